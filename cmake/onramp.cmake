@@ -1,0 +1,52 @@
+# What every room's library and every test is built with.
+
+add_library(onramp_options INTERFACE)
+target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})
+target_compile_options(onramp_options INTERFACE
+  -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror)
+
+# Every object file is instrumented, third-party headers' code included, so these are global.
+if(ONRAMP_SANITIZE)
+  add_compile_options(-fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  add_link_options(-fsanitize=address,undefined)
+endif()
+if(ONRAMP_FUZZ)
+  add_compile_options(-fsanitize=fuzzer-no-link)
+endif()
+
+# onramp_library(NAME SOURCES… [LINK libraries…]): a room's static library.
+function(onramp_library name)
+  cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
+  add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
+  target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
+endfunction()
+
+# onramp_test(NAME SOURCES… [LINK libraries…]): a GoogleTest program, run by ctest as one test.
+function(onramp_test name)
+  if(NOT ONRAMP_TESTS)
+    return()
+  endif()
+  cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
+  add_executable(${name} ${ARG_UNPARSED_ARGUMENTS})
+  target_link_libraries(${name} PRIVATE onramp_options ${ARG_LINK} GTest::gmock GTest::gtest_main)
+  add_test(NAME ${name} COMMAND ${name})
+  set_tests_properties(${name} PROPERTIES TIMEOUT 300)
+endfunction()
+
+# onramp_fuzz(NAME SOURCES… [LINK libraries…]): a libFuzzer program. ctest gives it a short run that
+# starts from the folder corpus/NAME beside its source; finds go to the build folder.
+function(onramp_fuzz name)
+  if(NOT ONRAMP_FUZZ)
+    return()
+  endif()
+  cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
+  add_executable(${name} ${ARG_UNPARSED_ARGUMENTS})
+  target_link_libraries(${name} PRIVATE onramp_options ${ARG_LINK})
+  target_link_options(${name} PRIVATE -fsanitize=fuzzer)
+  file(MAKE_DIRECTORY ${CMAKE_CURRENT_BINARY_DIR}/${name}-found)
+  add_test(NAME ${name}
+    COMMAND ${name} -runs=100000 -max_total_time=20 -timeout=5 -print_final_stats=1
+      -artifact_prefix=${CMAKE_CURRENT_BINARY_DIR}/${name}-found/
+      ${CMAKE_CURRENT_BINARY_DIR}/${name}-found ${CMAKE_CURRENT_SOURCE_DIR}/corpus/${name})
+  set_tests_properties(${name} PROPERTIES TIMEOUT 120)
+endfunction()
