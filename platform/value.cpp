@@ -16,7 +16,9 @@ std::int64_t saturated(double number) {
   return static_cast<std::int64_t>(number);
 }
 
-bool keyIsLess(const Dictionary::Pair& pair, std::string_view key) { return pair.first < key; }
+bool keyIsLess(const Dictionary::Pair& pair, std::string_view key) {
+  return pair.first < key;
+}
 
 }  // namespace
 
@@ -93,9 +95,13 @@ Dictionary Dictionary::with(std::string_view key, Value value) const {
   return Dictionary(std::move(pairs));
 }
 
-std::size_t Dictionary::size() const { return pairs_ ? pairs_->size() : 0; }
+std::size_t Dictionary::size() const {
+  return pairs_ ? pairs_->size() : 0;
+}
 
-const Dictionary::Pair* Dictionary::begin() const { return pairs_ ? pairs_->data() : nullptr; }
+const Dictionary::Pair* Dictionary::begin() const {
+  return pairs_ ? pairs_->data() : nullptr;
+}
 
 const Dictionary::Pair* Dictionary::end() const {
   return pairs_ ? pairs_->data() + pairs_->size() : nullptr;

@@ -27,7 +27,8 @@ struct Date {
 
 using Array = std::vector<Value>;
 
-/// An immutable, string-keyed record. Copies share their contents, so passing one by value is cheap.
+/// An immutable, string-keyed record. Copies share their contents, so passing one by value is
+/// cheap.
 class Dictionary {
  public:
   using Pair = std::pair<std::string, Value>;
@@ -39,7 +40,8 @@ class Dictionary {
   Dictionary(std::initializer_list<Pair> pairs);
   explicit Dictionary(std::vector<Pair> pairs);
 
-  /// The value under `key`, or null when there is none. Lives as long as this dictionary's contents.
+  /// The value under `key`, or null when there is none. Lives as long as this dictionary's
+  /// contents.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
   /// The value under `key` if it is a string, a dictionary, an array; nothing (or null) otherwise.

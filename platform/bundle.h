@@ -1,0 +1,52 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "platform/value.h"
+
+namespace onramp {
+
+/// A folder laid out as a resource bundle: Contents/Info.plist, Contents/Resources with one folder
+/// of string tables a language, and for an application its executable in a folder named after the
+/// system. Nothing is cached: every question is answered from the disk as it is now.
+class Bundle {
+ public:
+  /// The running application's own bundle.
+  [[nodiscard]] static Bundle main();
+
+  /// The bundle at `path`; nothing when no folder lies there.
+  [[nodiscard]] static std::optional<Bundle> open(const std::string& path);
+
+  /// Absolute path of the bundle's folder, without a closing "/".
+  [[nodiscard]] const std::string& path() const { return path_; }
+
+  /// The information dictionary; empty when the bundle has none.
+  [[nodiscard]] Dictionary infoDictionary() const;
+
+  /// The information dictionary's text under `key` if it is a string.
+  [[nodiscard]] std::optional<std::string> infoString(std::string_view key) const;
+
+  /// Path of the resource `name` with the extension `type` (without its dot; empty for none), or
+  /// nothing when the bundle holds no such file.
+  [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
+                                                           const std::string& type) const;
+
+  /// Path of the bundle's program, whether or not a file lies there; nothing when the bundle does
+  /// not name one.
+  [[nodiscard]] std::optional<std::string> executablePath() const;
+
+  /// The text under `key` in the string table `table` ("Localizable" when none is given) for the
+  /// user's preferred language among those the bundle offers, else for its development language;
+  /// `value` when the table has no such key.
+  [[nodiscard]] std::string localizedString(const std::string& key, const std::string& value,
+                                            const std::optional<std::string>& table) const;
+
+ private:
+  explicit Bundle(std::string path) : path_(std::move(path)) {}
+
+  std::string path_;
+};
+
+}  // namespace onramp

@@ -1,0 +1,200 @@
+#pragma once
+
+#include <cstddef>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace onramp {
+
+class ArrayController;
+
+/// What a handle stands for; only the linked front end knows what it is.
+struct NativeObject;
+
+enum class OutletKind {
+  kView,
+  kTextField,
+  kButton,
+  kRadioMatrix,
+  kImageView,
+  kProgressIndicator,
+  kTableView,
+  kPopUpButton,
+  kWindow,
+  kMenu,
+  kMenuItem,
+};
+
+/// A handle on an object of the user interface that the front end owns. Copies stand for the same
+/// object. An empty handle takes every request and does nothing, and so does a handle whose object
+/// is gone from an interface file: a page works as far as its file goes. Main thread only.
+class Outlet {
+ public:
+  Outlet() = default;
+  explicit Outlet(NativeObject* object) : object_(object) {}
+
+  explicit operator bool() const { return object_ != nullptr; }
+  [[nodiscard]] NativeObject* native() const { return object_; }
+
+  friend bool operator==(const Outlet&, const Outlet&) = default;
+
+ private:
+  NativeObject* object_ = nullptr;
+};
+
+class View : public Outlet {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kView;
+  using Outlet::Outlet;
+
+  void setHidden(bool hidden) const;
+
+  /// The first of the views inside this one; empty when there is none.
+  [[nodiscard]] View firstSubview() const;
+
+  /// Puts `view` inside this one, filling it, and shows it. Its owner stays its owner.
+  void addSubview(const View& view) const;
+
+  /// Takes this view out of the one that it is in; its owner keeps it.
+  void removeFromSuperview() const;
+};
+
+class Control : public View {
+ public:
+  using View::View;
+
+  void setEnabled(bool enabled) const;
+};
+
+/// Static text that wraps at the view's width.
+class TextField : public View {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kTextField;
+  using View::View;
+
+  void setStringValue(const std::string& text) const;
+};
+
+/// A push button. Its title comes by binding, its click goes to the owner, both by the interface
+/// file.
+class Button : public Control {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kButton;
+  using Control::Control;
+};
+
+/// Radio buttons in rows and columns, of which exactly one is selected.
+class RadioMatrix : public Control {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kRadioMatrix;
+  using Control::Control;
+
+  void setTitle(int row, int column, const std::string& title) const;
+  void selectCell(int row, int column) const;
+
+  /// Row of the selected button, counted from 0; 0 when this handle is empty.
+  [[nodiscard]] int selectedRow() const;
+};
+
+/// An image file by reference: it is read when it is drawn.
+struct Image {
+  std::string path;
+
+  /// The image resource of the application's bundle with this file name, if there is one.
+  [[nodiscard]] static std::optional<Image> named(const std::string& fileName);
+};
+
+enum class ImageScaling {
+  kProportionallyDown,  ///< shown in its own size, or smaller where that does not fit
+  kAxesIndependently,   ///< stretched to fill the view
+};
+
+class ImageView : public View {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kImageView;
+  using View::View;
+
+  /// A file that is missing or no image leaves the view empty.
+  void setImage(const Image& image) const;
+  void setImageScaling(ImageScaling scaling) const;
+};
+
+/// A spinner without a measure of how far things are.
+class ProgressIndicator : public View {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kProgressIndicator;
+  using View::View;
+
+  void startAnimation() const;
+  void stopAnimation() const;
+};
+
+/// A list with columns. Each column has an identifier, set by the interface file, and shows the
+/// text that every entry has under that key.
+class TableView : public Control {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kTableView;
+  using Control::Control;
+
+  /// Shows the controller's entries and keeps both selections the same. `controller` has to outlive
+  /// the table, or another bind().
+  void bind(ArrayController& controller) const;
+
+  void setAllowsColumnReordering(bool allows) const;
+  void setAllowsColumnSelection(bool allows) const;
+  void setColumnHeader(std::string_view identifier, const std::string& title) const;
+  void setColumnEditable(std::string_view identifier, bool editable) const;
+};
+
+/// A button that opens a menu of commands. Item 0 is the button's own face.
+class PopUpButton : public Control {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kPopUpButton;
+  using Control::Control;
+
+  [[nodiscard]] std::size_t numberOfItems() const;
+  void removeItem(std::size_t index) const;
+  void addItem(const std::string& title, std::function<void()> action) const;
+};
+
+class Window : public Outlet {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kWindow;
+  using Outlet::Outlet;
+
+  void setShowsResizeIndicator(bool shows) const;
+
+  /// Centres the window on its screen.
+  void center() const;
+  void makeKeyWindow() const;
+  void orderFront() const;
+  void makeKeyAndOrderFront() const;
+
+  /// Takes the window off the screen without asking anybody.
+  void close() const;
+};
+
+class MenuItem;
+
+class Menu : public Outlet {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kMenu;
+  using Outlet::Outlet;
+
+  /// The first item with this title; empty when there is none.
+  [[nodiscard]] MenuItem itemWithTitle(const std::string& title) const;
+};
+
+class MenuItem : public Outlet {
+ public:
+  static constexpr OutletKind kKind = OutletKind::kMenuItem;
+  using Outlet::Outlet;
+
+  /// The menu that the item opens; empty for a plain item.
+  [[nodiscard]] Menu submenu() const;
+  void setTitle(const std::string& title) const;
+};
+
+}  // namespace onramp
