@@ -1,0 +1,52 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "platform/value.h"
+
+namespace onramp {
+
+/// A file by its absolute path.
+struct FileURL {
+  std::string path;
+  friend bool operator==(const FileURL&, const FileURL&) = default;
+};
+
+/// Where the installer package and the wireless set-up tool lie on the medium, and which systems
+/// the medium supports. Read once from the medium, when the object is made.
+class KSInstallerInfo {
+ public:
+  /// Reads the medium that the application lies on.
+  KSInstallerInfo();
+
+  /// Sets everything from a medium resource dictionary; from none, the defaults.
+  void setCDCommonInfoValue(const std::optional<Dictionary>& common);
+
+  void loadPkgURL(const std::optional<Dictionary>& common);
+  void loadSupportSystem(const std::optional<Dictionary>& common);
+  void loadWLANToolURL(const std::optional<Dictionary>& common);
+
+  /// The package to open; nothing when the medium has none for the running system.
+  [[nodiscard]] const std::optional<FileURL>& pkgURL() const { return mPkgURL; }
+
+  /// The set-up tool's application bundle, whether or not it is there; nothing when the medium's
+  /// resource dictionary could not be read.
+  [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
+
+  /// Version dictionaries with "Major", "Minor" and "BugFix", as strings or numbers. A "Major" of 0
+  /// sets no bound, and that is the default.
+  [[nodiscard]] const Dictionary& supportSystemMin() const { return mSystemMin; }
+  [[nodiscard]] const Dictionary& supportSystemMax() const { return mSystemMax; }
+
+  [[nodiscard]] static std::string convertRelativePathToFullPath(
+      const std::optional<std::string>& relativePath);
+
+ private:
+  std::optional<FileURL> mPkgURL;
+  std::optional<FileURL> mWLANToolURL;
+  Dictionary mSystemMin;
+  Dictionary mSystemMax;
+};
+
+}  // namespace onramp
