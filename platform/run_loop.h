@@ -14,8 +14,8 @@ void scheduleTimer(double seconds, std::function<void()> action);
 /// modal one included. Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 
-/// Runs the main loop with `window` as its modal window; returns after abortModal() or when the
-/// application is asked to terminate. Main thread only.
+/// Shows `window`, makes it key and runs the main loop with it as the modal window; returns after
+/// abortModal() or when the application is asked to terminate. Main thread only.
 void runModalForWindow(const Window& window);
 
 /// Ends the running modal loop; without one, nothing. Callable from any thread.

@@ -1,0 +1,130 @@
+#include <filesystem>
+#include <system_error>
+
+#include "app/OnrampOSXAppDelegate.h"
+#include "media/KSOROSXCD.h"
+#include "media/medium.h"
+#include "media/text_order.h"
+#include "platform/bundle.h"
+#include "platform/folders.h"
+#include "platform/locale.h"
+#include "platform/property_list.h"
+
+namespace onramp {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr const char* kModel = "Model";
+constexpr const char* kInterface = "Interface";
+
+// "com.vendor.kind.plist"
+std::string fileName(const std::string& vendor, const std::string& kind) {
+  return "com." + lowercased(vendor) + "." + kind + ".plist";
+}
+
+// Other users' runs and the installer must be able to replace what lies in the folder. A path as
+// long as the system's own limit is left as it is.
+void openToEveryone(const std::string& folder) {
+  constexpr std::size_t kPathBufferSize = 1024;
+  if (folder.size() >= kPathBufferSize) return;
+  std::error_code ignored;
+  fs::permissions(folder, fs::perms::all, ignored);
+}
+
+void setDefault(Dictionary& options, const char* key) {
+  if (!options.find(key)) options = options.with(key, false);
+}
+
+// What the application knows of the online service in the user's country, if the medium offers it.
+Value onlineServiceOption(const Dictionary& options) {
+  const Value* const offered = options.find("PKG_KestrelOnline");
+  if (!offered || offered->boolean() == false) return false;
+  const auto path = Bundle::main().pathForResource("SupportedKOL", "plist");
+  const auto resource = path ? loadDictionary(*path) : std::nullopt;
+  const auto countries = resource ? resource->dictionary("Country") : std::nullopt;
+  const Value* const entry = countries ? countries->find(localeCountryCode()) : nullptr;
+  return entry ? *entry : Value(false);
+}
+
+bool fontSetOption(const Dictionary& options) {
+  if (!options.find("PKG_FontSet")) return false;
+  const std::string language = localeLanguageCode();
+  return language == "ja" || language == "ko" || language == "zh";
+}
+
+// The records stand an empty text for what is not known.
+std::optional<std::string> knownText(const Dictionary& record, std::string_view key) {
+  std::optional<std::string> text = record.string(key);
+  return text && !text->empty() ? text : std::nullopt;
+}
+
+std::optional<std::string> firstAddress(const Dictionary& device) {
+  const Array* const addresses = device.array("IP address list");
+  if (!addresses || addresses->empty()) return std::nullopt;
+  const auto* const address = addresses->front().as<std::string>();
+  return address ? std::optional(*address) : std::nullopt;
+}
+
+}  // namespace
+
+std::string OnrampOSXAppDelegate::setVenderName() {
+  const std::optional<Dictionary> resources = medium::loadResourceDictionary();
+  std::string vendor = resources ? resources->string(medium::kVenderName).value_or("") : "";
+  std::erase(vendor, ' ');
+  return vendor;
+}
+
+std::string OnrampOSXAppDelegate::InstallPKGInfoURL() {
+  const std::string vendor = setVenderName();
+  const std::string folder = applicationSupportFolder(FolderDomain::kLocal) + "/" + vendor + "/";
+  std::error_code ignored;
+  if (!fs::exists(folder, ignored)) {
+    fs::create_directories(folder, ignored);
+    openToEveryone(folder);
+  }
+  return folder + fileName(vendor, "installpkginfo");
+}
+
+std::string OnrampOSXAppDelegate::instmodelPlistURL() {
+  const std::string vendor = setVenderName();
+  const std::string folder = applicationSupportFolder(FolderDomain::kUser) + "/" + vendor + "/";
+  std::error_code ignored;
+  fs::create_directories(folder, ignored);
+  return folder + fileName(vendor, "instmodel");
+}
+
+void OnrampOSXAppDelegate::copyCDInfo() {
+  const auto info = medium::loadNamedDictionary(medium::loadResourceDictionary(), medium::kCDInfo);
+  Dictionary options = info ? info->dictionary("InstallPKG").value_or(Dictionary()) : Dictionary();
+  setDefault(options, "PKG_WebLink");
+  options = options.with("PKG_KestrelOnline", onlineServiceOption(options));
+  setDefault(options, "PKG_RemoteTool");
+  setDefault(options, "PKG_LabelTool");
+  options = options.with("PKG_FontSet", fontSetOption(options));
+  writeDictionaryAtomically(options, InstallPKGInfoURL());
+}
+
+Dictionary OnrampOSXAppDelegate::instmodelPlistNotWiFi(const std::string& model) {
+  return Dictionary{{kModel, model}, {kInterface, "Default"}};
+}
+
+Dictionary OnrampOSXAppDelegate::instmodelPlistWiFi(const std::optional<std::string>& model,
+                                                    const std::optional<Dictionary>& property) {
+  const auto type = knownText(KSOROSXCD::initWithCDInfo(), KSOROSXCD::kBonjourServiceType);
+  if (property) {
+    const auto name = knownText(*property, "display name");
+    const auto address = firstAddress(*property);
+    if (name && type && address) {
+      const Dictionary bonjour{{"name", *name}, {"type", *type}, {"domain", "local."}};
+      const Dictionary network{{"Bonjour", bonjour}, {"IP address", *address}};
+      return Dictionary{{kModel, property->string("model name").value_or("")},
+                        {kInterface, "WiFi"},
+                        {"Network", network}};
+    }
+  }
+  return instmodelPlistNotWiFi(model.value_or(""));
+}
+
+}  // namespace onramp

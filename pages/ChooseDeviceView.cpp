@@ -1,0 +1,121 @@
+#include "pages/ChooseDeviceView.h"
+
+#include <utility>
+
+#include "media/CommonMessage.h"
+#include "media/KSInstallerInfo.h"
+#include "platform/bundle.h"
+#include "platform/notification_center.h"
+
+namespace onramp {
+
+namespace {
+
+constexpr int kRefreshWaitSeconds = 3;
+
+// A tool without a name of its own is called by its file's name.
+std::string setupToolName() {
+  const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
+  if (!tool) return "";
+  if (const auto bundle = Bundle::open(tool->path)) {
+    if (auto name = bundle->infoString("CFBundleDisplayName")) return *name;
+  }
+  std::string name = tool->path.substr(tool->path.rfind('/') + 1);
+  return name.substr(0, name.rfind('.'));
+}
+
+}  // namespace
+
+ChooseDeviceView::ChooseDeviceView(std::unique_ptr<Interface> interface)
+    : Page(std::move(interface)),
+      deviceListView(outlet<TableView>("deviceListView")),
+      deviceListTitle(outlet<TextField>("deviceListTitle")),
+      deviceListPopupButton(outlet<PopUpButton>("deviceListPopupButton")),
+      progressTxtField(outlet<TextField>("progressTxtField")),
+      progress(outlet<ProgressIndicator>("progress")) {
+  awakeFromNib();
+}
+
+ChooseDeviceView::~ChooseDeviceView() {
+  stopBrowsing();
+}
+
+void ChooseDeviceView::awakeFromNib() {
+  deviceListTitle.setStringValue(localized("INST_TXT_DEVLIST"));
+  fillPopUpMenu();
+
+  deviceListView.setAllowsColumnReordering(false);
+  deviceListView.setAllowsColumnSelection(false);
+  deviceListView.setColumnHeader(kDevice, localized("INST_TXT_DEVICE"));
+  deviceListView.setColumnHeader(kInterface, localized("INST_TXT_CONNECTION"));
+  deviceListView.setColumnHeader(kLocation, localized("INST_TXT_IPADDRESS"));
+  for (const std::string_view column : {kDevice, kInterface, kLocation}) {
+    deviceListView.setColumnEditable(column, false);
+  }
+
+  deviceArrayController.setSortKey(std::string(kDevice));
+  progressTxtField.setStringValue(localized("INST_WAIT"));
+  deviceArrayController.rearrange();
+  deviceArrayController.setSelectionIndex(0);
+  deviceListView.bind(deviceArrayController);
+  progressON(false);
+}
+
+void ChooseDeviceView::fillPopUpMenu() {
+  for (std::size_t item = deviceListPopupButton.numberOfItems(); item > 1; --item) {
+    deviceListPopupButton.removeItem(item - 1);
+  }
+  deviceListPopupButton.addItem(setupToolName() + "...", [this] { setupWizardMenu(); });
+  deviceListPopupButton.addItem(localized("INST_TXT_REFRESH"), [this] { refreshBrowsing(); });
+}
+
+void ChooseDeviceView::setSearchModelList(std::vector<std::string> models) {
+  searchModelList = std::move(models);
+}
+
+void ChooseDeviceView::startBrowsing() {
+  stopBrowsing();
+}
+
+void ChooseDeviceView::stopBrowsing() {}
+
+void ChooseDeviceView::refreshBrowsing() {
+  stopBrowsing();
+  deviceArrayController.removeAllObjects();
+  deviceArrayController.rearrange();
+  startBrowsing();
+  NotificationCenter::defaultCenter().post(
+      {.name = std::string(kDeviceWaitNotification),
+       .object = this,
+       .userInfo = {{std::string(kWaitTime), kRefreshWaitSeconds}}});
+}
+
+void ChooseDeviceView::setupWizardMenu() {
+  stopBrowsing();
+  NotificationCenter::defaultCenter().post(
+      {.name = std::string(kLaunchWLANToolNotification), .object = nullptr, .userInfo = {}});
+}
+
+std::size_t ChooseDeviceView::deviceArrayControllerCnt() const {
+  return deviceArrayController.arrangedCount();
+}
+
+std::optional<Dictionary> ChooseDeviceView::choosedDevice() const {
+  return deviceArrayController.selectedObject();
+}
+
+void ChooseDeviceView::deviceListPopupButtonEnable(bool enable) {
+  deviceListPopupButton.setEnabled(enable);
+}
+
+void ChooseDeviceView::progressON(bool on) {
+  if (on) {
+    progress.startAnimation();
+  } else {
+    progress.stopAnimation();
+  }
+  progress.setHidden(!on);
+  progressTxtField.setHidden(!on);
+}
+
+}  // namespace onramp

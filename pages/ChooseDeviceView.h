@@ -1,0 +1,79 @@
+#pragma once
+
+#include <cstddef>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "pages/page.h"
+#include "platform/array_controller.h"
+#include "platform/outlets.h"
+#include "platform/value.h"
+
+namespace onramp {
+
+// What the page asks the application for, by notification.
+
+/// Launch the wireless set-up tool. Carries nothing.
+inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
+
+/// Wait for the device search. Carries under kWaitTime the seconds per pause, an int.
+inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
+inline constexpr std::string_view kWaitTime = "WAIT_TIME";
+
+/// The page that lists the devices found on the network. Made once; its list survives page changes.
+class ChooseDeviceView final : public Page {
+ public:
+  // Keys of a list entry.
+  static constexpr std::string_view kDevice = "device";        ///< string, the device's name
+  static constexpr std::string_view kInterface = "interface";  ///< string, how it is connected
+  static constexpr std::string_view kLocation = "location";    ///< string, its first address
+  static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
+
+  explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
+  ~ChooseDeviceView() override;
+
+  /// The models to look for, as "manufacturer model" texts.
+  void setSearchModelList(std::vector<std::string> models);
+
+  /// Starts a new search; the list keeps what it has.
+  void startBrowsing();
+
+  /// Ends the search; the list keeps what it has. Without a search, nothing.
+  void stopBrowsing();
+
+  /// Empties the list, starts a new search and asks the application to wait for it.
+  void refreshBrowsing();
+
+  /// Ends the search and asks the application to launch the wireless set-up tool.
+  void setupWizardMenu();
+
+  /// The number of devices listed. Callable from any thread.
+  [[nodiscard]] std::size_t deviceArrayControllerCnt() const;
+
+  /// The selected list entry; nothing when none is selected.
+  [[nodiscard]] std::optional<Dictionary> choosedDevice() const;
+
+  void deviceListPopupButtonEnable(bool enable);
+
+  /// Shows or hides the waiting state.
+  void progressON(bool on);
+
+ private:
+  void awakeFromNib();
+  void fillPopUpMenu();
+
+  std::vector<std::string> searchModelList;
+
+  // The controller comes before the table that is bound to it.
+  ArrayController deviceArrayController;
+  TableView deviceListView;
+  TextField deviceListTitle;
+  PopUpButton deviceListPopupButton;
+  TextField progressTxtField;
+  ProgressIndicator progress;
+};
+
+}  // namespace onramp

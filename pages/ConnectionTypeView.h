@@ -1,0 +1,54 @@
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "pages/page.h"
+#include "platform/outlets.h"
+
+namespace onramp {
+
+/// The interfaces that a model, or all models of the medium, support besides wireless.
+enum class ConnectionType : unsigned char {
+  kNeither = 0,  ///< neither USB nor wired Ethernet, or the models disagree
+  kEthernet = 2,
+  kUSB = 3,
+  kUSBAndEthernet = 4,
+};
+
+/// The page that asks how the device is connected. Made anew each time it is shown.
+class ConnectionTypeView final : public Page {
+ public:
+  /// The rows of the choice.
+  static constexpr int kWirelessRow = 0;
+  static constexpr int kWiredRow = 1;
+
+  explicit ConnectionTypeView(std::unique_ptr<Interface> interface);
+
+  /// Sets both choices' titles and images; the selection stays.
+  void setConnectionType(ConnectionType type);
+
+  /// The selected row: kWirelessRow or kWiredRow.
+  [[nodiscard]] int chooseDeviceType() const;
+
+  void setChooseButton(int row, int column);
+
+  /// Shows or hides the waiting state, in which nothing can be chosen.
+  void progressON(bool on);
+
+  /// Full path of the medium's folder of images.
+  [[nodiscard]] static std::string commonImagesFolderPath();
+
+ private:
+  void awakeFromNib();
+
+  TextField connectionTypeTitle;
+  TextField connectionDescriptionTextField;
+  RadioMatrix connectionTypeRadioButton;
+  ImageView connectionTypeImage1;
+  ImageView connectionTypeImage2;
+  TextField progressTxtField;
+  ProgressIndicator progress;
+};
+
+}  // namespace onramp

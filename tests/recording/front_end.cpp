@@ -1,0 +1,151 @@
+#include "tests/recording/front_end.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+
+#include "platform/array_controller.h"
+#include "platform/run_loop.h"
+#include "tests/recording/interfaces.h"
+#include "tests/recording/loop.h"
+
+namespace onramp::recording {
+
+/// What the seam's functions below may change of the front end.
+struct Access {
+  static void schedule(double seconds, std::function<void()> action) {
+    FrontEnd& frontEnd = FrontEnd::instance();
+    frontEnd.timers_.push_back({frontEnd.now_ + seconds, std::move(action)});
+  }
+  static Object& newMenuObject(OutletKind kind, std::string text) {
+    auto object = std::make_unique<Object>();
+    object->kind = kind;
+    object->text = std::move(text);
+    FrontEnd::instance().menus_.push_back(std::move(object));
+    return *FrontEnd::instance().menus_.back();
+  }
+  static Object* firstMenuObject() {
+    auto& menus = FrontEnd::instance().menus_;
+    return menus.empty() ? nullptr : menus.front().get();
+  }
+};
+
+FrontEnd& FrontEnd::instance() {
+  static FrontEnd frontEnd;
+  return frontEnd;
+}
+
+void FrontEnd::reset() {
+  mainInterface_.reset();
+  timers_.clear();
+  menus_.clear();
+  log.clear();
+  alerts.clear();
+  sheets.clear();
+  pauses.clear();
+  missingInterfaces.clear();
+  duringPause = nullptr;
+  terminated = false;
+  now_ = 0;
+  resetLoop();
+
+  Object& bar = Access::newMenuObject(OutletKind::kMenu, "");
+  Object& item = Access::newMenuObject(OutletKind::kMenuItem, "Onramp OSX");
+  Object& menu = Access::newMenuObject(OutletKind::kMenu, "");
+  bar.subviews = {&item};
+  item.subviews = {&menu};
+  for (const char* title : {"About", "Hide", "Hide Others", "Show All", "Quit"}) {
+    menu.subviews.push_back(&Access::newMenuObject(OutletKind::kMenuItem, title));
+  }
+}
+
+void FrontEnd::launch(ApplicationDelegate& delegate) {
+  mainInterface_ = Interface::load("MainMenu", delegate);
+  if (!mainInterface_) return;
+  delegate.setOutlets(*mainInterface_);
+  delegate.awakeFromNib();
+  delegate.applicationWillFinishLaunching();
+  if (!terminated) delegate.applicationDidFinishLaunching();
+}
+
+Object& FrontEnd::object(const std::string& name) {
+  Object* const found = findLiveObject(name);
+  if (!found) {
+    std::fprintf(stderr, "no live object named %s\n", name.c_str());
+    std::abort();
+  }
+  return *found;
+}
+
+bool FrontEnd::has(const std::string& name) const {
+  return findLiveObject(name) != nullptr;
+}
+
+void FrontEnd::click(const std::string& buttonName) {
+  const Object& button = object(buttonName);
+  if (button.hidden || !button.enabled) return;
+  ownerOf(button).performAction(button.action);
+}
+
+void FrontEnd::runTimers() {
+  while (!timers_.empty() && !terminated) {
+    const auto next =
+        std::min_element(timers_.begin(), timers_.end(),
+                         [](const Timer& a, const Timer& b) { return a.due < b.due; });
+    const Timer timer = std::move(*next);
+    timers_.erase(next);
+    now_ = timer.due;
+    timer.action();
+  }
+}
+
+bool FrontEnd::pumpUntil(const std::function<bool()>& done, double seconds) {
+  return runPosted(done, std::chrono::duration<double>(seconds));
+}
+
+}  // namespace onramp::recording
+
+namespace onramp {
+
+using recording::Access;
+using recording::FrontEnd;
+
+void scheduleTimer(double seconds, std::function<void()> action) {
+  Access::schedule(seconds, std::move(action));
+}
+
+void terminateApplication() {
+  FrontEnd::instance().log.emplace_back("terminate");
+  FrontEnd::instance().terminated = true;
+  recording::endLoop();
+}
+
+void hideApplication() {
+  FrontEnd::instance().log.emplace_back("hide");
+}
+void unhideApplication() {
+  FrontEnd::instance().log.emplace_back("unhide");
+}
+void activateIgnoringOtherApps() {
+  FrontEnd::instance().log.emplace_back("activate");
+}
+
+Menu mainMenu() {
+  recording::Object* const bar = Access::firstMenuObject();
+  return Menu(bar ? bar->native() : nullptr);
+}
+
+void setMainMenu(const Menu&) {}
+
+void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
+                      const std::string& buttonTitle) {
+  FrontEnd::instance().log.emplace_back("alert");
+  FrontEnd::instance().alerts.push_back({messageText, informativeText, buttonTitle});
+}
+
+void beginAlertSheet(const AlertSheet& sheet, const Window&, std::function<void(int)> didEnd) {
+  FrontEnd::instance().log.emplace_back("sheet");
+  FrontEnd::instance().sheets.push_back({sheet, std::move(didEnd)});
+}
+
+}  // namespace onramp

@@ -1,0 +1,105 @@
+#pragma once
+
+#include <functional>
+#include <list>
+#include <map>
+#include <memory>
+#include <optional>
+#include <set>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "platform/alert.h"
+#include "platform/application.h"
+#include "platform/outlets.h"
+
+namespace onramp::recording {
+
+/// One object of the user interface, as the program has left it.
+struct Object {
+  OutletKind kind = OutletKind::kView;
+  std::string name;
+  bool hidden = false;
+  bool enabled = true;
+  bool animating = false;
+  std::string text;                                  ///< of a text field, a window, a menu item
+  std::map<std::pair<int, int>, std::string> cells;  ///< titles by row and column
+  int selectedRow = -1;
+  std::string imagePath;
+  ImageScaling scaling = ImageScaling::kProportionallyDown;
+  std::map<std::string, std::string> headers;
+  ArrayController* content = nullptr;
+  std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
+  Object* superview = nullptr;
+  std::vector<Object*> subviews;
+  std::string titleBinding;
+  std::string action;
+
+  [[nodiscard]] NativeObject* native() { return reinterpret_cast<NativeObject*>(this); }
+};
+
+struct ShownAlert {
+  std::string messageText;
+  std::string informativeText;
+  std::string buttonTitle;
+};
+
+struct ShownSheet {
+  AlertSheet sheet;
+  std::function<void(int)> didEnd;
+};
+
+/// A front end without a screen: it keeps what the program shows and asks for, and plays the user
+/// and the clock. Time passes only when a test says so, or in a search wait, whose pauses take no
+/// time.
+class FrontEnd {
+ public:
+  static FrontEnd& instance();
+
+  /// Back to the beginning, as for a new process.
+  void reset();
+
+  /// Launches the application for `delegate` as the platform does, up to the point where it waits
+  /// for the user. The delegate has to outlive what the test does with it.
+  void launch(ApplicationDelegate& delegate);
+
+  /// The live object of that name that was loaded last; a test fails hard without it.
+  [[nodiscard]] Object& object(const std::string& name);
+  [[nodiscard]] bool has(const std::string& name) const;
+
+  /// The user clicks a button: nothing happens when it is hidden or disabled.
+  void click(const std::string& buttonName);
+
+  /// Runs the scheduled timers, earliest first, until none is left or the application terminates.
+  void runTimers();
+
+  /// Runs what other threads have posted to the main thread, waiting up to `seconds` for `done`.
+  bool pumpUntil(const std::function<bool()>& done, double seconds);
+
+  // What the program did.
+  std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
+  std::vector<ShownAlert> alerts;
+  std::vector<ShownSheet> sheets;
+  std::vector<unsigned> pauses;  ///< seconds of every pause off the main thread
+  bool terminated = false;
+
+  // What a test sets up.
+  std::set<std::string> missingInterfaces;
+  std::function<void(int pause)> duringPause;  ///< called on the main thread, counted from 1
+
+ private:
+  friend struct Access;
+
+  struct Timer {
+    double due;
+    std::function<void()> action;
+  };
+
+  double now_ = 0;
+  std::list<Timer> timers_;
+  std::list<std::unique_ptr<Object>> menus_;
+  std::unique_ptr<Interface> mainInterface_;
+};
+
+}  // namespace onramp::recording
