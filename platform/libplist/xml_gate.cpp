@@ -71,7 +71,7 @@ class Walk {
     if (name == "integer" && !empty) blankLeadingZeros();
     if (empty || !isContainer(name)) return true;
     containers_.push_back({start_, name.size(), 0});
-    return containers_.size() <= kMostDepth;
+    return containers_.size() <= kMostDepth + 1;  // the outermost is <plist>
   }
 
   static bool isContainer(std::string_view name) {
