@@ -34,7 +34,10 @@ class PracticeNetwork:
         self._ask("add", name, entries)
 
     def remove(self, name):
-        """Switches a device off: it says goodbye, and its agents are gone."""
+        """Switches a device off: it says goodbye, and its agents are gone.
+
+        Browsers see it leave up to a second later, since mDNS caches keep it that long.
+        """
         self._ask("remove", name)
 
     def rename(self, name, new_name):

@@ -138,7 +138,7 @@ def _types(value):
     if not types or len(set(types)) != len(types):
         raise ValueError
     for service_type in types:
-        if not re.fullmatch(r"_(?=.*[A-Za-z])[A-Za-z0-9-]{1,15}\._(tcp|udp)", _text(service_type)):
+        if not re.fullmatch(r"_(?=.*[A-Za-z])[A-Za-z0-9-]{2,15}\._(tcp|udp)", _text(service_type)):
             raise ValueError
     return types
 

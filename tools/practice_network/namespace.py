@@ -40,14 +40,16 @@ def enclose(options):
         ["setpriv", "--pdeathsig", "KILL", *ENCLOSE,
          sys.executable, LAUNCHER, "--inside", json.dumps(options)])
 
+    ended_by = []
+
     def end(number, _):
-        process.kill()
-        process.wait()
-        sys.exit(128 + number)
+        ended_by.append(number)
+        os.kill(process.pid, signal.SIGKILL)
 
     signal.signal(signal.SIGTERM, end)
     signal.signal(signal.SIGHUP, end)
-    return _status(process.wait())
+    status = _status(process.wait())
+    return 128 + ended_by[0] if ended_by else status
 
 
 def inside(options):
@@ -92,7 +94,7 @@ def devices(options):
         network.load(description.load(options["description"]))
         network.settle()
     except DescriptionError as error:
-        print(f"practice-network: {error}", file=sys.stderr)
+        print(f"practice-network: {options['description']}: {error}", file=sys.stderr)
         return BAD_INPUT
     except (HostError, AgentError, PublishError) as error:
         return _fail(error)
