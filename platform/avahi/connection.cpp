@@ -11,12 +11,20 @@ namespace {
 // What fails at once is not tried again at once, so that nothing ever keeps the processor busy.
 constexpr std::chrono::milliseconds kRetryPause{1000};
 
+// Freeing takes as many calls as asking does, and in a burst of services the next one waits.
+constexpr std::chrono::milliseconds kQuiet{50};
+// Well below the objects that a daemon allows each client.
+constexpr std::size_t kMostFinished = 200;
+
 }  // namespace
 
 Connection::Connection(Loop& loop)
-    : loop_(loop), retry_(loop, [this] { client_ ? startJobs() : connect(); }) {}
+    : loop_(loop),
+      retry_(loop, [this] { client_ ? startJobs() : connect(); }),
+      quiet_(loop, [this] { freeFinished(); }) {}
 
 Connection::~Connection() {
+  freeFinished();
   for (const auto& job : jobs_)
     job->stop();
 }
@@ -37,7 +45,12 @@ void Connection::remove(const std::shared_ptr<Job>& job) {
 }
 
 void Connection::finish(const std::shared_ptr<Job>& job) {
-  loop_.post([this, job] { remove(job); });
+  loop_.post([this, job] {
+    if (jobs_.erase(job) == 0) return;
+    finished_.push_back(job);
+    if (finished_.size() >= kMostFinished) freeFinished();
+    quiet_.start(kQuiet);
+  });
 }
 
 void Connection::restart(const std::shared_ptr<Job>& job) {
@@ -47,6 +60,11 @@ void Connection::restart(const std::shared_ptr<Job>& job) {
     job->lost();
     retryLater();
   });
+}
+
+void Connection::freeFinished() {
+  for (const auto& job : std::exchange(finished_, {}))
+    job->stop();
 }
 
 void Connection::retryLater() {
@@ -74,6 +92,7 @@ void Connection::connect() {
 
 void Connection::disconnect() {
   connected_ = false;
+  freeFinished();
   for (const auto& job : jobs_)
     job->stop();
   client_.reset();

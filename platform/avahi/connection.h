@@ -5,6 +5,7 @@
 #include <set>
 #include <string>
 #include <utility>
+#include <vector>
 
 #include "platform/avahi/handles.h"
 #include "platform/avahi/job.h"
@@ -29,7 +30,7 @@ class Connection {
 
   // What a job asks for from within a callback of Avahi is done once that is over.
 
-  /// The job is done.
+  /// The job is done; what it has of the daemon is freed when there is nothing more urgent.
   void finish(const std::shared_ptr<Job>& job);
   /// What the job has of the daemon is of no use any more: stop it and start it again after a
   /// pause.
@@ -48,14 +49,17 @@ class Connection {
   void stateChanged(AvahiClientState state);
   void startJobs();
   void retryLater();
+  void freeFinished();
 
   Loop& loop_;
   Timer retry_;
+  Timer quiet_;
   ClientHandle client_;
   bool connected_ = false;
   // Jobs hold objects of the client, so they come after it.
   std::map<std::pair<AvahiIfIndex, std::string>, std::weak_ptr<HostAddresses>> hosts_;
   std::set<std::shared_ptr<Job>> jobs_;
+  std::vector<std::shared_ptr<Job>> finished_;
 };
 
 }  // namespace onramp::avahi
