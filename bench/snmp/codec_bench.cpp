@@ -46,52 +46,35 @@ void check(bool fine, const char* what) {
   std::exit(1);
 }
 
-class Ours {
- public:
+// One message and the storage behind it.
+struct Ours {
   Ours() {
-    snmp_message_init(message_, 1);
-    binding_[0].name = &name_;
-    binding_[0].octets_value = &octets_;
+    snmp_message_init(message, 1);
+    message.request_id = 1234;
+    binding[0].name = &name;
   }
+  Ours(const Ours&) = delete;
+  Ours& operator=(const Ours&) = delete;
 
-  void build() {
-    message_.pdu_type = onramp::kPduGet;
-    message_.request_id = 1234;
-    message_.varbind_count = 1;
-    binding_[0].type = onramp::kTagNull;
-    check(onramp::snmp_encode_message(message_, buffer_, length_) == 0, "encoding");
-  }
+  void build() { check(onramp::snmp_encode_message(message, buffer, length) == 0, "encoding"); }
 
   void parse(std::span<const std::uint8_t> reply) {
-    octets_ = {1500, 1500, strings_.data()};
-    check(onramp::snmp_decode_message(message_, reply) == 0, "decoding");
-    check(binding_[0].int_value == 2, "reading the value");
+    octets = {1500, 1500, strings.data()};
+    check(onramp::snmp_decode_message(message, reply) == 0, "decoding");
+    check(binding[0].int_value == 2, "reading the value");
   }
 
-  [[nodiscard]] std::span<const std::uint8_t> request() const {
-    return std::span(buffer_).first(length_);
+  [[nodiscard]] std::span<const std::uint8_t> built() const {
+    return std::span(buffer).first(length);
   }
 
-  /// The answer to build()'s request: ActiveIF is 2.
-  [[nodiscard]] std::span<const std::uint8_t> makeReply() {
-    build();
-    message_.pdu_type = onramp::kPduResponse;
-    message_.community = "corridor";
-    binding_[0].type = onramp::kTagInteger;
-    binding_[0].int_value = 2;
-    check(onramp::snmp_encode_message(message_, reply_, length_) == 0, "making the reply");
-    return std::span(reply_).first(length_);
-  }
-
- private:
-  std::array<std::uint8_t, 1536> buffer_{};
-  std::array<std::uint8_t, 1536> reply_{};
-  std::array<std::uint8_t, 1500> strings_{};
-  std::uint16_t length_ = 0;
-  onramp::snmp_oid name_{14, 14, arcs.data()};
-  onramp::snmp_octets octets_;
-  std::array<onramp::snmp_varbind, 1> binding_;
-  onramp::snmp_message message_{.varbinds = binding_};
+  std::array<std::uint8_t, 1536> buffer{};
+  std::array<std::uint8_t, 1500> strings{};
+  std::uint16_t length = 0;
+  onramp::snmp_oid name{14, 14, arcs.data()};
+  onramp::snmp_octets octets;
+  std::array<onramp::snmp_varbind, 1> binding{{{.octets_value = &octets}}};
+  onramp::snmp_message message{.varbinds = binding};
 };
 
 class NetSnmp {
@@ -160,30 +143,36 @@ void report(const char* what, const Samples& ours, const Samples& peer, double o
 }  // namespace
 
 int main() {
-  Ours ours;
+  Ours request;
+  Ours device;
+  Ours answer;
   NetSnmp peer;
-  const auto reply = ours.makeReply();
-  ours.build();
+  request.build();
   peer.build();
-  const auto a = ours.request();
+  const auto a = request.built();
   const auto b = peer.request();
   check(std::equal(a.begin(), a.end(), b.begin(), b.end()), "building the same bytes as net-snmp");
+  device.message.pdu_type = onramp::kPduResponse;
+  device.binding[0].type = onramp::kTagInteger;
+  device.binding[0].int_value = 2;
+  device.build();
+  const auto reply = device.built();
 
   Samples ourBuild;
   Samples peerBuild;
   Samples ourParse;
   Samples peerParse;
   for (int round = 0; round < kRounds; ++round) {
-    ourBuild.measure(kMessagesPerRound, [&] { ours.build(); });
+    ourBuild.measure(kMessagesPerRound, [&] { request.build(); });
     peerBuild.measure(kMessagesPerRound, [&] { peer.build(); });
-    ourParse.measure(kMessagesPerRound, [&] { ours.parse(reply); });
+    ourParse.measure(kMessagesPerRound, [&] { answer.parse(reply); });
     peerParse.measure(kMessagesPerRound, [&] { peer.parse(reply); });
   }
   std::printf("Medians of %d rounds of %d messages of %zu bytes [5 %%, 95 %%]\n", kRounds,
               kMessagesPerRound, a.size());
-  report("encode", ourBuild, peerBuild, allocationsOf([&] { ours.build(); }),
+  report("encode", ourBuild, peerBuild, allocationsOf([&] { request.build(); }),
          allocationsOf([&] { peer.build(); }));
-  report("decode", ourParse, peerParse, allocationsOf([&] { ours.parse(reply); }),
+  report("decode", ourParse, peerParse, allocationsOf([&] { answer.parse(reply); }),
          allocationsOf([&] { peer.parse(reply); }));
   return 0;
 }
