@@ -56,6 +56,12 @@ class ber_writer {
   return magnitude < 0x80U ? 1 : magnitude < 0x8000U ? 2 : magnitude < 0x800000U ? 3 : 4;
 }
 
+/// `value` as it is on the wire: a negative one cut down to the bytes of its INTEGER, which is the
+/// number that ber_get_uint reads from them.
+[[nodiscard]] constexpr std::uint64_t ber_int_bytes(std::uint64_t value) {
+  return (value & 0x80000000U) == 0 ? value : value & UINT32_MAX >> (32 - 8 * ber_int_size(value));
+}
+
 /// Of the content of a Counter, Gauge or TimeTicks: the low 32 bits of `value` as an unsigned
 /// number. As in an INTEGER below 2^31; from there on 5 bytes, of which the first is zero, because
 /// their content is an INTEGER's and so must not look negative (RFC 1155 section 6, X.690
@@ -135,14 +141,12 @@ inline void ber_fill_length(std::span<std::uint8_t> field, std::uint16_t length)
   return SNMP_OK;
 }
 
-/// An integer in `size` bytes, its ber_int_size. A negative value is masked in place to the bytes
-/// written, so that a message keeps the number that ber_get_uint reads when they come back.
+/// An integer in `size` bytes, its ber_int_size. Leaves its ber_int_bytes in `value`.
 template <typename Integer>
 [[nodiscard]] snmp_status ber_put_sized_int(ber_writer& out, Integer& value, std::size_t size,
                                             std::uint8_t tag) {
-  const auto bits = static_cast<std::uint32_t>(value);
-  if (bits > INT32_MAX) value = static_cast<Integer>(bits & UINT32_MAX >> (32 - 8 * size));
-  return ber_put_bits(out, bits, size, tag);
+  value = static_cast<Integer>(ber_int_bytes(static_cast<std::uint64_t>(value)));
+  return ber_put_bits(out, static_cast<std::uint32_t>(value), size, tag);
 }
 
 template <typename Integer>
