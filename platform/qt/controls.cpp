@@ -2,6 +2,7 @@
 #include <QMenu>
 #include <QProgressBar>
 #include <QToolButton>
+#include <memory>
 #include <utility>
 
 #include "platform/outlets.h"
@@ -30,7 +31,8 @@ std::size_t PopUpButton::numberOfItems() const {
 void PopUpButton::removeItem(std::size_t index) const {
   auto* const button = nativeOf<QToolButton>(*this);
   if (!button || index < 1 || index >= numberOfItems()) return;
-  delete button->menu()->actions().at(static_cast<qsizetype>(index) - 1);
+  const std::unique_ptr<QAction> item(
+      button->menu()->actions().at(static_cast<qsizetype>(index) - 1));
 }
 
 void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {

@@ -134,7 +134,7 @@ struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;
   Tree& operator=(const Tree&) = delete;
-  ~Tree() { delete root.data(); }
+  ~Tree() { const std::unique_ptr<QWidget> ended(root.data()); }
 
   QPointer<QWidget> root;
 };
