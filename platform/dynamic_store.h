@@ -39,7 +39,8 @@ inline constexpr int kSCStatusInvalidArgument = 1002;
 inline constexpr int kSCStatusNoStoreSession = 2001;
 
 /// A session with the store. Only the linked backend knows what it is; a null one is allowed
-/// everywhere and fails with kSCStatusNoStoreSession.
+/// everywhere and fails with kSCStatusNoStoreSession. Used from one thread at a time, and from the
+/// main one only when it has a callback.
 struct DynamicStore;
 using DynamicStoreRef = std::shared_ptr<DynamicStore>;
 
