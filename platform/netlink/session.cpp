@@ -10,22 +10,30 @@ namespace onramp {
 
 namespace netlink {
 
+// Null when the pattern cannot be read.
+Selection::Pattern Selection::compile(const std::string& pattern) {
+  auto compiled = std::make_unique<regex_t>();
+  const std::string whole = "^(" + pattern + ")$";
+  if (::regcomp(compiled.get(), whole.c_str(), REG_EXTENDED | REG_NOSUB) != 0) return nullptr;
+  return Pattern(compiled.release());
+}
+
 std::optional<Selection> Selection::of(const std::vector<std::string>& keys,
-                                       const std::vector<std::string>& patterns) try {
+                                       const std::vector<std::string>& patterns) {
   Selection selection;
   selection.keys_ = keys;
   for (const std::string& pattern : patterns) {
-    selection.patterns_.emplace_back(pattern, std::regex::extended);
+    selection.patterns_.push_back(compile(pattern));
+    if (!selection.patterns_.back()) return std::nullopt;
   }
   return selection;
-} catch (const std::regex_error&) {
-  return std::nullopt;
 }
 
 bool Selection::has(const std::string& key) const {
   return std::find(keys_.begin(), keys_.end(), key) != keys_.end() ||
-         std::any_of(patterns_.begin(), patterns_.end(),
-                     [&](const std::regex& pattern) { return std::regex_match(key, pattern); });
+         std::any_of(patterns_.begin(), patterns_.end(), [&](const Pattern& pattern) {
+           return ::regexec(pattern.get(), key.c_str(), 0, nullptr, 0) == 0;
+         });
 }
 
 bool Selection::hasGlobal() const {

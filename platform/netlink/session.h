@@ -1,9 +1,10 @@
 #pragma once
 
+#include <regex.h>
+
 #include <functional>
 #include <memory>
 #include <optional>
-#include <regex>
 #include <string>
 #include <utility>
 #include <vector>
@@ -36,8 +37,18 @@ class Selection {
   [[nodiscard]] std::optional<Dictionary> read(nl_sock* socket) const;
 
  private:
+  struct FreePattern {
+    void operator()(regex_t* pattern) const {
+      ::regfree(pattern);
+      std::default_delete<regex_t>()(pattern);
+    }
+  };
+  using Pattern = std::unique_ptr<regex_t, FreePattern>;
+
+  [[nodiscard]] static Pattern compile(const std::string& pattern);
+
   std::vector<std::string> keys_;
-  std::vector<std::regex> patterns_;
+  std::vector<Pattern> patterns_;
 };
 
 }  // namespace netlink

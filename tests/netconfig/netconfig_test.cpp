@@ -128,11 +128,11 @@ TEST_F(Netconfig, DestinationIsReachedFromTheFirstInterfaceInItsSubnet) {
       {{}, "192.168.1.20", std::nullopt},
   };
   for (const auto& [entries, destination, local] : cases) {
-    std::vector<Dictionary::Pair> contents;
+    Dictionary contents;
     for (const Dictionary& entry : entries) {
-      contents.emplace_back("interface " + std::to_string(contents.size()), entry);
+      contents = contents.with("interface " + std::to_string(contents.size()), entry);
     }
-    store.change(Dictionary(std::move(contents)));
+    store.change(contents);
     EXPECT_EQ(local_address_for_destination(destination), local) << destination;
   }
 }
