@@ -111,9 +111,14 @@ bool operator==(const Dictionary& a, const Dictionary& b) {
   return a.pairs_ == b.pairs_ || std::equal(a.begin(), a.end(), b.begin(), b.end());
 }
 
+Value::Value(std::uint64_t value) : storage_(value) {
+  if (std::in_range<std::int64_t>(value)) storage_ = static_cast<std::int64_t>(value);
+}
+
 std::optional<bool> Value::boolean() const {
   if (const auto* flag = as<bool>()) return *flag;
   if (const auto* integer = as<std::int64_t>()) return *integer != 0;
+  if (as<std::uint64_t>()) return true;
   if (const auto* real = as<double>()) return *real != 0;
   return std::nullopt;
 }
@@ -121,6 +126,7 @@ std::optional<bool> Value::boolean() const {
 std::int64_t Value::integerValue() const {
   if (const auto* flag = as<bool>()) return *flag ? 1 : 0;
   if (const auto* integer = as<std::int64_t>()) return *integer;
+  if (as<std::uint64_t>()) return std::numeric_limits<std::int64_t>::max();
   if (const auto* real = as<double>()) return saturated(*real);
   if (const auto* text = as<std::string>()) return leadingInteger(*text);
   return 0;

@@ -74,12 +74,14 @@ class Dictionary {
 /// One property-list value.
 class Value {
  public:
-  using Storage =
-      std::variant<bool, std::int64_t, double, std::string, Data, Date, Array, Dictionary>;
+  /// An integer is signed wherever it fits; the unsigned kind holds those of 2^63 and above only.
+  using Storage = std::variant<bool, std::int64_t, std::uint64_t, double, std::string, Data, Date,
+                               Array, Dictionary>;
 
   Value(bool value) : storage_(value) {}
   Value(int value) : storage_(std::int64_t{value}) {}
   Value(std::int64_t value) : storage_(value) {}
+  Value(std::uint64_t value);
   Value(double value) : storage_(value) {}
   Value(const char* value) : storage_(std::string(value)) {}
   Value(std::string value) : storage_(std::move(value)) {}
@@ -97,13 +99,13 @@ class Value {
   }
 
   /// Booleans, integers and reals are all numbers.
-  [[nodiscard]] bool isNumber() const { return storage_.index() <= 2; }
+  [[nodiscard]] bool isNumber() const { return storage_.index() <= 3; }
 
   /// The truth of a number (non-zero is true); nothing for a value that is no number.
   [[nodiscard]] std::optional<bool> boolean() const;
 
-  /// A number cut to an integer; for a string its leading decimal integer, after blanks and a sign,
-  /// kept within the 64-bit range; 0 for everything else.
+  /// A number cut to an integer and kept within the signed 64-bit range; for a string likewise its
+  /// leading decimal integer, after blanks and a sign; 0 for everything else.
   [[nodiscard]] std::int64_t integerValue() const;
 
   friend bool operator==(const Value& a, const Value& b) { return a.storage_ == b.storage_; }

@@ -1,0 +1,126 @@
+#include "platform/freedesktop/language.h"
+
+#include <algorithm>
+#include <array>
+#include <utility>
+
+namespace onramp {
+
+namespace {
+
+struct Renamed {
+  std::string_view from;
+  std::string_view to;
+};
+
+// Names that bundles had before codes came into use, and codes that were replaced.
+constexpr std::array kRenamed = {
+    Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},
+    Renamed{"japanese", "ja"},  Renamed{"italian", "it"}, Renamed{"spanish", "es"},
+    Renamed{"dutch", "nl"},     Renamed{"swedish", "sv"}, Renamed{"danish", "da"},
+    Renamed{"norwegian", "no"}, Renamed{"finnish", "fi"}, Renamed{"portuguese", "pt"},
+    Renamed{"korean", "ko"},    Renamed{"chinese", "zh"}, Renamed{"russian", "ru"},
+    Renamed{"polish", "pl"},    Renamed{"czech", "cs"},   Renamed{"hungarian", "hu"},
+    Renamed{"turkish", "tr"},   Renamed{"greek", "el"},   Renamed{"arabic", "ar"},
+    Renamed{"hebrew", "he"},    Renamed{"thai", "th"},    Renamed{"ukrainian", "uk"},
+    Renamed{"nb", "no"},        Renamed{"iw", "he"},      Renamed{"in", "id"}};
+
+bool isLetter(char c) {
+  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
+}
+
+char small(char c) {
+  return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+}
+
+char capital(char c) {
+  return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
+}
+
+template <typename Convert>
+std::string converted(std::string_view text, Convert convert) {
+  std::string result(text);
+  std::transform(result.begin(), result.end(), result.begin(), convert);
+  return result;
+}
+
+std::string_view takePart(std::string_view& identifier) {
+  const std::size_t end = std::min(identifier.find_first_of("-_"), identifier.size());
+  const std::string_view part = identifier.substr(0, end);
+  identifier.remove_prefix(std::min(end + 1, identifier.size()));
+  return part;
+}
+
+std::string codeOf(std::string_view name) {
+  std::string code = converted(name, small);
+  for (const Renamed& renamed : kRenamed) {
+    if (code == renamed.from) code = renamed.to;
+  }
+  const bool valid =
+      (code.size() == 2 || code.size() == 3) && std::all_of(code.begin(), code.end(), isLetter);
+  return valid ? code : std::string();
+}
+
+std::string chineseScript(std::string_view region) {
+  return region == "TW" || region == "HK" || region == "MO" ? "Hant" : "Hans";
+}
+
+// How well an offered language serves a preferred one; 0 when not at all.
+int fitness(const Language& offered, const Language& preferred) {
+  if (offered.code.empty() || offered.code != preferred.code) return 0;
+  if (!offered.script.empty() && !preferred.script.empty() && offered.script != preferred.script) {
+    return 0;
+  }
+  if (offered.region == preferred.region) return 3;
+  return offered.region.empty() ? 2 : 1;
+}
+
+// Moves those of `offered` that serve `wanted` to the end of `chosen`, the fittest first.
+bool choose(std::vector<std::string>& offered, const Language& wanted,
+            std::vector<std::string>& chosen) {
+  std::vector<std::pair<int, std::string>> fitting;
+  std::erase_if(offered, [&](const std::string& name) {
+    const int fit = fitness(Language::parse(name), wanted);
+    if (fit > 0) fitting.emplace_back(-fit, name);
+    return fit > 0;
+  });
+  std::sort(fitting.begin(), fitting.end());
+  for (auto& [unused, name] : fitting)
+    chosen.push_back(std::move(name));
+  return !fitting.empty();
+}
+
+}  // namespace
+
+Language Language::parse(std::string_view identifier) {
+  // A POSIX locale's character set and modifier say nothing that counts here.
+  identifier = identifier.substr(0, identifier.find_first_of(".@"));
+  Language language;
+  language.code = codeOf(takePart(identifier));
+  while (!identifier.empty()) {
+    const std::string_view part = takePart(identifier);
+    if (!std::all_of(part.begin(), part.end(), isLetter)) continue;
+    if (part.size() == 4) {
+      language.script = converted(part, small);
+      language.script[0] = capital(language.script[0]);
+    }
+    if (part.size() == 2) language.region = converted(part, capital);
+  }
+  if (language.code == "zh" && language.script.empty()) {
+    language.script = chineseScript(language.region);
+  }
+  return language;
+}
+
+std::vector<std::string> languagesToSearch(std::vector<std::string> offered,
+                                           const std::vector<std::string>& preferred,
+                                           const std::string& development) {
+  std::vector<std::string> chosen;
+  for (const std::string& identifier : preferred) {
+    if (choose(offered, Language::parse(identifier), chosen)) break;
+  }
+  choose(offered, Language::parse(development), chosen);
+  return chosen;
+}
+
+}  // namespace onramp

@@ -1,0 +1,58 @@
+#include "platform/system_version.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <string_view>
+#include <utility>
+
+#include "platform/freedesktop/stand_in_system.h"
+#include "platform/value.h"
+
+namespace onramp {
+
+namespace {
+
+constexpr const char* kDefaultVersion = "10.15.7";
+
+std::string& chosenVersion() {
+  static std::string version;
+  return version;
+}
+
+std::string runningVersion() {
+  if (!chosenVersion().empty()) return chosenVersion();
+  const char* const version = std::getenv("ONRAMP_SYSTEM_VERSION");
+  return version && *version ? version : kDefaultVersion;
+}
+
+// The number before the next point, which is taken off with it.
+std::int64_t takeComponent(std::string_view& version, std::int64_t most) {
+  const std::int64_t number = leadingInteger(version.substr(0, version.find('.')));
+  version.remove_prefix(std::min(version.find('.'), version.size() - 1) + 1);
+  return std::clamp<std::int64_t>(number, 0, most);
+}
+
+}  // namespace
+
+void setSystemVersion(std::string version) {
+  chosenVersion() = std::move(version);
+}
+
+std::optional<std::string> productVersion() {
+  return runningVersion();
+}
+
+std::optional<std::int32_t> gestaltSystemVersion() {
+  // A point more, so that every component ends with one.
+  const std::string version = runningVersion() + "...";
+  std::string_view rest = version;
+  std::int64_t digits = takeComponent(rest, 9999);
+  std::int32_t coded = 0;
+  for (int shift = 8; digits > 0; digits /= 10, shift += 4)
+    coded |= static_cast<std::int32_t>(digits % 10) << shift;
+  const auto minor = static_cast<std::int32_t>(takeComponent(rest, 9));
+  const auto bugFix = static_cast<std::int32_t>(takeComponent(rest, 9));
+  return coded | minor << 4 | bugFix;
+}
+
+}  // namespace onramp

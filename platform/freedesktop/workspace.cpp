@@ -1,0 +1,55 @@
+#include "platform/workspace.h"
+
+#include <unistd.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <optional>
+#include <string_view>
+#include <system_error>
+#include <thread>
+
+#include "platform/freedesktop/process.h"
+
+namespace onramp {
+
+namespace {
+
+std::optional<std::string> programOnPath(std::string_view name) {
+  const char* const list = std::getenv("PATH");
+  for (std::string_view rest = list ? list : ""; !rest.empty();) {
+    const std::size_t end = rest.find(':');
+    const std::string folder(rest.substr(0, end));
+    rest.remove_prefix(end == std::string_view::npos ? rest.size() : end + 1);
+    // The empty entry, which stands for the current folder, is no place to run programs from.
+    if (folder.empty()) continue;
+    std::string program = folder + "/" + std::string(name);
+    std::error_code ignored;
+    if (std::filesystem::is_regular_file(program, ignored) && access(program.c_str(), X_OK) == 0) {
+      return program;
+    }
+  }
+  return std::nullopt;
+}
+
+bool openWithDesktop(const std::string& target) {
+  const auto opener = programOnPath("xdg-open");
+  const auto process = opener ? startProcess(*opener, {target}, Session::kOwn) : std::nullopt;
+  if (!process) return false;
+  // Somebody has to wait for it, or a zombie stays until this program ends.
+  std::thread([process] { waitForProcess(*process); }).detach();
+  return true;
+}
+
+}  // namespace
+
+bool openFile(const std::string& path) {
+  // Nothing but a path begins like this: neither an option nor an address.
+  return openWithDesktop(path.starts_with('/') ? path : "./" + path);
+}
+
+bool openURL(const std::string& url) {
+  return !url.starts_with('-') && openWithDesktop(url);
+}
+
+}  // namespace onramp

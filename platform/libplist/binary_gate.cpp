@@ -1,0 +1,184 @@
+#include "platform/libplist/binary_gate.h"
+
+#include <algorithm>
+#include <vector>
+
+#include "platform/libplist/cursor.h"
+#include "platform/libplist/limits.h"
+
+namespace onramp::libplist {
+
+namespace {
+
+constexpr std::string_view kHeader = "bplist00";
+constexpr std::size_t kTrailerSize = 32;
+
+// The high half of an object's first byte.
+enum Kind : std::uint64_t {
+  kSimple = 0x0,
+  kInteger = 0x1,
+  kReal = 0x2,
+  kDate = 0x3,
+  kData = 0x4,
+  kASCII = 0x5,
+  kUTF16 = 0x6,
+  kUID = 0x8,
+  kArray = 0xA,
+  kSet = 0xC,
+  kDictionary = 0xD,
+};
+
+// What an object comes to with everything that it refers to, each reference counted anew.
+struct Cost {
+  std::uint64_t objects = 1;
+  std::uint64_t bytes = 0;
+  std::size_t depth = 0;
+
+  // Sums cannot overflow: each side is within the limits.
+  void add(const Cost& inner) {
+    objects += inner.objects;
+    bytes += inner.bytes;
+    depth = std::max(depth, inner.depth + 1);
+  }
+
+  [[nodiscard]] bool withinLimits() const {
+    return objects <= kMostObjects && bytes <= kMostBytes && depth <= kMostDepth;
+  }
+};
+
+bool isNumberSize(std::uint64_t size) {
+  return size == 1 || size == 2 || size == 4 || size == 8;
+}
+
+class Walk {
+ public:
+  explicit Walk(std::string_view bytes) : bytes_(bytes) {}
+
+  bool run() {
+    if (bytes_.size() < kHeader.size() + kTrailerSize || !bytes_.starts_with(kHeader)) return false;
+    Cursor trailer(bytes_, bytes_.size() - kTrailerSize + 6);
+    const std::uint64_t offsetSize = trailer.number(1).value_or(0);
+    const std::uint64_t referenceSize = trailer.number(1).value_or(0);
+    const std::uint64_t objects = trailer.number(8).value_or(0);
+    const std::uint64_t root = trailer.number(8).value_or(0);
+    const std::uint64_t table = trailer.number(8).value_or(0);
+    if (!isNumberSize(offsetSize) || !isNumberSize(referenceSize) || objects > kMostObjects ||
+        table < kHeader.size() || table > bytes_.size() - kTrailerSize) {
+      return false;
+    }
+    referenceSize_ = static_cast<std::size_t>(referenceSize);
+    objects_ = bytes_.substr(0, static_cast<std::size_t>(table));
+    Cursor offsets(bytes_.substr(0, bytes_.size() - kTrailerSize), table);
+    offsets_.reserve(static_cast<std::size_t>(objects));
+    for (std::uint64_t i = 0; i < objects; ++i) {
+      const auto offset = offsets.number(static_cast<std::size_t>(offsetSize));
+      if (!offset) return false;
+      offsets_.push_back(*offset);
+    }
+    states_.resize(offsets_.size());
+    return root < objects && visit(static_cast<std::size_t>(root), 0);
+  }
+
+ private:
+  enum class Progress { kUnseen, kOpen, kDone };
+  struct State {
+    Progress progress = Progress::kUnseen;
+    Cost cost;
+  };
+
+  // Fills in the object's cost; false when the object is not to be built. Recursion ends at the
+  // depth limit.
+  bool visit(std::size_t index, std::size_t depth) {
+    State& state = states_[index];
+    if (state.progress == Progress::kOpen || depth > kMostDepth) return false;
+    if (state.progress == Progress::kDone) return true;
+    state.progress = Progress::kOpen;
+    Cursor object(objects_, offsets_[index]);
+    const auto marker = object.number(1);
+    if (!marker || !measure(*marker >> 4, *marker & 0xF, object, state.cost, depth)) return false;
+    state.progress = Progress::kDone;
+    return state.cost.withinLimits();
+  }
+
+  bool measure(std::uint64_t kind, std::uint64_t low, Cursor& object, Cost& cost,
+               std::size_t depth) {
+    switch (kind) {
+      case kSimple:
+        return low == 0x8 || low == 0x9;  // false and true; null has no place in a list
+      case kInteger:
+        return low <= 4 && object.take(std::uint64_t{1} << low);
+      case kReal:
+        return (low == 2 || low == 3) && object.take(std::uint64_t{1} << low);
+      case kDate:
+        return low == 3 && object.take(8);
+      case kUID:
+        return isNumberSize(low + 1) &&
+               object.number(static_cast<std::size_t>(low) + 1).value_or(UINT64_MAX) <= UINT32_MAX;
+      case kData:
+      case kASCII:
+        return measureBytes(count(low, object), 1, object, cost);
+      case kUTF16:
+        return measureBytes(count(low, object), 2, object, cost);
+      case kArray:
+      case kSet:
+        return measureItems(count(low, object), object, cost, depth);
+      case kDictionary:
+        return measureEntries(count(low, object), object, cost, depth);
+      default:
+        return false;
+    }
+  }
+
+  // The count of a container's items or of a text's units; an impossible one when it is malformed.
+  static std::uint64_t count(std::uint64_t low, Cursor& object) {
+    if (low < 0xF) return low;
+    const std::uint64_t marker = object.number(1).value_or(0);
+    if (marker >> 4 != kInteger || (marker & 0xF) > 3) return UINT64_MAX;
+    return object.number(std::size_t{1} << (marker & 0xF)).value_or(UINT64_MAX);
+  }
+
+  static bool measureBytes(std::uint64_t units, std::uint64_t unitSize, Cursor& object,
+                           Cost& cost) {
+    if (units > kMostBytes) return false;
+    cost.bytes = units * unitSize;
+    return object.take(cost.bytes).has_value();
+  }
+
+  bool measureItems(std::uint64_t items, Cursor& object, Cost& cost, std::size_t depth) {
+    if (items > kMostObjects) return false;
+    for (std::uint64_t i = 0; i < items; ++i) {
+      const auto item = object.number(referenceSize_);
+      if (!item || *item >= states_.size()) return false;
+      const auto index = static_cast<std::size_t>(*item);
+      if (!visit(index, depth + 1)) return false;
+      cost.add(states_[index].cost);
+      if (!cost.withinLimits()) return false;
+    }
+    return true;
+  }
+
+  bool measureEntries(std::uint64_t entries, Cursor& object, Cost& cost, std::size_t depth) {
+    Cursor keys = object;
+    for (std::uint64_t i = 0; i < std::min(entries, kMostObjects); ++i) {
+      const auto key = keys.number(referenceSize_);
+      if (!key || *key >= states_.size()) return false;
+      const auto marker = Cursor(objects_, offsets_[static_cast<std::size_t>(*key)]).number(1);
+      if (!marker || (*marker >> 4 != kASCII && *marker >> 4 != kUTF16)) return false;
+    }
+    return entries <= kMostObjects && measureItems(2 * entries, object, cost, depth);
+  }
+
+  std::string_view bytes_;
+  std::string_view objects_;  ///< the file up to the table of offsets
+  std::size_t referenceSize_ = 0;
+  std::vector<std::uint64_t> offsets_;
+  std::vector<State> states_;
+};
+
+}  // namespace
+
+bool mayReadBinary(std::string_view bytes) {
+  return bytes.size() <= kMostBytes && Walk(bytes).run();
+}
+
+}  // namespace onramp::libplist

@@ -1,0 +1,85 @@
+#include "platform/libplist/parse.h"
+
+#include <locale.h>
+
+#include <cstdint>
+#include <memory>
+#include <type_traits>
+
+#include "platform/libplist/binary_gate.h"
+#include "platform/libplist/node.h"
+#include "platform/libplist/xml_gate.h"
+#include "platform/text.h"
+
+namespace onramp::libplist {
+
+namespace {
+
+// libplist reads and writes real numbers by the thread's locale, which for a desktop program is the
+// user's and may have a decimal comma.
+class PlainNumbers {
+ public:
+  PlainNumbers() : plain_(newlocale(LC_ALL_MASK, "C", nullptr)), before_(uselocale(plain_)) {}
+  PlainNumbers(const PlainNumbers&) = delete;
+  PlainNumbers& operator=(const PlainNumbers&) = delete;
+  ~PlainNumbers() {
+    uselocale(before_);
+    freelocale(plain_);
+  }
+
+ private:
+  locale_t plain_;
+  locale_t before_;
+};
+
+struct XMLFree {
+  void operator()(char* text) const { plist_to_xml_free(text); }
+};
+
+// An XML reader takes a bare carriage return for a line's end.
+void referToCarriageReturns(std::string& xml) {
+  for (std::size_t at = xml.find('\r'); at != std::string::npos; at = xml.find('\r', at))
+    xml.replace(at, 1, "&#13;");
+}
+
+// Readers expect a year of four digits.
+void padYears(std::string& xml) {
+  constexpr std::string_view kDate = "<date>";
+  for (std::size_t at = xml.find(kDate); at != std::string::npos; at = xml.find(kDate, at)) {
+    at += kDate.size();
+    const std::size_t digits = xml.find('-', at) - at;
+    if (digits < 4) xml.insert(at, 4 - digits, '0');
+  }
+}
+
+}  // namespace
+
+std::optional<Value> parsePropertyList(std::string bytes) {
+  const PlainNumbers plainNumbers;
+  plist_t root = nullptr;
+  if (bytes.starts_with("bplist")) {
+    if (!mayReadBinary(bytes)) return std::nullopt;
+    plist_from_bin(bytes.data(), static_cast<std::uint32_t>(bytes.size()), &root);
+  } else {
+    std::optional<std::string> text = decodedText(bytes);
+    if (!text || !mayReadXML(*text)) return std::nullopt;
+    plist_from_xml(text->c_str(), static_cast<std::uint32_t>(text->size()), &root);
+  }
+  const Node node(root);
+  return node ? std::optional(valueOf(node.get())) : std::nullopt;
+}
+
+std::string formatPropertyList(const Dictionary& dictionary) {
+  const PlainNumbers plainNumbers;
+  const Node node = nodeOf(dictionary);
+  char* text = nullptr;
+  std::uint32_t size = 0;
+  plist_to_xml(node.get(), &text, &size);
+  const std::unique_ptr<char, XMLFree> owned(text);
+  std::string xml = text ? std::string(text, size) : std::string();
+  referToCarriageReturns(xml);
+  padYears(xml);
+  return xml;
+}
+
+}  // namespace onramp::libplist

@@ -1,0 +1,23 @@
+#include "platform/property_list.h"
+
+#include <utility>
+
+#include "platform/libplist/file.h"
+#include "platform/libplist/limits.h"
+#include "platform/libplist/parse.h"
+
+namespace onramp {
+
+std::optional<Dictionary> loadDictionary(const std::string& path) {
+  std::optional<std::string> bytes = libplist::readFile(path, libplist::kMostBytes);
+  const auto value = bytes ? libplist::parsePropertyList(std::move(*bytes)) : std::nullopt;
+  const auto* const dictionary = value ? value->as<Dictionary>() : nullptr;
+  return dictionary ? std::optional(*dictionary) : std::nullopt;
+}
+
+bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path) {
+  const std::string xml = libplist::formatPropertyList(dictionary);
+  return !xml.empty() && libplist::writeFileAtomically(path, xml);
+}
+
+}  // namespace onramp

@@ -1,0 +1,126 @@
+#include "platform/libplist/xml_gate.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+#include "platform/libplist/limits.h"
+
+namespace onramp::libplist {
+
+namespace {
+
+constexpr std::size_t kNone = std::string::npos;
+
+class Walk {
+ public:
+  explicit Walk(std::string& text) : text_(text) {}
+
+  bool run() {
+    if (text_.find('\0') != kNone) return false;
+    while (at_ < text_.size()) {
+      const std::size_t markup = std::min(text_.find('<', at_), text_.size());
+      if (!characters(markup)) return false;
+      at_ = markup;
+      if (at_ < text_.size() && !markupHere()) return false;
+    }
+    return containers_.empty();
+  }
+
+ private:
+  bool characters(std::size_t end) {
+    const std::string_view run = std::string_view(text_).substr(at_, end - at_);
+    const auto entities = static_cast<std::uint64_t>(std::count(run.begin(), run.end(), '&'));
+    return spend(entities * run.size());
+  }
+
+  bool markupHere() {
+    const std::string_view here = std::string_view(text_).substr(at_);
+    if (here.starts_with("<!--")) return skipPast("-->", 4);
+    if (here.starts_with("<![CDATA[")) return skipPast("]]>", 9);
+    if (here.starts_with("<?")) return skipPast("?>", 1) && quotesArePaired();
+    if (here.starts_with("<!DOCTYPE")) return skipPast(">", 9) && quotesArePaired("[");
+    if (here.starts_with("<!")) return false;
+    return skipPast(">", 1) && quotesArePaired("<") && tag();
+  }
+
+  // Past the next `end`, from `from` characters on; the markup skipped is then `skipped_`.
+  bool skipPast(std::string_view end, std::size_t from) {
+    const std::size_t found = text_.find(end, at_ + from);
+    if (found == kNone) return false;
+    skipped_ = std::string_view(text_).substr(at_ + from, found - at_ - from);
+    start_ = at_ + from;
+    at_ = found + end.size();
+    return true;
+  }
+
+  // Then the end found is no part of a quoted text. None of `refused` may stand in the markup.
+  [[nodiscard]] bool quotesArePaired(std::string_view refused = "") const {
+    return std::count(skipped_.begin(), skipped_.end(), '"') % 2 == 0 &&
+           skipped_.find_first_of(refused) == kNone;
+  }
+
+  bool tag() {
+    const bool empty = skipped_.ends_with('/');
+    std::string_view name = skipped_.substr(0, skipped_.find_first_of(" \t\r\n"));
+    if (name.ends_with('/')) name.remove_suffix(1);
+    if (name.starts_with('/')) return close(name.substr(1));
+    if (++objects_ > kMostObjects) return false;
+    if (name == "key" && !containers_.empty()) ++containers_.back().keys;
+    if (name == "integer" && !empty) blankLeadingZeros();
+    if (empty || !isContainer(name)) return true;
+    containers_.push_back({start_, name.size(), 0});
+    return containers_.size() <= kMostDepth + 1;  // the outermost is <plist>
+  }
+
+  static bool isContainer(std::string_view name) {
+    return name == "dict" || name == "array" || name == "plist";
+  }
+
+  bool close(std::string_view name) {
+    if (!isContainer(name)) return true;
+    if (containers_.empty()) return false;
+    const Container closed = containers_.back();
+    containers_.pop_back();
+    return text_.compare(closed.name, closed.nameSize, name) == 0 &&
+           spend(closed.keys * closed.keys);
+  }
+
+  bool spend(std::uint64_t steps) {
+    steps_ += steps;
+    return steps_ <= kMostSquaredSteps;
+  }
+
+  void blankLeadingZeros() {
+    std::size_t digit = text_.find_first_not_of(" \t\r\n", at_);
+    if (digit != kNone && (text_[digit] == '-' || text_[digit] == '+')) ++digit;
+    const auto isDigit = [this](std::size_t index) {
+      return index < text_.size() && text_[index] >= '0' && text_[index] <= '9';
+    };
+    while (isDigit(digit) && text_[digit] == '0' && isDigit(digit + 1))
+      text_[digit++] = ' ';
+  }
+
+  struct Container {
+    std::size_t name;
+    std::size_t nameSize;
+    std::uint64_t keys;
+  };
+
+  std::string& text_;
+  std::size_t at_ = 0;
+  std::size_t start_ = 0;
+  std::string_view skipped_;
+  std::vector<Container> containers_;
+  std::uint64_t objects_ = 0;
+  std::uint64_t steps_ = 0;
+};
+
+}  // namespace
+
+bool mayReadXML(std::string& text) {
+  return text.size() <= kMostBytes && Walk(text).run();
+}
+
+}  // namespace onramp::libplist

@@ -1,0 +1,13 @@
+#pragma once
+
+#include <string>
+
+namespace onramp::libplist {
+
+/// Whether `text` (UTF-8 without a byte-order mark) is markup that libplist can read within the
+/// limits. Markup that libplist might take apart in another way than the check does, such as
+/// document types with an internal part, is refused. Integers lose their leading zeros on the way,
+/// because libplist would read those as octal.
+[[nodiscard]] bool mayReadXML(std::string& text);
+
+}  // namespace onramp::libplist

@@ -1,0 +1,247 @@
+#include <filesystem>
+
+#include "tests/app/wizard.h"
+
+namespace onramp {
+namespace {
+
+using recording::model;
+using StartUp = Wizard;
+
+TEST_F(StartUp, ShowsTheListWhenModelsDiffer) {
+  describeTwoModels();
+  launch();
+  EXPECT_EQ(page(), "ModelListView");
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
+  EXPECT_EQ(screen.log.back(), "key and front");
+}
+
+TEST_F(StartUp, SkipsTheListWhenAllModelsShareTheirCables) {
+  const char* const kWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
+  struct Case {
+    std::vector<Dictionary::Pair> models;
+    std::string page;
+    std::string secondChoice;
+  };
+  const Case cases[] = {
+      {{{"A", model(true, false, true)}}, "ConnectionTypeView", "INST_TXT_USB"},
+      {{{"A", model(true, true, true)}, {"B", model(true, true, false)}},
+       "ConnectionTypeView",
+       kWired},
+      {{{"A", model(false, true, true)}, {"B", model(false, true, true)}},
+       "ConnectionTypeView",
+       "INST_TXT_USB"},
+      {{{"A", model(true, true, true)}, {"B", model(true, false, true)}}, "ModelListView", ""},
+      {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, "ModelListView", ""}};
+  for (const Case& c : cases) {
+    screen.reset();
+    describe(c.models);
+    launch();
+    EXPECT_EQ(page(), c.page);
+    if (c.page != "ConnectionTypeView") continue;
+    EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no list to go back to";
+    EXPECT_EQ(screen.object("connectionTypeRadioButton").cells[std::pair(1, 0)], c.secondChoice);
+  }
+}
+
+TEST_F(StartUp, OpensThePackageAtOnceWhenNoModelIsWireless) {
+  const std::vector<std::vector<Dictionary::Pair>> media = {
+      {{"Cable", model(true, true, false)}},
+      {},
+      {{"No identifier", Dictionary{{"Interfaces", Dictionary{{"WirelessLAN", true}}}}}}};
+  for (std::size_t i = 0; i < media.size(); ++i) {
+    screen.reset();
+    describe(media[i]);
+    launch();
+    EXPECT_EQ(page(), "");
+    EXPECT_EQ(medium.opened(i + 1).size(), i + 1);
+    EXPECT_FALSE(medium.modelFile());
+    EXPECT_TRUE(medium.optionsFile());
+    screen.runTimers();
+    EXPECT_TRUE(screen.terminated);
+  }
+}
+
+TEST_F(StartUp, ListsModelsByTheirExactSpelling) {
+  describe({{"abc", model(true, true, true)}, {"ABD", model(true, false, true)}});
+  launch();
+  ASSERT_EQ(modelList().arrangedObjects().size(), 2U);
+  EXPECT_EQ(modelList().arrangedObjects()[0], (Dictionary{{"model", "ABD"}}));
+  EXPECT_EQ(modelList().selectionIndex(), 0U);
+}
+
+TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
+  describeTwoModels();
+  medium.setEnvironment("LANG", "ja_JP.UTF-8");
+  medium.write(
+      "MacResources/CDCommonMessage.bundle/Contents/Resources/ja.lproj/Localizable.strings",
+      std::string("\"APP_MENU_HIDEOHTERS\" = \"他を隠す\"; \"BTN_NEXT\" = \"次へ\";"));
+  medium.write("Onramp OSX.app/Contents/Resources/Background.png", std::string("picture"));
+  launch();
+  EXPECT_EQ(screen.object("window").text, "Onramp OSX");
+  EXPECT_EQ(screen.object("mBackGroundView").imagePath,
+            medium.path("Onramp OSX.app/Contents/Resources/Background.png"));
+  EXPECT_EQ(screen.object("mBackGroundView").scaling, ImageScaling::kAxesIndependently);
+  const Menu menu = mainMenu().itemWithTitle("Onramp OSX").submenu();
+  EXPECT_TRUE(menu.itemWithTitle("他を隠す"));
+  EXPECT_TRUE(menu.itemWithTitle("Show All")) << "keeps its English title without a translation";
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][次へ]");
+}
+
+TEST_F(StartUp, RemovesWhatAnEarlierRunHandedOver) {
+  describeTwoModels();
+  for (const std::string& file : {medium.modelFilePath(), medium.optionsFilePath()}) {
+    std::filesystem::create_directories(std::filesystem::path(file).parent_path());
+    std::filesystem::copy_file(medium.path("MacResources/CDInfo.plist"), file);
+  }
+  launch();
+  EXPECT_FALSE(medium.modelFile());
+  EXPECT_FALSE(medium.optionsFile());
+}
+
+TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
+  const std::string files[] = {"MacResources/Common.plist", "MacResources/CDInfo.plist",
+                               "MacResources/ModelInfo.plist",
+                               "Onramp OSX.app/Contents/Info.plist"};
+  struct Damage {
+    const char* name;
+    std::function<void(const std::string&)> apply;
+  };
+  const Damage damages[] = {
+      {"missing", [&](const std::string& f) { std::filesystem::remove(medium.path(f)); }},
+      {"truncated",
+       [&](const std::string& f) {
+         std::filesystem::resize_file(medium.path(f),
+                                      std::filesystem::file_size(medium.path(f)) / 2);
+       }},
+      {"a list",
+       [&](const std::string& f) {
+         medium.write(f, std::string("<plist version=\"1.0\"><array/></plist>"));
+       }},
+      {"wrong types", [&](const std::string& f) {
+         medium.write(f, Dictionary{{"CommonResourcePath", 1},
+                                    {"CDInfo", 1},
+                                    {"ModelInfo", 1},
+                                    {"PkgInfo", "x"},
+                                    {"ContainedModel", "x"},
+                                    {"Model", Array{1}},
+                                    {"VenderName", true},
+                                    {"SystemMax", 3},
+                                    {"WLANtool", 2.5}});
+       }}};
+  const std::string intact = medium.path("Onramp OSX.app/Contents/Info.plist");
+  const std::string copy = medium.path("../Info.plist");
+  std::filesystem::copy_file(intact, copy);
+  for (const std::string& file : files) {
+    for (const Damage& damage : damages) {
+      SCOPED_TRACE(file + " " + damage.name);
+      screen.reset();
+      std::filesystem::copy_file(copy, intact, std::filesystem::copy_options::overwrite_existing);
+      describeTwoModels();
+      damage.apply(file);
+      launch();
+      // Without its description a medium has no wireless model: the wizard is not needed.
+      EXPECT_EQ(page(), "");
+      screen.runTimers();
+      EXPECT_TRUE(screen.terminated);
+    }
+  }
+}
+
+TEST_F(StartUp, MakesTheVendorNameOfItsWords) {
+  const std::pair<Dictionary, std::string> cases[] = {
+      {{{"VenderName", "Kestrel Imaging  Works"}}, "KestrelImagingWorks"},
+      {{{"VenderName", 5}}, ""},
+      {{}, ""}};
+  for (const auto& [resources, expected] : cases) {
+    medium.write("MacResources/Common.plist", resources);
+    EXPECT_EQ(OnrampOSXAppDelegate::setVenderName(), expected);
+  }
+}
+
+TEST_F(StartUp, GoesOnWithoutAPageWhoseInterfaceFileIsMissing) {
+  describeTwoModels();
+  screen.missingInterfaces = {"ModelListView", "ChooseDeviceView"};
+  launch();
+  EXPECT_EQ(page(), "");
+  screen.click("rightMostButton");
+  EXPECT_TRUE(screen.terminated) << "with no page, every button quits";
+}
+
+struct SystemCase {
+  const char* system;
+  Dictionary minimum;
+  Dictionary maximum;
+  const char* alert;  // a part of the alert's text; empty for a supported system
+};
+
+Dictionary version(Value major, Value minor, Value bugFix) {
+  return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
+}
+
+class SystemRange : public Wizard, public testing::WithParamInterface<SystemCase> {};
+
+TEST_P(SystemRange, IsCheckedBeforeAnythingElse) {
+  const SystemCase& c = GetParam();
+  describeTwoModels(Dictionary{{"SystemMin", c.minimum}, {"SystemMax", c.maximum}});
+  medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
+  std::filesystem::create_directories(std::filesystem::path(medium.modelFilePath()).parent_path());
+  std::filesystem::copy_file(medium.path("MacResources/CDInfo.plist"), medium.modelFilePath());
+  launch();
+  if (*c.alert == '\0') {
+    EXPECT_TRUE(screen.alerts.empty());
+    EXPECT_EQ(page(), "ModelListView");
+    return;
+  }
+  ASSERT_EQ(screen.alerts.size(), 1U);
+  EXPECT_NE(screen.alerts[0].informativeText.find(c.alert), std::string::npos)
+      << screen.alerts[0].informativeText;
+  EXPECT_EQ(screen.alerts[0].buttonTitle, "Close");
+  EXPECT_EQ(screen.log, (std::vector<std::string>{"center", "close", "alert", "terminate"}));
+  EXPECT_EQ(page(), "");
+  EXPECT_TRUE(medium.modelFile()) << "no hand-off file is touched before the check";
+}
+
+const Dictionary kNone = version("0", "0", "0");
+
+INSTANTIATE_TEST_SUITE_P(
+    Systems, SystemRange,
+    testing::Values(
+        SystemCase{"10.5.8", version(10, 6, 0), kNone, "Mac OS X 10.6 or"},
+        SystemCase{"10.6.0", version("10", "6", "0"), kNone, ""},
+        SystemCase{"10.9.9", version(10, 10, 0), kNone, "Mac OS X 10.10 or"},
+        SystemCase{"10.6.2", version(10, 6, 3), kNone, "Mac OS X 10.6.3 or"},
+        SystemCase{"9.9.9", version(10, 0, 0), kNone, "Mac OS X 10.0 or"},
+        SystemCase{"10.9.5", kNone, version(10, 9, "X"), ""},
+        SystemCase{"10.10.0", kNone, version(10, 9, "X"), "Solutions Center"},
+        SystemCase{"10.9.2", kNone, version(10, 9, 3), ""},
+        SystemCase{"10.9.3", kNone, version("10", "9", "3"), "Solutions Center"},
+        SystemCase{"11.0", kNone, version(10, 15, "x"), "Solutions Center"},
+        SystemCase{"10.9", kNone, version(10, 9, 1), ""},
+        SystemCase{"10.9", kNone, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
+        SystemCase{"99.9.9", kNone, kNone, ""},
+        SystemCase{"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
+        // Outside both: the maximum is looked at first.
+        SystemCase{"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}));
+
+TEST_F(StartUp, FillsTheMinimumIntoAsManyPlacesAsTheTextHas) {
+  describeTwoModels(Dictionary{{"SystemMin", version(10, 11, 0)}});
+  const std::pair<std::string, std::string> texts[] = {{"%@ bis %@.", "10.11 bis 10.11."},
+                                                       {"%@", "10.11"},
+                                                       {"neuer", "neuer"},
+                                                       {"%@ %@ %@", "%@ %@ %@"}};
+  for (const auto& [text, expected] : texts) {
+    screen.reset();
+    medium.write(
+        "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings",
+        "\"INST_TXT_ALERT_OSMIN\" = \"" + text + "\";");
+    launch();
+    ASSERT_EQ(screen.alerts.size(), 1U);
+    EXPECT_EQ(screen.alerts[0].informativeText, expected);
+    EXPECT_EQ(screen.alerts[0].messageText,
+              "This OS version is not supported.\nSoftware cannot be installed.");
+  }
+}
+
+}  // namespace
+}  // namespace onramp

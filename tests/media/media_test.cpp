@@ -1,0 +1,135 @@
+#include <gtest/gtest.h>
+
+#include "media/CommonMessage.h"
+#include "media/KSInstallerInfo.h"
+#include "media/KSOROSXCD.h"
+#include "media/KSOROSXModel.h"
+#include "media/medium.h"
+#include "tests/recording/medium_folder.h"
+
+namespace onramp {
+namespace {
+
+using recording::MediumFolder;
+
+TEST(FullPath, CountsFromTheFolderThatHoldsTheBundle) {
+  struct Case {
+    const char* bundle;
+    std::optional<std::string> relative;
+    const char* expected;
+  };
+  const Case cases[] = {
+      {"/Volumes/Disc/Setup.app", "MacResources/Images", "/Volumes/Disc/MacResources/Images"},
+      {"/Setup.app", "MacResources/Images", "/MacResources/Images"},
+      {"/Volumes/Disc/Setup.app", "MacResources/", "/Volumes/Disc/MacResources"},
+      {"/Volumes/Disc/Setup.app", std::nullopt, "/Volumes/Disc"},
+      {"/Setup.app", std::nullopt, "/"},
+      {"Setup.app", "MacResources/", "MacResources"}};
+  for (const Case& c : cases) {
+    EXPECT_EQ(medium::fullPath(c.bundle, c.relative), c.expected) << c.bundle;
+  }
+}
+
+TEST(MediumDescription, TakesDefaultsForWhatIsMissingOrOfAnotherType) {
+  const Dictionary info{{"ContainedModel", Dictionary{{"ABD", 1}, {"abc", 1}, {"abE", 1}}},
+                        {"Type", Dictionary{{"Printer", "NO"}, {"TWAIN", 0}}},
+                        {"KSCSeriesCode", 7}};
+  const Dictionary common{{"BonjourNetwork", "_printer._tcp."}};
+  const Dictionary expected{{"contained models", Array{"abc", "ABD", "abE"}},
+                            {"support Printer Pacakge", true},
+                            {"support Scanner Package", false},
+                            {"KSC Series Code", ""},
+                            {"bonjour service type for browsing", "_printer._tcp."}};
+  EXPECT_EQ(KSOROSXCD::initWithCDInfoPlist(info, common), expected);
+
+  const Dictionary defaults{{"contained models", Array{}},
+                            {"support Printer Pacakge", true},
+                            {"support Scanner Package", true},
+                            {"KSC Series Code", ""},
+                            {"bonjour service type for browsing", ""}};
+  EXPECT_EQ(KSOROSXCD::initWithCDInfoPlist(std::nullopt, common), defaults)
+      << "without a description, the service type is not read either";
+  EXPECT_EQ(KSOROSXCD::initWithCDInfoPlist(Dictionary(), std::nullopt), defaults);
+}
+
+TEST(ModelRecord, FollowsTheModelInformation) {
+  const Dictionary interfaces{{"USB", "no"}, {"WiredLAN", 1}, {"WirelessLAN", "yes"}};
+  const Dictionary info{
+      {"Model", Dictionary{{"Plain", Dictionary{{"KSCID", "p"}}},
+                           {"Odd", Dictionary{{"KSCID", 5}, {"Interfaces", interfaces}}},
+                           {"Nameless", Dictionary{{"Interfaces", interfaces}}}}}};
+  const auto record = [](const char* name, Value id, bool usb, bool wired, bool wireless) {
+    return Dictionary{{"name", name},
+                      {"KSC model ID", std::move(id)},
+                      {"support USB", usb},
+                      {"support Ethernet", wired},
+                      {"support WiFi", wireless}};
+  };
+  EXPECT_EQ(KSOROSXModel::initWithName("Plain", info), record("Plain", "p", true, false, false));
+  EXPECT_EQ(KSOROSXModel::initWithName("Odd", info), record("Odd", 5, true, true, false));
+  EXPECT_EQ(KSOROSXModel::initWithName("Other", info), record("Other", "", true, false, false));
+  EXPECT_EQ(KSOROSXModel::initWithName("Odd", std::nullopt), record("Odd", "", true, false, false));
+  EXPECT_EQ(KSOROSXModel::initWithName("Nameless", info), (Dictionary{{"name", "Nameless"}}))
+      << "the record ends at the missing identifier";
+  EXPECT_EQ(KSOROSXModel::initWithName(std::nullopt, info), Dictionary());
+}
+
+TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
+  const Dictionary byVersion{
+      {"PkgLocation", "Packages/"}, {"104", "four.pkg"}, {"106", "six.pkg"}, {"109", "nine.pkg"}};
+  struct Case {
+    const char* system;
+    Dictionary package;
+    std::optional<std::string> expected;
+  };
+  const Case cases[] = {
+      {"10.6.8", byVersion, "Packages/six.pkg"},
+      {"10.3.9", byVersion, std::nullopt},
+      {"10.5.0", byVersion, std::nullopt},  // has a key, but the medium no package under it
+      {"10.15.7", byVersion, "Packages/nine.pkg"},
+      {"11.0.0", byVersion, "Packages/nine.pkg"},
+      {"101.0.0", byVersion, std::nullopt},  // past 0x100FF
+      {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+      {"10.6.8", Dictionary{{"PkgName", "all.pkg"}}, std::nullopt}};
+  for (const Case& c : cases) {
+    MediumFolder medium;
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
+    medium.describe(Dictionary{{"PkgInfo", c.package}}, {}, {});
+    const auto url = KSInstallerInfo().pkgURL();
+    EXPECT_EQ(url ? url->path : "none", c.expected ? medium.path(*c.expected) : "none") << c.system;
+  }
+}
+
+TEST(InstallerInformation, HasDefaultsForEveryMissingPart) {
+  const Dictionary unbounded{{"Major", "0"}, {"Minor", "0"}, {"BugFix", "0"}};
+  MediumFolder medium;
+  const KSInstallerInfo unreadable;
+  EXPECT_EQ(unreadable.pkgURL(), std::nullopt);
+  EXPECT_EQ(unreadable.WLANtoolURL(), std::nullopt);
+  EXPECT_EQ(unreadable.supportSystemMin(), unbounded);
+
+  const Dictionary minimum{{"Major", 10}};
+  medium.describe(Dictionary{{"SystemMax", "10.9"}, {"SystemMin", minimum}}, {}, {});
+  const KSInstallerInfo sparse;
+  EXPECT_EQ(sparse.supportSystemMax(), unbounded);
+  EXPECT_EQ(sparse.supportSystemMin(), minimum);
+  EXPECT_EQ(sparse.WLANtoolURL(), FileURL{medium.path("").substr(0, medium.path("").size() - 1)})
+      << "without a tool, the folder that holds the application";
+}
+
+TEST(CommonMessage, FallsBackWithoutABundleAndWithoutAKey) {
+  MediumFolder medium;
+  medium.setEnvironment("LANG", "de_DE.UTF-8");
+  EXPECT_EQ(localized("BTN_NEXT"), "BTN_NEXT");
+  const std::string bundle = "MacResources/CDCommonMessage.bundle/Contents/";
+  medium.write(bundle + "Resources/en.lproj/Localizable.strings",
+               std::string("\"BTN_NEXT\" = \"Next\"; \"ONLY\" = \"English\";"));
+  EXPECT_EQ(localized("BTN_NEXT", "x"), "Next") << "the development language, when no other";
+  medium.write(bundle + "Resources/de.lproj/Localizable.strings",
+               std::string("\"BTN_NEXT\" = \"Weiter\";"));
+  EXPECT_EQ(localized("BTN_NEXT", "x"), "Weiter");
+  EXPECT_EQ(localized("ONLY", "fallback"), "fallback");
+}
+
+}  // namespace
+}  // namespace onramp

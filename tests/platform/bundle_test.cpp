@@ -1,0 +1,146 @@
+#include "platform/bundle.h"
+
+#include <gtest/gtest.h>
+
+#include "platform/freedesktop/language.h"
+#include "tests/recording/medium_folder.h"
+
+namespace onramp {
+namespace {
+
+using Names = std::vector<std::string>;
+
+TEST(Language, IsToldFromEveryWayOfWritingIt) {
+  struct Case {
+    const char* identifier;
+    const char* code;
+    const char* script;
+    const char* region;
+  };
+  const Case cases[] = {{"ja", "ja", "", ""},
+                        {"ja_JP.UTF-8", "ja", "", "JP"},
+                        {"de_DE@euro", "de", "", "DE"},
+                        {"pt-BR", "pt", "", "BR"},
+                        {"zh_CN", "zh", "Hans", "CN"},
+                        {"zh-Hant", "zh", "Hant", ""},
+                        {"zh_TW", "zh", "Hant", "TW"},
+                        {"zh-Hans-CN", "zh", "Hans", "CN"},
+                        {"zh-Hant-HK", "zh", "Hant", "HK"},
+                        {"German", "de", "", ""},
+                        {"Japanese", "ja", "", ""},
+                        {"es-419", "es", "", ""},
+                        {"EN_us", "en", "", "US"},
+                        {"yue-Hant", "yue", "Hant", ""},
+                        {"nb_NO", "no", "", "NO"},
+                        {"Base", "", "", ""},
+                        {"", "", "", ""},
+                        {"../en", "", "", ""}};
+  for (const Case& c : cases) {
+    const Language language = Language::parse(c.identifier);
+    EXPECT_EQ(language.code, c.code) << c.identifier;
+    EXPECT_EQ(language.script, c.script) << c.identifier;
+    EXPECT_EQ(language.region, c.region) << c.identifier;
+  }
+}
+
+TEST(Language, IsChosenByLocaleThenLanguageThenDevelopment) {
+  struct Case {
+    Names offered;
+    Names preferred;
+    std::string development;
+    Names expected;
+  };
+  const Case cases[] = {{{"de", "en"}, {"de_AT"}, "en", {"de", "en"}},
+                        {{"de", "de_AT", "en"}, {"de_AT"}, "en", {"de_AT", "de", "en"}},
+                        {{"de_AT", "de_CH", "de"}, {"de"}, "en", {"de", "de_AT", "de_CH"}},
+                        {{"English", "German"}, {"de_DE"}, "English", {"German", "English"}},
+                        {{"English", "Japanese"}, {"fr"}, "en", {"English"}},
+                        {{"en", "fr"}, {"ko", "fr_CA"}, "en", {"fr", "en"}},
+                        {{"en", "pt-BR"}, {"pt_PT"}, "en", {"pt-BR", "en"}},
+                        {{"en", "zh_CN", "zh_TW"}, {"zh_CN"}, "en", {"zh_CN", "en"}},
+                        {{"en", "zh-Hans", "zh-Hant"}, {"zh_TW"}, "en", {"zh-Hant", "en"}},
+                        {{"en", "zh-Hans"}, {"zh_TW"}, "en", {"en"}},
+                        {{"en", "zh_TW"}, {"zh_HK"}, "en", {"zh_TW", "en"}},
+                        {{"en", "zh_CN"}, {"zh-Hans-SG"}, "en", {"zh_CN", "en"}},
+                        {{"en", "zh"}, {"zh-Hans-CN"}, "en", {"zh", "en"}},
+                        {{"sr", "sr-Latn"}, {"sr_RS"}, "en", {"sr", "sr-Latn"}},
+                        {{"ja"}, {"fr"}, "en", {}},
+                        {{"en", "ja"}, {"fr"}, "ja_JP", {"ja"}},
+                        {{}, {"en"}, "en", {}}};
+  for (const Case& c : cases) {
+    EXPECT_EQ(languagesToSearch(c.offered, c.preferred, c.development), c.expected)
+        << testing::PrintToString(c.offered) << " for " << testing::PrintToString(c.preferred);
+  }
+}
+
+class BundleOnMedium : public testing::Test {
+ protected:
+  void resource(const std::string& name, const std::string& bytes) const {
+    medium.write("Some.bundle/Contents/Resources/" + name, bytes);
+  }
+
+  [[nodiscard]] std::string text(const std::string& key) const {
+    const auto bundle = Bundle::open(medium.path("Some.bundle"));
+    return bundle ? bundle->localizedString(key, "fallback", std::nullopt) : "no bundle";
+  }
+
+  recording::MediumFolder medium;
+};
+
+TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAsTheDiskIsNow) {
+  EXPECT_EQ(text("k"), "no bundle");
+  resource("English.lproj/Localizable.strings", "k = english; only = english;");
+  resource("zh_CN.lproj/Localizable.strings", "\"k\" = \"简体\";");
+  medium.setEnvironment("LANG", "zh_CN.UTF-8");
+  EXPECT_EQ(text("k"), "简体");
+  EXPECT_EQ(text("only"), "fallback") << "one table is asked";
+  medium.setEnvironment("LANG", "ko_KR.UTF-8");
+  EXPECT_EQ(text("k"), "english");
+  medium.setEnvironment("LANGUAGE", "pt:zh_CN");
+  EXPECT_EQ(text("k"), "简体");
+  medium.setEnvironment("LC_ALL", "C");
+  EXPECT_EQ(text("k"), "english") << "the list counts for nothing in the C locale";
+
+  medium.setEnvironment("LC_ALL", "ko_KR.UTF-8");
+  medium.setEnvironment("LANGUAGE", std::nullopt);
+  medium.write("Some.bundle/Contents/Info.plist",
+               Dictionary{{"CFBundleDevelopmentRegion", "zh_CN"}});
+  EXPECT_EQ(text("k"), "简体");
+  resource("ko.lproj/Localizable.strings", "k = ");
+  EXPECT_EQ(text("k"), "fallback") << "the table cannot be read";
+  resource("ko.lproj/Localizable.strings", "k = korean;");
+  EXPECT_EQ(text("k"), "korean");
+  EXPECT_EQ(Bundle::open(medium.path("Some.bundle"))->localizedString("k", "v", "Other"), "v");
+}
+
+TEST_F(BundleOnMedium, FindsResourcesForEverybodyFirst) {
+  resource("Picture.png", "");
+  resource("de.lproj/Picture.png", "");
+  resource("de.lproj/Own.png", "");
+  resource("noextension", "");
+  medium.setEnvironment("LANG", "de_DE.UTF-8");
+  const std::string resources = medium.path("Some.bundle/Contents/Resources/");
+  const auto bundle = Bundle::open(medium.path("Some.bundle/"));
+  ASSERT_TRUE(bundle);
+  EXPECT_EQ(bundle->path(), medium.path("Some.bundle"));
+  EXPECT_EQ(bundle->pathForResource("Picture", "png"), resources + "Picture.png");
+  EXPECT_EQ(bundle->pathForResource("Own", "png"), resources + "de.lproj/Own.png");
+  EXPECT_EQ(bundle->pathForResource("noextension", ""), resources + "noextension");
+  EXPECT_EQ(bundle->pathForResource("de", "lproj"), std::nullopt) << "a folder";
+}
+
+TEST_F(BundleOnMedium, NamesItsProgramWhereverThatLies) {
+  medium.write("Some.bundle/Contents/Info.plist", Dictionary{{"CFBundleExecutable", "tool"}});
+  const std::string contents = medium.path("Some.bundle/Contents/");
+  const auto bundle = Bundle::open(medium.path("Some.bundle"));
+  EXPECT_EQ(bundle->executablePath(), contents + "Linux/tool");
+  medium.write("Some.bundle/Contents/MacOS/tool", std::string("#!/bin/sh\n"));
+  EXPECT_EQ(bundle->executablePath(), contents + "MacOS/tool");
+  medium.write("Some.bundle/Contents/Linux/tool", std::string("#!/bin/sh\n"));
+  EXPECT_EQ(bundle->executablePath(), contents + "Linux/tool");
+  medium.write("Some.bundle/Contents/Info.plist", Dictionary{{"CFBundleExecutable", 5}});
+  EXPECT_EQ(bundle->executablePath(), std::nullopt);
+}
+
+}  // namespace
+}  // namespace onramp

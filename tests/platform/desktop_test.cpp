@@ -1,0 +1,143 @@
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+
+#include <chrono>
+#include <filesystem>
+#include <thread>
+
+#include "platform/child_process.h"
+#include "platform/folders.h"
+#include "platform/freedesktop/stand_in_system.h"
+#include "platform/locale.h"
+#include "platform/system_version.h"
+#include "platform/workspace.h"
+#include "tests/recording/medium_folder.h"
+
+namespace onramp {
+namespace {
+
+using Environment = std::vector<std::pair<const char*, const char*>>;
+
+TEST(Desktop, TakesLanguageAndCountryFromTheUsualVariables) {
+  struct Case {
+    Environment environment;
+    const char* language;
+    const char* country;
+    std::vector<std::string> preferred;
+  };
+  const Case cases[] = {
+      {{{"LANG", "ja_JP.UTF-8"}}, "ja", "JP", {"ja_JP"}},
+      {{{"LANG", "ja_JP"}, {"LC_MESSAGES", "de_DE@euro"}}, "de", "DE", {"de_DE"}},
+      {{{"LANG", "ja_JP"}, {"LC_MESSAGES", "de_DE"}, {"LC_ALL", "fr_CA"}}, "fr", "CA", {"fr_CA"}},
+      {{{"LANG", "ja_JP"}, {"LC_ALL", ""}}, "ja", "JP", {"ja_JP"}},
+      {{{"LANG", "de_CH"}, {"LANGUAGE", "de_AT:fr"}}, "de", "AT", {"de_AT", "fr", "de_CH"}},
+      {{{"LANG", "de_CH"}, {"LANGUAGE", "fr"}}, "fr", "CH", {"fr", "de_CH"}},
+      {{{"LANG", "zh_TW"}, {"LANGUAGE", "::?:"}}, "zh", "TW", {"zh_TW"}},
+      {{{"LANG", "C.UTF-8"}, {"LANGUAGE", "fr"}}, "en", "", {"en"}},
+      {{{"LANG", "ja_JP"}, {"LC_ALL", "POSIX"}}, "en", "", {"en"}},
+      {{{"LANG", "de"}}, "de", "", {"de"}},
+      {{{"LANG", "nonsense"}}, "en", "", {"en"}},
+      {{{"LANG", ""}}, "en", "", {"en"}}};
+  for (const Case& c : cases) {
+    recording::MediumFolder medium;
+    for (const auto& [name, value] : c.environment)
+      medium.setEnvironment(name, value);
+    const std::string trace = testing::PrintToString(c.environment);
+    EXPECT_EQ(localeLanguageCode(), c.language) << trace;
+    EXPECT_EQ(localeCountryCode(), c.country) << trace;
+    EXPECT_EQ(preferredLanguages(), c.preferred) << trace;
+  }
+}
+
+TEST(Desktop, KeepsApplicationSupportInTheXDGFolders) {
+  recording::MediumFolder medium;
+  const std::string home = medium.path("home");
+  medium.setEnvironment("HOME", home);
+  medium.setEnvironment("XDG_DATA_HOME", medium.path("data/"));
+  EXPECT_EQ(applicationSupportFolder(FolderDomain::kUser), medium.path("data"));
+  EXPECT_TRUE(std::filesystem::is_directory(medium.path("data")));
+  for (const char* const unusable : {"", "relative/data"}) {
+    medium.setEnvironment("XDG_DATA_HOME", unusable);
+    EXPECT_EQ(applicationSupportFolder(FolderDomain::kUser), home + "/.local/share");
+  }
+  medium.setEnvironment("XDG_DATA_DIRS", ":relative:" + medium.path("a") + ":" + medium.path("b"));
+  EXPECT_EQ(applicationSupportFolder(FolderDomain::kLocal), medium.path("a"));
+  EXPECT_FALSE(std::filesystem::exists(medium.path("b")));
+  medium.setEnvironment("XDG_DATA_DIRS", std::nullopt);
+  EXPECT_EQ(applicationSupportFolder(FolderDomain::kLocal), "/usr/local/share");
+}
+
+TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
+  recording::MediumFolder medium;
+  medium.write("../bin/xdg-open", "#!/bin/sh\nsleep 0.2\nprintf '%s\\n' \"$#:$1\" >> '" +
+                                      medium.path("../opened") + "'\n");
+  medium.makeExecutable("../bin/xdg-open");
+  EXPECT_TRUE(openFile("/a folder/-it's \"the\" $package.pkg"));
+  EXPECT_TRUE(medium.opened(0).empty()) << "it came back before the opener had done anything";
+  ASSERT_EQ(medium.opened(1).size(), 1U);
+  EXPECT_EQ(medium.opened(1)[0], "1:/a folder/-it's \"the\" $package.pkg");
+  EXPECT_TRUE(openFile("-v"));
+  EXPECT_EQ(medium.opened(2).back(), "1:./-v");
+  EXPECT_TRUE(openURL("http://support.kestrel.example/?a=b&c=d"));
+  EXPECT_EQ(medium.opened(3).back(), "1:http://support.kestrel.example/?a=b&c=d");
+  EXPECT_FALSE(openURL("--help"));
+
+  const auto hasChildren = [] {
+    siginfo_t child{};
+    return waitid(P_ALL, 0, &child, WEXITED | WNOHANG | WNOWAIT) == 0;
+  };
+  for (int i = 0; i < 1000 && hasChildren(); ++i)
+    std::this_thread::sleep_for(std::chrono::milliseconds(10));
+  EXPECT_FALSE(hasChildren());
+}
+
+TEST(Desktop, OpensNothingWithoutAnOpener) {
+  recording::MediumFolder medium;
+  medium.write("bin/xdg-open", std::string("not executable"));
+  for (const std::string& path : {medium.path("bin") + ":", std::string()}) {
+    medium.setEnvironment("PATH", path);
+    EXPECT_FALSE(openFile("/package.pkg"));
+    EXPECT_FALSE(openURL("http://support.kestrel.example/"));
+  }
+}
+
+TEST(Desktop, TellsHowAChildProcessEnded) {
+  recording::MediumFolder medium;
+  const auto script = [&](const std::string& commands) {
+    medium.write("tool", "#!/bin/sh\n" + commands);
+    medium.makeExecutable("tool");
+    return medium.path("tool");
+  };
+  EXPECT_EQ(runAndWait(script("exit 0"), {}), 0);
+  EXPECT_EQ(runAndWait(script("[ \"$#:$1\" = '1:-installer' ] && exit 2"), {"-installer"}), 2);
+  EXPECT_EQ(runAndWait(script("kill -9 $$"), {}), std::nullopt);
+  EXPECT_EQ(runAndWait(medium.path("absent"), {}), std::nullopt);
+  medium.write("tool", std::string("no program"));
+  EXPECT_EQ(runAndWait(medium.path("tool"), {}), std::nullopt);
+  EXPECT_EQ(runAndWait(medium.path(""), {}), std::nullopt);
+}
+
+TEST(Desktop, StandsInForTheSystemThatItIsTold) {
+  recording::MediumFolder medium;
+  const std::pair<const char*, std::int32_t> cases[] = {
+      {"10.6.8", 0x1068},  {"10.3.9", 0x1039},  {"10.15.7", 0x1097}, {"10.9", 0x1090},
+      {"11.0.0", 0x1100},  {"14.6.10", 0x1469}, {"9.2.2", 0x922},    {"101.0.0", 0x10100},
+      {"10.-3.x", 0x1000}, {"system", 0},       {"10..5", 0x1005}};
+  for (const auto& [version, selector] : cases) {
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", version);
+    EXPECT_EQ(productVersion(), version);
+    EXPECT_EQ(gestaltSystemVersion(), selector) << version;
+  }
+  for (const auto& absent : {std::optional<std::string>(), std::optional<std::string>("")}) {
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", absent);
+    EXPECT_EQ(productVersion(), "10.15.7");
+  }
+  setSystemVersion("10.6.8");
+  medium.setEnvironment("ONRAMP_SYSTEM_VERSION", "10.9.5");
+  EXPECT_EQ(productVersion(), "10.6.8") << "what the front end was told counts more";
+  setSystemVersion("");
+  EXPECT_EQ(productVersion(), "10.9.5");
+}
+
+}  // namespace
+}  // namespace onramp

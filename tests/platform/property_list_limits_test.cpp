@@ -1,0 +1,162 @@
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <functional>
+
+#include "platform/property_list.h"
+#include "tests/platform/temporary_folder.h"
+
+namespace onramp {
+namespace {
+
+std::string repeated(const std::string& text, std::size_t times) {
+  std::string result;
+  for (std::size_t i = 0; i < times; ++i)
+    result += text;
+  return result;
+}
+
+std::string plist(const std::string& inside) {
+  return "<plist version=\"1.0\"><dict><key>k</key>" + inside + "</dict></plist>";
+}
+
+std::string bigEndian(std::size_t number, int bytes) {
+  std::string text;
+  for (int shift = 8 * (bytes - 1); shift >= 0; shift -= 8)
+    text += static_cast<char>(number >> shift & 0xFF);
+  return text;
+}
+
+std::string reference(std::size_t index) {
+  return bigEndian(index, 4);
+}
+
+// A binary list of these objects, the first one its root; references take four bytes.
+std::string binary(const std::vector<std::string>& objects) {
+  std::string bytes = "bplist00";
+  std::string offsets;
+  for (const std::string& object : objects) {
+    offsets += bigEndian(bytes.size(), 4);
+    bytes += object;
+  }
+  const std::size_t table = bytes.size();
+  return bytes + offsets + std::string(6, '\0') + "\4\4" + bigEndian(objects.size(), 8) +
+         bigEndian(0, 8) + bigEndian(table, 8);
+}
+
+// A dictionary whose one value is object 2, and then objects 2, 3, … as `object` makes them.
+std::string dictionaryOver(std::size_t count,
+                           const std::function<std::string(std::size_t)>& object) {
+  std::vector<std::string> objects{"\xD1" + reference(1) + reference(2), "\x51k"};
+  for (std::size_t i = 2; i < count + 2; ++i)
+    objects.push_back(object(i));
+  return binary(objects);
+}
+
+// Each array holds the next one `times` times; the last object is a text.
+std::string arrays(std::size_t depth, std::size_t times) {
+  return dictionaryOver(depth + 1, [&](std::size_t i) {
+    return i == depth + 2 ? std::string("\x51t")
+                          : static_cast<char>(0xA0 + times) + repeated(reference(i + 1), times);
+  });
+}
+
+struct Outcome {
+  bool read;
+  long peakKilobytes;
+};
+
+// Loads the file in a process of its own, whose memory can be told.
+Outcome load(const std::string& path) {
+  const pid_t loader = fork();
+  if (loader == 0) _exit(loadDictionary(path) ? 0 : 1);
+  int status = 0;
+  rusage usage{};
+  EXPECT_EQ(wait4(loader, &status, 0, &usage), loader);
+  EXPECT_TRUE(WIFEXITED(status)) << "the loading process crashed";
+  return {status == 0, usage.ru_maxrss};
+}
+
+TEST(Limits, AHostileFileIsUnreadableAndCostsLittle) {
+  const TemporaryFolder folder;
+  const std::pair<const char*, std::string> cases[] = {
+      {"XML nested 200,000 deep",
+       plist(repeated("<array>", 200000) + repeated("</array>", 200000))},
+      {"XML nested behind comments that seem to close it",
+       plist(repeated("<array><!--</array>-->", 100000) + repeated("</array>", 100000))},
+      {"XML nested behind what seems to be an instruction",
+       "<?>" + plist(repeated("<array>", 100000) + repeated("</array>", 100000)) + "?>"},
+      {"a document type with an internal part",
+       "<!DOCTYPE plist [<!ENTITY a \"b\">]>" + plist("<true/>")},
+      {"two million elements", plist("<array>" + repeated("<true/>", 2000000) + "</array>")},
+      {"a text of a million entities",
+       plist("<string>" + repeated("&amp;", 1000000) + "</string>")},
+      {"a dictionary of 100,000 keys that hash alike",
+       plist("<dict>" + repeated("<key>aa</key><true/>", 100000) + "</dict>")},
+      {"a file of 17 MiB", plist("<string>" + std::string(17 << 20, 'x') + "</string>")},
+      {"shared references that grow to 10^13 objects", arrays(13, 10)},
+      {"binary lists nested 100,000 deep", arrays(100000, 1)},
+      {"a shared text that grows to 200 GB",
+       dictionaryOver(3,
+                      [](std::size_t i) {
+                        return i == 2
+                                   ? "\xAF\x12" + bigEndian(200000, 4) +
+                                         repeated(reference(3), 200000)
+                                   : "\x5F\x12" + bigEndian(1000000, 4) + std::string(1000000, 'x');
+                      })},
+      {"a list that holds itself",
+       dictionaryOver(2, [](std::size_t i) { return "\xA1" + reference(5 - i); })}};
+  const long usual = load(folder.holding("usual", plist("<true/>"))).peakKilobytes;
+  for (const auto& [name, bytes] : cases) {
+    const Outcome outcome = load(folder.holding("list", bytes));
+    EXPECT_FALSE(outcome.read) << name;
+    EXPECT_LT(outcome.peakKilobytes - usual, 32 * 1024) << name;
+  }
+}
+
+TEST(Limits, LeaveRoomForWhatMediaHold) {
+  const TemporaryFolder folder;
+  std::string models;
+  for (int i = 0; i < 20000; ++i) {
+    models += "<key>Model " + std::to_string(i) +
+              "</key><dict><key>KSCID</key><string>k</string><key>Interfaces</key><dict>"
+              "<key>USB</key><true/></dict></dict>";
+  }
+  const std::pair<const char*, std::string> cases[] = {
+      {"20,000 models", plist("<dict>" + models + "</dict>")},
+      {"lists 100 deep", plist(repeated("<array>", 100) + repeated("</array>", 100))},
+      {"binary lists 100 deep", arrays(100, 1)},
+      {"shared references", arrays(4, 14)},
+      {"a long text with entities",
+       plist("<string>" + repeated("text &amp; text ", 1000) + "</string>")}};
+  for (const auto& [name, bytes] : cases)
+    EXPECT_TRUE(loadDictionary(folder.holding("list", bytes))) << name;
+}
+
+TEST(Limits, EveryObjectOfABinaryListHasToBeWhole) {
+  const TemporaryFolder folder;
+  const std::string whole = dictionaryOver(1, [](std::size_t) { return "\x51t"; });
+  ASSERT_TRUE(loadDictionary(folder.holding("list", whole)));
+  const std::pair<const char*, std::string> objects[] = {
+      {"null", std::string("\x00", 1)},
+      {"an unknown kind", "\x70"},
+      {"an integer of 32 bytes", "\x15" + std::string(32, '\1')},
+      {"a text past the objects", "\x5F\x12" + bigEndian(1000, 4) + "short"},
+      {"a text of 2^64-1 units", "\x6F\x13" + std::string(8, '\xFF')},
+      {"a size that is no integer", "\x5F\x51t"},
+      {"data without its size", "\x4F"},
+      {"an array past the objects", "\xA9"},
+      {"a reference past the table", "\xA1" + reference(3)},
+      {"a dictionary with a number for a key", "\xD1" + reference(2) + reference(1)}};
+  for (const auto& [name, object] : objects) {
+    const std::string bytes = dictionaryOver(1, [&o = object](std::size_t) { return o; });
+    EXPECT_FALSE(loadDictionary(folder.holding("list", bytes))) << name;
+  }
+  for (std::size_t size = 0; size < whole.size(); ++size)
+    EXPECT_FALSE(loadDictionary(folder.holding("list", whole.substr(0, size)))) << size;
+}
+
+}  // namespace
+}  // namespace onramp

@@ -1,0 +1,203 @@
+#include "platform/property_list.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <signal.h>
+#include <sys/resource.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <clocale>
+#include <limits>
+#include <random>
+#include <thread>
+
+#include "platform/child_process.h"
+#include "tests/platform/temporary_folder.h"
+
+namespace onramp {
+namespace {
+
+Date date(double seconds) {
+  return Date{seconds};
+}
+
+Data allBytes() {
+  Data data;
+  for (int i = 0; i < 256; ++i)
+    data.push_back(static_cast<std::byte>(i));
+  return data;
+}
+
+// The same as property_list_peer.py expects, but for two texts that XML cannot hold as they are.
+Dictionary everything() {
+  return Dictionary{{"false", false},
+                    {"true", true},
+                    {"zero", 0},
+                    {"negative", -1},
+                    {"least", std::numeric_limits<std::int64_t>::min()},
+                    {"greatest signed", std::numeric_limits<std::int64_t>::max()},
+                    {"unsigned", std::uint64_t{1} << 63},
+                    {"greatest", std::numeric_limits<std::uint64_t>::max()},
+                    {"real", 0.1},
+                    {"small", -5e-324},
+                    {"large", std::numeric_limits<double>::max()},
+                    {"whole", 2.0},
+                    {"infinite", std::numeric_limits<double>::infinity()},
+                    {"empty text", ""},
+                    {"markup", "<key>&amp; \"quoted\" 'too' ]]> </key>"},
+                    {"blanks", "  a\tb\nc\n "},
+                    {"carriage return", "a\rb\r\n"},
+                    {"Schlüssel 鍵 🖨", "Größe 大きさ 🖨"},
+                    {"<&>", "key with markup"},
+                    {"not for XML", "bell \a, broken \xFF\xC3"},
+                    {"data", allBytes()},
+                    {"no data", Data()},
+                    {"day", date(730902896)},
+                    {"before", date(-31622401)},
+                    {"far", date(63113904000)},
+                    {"first", date(-63113904000)},
+                    {"last", date(252423993599)},
+                    {"empty list", Array{}},
+                    {"list", Array{1, Array{2, Array{"three"}}, Dictionary{{"four", 4}}}},
+                    {"empty dictionary", Dictionary()}};
+}
+
+std::string plist(const std::string& inside) {
+  return "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+         "<!DOCTYPE plist PUBLIC \"-//Apple//DTD PLIST 1.0//EN\" "
+         "\"http://www.apple.com/DTDs/PropertyList-1.0.dtd\">\n"
+         "<plist version=\"1.0\"><dict>" +
+         inside + "</dict></plist>\n";
+}
+
+std::string utf16(const std::string& ascii, bool bigEndian) {
+  std::string bytes;
+  for (const char c : ascii)
+    bytes += bigEndian ? std::string{'\0', c} : std::string{c, '\0'};
+  return bytes;
+}
+
+TEST(PropertyList, HoldsEveryKindOfValueForAnotherReaderAndBack) {
+  const TemporaryFolder folder;
+  ASSERT_TRUE(writeDictionaryAtomically(everything(), folder / "written"));
+  ASSERT_EQ(
+      runAndWait(PYTHON, {PEER_READER, folder / "written", folder / "xml", folder / "binary"}), 0);
+  const Dictionary expected = everything().with("not for XML", "bell \uFFFD, broken \uFFFD\uFFFD");
+  for (const char* const name : {"written", "xml", "binary"}) {
+    const auto read = loadDictionary(folder / name);
+    ASSERT_TRUE(read) << name;
+    for (const auto& [key, value] : expected) {
+      // The other reader's own XML turns carriage returns into line feeds.
+      if (key == "carriage return" && name == std::string("xml")) continue;
+      const Value* const found = read->find(key);
+      EXPECT_TRUE(found && *found == value) << name << ": " << key;
+    }
+    EXPECT_EQ(read->size(), expected.size()) << name;
+  }
+}
+
+TEST(PropertyList, ReadsTheSameNumbersWithADecimalComma) {
+  const TemporaryFolder folder;
+  (void)runAndWait("/usr/bin/localedef", {"-i", "de_DE", "-f", "UTF-8", folder / "de_DE.UTF-8"});
+  setenv("LOCPATH", (folder / "").c_str(), 1);
+  if (!std::setlocale(LC_ALL, "de_DE.UTF-8")) GTEST_SKIP() << "Debian's package locales is missing";
+  EXPECT_TRUE(writeDictionaryAtomically(Dictionary{{"real", 1234.5}}, folder / "list"));
+  EXPECT_EQ(loadDictionary(folder / "list"), (Dictionary{{"real", 1234.5}}));
+  std::setlocale(LC_ALL, "C");
+  unsetenv("LOCPATH");
+}
+
+TEST(PropertyList, ReadsXMLAsPeopleWriteIt) {
+  const Dictionary expected{{"k", "a<b"}};
+  const std::pair<std::string, Dictionary> cases[] = {
+      {plist("<key>k</key><string>a&lt;b</string>"), expected},
+      {"\xEF\xBB\xBF" + plist("<key>k</key><string>a&lt;b</string>"), expected},
+      {"\xFF\xFE" + utf16(plist("<key>k</key><string>a&lt;b</string>"), false), expected},
+      {utf16(plist("<key>k</key><string>a&lt;b</string>"), true), expected},
+      {"<plist><dict><key>k</key><string><![CDATA[a<b]]></string></dict></plist>", expected},
+      {plist("<!-- <array> --><key>k</key><string>a<!-- > -->&#60;&#x62;</string>"), expected},
+      {plist("<key>k</key>\n\t<integer>010</integer><key>m</key><integer> -09</integer>"
+             "<key>h</key><integer>0x1F</integer><key>z</key><integer>00</integer>"),
+       Dictionary{{"k", 10}, {"m", -9}, {"h", 31}, {"z", 0}}},
+      {plist("<key>k</key><string/><key>t</key><true></true><key>d</key><dict/>"),
+       Dictionary{{"k", ""}, {"t", true}, {"d", Dictionary()}}}};
+  const TemporaryFolder folder;
+  for (const auto& [text, dictionary] : cases)
+    EXPECT_EQ(loadDictionary(folder.holding("list", text)), dictionary) << text;
+}
+
+TEST(PropertyList, AnswersNothingForEverythingElse) {
+  const std::string whole = plist("<key>k</key><string>text</string>");
+  const std::string cases[] = {"",
+                               "plain text",
+                               "<",
+                               "<plist version=\"1.0\"><array/></plist>",
+                               "<plist><string>text</string></plist>",
+                               "<html><body/></html>",
+                               whole.substr(0, whole.size() - 12),
+                               plist("<key>k</key>\xFF"),
+                               plist(std::string("<key>k</key><string>\0</string>", 31)),
+                               plist("<key>k</key><string>&unknown;</string>"),
+                               "bplist00",
+                               "bplist00" + std::string(40, '\xFF')};
+  const TemporaryFolder folder;
+  for (const std::string& bytes : cases)
+    EXPECT_EQ(loadDictionary(folder.holding("list", bytes)), std::nullopt) << bytes;
+  EXPECT_EQ(loadDictionary(folder / "absent"), std::nullopt);
+  EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
+  EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
+  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "nobody will ever write to it";
+}
+
+TEST(AtomicWriting, AFailureLeavesWhatWasThereAndNothingElse) {
+  const TemporaryFolder folder;
+  const Dictionary before{{"k", "before"}};
+  ASSERT_TRUE(writeDictionaryAtomically(before, folder / "list"));
+  std::filesystem::create_directory(folder / "taken");
+  EXPECT_FALSE(writeDictionaryAtomically(before, folder / "taken"));
+  EXPECT_FALSE(writeDictionaryAtomically(before, folder / "no folder/list"));
+
+  const pid_t writer = fork();
+  if (writer == 0) {
+    // The disk is full after a kilobyte.
+    signal(SIGXFSZ, SIG_IGN);
+    const rlimit limit{1024, 1024};
+    setrlimit(RLIMIT_FSIZE, &limit);
+    _exit(writeDictionaryAtomically(Dictionary{{"k", std::string(5000, 'x')}}, folder / "list"));
+  }
+  int status = -1;
+  ASSERT_EQ(waitpid(writer, &status, 0), writer);
+  EXPECT_EQ(status, 0) << "the writing succeeded";
+  EXPECT_EQ(loadDictionary(folder / "list"), before);
+  EXPECT_THAT(folder.names(), testing::UnorderedElementsAre("list", "taken"));
+}
+
+TEST(AtomicWriting, AKillAtAnyMomentLeavesTheOldFileOrTheNewOne) {
+  const TemporaryFolder folder;
+  const Dictionary versions[] = {Dictionary{{"k", std::string(200000, 'a')}},
+                                 Dictionary{{"k", std::string(300000, 'b')}}};
+  std::minstd_rand random(1);
+  int present = 0;
+  for (int round = 0; round < 40; ++round) {
+    if (round % 4 == 0) std::filesystem::remove(folder / "list");
+    const pid_t writer = fork();
+    if (writer == 0) {
+      for (int i = round;; ++i)
+        writeDictionaryAtomically(versions[i % 2], folder / "list");
+    }
+    std::this_thread::sleep_for(std::chrono::microseconds(random() % 60000));
+    kill(writer, SIGKILL);
+    ASSERT_EQ(waitpid(writer, nullptr, 0), writer);
+    if (!std::filesystem::exists(folder / "list")) continue;
+    ++present;
+    const auto read = loadDictionary(folder / "list");
+    EXPECT_TRUE(read == versions[0] || read == versions[1]) << "round " << round;
+  }
+  EXPECT_GT(present, 0);
+}
+
+}  // namespace
+}  // namespace onramp

@@ -1,0 +1,45 @@
+#pragma once
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <string>
+#include <system_error>
+#include <vector>
+
+namespace onramp {
+
+/// A folder of the test's own, removed at destruction.
+class TemporaryFolder {
+ public:
+  TemporaryFolder()
+      : path_((std::filesystem::temp_directory_path() / "onramp-test-XXXXXX").string()) {
+    if (!mkdtemp(path_.data())) std::abort();
+  }
+  TemporaryFolder(const TemporaryFolder&) = delete;
+  TemporaryFolder& operator=(const TemporaryFolder&) = delete;
+  ~TemporaryFolder() {
+    std::error_code ignored;
+    std::filesystem::remove_all(path_, ignored);
+  }
+
+  [[nodiscard]] std::string operator/(const std::string& name) const { return path_ + "/" + name; }
+
+  /// The path of a file `name` with these bytes.
+  [[nodiscard]] std::string holding(const std::string& name, const std::string& bytes) const {
+    std::ofstream(*this / name, std::ios::binary) << bytes;
+    return *this / name;
+  }
+
+  [[nodiscard]] std::vector<std::string> names() const {
+    std::vector<std::string> names;
+    for (const auto& entry : std::filesystem::directory_iterator(path_))
+      names.push_back(entry.path().filename().string());
+    return names;
+  }
+
+ private:
+  std::string path_;
+};
+
+}  // namespace onramp

@@ -1,0 +1,159 @@
+#include "tests/recording/medium_folder.h"
+
+#include <chrono>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+#include <thread>
+#include <utility>
+
+#include "platform/freedesktop/main_bundle.h"
+#include "platform/property_list.h"
+
+namespace onramp::recording {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+std::string temporaryFolder() {
+  std::string name = (fs::temp_directory_path() / "onramp-test-XXXXXX").string();
+  if (!mkdtemp(name.data())) std::abort();
+  return name;
+}
+
+std::string contents(const std::string& path) {
+  std::ifstream file(path);
+  std::ostringstream text;
+  text << file.rdbuf();
+  return text.str();
+}
+
+}  // namespace
+
+MediumFolder::MediumFolder() : root_(temporaryFolder()) {
+  fs::create_directories(root_ + "/bin");
+  std::ofstream(root_ + "/bin/xdg-open")
+      << "#!/bin/sh\nprintf '%s\\n' \"$1\" >> '" << root_ << "/opened'\n";
+  fs::permissions(root_ + "/bin/xdg-open", fs::perms::owner_all);
+  setEnvironment("PATH", root_ + "/bin:" + std::getenv("PATH"));
+  setEnvironment("XDG_DATA_HOME", root_ + "/user");
+  setEnvironment("XDG_DATA_DIRS", root_ + "/local");
+  setEnvironment("ONRAMP_SYSTEM_VERSION", "10.9.5");
+  for (const char* variable : {"LANGUAGE", "LC_ALL", "LC_MESSAGES"}) {
+    setEnvironment(variable, std::nullopt);
+  }
+  setEnvironment("LANG", "en_US.UTF-8");
+
+  write("Onramp OSX.app/Contents/Info.plist",
+        Dictionary{{"CFBundleName", "Onramp OSX"},
+                   {"CommonResourcePath", "MacResources/Common.plist"}});
+  setMainBundlePath(path("Onramp OSX.app"));
+}
+
+MediumFolder::~MediumFolder() {
+  for (const auto& [name, value] : std::exchange(before_, {})) {
+    if (value) {
+      setenv(name.c_str(), value->c_str(), 1);
+    } else {
+      unsetenv(name.c_str());
+    }
+  }
+  std::error_code ignored;
+  fs::remove_all(root_, ignored);
+}
+
+std::string MediumFolder::path(const std::string& relative) const {
+  return root_ + "/medium/" + relative;
+}
+
+void MediumFolder::write(const std::string& relative, const std::string& bytes) const {
+  fs::create_directories(fs::path(path(relative)).parent_path());
+  std::ofstream(path(relative), std::ios::binary) << bytes;
+}
+
+void MediumFolder::write(const std::string& relative, const Dictionary& dictionary) const {
+  fs::create_directories(fs::path(path(relative)).parent_path());
+  if (!writeDictionaryAtomically(dictionary, path(relative))) std::abort();
+}
+
+void MediumFolder::makeExecutable(const std::string& relative) const {
+  fs::permissions(path(relative), fs::perms::owner_all);
+}
+
+void MediumFolder::describe(const Dictionary& resources, const Dictionary& cdInfo,
+                            const Dictionary& modelInfo) const {
+  write("MacResources/Common.plist", resources.with("CDInfo", "MacResources/CDInfo.plist")
+                                         .with("ModelInfo", "MacResources/ModelInfo.plist")
+                                         .with("VenderName", "Kestrel Imaging"));
+  write("MacResources/CDInfo.plist", cdInfo);
+  write("MacResources/ModelInfo.plist", Dictionary{{"Model", modelInfo}});
+}
+
+void MediumFolder::addSetUpTool(int status) const {
+  write("Setup.app/Contents/Info.plist",
+        Dictionary{{"CFBundleExecutable", "setup"}, {"CFBundleDisplayName", "Wireless Setup"}});
+  write("Setup.app/Contents/Linux/setup", "#!/bin/sh\nprintf '%s' \"$*\" > '" + root_ +
+                                              "/tool'\nexit " + std::to_string(status) + "\n");
+  makeExecutable("Setup.app/Contents/Linux/setup");
+}
+
+std::string MediumFolder::setUpToolArguments() const {
+  return contents(root_ + "/tool");
+}
+
+std::vector<std::string> MediumFolder::opened(std::size_t count) const {
+  std::vector<std::string> lines;
+  for (int attempt = 0; attempt < 1000; ++attempt) {
+    std::istringstream text(contents(root_ + "/opened"));
+    lines.clear();
+    for (std::string line; std::getline(text, line);)
+      lines.push_back(line);
+    if (lines.size() >= count) break;
+    std::this_thread::sleep_for(std::chrono::milliseconds(10));
+  }
+  return lines;
+}
+
+std::string MediumFolder::optionsFilePath() const {
+  return root_ + "/local/KestrelImaging/com.kestrelimaging.installpkginfo.plist";
+}
+
+std::string MediumFolder::modelFilePath() const {
+  return root_ + "/user/KestrelImaging/com.kestrelimaging.instmodel.plist";
+}
+
+std::optional<Dictionary> MediumFolder::optionsFile() const {
+  return loadDictionary(optionsFilePath());
+}
+
+std::optional<Dictionary> MediumFolder::modelFile() const {
+  return loadDictionary(modelFilePath());
+}
+
+void MediumFolder::setEnvironment(const std::string& name,
+                                  const std::optional<std::string>& value) {
+  const char* const current = std::getenv(name.c_str());
+  before_.try_emplace(name, current ? std::optional<std::string>(current) : std::nullopt);
+  if (value) {
+    setenv(name.c_str(), value->c_str(), 1);
+  } else {
+    unsetenv(name.c_str());
+  }
+}
+
+Dictionary model(bool usb, bool wired, bool wireless) {
+  return Dictionary{
+      {"KSCID", "k1"},
+      {"Interfaces", Dictionary{{"USB", usb}, {"WiredLAN", wired}, {"WirelessLAN", wireless}}}};
+}
+
+Dictionary containing(const std::vector<std::string>& models) {
+  std::vector<Dictionary::Pair> pairs;
+  for (const std::string& name : models)
+    pairs.emplace_back(name, Dictionary());
+  return Dictionary{{"ContainedModel", Dictionary(std::move(pairs))}, {"KSCSeriesCode", "KS7"}};
+}
+
+}  // namespace onramp::recording
