@@ -1,11 +1,10 @@
 #include "netconfig/local_address_cache.h"
 
 #include <cstddef>
-#include <cstdint>
 #include <vector>
 
 #include "platform/dynamic_store.h"
-#include "platform/ipv4_address.h"
+#include "platform/ipv4.h"
 
 namespace onramp {
 
@@ -18,8 +17,8 @@ void refresh(local_address_list& cache) {
   KSSysConfigCopyCurrentLocalAddressList(&cache);
 }
 
-std::optional<std::uint32_t> ipv4(const std::string* text) {
-  return text ? ipv4FromText(*text) : std::nullopt;
+std::optional<IPv4Address> parsed(const std::string* text) {
+  return text ? parseIPv4(*text) : std::nullopt;
 }
 
 }  // namespace
@@ -43,16 +42,16 @@ local_address_list local_address_cache_copy() {
 }
 
 std::optional<std::string> local_address_for_destination(const std::string& address_text) {
-  const std::optional<std::uint32_t> destination = ipv4FromText(address_text);
+  const std::optional<IPv4Address> destination = parseIPv4(address_text);
   if (!destination) return std::nullopt;
 
   const local_address_list list = local_address_cache;
   for (std::size_t i = 0; i < local_address_list_count(list); ++i) {
     const std::string* text = local_address_at(list, i);
-    const std::optional<std::uint32_t> local = ipv4(text);
-    const std::optional<std::uint32_t> mask = ipv4(local_subnet_mask_at(list, i));
+    const std::optional<IPv4Address> local = parsed(text);
+    const std::optional<IPv4Address> mask = parsed(local_subnet_mask_at(list, i));
     if (!local || !mask) return std::nullopt;
-    if (((*local ^ *destination) & *mask) == 0) return *text;
+    if (((local->bits ^ destination->bits) & mask->bits) == 0) return *text;
   }
   return std::nullopt;
 }

@@ -1,8 +1,8 @@
 #include "platform/netlink/ipv4_state.h"
 
-#include <arpa/inet.h>
 #include <linux/rtnetlink.h>
 #include <net/if.h>
+#include <netinet/in.h>
 #include <netlink/errno.h>
 #include <netlink/msg.h>
 #include <netlink/netlink.h>
@@ -11,14 +11,15 @@
 #include <netlink/route/nexthop.h>
 #include <netlink/route/route.h>
 
-#include <array>
 #include <cstdint>
+#include <cstring>
 #include <map>
 #include <string>
 #include <utility>
 #include <vector>
 
 #include "platform/dynamic_store.h"
+#include "platform/ipv4.h"
 
 namespace onramp::netlink {
 
@@ -85,17 +86,14 @@ bool isDefaultRoute(nl_object* object) {
 }
 
 std::optional<std::string> dotted(const nl_addr* address) {
-  if (!address || nl_addr_get_len(address) != sizeof(in_addr)) return std::nullopt;
-  std::array<char, INET_ADDRSTRLEN> text{};
-  inet_ntop(AF_INET, nl_addr_get_binary_addr(address), text.data(), text.size());
-  return text.data();
+  in_addr raw{};
+  if (!address || nl_addr_get_len(address) != sizeof raw) return std::nullopt;
+  std::memcpy(&raw, nl_addr_get_binary_addr(address), sizeof raw);
+  return dottedIPv4({ntohl(raw.s_addr)});
 }
 
 std::string dottedMask(int prefix) {
-  const in_addr mask{htonl(prefix == 0 ? 0 : ~std::uint32_t{0} << (32 - prefix))};
-  std::array<char, INET_ADDRSTRLEN> text{};
-  inet_ntop(AF_INET, &mask, text.data(), text.size());
-  return text.data();
+  return dottedIPv4({prefix == 0 ? 0 : ~std::uint32_t{0} << (32 - prefix)});
 }
 
 struct Interface {
