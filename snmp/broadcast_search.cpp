@@ -58,8 +58,7 @@ std::optional<Dictionary> receiveResult(DatagramSocket& socket, snmp_table_reque
 void searchSubnet(mib_table& table, const std::string& broadcast, Array& results) {
   snmp_table_request request(table);
   const auto normalized = snmp_normalize_ipv4(broadcast.c_str());
-  const auto address = normalized ? parseIPv4(*normalized) : std::nullopt;
-  if (!address) return;
+  if (!normalized) return;
 
   request.message().request_id = snmp_next_request_id();
   snmp_packet encoded{};
@@ -67,7 +66,7 @@ void searchSubnet(mib_table& table, const std::string& broadcast, Array& results
   if (snmp_encode_message(request.message(), encoded, length)) return;
   auto socket = openBroadcastSocket();
   if (!socket) return;
-  snmp_send(*socket, {*address, kSnmpPort}, std::span(encoded).first(length));
+  snmp_send(*socket, snmp_agent_at(*normalized), std::span(encoded).first(length));
 
   const std::chrono::seconds sent = wholeSeconds();
   for (int attempt = 0; attempt < kReceiveAttempts && wholeSeconds() - sent <= kListening;
