@@ -1,6 +1,5 @@
 #include "platform/qt/image_view.h"
 
-#include <QImageReader>
 #include <QPainter>
 
 #include "platform/qt/native.h"
@@ -18,42 +17,32 @@ constexpr int kImageDensity = 2;
 
 void ImageViewWidget::setImage(const QString& path) {
   path_ = path;
-  drawnFor_ = {};
+  pixmap_.reset();
   update();
 }
 
 void ImageViewWidget::setScaling(ImageScaling scaling) {
   scaling_ = scaling;
-  drawnFor_ = {};
   update();
 }
 
-QPixmap ImageViewWidget::read() const {
-  QImageReader reader(path_);
-  const QSize viewPixels = (QSizeF(size()) * devicePixelRatioF()).toSize();
-  QSize pixels = viewPixels;
-  if (scaling_ == ImageScaling::kProportionallyDown) {
-    pixels = (QSizeF(reader.size()) * devicePixelRatioF() / kImageDensity).toSize();
-    if (pixels.width() > viewPixels.width() || pixels.height() > viewPixels.height()) {
-      pixels.scale(viewPixels, Qt::KeepAspectRatio);
-    }
+QRectF ImageViewWidget::target() const {
+  if (scaling_ == ImageScaling::kAxesIndependently) return rect();
+  QSizeF size = QSizeF(pixmap_->size()) / kImageDensity;
+  if (size.width() > width() || size.height() > height()) {
+    size.scale(this->size(), Qt::KeepAspectRatio);
   }
-  if (!pixels.isEmpty()) reader.setScaledSize(pixels);
-  QPixmap pixmap = QPixmap::fromImageReader(&reader);
-  pixmap.setDevicePixelRatio(devicePixelRatioF());
-  return pixmap;
+  QRectF target(QPointF(), size);
+  target.moveCenter(QRectF(rect()).center());
+  return target;
 }
 
 void ImageViewWidget::paintEvent(QPaintEvent*) {
-  if (path_.isEmpty()) return;
-  if (drawnFor_ != size() || drawn_.devicePixelRatio() != devicePixelRatioF()) {
-    drawn_ = read();
-    drawnFor_ = size();
-  }
-  if (drawn_.isNull()) return;
-  QRectF target(QPointF(), drawn_.deviceIndependentSize());
-  target.moveCenter(QRectF(rect()).center());
-  QPainter(this).drawPixmap(target.topLeft(), drawn_);
+  if (!pixmap_) pixmap_ = QPixmap(path_);
+  if (pixmap_->isNull()) return;
+  QPainter painter(this);
+  painter.setRenderHint(QPainter::SmoothPixmapTransform);
+  painter.drawPixmap(target(), *pixmap_, pixmap_->rect());
 }
 
 }  // namespace qt

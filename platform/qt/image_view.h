@@ -2,12 +2,13 @@
 
 #include <QPixmap>
 #include <QWidget>
+#include <optional>
 
 #include "platform/outlets.h"
 
 namespace onramp::qt {
 
-/// Shows an image file, which it reads when it is first drawn in a size.
+/// Shows an image file, which it reads when it is first drawn.
 class ImageViewWidget final : public QWidget {
   Q_OBJECT
 
@@ -21,13 +22,12 @@ class ImageViewWidget final : public QWidget {
   void paintEvent(QPaintEvent* event) override;
 
  private:
-  /// The image read in the size that it takes up in this view now.
-  [[nodiscard]] QPixmap read() const;
+  /// Where in this view the image goes.
+  [[nodiscard]] QRectF target() const;
 
   QString path_;
   ImageScaling scaling_ = ImageScaling::kProportionallyDown;
-  QPixmap drawn_;
-  QSize drawnFor_;
+  std::optional<QPixmap> pixmap_;
 };
 
 }  // namespace onramp::qt

@@ -3,6 +3,7 @@
 #include <QAbstractButton>
 #include <QAbstractItemView>
 #include <QAction>
+#include <QCoreApplication>
 #include <QFile>
 #include <QLabel>
 #include <QMenu>
@@ -33,9 +34,15 @@ QString textOf(std::string_view text) {
 // which is how an interface file names a page's class.
 class Loader final : public QUiLoader {
  public:
-  Loader() {
+  explicit Loader(QObject* parent) : QUiLoader(parent) {
     // Nothing here comes from a plug-in; looking for some costs time at every start.
     clearPluginPaths();
+  }
+
+  /// The application's one loader, since making one takes as long as loading a file.
+  static Loader& shared() {
+    static Loader* const loader = qt::makeChild<Loader>(qApp);
+    return *loader;
   }
 
   QWidget* createWidget(const QString& className, QWidget* parent, const QString& name) override {
@@ -140,7 +147,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
   const auto path = Bundle::main().pathForResource(name, "ui");
   QFile file(QString::fromStdString(path.value_or("")));
   if (!path || !file.open(QIODevice::ReadOnly)) return nullptr;
-  auto tree = std::make_unique<Tree>(Loader().load(&file));
+  auto tree = std::make_unique<Tree>(Loader::shared().load(&file));
   if (!tree->root) return nullptr;
 
   localize(*tree->root, name);

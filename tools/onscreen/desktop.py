@@ -110,7 +110,8 @@ class Desktop:
 
     def _start_display(self):
         display = self._start(
-            ["Xvfb", "-displayfd", "1", "-screen", "0", f"{_SIZE}x24", "-nolisten", "tcp"],
+            ["Xvfb", "-displayfd", "1", "-screen", "0", f"{_SIZE}x24", "-noreset", "-nolisten",
+             "tcp"],
             "xvfb", stdout=subprocess.PIPE, text=True)
         number = display.stdout.readline().strip()
         if not number:
