@@ -22,7 +22,7 @@ from practice_network.control import PracticeNetwork  # noqa: E402
 
 TYPE = "_ipp._tcp"
 COUNTS = (1, 20, 200)
-ROUNDS = {"warm": 15, "cold": 7}
+ROUNDS = {"warm": 15, "cold": 5}
 IDLE_SECONDS = 30
 
 
@@ -78,12 +78,11 @@ def compare(state, probe):
                 seconds = program(*arguments)
                 if round_number:  # The first round warms everything else up.
                     samples[program].append(seconds)
-        medians = {program: statistics.median(values) for program, values in samples.items()}
-        noise = max(statistics.quantiles(values)[2] / statistics.quantiles(values)[0]
-                    for values in samples.values())
-        print(f"{state} {count:4} services: {medians[ours]:.3f} s, avahi-browse "
-              f"{medians[peer]:.3f} s, ratio {medians[ours] / medians[peer]:.2f} "
-              f"(noise: upper by lower quartile {noise:.2f})", flush=True)
+        ratios = [one / other for one, other in zip(samples[ours], samples[peer])]
+        low, middle, high = statistics.quantiles(ratios)
+        print(f"{state} {count:4} services: {statistics.median(samples[ours]):.3f} s, avahi-browse "
+              f"{statistics.median(samples[peer]):.3f} s, ratio {middle:.2f} "
+              f"(quartiles {low:.2f} to {high:.2f})", flush=True)
 
 
 def idle(probe):
