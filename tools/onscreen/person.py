@@ -69,6 +69,14 @@ class Person:
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
 
+    def choose_from_menu(self, button, item):
+        """Opens a button's menu and takes its `item`th entry.
+
+        With the keyboard, since Qt keeps the menus of buttons from the accessibility bus.
+        """
+        self.click("push button", button)
+        self.press(*["Down"] * item, "Return")
+
     def press(self, *keys):
         """Presses keys by their X names, such as "Return" or "alt+F4"."""
         self.desktop.run(["xdotool", "key", "--clearmodifiers", *keys])
