@@ -38,6 +38,8 @@ class ChooseDeviceView final : public Page,
   static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
 
   explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
+  ChooseDeviceView(const ChooseDeviceView&) = delete;
+  ChooseDeviceView& operator=(const ChooseDeviceView&) = delete;
   ~ChooseDeviceView() override;
 
   /// The models to look for, as "manufacturer model" texts.

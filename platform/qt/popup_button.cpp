@@ -1,6 +1,5 @@
 #include <QAction>
 #include <QMenu>
-#include <QProgressBar>
 #include <QToolButton>
 #include <memory>
 #include <utility>
@@ -11,14 +10,6 @@
 namespace onramp {
 
 using qt::nativeOf;
-
-void ProgressIndicator::startAnimation() const {
-  if (auto* const bar = nativeOf<QProgressBar>(*this)) bar->setRange(0, 0);
-}
-
-void ProgressIndicator::stopAnimation() const {
-  if (auto* const bar = nativeOf<QProgressBar>(*this)) bar->setRange(0, 1);
-}
 
 // The button itself is item 0; the others are its menu's actions.
 
