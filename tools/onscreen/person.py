@@ -69,12 +69,15 @@ class Person:
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
 
-    def choose_from_menu(self, button, item):
-        """Opens a button's menu and takes its `item`th entry.
-
-        With the keyboard, since Qt keeps the menus of buttons from the accessibility bus.
-        """
+    def open_menu(self, button):
+        """Opens a button's menu, which Qt keeps from the accessibility bus: use it with keys."""
+        windows = self._window_count()
         self.click("push button", button)
+        wait_for(lambda: self._window_count() > windows, _LOOK_SECONDS, f"the menu of {button!r}")
+
+    def choose_from_menu(self, button, item):
+        """Opens a button's menu and takes its `item`th entry."""
+        self.open_menu(button)
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):
@@ -98,6 +101,10 @@ class Person:
         if self.process.poll() is not None:
             raise RuntimeError(f"the program has ended with status {self.process.returncode}")
         return True
+
+    def _window_count(self):
+        return len(self.desktop.run(["xdotool", "search", "--onlyvisible", "--pid",
+                                     str(self.process.pid)]).split())
 
     def _application(self):
         screen = self._atspi.get_desktop(0)

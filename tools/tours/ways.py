@@ -61,7 +61,7 @@ class Tour:
             person.see("table cell", model)
             person.picture(self._pictures / "wireless-4-devices.png")
 
-            person.click("push button", _GEAR)
+            person.open_menu(_GEAR)
             person.picture(self._pictures / "wireless-5-gear.png")
             person.press("Escape")
 
