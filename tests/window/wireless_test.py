@@ -1,8 +1,8 @@
 """Whole ways by the wireless row, in the wizard's real window on a practice network.
 
-Usage: wireless_test.py MEDIUM, a medium's folder with the application on it; before it, one test's
-name on the practice network. Every test has a process, a desktop and devices of its own, so several
-run at a time: most of a search is waiting.
+Usage: wireless_test.py [TEST] MEDIUM, a medium's folder with the application on it.
+Every test has a process, a desktop and devices of its own, so several run at a time: most of a
+search is waiting.
 """
 
 import concurrent.futures
@@ -52,6 +52,8 @@ class WirelessWays(WayTest):
         person = self.start({self.model: model(usb=True, wired=True, wireless=True),
                              "Kestrel Cable": model(usb=True)}, env=env, **details)
         person.click("list item", self.model)
+        wait_for(lambda: person.has_state(person.see("list item", self.model), "selected"),
+                 PATIENCE, "the choice")
         person.click("push button", self.text["BTN_NEXT"])
         person.click("radio button", self.text["INST_TXT_WIFI"])
         person.click("push button", self.text["BTN_NEXT"])
@@ -286,7 +288,7 @@ def run_all():
     names = unittest.defaultTestLoader.getTestCaseNames(WirelessWays)
     with concurrent.futures.ThreadPoolExecutor(AT_A_TIME) as pool:
         runs = pool.map(lambda name: subprocess.run(
-            [sys.executable, "-W", "ignore", __file__, f"WirelessWays.{name}", BUILT], stderr=subprocess.PIPE,
+            [sys.executable, __file__, f"WirelessWays.{name}", BUILT], stderr=subprocess.PIPE,
             text=True), names)
         passed = True
         for name, run in zip(names, runs):
@@ -302,5 +304,5 @@ if __name__ == "__main__":
         os.execv(sys.executable, [sys.executable, PRACTICE_NETWORK, "/dev/null", sys.executable,
                                   *sys.argv, BUILT])
     if len(sys.argv) > 1:
-        unittest.main()
+        unittest.main(warnings="ignore")
     sys.exit(not run_all())

@@ -20,6 +20,7 @@ class Person:
         gi.require_version("Atspi", "2.0")
         from gi.repository import Atspi
         self._atspi = Atspi
+        self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 
     def __enter__(self):
@@ -41,7 +42,7 @@ class Person:
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits until no such control is on the screen."""
-        wait_for(lambda: not self.sees(role, name), seconds, f"the end of {role} {name!r}")
+        wait_for(lambda: self._certainly_gone(role, name), seconds, f"the end of {role} {name!r}")
 
     def everything(self):
         """(role, name, control) of all that is on the screen."""
@@ -65,7 +66,7 @@ class Person:
         """Clicks the middle of a control once it can be clicked."""
         control = self.see(role, name)
         wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} enabled")
-        box = control.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+        box = self._resting_place(control)
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
 
@@ -102,17 +103,39 @@ class Person:
             raise RuntimeError(f"the program has ended with status {self.process.returncode}")
         return True
 
+    def _resting_place(self, control):
+        """Where a control is when it no longer moves: a new window is put in its place late."""
+        place = None
+
+        def rests():
+            nonlocal place
+            time.sleep(0.05)
+            box = control.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+            before, place = place, (box.x, box.y, box.width, box.height)
+            return place == before and box
+
+        return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
+
     def _window_count(self):
         return len(self.desktop.run(["xdotool", "search", "--onlyvisible", "--pid",
                                      str(self.process.pid)]).split())
 
     def _application(self):
         screen = self._atspi.get_desktop(0)
-        for index in range(screen.get_child_count()):
-            application = screen.get_child_at_index(index)
-            if application and application.get_process_id() == self.process.pid:
-                return application
+        try:
+            for index in range(screen.get_child_count()):
+                application = screen.get_child_at_index(index)
+                if application and application.get_process_id() == self.process.pid:
+                    return application
+        except self._gone():
+            pass
         return None
+
+    def _certainly_gone(self, role, name):
+        """A program that is busy answers nothing, which must not pass for nothing there."""
+        self._overlooked = False
+        found = self.sees(role, name)
+        return not found and (not self._overlooked or not self.is_running())
 
     def _look(self, role, name):
         match = []
@@ -128,6 +151,7 @@ class Person:
     def _visit(self, control, visit):
         """Shows `visit` what is on the screen, depth first; objects that vanish are passed over."""
         if control is None:
+            self._overlooked = True
             return True
         try:
             is_application = control.get_role_name() == "application"
@@ -137,6 +161,7 @@ class Person:
                 return False
             children = [control.get_child_at_index(i) for i in range(control.get_child_count())]
         except self._gone():
+            self._overlooked = True
             return True
         return all(self._visit(child, visit) for child in children)
 
