@@ -1,8 +1,11 @@
 #include <gmock/gmock.h>
 
+#include <algorithm>
+#include <array>
 #include <cstdlib>
 #include <random>
 #include <set>
+#include <utility>
 
 #include "pages/ChooseDeviceView.h"
 #include "tests/app/wizard.h"
@@ -23,8 +26,8 @@ constexpr unsigned kMostPauses = 5;
 class ChooserSoak : public Wizard {
  protected:
   struct Device {
-    NetServiceRef service;     // null while it is away
-    unsigned char host = 0;    // of its address, 192.0.2.0/24
+    NetServiceRef service;   // null while it is away
+    unsigned char host = 0;  // of its address, 192.0.2.0/24
     bool matches = false;
     bool wireless = false;
   };
@@ -33,7 +36,8 @@ class ChooserSoak : public Wizard {
     Network::instance().reset();
     Agents::instance().reset();
     const Dictionary model = recording::model(true, false, true);
-    describe({{"Kestrel Model 100", model}, {"Kestrel Scan", recording::model(true, false, false)}});
+    describe(
+        {{"Kestrel Model 100", model}, {"Kestrel Scan", recording::model(true, true, false)}});
   }
 
   [[nodiscard]] int random(int below) {
@@ -73,23 +77,26 @@ class ChooserSoak : public Wizard {
     const int number = random(kDevices);
     Device& device = devices[static_cast<std::size_t>(number)];
     switch (random(4)) {
-      case 0: return come(device, number);
-      case 1: return go(device);
-      default: return resolve(device, number);
+      case 0:
+        return come(device, number);
+      case 1:
+        return go(device);
+      default:
+        return resolve(device, number);
     }
   }
 
   void pause() {
     ++pausesOfThisWait_;
     EXPECT_LE(pausesOfThisWait_, kMostPauses);
-    EXPECT_TRUE(found_ == expected.empty() || pausesOfThisWait_ == 1) << "the wait should be over";
+    EXPECT_TRUE(listWasEmpty_ || pausesOfThisWait_ == 1) << "the wait should be over";
     if (pausesOfThisWait_ == 1) {
       for (const Device& device : devices)
         if (device.service) network.found(device.service);
     }
     for (int i = random(8); i > 0; --i)
       oneEvent();
-    found_ = expected.empty();
+    listWasEmpty_ = expected.empty();
     EXPECT_EQ(rows(), std::vector(expected.begin(), expected.end()));
     EXPECT_FALSE(delegate->windowShouldClose(Window()));
   }
@@ -107,14 +114,14 @@ class ChooserSoak : public Wizard {
   /// One step of the person: everything that starts a search.
   void use() {
     pausesOfThisWait_ = 0;
-    found_ = true;
+    listWasEmpty_ = true;
     if (page() == "ConnectionTypeView") {
       medium.addSetUpTool(random(2));
       screen.click("rightMostButton");
       pausesOfThisWait_ = 0;
       screen.runTimers();
-    } else if (!screen.object("rightButton").hidden && screen.object("rightButton").text == "BTN_BACK" &&
-               random(2) == 0) {
+    } else if (!screen.object("rightButton").hidden &&
+               screen.object("rightButton").text == "BTN_BACK" && random(2) == 0) {
       screen.click("rightButton");
     } else {
       expected.clear();
@@ -151,7 +158,7 @@ class ChooserSoak : public Wizard {
  private:
   std::mt19937 generator_;
   unsigned pausesOfThisWait_ = 0;
-  bool found_ = true;
+  bool listWasEmpty_ = true;  ///< after the pause before
 };
 
 TEST_F(ChooserSoak, TheListIsWhatTheRulesGiveAndEveryWaitEnds) {

@@ -62,10 +62,14 @@ TEST_F(Chooser, ListsOnlyTheModelsLookedFor) {
     const char* maker;
     const char* model;
     bool listed;
-  } cases[] = {{"Kestrel", "Model 100", true},  {"Kestrel Model", "100", true},
-               {"kestrel", "Model 100", false}, {"Kestrel", " Model 100", false},
-               {"Kestrel", "Model 10", false},  {"Kestrel", "Model 100 ", false},
-               {"Heron", "Model 100", false},   {"", "Kestrel Model 100", false},
+  } cases[] = {{"Kestrel", "Model 100", true},
+               {"Kestrel Model", "100", true},
+               {"kestrel", "Model 100", false},
+               {"Kestrel", " Model 100", false},
+               {"Kestrel", "Model 10", false},
+               {"Kestrel", "Model 100 ", false},
+               {"Heron", "Model 100", false},
+               {"", "Kestrel Model 100", false},
                {"", "", false}};
   for (const auto& [maker, model, listed] : cases) {
     agents.asked.clear();
@@ -112,7 +116,8 @@ TEST_F(Chooser, TheFirstAddressThatAnswersAtOnceDecides) {
       agents.answers[address] = answers[i];
       expected.insert(expected.end(), asked[i], address);
     }
-    EXPECT_EQ(ChooseDeviceView::doesWiFi(device("D", addresses)), listed) << ::testing::PrintToString(answers);
+    EXPECT_EQ(ChooseDeviceView::doesWiFi(device("D", addresses)), listed)
+        << ::testing::PrintToString(answers);
     EXPECT_EQ(agents.asked, expected);
   }
 }

@@ -1,6 +1,7 @@
 #include "tests/recording/agents.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/datagram_socket.h"
 
@@ -24,7 +25,7 @@ std::optional<Reply>& pendingReply() {
 // A request for one object as its answer (RFC 1157): another PDU, and an INTEGER of one byte, one
 // byte longer than the NULL in its place, at the end. All lengths are of one byte.
 std::vector<std::uint8_t> answerTo(std::span<const std::uint8_t> request, int value) {
-  std::vector<std::uint8_t> bytes(request.begin(), request.end());
+  std::vector<std::uint8_t> bytes(request.begin(), request.end() - 2);
   const std::size_t version = 2;
   const std::size_t community = version + 2 + bytes.at(version + 1);
   const std::size_t pdu = community + 2 + bytes.at(community + 1);
@@ -34,8 +35,8 @@ std::vector<std::uint8_t> answerTo(std::span<const std::uint8_t> request, int va
   for (const std::size_t enclosing : {std::size_t{0}, pdu, list, list + 2})
     ++bytes.at(enclosing + 1);
   bytes.at(pdu) = 0xA2;
-  bytes.resize(bytes.size() - 2);
-  bytes.insert(bytes.end(), {0x02, 0x01, static_cast<std::uint8_t>(value)});
+  for (const int byte : {0x02, 0x01, value})
+    bytes.push_back(static_cast<std::uint8_t>(byte));
   return bytes;
 }
 

@@ -1,6 +1,7 @@
 """A person at the screen: sees the controls by their roles and names, has a mouse and a keyboard."""
 
 import os
+import pathlib
 import time
 
 from .processes import start, stop, wait_for
@@ -18,8 +19,9 @@ class Person:
                            for name in ("DBUS_SESSION_BUS_ADDRESS", "DISPLAY", "XDG_RUNTIME_DIR")})
         import gi
         gi.require_version("Atspi", "2.0")
-        from gi.repository import Atspi
+        from gi.repository import Atspi, GLib
         self._atspi = Atspi
+        self.errors = GLib.Error  # what the use of a control raises that is gone
         self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 
@@ -66,6 +68,10 @@ class Person:
         """Clicks the middle of a control once it can be clicked."""
         control = self.see(role, name)
         wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} enabled")
+        self.click_control(control)
+
+    def click_control(self, control):
+        """Clicks the middle of a control, whatever it is and whether or not that does anything."""
         box = self._resting_place(control)
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
@@ -116,6 +122,24 @@ class Person:
 
         return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
 
+    def round_trip(self):
+        """The seconds in which the program answers; those of waiting for a processor are taken off.
+
+        None when it does not answer, having ended.
+        """
+        waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
+
+        def waited():
+            return sum(int(file.read_text().split()[1]) for file in waits) / 1e9
+
+        try:
+            began, waited_before = time.monotonic(), waited()
+            frame = self._application().get_child_at_index(0)
+            frame.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+            return time.monotonic() - began - (waited() - waited_before)
+        except (AttributeError, OSError, self.errors):
+            return time.monotonic() - began if self.is_running() else None
+
     def _window_count(self):
         return len(self.desktop.run(["xdotool", "search", "--onlyvisible", "--pid",
                                      str(self.process.pid)]).split())
@@ -127,7 +151,7 @@ class Person:
                 application = screen.get_child_at_index(index)
                 if application and application.get_process_id() == self.process.pid:
                     return application
-        except self._gone():
+        except self.errors:
             pass
         return None
 
@@ -160,12 +184,7 @@ class Person:
             if not is_application and visit(control) is False:
                 return False
             children = [control.get_child_at_index(i) for i in range(control.get_child_count())]
-        except self._gone():
+        except self.errors:
             self._overlooked = True
             return True
         return all(self._visit(child, visit) for child in children)
-
-    @staticmethod
-    def _gone():
-        from gi.repository import GLib
-        return GLib.Error
