@@ -33,8 +33,10 @@ PATIENCE = 60
 CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu item")
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
-# Left to chance alone, most walks would end early and few would get far.
-WEIGHTS = {"Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2, "Quit": 0.1,
+PRINTER = "_pdl-datastream._tcp"
+# Left to chance alone, most walks would end early and few would get far. There is no task bar that
+# could bring a hidden window back.
+WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2, "Quit": 0.1,
            "Next": 4, "Actions": 2}
 # None of these leaves a question unanswered, for which the wizard would have to wait.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
@@ -111,16 +113,17 @@ class Walk:
     def change_devices(self, _):
         name = f"{self.kind} no. {self.dice.randint(1, 4)}"
         self.steps.append(f"change {name!r}")
-        if self.devices.get(name):
-            if self.dice.random() < 0.5:
-                self.network.remove(name)
-                self.devices[name] = False
-            else:
-                self.network.set(name, activeif=self.dice.choice(ANSWERS), note=f"after step {len(self.steps)}")
-        else:
+        if name not in self.devices:
             self.network.add(name, maker="Kestrel", model=self.kind,
                              activeif=self.dice.choice(ANSWERS))
             self.devices[name] = True
+        elif self.dice.random() < 0.5:
+            # It comes and goes as a service of the type that is browsed for; it goes on answering,
+            # since the wizard may be about to ask it.
+            self.devices[name] = not self.devices[name]
+            self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
+        else:
+            self.network.set(name, note=f"after step {len(self.steps)}")
 
     def listen(self, person, seconds):
         """Lets time pass in which the wizard has to answer all the time."""
