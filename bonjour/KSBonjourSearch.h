@@ -31,6 +31,8 @@ class KSBonjourSearch final : public KSBonjourObserver,
  public:
   [[nodiscard]] static std::shared_ptr<KSBonjourSearch> init();
 
+  KSBonjourSearch(const KSBonjourSearch&) = delete;
+  KSBonjourSearch& operator=(const KSBonjourSearch&) = delete;
   ~KSBonjourSearch() override;
 
   /// Observers are retained and told in the order in which they were added.

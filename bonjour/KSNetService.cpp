@@ -1,6 +1,9 @@
 #include "bonjour/KSNetService.h"
 
 #include <cstddef>
+#include <cstdint>
+
+#include "platform/ipv4.h"
 
 namespace onramp {
 
@@ -12,13 +15,11 @@ constexpr std::size_t kIPv4Offset = 4;
 constexpr std::size_t kIPv4Size = 4;
 constexpr std::byte kIPv4Family{2};
 
-std::string dotted(const std::byte* address) {
-  std::string text;
-  for (std::size_t i = 0; i < kIPv4Size; ++i) {
-    if (i != 0) text += '.';
-    text += std::to_string(std::to_integer<unsigned>(address[i]));
-  }
-  return text;
+IPv4Address addressAt(const std::byte* bytes) {
+  IPv4Address address;
+  for (std::size_t i = 0; i < kIPv4Size; ++i)
+    address.bits = address.bits << 8U | std::to_integer<std::uint32_t>(bytes[i]);
+  return address;
 }
 
 }  // namespace
@@ -107,7 +108,7 @@ std::optional<std::vector<std::string>> KSNetServiceCopyIPv4Addresses(
   std::vector<std::string> addresses;
   for (const Data& address : service->addressing()) {
     if (address.size() < kIPv4Offset + kIPv4Size || address[kFamilyOffset] != kIPv4Family) continue;
-    addresses.push_back(dotted(address.data() + kIPv4Offset));
+    addresses.push_back(dottedIPv4(addressAt(address.data() + kIPv4Offset)));
   }
   if (addresses.empty()) return std::nullopt;
   return addresses;

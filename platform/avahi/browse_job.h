@@ -2,6 +2,7 @@
 
 #include <functional>
 #include <string>
+#include <tuple>
 
 #include "platform/avahi/handles.h"
 #include "platform/avahi/job.h"
@@ -16,7 +17,10 @@ struct Sighting {
   std::string name;
   std::string type;
   std::string domain;
-  friend auto operator<=>(const Sighting&, const Sighting&) = default;
+  friend bool operator<(const Sighting& a, const Sighting& b) {
+    return std::tie(a.interface, a.protocol, a.name, a.type, a.domain) <
+           std::tie(b.interface, b.protocol, b.name, b.type, b.domain);
+  }
 };
 
 enum class BrowseEvent {

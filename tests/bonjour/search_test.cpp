@@ -37,7 +37,7 @@ class SearchTest : public ::testing::Test {
     search->addKSDeviceObserver(recorder);
     search->startBrowsing();
   }
-  ~SearchTest() override { search->stopBrowsing(); }
+  void TearDown() override { search->stopBrowsing(); }
 
   Network& network = Network::instance();
   std::shared_ptr<KSBonjourSearch> search = KSBonjourSearch::init();
