@@ -36,8 +36,7 @@ class ChooserSoak : public Wizard {
     Network::instance().reset();
     Agents::instance().reset();
     const Dictionary model = recording::model(true, false, true);
-    describe(
-        {{"Kestrel Model 100", model}, {"Kestrel Scan", recording::model(true, true, false)}});
+    describe({{"Kestrel Model 100", model}, {"Kestrel Scan", recording::model(true, true, false)}});
   }
 
   [[nodiscard]] int random(int below) {
