@@ -1,0 +1,102 @@
+#include "platform/run_loop.h"
+
+#import <AppKit/AppKit.h>
+
+#include <chrono>
+#include <condition_variable>
+#include <mutex>
+#include <utility>
+
+#import "platform/cocoa/action.h"
+#import "platform/cocoa/native.h"
+#import "platform/cocoa/termination.h"
+
+namespace onramp {
+
+namespace {
+
+NSArray* allModes() {
+  return [NSArray arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode,
+                                   NSEventTrackingRunLoopMode, nil];
+}
+
+struct Termination {
+  std::mutex mutex;
+  std::condition_variable changed;
+  bool asked = false;
+};
+
+// Never destroyed: the process may exit while a thread still sleeps.
+Termination& termination() {
+  static Termination* const instance = std::make_unique<Termination>().release();
+  return *instance;
+}
+
+// A modal loop looks whether it was stopped when it has handled an event.
+void wakeEventLoop() {
+  [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
+                                      location:NSZeroPoint
+                                 modifierFlags:0
+                                     timestamp:0
+                                  windowNumber:0
+                                       context:nil
+                                       subtype:0
+                                         data1:0
+                                         data2:0]
+           atStart:NO];
+}
+
+}  // namespace
+
+namespace cocoa {
+
+void wakeSleepersForTermination() {
+  {
+    const std::lock_guard lock(termination().mutex);
+    termination().asked = true;
+  }
+  termination().changed.notify_all();
+}
+
+}  // namespace cocoa
+
+void scheduleTimer(double seconds, std::function<void()> action) {
+  NSTimer* const timer =
+      [NSTimer timerWithTimeInterval:seconds
+                              target:[OnrampAction actionWithFunction:std::move(action)]
+                            selector:@selector(perform:)
+                            userInfo:nil
+                             repeats:NO];
+  for (NSString* mode in allModes())
+    [[NSRunLoop mainRunLoop] addTimer:timer forMode:mode];
+}
+
+void performOnMainThread(std::function<void()> action) {
+  @autoreleasepool {
+    [[OnrampAction actionWithFunction:std::move(action)]
+        performSelectorOnMainThread:@selector(perform:)
+                         withObject:nil
+                      waitUntilDone:NO
+                              modes:allModes()];
+  }
+}
+
+void runModalForWindow(const Window& window) {
+  window.makeKeyAndOrderFront();
+  if (NSWindow* const modal = cocoa::nativeOf<NSWindow>(window)) [NSApp runModalForWindow:modal];
+}
+
+void abortModal() {
+  performOnMainThread([] {
+    [NSApp stopModalWithCode:NSModalResponseAbort];
+    wakeEventLoop();
+  });
+}
+
+bool sleepOffMainThread(std::uint32_t seconds) {
+  std::unique_lock lock(termination().mutex);
+  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
+                                         [] { return termination().asked; });
+}
+
+}  // namespace onramp
