@@ -26,5 +26,7 @@ execute_process(COMMAND gcc -print-file-name=include OUTPUT_VARIABLE gcc_include
 
 add_library(GNUstep::AppKit INTERFACE IMPORTED)
 target_compile_options(GNUstep::AppKit INTERFACE
-  $<$<COMPILE_LANGUAGE:OBJCXX>:${compile_flags} -fobjc-runtime=gcc -idirafter${gcc_include}>)
+  $<$<COMPILE_LANGUAGE:OBJCXX>:${compile_flags} -fobjc-runtime=gcc -idirafter${gcc_include}>
+  # Declares what GNUstep's own headers do not.
+  "$<$<COMPILE_LANGUAGE:OBJCXX>:SHELL:-include ${PROJECT_SOURCE_DIR}/platform/cocoa/gnustep/appkit_additions.h>")
 target_link_libraries(GNUstep::AppKit INTERFACE ${link_flags})

@@ -3,7 +3,9 @@
 add_library(onramp_options INTERFACE)
 target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})
 target_compile_options(onramp_options INTERFACE
-  -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror)
+  -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
+  # GCC 12 takes the libraries' own string concatenation for an overlapping copy.
+  $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>)
 
 # Every object file is instrumented, third-party headers' code included, so these are global.
 if(ONRAMP_SANITIZE)
@@ -18,6 +20,15 @@ endif()
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
+  target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
+endfunction()
+
+# onramp_backend(NAME SOURCES… [LINK libraries…]): what fulfils the seam, or a part of it. Its objects
+# are linked as they are: the rooms' libraries refer to them and come after them on the linker's
+# line, where it would no longer take them out of a static library.
+function(onramp_backend name)
+  cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
+  add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 

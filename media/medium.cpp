@@ -18,9 +18,7 @@ std::string fullPath(std::string_view bundlePath, const std::optional<std::strin
   const std::size_t slash = bundlePath.rfind('/');
   std::string joined(bundlePath.substr(0, slash == std::string_view::npos ? 0 : slash + 1));
   if (relativePath) joined += *relativePath;
-  while (joined.size() > 1 && joined.back() == '/')
-    joined.pop_back();
-  return joined;
+  return withoutClosingSlash(std::move(joined));
 }
 
 std::string fullPath(const std::optional<std::string>& relativePath) {

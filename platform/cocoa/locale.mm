@@ -1,6 +1,5 @@
-#include "platform/locale.h"
-
 #import "platform/cocoa/text.h"
+#include "platform/user_locale.h"
 
 namespace onramp {
 

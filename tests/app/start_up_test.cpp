@@ -1,4 +1,7 @@
 #include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <map>
 
 #include "tests/app/wizard.h"
 
@@ -32,7 +35,11 @@ TEST_F(StartUp, SkipsTheListWhenAllModelsShareTheirCables) {
        "ConnectionTypeView",
        "INST_TXT_USB"},
       {{{"A", model(true, true, true)}, {"B", model(true, false, true)}}, "ModelListView", ""},
-      {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, "ModelListView", ""}};
+      {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, "ModelListView", ""},
+      {{{"A", model(true, false, true)},
+        {"No identifier", Dictionary{{"Interfaces", Dictionary{{"USB", true}}}}}},
+       "ModelListView",
+       ""}};
   for (const Case& c : cases) {
     screen.reset();
     describe(c.models);
@@ -99,10 +106,31 @@ TEST_F(StartUp, RemovesWhatAnEarlierRunHandedOver) {
   EXPECT_FALSE(medium.optionsFile());
 }
 
+// Every file below `folder` with its bytes.
+std::map<std::string, std::string> filesBelow(const std::string& folder) {
+  std::map<std::string, std::string> files;
+  for (const auto& entry : std::filesystem::recursive_directory_iterator(folder)) {
+    if (!entry.is_regular_file()) continue;
+    std::ifstream file(entry.path(), std::ios::binary);
+    files[entry.path().string()] = std::string(std::istreambuf_iterator<char>(file), {});
+  }
+  return files;
+}
+
+TEST_F(StartUp, NeedsNothingOnTheMedium) {
+  launch();
+  EXPECT_EQ(page(), "");
+  EXPECT_EQ(medium.opened(0), std::vector<std::string>());
+  screen.runTimers();
+  EXPECT_TRUE(screen.terminated);
+}
+
 TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
+  const std::string texts =
+      "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
   const std::string files[] = {"MacResources/Common.plist", "MacResources/CDInfo.plist",
-                               "MacResources/ModelInfo.plist",
-                               "Onramp OSX.app/Contents/Info.plist"};
+                               "MacResources/ModelInfo.plist", "Onramp OSX.app/Contents/Info.plist",
+                               texts};
   struct Damage {
     const char* name;
     std::function<void(const std::string&)> apply;
@@ -138,12 +166,20 @@ TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
       screen.reset();
       std::filesystem::copy_file(copy, intact, std::filesystem::copy_options::overwrite_existing);
       describeTwoModels();
+      medium.write(texts, std::string("\"BTN_NEXT\" = \"Next\";"));
       damage.apply(file);
+      const auto before = filesBelow(medium.path(""));
       launch();
-      // Without its description a medium has no wireless model: the wizard is not needed.
-      EXPECT_EQ(page(), "");
-      screen.runTimers();
+      if (file == texts) {
+        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "keys stand for themselves";
+        screen.click("rightButton");
+      } else {
+        // Without its description a medium has no wireless model: the wizard is not needed.
+        EXPECT_EQ(page(), "");
+        screen.runTimers();
+      }
       EXPECT_TRUE(screen.terminated);
+      EXPECT_EQ(filesBelow(medium.path("")), before) << "the medium is never written to";
     }
   }
 }

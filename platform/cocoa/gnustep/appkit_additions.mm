@@ -4,24 +4,15 @@
 
 #import "platform/cocoa/gnustep/method_exchange.h"
 
-@implementation NSWindow (OnrampTermination)
-
-// A window of fixed size shows none.
-- (void)setShowsResizeIndicator:(BOOL)shows {
-}
-
-// GNUstep's windows never do.
-- (void)setPreventsApplicationTerminationWhenModal:(BOOL)prevents {
-}
-
-@end
-
 namespace {
 
 using BeginSheet = void(id, SEL, NSWindow*, id, SEL, void*);
 using OpenURL = BOOL(id, SEL, NSURL*);
 
 BeginSheet* originalBeginSheet = nullptr;
+
+// A window of fixed size shows no resize indicator, and no window prevents termination here.
+void ignore(id, SEL, BOOL) {}
 
 }  // namespace
 
@@ -91,6 +82,9 @@ BOOL openURL(id, SEL, NSURL* url) {
         [NSAlert class],
         @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:), beginSheet);
     replaceMethod([NSWorkspace class], @selector(openURL:), openURL);
+    onramp::gnustep::addMethod([NSWindow class], @selector(setShowsResizeIndicator:), ignore);
+    onramp::gnustep::addMethod([NSWindow class],
+                               @selector(setPreventsApplicationTerminationWhenModal:), ignore);
     [NSButton exposeBinding:@"title"];
   }
 }

@@ -11,4 +11,10 @@ Implementation* replaceMethod(Class owner, SEL selector, Implementation* replace
       class_getInstanceMethod(owner, selector), reinterpret_cast<IMP>(replacement)));
 }
 
+/// Gives the class a method that it lacks or does not fulfil: one that takes a BOOL and gives
+/// nothing.
+inline void addMethod(Class owner, SEL selector, void (*implementation)(id, SEL, BOOL)) {
+  class_replaceMethod(owner, selector, reinterpret_cast<IMP>(implementation), "v@:c");
+}
+
 }  // namespace onramp::gnustep

@@ -1,0 +1,15 @@
+// The least that a program with a window of the wizard's size can do.
+
+#include <QApplication>
+#include <QMainWindow>
+#include <QScreen>
+
+int main(int argc, char** argv) {
+  const QApplication application(argc, argv);
+  QApplication::setStyle(QStringLiteral("Fusion"));
+  QMainWindow window;
+  window.setFixedSize(680, 510);
+  window.move(window.screen()->geometry().center() - window.rect().center());
+  window.show();
+  return QApplication::exec();
+}

@@ -1,0 +1,17 @@
+# Which backends a program is linked with: one for each part of the seam.
+
+if(APPLE)
+  set(ONRAMP_UI cocoa)
+  set(ONRAMP_BACKENDS onramp_cocoa onramp_coreservices onramp_cfnetwork onramp_systemconfiguration)
+else()
+  set(ONRAMP_UI qt CACHE STRING "The front end: qt, or cocoa to try the one of macOS on GNUstep")
+  set_property(CACHE ONRAMP_UI PROPERTY STRINGS qt cocoa)
+  if(ONRAMP_UI STREQUAL "qt")
+    set(ONRAMP_BACKENDS onramp_qt onramp_freedesktop onramp_libplist)
+  elseif(ONRAMP_UI STREQUAL "cocoa")
+    include(gnustep)
+    set(ONRAMP_BACKENDS onramp_cocoa onramp_gnustep)
+  else()
+    message(FATAL_ERROR "ONRAMP_UI is \"${ONRAMP_UI}\"; set it to qt or cocoa")
+  endif()
+endif()

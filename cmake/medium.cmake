@@ -1,0 +1,34 @@
+# Assembles a medium to run from: the example medium's files with the application's bundle beside
+# them. The build tree's own copy lies in ONRAMP_MEDIUM.
+
+set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
+set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
+
+set_target_properties(onramp PROPERTIES
+  OUTPUT_NAME "Onramp OSX"
+  RUNTIME_OUTPUT_DIRECTORY "${onramp_contents}/Linux")
+configure_file(${PROJECT_SOURCE_DIR}/resources/Info.plist.in ${PROJECT_BINARY_DIR}/Info.plist @ONLY)
+file(GLOB onramp_languages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.lproj)
+file(GLOB onramp_interfaces CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/${ONRAMP_UI}/*.*)
+
+set(copy_languages)
+foreach(folder IN LISTS onramp_languages)
+  get_filename_component(language ${folder} NAME)
+  list(APPEND copy_languages COMMAND ${CMAKE_COMMAND} -E copy_directory ${folder}
+    ${onramp_contents}/Resources/${language})
+endforeach()
+
+# The folders of the example medium go first, so that nothing stays there that is no longer in it.
+add_custom_target(medium ALL
+  COMMAND ${CMAKE_COMMAND} -E rm -rf ${ONRAMP_MEDIUM}/MacResources ${ONRAMP_MEDIUM}/Packages
+    ${ONRAMP_MEDIUM}/Utilities ${onramp_contents}/Resources
+  COMMAND ${CMAKE_COMMAND} -E copy_directory ${PROJECT_SOURCE_DIR}/examples/medium ${ONRAMP_MEDIUM}
+  COMMAND ${CMAKE_COMMAND} -E make_directory ${onramp_contents}/Resources
+  COMMAND ${CMAKE_COMMAND} -E copy ${PROJECT_BINARY_DIR}/Info.plist ${onramp_contents}/Info.plist
+  COMMAND ${CMAKE_COMMAND} -E copy ${onramp_interfaces}
+    ${PROJECT_SOURCE_DIR}/resources/Background.png
+    ${PROJECT_SOURCE_DIR}/resources/SupportedKOL.plist ${onramp_contents}/Resources
+  ${copy_languages}
+  DEPENDS onramp
+  COMMENT "Assembling the medium"
+  VERBATIM)

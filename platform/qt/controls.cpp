@@ -1,0 +1,45 @@
+#include <QAction>
+#include <QMenu>
+#include <QProgressBar>
+#include <QToolButton>
+#include <utility>
+
+#include "platform/outlets.h"
+#include "platform/qt/native.h"
+
+namespace onramp {
+
+using qt::nativeOf;
+
+void ProgressIndicator::startAnimation() const {
+  if (auto* const bar = nativeOf<QProgressBar>(*this)) bar->setRange(0, 0);
+}
+
+void ProgressIndicator::stopAnimation() const {
+  if (auto* const bar = nativeOf<QProgressBar>(*this)) bar->setRange(0, 1);
+}
+
+// The button itself is item 0; the others are its menu's actions.
+
+std::size_t PopUpButton::numberOfItems() const {
+  const auto* const button = nativeOf<QToolButton>(*this);
+  if (!button) return 0;
+  return 1 + (button->menu() ? static_cast<std::size_t>(button->menu()->actions().size()) : 0);
+}
+
+void PopUpButton::removeItem(std::size_t index) const {
+  auto* const button = nativeOf<QToolButton>(*this);
+  if (!button || index < 1 || index >= numberOfItems()) return;
+  delete button->menu()->actions().at(static_cast<qsizetype>(index) - 1);
+}
+
+void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {
+  auto* const button = nativeOf<QToolButton>(*this);
+  if (!button) return;
+  if (!button->menu()) button->setMenu(qt::makeChild<QMenu>(button));
+  const QAction* const item = button->menu()->addAction(qt::titleText(title));
+  // The command runs once the menu has closed: it may block for seconds.
+  QObject::connect(item, &QAction::triggered, button, std::move(action), Qt::QueuedConnection);
+}
+
+}  // namespace onramp

@@ -1,0 +1,182 @@
+#include "platform/interface_file.h"
+
+#include <QAbstractButton>
+#include <QAbstractItemView>
+#include <QAction>
+#include <QCoreApplication>
+#include <QFile>
+#include <QLabel>
+#include <QMenu>
+#include <QMenuBar>
+#include <QPointer>
+#include <QProgressBar>
+#include <QPushButton>
+#include <QToolButton>
+#include <QUiLoader>
+#include <utility>
+
+#include "platform/bundle.h"
+#include "platform/qt/image_view.h"
+#include "platform/qt/native.h"
+#include "platform/qt/radio_matrix.h"
+
+namespace onramp {
+
+namespace {
+
+constexpr const char* kViewClass = "viewClass";
+
+QString textOf(std::string_view text) {
+  return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+}
+
+// Makes this front end's own widgets, and a plain widget for every class that it does not know,
+// which is how an interface file names a page's class.
+class Loader final : public QUiLoader {
+ public:
+  explicit Loader(QObject* parent) : QUiLoader(parent) {
+    // Nothing here comes from a plug-in; looking for some costs time at every start.
+    clearPluginPaths();
+  }
+
+  /// The application's one loader, since making one takes as long as loading a file.
+  static Loader& shared() {
+    static Loader* const loader = qt::makeChild<Loader>(qApp);
+    return *loader;
+  }
+
+  QWidget* createWidget(const QString& className, QWidget* parent, const QString& name) override {
+    QWidget* widget = nullptr;
+    if (className == QLatin1String("ImageView")) {
+      widget = qt::makeChild<qt::ImageViewWidget>(parent);
+    } else if (className == QLatin1String("RadioMatrix")) {
+      widget = qt::makeChild<qt::RadioMatrixWidget>(parent);
+    } else if (availableWidgets().contains(className)) {
+      widget = QUiLoader::createWidget(className, parent, name);
+    } else {
+      widget = qt::makeChild<QWidget>(parent);
+      widget->setProperty(kViewClass, className);
+    }
+    if (widget) widget->setObjectName(name);
+    return widget;
+  }
+};
+
+// The texts that stand in the interface file itself, in the user's language.
+void localize(QWidget& root, const std::string& interfaceName) {
+  const auto translated = [&](const QString& text) {
+    const std::string key = text.toStdString();
+    return QString::fromStdString(Bundle::main().localizedString(key, key, interfaceName));
+  };
+  for (QWidget* const widget : root.findChildren<QWidget*>()) {
+    if (!widget->accessibleName().isEmpty()) {
+      widget->setAccessibleName(translated(widget->accessibleName()));
+    }
+    if (!widget->toolTip().isEmpty()) widget->setToolTip(translated(widget->toolTip()));
+  }
+}
+
+// "titleBinding" names the owner's text that a button or window shows.
+void bindTitle(QWidget* widget, KeyValueTexts& texts) {
+  const QString key = widget->property("titleBinding").toString();
+  if (key.isEmpty()) return;
+  texts.bind(key.toStdString(), [target = QPointer<QWidget>(widget)](const std::string& title) {
+    if (auto* const button = qobject_cast<QAbstractButton*>(target)) {
+      button->setText(qt::titleText(title));
+    } else if (target) {
+      target->setWindowTitle(QString::fromStdString(title));
+    }
+  });
+}
+
+// "action" names what a click asks the owner for.
+void connectAction(QWidget* widget, InterfaceOwner& owner) {
+  auto* const button = qobject_cast<QAbstractButton*>(widget);
+  const std::string action = widget->property("action").toString().toStdString();
+  if (!button || action.empty()) return;
+  QObject::connect(button, &QAbstractButton::clicked, button,
+                   [&owner, action] { owner.performAction(action); });
+}
+
+bool isOfKind(const QObject* object, OutletKind kind) {
+  switch (kind) {
+    case OutletKind::kView:
+      return object->isWidgetType();
+    case OutletKind::kTextField:
+      return qobject_cast<const QLabel*>(object);
+    case OutletKind::kButton:
+      return qobject_cast<const QPushButton*>(object);
+    case OutletKind::kRadioMatrix:
+      return qobject_cast<const qt::RadioMatrixWidget*>(object);
+    case OutletKind::kImageView:
+      return qobject_cast<const qt::ImageViewWidget*>(object);
+    case OutletKind::kProgressIndicator:
+      return qobject_cast<const QProgressBar*>(object);
+    case OutletKind::kTableView:
+      return qobject_cast<const QAbstractItemView*>(object);
+    case OutletKind::kPopUpButton:
+      return qobject_cast<const QToolButton*>(object);
+    case OutletKind::kWindow:
+      return object->isWidgetType() && static_cast<const QWidget*>(object)->isWindow();
+    case OutletKind::kMenu:
+      return qobject_cast<const QMenuBar*>(object) || qobject_cast<const QMenu*>(object);
+    case OutletKind::kMenuItem:
+      return qobject_cast<const QAction*>(object);
+  }
+  return false;
+}
+
+}  // namespace
+
+// A page's root is a child of the window while it is shown, and goes with it if the window goes
+// first.
+struct Interface::Tree {
+  explicit Tree(QWidget* widget) : root(widget) {}
+  Tree(const Tree&) = delete;
+  Tree& operator=(const Tree&) = delete;
+  ~Tree() { delete root.data(); }
+
+  QPointer<QWidget> root;
+};
+
+Interface::Interface(std::unique_ptr<Tree> tree) : tree_(std::move(tree)) {}
+
+Interface::~Interface() = default;
+
+std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwner& owner) {
+  const auto path = Bundle::main().pathForResource(name, "ui");
+  QFile file(QString::fromStdString(path.value_or("")));
+  if (!path || !file.open(QIODevice::ReadOnly)) return nullptr;
+  auto tree = std::make_unique<Tree>(Loader::shared().load(&file));
+  if (!tree->root) return nullptr;
+
+  localize(*tree->root, name);
+  QList<QWidget*> widgets = tree->root->findChildren<QWidget*>();
+  widgets.prepend(tree->root);
+  for (QWidget* const widget : widgets) {
+    bindTitle(widget, owner.boundTexts());
+    connectAction(widget, owner);
+  }
+  return std::unique_ptr<Interface>(new Interface(std::move(tree)));
+}
+
+View Interface::view() const {
+  return View(qt::toNative(tree_->root));
+}
+
+std::string Interface::viewClass() const {
+  return tree_->root ? tree_->root->property(kViewClass).toString().toStdString() : "";
+}
+
+NativeObject* Interface::find(std::string_view name, OutletKind kind) const {
+  if (!tree_->root) return nullptr;
+  if (tree_->root->objectName() == textOf(name) && isOfKind(tree_->root, kind)) {
+    return qt::toNative(tree_->root);
+  }
+  for (QObject* const object : tree_->root->findChildren<QObject*>(textOf(name))) {
+    if (isOfKind(object, kind)) return qt::toNative(object);
+  }
+  return nullptr;
+}
+
+}  // namespace onramp

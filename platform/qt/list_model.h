@@ -1,0 +1,41 @@
+#pragma once
+
+#include <QAbstractTableModel>
+#include <QStringList>
+
+namespace onramp {
+
+class ArrayController;
+
+namespace qt {
+
+/// An array controller's entries as a table: one row an entry, one column an identifier.
+class ListModel final : public QAbstractTableModel {
+  Q_OBJECT
+
+ public:
+  ListModel(QStringList columns, QObject* parent);
+
+  /// Shows the entries of `controller` from now on.
+  void setController(const ArrayController& controller);
+
+  /// The controller's entries have changed.
+  void reload();
+
+  void setHeader(const QString& identifier, const QString& title);
+
+  [[nodiscard]] int rowCount(const QModelIndex& parent = {}) const override;
+  [[nodiscard]] int columnCount(const QModelIndex& parent = {}) const override;
+  [[nodiscard]] QVariant data(const QModelIndex& index, int role) const override;
+  [[nodiscard]] QVariant headerData(int section, Qt::Orientation orientation,
+                                    int role) const override;
+
+ private:
+  const QStringList columns_;
+  QStringList headers_;
+  const ArrayController* controller_ = nullptr;
+  int rows_ = 0;  ///< as the views know it
+};
+
+}  // namespace qt
+}  // namespace onramp

@@ -1,0 +1,15 @@
+#pragma once
+
+namespace onramp::qt {
+
+/// Whether the application was asked to terminate. Callable from any thread.
+[[nodiscard]] bool isTerminating();
+
+/// Whether a modal loop runs. Main thread only.
+[[nodiscard]] bool isModal();
+
+/// Ends the main loop, every modal one and every sleep off the main thread, for good. Main thread
+/// only.
+void endAllLoops();
+
+}  // namespace onramp::qt

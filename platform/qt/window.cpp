@@ -1,0 +1,45 @@
+#include <QScreen>
+#include <QWidget>
+
+#include "platform/outlets.h"
+#include "platform/qt/native.h"
+
+namespace onramp {
+
+using qt::nativeOf;
+
+// A window without the indicator cannot be resized.
+void Window::setShowsResizeIndicator(bool shows) const {
+  auto* const window = nativeOf<QWidget>(*this);
+  if (window && !shows) window->setFixedSize(window->size());
+}
+
+void Window::center() const {
+  auto* const window = nativeOf<QWidget>(*this);
+  if (!window) return;
+  QRect frame = window->frameGeometry();
+  frame.moveCenter(window->screen()->availableGeometry().center());
+  window->move(frame.topLeft());
+}
+
+void Window::makeKeyWindow() const {
+  if (auto* const window = nativeOf<QWidget>(*this)) window->activateWindow();
+}
+
+void Window::orderFront() const {
+  auto* const window = nativeOf<QWidget>(*this);
+  if (!window) return;
+  window->show();
+  window->raise();
+}
+
+void Window::makeKeyAndOrderFront() const {
+  orderFront();
+  makeKeyWindow();
+}
+
+void Window::close() const {
+  if (auto* const window = nativeOf<QWidget>(*this)) window->hide();
+}
+
+}  // namespace onramp

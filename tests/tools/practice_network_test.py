@@ -1,0 +1,259 @@
+"""The practice network, seen with the ordinary tools of mDNS and SNMP."""
+
+import os
+import pathlib
+import re
+import signal
+import subprocess
+import sys
+import tempfile
+import time
+import unittest
+
+TOOLS = pathlib.Path(__file__).resolve().parents[2] / "tools"
+TOOL = str(TOOLS / "practice-network")
+EXAMPLE = TOOLS.parent / "examples" / "practice-network.toml"
+sys.path.insert(0, str(TOOLS))
+
+from practice_network import ControlError, PracticeNetwork
+
+OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
+DEVICES = """
+[[device]]
+name = "Büro 北"
+maker = "Kestrel"
+model = "Model 100"
+note = "2nd floor"
+addresses = ["127.0.1.1", "127.0.1.2", "127.0.1.3"]
+activeif = ["silent", 2, -7]
+[[device]]
+name = "Scanner"
+maker = "Kestrel"
+model = "Scan 50"
+type = ["_scanner._tcp", "_ipp._tcp"]
+port = 4000
+activeif = "missing"
+[[device]]
+name = "Odd"
+addresses = ["127.0.1.20"]
+activeif = "text"
+[[device]]
+name = "Later"
+addresses = ["127.0.1.30"]
+delay = 0.5
+present = false
+"""
+
+
+def browse(service_type):
+    """Name → (address, port, TXT entries) of all devices that are there."""
+    output = subprocess.run(["avahi-browse", "-rptk", service_type], check=True,
+                            capture_output=True, text=True).stdout
+    rows = [line.split(";", 9) for line in output.splitlines() if line.startswith("=")]
+    unescape = lambda text: re.sub(rb"\\(\d{3})", lambda match: bytes([int(match[1])]),
+                                   text.encode()).decode()
+    return {unescape(row[3]): (row[7], row[8], set(re.findall(r'"(.*?)"', row[9])))
+            for row in rows}
+
+
+def ask(address, seconds=0.3):
+    """What snmpget prints for the device interface object: a value, or the reason for none."""
+    result = subprocess.run(["snmpget", "-v1", "-Ov", "-c", "corridor", "-r0", f"-t{seconds}",
+                             address, OBJECT], capture_output=True, text=True)
+    return result.stdout.strip() or result.stderr
+
+
+class FromInside(unittest.TestCase):
+    """Runs as the command of a network of DEVICES."""
+
+    def setUp(self):
+        self.network = PracticeNetwork()
+
+    def assert_gone(self, name):
+        """Avahi's caches keep what said goodbye for another second, as all mDNS caches do."""
+        deadline = time.monotonic() + 10
+        while name in browse("_pdl-datastream._tcp"):
+            self.assertLess(time.monotonic(), deadline, f"{name} is still there")
+
+    def restore(self, name, **entries):
+        self.addCleanup(self.network.settle)
+        self.addCleanup(self.network.set, name, **entries)
+
+    def test_services_carry_the_keys_of_their_type(self):
+        printers = browse("_pdl-datastream._tcp")
+        self.assertEqual(set(printers), {"Büro 北", "Odd"})
+        self.assertEqual(printers["Büro 北"][1:], (
+            "9100", {"usb_MFG=Kestrel", "usb_MDL=Model 100", "note=2nd floor"}))
+        self.assertEqual(browse("_scanner._tcp")["Scanner"][1:],
+                         ("4000", {"mfg=Kestrel", "mdl=Scan 50"}))
+        self.assertEqual(browse("_ipp._tcp")["Scanner"][1:],
+                         ("4000", {"usb_MFG=Kestrel", "usb_MDL=Scan 50"}))
+
+    def test_each_address_answers_in_its_own_way(self):
+        scanner, = (one["addresses"][0] for one in self.network.list() if one["name"] == "Scanner")
+        for address, answer in (("127.0.1.1", "Timeout"), ("127.0.1.2", "INTEGER: 2"),
+                                ("127.0.1.3", "INTEGER: -7"), ("127.0.1.20", 'STRING: "two"'),
+                                (scanner, "noSuchName"), ("127.0.1.30", "Timeout")):
+            with self.subTest(address):
+                self.assertIn(answer, ask(address))
+
+    def test_a_device_comes_slow_to_answer_and_goes(self):
+        self.network.add("Later")
+        self.network.settle()
+        self.assertIn("Later", browse("_pdl-datastream._tcp"))
+        self.assertIn("Timeout", ask("127.0.1.30", seconds=0.1))
+        self.assertIn("INTEGER: 2", ask("127.0.1.30", seconds=20))
+        self.network.remove("Later")
+        self.assert_gone("Later")
+        self.assertIn("Timeout", ask("127.0.1.30"))
+
+    def test_a_new_device_can_be_made_up(self):
+        subprocess.run([TOOL, "ctl", "add", "New one", "maker=Kestrel", "model=Model 300",
+                        'addresses=["10.1.2.3"]', "activeif=7"], check=True)
+        self.network.settle()
+        self.assertEqual(browse("_pdl-datastream._tcp")["New one"],
+                         ("10.1.2.3", "9100", {"usb_MFG=Kestrel", "usb_MDL=Model 300"}))
+        self.assertIn("INTEGER: 7", ask("10.1.2.3"))
+        self.network.remove("New one")
+
+    def test_a_device_changes_under_its_name_and_gets_another(self):
+        self.restore("Odd", addresses=["127.0.1.20"], activeif="text", note="")
+        self.network.set("Odd", addresses=["127.0.1.21"], activeif=1, note="Attic")
+        self.network.rename("Odd", "Even")
+        self.addCleanup(self.network.rename, "Even", "Odd")
+        self.network.settle()
+        self.assert_gone("Odd")
+        self.assertEqual(browse("_pdl-datastream._tcp")["Even"], ("127.0.1.21", "9100", {"note=Attic"}))
+        self.assertIn("INTEGER: 1", ask("127.0.1.21"))
+        self.assertIn("Timeout", ask("127.0.1.20"))
+
+    def test_devices_are_back_after_the_daemon_was_away(self):
+        self.network.stop_daemon()
+        self.assertNotEqual(subprocess.run(["avahi-browse", "-at"], capture_output=True).returncode,
+                            0)
+        self.network.start_daemon()
+        self.network.settle()
+        self.assertEqual(set(browse("_pdl-datastream._tcp")), {"Büro 北", "Odd"})
+
+    def test_a_refused_request_changes_nothing(self):
+        before = self.network.list()
+        for message, request in (
+                ("is not known", lambda: self.network.set("Nobody", port=1)),
+                ("port must be", lambda: self.network.set("Odd", port="x")),
+                ("is there already", lambda: self.network.rename("Odd", "Scanner")),
+                ("another device's", lambda: self.network.add("Twin", addresses=["127.0.1.2"]))):
+            with self.subTest(message), self.assertRaisesRegex(ControlError, message):
+                request()
+        self.assertEqual(self.network.list(), before)
+
+
+class FromOutside(unittest.TestCase):
+    def setUp(self):
+        folder = tempfile.TemporaryDirectory()
+        self.addCleanup(folder.cleanup)
+        self.folder = pathlib.Path(folder.name)
+
+    def describe(self, text):
+        path = self.folder / "devices.toml"
+        path.write_text(text)
+        return str(path)
+
+    def run_tool(self, *arguments, **options):
+        return subprocess.run([TOOL, *arguments], capture_output=True, text=True, timeout=60,
+                              **options)
+
+    def test_described_devices_are_there_for_the_command(self):
+        result = self.run_tool(self.describe(DEVICES), sys.executable, "-B", __file__, "FromInside")
+        self.assertEqual(result.returncode, 0, result.stderr)
+
+    def test_the_example_comes_up_whole(self):
+        result = self.run_tool(str(EXAMPLE), "--", TOOL, "ctl", "list")
+        self.assertEqual((result.stdout.count('"established"'), result.stdout.count('"withdrawn"')),
+                         (19, 1), result.stderr)
+
+    def test_two_hosts_meet_over_the_cable_only(self):
+        script = ("timeout 20 avahi-browse -rpk _pdl-datastream._tcp | grep -m1 '^=.*192.0.2.10';"
+                  f"snmpget -v1 -Ov -c corridor 192.0.2.10 {OBJECT}; ls /run/practice-network/agents")
+        result = self.run_tool("--hosts", "2", self.describe('[[device]]\nname = "Far"'),
+                               "sh", "-c", script)
+        self.assertRegex(result.stdout, "^=;.*;Far;.*\nINTEGER: 2\n$", result.stderr)
+        self.assertIn("No such file", result.stderr)
+
+    def test_the_exit_status_is_the_commands(self):
+        description = self.describe("")
+        for command, status in ((["sh", "-c", "exit 5"], 5), (["sh", "-c", "kill -9 $$"], 137),
+                                (["/no/such/program"], 127)):
+            with self.subTest(command):
+                self.assertEqual(self.run_tool(description, *command).returncode, status)
+
+    def test_nothing_is_left_when_the_tool_is_ended(self):
+        for number, status in ((signal.SIGKILL, -9), (signal.SIGTERM, 143)):
+            with self.subTest(number):
+                tool = subprocess.Popen(
+                    [TOOL, self.describe(DEVICES), "sh", "-c",
+                     "(setsid sleep 600 &); readlink /proc/self/ns/pid; sleep 600"],
+                    stdout=subprocess.PIPE, text=True)
+                namespace = tool.stdout.readline().strip()
+                self.assertGreater(len(processes_in(namespace)), 6)
+                tool.send_signal(number)
+                self.assertEqual(tool.wait(30), status)
+                tool.stdout.close()
+                deadline = time.monotonic() + 10
+                while processes_in(namespace) and time.monotonic() < deadline:
+                    time.sleep(0.05)
+                self.assertEqual(processes_in(namespace), [])
+
+    def test_a_bad_description_is_named_with_its_remedy(self):
+        for text, message in (
+                ("[[device]]\nname = x\n", "not valid TOML.*line 2"),
+                ('[[devices]]\nname = "A"', r'unknown entry "devices".*\[\[device\]\]'),
+                ('[device]\nname = "A"', "double brackets"),
+                ("[[device]]\nport = 1", "device number 1: name is missing"),
+                ('[[device]]\nname = "A"\nmodle = "x"', 'device "A".*did you mean "model"'),
+                ('[[device]]\nname = "A"\n' * 2, 'device "A": the name is used twice'),
+                (f'[[device]]\nname = "{"ü" * 32}"', "1 to 63 bytes"),
+                ('[[device]]\nname = "A"\nport = 65536', "from 1 to 65535, not 65536"),
+                ('[[device]]\nname = "A"\nactiveif = "quiet"', '"silent", "closed".*\'quiet\''),
+                ('[[device]]\nname = "A"\nactiveif = [1, 2]', "2 values for 1 addresses"),
+                ('[[device]]\nname = "A"\naddresses = ["127.0.1"]', "list of different addresses"),
+                ('[[device]]\nname = "A"\ntype = "ipp"', "a service type such as"),
+                ('[[device]]\nname = "A"\ndelay = -1', "seconds from 0"),
+                ('[[device]]\nname = "A"\npresent = "no"', "true or false"),
+                (f'[[device]]\nname = "A"\nnote = "{"n" * 260}"', "note is too long"),
+                ('[[device]]\nname = "A"\naddresses = ["127.0.1.1"]\n'
+                 '[[device]]\nname = "B"\naddresses = ["127.0.1.1"]', "another device's address")):
+            with self.subTest(text):
+                path = self.describe(text)
+                result = self.run_tool(path, "true")
+                self.assertEqual(result.returncode, 2)
+                self.assertRegex(result.stderr, message)
+                self.assertIn(path, result.stderr)
+
+    def test_a_missing_program_is_named_with_its_package(self):
+        for program in ("unshare", "setpriv", "mount", "ip"):
+            (self.folder / program).symlink_to("/bin/true")
+        result = self.run_tool(self.describe(""), "true", env={"PATH": str(self.folder)})
+        self.assertEqual(result.returncode, 125)
+        self.assertRegex(result.stderr, "is missing; install it: apt-get install ")
+
+
+def processes_in(namespace):
+    found = []
+    for path in pathlib.Path("/proc").glob("[0-9]*/ns/pid"):
+        try:
+            if os.readlink(path) == namespace:
+                found.append(path)
+        except OSError:
+            pass  # Ended meanwhile, or somebody else's.
+    return found
+
+
+if __name__ == "__main__":
+    if sys.argv[1:] == ["FromInside"]:
+        unittest.main(argv=sys.argv)
+    with tempfile.NamedTemporaryFile(suffix=".toml") as empty:
+        probe = subprocess.run([TOOL, empty.name, "true"], stderr=subprocess.PIPE, text=True)
+    if probe.returncode == 77:
+        print(probe.stderr, end="")
+        sys.exit(77)
+    unittest.main(argv=sys.argv[:1] + (sys.argv[1:] or ["FromOutside"]))

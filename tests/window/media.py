@@ -1,0 +1,51 @@
+"""Media for tests, each in a folder of its own."""
+
+import pathlib
+import plistlib
+import shutil
+
+RESOURCES = "MacResources/CDCommonInfo.plist"
+
+
+def write(path, value):
+    path.parent.mkdir(parents=True, exist_ok=True)
+    path.write_bytes(plistlib.dumps(value))
+
+
+def model(usb=False, wired=False, wireless=False):
+    return {"KSCID": "k", "Interfaces": {"USB": usb, "WiredLAN": wired, "WirelessLAN": wireless}}
+
+
+def make(folder, built, models, tool_status=0, **resources):
+    """A medium with the application and the messages of the one in `built`.
+
+    Its set-up tool writes what it is called with to the file "tool" and exits with `tool_status`.
+    """
+    folder, built = pathlib.Path(folder), pathlib.Path(built)
+    shutil.copytree(built / "Onramp OSX.app", folder / "Onramp OSX.app")
+    (folder / "MacResources").mkdir()
+    for shared in ("CDCommonMessage.bundle", "Images"):
+        (folder / "MacResources" / shared).symlink_to(built / "MacResources" / shared)
+    write(folder / RESOURCES, {
+        "CDInfo": "MacResources/CDInfo.plist",
+        "ModelInfo": "MacResources/ModelInfo.plist",
+        "BonjourNetwork": "_pdl-datastream._tcp.",
+        "VenderName": "Kestrel Imaging",
+        "PkgInfo": {"PkgName": "Kestrel.pkg", "PkgLocation": "Packages"},
+        "WLANtool": "Setup.app",
+    } | resources)
+    write(folder / "MacResources/CDInfo.plist", {
+        "ContainedModel": {name: {} for name in models},
+        "KSCSeriesCode": "KS7",
+        "InstallPKG": {"PKG_WebLink": True},
+    })
+    write(folder / "MacResources/ModelInfo.plist", {"Model": models})
+    (folder / "Packages").mkdir()
+    (folder / "Packages/Kestrel.pkg").write_text("stand-in")
+    write(folder / "Setup.app/Contents/Info.plist",
+          {"CFBundleExecutable": "setup", "CFBundleDisplayName": "Wireless Setup"})
+    tool = folder / "Setup.app/Contents/Linux/setup"
+    tool.parent.mkdir()
+    tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {tool_status}\n")
+    tool.chmod(0o755)
+    return folder

@@ -1,0 +1,145 @@
+"""Whole ways through the wizard in its real window.
+
+Usage: ways_test.py [unittest options] MEDIUM, a medium's folder with the application on it.
+"""
+
+import pathlib
+import plistlib
+import sys
+import tempfile
+import unittest
+
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+sys.path.insert(0, str(ROOT / "tools"))
+
+import media  # noqa: E402
+from media import model  # noqa: E402
+from onscreen import messages  # noqa: E402
+from onscreen.desktop import Desktop  # noqa: E402
+from onscreen.person import Person  # noqa: E402
+
+BUILT = pathlib.Path(sys.argv.pop()).resolve()
+TEXT = messages.read(BUILT, "en")
+TWO_MODELS = {"Kestrel 1": model(usb=True, wired=True, wireless=True),
+              "Kestrel 2": model(usb=True)}
+OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": False,
+           "PKG_LabelTool": False, "PKG_FontSet": False}
+
+
+class Ways(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.desktop = cls.enterClassContext(Desktop())
+        cls.desktop.env["LANG"] = "en_US.UTF-8"
+
+    def setUp(self):
+        self.desktop.forget()
+        self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+
+    def start(self, models, arguments=(), env=None, **details):
+        self.medium = media.make(self.folder / "medium", BUILT, models, **details)
+        program = self.medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
+        return self.enterContext(Person(self.desktop, program, arguments, env))
+
+    def files(self):
+        """The hand-off files' contents by the last words of their names."""
+        found = {}
+        for folder in (self.desktop.user_folder, self.desktop.local_folder):
+            for path in folder.rglob("com.kestrelimaging.*"):
+                found[path.name.split(".")[2]] = plistlib.loads(path.read_bytes())
+        return found
+
+    def assert_installer_opened(self, person, model_file):
+        self.assertEqual(person.wait_for_end(), 0)
+        expected = {"installpkginfo": OPTIONS}
+        if model_file:
+            expected["instmodel"] = model_file
+        self.assertEqual(self.files(), expected)
+        self.assertEqual(self.desktop.opened(), [str(self.medium / "Packages/Kestrel.pkg")])
+
+    def assert_quit_without_a_trace(self, person):
+        self.assertEqual(person.wait_for_end(), 0)
+        self.assertEqual(self.files(), {})
+        self.assertEqual(self.desktop.opened(), [])
+
+    def test_mouse_by_the_list_and_the_cable(self):
+        person = self.start(TWO_MODELS)
+        person.click("list item", "Kestrel 1")
+        person.click("push button", TEXT["BTN_NEXT"])
+        person.click("radio button", TEXT["INST_TXT_USB"] + "\n" + TEXT["INST_TXT_ETHERNET"])
+        person.click("push button", TEXT["BTN_NEXT"])
+        self.assert_installer_opened(person, {"Model": "Kestrel 1", "Interface": "Default"})
+
+    def test_keyboard_by_a_model_without_wireless(self):
+        person = self.start(TWO_MODELS)
+        person.see("list item", "Kestrel 2")
+        person.press("Down")
+        person.press("Return")
+        self.assert_installer_opened(person, {"Model": "Kestrel 2", "Interface": "Default"})
+
+    def test_keyboard_forth_and_back_and_forth(self):
+        person = self.start({name: model(usb=True, wired=wired, wireless=True)
+                             for name, wired in (("A", True), ("B", False), ("C", True))})
+        person.see("list item", "B")
+        person.press("Down")
+        person.press("Return")
+        wireless = person.see("radio button", TEXT["INST_TXT_WIFI"])
+        self.assertTrue(person.has_state(wireless, "checked"))
+        person.click("push button", TEXT["BTN_BACK"])
+        chosen = person.see("list item", "B")
+        self.assertTrue(person.has_state(chosen, "selected"))
+        person.press("Return")
+        person.see("radio button", TEXT["INST_TXT_USB"])
+        person.press("Down")
+        person.press("space")
+        person.press("Return")
+        self.assert_installer_opened(person, {"Model": "B", "Interface": "Default"})
+
+    def test_one_model_skips_the_list(self):
+        person = self.start({"Only": model(usb=True, wireless=True)})
+        person.click("radio button", TEXT["INST_TXT_USB"])
+        self.assertFalse(person.sees("push button", TEXT["BTN_BACK"]))
+        person.press("Return")
+        self.assert_installer_opened(person, None)
+
+    def test_no_wireless_model_shows_no_window(self):
+        person = self.start({"Cable": model(usb=True, wired=True)})
+        self.assert_installer_opened(person, None)
+
+    def test_escape_and_the_close_button_quit(self):
+        for leave in (lambda p: p.press("Escape"), lambda p: p.close_window(),
+                      lambda p: p.click("push button", TEXT["BTN_CANCEL"])):
+            with self.subTest(leave=leave), tempfile.TemporaryDirectory() as self.folder:
+                self.folder = pathlib.Path(self.folder)
+                person = self.start(TWO_MODELS)
+                person.see("list item", "Kestrel 1")
+                leave(person)
+                self.assert_quit_without_a_trace(person)
+
+    def test_systems_outside_the_range_are_told_why(self):
+        cases = (("10.5.8", TEXT["INST_TXT_ALERT_OSMIN"].replace("%@", "10.6")),
+                 ("11.0.0", TEXT["INST_TXT_ALERT_OSMAX"]))
+        for version, reason in cases:
+            with self.subTest(version), tempfile.TemporaryDirectory() as self.folder:
+                self.folder = pathlib.Path(self.folder)
+                person = self.start(TWO_MODELS, ["--system-version", version],
+                                    SystemMin={"Major": "10", "Minor": "6", "BugFix": "0"},
+                                    SystemMax={"Major": "10", "Minor": "15", "BugFix": "x"})
+                person.see("label", TEXT["INST_TXT_ALERT_OS"])
+                person.see("label", reason)
+                self.assertFalse(person.sees("list item", "Kestrel 1"))
+                person.click("push button", TEXT["BTN_CLOSE"])
+                self.assert_quit_without_a_trace(person)
+
+    def test_the_application_menu_speaks_the_users_language(self):
+        german = messages.read(BUILT, "de")
+        person = self.start(TWO_MODELS, env={"LANG": "de_DE.UTF-8"})
+        person.click("menu item", "Onramp OSX")
+        for key in ("ABOUT", "HIDE", "HIDEOHTERS", "SHOWALL"):
+            person.see("menu item", german["APP_MENU_" + key])
+        person.click("menu item", german["APP_MENU_QUIT"])
+        self.assert_quit_without_a_trace(person)
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,1 @@
+"""Uses the wizard on a screen from outside its process, as a person does."""

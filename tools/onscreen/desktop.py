@@ -1,0 +1,124 @@
+"""A virtual desktop: a display, a window manager, a session bus and a home of its own."""
+
+import os
+import pathlib
+import shutil
+import subprocess
+import tempfile
+
+from .processes import Missing, start, stop, wait_for
+
+_SIZE = "1600x1200"
+
+
+class Desktop:
+    """Use it in a `with` statement; everything that it started ends with it.
+
+    What programs open with xdg-open is written down instead, one a line. A process can look at one
+    desktop only in its life: the accessibility library keeps the first one's bus.
+    """
+
+    def __init__(self, window_manager=True):
+        self._window_manager = window_manager
+        self._processes = []
+        self._folder = None
+        self.env = {}
+
+    def __enter__(self):
+        self._folder = pathlib.Path(tempfile.mkdtemp(prefix="onramp-desktop-"))
+        try:
+            self._make_home()
+            self._start_bus()
+            self._start_display()
+        except BaseException:
+            self.__exit__()
+            raise
+        return self
+
+    def __exit__(self, *_):
+        for process in reversed(self._processes):
+            stop(process)
+        shutil.rmtree(self._folder, ignore_errors=True)
+
+    @property
+    def user_folder(self):
+        """Where the user's own application-support files go."""
+        return self._folder / "user"
+
+    @property
+    def local_folder(self):
+        """Where application-support files for all users go."""
+        return self._folder / "local"
+
+    def opened(self):
+        """What was opened so far, as a list of paths and addresses."""
+        record = self._folder / "opened"
+        return record.read_text().splitlines() if record.exists() else []
+
+    def forget(self):
+        """Removes what programs have left: application-support files and what was opened."""
+        for folder in (self.user_folder, self.local_folder):
+            shutil.rmtree(folder, ignore_errors=True)
+        (self._folder / "opened").unlink(missing_ok=True)
+
+    def run(self, arguments, **options):
+        """Runs a program to its end and gives its output."""
+        done = subprocess.run(arguments, env=self.env, check=True, stdout=subprocess.PIPE,
+                              text=True, **options)
+        return done.stdout
+
+    def picture(self, path):
+        """Saves what is on the screen, without the empty desktop around it."""
+        path.parent.mkdir(parents=True, exist_ok=True)
+        self.run(["import", "-silent", "-window", "root", str(path)])
+        self.run(["mogrify", "-bordercolor", "black", "-border", "1", "-trim", "+repage",
+                  str(path)])
+
+    def _make_home(self):
+        for name in ("home", "run", "bin", "user", "local"):
+            (self._folder / name).mkdir(mode=0o700)
+        opener = self._folder / "bin" / "xdg-open"
+        opener.write_text(f"#!/bin/sh\nprintf '%s\\n' \"$1\" >> '{self._folder}/opened'\n")
+        opener.chmod(0o755)
+        kept = ("LANG", "LANGUAGE", "LC_ALL", "LC_MESSAGES", "ONRAMP_SYSTEM_VERSION")
+        self.env = {name: os.environ[name] for name in kept if name in os.environ}
+        self.env |= {
+            "HOME": str(self._folder / "home"),
+            "PATH": f"{self._folder}/bin:{os.environ['PATH']}",
+            "XDG_RUNTIME_DIR": str(self._folder / "run"),
+            "XDG_DATA_HOME": str(self.user_folder),
+            "XDG_DATA_DIRS": f"{self.local_folder}:/usr/local/share:/usr/share",
+            "QT_LINUX_ACCESSIBILITY_ALWAYS_ON": "1",
+            "NO_AT_BRIDGE": "0",
+        }
+        for name in ("DBUS_SYSTEM_BUS_ADDRESS", "ONRAMP_PRACTICE_SOCKET"):
+            if name in os.environ:
+                self.env[name] = os.environ[name]
+
+    def _start(self, arguments, package, **options):
+        process = start(arguments, package, env=self.env, stderr=subprocess.DEVNULL, **options)
+        self._processes.append(process)
+        return process
+
+    def _start_bus(self):
+        bus = self._start(["dbus-daemon", "--session", "--nofork", "--print-address"], "dbus",
+                          stdout=subprocess.PIPE, text=True)
+        address = bus.stdout.readline().strip()
+        if not address:
+            raise Missing("dbus-daemon gave no address of a session bus")
+        self.env["DBUS_SESSION_BUS_ADDRESS"] = address
+
+    def _start_display(self):
+        display = self._start(
+            ["Xvfb", "-displayfd", "1", "-screen", "0", f"{_SIZE}x24", "-noreset", "-nolisten",
+             "tcp"],
+            "xvfb", stdout=subprocess.PIPE, text=True)
+        number = display.stdout.readline().strip()
+        if not number:
+            raise Missing("Xvfb gave no display")
+        self.env["DISPLAY"] = f":{number}"
+        if not self._window_manager:
+            return
+        self._start(["openbox", "--sm-disable"], "openbox")
+        wait_for(lambda: "_NET_SUPPORTING_WM_CHECK(WINDOW)" in
+                 self.run(["xprop", "-root", "_NET_SUPPORTING_WM_CHECK"]), 10, "openbox")

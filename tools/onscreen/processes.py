@@ -1,0 +1,49 @@
+"""Child processes that end when their starter does."""
+
+import ctypes
+import signal
+import subprocess
+import time
+
+_PR_SET_PDEATHSIG = 1
+_libc = ctypes.CDLL(None, use_errno=True)
+
+
+class Missing(Exception):
+    """A program is not installed. The text says which and how to get it."""
+
+
+def _die_with_parent():
+    _libc.prctl(_PR_SET_PDEATHSIG, signal.SIGKILL)
+
+
+def start(arguments, package=None, **options):
+    """Starts a program; `package` is the Debian package that brings it."""
+    try:
+        return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)
+    except FileNotFoundError as error:
+        hint = f"; install it with: apt-get install {package}" if package else ""
+        raise Missing(f"{arguments[0]} was not found{hint}") from error
+
+
+def stop(process):
+    """Ends a program that start() gave, for certain."""
+    if process.poll() is None:
+        process.terminate()
+        try:
+            process.wait(5)
+        except subprocess.TimeoutExpired:
+            process.kill()
+            process.wait()
+
+
+def wait_for(condition, seconds, what):
+    """The first true value of condition(), asked until the time is up."""
+    deadline = time.monotonic() + seconds
+    while True:
+        value = condition()
+        if value:
+            return value
+        if time.monotonic() > deadline:
+            raise TimeoutError(f"waited {seconds} s in vain for {what}")
+        time.sleep(0.02)

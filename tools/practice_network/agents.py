@@ -1,0 +1,113 @@
+"""The SNMP side of the devices: one net-snmp agent for each address that answers."""
+
+import os
+import pathlib
+import signal
+import socket
+import subprocess
+import time
+
+from practice_network.description import CLOSED, MISSING, SILENT, TEXT
+
+COMMUNITY = "corridor"
+OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
+PORT = 161
+# Without the other modules an agent is up in some 15 ms and does not listen for sub-agents.
+MODULES = "override,pass,vacm_conf,vacm_context"
+
+
+class AgentError(Exception):
+    """An agent did not come up; says why."""
+
+
+class Agents:
+    """The agents of all devices that are present."""
+
+    def __init__(self, folder):
+        self._folder = pathlib.Path(folder)
+        self._folder.mkdir(parents=True, exist_ok=True)
+        self._by_device = {}
+
+    def start(self, devices):
+        """Starts the agents of `devices`, all at once, and returns when they listen."""
+        awaited = []
+        for device in devices:
+            handles = self._by_device[device.name] = []
+            for address, activeif in zip(device.addresses, device.behaviour(), strict=True):
+                if activeif == CLOSED or ":" in address:
+                    continue
+                if activeif == SILENT:
+                    handles.append(_SilentAgent(address))
+                else:
+                    handles.append(_Agent(self._folder, address, activeif, device.delay))
+                    awaited.append(handles[-1])
+        deadline = time.monotonic() + 20
+        while awaited := [agent for agent in awaited if not agent.is_listening()]:
+            if time.monotonic() > deadline:
+                raise AgentError(f"snmpd at {awaited[0].address} does not listen:"
+                                 f"\n{awaited[0].log()}")
+            time.sleep(0.005)
+
+    def stop(self, device):
+        for handle in self._by_device.pop(device.name, []):
+            handle.close()
+
+
+class _SilentAgent:
+    """Takes requests and leaves them unread, so that the sender sees neither answer nor refusal."""
+
+    def __init__(self, address):
+        self._socket = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
+        self._socket.bind((address, PORT))
+
+    def close(self):
+        self._socket.close()
+
+
+class _Agent:
+    def __init__(self, folder, address, activeif, delay):
+        self.address = address
+        self._log = folder / f"{address}.log"
+        configuration = folder / f"{address}.conf"
+        lines = [f"rocommunity {COMMUNITY}", f"agentAddress udp:{address}:{PORT}"]
+        if delay:
+            script = folder / f"{address}.sh"
+            script.write_text(_slow_script(activeif, delay))
+            script.chmod(0o755)
+            lines.append(f"pass .{OBJECT.rsplit('.', 1)[0]} {script}")
+        elif activeif != MISSING:
+            lines.append(f"override {OBJECT} {_override(activeif)}")
+        configuration.write_text("\n".join(lines) + "\n")
+        self._process = subprocess.Popen(
+            ["snmpd", "-f", "-C", "-c", configuration, "-I", MODULES, "-Lf", self._log],
+            env=os.environ | {"MIBS": "", "SNMPCONFPATH": str(folder),
+                              "SNMP_PERSISTENT_DIR": str(folder)},
+            stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
+            start_new_session=True)
+
+    def is_listening(self):
+        if self._process.poll() is not None:
+            raise AgentError(f"snmpd at {self.address} ended at once:\n{self.log()}")
+        number = socket.inet_aton(self.address)[::-1].hex().upper()
+        return f" {number}:{PORT:04X} " in pathlib.Path("/proc/net/udp").read_text()
+
+    def log(self):
+        return self._log.read_text(errors="replace") if self._log.exists() else ""
+
+    def close(self):
+        # The whole session, since a slow answer's script holds the agent's socket open.
+        if self._process.poll() is None:
+            os.killpg(self._process.pid, signal.SIGKILL)
+            self._process.wait()
+
+
+def _override(activeif):
+    return 'octet_str "two"' if activeif == TEXT else f"integer {activeif}"
+
+
+def _slow_script(activeif, delay):
+    """A program that net-snmp asks for the object; it prints the object's name, type and value."""
+    answer = {MISSING: "", TEXT: f".{OBJECT}\nstring\ntwo"}.get(
+        activeif, f".{OBJECT}\ninteger\n{activeif}")
+    return f"#!/bin/sh\nsleep {delay}\n[ \"$1\" = -g ] && [ \"$2\" = .{OBJECT} ] || exit 0\n" \
+           f"cat <<'END'\n{answer}\nEND\n"

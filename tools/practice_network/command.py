@@ -1,0 +1,186 @@
+"""The command line: the network itself, and `ctl` that steers it from the inside."""
+
+import argparse
+import importlib.util
+import json
+import os
+import shutil
+import sys
+import textwrap
+import tomllib
+
+from practice_network import description
+from practice_network.control import ControlError, PracticeNetwork
+from practice_network.description import DescriptionError
+
+BAD_INPUT = 2
+NO_NAMESPACE = 77
+NETWORK_FAILED = 125
+PACKAGES = {"unshare": "util-linux", "setpriv": "util-linux", "nsenter": "util-linux",
+            "mount": "mount", "ip": "iproute2", "dbus-daemon": "dbus-daemon",
+            "avahi-daemon": "avahi-daemon", "snmpd": "snmpd"}
+
+HELP = """
+Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns its exit
+status. Real Avahi and net-snmp daemons play the devices, inside namespaces of their own: no packet
+leaves this machine, no hardware is needed, and when COMMAND or this tool ends, however it ends,
+everything is gone.
+
+The wizard against twenty devices:
+    tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
+A shell to look around in:
+    tools/practice-network examples/practice-network.toml
+    avahi-browse -rpt _pdl-datastream._tcp
+    snmpget -v1 -c corridor 127.0.1.1 1.3.6.1.4.1.4242.2.4.4.1240.1.2.0
+
+Needs root or sudo; COMMAND runs as you in either case.
+"""
+
+DETAILS = """
+the description is a TOML file with one table for each device:
+    [[device]]
+    name = "Kestrel Model 100"     the name in the wizard's list; all else may be left out
+    maker = "Kestrel"              as in the medium's model names: maker, blank, model
+    model = "Model 100"
+    note = "2nd floor"             where it stands
+    type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
+    port = 631                     default: the type's usual port
+    addresses = ["127.0.1.9"]      or how many to choose for it; default 1
+    activeif = 2                   what SNMP says: 2 is wireless, the default. "silent": takes the
+                                   question and never answers. "closed": has no agent. "missing":
+                                   has an agent without the object. "text": answers with a text.
+                                   A list gives each address its own.
+    delay = 1.5                    seconds before each SNMP answer; default 0
+    present = false                begins switched off; default true
+    txt = {rp = "auto"}            further TXT entries
+
+devices come, go and change while COMMAND runs, from the inside (a new device or a new value takes
+the entries of the file, as KEY=VALUE):
+    practice-network ctl list
+    practice-network ctl add NAME [KEY=VALUE ...]     a known device, or a new one
+    practice-network ctl set NAME KEY=VALUE ...       such as activeif=silent, delay=3, note=Attic
+    practice-network ctl rename NAME NEW-NAME
+    practice-network ctl remove NAME
+    practice-network ctl stop-daemon | start-daemon | restart-daemon      Avahi's
+    practice-network ctl settle                       waits until all devices are established
+Python tests import PracticeNetwork from tools/practice_network for the same. Both find the network
+by the variable ONRAMP_PRACTICE_SOCKET.
+
+programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as all do by
+default; abstract sockets and TCP do not cross into the namespace. XDG_RUNTIME_DIR is a new, empty
+folder. Session bus, Wayland and accessibility bus of your desktop are out of reach: start what is
+needed inside, for instance with "dbus-run-session -- COMMAND".
+
+exit status: that of COMMAND, 128 + n if signal n ended it; 2 for a bad description, 77 if this
+machine gives no namespaces, 125 if the network did not come up, 126 or 127 if COMMAND did not.
+"""
+
+
+def main(arguments):
+    program, *arguments = arguments
+    match arguments:
+        case ["ctl", *request]:
+            return _steer(request)
+        case ["--inside", options]:
+            from practice_network import namespace
+            return namespace.inside(json.loads(options))
+        case ["--devices", options]:
+            from practice_network import namespace
+            return namespace.devices(json.loads(options))
+    return _run(program, arguments)
+
+
+def _run(program, arguments):
+    parser = argparse.ArgumentParser(
+        prog="practice-network", formatter_class=argparse.RawDescriptionHelpFormatter,
+        usage="practice-network [--hosts 2] DESCRIPTION [COMMAND [ARGUMENT ...]]\n"
+              "       practice-network ctl REQUEST [ARGUMENT ...]",
+        description=textwrap.dedent(HELP), epilog=DETAILS)
+    parser.add_argument("--hosts", type=int, choices=(1, 2), default=1,
+                        help="2: devices and COMMAND are on two hosts joined by a cable, "
+                             "192.0.2.0/24, each with its own Avahi; ctl has the devices' one")
+    parser.add_argument("--invoker", help=argparse.SUPPRESS)
+    parser.add_argument("description", metavar="DESCRIPTION")
+    parser.add_argument("command", metavar="COMMAND", nargs=argparse.REMAINDER)
+    options = parser.parse_args(arguments)
+
+    try:
+        description.load(options.description)
+    except DescriptionError as error:
+        return _complain(error, BAD_INPUT)
+    if os.getuid() != 0:
+        return _become_root(program, arguments)
+    return _enclose(options)
+
+
+def _enclose(options):
+    os.environ["PATH"] += ":/usr/sbin:/sbin"
+    for name, package in PACKAGES.items():
+        if not shutil.which(name):
+            return _complain(f"{name} is missing; install it: apt-get install {package}",
+                             NETWORK_FAILED)
+    if not importlib.util.find_spec("dbus"):
+        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3 and install "
+                         "it: apt-get install python3-dbus", NETWORK_FAILED)
+
+    from practice_network import namespace
+    reason = namespace.why_not_enclosed()
+    if reason:
+        return _complain(f"this machine gives no namespaces: {reason}", NO_NAMESPACE)
+    user, group, path = json.loads(options.invoker) if options.invoker else (0, 0, "")
+    command = options.command[1:] if options.command[:1] == ["--"] else options.command
+    return namespace.enclose({
+        "description": os.path.abspath(options.description), "hosts": options.hosts,
+        "command": command or [os.environ.get("SHELL", "/bin/sh")],
+        "user": [user, group], "path": path})
+
+
+def _become_root(program, arguments):
+    if not shutil.which("sudo"):
+        return _complain("this machine gives no namespaces: not root, and there is no sudo",
+                         NO_NAMESPACE)
+    ask = [] if sys.stdin.isatty() else ["-n"]
+    if os.spawnvp(os.P_WAIT, "sudo", ["sudo", *ask, "-v"]):
+        return _complain("this machine gives no namespaces: not root, and sudo refuses",
+                         NO_NAMESPACE)
+    invoker = json.dumps([os.getuid(), os.getgid(), os.environ.get("PATH", "")])
+    os.execvp("sudo", ["sudo", "-E", *ask, "--", "setpriv", "--pdeathsig", "KILL", sys.executable,
+                       os.path.abspath(program), "--invoker", invoker, *arguments])
+
+
+def _steer(request):
+    parser = argparse.ArgumentParser(prog="practice-network ctl")
+    requests = parser.add_subparsers(dest="operation", required=True, metavar="REQUEST")
+    for name, operands in (("add", ["name", "entries"]), ("remove", ["name"]),
+                           ("rename", ["name", "new_name"]), ("set", ["name", "entries"]),
+                           ("list", []), ("settle", []), ("stop-daemon", []),
+                           ("start-daemon", []), ("restart-daemon", [])):
+        one = requests.add_parser(name)
+        for operand in operands:
+            one.add_argument(operand, nargs="*" if operand == "entries" else None)
+    operands = vars(parser.parse_args(request))
+    operation = operands.pop("operation").replace("-", "_")
+    try:
+        entries = dict(_entry(text) for text in operands.pop("entries", ()))
+        result = getattr(PracticeNetwork(), operation)(**operands, **entries)
+    except ControlError as error:
+        return _complain(error, 1)
+    for device in result or ():
+        print(json.dumps(device, ensure_ascii=False))
+    return 0
+
+
+def _entry(text):
+    """KEY=VALUE as the description file would have it; a text needs no quotes."""
+    key, equals, value = text.partition("=")
+    if not equals:
+        raise ControlError(f'"{text}": write an entry as KEY=VALUE')
+    try:
+        return key, tomllib.loads(f"value = {value}")["value"]
+    except tomllib.TOMLDecodeError:
+        return key, value
+
+
+def _complain(message, status):
+    print(f"practice-network: {message}", file=sys.stderr)
+    return status

@@ -1,0 +1,116 @@
+"""How a running network is steered: one JSON line a request over a Unix socket, one back."""
+
+import json
+import os
+import socket
+import time
+
+from practice_network.description import DescriptionError
+
+SOCKET_VARIABLE = "ONRAMP_PRACTICE_SOCKET"
+
+
+class ControlError(Exception):
+    """The network refused a request, or there is none; says why."""
+
+
+class PracticeNetwork:
+    """The network that this process runs in, for tests and for `practice-network ctl`.
+
+    Devices are named by their name. Entries are those of the description file: `maker`, `model`,
+    `note`, `type`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation returns when
+    the network has carried it out; Avahi takes another second to establish what is new, for which
+    settle() waits. A refused operation raises ControlError and changes nothing.
+    """
+
+    def __init__(self, path=None):
+        self._path = path or os.environ.get(SOCKET_VARIABLE)
+        if not self._path:
+            raise ControlError(f"{SOCKET_VARIABLE} is not set: this is no practice network; "
+                               "start one with: practice-network DESCRIPTION")
+
+    def add(self, name, **entries):
+        """Lets a device appear: a known one, or a new one made from `entries`."""
+        self._ask("add", name, entries)
+
+    def remove(self, name):
+        """Switches a device off: it says goodbye, and its agents are gone.
+
+        Browsers see it leave up to a second later, since mDNS caches keep it that long.
+        """
+        self._ask("remove", name)
+
+    def rename(self, name, new_name):
+        self._ask("rename", name, new_name)
+
+    def set(self, name, **entries):
+        """Changes a device; a new text or address is published as a change, not a new device."""
+        self._ask("set", name, entries)
+
+    def list(self):
+        """One dictionary a device: its entries, and its "state": "established" and others."""
+        return self._ask("list")
+
+    def stop_daemon(self):
+        self._ask("stop_daemon")
+
+    def start_daemon(self):
+        self._ask("start_daemon")
+
+    def restart_daemon(self):
+        self.stop_daemon()
+        self.start_daemon()
+
+    def settle(self, seconds=30):
+        """Waits until Avahi has established every device that is present."""
+        deadline = time.monotonic() + seconds
+        while waiting := [one for one in self.list()
+                          if one["present"] and one["state"] != "established"]:
+            if time.monotonic() > deadline:
+                raise ControlError(f'device "{waiting[0]["name"]}" is still {waiting[0]["state"]}')
+            time.sleep(0.02)
+
+    def _ask(self, operation, *arguments):
+        try:
+            with socket.socket(socket.AF_UNIX) as connection:
+                connection.connect(self._path)
+                with connection.makefile("rwb") as stream:
+                    stream.write(json.dumps([operation, *arguments]).encode() + b"\n")
+                    stream.flush()
+                    answer = json.loads(stream.readline() or b'{"error": "the network ended"}')
+        except OSError as error:
+            raise ControlError(f"{self._path}: {error.strerror}; is the network running?") from None
+        if "error" in answer:
+            raise ControlError(answer["error"])
+        return answer["result"]
+
+
+OPERATIONS = ("add", "remove", "rename", "set", "list", "stop_daemon", "start_daemon")
+
+
+def serve(network, listener):
+    """Carries out requests, one after the other, until the process is ended."""
+    while True:
+        connection, _ = listener.accept()
+        connection.settimeout(5)
+        with connection, connection.makefile("rwb") as stream:
+            try:
+                answer = _answer(network, stream.readline())
+                stream.write(json.dumps(answer).encode() + b"\n")
+                stream.flush()
+            except OSError:
+                pass  # The asker is gone.
+
+
+def _answer(network, line):
+    try:
+        operation, *arguments = json.loads(line)
+        if operation not in OPERATIONS:
+            return {"error": f'unknown request "{operation}"'}
+        return {"result": getattr(network, operation)(*arguments)}
+    except (ValueError, TypeError) as error:
+        return {"error": f"not a request: {error}"}
+    except DescriptionError as error:
+        return {"error": str(error)}
+    except Exception as error:  # One failed request must not end the network.
+        return {"error": f"{type(error).__name__}: {error}"}

@@ -1,0 +1,160 @@
+"""Encloses the network: namespaces from which nothing leaks and which end with the tool."""
+
+import json
+import os
+import pathlib
+import pwd
+import signal
+import socket
+import subprocess
+import sys
+
+from practice_network import description
+from practice_network.agents import AgentError
+from practice_network.control import SOCKET_VARIABLE, serve
+from practice_network.description import DescriptionError
+from practice_network.host import (BUS_ADDRESS, RUN, Host, HostError, loop_back, plug_in_cable,
+                                   take_over_run)
+from practice_network.network import Network
+from practice_network.publisher import PublishError, connect
+
+ENCLOSE = ["unshare", "--net", "--mount", "--pid", "--fork", "--kill-child", "--mount-proc"]
+LAUNCHER = str(pathlib.Path(__file__).resolve().parent.parent / "practice-network")
+CABLE = "practice0"
+BAD_INPUT = 2
+NETWORK_FAILED = 125
+
+
+def why_not_enclosed():
+    """None where this process can have such namespaces; else what the system says."""
+    probe = subprocess.run([*ENCLOSE, "mount", "-t", "tmpfs", "none", "/run"],
+                           capture_output=True, text=True)
+    return probe.stderr.strip() or "unshare failed" if probe.returncode else None
+
+
+def enclose(options):
+    """Runs the network and its command in namespaces; returns the command's exit status."""
+    # Ctrl-C is meant for the command, which has it from the terminal. The other two end all.
+    signal.signal(signal.SIGINT, lambda *_: None)
+    process = subprocess.Popen(
+        ["setpriv", "--pdeathsig", "KILL", *ENCLOSE,
+         sys.executable, LAUNCHER, "--inside", json.dumps(options)])
+
+    ended_by = []
+
+    def end(number, _):
+        ended_by.append(number)
+        os.kill(process.pid, signal.SIGKILL)
+
+    signal.signal(signal.SIGTERM, end)
+    signal.signal(signal.SIGHUP, end)
+    status = _status(process.wait())
+    return 128 + ended_by[0] if ended_by else status
+
+
+def inside(options):
+    """The first process of the namespaces: starts the network, then the command."""
+    # Handlers, because a signal that is ignored would stay so in the command.
+    signal.signal(signal.SIGINT, lambda *_: None)
+    try:
+        environment = _own_run(options["user"])
+        devices = _start_devices(options)
+        if devices.stdout.readline() != b"ready\n":
+            return devices.wait()
+        if options["hosts"] == 2:
+            Host("wizard", CABLE).start_avahi()
+            connect(BUS_ADDRESS)
+    except (HostError, PublishError) as error:
+        return _fail(error)
+
+    try:
+        command = _start_command(options, environment)
+    except OSError as error:
+        print(f"practice-network: {options['command'][0]}: {error.strerror}", file=sys.stderr)
+        return 127 if isinstance(error, FileNotFoundError) else 126
+    # As the first process this one inherits all orphans, and takes every one that ends.
+    while True:
+        pid, status = os.wait()
+        if pid == command.pid:
+            return _status(os.waitstatus_to_exitcode(status))
+        if pid == devices.pid:
+            return _fail("the process with the devices ended")
+
+
+def devices(options):
+    """The process that has the devices: on the command's host, or on a host of their own."""
+    try:
+        if options["hosts"] == 2:
+            take_over_run()
+            plug_in_cable(CABLE, "192.0.2.2/24", "192.0.2.1/24")
+            network = Network(Host("devices", CABLE), "192.0.2.0/24")
+        else:
+            loop_back()
+            network = Network(Host("practice", "lo"), "127.0.0.0/8")
+        network.load(description.load(options["description"]))
+        network.settle()
+    except DescriptionError as error:
+        print(f"practice-network: {options['description']}: {error}", file=sys.stderr)
+        return BAD_INPUT
+    except (HostError, AgentError, PublishError) as error:
+        return _fail(error)
+    print("ready", flush=True)
+    serve(network, socket.socket(fileno=options["listener"]))
+
+
+def _own_run(user):
+    """Takes over /run and gives back what a desktop program needs of it, as environment."""
+    variables = {SOCKET_VARIABLE: str(RUN / "socket"), "DBUS_SYSTEM_BUS_ADDRESS": BUS_ADDRESS,
+                 "XDG_RUNTIME_DIR": str(RUN / "user")}
+    authority = pathlib.Path(os.environ.get("XAUTHORITY", "/nowhere"))
+    cookies = authority.read_bytes() if authority.is_file() else b""
+    take_over_run()
+    folder = pathlib.Path(variables["XDG_RUNTIME_DIR"])
+    folder.mkdir(mode=0o700)
+    os.chown(folder, *user)
+    if cookies and not authority.exists():  # It lay in /run.
+        copy = folder / "Xauthority"
+        copy.touch(mode=0o600)
+        copy.write_bytes(cookies)
+        os.chown(copy, *user)
+        variables["XAUTHORITY"] = str(copy)
+    # The sockets of these two were in /run.
+    gone = ("DBUS_SESSION_BUS_ADDRESS", "WAYLAND_DISPLAY")
+    return {key: value for key, value in os.environ.items() if key not in gone} | variables
+
+
+def _start_devices(options):
+    with socket.socket(socket.AF_UNIX) as listener:
+        path = str(RUN / "socket")
+        listener.bind(path)
+        os.chmod(path, 0o666)
+        listener.listen(64)
+        own_host = ["unshare", "--net", "--mount"] if options["hosts"] == 2 else []
+        number = listener.fileno()
+        return subprocess.Popen(
+            [*own_host, sys.executable, LAUNCHER, "--devices",
+             json.dumps(options | {"listener": number})],
+            stdin=subprocess.DEVNULL, stdout=subprocess.PIPE, pass_fds=[number],
+            start_new_session=True)
+
+
+def _start_command(options, environment):
+    user, group = options["user"]
+    identity = {}
+    if user != os.getuid():
+        account = pwd.getpwuid(user)
+        identity = {"user": user, "group": group,
+                    "extra_groups": os.getgrouplist(account.pw_name, group)}
+        environment |= {"HOME": account.pw_dir, "USER": account.pw_name,
+                        "LOGNAME": account.pw_name, "PATH": options["path"]}
+    return subprocess.Popen(options["command"], env=environment, **identity)
+
+
+def _status(code):
+    """A child's exit status as a shell tells it."""
+    return code if code >= 0 else 128 - code
+
+
+def _fail(message):
+    print(f"practice-network: {message}", file=sys.stderr)
+    return NETWORK_FAILED

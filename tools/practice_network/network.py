@@ -1,0 +1,166 @@
+"""The devices of a running network: who is there, and how that changes."""
+
+import dataclasses
+import ipaddress
+import itertools
+import time
+
+from practice_network import description
+from practice_network.agents import Agents
+from practice_network.description import DescriptionError
+from practice_network.host import BUS_ADDRESS, RUN
+from practice_network.publisher import Publisher, PublishError
+
+
+class Network:
+    """All devices, present or not, published and answering as they are described."""
+
+    def __init__(self, host, subnet):
+        self._host = host
+        self._subnet = ipaddress.ip_network(subnet)
+        self._agents = Agents(RUN / "agents")
+        self._publisher = None
+        self._devices = {}
+
+    def load(self, devices):
+        """Takes in all devices of a description and lets those appear that are present."""
+        self._devices = {device.name: device for device in devices}
+        # Those that name their addresses come first, so that nobody else is given them.
+        for device in sorted(devices, key=lambda one: isinstance(one.addresses, int)):
+            self._devices[device.name] = self._with_addresses(device)
+        present = [device for device in self._devices.values() if device.present]
+        self._agents.start(present)
+        self.start_daemon()
+
+    def start_daemon(self):
+        self._host.start_avahi()
+        if not self._publisher:
+            self._publisher = Publisher(BUS_ADDRESS)
+            for device in self._devices.values():
+                if device.present:
+                    self._publisher.publish(device)
+
+    def settle(self, seconds=30):
+        """Waits until everything is established that is published."""
+        deadline = time.monotonic() + seconds
+        for device in self._devices.values():
+            while device.present and (state := self._state(device)) != "established":
+                if time.monotonic() > deadline:
+                    raise PublishError(f'device "{device.name}" is still {state}')
+                time.sleep(0.01)
+
+    def stop_daemon(self):
+        if self._publisher:
+            self._publisher.close()
+            self._publisher = None
+        self._host.stop_avahi()
+
+    def add(self, name, entries):
+        """Lets a known device appear, changed by `entries`, or a new one."""
+        if name in self._devices:
+            self.set(name, entries | {"present": True})
+            return
+        device = description.device({"name": name} | entries, f'device "{name}"')
+        self._devices[name] = device = self._with_addresses(device)
+        if device.present:
+            self._appear(device)
+
+    def remove(self, name):
+        self.set(name, {"present": False})
+
+    def rename(self, name, new_name):
+        self.set(name, {"name": new_name})
+
+    def set(self, name, entries):
+        """Changes a device; what it publishes changes only where the entries differ."""
+        before = self._devices.get(name)
+        if not before:
+            raise DescriptionError(f'device "{name}": is not known; "list" shows the known ones')
+        after = description.change(before, entries, f'device "{name}"')
+        if after.name != name and after.name in self._devices:
+            raise DescriptionError(f'device "{after.name}": is there already; take another name')
+        after = self._with_addresses(after, name)
+        if after.name != name:
+            self._devices = {after.name if key == name else key: value
+                             for key, value in self._devices.items()}
+        self._devices[after.name] = after
+        if not (before.present and after.present) or after.name != name:
+            self._vanish(before)
+            if after.present:
+                self._appear(after)
+            return
+
+        if _agent_part(before) != _agent_part(after):
+            self._agents.stop(before)
+            self._agents.start([after])
+        if not self._publisher:
+            return
+        if (before.type, before.port) != (after.type, after.port):
+            self._publisher.withdraw(before)
+            self._publisher.publish(after)
+            return
+        if before.addresses != after.addresses:
+            self._publisher.publish_addresses(after)
+        if any(before.txt_of(one) != after.txt_of(one) for one in after.type):
+            self._publisher.publish_txt(after)
+
+    def list(self):
+        """One table a device: its entries as described, and "state", Avahi's word for it."""
+        return [{key: value for key, value in dataclasses.asdict(device).items()
+                 if value is not None}
+                | {"txt": dict(device.txt), "state": self._state(device)}
+                for device in self._devices.values()]
+
+    def _state(self, device):
+        if not device.present or not self._publisher:
+            return "withdrawn"
+        return self._publisher.state(device)
+
+    def _appear(self, device):
+        self._agents.start([device])
+        if self._publisher:
+            self._publisher.publish(device)
+
+    def _vanish(self, device):
+        if self._publisher:
+            self._publisher.withdraw(device)
+        self._agents.stop(device)
+
+    def _with_addresses(self, device, known_as=None):
+        """The device with addresses that no other device answers at, all known to the host."""
+        used = {address for name, other in self._devices.items()
+                if name != (known_as or device.name)
+                for address, behaviour in zip(_list(other.addresses), other.behaviour())
+                if behaviour != description.CLOSED}
+        if isinstance(device.addresses, int):
+            # A loopback network's first addresses are the host's own, and so are those of a cable.
+            hosts = itertools.islice(self._subnet.hosts(), 256 if self._subnet.is_loopback else 9,
+                                     None)
+            free = (str(address) for address in hosts if str(address) not in used)
+            addresses = tuple(itertools.islice(free, device.addresses))
+            if len(addresses) < device.addresses:
+                raise DescriptionError(f'device "{device.name}": no address of {self._subnet} is '
+                                       "left; let closed devices share some")
+            device = dataclasses.replace(device, addresses=addresses)
+        for address, behaviour in zip(device.addresses, device.behaviour()):
+            if address in used and behaviour != description.CLOSED:
+                raise DescriptionError(f'device "{device.name}": {address} is another device\'s '
+                                       "address; take one that is free, or leave addresses away")
+            self._admit(device, ipaddress.ip_address(address))
+        return device
+
+    def _admit(self, device, address):
+        if address.version == 6 or self._subnet.is_loopback and address.is_loopback:
+            return
+        if not self._subnet.is_loopback and address not in self._subnet:
+            raise DescriptionError(f'device "{device.name}": {address} is not in {self._subnet}, '
+                                   "the network of two hosts; take one from there")
+        self._host.add_address(f"{address}/{32 if self._subnet.is_loopback else 24}")
+
+
+def _list(addresses):
+    return () if isinstance(addresses, int) else addresses
+
+
+def _agent_part(device):
+    return device.addresses, device.behaviour(), device.delay

@@ -1,0 +1,110 @@
+"""The mDNS side of the devices: their host names and services in a real Avahi daemon."""
+
+import dataclasses
+import time
+
+import dbus
+import dbus.bus
+
+AVAHI = "org.freedesktop.Avahi"
+ANY_INTERFACE = dbus.Int32(-1)
+ANY_PROTOCOL = dbus.Int32(-1)
+NO_FLAGS = dbus.UInt32(0)
+NO_REVERSE = dbus.UInt32(16)  # AVAHI_PUBLISH_NO_REVERSE
+SERVER_RUNNING = 2
+GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 4: "failed"}
+
+
+class PublishError(Exception):
+    """Avahi refused something or is not there; says what."""
+
+
+def connect(bus_address, seconds=10):
+    """A connection to a bus on which Avahi is up and running, and Avahi's server; waits for it."""
+    bus = dbus.bus.BusConnection(bus_address)
+    deadline = time.monotonic() + seconds
+    while True:
+        try:
+            server = dbus.Interface(bus.get_object(AVAHI, "/", introspect=False),
+                                    AVAHI + ".Server")
+            state = server.GetState()
+            if state == SERVER_RUNNING:
+                return bus, server
+        except dbus.DBusException as error:
+            state = error
+        if time.monotonic() > deadline:
+            raise PublishError(f"avahi-daemon does not come up: {state}")
+        time.sleep(0.01)
+
+
+@dataclasses.dataclass(frozen=True)
+class _Entry:
+    """What is published of a device: two groups, so that its addresses can change by themselves."""
+
+    host: str
+    addresses: dbus.Interface
+    services: dbus.Interface
+
+
+class Publisher:
+    """Publishes devices. Everything is gone again when the connection closes."""
+
+    def __init__(self, bus_address):
+        self._bus, self._server = connect(bus_address)
+        self._entries = {}
+        self._host_count = 0
+
+    def close(self):
+        self._bus.close()
+
+    def publish(self, device):
+        self._host_count += 1
+        entry = _Entry(f"device-{self._host_count}.local", self._new_group(), self._new_group())
+        self._entries[device.name] = entry
+        self.publish_addresses(device)
+        for service_type in device.type:
+            entry.services.AddService(
+                ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name, service_type, "local",
+                entry.host, dbus.UInt16(device.port_of(service_type)), _txt(device, service_type))
+        entry.services.Commit()
+
+    def publish_addresses(self, device):
+        """Publishes the device's present addresses in place of those it had."""
+        entry = self._entries[device.name]
+        entry.addresses.Reset()
+        for address in device.addresses:
+            entry.addresses.AddAddress(ANY_INTERFACE, ANY_PROTOCOL, NO_REVERSE, entry.host, address)
+        entry.addresses.Commit()
+
+    def publish_txt(self, device):
+        """Publishes the device's present texts in place of those it had."""
+        services = self._entries[device.name].services
+        for service_type in device.type:
+            services.UpdateServiceTxt(ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name,
+                                      service_type, "local", _txt(device, service_type))
+
+    def withdraw(self, device):
+        if entry := self._entries.pop(device.name, None):
+            entry.services.Free()
+            entry.addresses.Free()
+
+    def state(self, device):
+        """"established" when everything of the device is; else the state of what is not."""
+        entry = self._entries.get(device.name)
+        if not entry:
+            return "withdrawn"
+        try:
+            states = [int(group.GetState()) for group in (entry.addresses, entry.services)]
+        except dbus.DBusException:
+            return "withdrawn"
+        return GROUP_STATES[next((state for state in states if state != 2), 2)]
+
+    def _new_group(self):
+        path = self._server.EntryGroupNew()
+        return dbus.Interface(self._bus.get_object(AVAHI, path, introspect=False),
+                              AVAHI + ".EntryGroup")
+
+
+def _txt(device, service_type):
+    pairs = (f"{key}={value}".encode() for key, value in device.txt_of(service_type))
+    return dbus.Array([dbus.ByteArray(pair) for pair in pairs], signature="ay")

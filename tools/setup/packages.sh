@@ -1,0 +1,27 @@
+# Sourced by the scripts at the root: installs what packages.txt names and this machine lacks.
+
+install_packages() {
+  local list=$1 missing
+  missing=$(sed 's/[[:space:]]*#.*//; /^$/d' "$list" | while read -r package; do
+    dpkg-query -W -f '${db:Status-Status}' "$package" 2>/dev/null | grep -qx installed ||
+      echo "$package"
+  done)
+  [ -z "$missing" ] && return
+  if ! command -v apt-get >/dev/null; then
+    echo "No apt-get here. Install the equivalents of:" $missing >&2
+    return 1
+  fi
+  local as_root=()
+  if [ "$(id -u)" != 0 ]; then
+    if ! command -v sudo >/dev/null; then
+      echo "These packages are missing, and installing them needs root or sudo:" $missing >&2
+      return 1
+    fi
+    as_root=(sudo)
+  fi
+  echo "Installing" $missing
+  "${as_root[@]}" apt-get update -qq &&
+    "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
+      apt-get install -y -qq --no-install-recommends $missing >/dev/null ||
+    { echo "apt-get could not install all of: $missing" >&2; return 1; }
+}
