@@ -17,13 +17,14 @@
 }
 
 - (void)dealloc {
-  [_table setDataSource:nil];
   [_table setDelegate:nil];
+  [_table setDataSource:nil];
   [_table release];
   [super dealloc];
 }
 
 - (void)reload {
+  _isShowingSelection = YES;
   [_table reloadData];
   [self showSelection];
 }

@@ -5,6 +5,19 @@ namespace onramp {
 
 using cocoa::nativeOf;
 
+namespace {
+
+// The first control inside the view that takes the keyboard.
+NSView* firstKeyView(NSView* view) {
+  if ([view isKindOfClass:[NSControl class]] && [view canBecomeKeyView]) return view;
+  for (NSView* subview in [view subviews]) {
+    if (NSView* const found = firstKeyView(subview)) return found;
+  }
+  return nil;
+}
+
+}  // namespace
+
 void View::setHidden(bool hidden) const {
   [nativeOf<NSView>(*this) setHidden:hidden];
 }
@@ -21,7 +34,7 @@ void View::addSubview(const View& inner) const {
   [added setFrame:[view bounds]];
   [added setAutoresizingMask:NSViewWidthSizable | NSViewHeightSizable];
   [view addSubview:added];
-  [[view window] makeFirstResponder:[added nextValidKeyView]];
+  [[view window] makeFirstResponder:firstKeyView(added)];
 }
 
 void View::removeFromSuperview() const {

@@ -19,6 +19,15 @@ class Reader {
  public:
   Reader(NSWindow* window, NSMutableArray* found) : window_(window), found_(found) {}
 
+  void readWindow() {
+    const bool isActive = [NSApp isActive] && [window_ isKeyWindow];
+    NSView* const frame = [[window_ contentView] superview];
+    add(@"frame", [window_ title],
+        isActive ? [NSArray arrayWithObject:@"active"] : [NSArray array], frame, [frame bounds]);
+    read(frame);
+  }
+
+ private:
   void read(NSView* view) {
     if ([view isHidden] || NSIsEmptyRect([view visibleRect])) return;
     if ([view isKindOfClass:[NSTableView class]]) {
@@ -36,7 +45,6 @@ class Reader {
     }
   }
 
- private:
   void readControl(NSView* view) {
     NSMutableArray* const states = [NSMutableArray array];
     const bool isControl = [view isKindOfClass:[NSControl class]];
@@ -63,7 +71,10 @@ class Reader {
     for (NSUInteger row = rows.location; row < NSMaxRange(rows); ++row) {
       NSMutableArray* const states = [NSMutableArray array];
       if ([table isEnabled]) [states addObject:@"enabled"];
-      if ([table isRowSelected:static_cast<NSInteger>(row)]) [states addObject:@"selected"];
+      if ([table isRowSelected:static_cast<NSInteger>(row)]) {
+        [states addObject:@"selected"];
+        if ([window_ firstResponder] == table) [states addObject:@"focused"];
+      }
       NSInteger column = 0;
       for (NSTableColumn* tableColumn in [table tableColumns]) {
         id const text = [[table dataSource] tableView:table
@@ -167,7 +178,7 @@ class Reader {
 - (void)write:(NSTimer*)timer {
   NSMutableArray* const found = [NSMutableArray array];
   for (NSWindow* window in [NSApp windows]) {
-    if ([window isVisible]) Reader(window, found).read([[window contentView] superview]);
+    if ([window isVisible]) Reader(window, found).readWindow();
   }
   NSData* const text = [NSJSONSerialization dataWithJSONObject:found options:0 error:nullptr];
   if ([text isEqualToData:_written]) return;

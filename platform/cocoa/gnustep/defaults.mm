@@ -4,6 +4,9 @@
 
 namespace {
 
+// What is looked up before everything else.
+NSString* const kFirstDomain = @"GSPrimaryDomain";
+
 // GNUstep looks for folders named after languages; those of a bundle are named after their codes.
 NSArray* languageCodes() {
   NSDictionary* const environment = [[NSProcessInfo processInfo] environment];
@@ -33,12 +36,12 @@ NSArray* languageCodes() {
   @autoreleasepool {
     NSUserDefaults* const defaults = [NSUserDefaults standardUserDefaults];
     NSMutableDictionary* const options =
-        [[[defaults volatileDomainForName:NSArgumentDomain] mutableCopy] autorelease];
+        [[[defaults volatileDomainForName:kFirstDomain] mutableCopy] autorelease];
     [options setObject:languageCodes() forKey:@"NSLanguages"];
     [options setObject:@"NSWindows95InterfaceStyle" forKey:@"NSMenuInterfaceStyle"];
     [options setObject:@"YES" forKey:@"GSSuppressAppIcon"];
-    [defaults removeVolatileDomainForName:NSArgumentDomain];
-    [defaults setVolatileDomain:options forName:NSArgumentDomain];
+    [defaults removeVolatileDomainForName:kFirstDomain];
+    [defaults setVolatileDomain:options forName:kFirstDomain];
   }
 }
 

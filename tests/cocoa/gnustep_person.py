@@ -1,0 +1,94 @@
+"""A person at the screen of the front end for Cocoa when it runs on GNUstep.
+
+Nothing there speaks AT-SPI. The program writes down what can be seen instead, by the same roles.
+"""
+
+import json
+import os
+import pathlib
+import time
+
+from onscreen.person import Person
+from onscreen.processes import start, wait_for
+
+_SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
+_LOOK_SECONDS = 20
+
+
+class GNUstepPerson(Person):
+    """Starts a program on a desktop and uses it. Use it in a `with` statement."""
+
+    def __init__(self, desktop, program, arguments=(), env=None):
+        self.desktop = desktop
+        folder = pathlib.Path(desktop.env["HOME"])
+        self._seen = folder / "accessibility.json"
+        self._seen.unlink(missing_ok=True)
+        variables = {
+            "ONRAMP_ACCESSIBILITY_FILE": str(self._seen),
+            "GNUSTEP_CONFIG_FILE": str(self._configure(folder)),
+            # Strings tables in UTF-8 are read in the locale's encoding.
+            "LC_CTYPE": "C.UTF-8",
+        } | self._options_as_environment(list(arguments))
+        self.process = start([str(program)], env=desktop.env | variables | (env or {}))
+
+    def everything(self):
+        return [(control["role"], control["name"], control) for control in self._read()]
+
+    def has_state(self, control, state):
+        return state in control["states"]
+
+    def click(self, role, name=None):
+        def clickable():
+            control = self.see(role, name)
+            return control if self.has_state(control, "enabled") else None
+
+        control = wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} enabled")
+        # A button that is let go of in the moment of its pressing is seen let go of first.
+        self.desktop.run(["xdotool", "mousemove", str(control["x"] + control["width"] // 2),
+                          str(control["y"] + control["height"] // 2),
+                          "sleep", "0.05", "mousedown", "1", "sleep", "0.1", "mouseup", "1"])
+
+    def see(self, role, name=None, seconds=_LOOK_SECONDS):
+        super().see(role, name, seconds)
+        return self._at_rest(role, name)
+
+    def _at_rest(self, role, name):
+        """The control once it stays where it is: a new window is moved by the window manager."""
+        seen = None
+        while True:
+            now = self._look(role, name)
+            if now == seen or now is None:
+                return seen
+            seen = now
+            time.sleep(0.12)
+
+    def _look(self, role, name):
+        return next((control for control in self._read()
+                     if control["role"] == role and name in (None, control["name"])), None)
+
+    def _read(self):
+        try:
+            return json.loads(self._seen.read_text(encoding="utf-8"))
+        except FileNotFoundError:
+            return []
+
+    def _configure(self, folder):
+        """The system's own GNUstep, with application-support folders on this desktop."""
+        own = {"GNUSTEP_USER_DIR_LIBRARY": os.path.relpath(self.desktop.user_folder, folder),
+               "GNUSTEP_LOCAL_LIBRARY": str(self.desktop.local_folder)}
+        lines = [line for line in _SYSTEM_CONFIGURATION.read_text(encoding="utf-8").splitlines()
+                 if line.split("=")[0] not in own]
+        file = folder / "GNUstep.conf"
+        file.write_text("\n".join(lines + [f"{k}={v}" for k, v in own.items()]) + "\n",
+                        encoding="utf-8")
+        file.chmod(0o600)
+        return file
+
+    @staticmethod
+    def _options_as_environment(arguments):
+        """This front end has no options of its own: what they set, it takes from the environment."""
+        if not arguments:
+            return {}
+        option, value = arguments
+        assert option == "--system-version"
+        return {"ONRAMP_SYSTEM_VERSION": value}
