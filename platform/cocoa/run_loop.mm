@@ -4,6 +4,7 @@
 
 #include <chrono>
 #include <condition_variable>
+#include <memory>
 #include <mutex>
 #include <utility>
 
@@ -60,13 +61,17 @@ void wakeSleepersForTermination() {
 
 }  // namespace cocoa
 
+// The action may run a loop of its own, in which its timer must not fire again.
 void scheduleTimer(double seconds, std::function<void()> action) {
-  NSTimer* const timer =
-      [NSTimer timerWithTimeInterval:seconds
-                              target:[OnrampAction actionWithFunction:std::move(action)]
-                            selector:@selector(perform:)
-                            userInfo:nil
-                             repeats:NO];
+  OnrampAction* const once =
+      [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
+        if (const auto pending = std::exchange(action, nullptr)) pending();
+      }];
+  NSTimer* const timer = [NSTimer timerWithTimeInterval:seconds
+                                                 target:once
+                                               selector:@selector(perform:)
+                                               userInfo:nil
+                                                repeats:NO];
   for (NSString* mode in allModes())
     [[NSRunLoop mainRunLoop] addTimer:timer forMode:mode];
 }
