@@ -36,6 +36,8 @@ enum class ToolStart { kAutomatic, kManual };
 class OnrampOSXAppDelegate final : public ApplicationDelegate {
  public:
   OnrampOSXAppDelegate();
+  OnrampOSXAppDelegate(const OnrampOSXAppDelegate&) = delete;
+  OnrampOSXAppDelegate& operator=(const OnrampOSXAppDelegate&) = delete;
   ~OnrampOSXAppDelegate() override;
 
   // start_up.cpp: start, end and the choice of the first page.

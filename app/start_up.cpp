@@ -51,6 +51,7 @@ OnrampOSXAppDelegate::OnrampOSXAppDelegate()
 
 OnrampOSXAppDelegate::~OnrampOSXAppDelegate() {
   NotificationCenter::defaultCenter().removeObserver(this);
+  if (ChooseDeviceView* const search = chooser()) search->stopBrowsing();
 }
 
 void OnrampOSXAppDelegate::setOutlets(const Interface& mainInterface) {

@@ -1,11 +1,15 @@
 #include "pages/ChooseDeviceView.h"
 
+#include <algorithm>
 #include <utility>
 
+#include "bonjour/KSDevice.h"
 #include "media/CommonMessage.h"
 #include "media/KSInstallerInfo.h"
 #include "platform/bundle.h"
 #include "platform/notification_center.h"
+#include "platform/run_loop.h"
+#include "snmp/query.h"
 
 namespace onramp {
 
@@ -22,6 +26,19 @@ std::string setupToolName() {
   }
   std::string name = tool->path.substr(tool->path.rfind('/') + 1);
   return name.substr(0, name.rfind('.'));
+}
+
+Dictionary entryFor(const Dictionary& device) {
+  const Array* const addresses = device.array(KSDevice::kIPAddressList);
+  std::vector<Dictionary::Pair> entry{
+      {std::string(ChooseDeviceView::kDevice), device.string(KSDevice::kDisplayName).value_or("")},
+      {std::string(ChooseDeviceView::kInterface),
+       localized("INST_TXT_CONNECTION_NETWORK", "Network")},
+      {std::string(ChooseDeviceView::kKSDevice), device}};
+  if (addresses && !addresses->empty()) {
+    entry.emplace_back(ChooseDeviceView::kLocation, addresses->front());
+  }
+  return Dictionary(std::move(entry));
 }
 
 }  // namespace
@@ -75,9 +92,18 @@ void ChooseDeviceView::setSearchModelList(std::vector<std::string> models) {
 
 void ChooseDeviceView::startBrowsing() {
   stopBrowsing();
+  mBonjourSearch = KSBonjourSearch::init();
+  mBonjourSearch->addKSDeviceObserver(shared_from_this());
+  mBonjourSearch->startBrowsing();
 }
 
-void ChooseDeviceView::stopBrowsing() {}
+void ChooseDeviceView::stopBrowsing() {
+  if (!mBonjourSearch) return;
+  mBonjourSearch->stopBrowsing();
+  mBonjourSearch->removeKSDeviceObserver(this);
+  // The search may be what calls, so it stays until the current event is over.
+  performOnMainThread([search = std::exchange(mBonjourSearch, nullptr)] {});
+}
 
 void ChooseDeviceView::refreshBrowsing() {
   stopBrowsing();
@@ -102,6 +128,39 @@ std::size_t ChooseDeviceView::deviceArrayControllerCnt() const {
 
 std::optional<Dictionary> ChooseDeviceView::choosedDevice() const {
   return deviceArrayController.selectedObject();
+}
+
+void ChooseDeviceView::addKSDevice(const Dictionary& device) {
+  if (doesMatchedModel(device) && doesWiFi(device)) setServiceToList(device);
+}
+
+void ChooseDeviceView::updateKSDevice(const Dictionary& device) {
+  addKSDevice(device);
+}
+
+void ChooseDeviceView::removeKSDevice(const Dictionary& device) {
+  if (doesMatchedModel(device)) removeServiceFromList(device);
+}
+
+bool ChooseDeviceView::doesMatchedModel(const Dictionary& device) const {
+  const std::string model = device.string(KSDevice::kUSBManufacturer).value_or("") + " " +
+                            device.string(KSDevice::kUSBModel).value_or("");
+  return std::find(searchModelList.begin(), searchModelList.end(), model) != searchModelList.end();
+}
+
+bool ChooseDeviceView::doesWiFi(const Dictionary& device) {
+  const Array* const addresses = device.array(KSDevice::kIPAddressList);
+  return addresses && snmp_active_interface_is_wireless(*addresses);
+}
+
+void ChooseDeviceView::setServiceToList(const Dictionary& device) {
+  removeServiceFromList(device);
+  deviceArrayController.addObjects({entryFor(device)});
+  deviceArrayController.rearrange();
+}
+
+void ChooseDeviceView::removeServiceFromList(const Dictionary& device) {
+  deviceArrayController.removeObject(entryFor(device));
 }
 
 void ChooseDeviceView::deviceListPopupButtonEnable(bool enable) {

@@ -7,6 +7,7 @@
 #include <string_view>
 #include <vector>
 
+#include "bonjour/KSBonjourSearch.h"
 #include "pages/page.h"
 #include "platform/array_controller.h"
 #include "platform/outlets.h"
@@ -23,8 +24,12 @@ inline constexpr std::string_view kLaunchWLANToolNotification = "addNotification
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
-/// The page that lists the devices found on the network. Made once; its list survives page changes.
-class ChooseDeviceView final : public Page {
+/// The page that lists the devices found on the network: those of the models looked for that say
+/// themselves that they are on wireless. Made once; its list and its search survive page changes.
+/// While it searches, the search holds it: stopBrowsing() lets go.
+class ChooseDeviceView final : public Page,
+                               public KSDeviceObserver,
+                               public std::enable_shared_from_this<ChooseDeviceView> {
  public:
   // Keys of a list entry.
   static constexpr std::string_view kDevice = "device";        ///< string, the device's name
@@ -33,6 +38,8 @@ class ChooseDeviceView final : public Page {
   static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
 
   explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
+  ChooseDeviceView(const ChooseDeviceView&) = delete;
+  ChooseDeviceView& operator=(const ChooseDeviceView&) = delete;
   ~ChooseDeviceView() override;
 
   /// The models to look for, as "manufacturer model" texts.
@@ -61,10 +68,28 @@ class ChooseDeviceView final : public Page {
   /// Shows or hides the waiting state.
   void progressON(bool on);
 
+  /// From the search. Asking a device whether it is on wireless may block for seconds.
+  void addKSDevice(const Dictionary& device) override;
+  void updateKSDevice(const Dictionary& device) override;
+  void removeKSDevice(const Dictionary& device) override;
+
+  /// Whether the device is one of the models looked for. Without any, none is.
+  [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
+
+  /// Whether the device answers that it is on wireless. Blocks.
+  [[nodiscard]] static bool doesWiFi(const Dictionary& device);
+
+  /// Lists the device, in place of an entry equal to the one that it makes.
+  void setServiceToList(const Dictionary& device);
+
+  /// Takes the entry equal to the one that the device makes off the list.
+  void removeServiceFromList(const Dictionary& device);
+
  private:
   void awakeFromNib();
   void fillPopUpMenu();
 
+  std::shared_ptr<KSBonjourSearch> mBonjourSearch;  ///< null when not browsing
   std::vector<std::string> searchModelList;
 
   // The controller comes before the table that is bound to it.

@@ -9,7 +9,6 @@
 #include <QMenu>
 #include <QMenuBar>
 #include <QPointer>
-#include <QProgressBar>
 #include <QPushButton>
 #include <QToolButton>
 #include <QUiLoader>
@@ -19,6 +18,7 @@
 #include "platform/qt/image_view.h"
 #include "platform/qt/native.h"
 #include "platform/qt/radio_matrix.h"
+#include "platform/qt/spinner.h"
 
 namespace onramp {
 
@@ -51,6 +51,8 @@ class Loader final : public QUiLoader {
       widget = qt::makeChild<qt::ImageViewWidget>(parent);
     } else if (className == QLatin1String("RadioMatrix")) {
       widget = qt::makeChild<qt::RadioMatrixWidget>(parent);
+    } else if (className == QLatin1String("Spinner")) {
+      widget = qt::makeChild<qt::Spinner>(parent);
     } else if (availableWidgets().contains(className)) {
       widget = QUiLoader::createWidget(className, parent, name);
     } else {
@@ -111,7 +113,7 @@ bool isOfKind(const QObject* object, OutletKind kind) {
     case OutletKind::kImageView:
       return qobject_cast<const qt::ImageViewWidget*>(object);
     case OutletKind::kProgressIndicator:
-      return qobject_cast<const QProgressBar*>(object);
+      return qobject_cast<const qt::Spinner*>(object);
     case OutletKind::kTableView:
       return qobject_cast<const QAbstractItemView*>(object);
     case OutletKind::kPopUpButton:
@@ -134,7 +136,7 @@ struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;
   Tree& operator=(const Tree&) = delete;
-  ~Tree() { delete root.data(); }
+  ~Tree() { const std::unique_ptr<QWidget> ended(root.data()); }
 
   QPointer<QWidget> root;
 };

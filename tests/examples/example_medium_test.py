@@ -166,7 +166,7 @@ class ApplicationResources(unittest.TestCase):
 
     def test_pictures_are_drawn_at_two_pixels_a_point(self):
         images = MEDIUM / "MacResources/Images"
-        sizes = {RESOURCES / "Background.png": (680, 480), images / "wirelessLan.png": (192, 192),
+        sizes = {RESOURCES / "Background.png": (340, 240), images / "wirelessLan.png": (192, 192),
                  images / "usb.png": (192, 192), images / "wiredLan.png": (192, 192)}
         for path, size in sizes.items():
             with self.subTest(path.name):

@@ -13,8 +13,8 @@ from practice_network import description
 from practice_network.agents import AgentError
 from practice_network.control import SOCKET_VARIABLE, serve
 from practice_network.description import DescriptionError
-from practice_network.host import (BUS_ADDRESS, RUN, Host, HostError, loop_back, plug_in_cable,
-                                   take_over_run)
+from practice_network.host import (BUS_ADDRESS, RUN, Host, HostError, log, loop_back,
+                                   plug_in_cable, take_over_run)
 from practice_network.network import Network
 from practice_network.publisher import PublishError, connect
 
@@ -26,10 +26,17 @@ NETWORK_FAILED = 125
 
 
 def why_not_enclosed():
-    """None where this process can have such namespaces; else what the system says."""
+    """None where this process can have such namespaces; else the reason."""
     probe = subprocess.run([*ENCLOSE, "mount", "-t", "tmpfs", "none", "/run"],
                            capture_output=True, text=True)
-    return probe.stderr.strip() or "unshare failed" if probe.returncode else None
+    if probe.returncode:
+        return probe.stderr.strip() or "unshare failed"
+    user = pwd.getpwnam("avahi").pw_uid
+    ranges = (map(int, line.split())
+              for line in pathlib.Path("/proc/self/uid_map").read_text().splitlines())
+    if not any(first <= user < first + count for first, _, count in ranges):
+        return "avahi-daemon's user does not exist in this user namespace"
+    return None
 
 
 def enclose(options):
@@ -96,8 +103,10 @@ def devices(options):
     except DescriptionError as error:
         print(f"practice-network: {options['description']}: {error}", file=sys.stderr)
         return BAD_INPUT
-    except (HostError, AgentError, PublishError) as error:
+    except (HostError, AgentError) as error:
         return _fail(error)
+    except PublishError as error:
+        return _fail(f"{error}\n{log('avahi-daemon')}")
     print("ready", flush=True)
     serve(network, socket.socket(fileno=options["listener"]))
 

@@ -1,5 +1,6 @@
 """The devices of a running network: who is there, and how that changes."""
 
+import collections
 import dataclasses
 import ipaddress
 import itertools
@@ -21,6 +22,9 @@ class Network:
         self._agents = Agents(RUN / "agents")
         self._publisher = None
         self._devices = {}
+        # A device keeps its host name, so that it publishes the same each time that it comes.
+        numbers = itertools.count(1)
+        self._host_names = collections.defaultdict(lambda: f"device-{next(numbers)}.local")
 
     def load(self, devices):
         """Takes in all devices of a description and lets those appear that are present."""
@@ -38,7 +42,7 @@ class Network:
             self._publisher = Publisher(BUS_ADDRESS)
             for device in self._devices.values():
                 if device.present:
-                    self._publisher.publish(device)
+                    self._publish(device)
 
     def settle(self, seconds=30):
         """Waits until everything is established that is published."""
@@ -83,6 +87,8 @@ class Network:
         if after.name != name:
             self._devices = {after.name if key == name else key: value
                              for key, value in self._devices.items()}
+            self._host_names[after.name] = self._host_names[name]
+            del self._host_names[name]
         self._devices[after.name] = after
         if not (before.present and after.present) or after.name != name:
             self._vanish(before)
@@ -95,14 +101,15 @@ class Network:
             self._agents.start([after])
         if not self._publisher:
             return
-        if (before.type, before.port) != (after.type, after.port):
-            self._publisher.withdraw(before)
-            self._publisher.publish(after)
-            return
         if before.addresses != after.addresses:
             self._publisher.publish_addresses(after)
-        if any(before.txt_of(one) != after.txt_of(one) for one in after.type):
-            self._publisher.publish_txt(after)
+        if _service_part(before) != _service_part(after):
+            self._publisher.await_probed(before)
+            if (before.type, before.port) == (after.type, after.port):
+                self._publisher.publish_txt(after)
+            else:
+                self._publisher.withdraw(before)
+                self._publish(after)
 
     def list(self):
         """One table a device: its entries as described, and "state", Avahi's word for it."""
@@ -119,7 +126,10 @@ class Network:
     def _appear(self, device):
         self._agents.start([device])
         if self._publisher:
-            self._publisher.publish(device)
+            self._publish(device)
+
+    def _publish(self, device):
+        self._publisher.publish(device, self._host_names[device.name])
 
     def _vanish(self, device):
         if self._publisher:
@@ -164,3 +174,7 @@ def _list(addresses):
 
 def _agent_part(device):
     return device.addresses, device.behaviour(), device.delay
+
+
+def _service_part(device):
+    return [(one, device.port_of(one), device.txt_of(one)) for one in device.type]

@@ -1,6 +1,7 @@
 """The mDNS side of the devices: their host names and services in a real Avahi daemon."""
 
 import dataclasses
+import ipaddress
 import time
 
 import dbus
@@ -10,7 +11,12 @@ AVAHI = "org.freedesktop.Avahi"
 ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
-NO_REVERSE = dbus.UInt32(16)  # AVAHI_PUBLISH_NO_REVERSE
+# Unique, not probed for, several of a name allowed. Host names are the network's own, so there is
+# nobody to ask; and a probe that comes back on loopback after its record was replaced would make
+# Avahi see a conflict with itself.
+ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
+ADDRESS_SECONDS = dbus.UInt32(120)  # RFC 6762, section 10
+CLASS_IN, TYPE_A, TYPE_AAAA = dbus.UInt16(1), dbus.UInt16(1), dbus.UInt16(28)
 SERVER_RUNNING = 2
 GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 4: "failed"}
 
@@ -52,14 +58,12 @@ class Publisher:
     def __init__(self, bus_address):
         self._bus, self._server = connect(bus_address)
         self._entries = {}
-        self._host_count = 0
 
     def close(self):
         self._bus.close()
 
-    def publish(self, device):
-        self._host_count += 1
-        entry = _Entry(f"device-{self._host_count}.local", self._new_group(), self._new_group())
+    def publish(self, device, host):
+        entry = _Entry(host, self._new_group(), self._new_group())
         self._entries[device.name] = entry
         self.publish_addresses(device)
         for service_type in device.type:
@@ -72,8 +76,11 @@ class Publisher:
         """Publishes the device's present addresses in place of those it had."""
         entry = self._entries[device.name]
         entry.addresses.Reset()
-        for address in device.addresses:
-            entry.addresses.AddAddress(ANY_INTERFACE, ANY_PROTOCOL, NO_REVERSE, entry.host, address)
+        for address in map(ipaddress.ip_address, device.addresses):
+            entry.addresses.AddRecord(
+                ANY_INTERFACE, ANY_PROTOCOL, ADDRESS_FLAGS, entry.host, CLASS_IN,
+                TYPE_A if address.version == 4 else TYPE_AAAA, ADDRESS_SECONDS,
+                dbus.ByteArray(address.packed))
         entry.addresses.Commit()
 
     def publish_txt(self, device):
@@ -87,6 +94,15 @@ class Publisher:
         if entry := self._entries.pop(device.name, None):
             entry.services.Free()
             entry.addresses.Free()
+
+    def await_probed(self, device, seconds=5):
+        """Waits out the probes for the device's name; what they ask for must not change meanwhile.
+
+        On loopback Avahi hears its own probes, and takes one with an older text for a rival's.
+        """
+        deadline = time.monotonic() + seconds
+        while self.state(device) == "probing" and time.monotonic() < deadline:
+            time.sleep(0.01)
 
     def state(self, device):
         """"established" when everything of the device is; else the state of what is not."""

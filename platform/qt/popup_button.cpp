@@ -1,7 +1,7 @@
 #include <QAction>
 #include <QMenu>
-#include <QProgressBar>
 #include <QToolButton>
+#include <memory>
 #include <utility>
 
 #include "platform/outlets.h"
@@ -10,14 +10,6 @@
 namespace onramp {
 
 using qt::nativeOf;
-
-void ProgressIndicator::startAnimation() const {
-  if (auto* const bar = nativeOf<QProgressBar>(*this)) bar->setRange(0, 0);
-}
-
-void ProgressIndicator::stopAnimation() const {
-  if (auto* const bar = nativeOf<QProgressBar>(*this)) bar->setRange(0, 1);
-}
 
 // The button itself is item 0; the others are its menu's actions.
 
@@ -30,7 +22,8 @@ std::size_t PopUpButton::numberOfItems() const {
 void PopUpButton::removeItem(std::size_t index) const {
   auto* const button = nativeOf<QToolButton>(*this);
   if (!button || index < 1 || index >= numberOfItems()) return;
-  delete button->menu()->actions().at(static_cast<qsizetype>(index) - 1);
+  const std::unique_ptr<QAction> item(
+      button->menu()->actions().at(static_cast<qsizetype>(index) - 1));
 }
 
 void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {

@@ -1,0 +1,178 @@
+// Encodes the request for ActiveIF and decodes its reply, with this codec and with net-snmp's
+// library in turns, and prints times, ratios and allocations of one message.
+
+#include <net-snmp/net-snmp-config.h>
+#include <net-snmp/net-snmp-includes.h>
+
+#include <array>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+
+#include "bench/snmp/median.h"
+#include "snmp/codec.h"
+
+namespace {
+
+long allocations = 0;
+
+}  // namespace
+
+// Every allocation of the process, those inside the library included, passes through here.
+extern "C" {
+void* __libc_malloc(std::size_t size);
+void* __libc_calloc(std::size_t count, std::size_t size);
+
+void* malloc(std::size_t size) {
+  ++allocations;
+  return __libc_malloc(size);
+}
+void* calloc(std::size_t count, std::size_t size) {
+  ++allocations;
+  return __libc_calloc(count, size);
+}
+}
+
+namespace {
+
+constexpr int kRounds = 2001;
+constexpr int kMessagesPerRound = 500;
+
+std::array<std::uint16_t, 14> arcs = {1, 3, 6, 1, 4, 1, 4242, 2, 4, 4, 1240, 1, 2, 0};
+
+void check(bool fine, const char* what) {
+  if (fine) return;
+  std::fprintf(stderr, "snmp_codec_bench: %s failed, so there is nothing to compare\n", what);
+  std::exit(1);
+}
+
+// One message and the storage behind it.
+struct Ours {
+  Ours() {
+    snmp_message_init(message, 1);
+    message.request_id = 1234;
+    binding[0].name = &name;
+  }
+  Ours(const Ours&) = delete;
+  Ours& operator=(const Ours&) = delete;
+
+  void build() { check(onramp::snmp_encode_message(message, buffer, length) == 0, "encoding"); }
+
+  void parse(std::span<const std::uint8_t> reply) {
+    octets = {1500, 1500, strings.data()};
+    check(onramp::snmp_decode_message(message, reply) == 0, "decoding");
+    check(binding[0].int_value == 2, "reading the value");
+  }
+
+  [[nodiscard]] std::span<const std::uint8_t> built() const {
+    return std::span(buffer).first(length);
+  }
+
+  std::array<std::uint8_t, 1536> buffer{};
+  std::array<std::uint8_t, 1500> strings{};
+  std::uint16_t length = 0;
+  onramp::snmp_oid name{14, 14, arcs.data()};
+  onramp::snmp_octets octets;
+  std::array<onramp::snmp_varbind, 1> binding{{{.octets_value = &octets}}};
+  onramp::snmp_message message{.varbinds = binding};
+};
+
+class NetSnmp {
+ public:
+  NetSnmp() {
+    snmp_sess_init(&session_);
+    session_.version = SNMP_VERSION_1;
+    std::array<oid, arcs.size()> name{};
+    std::copy(arcs.begin(), arcs.end(), name.begin());
+    request_ = snmp_pdu_create(SNMP_MSG_GET);
+    request_->version = SNMP_VERSION_1;
+    request_->reqid = 1234;
+    request_->community = reinterpret_cast<u_char*>(strdup("corridor"));
+    request_->community_len = 8;
+    snmp_add_null_var(request_, name.data(), name.size());
+  }
+  NetSnmp(const NetSnmp&) = delete;
+  NetSnmp& operator=(const NetSnmp&) = delete;
+  ~NetSnmp() { snmp_free_pdu(request_); }
+
+  void build() {
+    size_t size = buffer_.size();
+    offset_ = 0;
+    u_char* packet = buffer_.data();
+    check(snmp_build(&packet, &size, &offset_, &session_, request_) == 0, "net-snmp's building");
+  }
+
+  void parse(std::span<const std::uint8_t> reply) {
+    netsnmp_pdu* const pdu = snmp_pdu_create(SNMP_MSG_RESPONSE);
+    check(snmp_parse(nullptr, &session_, pdu, const_cast<u_char*>(reply.data()), reply.size()) == 0,
+          "net-snmp's parsing");
+    check(*pdu->variables->val.integer == 2, "net-snmp's reading of the value");
+    snmp_free_pdu(pdu);
+  }
+
+  /// Built from the buffer's end towards its start.
+  [[nodiscard]] std::span<const std::uint8_t> request() const {
+    return std::span(buffer_).last(offset_);
+  }
+
+ private:
+  netsnmp_session session_{};
+  netsnmp_pdu* request_ = nullptr;
+  std::array<u_char, 1536> buffer_{};
+  size_t offset_ = 0;
+};
+
+template <typename Work>
+double allocationsOf(Work work) {
+  const long before = allocations;
+  for (int i = 0; i < kMessagesPerRound; ++i)
+    work();
+  return static_cast<double>(allocations - before) / kMessagesPerRound;
+}
+
+void report(const char* what, const Samples& ours, const Samples& peer, double ourAllocations,
+            double peerAllocations) {
+  std::printf(
+      "%s  %6.1f ns [%.1f, %.1f]   net-snmp %6.1f ns [%.1f, %.1f]   %5.1f times as fast"
+      "   allocations %g, net-snmp %g\n",
+      what, ours.median(), ours.quantile(0.05), ours.quantile(0.95), peer.median(),
+      peer.quantile(0.05), peer.quantile(0.95), peer.median() / ours.median(), ourAllocations,
+      peerAllocations);
+}
+
+}  // namespace
+
+int main() {
+  Ours request;
+  Ours device;
+  Ours answer;
+  NetSnmp peer;
+  request.build();
+  peer.build();
+  const auto a = request.built();
+  const auto b = peer.request();
+  check(std::equal(a.begin(), a.end(), b.begin(), b.end()), "building the same bytes as net-snmp");
+  device.message.pdu_type = onramp::kPduResponse;
+  device.binding[0].type = onramp::kTagInteger;
+  device.binding[0].int_value = 2;
+  device.build();
+  const auto reply = device.built();
+
+  Samples ourBuild;
+  Samples peerBuild;
+  Samples ourParse;
+  Samples peerParse;
+  for (int round = 0; round < kRounds; ++round) {
+    ourBuild.measure(kMessagesPerRound, [&] { request.build(); });
+    peerBuild.measure(kMessagesPerRound, [&] { peer.build(); });
+    ourParse.measure(kMessagesPerRound, [&] { answer.parse(reply); });
+    peerParse.measure(kMessagesPerRound, [&] { peer.parse(reply); });
+  }
+  std::printf("Medians of %d rounds of %d messages of %zu bytes [5 %%, 95 %%]\n", kRounds,
+              kMessagesPerRound, a.size());
+  report("encode", ourBuild, peerBuild, allocationsOf([&] { request.build(); }),
+         allocationsOf([&] { peer.build(); }));
+  report("decode", ourParse, peerParse, allocationsOf([&] { answer.parse(reply); }),
+         allocationsOf([&] { peer.parse(reply); }));
+  return 0;
+}

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <algorithm>
+#include <chrono>
+#include <vector>
+
+/// The nanoseconds of repeated measurements of one thing.
+class Samples {
+ public:
+  /// Runs `work` `times` times in a row and keeps the mean as one sample.
+  template <typename Work>
+  void measure(int times, Work work) {
+    const auto start = std::chrono::steady_clock::now();
+    for (int i = 0; i < times; ++i)
+      work();
+    const std::chrono::duration<double, std::nano> took = std::chrono::steady_clock::now() - start;
+    samples_.push_back(took.count() / times);
+  }
+
+  [[nodiscard]] double median() const { return quantile(0.5); }
+
+  /// The value that the given part of the samples, 0 to 1, stays below.
+  [[nodiscard]] double quantile(double part) const {
+    std::vector<double> sorted = samples_;
+    std::sort(sorted.begin(), sorted.end());
+    return sorted[static_cast<std::size_t>(part * static_cast<double>(sorted.size() - 1))];
+  }
+
+ private:
+  std::vector<double> samples_;
+};

@@ -1,0 +1,46 @@
+#include "bonjour/KSDevice.h"
+
+#include <string>
+#include <utility>
+
+#include "bonjour/KSNetService.h"
+
+namespace onramp {
+
+namespace {
+
+// Without a service the texts are known to be empty; with one they may be unknown.
+std::optional<std::string> textOf(const NetServiceRef& service,
+                                  std::optional<std::string> (*read)(const NetServiceRef&)) {
+  return service ? read(service) : "";
+}
+
+}  // namespace
+
+Dictionary KSDevice::initWithService(const NetServiceRef& service,
+                                     const std::optional<Array>& types) {
+  const auto name = textOf(service, KSNetServiceGetNameSafe);
+  const auto manufacturer = textOf(service, KSNetServiceCopyManufacturer);
+  const auto model = textOf(service, KSNetServiceCopyModel);
+  const auto note = textOf(service, KSNetServiceCopyNote);
+  const auto uri = textOf(service, KSNetServiceCopyDeviceURI);
+
+  Array addresses;
+  if (auto found = KSNetServiceCopyIPv4Addresses(service)) {
+    addresses.assign(std::make_move_iterator(found->begin()),
+                     std::make_move_iterator(found->end()));
+  }
+  std::string modelName;
+  if (manufacturer && model) modelName = *manufacturer + ' ' + *model;
+
+  return Dictionary{{std::string(kDisplayName), name.value_or("")},
+                    {std::string(kModelName), std::move(modelName)},
+                    {std::string(kBonjourServiceType), types.value_or(Array())},
+                    {std::string(kUSBManufacturer), manufacturer.value_or("")},
+                    {std::string(kUSBModel), model.value_or("")},
+                    {std::string(kLocation), note.value_or("")},
+                    {std::string(kDeviceURI), uri.value_or("")},
+                    {std::string(kIPAddressList), std::move(addresses)}};
+}
+
+}  // namespace onramp

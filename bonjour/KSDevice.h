@@ -1,0 +1,33 @@
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+#include "platform/net_service.h"
+#include "platform/value.h"
+
+namespace onramp {
+
+/// What the wizard knows of a device on the network: a flat record made of one service. Unknown
+/// texts are empty, unknown lists too; nothing is ever absent.
+class KSDevice {
+ public:
+  KSDevice() = delete;
+
+  // Keys of the record; all eight are always present.
+  static constexpr std::string_view kDisplayName = "display name";  ///< string
+  static constexpr std::string_view kModelName = "model name";      ///< string
+  static constexpr std::string_view kBonjourServiceType =
+      "bonjour service type";                                            ///< array of strings
+  static constexpr std::string_view kUSBManufacturer = "USB_MFG";        ///< string
+  static constexpr std::string_view kUSBModel = "USB_MDL";               ///< string
+  static constexpr std::string_view kLocation = "location";              ///< string
+  static constexpr std::string_view kDeviceURI = "device URI";           ///< string
+  static constexpr std::string_view kIPAddressList = "IP address list";  ///< array of strings
+
+  /// The record of `service`, which is known under the service types `types`; either may be null.
+  [[nodiscard]] static Dictionary initWithService(const NetServiceRef& service,
+                                                  const std::optional<Array>& types);
+};
+
+}  // namespace onramp

@@ -1,0 +1,62 @@
+#pragma once
+
+#include <avahi-common/address.h>
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "platform/avahi/handles.h"
+#include "platform/avahi/loop.h"
+
+namespace onramp::avahi {
+
+class Connection;
+
+/// All addresses of a host on one interface. (Avahi's resolver gives one address only, and that of
+/// the family that the service was found by.) On the loop's thread only.
+class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
+ public:
+  /// Starts to look; null when the daemon would not.
+  [[nodiscard]] static std::shared_ptr<HostAddresses> lookUp(Connection& connection,
+                                                             AvahiIfIndex interface,
+                                                             const std::string& host);
+
+  /// Calls `action` once, outside of any callback of Avahi, when addresses are known and either one
+  /// is IPv4 or there has been time enough for one. Dropped with the last holder of this object.
+  void whenKnown(std::function<void()> action);
+
+  /// The addresses in the order in which the daemon told of them, each once.
+  [[nodiscard]] std::vector<AvahiAddress> addresses() const;
+
+  [[nodiscard]] AvahiIfIndex interface() const { return interface_; }
+
+ private:
+  struct Record {
+    AvahiProtocol heardBy;
+    AvahiAddress address;
+  };
+
+  HostAddresses(Loop& loop, AvahiIfIndex interface);
+
+  static void called(AvahiRecordBrowser* browser, AvahiIfIndex interface, AvahiProtocol protocol,
+                     AvahiBrowserEvent event, const char* name, std::uint16_t recordClass,
+                     std::uint16_t type, const void* data, std::size_t size,
+                     AvahiLookupResultFlags flags, void* self);
+  void exhausted();
+  void check();
+  [[nodiscard]] bool known() const;
+
+  Loop& loop_;
+  AvahiIfIndex interface_;
+  std::vector<Record> records_;
+  std::vector<std::function<void()>> waiting_;
+  int unanswered_ = 2;  ///< of the two browsers, those that still go through what is known at once
+  bool patient_ = true;
+  Timer patience_;
+  RecordBrowserHandle ipv4_;
+  RecordBrowserHandle ipv6_;
+};
+
+}  // namespace onramp::avahi

@@ -1,0 +1,195 @@
+#include <gmock/gmock.h>
+
+#include "bonjour/KSBonjour.h"
+#include "tests/recording/network.h"
+
+namespace onramp {
+
+namespace {
+
+using recording::Network;
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+struct Event {
+  std::string what;
+  NetServiceRef service;
+  bool resolvedByThen = false;
+  friend bool operator==(const Event& a, const Event& b) {
+    return a.what == b.what && a.service == b.service;
+  }
+};
+
+void PrintTo(const Event& event, std::ostream* out) {
+  *out << event.what << ' ' << (event.service ? event.service->name().value_or("?") : "null");
+}
+
+class Recorder final : public KSBonjourObserver {
+ public:
+  explicit Recorder(const KSBonjour& watched) : browser(watched) {}
+  void addBonjourService(const NetServiceRef& service) override { note("add", service); }
+  void removeBonjourService(const NetServiceRef& service) override { note("remove", service); }
+  void resolvedBonjourService(const NetServiceRef& service) override { note("resolved", service); }
+
+  const KSBonjour& browser;
+  std::vector<Event> events;
+
+ private:
+  void note(const char* what, const NetServiceRef& s) {
+    events.push_back({what, s, s && browser.didServiceResolved(s->name(), s->type(), s->domain())});
+  }
+};
+
+class BrowserTest : public ::testing::Test {
+ protected:
+  BrowserTest() {
+    network.reset();
+    browser->addKSBonjourObserver(recorder);
+    browser->startBrowsing();
+  }
+
+  static bool contains(const KSBonjour& b) {
+    return b.isServiceContained("Kestrel", "_ipp._tcp.", "local.");
+  }
+  [[nodiscard]] bool contains() const { return contains(*browser); }
+
+  Network& network = Network::instance();
+  std::shared_ptr<KSBonjour> browser = KSBonjour::initWithType("_ipp._tcp.");
+  std::shared_ptr<Recorder> recorder = std::make_shared<Recorder>(*browser);
+  NetServiceRef onOne = Network::service("Kestrel", "_ipp._tcp.");
+  NetServiceRef onTwo = Network::service("Kestrel", "_ipp._tcp.");
+  NetServiceRef onThree = Network::service("Kestrel", "_ipp._tcp.");
+};
+
+TEST_F(BrowserTest, AServiceIsForwardedResolvedAndForgotten) {
+  network.found(onOne);
+  EXPECT_TRUE(contains());
+  EXPECT_FALSE(browser->didServiceResolved("Kestrel", "_ipp._tcp.", "local."));
+  EXPECT_TRUE(Network::isResolving(onOne));
+  EXPECT_EQ(browser->serviceWithName("Kestrel._ipp._tcp.local."), onOne);
+  EXPECT_EQ(browser->serviceWithName("Kestrel"), nullptr);
+
+  network.resolves(onOne, {});
+  EXPECT_TRUE(recorder->events.back().resolvedByThen);
+  network.gone(onOne);
+  EXPECT_FALSE(contains());
+  EXPECT_THAT(recorder->events,
+              ElementsAre(Event{"add", onOne}, Event{"resolved", onOne}, Event{"remove", onOne}));
+}
+
+TEST_F(BrowserTest, ADuplicateIsCountedAndTheNewestObjectIsKept) {
+  network.found(onOne);
+  network.found(onTwo);
+  EXPECT_FALSE(Network::isResolving(onOne));
+  EXPECT_TRUE(Network::isResolving(onTwo));
+  EXPECT_EQ(browser->serviceWithName("Kestrel._ipp._tcp.local."), onTwo);
+  network.resolves(onTwo, {});
+
+  network.gone(onOne);
+  EXPECT_TRUE(contains());
+  EXPECT_TRUE(Network::isResolving(onTwo));
+  network.gone(onTwo);
+  EXPECT_FALSE(contains());
+  EXPECT_FALSE(Network::isResolving(onTwo));
+  EXPECT_THAT(recorder->events,
+              ElementsAre(Event{"add", onOne}, Event{"add", onTwo}, Event{"resolved", onTwo},
+                          Event{"remove", onTwo}, Event{"remove", onTwo}));
+}
+
+TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
+  for (const auto& service : {onOne, onTwo, onThree})
+    network.found(service);
+  for (const auto& service : {onOne, onTwo, onThree})
+    network.gone(service);
+  EXPECT_TRUE(contains());
+
+  // The first of them counted, so two are left, and the next resolve makes removals count again.
+  network.resolves(onThree, {});
+  network.gone(onOne);
+  EXPECT_TRUE(contains());
+  network.gone(onOne);
+  EXPECT_FALSE(contains());
+}
+
+TEST_F(BrowserTest, RemovalsOfUnknownServicesAreForwardedAsNull) {
+  network.gone(onOne);
+  const NetServiceRef scanner = Network::service("Kestrel", "_scanner._tcp.");
+  browser->removeKSNetService({std::string(kRemoveNotification), nullptr, {}});
+  browser->removeKSNetService(
+      {std::string(kRemoveNotification), nullptr, {{std::string(kServiceInfo), scanner}}});
+  EXPECT_THAT(recorder->events, ElementsAre(Event{"remove", nullptr}, Event{"remove", nullptr},
+                                            Event{"remove", nullptr}));
+}
+
+TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
+  const auto scanners = KSBonjour::initWithType("_scanner._tcp.");
+  const auto scannerRecorder = std::make_shared<Recorder>(*scanners);
+  scanners->addKSBonjourObserver(scannerRecorder);
+  scanners->startBrowsing();
+
+  network.found(onOne);
+  network.resolves(onOne, {});
+  EXPECT_TRUE(contains());
+  EXPECT_FALSE(contains(*scanners));
+  network.gone(onOne);
+  EXPECT_THAT(scannerRecorder->events,
+              ElementsAre(Event{"add", onOne}, Event{"resolved", onOne}, Event{"remove", nullptr}));
+  EXPECT_EQ(recorder->events.back(), (Event{"remove", onOne}));
+
+  browser->addKSNetService({std::string(kAddNotification), nullptr, {}});
+  browser->resolvedKSNetService({std::string(kResolvedNotification), nullptr, {}});
+  EXPECT_EQ(recorder->events.back(), (Event{"resolved", nullptr}));
+}
+
+TEST_F(BrowserTest, StoppingDropsTheTableAndRunningResolvesSilently) {
+  network.found(onOne);
+  recorder->events.clear();
+  browser->stopBrowsing();
+  EXPECT_FALSE(Network::isResolving(onOne));
+  EXPECT_FALSE(contains());
+  EXPECT_EQ(browser->serviceWithName("Kestrel._ipp._tcp.local."), nullptr);
+  network.found(onOne);
+  EXPECT_THAT(recorder->events, IsEmpty());
+  browser->stopBrowsing();
+}
+
+TEST_F(BrowserTest, ARestartBeginsCleanWithOneBrowse) {
+  network.found(onOne);
+  browser->startBrowsing();
+  browser->startBrowsing();
+  EXPECT_EQ(network.browsers.size(), 1u);
+  EXPECT_FALSE(contains());
+  recorder->events.clear();
+  network.found(onOne);
+  EXPECT_THAT(recorder->events, ElementsAre(Event{"add", onOne}));
+}
+
+TEST_F(BrowserTest, ABrowseThatCannotStartLeavesAnIdleBrowser) {
+  network.searchesStart = false;
+  browser->startBrowsing();
+  EXPECT_THAT(network.browsers, IsEmpty());
+  const auto typeless = KSBonjour::initWithType(std::nullopt);
+  network.log.clear();
+  typeless->startBrowsing();
+  EXPECT_THAT(network.log, IsEmpty());
+}
+
+TEST_F(BrowserTest, AnObserverMayEndTheBrowserFromWithin) {
+  class Ender final : public KSBonjourObserver {
+   public:
+    explicit Ender(std::shared_ptr<KSBonjour>& held) : browser(held) {}
+    void addBonjourService(const NetServiceRef&) override { browser.reset(); }
+    void removeBonjourService(const NetServiceRef&) override {}
+    void resolvedBonjourService(const NetServiceRef&) override {}
+    std::shared_ptr<KSBonjour>& browser;
+  };
+  browser->addKSBonjourObserver(std::make_shared<Ender>(browser));
+  network.found(onOne);
+  EXPECT_EQ(browser, nullptr);
+  EXPECT_FALSE(Network::isResolving(onOne));
+  EXPECT_THAT(network.browsers, IsEmpty());
+}
+
+}  // namespace
+
+}  // namespace onramp

@@ -1,0 +1,31 @@
+// Any text as a device URI, and any name through a URI and back.
+
+#include <cstdint>
+#include <cstdlib>
+#include <string>
+
+#include "bonjour/device_uri.h"
+#include "bonjour/utf8.h"
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+  const std::string text(reinterpret_cast<const char*>(data), size);
+
+  if (const auto instance = onramp::serviceInstanceOf(text)) {
+    if (instance->domain != "local." || !onramp::isUtf8(instance->name)) std::abort();
+    if (!instance->type.ends_with("_tcp.") && !instance->type.ends_with("_udp.")) std::abort();
+  }
+  if (const auto host = onramp::hostOfURL(text)) {
+    if (host->empty() || host->find_first_of("/?#@") != std::string::npos) std::abort();
+  }
+
+  const std::string escaped = onramp::percentEscaped(text);
+  const bool utf8 = onramp::isUtf8(text);
+  if (onramp::percentUnescaped(escaped).has_value() != utf8) std::abort();
+  if (utf8 && text.find('.') == std::string::npos) {
+    const onramp::ServiceInstance whole{text, "_ipp._tcp.", "local."};
+    if (onramp::serviceInstanceOf("dnssd://" + escaped + "._ipp._tcp.local.") != whole) {
+      std::abort();
+    }
+  }
+  return 0;
+}

@@ -1,0 +1,157 @@
+"""What the tests and benchmarks of discovery share."""
+
+import os
+import pathlib
+import signal
+import socket
+import struct
+import subprocess
+import sys
+import threading
+import time
+
+ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
+PRACTICE_NETWORK = ROOT / "tools" / "practice-network"
+INTERFACE = "practice0"
+PATIENCE = 30  # Seconds until something counts as not happening at all.
+
+
+def enclose(description):
+    """Starts this program over on a practice network of two hosts, unless it runs on one."""
+    if "ONRAMP_PRACTICE_SOCKET" in os.environ:
+        return
+    os.execv(sys.executable, [sys.executable, "-B", str(PRACTICE_NETWORK), "--hosts", "2",
+                              str(description), sys.executable, "-B", *sys.argv])
+
+
+class Process:
+    """A running program whose lines of output can be waited for; ends with its input."""
+
+    def __init__(self, *command, **options):
+        self._process = subprocess.Popen([str(word) for word in command], text=True,
+                                         stdin=subprocess.PIPE, stdout=subprocess.PIPE, **options)
+        self.lines = []
+        self._news = threading.Condition()
+        self._reader = threading.Thread(target=self._read)
+        self._reader.start()
+
+    def __enter__(self):
+        return self
+
+    def __exit__(self, *_):
+        self.end()
+
+    def _read(self):
+        for line in self._process.stdout:
+            with self._news:
+                self.lines.append(line.rstrip("\n"))
+                self._news.notify_all()
+
+    def wait(self, condition, patience=PATIENCE):
+        """Waits until `condition` of the lines so far holds and returns it; raises if it never does."""
+        with self._news:
+            if not self._news.wait_for(lambda: condition(self.lines), patience):
+                raise AssertionError("it never happened; the output was:\n" + "\n".join(self.lines))
+            return condition(self.lines)
+
+    def tell(self, line):
+        self._process.stdin.write(line + "\n")
+        self._process.stdin.flush()
+
+    def end(self):
+        if not self._process.stdin.closed:
+            self._process.stdin.close()
+        status = self._process.wait(PATIENCE)
+        self._reader.join()
+        self._process.stdout.close()
+        return status
+
+
+class Search(Process):
+    """A running `bonjour_probe search`; its lines are events of time, word, name and more."""
+
+    def __init__(self, probe, service_type, **options):
+        super().__init__(probe, "search", service_type + ".", **options)
+
+    def events(self, word, name=None):
+        fields = [line.split("\t") for line in self.lines]
+        return [event for event in fields if event[1] == word and name in (None, event[2])]
+
+    def wait_for(self, word, name, count=1):
+        """The last of at least `count` events of that kind, as its fields."""
+        return self.wait(lambda _: len(self.events(word, name)) >= count
+                         and self.events(word, name)[-1])
+
+    def processor_seconds(self):
+        return float(self.events("cpu")[0][2])
+
+
+class Avahi:
+    """This host's Avahi daemon, to be killed, frozen and started again."""
+
+    configuration = pathlib.Path("/run/practice-network/avahi-daemon.conf")
+    pid_file = pathlib.Path("/run/avahi-daemon/pid")
+
+    def kill(self):
+        os.kill(self._pid(), signal.SIGKILL)
+        self._wait(lambda: not self._alive())
+
+    def freeze(self):
+        os.kill(self._pid(), signal.SIGSTOP)
+
+    def thaw(self):
+        os.kill(self._pid(), signal.SIGCONT)
+
+    def start(self, **settings):
+        """Starts it anew with other `settings`, by their names with "_" for "-"."""
+        text = self.configuration.read_text()
+        for name, value in settings.items():
+            key = name.replace("_", "-") + "="
+            text = "\n".join(key + value if line.startswith(key) else line
+                             for line in text.split("\n"))
+        configuration = self.configuration.with_name("changed.conf")
+        configuration.write_text(text)
+        subprocess.run(["avahi-daemon", "-f", configuration, "--no-drop-root", "--no-chroot",
+                        "--no-rlimits", "--daemonize"], check=True, stderr=subprocess.DEVNULL)
+
+    def restart(self, **settings):
+        self.kill()
+        self.start(**settings)
+
+    def _pid(self):
+        return int(self.pid_file.read_text())
+
+    def _alive(self):
+        """Whether the process runs: one that has ended may wait to be taken note of."""
+        try:
+            status = pathlib.Path(f"/proc/{self._pid()}/stat").read_text()
+        except (FileNotFoundError, ProcessLookupError):
+            return False
+        return status.rpartition(")")[2].split()[0] not in "ZX"
+
+    @staticmethod
+    def _wait(condition):
+        deadline = time.monotonic() + PATIENCE
+        while not condition():
+            if time.monotonic() > deadline:
+                raise AssertionError("avahi-daemon does not end")
+            time.sleep(0.01)
+
+
+def announce_pointer(service_type, target_labels):
+    """Announces (RFC 6762 section 8.3) that `service_type` has an instance of those labels, and
+    nothing else of it."""
+    name = _labels(*service_type.encode().split(b"."), b"local")
+    target = _labels(*target_labels)
+    packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name
+              + struct.pack("!HHIH", 12, 1, 4500, len(target)) + target)
+    with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as sender:
+        sender.setsockopt(socket.SOL_SOCKET, socket.SO_REUSEADDR, 1)
+        sender.setsockopt(socket.SOL_SOCKET, socket.SO_REUSEPORT, 1)
+        sender.setsockopt(socket.IPPROTO_IP, socket.IP_MULTICAST_TTL, 255)
+        sender.bind(("", 5353))
+        sender.sendto(packet, ("224.0.0.251", 5353))
+
+
+def _labels(*labels):
+    return b"".join(bytes([len(label)]) + label for label in labels) + b"\0"

@@ -1,0 +1,196 @@
+"""Discovery against real parts: network_test.py PROBE NODE_FOLDER, started on two hosts with a
+cable between them. The devices are Avahi's on the other host, and another implementation's here."""
+
+import os
+import pathlib
+import subprocess
+import sys
+import time
+import unittest
+
+HERE = pathlib.Path(__file__).resolve().parent
+sys.path[:0] = [str(HERE), str(HERE.parent.parent / "tools")]
+
+import discovery
+from practice_network.control import PracticeNetwork
+from discovery import INTERFACE, Avahi, Process, Search
+
+PROBE, NODE_FOLDER = (os.path.abspath(argument) for argument in sys.argv[1:3])
+TYPE = "_ipp._tcp"
+
+
+class NetworkTest(unittest.TestCase):
+    def setUp(self):
+        self.network = PracticeNetwork()
+        self.avahi = Avahi()
+
+    def add(self, name, **entries):
+        self.network.add(name, **{"type": TYPE, "activeif": "closed", "maker": "Kestrel",
+                                  "model": "Model 100"} | entries)
+        self.addCleanup(self.network.remove, name)
+
+    def publish(self, name):
+        publisher = subprocess.Popen(["avahi-publish", "-s", name, TYPE, "631"],
+                                     stderr=subprocess.DEVNULL)
+        self.addCleanup(publisher.wait)
+        self.addCleanup(publisher.terminate)
+        return publisher
+
+    def test_names_of_all_kinds_lead_to_their_devices_and_back(self):
+        names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
+                 "x" * 63]
+        for name in names:
+            self.add(name, note=f"at {name}"[:40])
+        with Search(PROBE, TYPE) as search:
+            for name in names:
+                _, _, _, model, _, uri, address = search.wait_for("update", name)
+                self.assertEqual(model, "Kestrel Model 100")
+                if "." in name:  # Not escaped, so such a URI need not lead back.
+                    continue
+                answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True,
+                                        stdout=subprocess.PIPE, check=True).stdout
+                self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+
+    def test_a_device_has_all_its_ipv4_addresses_and_no_other(self):
+        self.add("Three", addresses=3)
+        self.add("Mixed", addresses=["fd00::7", "192.0.2.77"])
+        self.add("Six", addresses=["fd00::8"])
+        with Search(PROBE, TYPE) as search:
+            self.assertEqual(len(search.wait_for("update", "Three")[6].split(",")), 3)
+            self.assertEqual(search.wait_for("update", "Mixed")[6], "192.0.2.77")
+            self.assertEqual(search.wait_for("update", "Six")[6], "")
+
+    def test_devices_come_change_and_go(self):
+        with Search(PROBE, TYPE) as search:
+            self.add("Merlin", note="Attic")
+            self.assertEqual(search.wait_for("update", "Merlin")[4], "Attic")
+            self.network.set("Merlin", note="Cellar")
+            # The record is that of the resolve; who searches anew has the new one.
+            deadline = time.monotonic() + discovery.PATIENCE
+            note = "Attic"
+            while note == "Attic" and time.monotonic() < deadline:
+                with Search(PROBE, TYPE) as again:
+                    note = again.wait_for("update", "Merlin")[4]
+            self.assertEqual(note, "Cellar")
+            self.network.remove("Merlin")
+            search.wait_for("gone", "Merlin")
+            search.wait_for("remove", "Merlin")
+
+    def test_a_second_implementation_is_understood(self):
+        with Search(PROBE, TYPE) as search:
+            with Process("node", HERE / "second_responder.js", INTERFACE, "Harrier (2)", "ipp",
+                         "631", "usb_MFG=Harrier", "usb_MDL=Jet 7", "note=Attic",
+                         cwd=NODE_FOLDER) as responder:
+                responder.wait(lambda lines: "published Harrier (2)" in lines)
+                event = search.wait_for("update", "Harrier (2)")
+                self.assertEqual(event[3:5], ["Harrier Jet 7", "Attic"])
+                self.assertEqual(event[6], "192.0.2.1")
+                responder.tell("usb_MFG=Harrier\tusb_MDL=Jet 8")
+                responder.wait(lambda lines: "updated" in lines)
+                deadline = time.monotonic() + discovery.PATIENCE
+                model = "Harrier Jet 7"
+                while model == "Harrier Jet 7" and time.monotonic() < deadline:
+                    with Search(PROBE, TYPE) as again:
+                        model = again.wait_for("update", "Harrier (2)")[3]
+                self.assertEqual(model, "Harrier Jet 8")
+            search.wait_for("gone", "Harrier (2)")
+            search.wait_for("remove", "Harrier (2)")
+
+    def test_of_two_devices_of_one_name_both_are_found(self):
+        self.avahi.restart(publish_addresses="yes")
+        self.addCleanup(self.avahi.restart)
+        self.add("Osprey")
+        self.network.settle()
+        with Search(PROBE, TYPE) as search:
+            search.wait_for("update", "Osprey")
+            self.publish("Osprey")
+            search.wait_for("update", "Osprey #2")
+
+    def test_a_device_on_two_interfaces_leaves_with_the_second(self):
+        for words in ("link add twin0 type veth peer name twin1",
+                      "address add 198.51.100.1/24 dev twin0", "link set twin1 up",
+                      "link set twin0 up"):
+            subprocess.run(["ip", *words.split()], check=True)
+        self.addCleanup(subprocess.run, ["ip", "link", "delete", "twin0"], check=True)
+        self.avahi.restart(allow_interfaces=f"{INTERFACE},twin0", publish_addresses="yes")
+        self.addCleanup(self.avahi.restart)
+        publisher = self.publish("Twin")
+        with Search(PROBE, TYPE) as search:
+            search.wait_for("found", "Twin", 2)
+            search.wait_for("update", "Twin")
+            subprocess.run(["ip", "link", "set", "twin0", "down"], check=True)
+            search.wait_for("gone", "Twin")
+            updates = len(search.events("update", "Twin"))
+            search.wait_for("update", "Twin", max(updates, 2))
+            self.assertEqual(search.events("remove", "Twin"), [])
+            publisher.terminate()
+            search.wait_for("remove", "Twin")
+
+    def test_two_hundred_devices_at_once(self):
+        names = {f"Flock {number}" for number in range(200)}
+        for name in names:
+            self.network.add(name, type=TYPE, activeif="closed", addresses=["192.0.2.100"])
+            self.addCleanup(self.network.remove, name)
+        with Search(PROBE, TYPE) as search:
+            search.wait(lambda _: names <= {event[2] for event in search.events("update")})
+
+    def test_the_daemon_may_be_absent_and_come_and_go(self):
+        self.avahi.kill()
+        with Search(PROBE, TYPE) as search:
+            time.sleep(1)
+            self.assertEqual(search.events("found"), [])
+            self.avahi.start()
+            search.wait_for("update", "Kestrel")
+            for round_number in (1, 2):
+                self.avahi.kill()
+                search.wait_for("gone", "Kestrel", round_number)
+                search.wait_for("remove", "Kestrel", round_number)
+                self.avahi.start()
+                search.wait_for("found", "Kestrel", round_number + 1)
+                search.wait_for("update", "Kestrel", round_number + 1)
+            self.assertEqual(search.end(), 0)
+
+    def test_the_message_bus_may_come_late(self):
+        late = pathlib.Path("/run/late_bus")
+        self.addCleanup(late.unlink)
+        environment = os.environ | {"DBUS_SYSTEM_BUS_ADDRESS": f"unix:path={late}"}
+        with Search(PROBE, TYPE, env=environment) as search:
+            time.sleep(1)
+            self.assertEqual(search.events("found"), [])
+            late.symlink_to("/run/dbus/system_bus_socket")
+            search.wait_for("update", "Kestrel")
+
+    def test_a_daemon_that_hangs_holds_no_one_up(self):
+        with Search(PROBE, TYPE) as search:
+            search.wait_for("update", "Kestrel")
+            self.avahi.freeze()
+            self.addCleanup(self.avahi.thaw)
+            uri = "dnssd://Kestrel._ipp._tcp.local."
+            started = time.monotonic()
+            self.assertEqual(subprocess.run([PROBE, "addresses", uri, "1"], check=False,
+                                            stdout=subprocess.DEVNULL).returncode, 1)
+            self.assertEqual(search.end(), 0)
+            # Avahi's own calls give up after 25 seconds.
+            self.assertLess(time.monotonic() - started, 20)
+
+    def test_odd_neighbours_disturb_no_one(self):
+        instance = [b"Ghost", *TYPE.encode().split(b"."), b"local"]
+        with Search(PROBE, TYPE) as search:
+            for labels in (instance, [b"Odd", b"_no type", b"tcp", b"local"], [b"\xff\x00\x1b"],
+                           [b"local"], [b"Two", b"Names", *instance[1:]]):
+                discovery.announce_pointer(TYPE, labels)
+            search.wait_for("found", "Ghost")
+            self.add("Merlin")
+            search.wait_for("update", "Merlin")
+            # Long enough for Avahi to give up on the ghost once.
+            time.sleep(8)
+            self.assertEqual(search.events("update", "Ghost"), [])
+            self.assertEqual(search.end(), 0)
+            print(f"a service that never resolves: {search.processor_seconds():.3f} s of processor "
+                  "time in 8 s", file=sys.stderr)
+            self.assertLess(search.processor_seconds(), 1)
+
+
+if __name__ == "__main__":
+    discovery.enclose(HERE / "network.toml")
+    unittest.main(argv=sys.argv[:1] + sys.argv[3:], verbosity=2)

@@ -1,0 +1,146 @@
+// Runs a search or a look-up on the real network and prints what comes of it, one line an event:
+// seconds since the start, what happened, whom it concerns. For tests and benchmarks, which start
+// it on a network of their own. It ends when its standard input does.
+//
+//   bonjour_probe search TYPE       a KSBonjourSearch for TYPE
+//   bonjour_probe addresses URI SECONDS
+//   bonjour_probe resolve NAME TYPE resolves for ever, without a browse
+
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <cstdio>
+#include <string>
+#include <thread>
+
+#include "bonjour/KSBonjourSearch.h"
+#include "bonjour/KSDevice.h"
+#include "bonjour/KSNetService.h"
+#include "platform/run_loop.h"
+#include "tests/bonjour/medium_stub.h"
+#include "tests/recording/front_end.h"
+
+namespace onramp {
+
+namespace {
+
+using Clock = std::chrono::steady_clock;
+
+const Clock::time_point start = Clock::now();
+
+void print(const char* what, const std::string& details) {
+  const std::chrono::duration<double> since = Clock::now() - start;
+  std::printf("%.6f\t%s\t%s\n", since.count(), what, details.c_str());
+  std::fflush(stdout);
+}
+
+std::string joined(const Array* texts) {
+  std::string all;
+  for (const Value& text : *texts)
+    all += (all.empty() ? "" : ",") + *text.as<std::string>();
+  return all;
+}
+
+std::string describe(const Dictionary& device) {
+  std::string text;
+  for (const auto key :
+       {KSDevice::kDisplayName, KSDevice::kModelName, KSDevice::kLocation, KSDevice::kDeviceURI}) {
+    text += device.string(key).value_or("?") + '\t';
+  }
+  return text + joined(device.array(KSDevice::kIPAddressList));
+}
+
+class Printer final : public KSDeviceObserver {
+ public:
+  void addKSDevice(const Dictionary& device) override { print("add", describe(device)); }
+  void updateKSDevice(const Dictionary& device) override { print("update", describe(device)); }
+  void removeKSDevice(const Dictionary& device) override { print("remove", describe(device)); }
+};
+
+void printNotifications() {
+  static const int observer = 0;
+  for (const auto& [name, word] :
+       {std::pair{kAddNotification, "found"}, std::pair{kRemoveNotification, "gone"}}) {
+    NotificationCenter::defaultCenter().addObserver(&observer, name, [word = word](const auto& n) {
+      const auto service = std::any_cast<NetServiceRef>(n.userInfo.find(kServiceInfo)->second);
+      print(word, service->name().value_or("?"));
+    });
+  }
+}
+
+void runUntilInputEnds() {
+  bool ended = false;
+  std::thread waiter([&ended] {
+    char byte = 0;
+    while (read(STDIN_FILENO, &byte, 1) > 0) {
+    }
+    performOnMainThread([&ended] { ended = true; });
+  });
+  recording::FrontEnd::instance().pumpUntil([&ended] { return ended; }, 3600);
+  waiter.join();
+
+  rusage usage{};
+  getrusage(RUSAGE_SELF, &usage);
+  const auto seconds = [](const timeval& time) {
+    return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
+  };
+  print("cpu", std::to_string(seconds(usage.ru_utime) + seconds(usage.ru_stime)));
+}
+
+int search(const std::string& type) {
+  testing_medium::medium().browsedType = type;
+  const auto printer = std::make_shared<Printer>();
+  const auto bonjour = KSBonjourSearch::init();
+  bonjour->addKSDeviceObserver(printer);
+  printNotifications();
+  print("start", type);
+  bonjour->startBrowsing();
+  runUntilInputEnds();
+  bonjour->stopBrowsing();
+  return 0;
+}
+
+int addresses(const std::string& uri, double timeout) {
+  std::optional<std::vector<std::string>> list;
+  const int status = KSNetServiceCopyAddressesForDeviceURI(uri, &list, timeout);
+  std::string all;
+  for (const std::string& address : list.value_or(std::vector<std::string>()))
+    all += (all.empty() ? "" : ",") + address;
+  print(status == 0 ? "addresses" : "failed", all);
+  return status;
+}
+
+int resolve(const std::string& name, const std::string& type) {
+  ServiceClientCallbacks callbacks;
+  callbacks.resolved = [](const NetServiceRef& s) {
+    print("resolved", describe(KSDevice::initWithService(s, {})));
+  };
+  const auto service = NetService::create("local.", type, name, 0);
+  print("start", name);
+  KSNetServiceResolveAsync(service, &callbacks);
+  runUntilInputEnds();
+  KSNetServiceCancelResolve(service);
+  return 0;
+}
+
+int run(const std::vector<std::string>& arguments) {
+  if (arguments.size() == 2 && arguments[0] == "search") return search(arguments[1]);
+  if (arguments.size() == 3 && arguments[0] == "addresses") {
+    return addresses(arguments[1], std::stod(arguments[2]));
+  }
+  if (arguments.size() == 3 && arguments[0] == "resolve") {
+    return resolve(arguments[1], arguments[2]);
+  }
+  std::fputs("usage: bonjour_probe search TYPE | addresses URI SECONDS | resolve NAME TYPE\n",
+             stderr);
+  return 2;
+}
+
+}  // namespace
+
+}  // namespace onramp
+
+int main(int count, char** arguments) {
+  return onramp::run({arguments + 1, arguments + count});
+}

@@ -1,0 +1,137 @@
+#include <gmock/gmock.h>
+
+#include "bonjour/KSBonjourSearch.h"
+#include "bonjour/KSDevice.h"
+#include "tests/bonjour/medium_stub.h"
+#include "tests/recording/network.h"
+
+namespace onramp {
+
+namespace {
+
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+using namespace recording;
+
+class Recorder final : public KSDeviceObserver {
+ public:
+  void addKSDevice(const Dictionary& device) override { note("add", device); }
+  void updateKSDevice(const Dictionary& device) override { note("update", device); }
+  void removeKSDevice(const Dictionary& device) override { note("remove", device); }
+
+  std::vector<std::string> events;
+  Dictionary last;
+
+ private:
+  void note(const char* what, const Dictionary& device) {
+    events.push_back(what + (' ' + device.string(KSDevice::kDisplayName).value_or("?")));
+    last = device;
+  }
+};
+
+class SearchTest : public ::testing::Test {
+ protected:
+  SearchTest() {
+    network.reset();
+    testing_medium::medium() = {};
+    search->addKSDeviceObserver(recorder);
+    search->startBrowsing();
+  }
+  ~SearchTest() override { search->stopBrowsing(); }
+
+  Network& network = Network::instance();
+  std::shared_ptr<KSBonjourSearch> search = KSBonjourSearch::init();
+  std::shared_ptr<Recorder> recorder = std::make_shared<Recorder>();
+  NetServiceRef onOne = Network::service("Kestrel", "_ipp._tcp.");
+  NetServiceRef onTwo = Network::service("Kestrel", "_ipp._tcp.");
+};
+
+TEST_F(SearchTest, ADeviceIsReportedOnceItIsResolved) {
+  network.found(onOne);
+  EXPECT_THAT(recorder->events, IsEmpty());
+  network.resolves(onOne, {ipv4Address(192, 0, 2, 7)},
+                   txtData({"usb_MFG=Kestrel", "usb_MDL=Model 100", "note=Lobby"}));
+  EXPECT_THAT(recorder->events, ElementsAre("update Kestrel"));
+  EXPECT_EQ(recorder->last, (Dictionary{{"display name", "Kestrel"},
+                                        {"model name", "Kestrel Model 100"},
+                                        {"bonjour service type", Array{"_ipp._tcp."}},
+                                        {"USB_MFG", "Kestrel"},
+                                        {"USB_MDL", "Model 100"},
+                                        {"location", "Lobby"},
+                                        {"device URI", "dnssd://Kestrel._ipp._tcp.local."},
+                                        {"IP address list", Array{"192.0.2.7"}}}));
+}
+
+TEST_F(SearchTest, ADeviceLeavesWithItsLastInterface) {
+  network.found(onOne);
+  network.found(onTwo);
+  network.resolves(onTwo, {});
+  network.gone(onOne);
+  network.gone(onTwo);
+  network.gone(onTwo);
+  EXPECT_THAT(recorder->events, ElementsAre("update Kestrel", "update Kestrel", "remove Kestrel"));
+  EXPECT_EQ(*recorder->last.array(KSDevice::kBonjourServiceType), Array());
+}
+
+TEST_F(SearchTest, AResolutionThatNoBrowserHoldsIsAnAddition) {
+  search->resolvedBonjourService(Network::service("Kestrel", "_scanner._tcp."));
+  search->resolvedBonjourService(nullptr);
+  EXPECT_THAT(recorder->events, ElementsAre("add Kestrel"));
+}
+
+TEST_F(SearchTest, StoppedBrowsersStayAndAnswerNothing) {
+  network.found(onOne);
+  EXPECT_EQ(search->supportTypes("Kestrel", "local."), Array{"_ipp._tcp."});
+  EXPECT_EQ(search->supportTypes(std::nullopt, "local."), Array());
+  search->stopBrowsing();
+  EXPECT_EQ(search->supportTypes("Kestrel", "local."), Array());
+
+  testing_medium::medium().browsedType = "_pdl-datastream._tcp.";
+  search->startBrowsing();
+  const NetServiceRef raw = Network::service("Kestrel", "_pdl-datastream._tcp.");
+  network.found(raw);
+  network.resolves(raw, {});
+  EXPECT_THAT(recorder->events, ElementsAre("update Kestrel"));
+  EXPECT_EQ(*recorder->last.array(KSDevice::kBonjourServiceType), Array{"_pdl-datastream._tcp."});
+}
+
+TEST_F(SearchTest, AnObserverMayDropTheSearchFromWithin) {
+  class Dropper final : public KSDeviceObserver {
+   public:
+    explicit Dropper(std::shared_ptr<KSBonjourSearch>& held) : search(held) {}
+    void addKSDevice(const Dictionary&) override {}
+    void updateKSDevice(const Dictionary&) override {
+      search->stopBrowsing();
+      search = KSBonjourSearch::init();
+    }
+    void removeKSDevice(const Dictionary&) override {}
+    std::shared_ptr<KSBonjourSearch>& search;
+  };
+  const std::weak_ptr<KSBonjourSearch> first = search;
+  search->addKSDeviceObserver(std::make_shared<Dropper>(search));
+  network.found(onOne);
+  network.resolves(onOne, {});
+  EXPECT_TRUE(first.expired());
+  EXPECT_THAT(network.browsers, IsEmpty());
+}
+
+TEST(Device, UnknownTextsAreEmptyAndNeverAbsent) {
+  const Dictionary none = KSDevice::initWithService(nullptr, std::nullopt);
+  EXPECT_EQ(none.size(), 8u);
+  EXPECT_EQ(none.string(KSDevice::kModelName), " ");
+  EXPECT_EQ(none.string(KSDevice::kDeviceURI), "");
+  EXPECT_EQ(*none.array(KSDevice::kIPAddressList), Array());
+
+  const NetServiceRef service = Network::service("Kestrel", "_ipp._tcp.");
+  Network::fill(service, {ipv6Address()}, txtData({"usb_MFG=Kestrel", "mdl=Model 100"}));
+  const Dictionary device = KSDevice::initWithService(service, Array{"_ipp._tcp."});
+  EXPECT_EQ(device.size(), 8u);
+  EXPECT_EQ(device.string(KSDevice::kModelName), "");
+  EXPECT_EQ(device.string(KSDevice::kUSBManufacturer), "Kestrel");
+  EXPECT_EQ(device.string(KSDevice::kUSBModel), "");
+  EXPECT_EQ(*device.array(KSDevice::kIPAddressList), Array());
+}
+
+}  // namespace
+
+}  // namespace onramp

@@ -1,0 +1,61 @@
+#include "bonjour/txt_record.h"
+
+#include <gtest/gtest.h>
+
+#include "bonjour/utf8.h"
+#include "tests/recording/network.h"
+
+namespace onramp {
+
+namespace {
+
+using recording::txtData;
+
+TEST(TxtRecord, ReadsAttributesAsTheyAreOnTheWire) {
+  const auto record = TxtRecord::parse(
+      txtData({"txtvers=1", "", "flag", "empty=", "=keyless", "Model=A=B", "model=second",
+               std::string("raw=\0\xff", 6), "long=" + std::string(250, 'x')}));
+  ASSERT_TRUE(record);
+  EXPECT_EQ(record->value("txtvers"), "1");
+  EXPECT_EQ(record->value("flag"), std::nullopt);
+  EXPECT_EQ(record->value("empty"), "");
+  EXPECT_EQ(record->value(""), std::nullopt);
+  EXPECT_EQ(record->value("MODEL"), "A=B");
+  EXPECT_EQ(record->value("raw"), std::string("\0\xff", 2));
+  EXPECT_EQ(record->value("long"), std::string(250, 'x'));
+  EXPECT_EQ(record->value("absent"), std::nullopt);
+}
+
+TEST(TxtRecord, ReadsRecordsOfThePermittedSize) {
+  std::vector<std::string> strings;
+  for (int i = 0; i < 34; ++i)
+    strings.push_back("key" + std::to_string(i) + '=' + std::string(255, 'v').substr(0, 240));
+  strings.emplace_back("last=" + std::string(250, 'z'));
+  const Data data = txtData(strings);
+  ASSERT_GT(data.size(), 8500u);
+  EXPECT_EQ(TxtRecord::parse(data)->value("last"), std::string(250, 'z'));
+}
+
+TEST(TxtRecord, DataThatEndsWithinAStringIsNone) {
+  const Data whole = txtData({"a=1", "b=22"});
+  for (std::size_t size = 0; size <= whole.size(); ++size) {
+    const bool betweenStrings = size == 0 || size == 4 || size == whole.size();
+    EXPECT_EQ(TxtRecord::parse(std::span(whole).first(size)).has_value(), betweenStrings) << size;
+  }
+}
+
+TEST(Utf8, TellsWellFormedTextFromOtherBytes) {
+  for (const char* text : {"", "plain", "\x7f", "\u0080\u07ff", "\u0800\ud7ff\ue000\uffff",
+                           "\U00010000\U0010ffff", "\ufeffmark"}) {
+    EXPECT_TRUE(isUtf8(text)) << text;
+  }
+  for (const char* text :
+       {"\x80", "\xc1\xbf", "\xc3", "\xc3(", "\xe0\x9f\xbf", "\xed\xa0\x80", "\xe2\x82",
+        "\xe2\x82(", "\xf0\x8f\xbf\xbf", "\xf4\x90\x80\x80", "\xf5\x80\x80\x80", "\xff"}) {
+    EXPECT_FALSE(isUtf8(text)) << text;
+  }
+}
+
+}  // namespace
+
+}  // namespace onramp
