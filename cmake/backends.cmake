@@ -2,6 +2,10 @@
 
 if(APPLE)
   set(ONRAMP_UI cocoa)
+  enable_language(OBJCXX)
+  set(CMAKE_OBJCXX_STANDARD 20)
+  set(CMAKE_OBJCXX_STANDARD_REQUIRED ON)
+  set(CMAKE_OBJCXX_EXTENSIONS OFF)
   set(ONRAMP_BACKENDS onramp_cocoa onramp_cfnetwork onramp_coreservices onramp_systemconfiguration onramp_posix)
 else()
   set(ONRAMP_UI qt CACHE STRING "The front end: qt, or cocoa to try the one of macOS on GNUstep")

@@ -20,6 +20,7 @@ class GNUstepPerson(Person):
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
+        self._menu_is_held = False
         folder = pathlib.Path(desktop.env["HOME"])
         self._seen = folder / "accessibility.json"
         self._seen.unlink(missing_ok=True)
@@ -43,10 +44,15 @@ class GNUstepPerson(Person):
             return control if self.has_state(control, "enabled") else None
 
         control = wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} enabled")
-        # A button that is let go of in the moment of its pressing is seen let go of first.
         self.desktop.run(["xdotool", "mousemove", str(control["x"] + control["width"] // 2),
-                          str(control["y"] + control["height"] // 2),
-                          "sleep", "0.05", "mousedown", "1", "sleep", "0.1", "mouseup", "1"])
+                          str(control["y"] + control["height"] // 2), "sleep", "0.05"])
+        if not self._menu_is_held:
+            self.desktop.run(["xdotool", "mousedown", "1"])
+        # The menu of a button is open for as long as the button is held.
+        self._menu_is_held = role == "button menu"
+        if not self._menu_is_held:
+            # What is let go of in the moment of its pressing, GNUstep may see let go of first.
+            self.desktop.run(["xdotool", "sleep", "0.1", "mouseup", "1"])
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
         super().see(role, name, seconds)
