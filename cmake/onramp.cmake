@@ -46,6 +46,17 @@ function(onramp_test name)
   set_tests_properties(${name} PROPERTIES TIMEOUT 300)
 endfunction()
 
+# onramp_namespace_test(NAME …): as onramp_test, but as root of a network namespace of its own; skipped
+# where there can be none. What ctest runs a test through, CMake calls an emulator.
+function(onramp_namespace_test name)
+  onramp_test(${name} ${ARGN})
+  if(TARGET ${name})
+    set_target_properties(${name} PROPERTIES
+      CROSSCOMPILING_EMULATOR ${PROJECT_SOURCE_DIR}/tests/in_namespace)
+    set_tests_properties(${name} PROPERTIES SKIP_RETURN_CODE 77)
+  endif()
+endfunction()
+
 # onramp_fuzz(NAME SOURCES… [LINK libraries…]): a libFuzzer program. ctest gives it a short run that
 # starts from the folder corpus/NAME beside its source; finds go to the build folder.
 function(onramp_fuzz name)

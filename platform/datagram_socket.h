@@ -38,6 +38,10 @@ class DatagramSocket {
   /// Lets sendTo reach broadcast addresses. False when the system refuses.
   [[nodiscard]] bool permitBroadcast();
 
+  /// Asks for room for `bytes` of datagrams that have come in and wait to be received, the system's
+  /// own record of each included. The system may give less.
+  void setReceiveBufferSize(std::size_t bytes);
+
   /// Whether the socket became ready within `timeout`.
   [[nodiscard]] bool waitWritable(std::chrono::nanoseconds timeout) const;
   [[nodiscard]] bool waitReadable(std::chrono::nanoseconds timeout) const;

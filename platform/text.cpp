@@ -20,6 +20,10 @@ unsigned char byteAt(std::string_view bytes, std::size_t index) {
   return static_cast<unsigned char>(bytes[index]);
 }
 
+bool isASCII(char c) {
+  return static_cast<unsigned char>(c) < 0x80;
+}
+
 std::optional<std::string> fromUTF16(std::string_view bytes, bool bigEndian) {
   if (bytes.size() % 2 != 0) return std::nullopt;
   const auto unitAt = [&](std::size_t index) {
@@ -44,10 +48,13 @@ std::optional<std::string> fromUTF16(std::string_view bytes, bool bigEndian) {
 
 std::optional<std::string> fromUTF8(std::string_view bytes) {
   if (bytes.starts_with(kUTF8Mark)) bytes.remove_prefix(kUTF8Mark.size());
-  for (std::string_view rest = bytes; !rest.empty();) {
+  std::string_view rest = bytes;
+  for (;;) {
+    const auto* const end = std::find_if_not(rest.begin(), rest.end(), isASCII);
+    rest.remove_prefix(static_cast<std::size_t>(end - rest.begin()));
+    if (rest.empty()) return std::string(bytes);
     if (!takeUTF8(rest)) return std::nullopt;
   }
-  return std::string(bytes);
 }
 
 }  // namespace

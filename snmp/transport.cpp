@@ -41,6 +41,10 @@ std::optional<std::string> snmp_normalize_ipv4(const char* text) {
   }
 }
 
+DatagramEndpoint snmp_agent_at(const std::string& address) {
+  return {parseIPv4(address).value_or(kAllOnes), kSnmpPort};
+}
+
 void snmp_send(DatagramSocket& socket, const DatagramEndpoint& destination,
                std::span<const std::uint8_t> request) {
   if (socket.waitWritable(kSendWait)) socket.sendTo(destination, request);
@@ -70,7 +74,7 @@ snmp_status snmp_exchange(snmp_message& message, const char* address, std::uint3
   if (mode != kModeNoNetwork) {
     auto socket = DatagramSocket::open();
     if (!socket) return SNMP_ERR_TRANSPORT;
-    const DatagramEndpoint agent{parseIPv4(address ? address : "").value_or(kAllOnes), kSnmpPort};
+    const DatagramEndpoint agent = snmp_agent_at(address ? address : "");
     snmp_send(*socket, agent, std::span(request).first(length));
     if (const auto datagram = snmp_receive(*socket, &agent, reply)) received = datagram->length;
   }

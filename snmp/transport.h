@@ -38,6 +38,9 @@ extern std::int64_t snmp_request_counter_ext;
 /// empty text, or when the numbers take more than the 31 characters of an address's storage.
 [[nodiscard]] std::optional<std::string> snmp_normalize_ipv4(const char* text);
 
+/// Port 161 of `address`, dotted IPv4 text. Other text stands for the address 255.255.255.255.
+[[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
+
 /// Sends `request` as soon as `socket` takes it; sends nothing when it does not within 2 seconds.
 void snmp_send(DatagramSocket& socket, const DatagramEndpoint& destination,
                std::span<const std::uint8_t> request);

@@ -118,7 +118,7 @@ class Walk {
       case kASCII:
         return measureBytes(count(low, object), 1, object, cost);
       case kUTF16:
-        return measureBytes(count(low, object), 2, object, cost);
+        return measureUTF16(count(low, object), object, cost);
       case kArray:
       case kSet:
         return measureItems(count(low, object), object, cost, depth);
@@ -142,6 +142,16 @@ class Walk {
     if (units > kMostBytes) return false;
     cost.bytes = units * unitSize;
     return object.take(cost.bytes).has_value();
+  }
+
+  // libplist ends the process at a key with a null character in it.
+  static bool measureUTF16(std::uint64_t units, Cursor& object, Cost& cost) {
+    Cursor text = object;
+    if (!measureBytes(units, 2, object, cost)) return false;
+    for (std::uint64_t i = 0; i < units; ++i) {
+      if (text.number(2) == 0U) return false;
+    }
+    return true;
   }
 
   bool measureItems(std::uint64_t items, Cursor& object, Cost& cost, std::size_t depth) {

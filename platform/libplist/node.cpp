@@ -5,7 +5,6 @@
 #include <cmath>
 #include <cstdint>
 #include <cstdlib>
-#include <cstring>
 #include <string>
 #include <string_view>
 
@@ -18,7 +17,8 @@ namespace {
 
 struct Free {
   // libplist hands out memory of malloc.
-  void operator()(void* memory) const { std::free(memory); }  // NOLINT(cppcoreguidelines-no-malloc)
+  // NOLINTNEXTLINE(cppcoreguidelines-no-malloc,cppcoreguidelines-owning-memory)
+  void operator()(void* memory) const { std::free(memory); }
 };
 
 template <typename T>
@@ -74,10 +74,8 @@ Value dateOf(plist_t node) {
 
 Value dataOf(plist_t node) {
   std::uint64_t size = 0;
-  const char* const bytes = plist_get_data_ptr(node, &size);
-  Data data(bytes ? static_cast<std::size_t>(size) : 0);
-  if (!data.empty()) std::memcpy(data.data(), bytes, data.size());
-  return data;
+  const auto* const bytes = reinterpret_cast<const std::byte*>(plist_get_data_ptr(node, &size));
+  return bytes ? Data(bytes, bytes + size) : Data();
 }
 
 Value stringOf(plist_t node) {

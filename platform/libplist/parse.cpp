@@ -63,7 +63,8 @@ std::optional<Value> parsePropertyList(std::string bytes) {
   } else {
     std::optional<std::string> text = decodedText(bytes);
     if (!text || !mayReadXML(*text)) return std::nullopt;
-    plist_from_xml(text->c_str(), static_cast<std::uint32_t>(text->size()), &root);
+    const std::string& xml = *text;
+    plist_from_xml(xml.c_str(), static_cast<std::uint32_t>(xml.size()), &root);
   }
   const Node node(root);
   return node ? std::optional(valueOf(node.get())) : std::nullopt;

@@ -37,12 +37,11 @@ class Walk {
 
   bool markupHere() {
     const std::string_view here = std::string_view(text_).substr(at_);
+    if (here.starts_with("<?")) return skipPast("?>", 1) && quotesArePaired();
+    if (!here.starts_with("<!")) return skipPast(">", 1) && quotesArePaired("<") && tag();
     if (here.starts_with("<!--")) return skipPast("-->", 4);
     if (here.starts_with("<![CDATA[")) return skipPast("]]>", 9);
-    if (here.starts_with("<?")) return skipPast("?>", 1) && quotesArePaired();
-    if (here.starts_with("<!DOCTYPE")) return skipPast(">", 9) && quotesArePaired("[");
-    if (here.starts_with("<!")) return false;
-    return skipPast(">", 1) && quotesArePaired("<") && tag();
+    return here.starts_with("<!DOCTYPE") && skipPast(">", 9) && quotesArePaired("[");
   }
 
   // Past the next `end`, from `from` characters on; the markup skipped is then `skipped_`.

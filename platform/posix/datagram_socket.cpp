@@ -62,6 +62,11 @@ bool DatagramSocket::permitBroadcast() {
   return ::setsockopt(descriptor_, SOL_SOCKET, SO_BROADCAST, &on, sizeof on) == 0;
 }
 
+void DatagramSocket::setReceiveBufferSize(std::size_t bytes) {
+  const int size = static_cast<int>(bytes);
+  ::setsockopt(descriptor_, SOL_SOCKET, SO_RCVBUF, &size, sizeof size);
+}
+
 bool DatagramSocket::waitWritable(std::chrono::nanoseconds timeout) const {
   return waitFor(descriptor_, POLLOUT, timeout);
 }

@@ -15,8 +15,8 @@ namespace onramp {
 /// The wizard on a medium of the test's own, seen and used as a person does.
 class Wizard : public testing::Test {
  protected:
-  Wizard() { screen.reset(); }
-  ~Wizard() override { screen.reset(); }
+  void SetUp() override { screen.reset(); }
+  void TearDown() override { screen.reset(); }
 
   /// A medium with a package and the two models "All" (USB, wired, wireless) and "Cable" (USB
   /// only).

@@ -4,14 +4,17 @@
 
 #include "platform/libplist/parse.h"
 
-// What was read comes back the same from what is written.
+// What was written once is read, and written again, as it stands. (The first writing replaces what
+// XML cannot hold.)
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
   using namespace onramp;
   const auto value =
       libplist::parsePropertyList(std::string(reinterpret_cast<const char*>(bytes), size));
   const auto* const dictionary = value ? value->as<Dictionary>() : nullptr;
   if (!dictionary) return 0;
-  const std::string xml = libplist::formatPropertyList(*dictionary);
+  const auto written = libplist::parsePropertyList(libplist::formatPropertyList(*dictionary));
+  if (!written) std::abort();
+  const std::string xml = libplist::formatPropertyList(*written->as<Dictionary>());
   const auto again = libplist::parsePropertyList(xml);
   if (!again || libplist::formatPropertyList(*again->as<Dictionary>()) != xml) std::abort();
   return 0;

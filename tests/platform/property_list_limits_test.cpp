@@ -145,6 +145,7 @@ TEST(Limits, EveryObjectOfABinaryListHasToBeWhole) {
       {"an integer of 32 bytes", "\x15" + std::string(32, '\1')},
       {"a text past the objects", "\x5F\x12" + bigEndian(1000, 4) + "short"},
       {"a text of 2^64-1 units", "\x6F\x13" + std::string(8, '\xFF')},
+      {"a text with a null character", std::string("\x62\0a\0\0", 5)},
       {"a size that is no integer", "\x5F\x51t"},
       {"data without its size", "\x4F"},
       {"an array past the objects", "\xA9"},

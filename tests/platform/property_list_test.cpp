@@ -139,7 +139,7 @@ TEST(PropertyList, AnswersNothingForEverythingElse) {
                                "<html><body/></html>",
                                whole.substr(0, whole.size() - 12),
                                plist("<key>k</key>\xFF"),
-                               plist(std::string("<key>k</key><string>\0</string>", 31)),
+                               plist(std::string("<key>k</key><string>\0</string>", 30)),
                                plist("<key>k</key><string>&unknown;</string>"),
                                "bplist00",
                                "bplist00" + std::string(40, '\xFF')};

@@ -1,0 +1,63 @@
+// One whole query, from the request to the result, beside the bare exchange of the same bytes with
+// the same agent, in turns.
+
+#include <array>
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+
+#include "bench/snmp/median.h"
+#include "bench/snmp/posix/bare_exchange.h"
+#include "snmp/codec.h"
+#include "snmp/query.h"
+
+namespace {
+
+constexpr int kQueries = 2000;
+constexpr int kWarmUp = 100;
+
+[[noreturn]] void giveUp(const char* what) {
+  std::fprintf(stderr, "snmp_query_bench: %s; run it as agents.py's command\n", what);
+  std::exit(1);
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  const std::string address = argc > 1 ? argv[1] : "127.0.1.1";
+  const auto agent = onramp::parseIPv4(address);
+  onramp::snmp_table_request request(onramp::active_interface_table);
+  onramp::snmp_packet packet{};
+  std::uint16_t length = 0;
+  if (!agent || onramp::snmp_encode_message(request.message(), packet, length)) {
+    giveUp("the argument is no IPv4 address");
+  }
+
+  Samples query;
+  Samples bare;
+  for (int i = -kWarmUp; i < kQueries; ++i) {
+    if (i == 0) query = bare = {};
+    query.measure(1, [&] {
+      bool noReply = false;
+      if (!onramp::snmp_query_table(&onramp::active_interface_table, address.c_str(), noReply,
+                                    nullptr, nullptr)) {
+        giveUp("the agent does not answer the query");
+      }
+    });
+    bare.measure(1, [&] {
+      onramp::snmp_packet reply;
+      if (bareExchange(agent->bits, onramp::kSnmpPort, std::span(packet).first(length), reply) ==
+          0) {
+        giveUp("the agent does not answer the bare request");
+      }
+    });
+  }
+  const auto microseconds = [](double nanoseconds) { return nanoseconds / 1000; };
+  std::printf("Medians of %d on loopback [5 %%, 95 %%]\n", kQueries);
+  std::printf("query  %.1f us [%.1f, %.1f]   bare exchange  %.1f us [%.1f, %.1f]   %.3f times\n",
+              microseconds(query.median()), microseconds(query.quantile(0.05)),
+              microseconds(query.quantile(0.95)), microseconds(bare.median()),
+              microseconds(bare.quantile(0.05)), microseconds(bare.quantile(0.95)),
+              query.median() / bare.median());
+  return 0;
+}

@@ -1,0 +1,68 @@
+#include "platform/netlink/change_watch.h"
+
+#include <linux/rtnetlink.h>
+#include <poll.h>
+#include <sys/eventfd.h>
+#include <sys/socket.h>
+
+#include <array>
+#include <cerrno>
+#include <cstdint>
+#include <utility>
+
+namespace onramp::netlink {
+
+namespace {
+
+// Takes all waiting messages off the socket. Changes that did not fit its buffer any more
+// (ENOBUFS) are changes too. False when the socket has come to its end.
+bool drain(int socket) {
+  for (;;) {
+    std::uint8_t byte = 0;
+    if (::recv(socket, &byte, sizeof byte, MSG_DONTWAIT) >= 0) continue;
+    if (errno == EAGAIN) return true;
+    if (errno != ENOBUFS && errno != EINTR) return false;
+  }
+}
+
+}  // namespace
+
+ChangeWatch::ChangeWatch(Socket socket)
+    : socket_(std::move(socket)), stop_(::eventfd(0, EFD_CLOEXEC)) {}
+
+std::unique_ptr<ChangeWatch> ChangeWatch::create(bool withRoutes) {
+  Socket socket = openRouteSocket();
+  if (!socket) return nullptr;
+  if (nl_socket_add_memberships(socket.get(), RTNLGRP_LINK, RTNLGRP_IPV4_IFADDR,
+                                withRoutes ? RTNLGRP_IPV4_ROUTE : RTNLGRP_NONE, RTNLGRP_NONE) < 0) {
+    return nullptr;
+  }
+  std::unique_ptr<ChangeWatch> watch(new ChangeWatch(std::move(socket)));
+  return watch->stop_.number() < 0 ? nullptr : std::move(watch);
+}
+
+ChangeWatch::~ChangeWatch() {
+  if (!thread_.joinable()) return;
+  ::eventfd_write(stop_.number(), 1);
+  thread_.join();
+}
+
+void ChangeWatch::start(std::function<void()> changed) {
+  thread_ = std::thread([this, changed = std::move(changed)] { run(changed); });
+}
+
+void ChangeWatch::run(const std::function<void()>& changed) const {
+  const int socket = nl_socket_get_fd(socket_.get());
+  std::array<pollfd, 2> waited{{{.fd = socket, .events = POLLIN, .revents = 0},
+                                {.fd = stop_.number(), .events = POLLIN, .revents = 0}}};
+  for (;;) {
+    if (::poll(waited.data(), waited.size(), -1) < 0) {
+      if (errno == EINTR) continue;
+      return;
+    }
+    if (waited[1].revents != 0 || !drain(socket)) return;
+    changed();
+  }
+}
+
+}  // namespace onramp::netlink

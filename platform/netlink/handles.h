@@ -1,0 +1,42 @@
+#pragma once
+
+#include <netlink/object.h>
+#include <netlink/socket.h>
+#include <unistd.h>
+
+#include <memory>
+
+namespace onramp::netlink {
+
+template <auto release>
+struct Release {
+  template <typename Handle>
+  void operator()(Handle* handle) const {
+    release(handle);
+  }
+};
+
+using Socket = std::unique_ptr<nl_sock, Release<nl_socket_free>>;
+using Object = std::unique_ptr<nl_object, Release<nl_object_put>>;
+
+/// Owns a file descriptor.
+class Descriptor {
+ public:
+  explicit Descriptor(int number) : number_(number) {}
+  Descriptor(const Descriptor&) = delete;
+  Descriptor& operator=(const Descriptor&) = delete;
+  ~Descriptor() {
+    if (number_ >= 0) ::close(number_);
+  }
+
+  /// Negative when there is none.
+  [[nodiscard]] int number() const { return number_; }
+
+ private:
+  int number_;
+};
+
+/// A new socket that speaks to the kernel's routing subsystem; null on failure.
+[[nodiscard]] Socket openRouteSocket();
+
+}  // namespace onramp::netlink

@@ -1,0 +1,266 @@
+// Runs as root of a network namespace of its own: see in_namespace.
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <fstream>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "netconfig/current_interface.h"
+#include "netconfig/local_address_cache.h"
+#include "netconfig/local_address_list.h"
+#include "platform/dynamic_store.h"
+#include "tests/recording/loop.h"
+
+namespace onramp {
+namespace {
+
+using ::testing::UnorderedElementsAreArray;
+
+constexpr double kMostSeconds = 20;
+
+void ip(const std::string& arguments) {
+  ASSERT_EQ(std::system(("ip " + arguments).c_str()), 0) << arguments;
+}
+
+std::vector<std::string> split(const std::string& line, char separator) {
+  std::vector<std::string> pieces(1);
+  for (const char c : line) {
+    if (c == separator) {
+      pieces.emplace_back();
+    } else {
+      pieces.back() += c;
+    }
+  }
+  return pieces;
+}
+
+// The configuration by iproute2.
+struct Configuration {
+  struct Interface {
+    std::string name;
+    std::string firstAddress;
+    std::string entry;
+  };
+
+  std::vector<Interface> interfaces;
+  std::string primary;
+
+  static Configuration read() {
+    const std::string path = ::testing::TempDir() + "onramp-configuration-by-ip";
+    EXPECT_EQ(std::system(("python3 " CONFIGURATION_BY_IP " > " + path).c_str()), 0);
+    std::ifstream file(path);
+    Configuration configuration;
+    for (std::string line; std::getline(file, line);) {
+      const std::vector<std::string> fields = split(line, '|');
+      if (fields[0] == "primary") {
+        configuration.primary = fields[1];
+      } else {
+        configuration.interfaces.push_back(
+            {fields[0], split(fields[1], ',')[0], fields[1] + "|" + fields[2] + "|" + fields[3]});
+      }
+    }
+    return configuration;
+  }
+
+  [[nodiscard]] std::vector<std::string> entries() const {
+    std::vector<std::string> texts;
+    for (const Interface& interface : interfaces)
+      texts.push_back(interface.entry);
+    return texts;
+  }
+};
+
+std::vector<std::string> entriesOf(const local_address_list& list) {
+  std::vector<std::string> texts;
+  for (const Value& value : list ? *list : Array{}) {
+    std::string text;
+    for (const char* key : {"Addresses", "SubnetMasks", "BroadcastAddresses"}) {
+      const Array* array = value.as<Dictionary>()->array(key);
+      for (std::size_t i = 0; array && i < array->size(); ++i) {
+        text += (i ? "," : "") + *(*array)[i].as<std::string>();
+      }
+      if (key != std::string_view("BroadcastAddresses")) text += "|";
+    }
+    texts.push_back(text);
+  }
+  return texts;
+}
+
+class Kernel : public ::testing::Test {
+ protected:
+  // Two pairs of interfaces whose ends are all here, up but for the first pair's far end.
+  void SetUp() override {
+    recording::resetLoop();
+    ip("link set lo up");
+    ip("link add near type veth peer name far");
+    ip("link add left type veth peer name right");
+    for (const char* name : {"near", "far", "left", "right"}) {
+      ip(std::string("link set up ") + name);
+    }
+  }
+
+  void TearDown() override {
+    ip("link del far");
+    ip("link del right");
+    ip("route flush table all");
+    ip("link set lo down");
+  }
+};
+
+struct Scenario {
+  const char* name;
+  std::vector<const char*> commands;
+  std::size_t interfaces;  // so that an expectation that comes out empty is noticed
+  const char* primary;
+};
+
+const Scenario kScenarios[] = {
+    {"no interface", {"link set lo down"}, 0, ""},
+    {"only the loopback interface", {}, 1, ""},
+    {"several interfaces and addresses",
+     {"addr add 192.0.2.1/24 brd + dev near", "addr add 192.0.2.7/24 brd + dev near",
+      "addr add 198.51.100.1/25 dev near", "addr add 10.0.0.1/8 brd 10.9.9.9 dev left",
+      "addr add 203.0.113.4/31 dev right"},
+     4,
+     ""},
+    {"point-to-point", {"addr add 10.1.0.1 peer 10.1.0.2 dev near"}, 2, ""},
+    {"one address towards two peers",
+     {"addr add 10.1.0.1 peer 10.1.0.2 dev near", "addr add 10.1.0.1 peer 10.1.0.3 dev near"},
+     2,
+     ""},
+    {"an interface that is down and one without carrier",
+     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left", "link set far down",
+      "link set left down"},
+     1,
+     ""},
+    {"a name with a dot",
+     {"link set near down", "link set near name near.7", "link set near.7 up",
+      "addr add 192.0.2.1/24 brd + dev near.7", "route add default via 192.0.2.254"},
+     2,
+     "near.7"},
+    {"the lowest metric wins",
+     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
+      "route add unreachable default metric 5", "route add default via 192.0.2.254 metric 600",
+      "route add default via 198.51.100.254 metric 100",
+      "route add default via 192.0.2.254 table 99"},
+     3,
+     "left"},
+    {"of equal metrics the first one wins",
+     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
+      "route append default via 198.51.100.254 metric 9",
+      "route append default via 192.0.2.254 metric 9"},
+     3,
+     "left"},
+    {"a default route over two interfaces",
+     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
+      "route add default nexthop via 192.0.2.254 nexthop via 198.51.100.254"},
+     3,
+     "near"},
+    {"a subnet's route is no default route",
+     {"addr add 192.0.2.1/24 dev near", "route add 0.0.0.0/1 via 192.0.2.254"},
+     2,
+     ""},
+};
+
+TEST_F(Kernel, AgreesWithIproute2) {
+  for (const Scenario& scenario : kScenarios) {
+    SCOPED_TRACE(scenario.name);
+    for (const char* command : scenario.commands) {
+      ip(command);
+    }
+    const Configuration expected = Configuration::read();
+    ASSERT_EQ(expected.interfaces.size(), scenario.interfaces);
+    ASSERT_EQ(expected.primary, scenario.primary);
+
+    local_address_list list;
+    EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(&list), 0);
+    EXPECT_THAT(entriesOf(list), UnorderedElementsAreArray(expected.entries()));
+    EXPECT_EQ(KSSCCopyCurrentInterfaceName().value_or(""), expected.primary);
+    for (const auto& interface : expected.interfaces) {
+      EXPECT_EQ(KSSCcurrentAddressWithInterfaceName(interface.name), interface.firstAddress);
+    }
+    EXPECT_EQ(KSSCcurrentAddressWithInterfaceName("absent"), std::nullopt);
+    TearDown();
+    SetUp();
+  }
+}
+
+// One test only: the callback stays for the process.
+TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
+  AddNetworkInterfaceListChangeCallbackSCF();
+  const auto follows = [] {
+    const std::vector<std::string> expected = Configuration::read().entries();
+    const auto agrees = [&] {
+      std::vector<std::string> cached = entriesOf(local_address_cache_copy());
+      return std::is_permutation(cached.begin(), cached.end(), expected.begin(), expected.end());
+    };
+    recording::runPosted(agrees, std::chrono::duration<double>(kMostSeconds));
+    EXPECT_THAT(entriesOf(local_address_cache_copy()), UnorderedElementsAreArray(expected));
+  };
+  follows();
+
+  ip("addr add 192.0.2.1/24 brd + dev near");
+  follows();
+  EXPECT_EQ(local_address_for_destination("192.0.2.77"), "192.0.2.1");
+  ip("addr del 192.0.2.1/24 dev near");
+  follows();
+  EXPECT_EQ(local_address_for_destination("192.0.2.77"), std::nullopt);
+
+  ip("addr add 198.51.100.1/24 dev left");
+  ip("link set right down");
+  follows();
+  ip("link set right up");
+  follows();
+
+  ASSERT_EQ(std::system("for i in $(seq 250); do echo addr add 10.7.7.$i/32 dev near; done |"
+                        " ip -batch -"),
+            0);
+  follows();
+}
+
+TEST_F(Kernel, CallbackHearsWhereTheDefaultRouteMoves) {
+  std::vector<std::string> heard;
+  const DynamicStoreRef store = createDynamicStore("test", [&](const auto& keys) { heard = keys; });
+  const std::string global = "State:/Network/Global/IPv4";
+  ASSERT_TRUE(setNotificationKeys(store, {global}, {}));
+  addSourceToMainLoop(createRunLoopSource(store, 0));
+  const auto nextIs = [&](const std::vector<std::string>& keys) {
+    heard.clear();
+    recording::runPosted([&] { return !heard.empty(); },
+                         std::chrono::duration<double>(kMostSeconds));
+    EXPECT_EQ(heard, keys);
+    EXPECT_EQ(KSSCCopyCurrentInterfaceName().value_or(""), Configuration::read().primary);
+  };
+
+  ip("addr add 192.0.2.1/24 dev near");
+  ip("addr add 198.51.100.1/24 dev left");
+  ip("route add default via 192.0.2.254 metric 20");
+  nextIs({global});
+  ip("route add default via 198.51.100.254 metric 10");
+  nextIs({global});
+  ip("link set left down");
+  nextIs({global});
+
+  const std::string near = "State:/Network/Interface/near/IPv4";
+  ASSERT_TRUE(setNotificationKeys(store, {}, {"State:/Network/Interface/[^/]+/IPv4"}));
+  ip("route del default");
+  ip("addr add 192.0.2.2/24 dev near");
+  nextIs({near});
+}
+
+TEST_F(Kernel, StoreRefusesWhatItCannotRead) {
+  EXPECT_EQ(copyMultiple(nullptr, {}, {}), std::nullopt);
+  EXPECT_EQ(lastDynamicStoreError(), kSCStatusNoStoreSession);
+  const DynamicStoreRef store = createDynamicStore("test");
+  EXPECT_EQ(copyMultiple(store, {}, {"State:/Network/Interface/(/IPv4"}), std::nullopt);
+  EXPECT_EQ(lastDynamicStoreError(), kSCStatusInvalidArgument);
+  EXPECT_FALSE(setNotificationKeys(store, {}, {"["}));
+}
+
+}  // namespace
+}  // namespace onramp
