@@ -13,14 +13,16 @@ from onscreen.processes import start, wait_for
 
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
 _LOOK_SECONDS = 20
+_MENU_BAR_ITEM = "Onramp OSX"
 
 
 class GNUstepPerson(Person):
     """Starts a program on a desktop and uses it. Use it in a `with` statement."""
 
+    errors = ()  # what the use of a control raises that is gone
+
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
-        self._menu_is_held = False
         folder = pathlib.Path(desktop.env["HOME"])
         self._seen = folder / "accessibility.json"
         self._seen.unlink(missing_ok=True)
@@ -43,16 +45,29 @@ class GNUstepPerson(Person):
             control = self.see(role, name)
             return control if self.has_state(control, "enabled") else None
 
-        control = wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} enabled")
+        self.click_control(wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} enabled"))
+
+    def click_control(self, control):
+        self._point_at(control)
+        # What is let go of in the moment of its pressing, GNUstep may see let go of first.
+        self.desktop.run(["xdotool", "mousedown", "1", "sleep", "0.1", "mouseup", "1"])
+
+    def choose_from_menu(self, button, item):
+        """Takes a button's `item`th menu entry. The menu is open as long as the button is held."""
+        self._point_at(self.see("button menu", button))
+        self.desktop.run(["xdotool", "mousedown", "1"])
+        entries = wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
+        self._point_at(entries[item - 1])
+        self.desktop.run(["xdotool", "sleep", "0.1", "mouseup", "1"])
+
+    def _menu_entries(self):
+        """The entries of the menu that is open; the menu bar has one of its own."""
+        items = [control for control in self._read() if control["role"] == "menu item"]
+        return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
+
+    def _point_at(self, control):
         self.desktop.run(["xdotool", "mousemove", str(control["x"] + control["width"] // 2),
                           str(control["y"] + control["height"] // 2), "sleep", "0.05"])
-        if not self._menu_is_held:
-            self.desktop.run(["xdotool", "mousedown", "1"])
-        # The menu of a button is open for as long as the button is held.
-        self._menu_is_held = role == "button menu"
-        if not self._menu_is_held:
-            # What is let go of in the moment of its pressing, GNUstep may see let go of first.
-            self.desktop.run(["xdotool", "sleep", "0.1", "mouseup", "1"])
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
         super().see(role, name, seconds)
