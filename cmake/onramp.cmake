@@ -47,13 +47,15 @@ function(onramp_test name)
 endfunction()
 
 # onramp_namespace_test(NAME …): as onramp_test, but as root of a network namespace of its own; skipped
-# where there can be none. What ctest runs a test through, CMake calls an emulator.
+# where there can be none. What ctest runs a test through, CMake calls an emulator. The test finds
+# its scripts in SOURCE_FOLDER.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})
     set_target_properties(${name} PROPERTIES
       CROSSCOMPILING_EMULATOR ${PROJECT_SOURCE_DIR}/tests/in_namespace)
     set_tests_properties(${name} PROPERTIES SKIP_RETURN_CODE 77)
+    target_compile_definitions(${name} PRIVATE SOURCE_FOLDER="${CMAKE_CURRENT_SOURCE_DIR}")
   endif()
 endfunction()
 

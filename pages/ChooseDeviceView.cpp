@@ -154,9 +154,13 @@ bool ChooseDeviceView::doesWiFi(const Dictionary& device) {
 }
 
 void ChooseDeviceView::setServiceToList(const Dictionary& device) {
+  const Dictionary entry = entryFor(device);
+  const bool isSelected = deviceArrayController.selectedObject() == entry;
   removeServiceFromList(device);
-  deviceArrayController.addObjects({entryFor(device)});
+  deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
+  // The user's choice stays when a search reports the chosen device anew.
+  if (isSelected) deviceArrayController.setSelectedObject(entry);
 }
 
 void ChooseDeviceView::removeServiceFromList(const Dictionary& device) {

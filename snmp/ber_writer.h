@@ -56,10 +56,9 @@ class ber_writer {
   return magnitude < 0x80U ? 1 : magnitude < 0x8000U ? 2 : magnitude < 0x800000U ? 3 : 4;
 }
 
-/// `value` as it is on the wire: a negative one cut down to the bytes of its INTEGER, which is the
-/// number that ber_get_uint reads from them.
-[[nodiscard]] constexpr std::uint64_t ber_int_bytes(std::uint64_t value) {
-  return (value & 0x80000000U) == 0 ? value : value & UINT32_MAX >> (32 - 8 * ber_int_size(value));
+/// The lowest `size` bytes of `value`, 1 to 4.
+[[nodiscard]] constexpr std::uint64_t ber_low_bytes(std::uint64_t value, std::size_t size) {
+  return value & UINT32_MAX >> (32 - 8 * size);
 }
 
 /// Of the content of a Counter, Gauge or TimeTicks: the low 32 bits of `value` as an unsigned
@@ -133,20 +132,24 @@ inline void ber_fill_length(std::span<std::uint8_t> field, std::uint16_t length)
 /// The low 32 bits of `value` in `size` bytes, big-endian; a fifth byte is zero.
 [[nodiscard]] inline snmp_status ber_put_bits(ber_writer& out, std::uint32_t value,
                                               std::size_t size, std::uint8_t tag) {
-  const auto content = ber_put_element(out, tag, static_cast<std::uint16_t>(size));
-  if (!content) return SNMP_ERR_CODEC;
+  const auto element = out.take(2 + size);
+  if (!element) return SNMP_ERR_CODEC;
+  (*element)[0] = tag;
+  (*element)[1] = static_cast<std::uint8_t>(size);
   std::size_t left = size;
-  for (std::uint8_t& byte : *content)
+  for (std::uint8_t& byte : element->last(size))
     byte = static_cast<std::uint8_t>(std::uint64_t{value} >> (8 * --left));
   return SNMP_OK;
 }
 
-/// An integer in `size` bytes, its ber_int_size. Leaves its ber_int_bytes in `value`.
+/// An integer in `size` bytes, its ber_int_size. A negative value is cut down in place to the bytes
+/// written, which is the number that ber_get_uint reads when they come back.
 template <typename Integer>
-[[nodiscard]] snmp_status ber_put_sized_int(ber_writer& out, Integer& value, std::size_t size,
-                                            std::uint8_t tag) {
-  value = static_cast<Integer>(ber_int_bytes(static_cast<std::uint64_t>(value)));
-  return ber_put_bits(out, static_cast<std::uint32_t>(value), size, tag);
+[[nodiscard]] inline snmp_status ber_put_sized_int(ber_writer& out, Integer& value,
+                                                   std::size_t size, std::uint8_t tag) {
+  const auto bits = static_cast<std::uint32_t>(value);
+  if (bits > INT32_MAX) value = static_cast<Integer>(ber_low_bytes(bits, size));
+  return ber_put_bits(out, bits, size, tag);
 }
 
 template <typename Integer>

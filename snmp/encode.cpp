@@ -109,7 +109,9 @@ snmp_status put_value(ber_writer& out, snmp_varbind& binding) {
   }
 }
 
-snmp_status put_bindings(ber_writer& out, std::span<snmp_varbind> bindings) {
+// Into exactly the room that the sizes ask for.
+snmp_status put_bindings(std::span<std::uint8_t> room, std::span<snmp_varbind> bindings) {
+  ber_writer out(room);
   for (snmp_varbind& binding : bindings) {
     if (ber_put_header(out, kTagSequence, binding.encoded_length)) return SNMP_ERR_CODEC;
     [[maybe_unused]] const std::size_t after = out.remaining() - binding.encoded_length;
@@ -122,6 +124,7 @@ snmp_status put_bindings(ber_writer& out, std::span<snmp_varbind> bindings) {
     }
     assert(out.remaining() == after);
   }
+  assert(out.remaining() == 0);
   return SNMP_OK;
 }
 
@@ -146,9 +149,11 @@ snmp_status snmp_encode_message(snmp_message& message, std::span<std::uint8_t> o
       ber_put_sized_int(out, message.request_id, sizes.request_id, kTagInteger) ||
       ber_put_sized_int(out, message.error_status, sizes.error_status, kTagInteger) ||
       ber_put_sized_int(out, message.error_index, sizes.error_index, kTagInteger) ||
-      ber_put_header(out, kTagSequence, sizes.varbinds) || put_bindings(out, bindings)) {
+      ber_put_header(out, kTagSequence, sizes.varbinds)) {
     return SNMP_ERR_CODEC;
   }
+  const auto list = out.take(sizes.varbinds);
+  if (!list || put_bindings(*list, bindings)) return SNMP_ERR_CODEC;
   assert(out.remaining() == 0);
   out_length = static_cast<std::uint16_t>(size);
   return SNMP_OK;

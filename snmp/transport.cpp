@@ -91,7 +91,7 @@ snmp_status snmp_request_to_address(snmp_message* message, const char* address) 
   const auto normalized = snmp_normalize_ipv4(address);
   if (!message || !normalized) return SNMP_ERR_TRANSPORT;
   message->request_id = snmp_next_request_id();
-  const std::uint64_t sent = ber_int_bytes(message->request_id);
+  const std::uint64_t sent = ber_low_bytes(message->request_id, ber_int_size(message->request_id));
   const snmp_status status = snmp_exchange(*message, normalized->c_str(), kModeNetwork);
   return message->request_id == sent ? status : SNMP_ERR_TRANSPORT;
 }

@@ -37,23 +37,32 @@ std::optional<AvahiAddress> addressIn(std::uint16_t type, const void* data, std:
 
 }  // namespace
 
-HostAddresses::HostAddresses(Loop& loop, AvahiIfIndex interface)
-    : loop_(loop), interface_(interface), patience_(loop, [this] {
+HostAddresses::HostAddresses(Connection& connection, AvahiIfIndex interface, std::string host)
+    : connection_(connection),
+      interface_(interface),
+      host_(std::move(host)),
+      patience_(connection.loop(), [this] {
         patient_ = false;
         check();
       }) {}
 
 std::shared_ptr<HostAddresses> HostAddresses::lookUp(Connection& connection, AvahiIfIndex interface,
                                                      const std::string& host) {
-  const std::shared_ptr<HostAddresses> self(new HostAddresses(connection.loop(), interface));
-  const auto browse = [&](std::uint16_t type) {
-    return RecordBrowserHandle(
-        avahi_record_browser_new(connection.client(), interface, AVAHI_PROTO_UNSPEC, host.c_str(),
-                                 AVAHI_DNS_CLASS_IN, type, {}, called, self.get()));
-  };
-  self->ipv4_ = browse(AVAHI_DNS_TYPE_A);
-  self->ipv6_ = browse(AVAHI_DNS_TYPE_AAAA);
-  return self->ipv4_ && self->ipv6_ ? self : nullptr;
+  std::shared_ptr<HostAddresses> self(new HostAddresses(connection, interface, host));
+  self->ipv4_ = self->browse(AVAHI_DNS_TYPE_A);
+  return self->ipv4_ ? self : nullptr;
+}
+
+void HostAddresses::wantIPv6() {
+  if (!ipv6_) ipv6_ = browse(AVAHI_DNS_TYPE_AAAA);
+}
+
+RecordBrowserHandle HostAddresses::browse(std::uint16_t type) {
+  RecordBrowserHandle browser(avahi_record_browser_new(connection_.client(), interface_,
+                                                       AVAHI_PROTO_UNSPEC, host_.c_str(),
+                                                       AVAHI_DNS_CLASS_IN, type, {}, called, this));
+  if (browser) ++unanswered_;
+  return browser;
 }
 
 void HostAddresses::whenKnown(std::function<void()> action) {
@@ -102,6 +111,7 @@ void HostAddresses::called(AvahiRecordBrowser*, AvahiIfIndex, AvahiProtocol prot
 void HostAddresses::exhausted() {
   if (unanswered_ == 0 || --unanswered_ != 0) return;
   patience_.start(kPatienceForIPv4);
+  if (records_.empty()) wantIPv6();
   check();
 }
 
@@ -114,7 +124,7 @@ bool HostAddresses::known() const {
 
 void HostAddresses::check() {
   if (waiting_.empty() || !known()) return;
-  loop_.post([weak = weak_from_this()] {
+  connection_.loop().post([weak = weak_from_this()] {
     const auto self = weak.lock();
     if (!self) return;
     for (const auto& action : std::exchange(self->waiting_, {}))

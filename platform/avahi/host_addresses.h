@@ -2,6 +2,7 @@
 
 #include <avahi-common/address.h>
 
+#include <cstdint>
 #include <functional>
 #include <memory>
 #include <string>
@@ -15,13 +16,18 @@ namespace onramp::avahi {
 class Connection;
 
 /// All addresses of a host on one interface. (Avahi's resolver gives one address only, and that of
-/// the family that the service was found by.) On the loop's thread only.
+/// the family that the service was found by.) IPv6 is asked for where somebody wants it or nothing
+/// else is there: each question costs as much time as all else that a resolve does. On the loop's
+/// thread only.
 class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
  public:
   /// Starts to look; null when the daemon would not.
   [[nodiscard]] static std::shared_ptr<HostAddresses> lookUp(Connection& connection,
                                                              AvahiIfIndex interface,
                                                              const std::string& host);
+
+  /// Asks for IPv6 addresses too.
+  void wantIPv6();
 
   /// Calls `action` once, outside of any callback of Avahi, when addresses are known and either one
   /// is IPv4 or there has been time enough for one. Dropped with the last holder of this object.
@@ -38,7 +44,9 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
     AvahiAddress address;
   };
 
-  HostAddresses(Loop& loop, AvahiIfIndex interface);
+  HostAddresses(Connection& connection, AvahiIfIndex interface, std::string host);
+
+  [[nodiscard]] RecordBrowserHandle browse(std::uint16_t type);
 
   static void called(AvahiRecordBrowser* browser, AvahiIfIndex interface, AvahiProtocol protocol,
                      AvahiBrowserEvent event, const char* name, std::uint16_t recordClass,
@@ -48,11 +56,12 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
   void check();
   [[nodiscard]] bool known() const;
 
-  Loop& loop_;
+  Connection& connection_;
   AvahiIfIndex interface_;
+  std::string host_;
   std::vector<Record> records_;
   std::vector<std::function<void()>> waiting_;
-  int unanswered_ = 2;  ///< of the two browsers, those that still go through what is known at once
+  int unanswered_ = 0;  ///< browsers that still go through what is known at once
   bool patient_ = true;
   Timer patience_;
   RecordBrowserHandle ipv4_;

@@ -5,6 +5,7 @@
 #include <sys/time.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <utility>
 
 namespace onramp::avahi {
@@ -29,23 +30,32 @@ Loop::~Loop() {
 
 void Loop::post(std::function<void()> action) {
   const std::lock_guard lock(mutex_);
+  const bool comesAnyway = !posted_.empty() || std::this_thread::get_id() == thread_;
   posted_.push_back(std::move(action));
-  eventfd_write(wakeUp_, 1);
+  if (!comesAnyway) eventfd_write(wakeUp_, 1);
 }
 
 void Loop::run() {
-  while (!quitting_ && avahi_simple_poll_iterate(poll_.get(), -1) == 0)
+  {
+    const std::lock_guard lock(mutex_);
+    thread_ = std::this_thread::get_id();
+  }
+  do {
     runPosted();
+  } while (!quitting_ && avahi_simple_poll_iterate(poll_.get(), -1) == 0);
 }
 
 void Loop::runPosted() {
-  std::vector<std::function<void()>> actions;
-  {
-    const std::lock_guard lock(mutex_);
-    actions.swap(posted_);
+  while (true) {
+    std::vector<std::function<void()>> actions;
+    {
+      const std::lock_guard lock(mutex_);
+      actions.swap(posted_);
+    }
+    if (actions.empty()) return;
+    for (const auto& action : actions)
+      action();
   }
-  for (const auto& action : actions)
-    action();
 }
 
 Timer::Timer(const Loop& loop, std::function<void()> action)

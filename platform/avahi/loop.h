@@ -3,6 +3,7 @@
 #include <chrono>
 #include <functional>
 #include <mutex>
+#include <thread>
 #include <vector>
 
 #include "platform/avahi/handles.h"
@@ -37,6 +38,7 @@ class Loop {
   bool quitting_ = false;
 
   std::mutex mutex_;
+  std::thread::id thread_;
   std::vector<std::function<void()>> posted_;
 };
 

@@ -98,6 +98,7 @@ void ResolveJob::found(AvahiIfIndex interface, const char* host, std::uint16_t p
     connection_->restart(shared_from_this());
     return;
   }
+  if (service_.protocol != AVAHI_PROTO_INET) host_->wantIPv6();
   host_->whenKnown([weak = weak_from_this()] {
     const auto job = std::static_pointer_cast<ResolveJob>(weak.lock());
     if (!job || !job->host_) return;

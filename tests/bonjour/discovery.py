@@ -93,8 +93,10 @@ class Avahi:
     pid_file = pathlib.Path("/run/avahi-daemon/pid")
 
     def kill(self):
+        process = pathlib.Path("/proc", str(self._pid()))
         os.kill(self._pid(), signal.SIGKILL)
-        self._wait(lambda: not self._alive())
+        # A new one does not start while there is any trace of the old one.
+        self._wait(lambda: not process.exists())
 
     def freeze(self):
         os.kill(self._pid(), signal.SIGSTOP)
@@ -120,14 +122,6 @@ class Avahi:
 
     def _pid(self):
         return int(self.pid_file.read_text())
-
-    def _alive(self):
-        """Whether the process runs: one that has ended may wait to be taken note of."""
-        try:
-            status = pathlib.Path(f"/proc/{self._pid()}/stat").read_text()
-        except (FileNotFoundError, ProcessLookupError):
-            return False
-        return status.rpartition(")")[2].split()[0] not in "ZX"
 
     @staticmethod
     def _wait(condition):

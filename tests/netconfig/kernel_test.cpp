@@ -52,7 +52,8 @@ struct Configuration {
 
   static Configuration read() {
     const std::string path = ::testing::TempDir() + "onramp-configuration-by-ip";
-    EXPECT_EQ(std::system(("python3 " CONFIGURATION_BY_IP " > " + path).c_str()), 0);
+    EXPECT_EQ(std::system(("python3 " SOURCE_FOLDER "/configuration_by_ip.py > " + path).c_str()),
+              0);
     std::ifstream file(path);
     Configuration configuration;
     for (std::string line; std::getline(file, line);) {

@@ -44,8 +44,13 @@ def make(folder, built, models, tool_status=0, **resources):
     (folder / "Packages/Kestrel.pkg").write_text("stand-in")
     write(folder / "Setup.app/Contents/Info.plist",
           {"CFBundleExecutable": "setup", "CFBundleDisplayName": "Wireless Setup"})
-    tool = folder / "Setup.app/Contents/Linux/setup"
-    tool.parent.mkdir()
-    tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {tool_status}\n")
-    tool.chmod(0o755)
+    make_tool(folder, tool_status)
     return folder
+
+
+def make_tool(folder, status):
+    """A set-up tool in place of the one that is there."""
+    tool = folder / "Setup.app/Contents/Linux/setup"
+    tool.parent.mkdir(exist_ok=True)
+    tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {status}\n")
+    tool.chmod(0o755)

@@ -2,6 +2,7 @@
 
 import os
 import pathlib
+import random
 import shutil
 import subprocess
 import tempfile
@@ -9,6 +10,18 @@ import tempfile
 from .processes import Missing, start, stop, wait_for
 
 _SIZE = "1600x1200"
+
+
+def _free_display():
+    """A display's number that nobody uses.
+
+    In a network namespace of its own a server does not see that another one has the same number,
+    and takes away its socket.
+    """
+    while True:
+        number = random.randrange(100, 50000)
+        if not pathlib.Path(f"/tmp/.X11-unix/X{number}").exists():
+            return number
 
 
 class Desktop:
@@ -110,8 +123,8 @@ class Desktop:
 
     def _start_display(self):
         display = self._start(
-            ["Xvfb", "-displayfd", "1", "-screen", "0", f"{_SIZE}x24", "-noreset", "-nolisten",
-             "tcp"],
+            ["Xvfb", f":{_free_display()}", "-displayfd", "1", "-screen", "0", f"{_SIZE}x24",
+             "-noreset", "-nolisten", "tcp"],
             "xvfb", stdout=subprocess.PIPE, text=True)
         number = display.stdout.readline().strip()
         if not number:
@@ -119,6 +132,6 @@ class Desktop:
         self.env["DISPLAY"] = f":{number}"
         if not self._window_manager:
             return
-        self._start(["openbox", "--sm-disable"], "openbox")
+        self._start(["openbox", "--sm-disable"], "openbox", stdout=subprocess.DEVNULL)
         wait_for(lambda: "_NET_SUPPORTING_WM_CHECK(WINDOW)" in
                  self.run(["xprop", "-root", "_NET_SUPPORTING_WM_CHECK"]), 10, "openbox")

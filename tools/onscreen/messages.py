@@ -4,11 +4,27 @@ import pathlib
 import re
 
 _ENTRY = re.compile(r'"((?:[^"\\]|\\.)*)"\s*=\s*"((?:[^"\\]|\\.)*)"\s*;')
+_RESOURCES = "MacResources/CDCommonMessage.bundle/Contents/Resources"
+
+
+class _Texts(dict):
+    """Texts by their keys. One that the medium lacks is its key, as the wizard shows it."""
+
+    def __missing__(self, key):
+        return key
+
+
+def language(medium, wanted):
+    """The language wanted if the medium has it, else the first one that it has."""
+    folders = (pathlib.Path(medium) / _RESOURCES).glob("*.lproj")
+    languages = sorted(folder.stem for folder in folders)
+    return languages[0] if languages and wanted not in languages else wanted
 
 
 def read(medium, language):
-    """The texts of one language by their keys, from a table in UTF-8."""
-    table = (pathlib.Path(medium) / "MacResources/CDCommonMessage.bundle/Contents/Resources" /
-             f"{language}.lproj/Localizable.strings")
-    entries = _ENTRY.findall(table.read_text(encoding="utf-8"))
-    return {key: text.replace("\\n", "\n").replace('\\"', '"') for key, text in entries}
+    """The texts of one language, from a table in UTF-8 or UTF-16."""
+    table = pathlib.Path(medium) / _RESOURCES / f"{language}.lproj/Localizable.strings"
+    data = table.read_bytes() if table.exists() else b""
+    wide = data[:2] in (b"\xff\xfe", b"\xfe\xff")
+    entries = _ENTRY.findall(data.decode("utf-16" if wide else "utf-8"))
+    return _Texts((key, text.replace("\\n", "\n").replace('\\"', '"')) for key, text in entries)

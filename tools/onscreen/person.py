@@ -1,6 +1,7 @@
 """A person at the screen: sees the controls by their roles and names, has a mouse and a keyboard."""
 
 import os
+import pathlib
 import time
 
 from .processes import start, stop, wait_for
@@ -18,8 +19,10 @@ class Person:
                            for name in ("DBUS_SESSION_BUS_ADDRESS", "DISPLAY", "XDG_RUNTIME_DIR")})
         import gi
         gi.require_version("Atspi", "2.0")
-        from gi.repository import Atspi
+        from gi.repository import Atspi, GLib
         self._atspi = Atspi
+        self.errors = GLib.Error  # what the use of a control raises that is gone
+        self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 
     def __enter__(self):
@@ -41,7 +44,7 @@ class Person:
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits until no such control is on the screen."""
-        wait_for(lambda: not self.sees(role, name), seconds, f"the end of {role} {name!r}")
+        wait_for(lambda: self._certainly_gone(role, name), seconds, f"the end of {role} {name!r}")
 
     def everything(self):
         """(role, name, control) of all that is on the screen."""
@@ -65,9 +68,24 @@ class Person:
         """Clicks the middle of a control once it can be clicked."""
         control = self.see(role, name)
         wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} enabled")
-        box = control.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+        self.click_control(control)
+
+    def click_control(self, control):
+        """Clicks the middle of a control, whatever it is and whether or not that does anything."""
+        box = self._resting_place(control)
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
+
+    def open_menu(self, button):
+        """Opens a button's menu, which Qt keeps from the accessibility bus: use it with keys."""
+        windows = self._window_count()
+        self.click("push button", button)
+        wait_for(lambda: self._window_count() > windows, _LOOK_SECONDS, f"the menu of {button!r}")
+
+    def choose_from_menu(self, button, item):
+        """Opens a button's menu and takes its `item`th entry."""
+        self.open_menu(button)
+        self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):
         """Presses keys by their X names, such as "Return" or "alt+F4"."""
@@ -91,13 +109,57 @@ class Person:
             raise RuntimeError(f"the program has ended with status {self.process.returncode}")
         return True
 
+    def _resting_place(self, control):
+        """Where a control is when it no longer moves: a new window is put in its place late."""
+        place = None
+
+        def rests():
+            nonlocal place
+            time.sleep(0.05)
+            box = control.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+            before, place = place, (box.x, box.y, box.width, box.height)
+            return place == before and box
+
+        return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
+
+    def round_trip(self):
+        """The seconds in which the program answers; those of waiting for a processor are taken off.
+
+        None when it does not answer, having ended.
+        """
+        waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
+
+        def waited():
+            return sum(int(file.read_text().split()[1]) for file in waits) / 1e9
+
+        try:
+            began, waited_before = time.monotonic(), waited()
+            frame = self._application().get_child_at_index(0)
+            frame.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+            return time.monotonic() - began - (waited() - waited_before)
+        except (AttributeError, OSError, self.errors):
+            return time.monotonic() - began if self.is_running() else None
+
+    def _window_count(self):
+        return len(self.desktop.run(["xdotool", "search", "--onlyvisible", "--pid",
+                                     str(self.process.pid)]).split())
+
     def _application(self):
         screen = self._atspi.get_desktop(0)
-        for index in range(screen.get_child_count()):
-            application = screen.get_child_at_index(index)
-            if application and application.get_process_id() == self.process.pid:
-                return application
+        try:
+            for index in range(screen.get_child_count()):
+                application = screen.get_child_at_index(index)
+                if application and application.get_process_id() == self.process.pid:
+                    return application
+        except self.errors:
+            pass
         return None
+
+    def _certainly_gone(self, role, name):
+        """A program that is busy answers nothing, which must not pass for nothing there."""
+        self._overlooked = False
+        found = self.sees(role, name)
+        return not found and (not self._overlooked or not self.is_running())
 
     def _look(self, role, name):
         match = []
@@ -113,6 +175,7 @@ class Person:
     def _visit(self, control, visit):
         """Shows `visit` what is on the screen, depth first; objects that vanish are passed over."""
         if control is None:
+            self._overlooked = True
             return True
         try:
             is_application = control.get_role_name() == "application"
@@ -121,11 +184,7 @@ class Person:
             if not is_application and visit(control) is False:
                 return False
             children = [control.get_child_at_index(i) for i in range(control.get_child_count())]
-        except self._gone():
+        except self.errors:
+            self._overlooked = True
             return True
         return all(self._visit(child, visit) for child in children)
-
-    @staticmethod
-    def _gone():
-        from gi.repository import GLib
-        return GLib.Error

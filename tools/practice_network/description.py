@@ -45,6 +45,10 @@ class Device:
         count = address_count(self.addresses)
         return self.activeif * count if len(self.activeif) == 1 else self.activeif
 
+    def is_closed(self):
+        """Whether nobody answers at any address, so that they can be other closed devices' too."""
+        return set(self.activeif) == {CLOSED}
+
     def port_of(self, service_type):
         return self.port or DEFAULT_PORTS.get(service_type, 9100)
 

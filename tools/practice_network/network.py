@@ -138,15 +138,16 @@ class Network:
 
     def _with_addresses(self, device, known_as=None):
         """The device with addresses that no other device answers at, all known to the host."""
-        used = {address for name, other in self._devices.items()
-                if name != (known_as or device.name)
+        name = known_as or device.name
+        used = {address for key, other in self._devices.items() if key != name
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())
                 if behaviour != description.CLOSED}
         if isinstance(device.addresses, int):
             # A loopback network's first addresses are the host's own, and so are those of a cable.
             hosts = itertools.islice(self._subnet.hosts(), 256 if self._subnet.is_loopback else 9,
                                      None)
-            free = (str(address) for address in hosts if str(address) not in used)
+            avoided = used if device.is_closed() else used | self._addresses_of_others(name)
+            free = (str(address) for address in hosts if str(address) not in avoided)
             addresses = tuple(itertools.islice(free, device.addresses))
             if len(addresses) < device.addresses:
                 raise DescriptionError(f'device "{device.name}": no address of {self._subnet} is '
@@ -158,6 +159,10 @@ class Network:
                                        "address; take one that is free, or leave addresses away")
             self._admit(device, ipaddress.ip_address(address))
         return device
+
+    def _addresses_of_others(self, name):
+        return {address for key, other in self._devices.items() if key != name
+                for address in _list(other.addresses)}
 
     def _admit(self, device, address):
         if address.version == 6 or self._subnet.is_loopback and address.is_loopback:

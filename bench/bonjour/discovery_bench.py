@@ -1,0 +1,120 @@
+#!/usr/bin/python3
+"""Discovery beside avahi-browse on the same network in the same run, as ratios.
+
+Usage: discovery_bench.py [BUILD], the folder of a release build (default build/release).
+
+Each time is from the start of the program to its line about the last service that it has resolved.
+Warm: one host, all in its daemon's cache. Cold: two hosts with a cable between them, and a daemon
+without any cache for each single search. Then the processor time of a search that idles.
+"""
+
+import pathlib
+import statistics
+import subprocess
+import sys
+import time
+
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+sys.path[:0] = [str(ROOT / "tests/bonjour"), str(ROOT / "tools")]
+
+import discovery  # noqa: E402
+from practice_network.control import PracticeNetwork  # noqa: E402
+
+TYPE = "_ipp._tcp"
+COUNTS = (1, 20, 200)
+ROUNDS = {"warm": 15, "cold": 5}
+IDLE_SECONDS = 30
+
+
+def seconds_until(count, command, name_of):
+    """From the start of `command` until it has named `count` services."""
+    started = time.monotonic()
+    with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
+                          stderr=subprocess.DEVNULL, text=True) as process:
+        names = set()
+        for line in process.stdout:
+            names.add(name_of(line))
+            if len(names - {None}) == count:
+                break
+        needed = time.monotonic() - started
+        process.terminate()
+    return needed
+
+
+def peer(count):
+    return seconds_until(count, ["avahi-browse", "-rp", TYPE],
+                         lambda line: line.split(";")[3] if line.startswith("=") else None)
+
+
+def ours(count, probe):
+    return seconds_until(count, [probe, "search", TYPE + "."],
+                         lambda line: line.split("\t")[2] if "\tupdate\t" in line else None)
+
+
+def grow_to(network, count):
+    for number in range(len(network.list()), count):
+        network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
+                    model="Model 100")
+    network.settle()
+    # Announcements are repeated for a while, and would warm a cold cache.
+    time.sleep(14 + 0.1 * count)
+
+
+def empty_cache():
+    avahi = discovery.Avahi()
+    avahi.restart()
+    time.sleep(3)
+
+
+def compare(state, probe):
+    network = PracticeNetwork()
+    for count in COUNTS:
+        grow_to(network, count)
+        samples = {peer: [], ours: []}
+        for round_number in range(ROUNDS[state] + 1):
+            for program, arguments in ((peer, (count,)), (ours, (count, probe))):
+                if state == "cold":
+                    empty_cache()
+                seconds = program(*arguments)
+                if round_number:  # The first round warms everything else up.
+                    samples[program].append(seconds)
+        ratios = [one / other for one, other in zip(samples[ours], samples[peer])]
+        low, middle, high = statistics.quantiles(ratios)
+        print(f"{state} {count:4} services: {statistics.median(samples[ours]):.3f} s, avahi-browse "
+              f"{statistics.median(samples[peer]):.3f} s, ratio {middle:.2f} "
+              f"(quartiles {low:.2f} to {high:.2f})", flush=True)
+
+
+def idle(probe):
+    with discovery.Search(probe, TYPE) as search:
+        search.wait_for("update", "Kestrel 1")
+        time.sleep(IDLE_SECONDS)
+        search.end()
+        print(f"idle for {IDLE_SECONDS} s with {COUNTS[-1]} services found: "
+              f"{search.processor_seconds():.3f} s of processor time, start included")
+
+
+def main():
+    match sys.argv[1:]:
+        case ["--inside", state, probe]:
+            compare(state, probe)
+            if state == "warm":
+                idle(probe)
+            return 0
+    build = pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/release").resolve()
+    probe = build / "tests/bonjour/bonjour_probe"
+    if not probe.exists():
+        print(f"{probe} is missing; build it: cmake --preset release && "
+              "cmake --build --preset release --target bonjour_probe", file=sys.stderr)
+        return 2
+    for state, hosts in (("warm", "1"), ("cold", "2")):
+        status = subprocess.run([sys.executable, "-B", discovery.PRACTICE_NETWORK, "--hosts", hosts,
+                                 ROOT / "tests/bonjour/network.toml", sys.executable, "-B",
+                                 __file__, "--inside", state, probe], check=False).returncode
+        if status:
+            return status
+    return 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())

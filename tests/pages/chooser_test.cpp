@@ -1,0 +1,187 @@
+#include <gmock/gmock.h>
+
+#include "bonjour/KSDevice.h"
+#include "pages/ChooseDeviceView.h"
+#include "platform/notification_center.h"
+#include "tests/app/wizard.h"
+#include "tests/recording/agents.h"
+#include "tests/recording/network.h"
+
+namespace onramp {
+namespace {
+
+using recording::Agents;
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+constexpr int kSilent = Agents::kSilent;
+constexpr int kWired = 1;
+constexpr int kWireless = 2;
+
+Dictionary device(const std::string& name, const Array& addresses = {"192.0.2.1"},
+                  const std::string& maker = "Kestrel", const std::string& model = "Model 100") {
+  return Dictionary{{std::string(KSDevice::kDisplayName), name},
+                    {std::string(KSDevice::kUSBManufacturer), maker},
+                    {std::string(KSDevice::kUSBModel), model},
+                    {std::string(KSDevice::kIPAddressList), addresses}};
+}
+
+class Chooser : public Wizard {
+ protected:
+  Chooser() {
+    agents.reset();
+    network.reset();
+    for (const char* address : {"192.0.2.1", "192.0.2.2", "192.0.2.3"})
+      agents.answers[address] = {kWireless};
+    describeTwoModels();
+    delegate = std::make_unique<OnrampOSXAppDelegate>();
+    page = std::static_pointer_cast<ChooseDeviceView>(delegate->loadView("ChooseDeviceView"));
+    page->setSearchModelList({"Kestrel Model 50", "Kestrel Model 100"});
+  }
+  ~Chooser() override { page->stopBrowsing(); }
+
+  /// "name address" of every row from the top, the selected one with a star.
+  [[nodiscard]] std::vector<std::string> rows() const {
+    const ArrayController& controller = *screen.object("deviceListView").content;
+    std::vector<std::string> rows;
+    for (const Dictionary& entry : controller.arrangedObjects()) {
+      rows.push_back(entry.string(ChooseDeviceView::kDevice).value_or("?") + ' ' +
+                     entry.string(ChooseDeviceView::kLocation).value_or("?"));
+      if (rows.size() - 1 == controller.selectionIndex()) rows.back() += '*';
+    }
+    return rows;
+  }
+
+  Agents& agents = Agents::instance();
+  recording::Network& network = recording::Network::instance();
+  std::shared_ptr<ChooseDeviceView> page;
+};
+
+TEST_F(Chooser, ListsOnlyTheModelsLookedFor) {
+  const struct {
+    const char* maker;
+    const char* model;
+    bool listed;
+  } cases[] = {{"Kestrel", "Model 100", true},
+               {"Kestrel Model", "100", true},
+               {"kestrel", "Model 100", false},
+               {"Kestrel", " Model 100", false},
+               {"Kestrel", "Model 10", false},
+               {"Kestrel", "Model 100 ", false},
+               {"Heron", "Model 100", false},
+               {"", "Kestrel Model 100", false},
+               {"", "", false}};
+  for (const auto& [maker, model, listed] : cases) {
+    agents.asked.clear();
+    const Dictionary found = device("D", {"192.0.2.1"}, maker, model);
+    page->updateKSDevice(found);
+    EXPECT_EQ(page->deviceArrayControllerCnt(), listed ? 1U : 0U) << maker << '|' << model;
+    EXPECT_EQ(agents.asked.size(), listed ? 1U : 0U) << "others are not asked";
+    page->removeKSDevice(found);
+    EXPECT_THAT(rows(), IsEmpty());
+  }
+  page->setSearchModelList({});
+  page->updateKSDevice(device("D"));
+  EXPECT_THAT(rows(), IsEmpty());
+}
+
+TEST_F(Chooser, TheFirstAddressThatAnswersAtOnceDecides) {
+  const struct {
+    std::vector<std::vector<int>> answers;  // of each address
+    std::vector<std::size_t> asked;         // requests to each address
+    bool listed;
+  } cases[] = {
+      {{}, {}, false},
+      {{{kWireless}}, {1}, true},
+      {{{kWired}}, {1}, false},
+      {{{0}}, {1}, false},
+      {{{kWireless}, {kWired}}, {1, 0}, true},
+      {{{kWired}, {kWireless}}, {1, 0}, false},
+      {{{kSilent}}, {6}, false},
+      {{{kSilent}, {kWireless}, {kWired}}, {6, 1, 0}, true},
+      {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
+      {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
+      // Once unanswered, an address has its three attempts, and the next one is asked.
+      {{{kSilent, kWireless}}, {4}, true},
+      {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
+      {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},
+  };
+  for (const auto& [answers, asked, listed] : cases) {
+    agents.reset();
+    Array addresses;
+    std::vector<std::string> expected;
+    for (std::size_t i = 0; i < answers.size(); ++i) {
+      const std::string address = "198.51.100." + std::to_string(i);
+      addresses.emplace_back(address);
+      agents.answers[address] = answers[i];
+      expected.insert(expected.end(), asked[i], address);
+    }
+    EXPECT_EQ(ChooseDeviceView::doesWiFi(device("D", addresses)), listed)
+        << ::testing::PrintToString(answers);
+    EXPECT_EQ(agents.asked, expected);
+  }
+}
+
+TEST_F(Chooser, SortsByNameAndReplacesWhatIsReportedAnew) {
+  for (const char* name : {"b", "C", "a"})
+    page->updateKSDevice(device(name));
+  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
+  for (const char* name : {"a", "b", "C"})
+    page->updateKSDevice(device(name));
+  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
+}
+
+TEST_F(Chooser, AnUpdateWithAnotherAddressLeavesTheOldEntry) {
+  page->updateKSDevice(device("D", {"192.0.2.1", "192.0.2.2"}));
+  page->updateKSDevice(device("D", {"192.0.2.2"}));
+  EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*", "D 192.0.2.2"));
+  page->removeKSDevice(device("D", {"192.0.2.2"}));
+  EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
+  // The other addresses are part of the record, too.
+  page->removeKSDevice(device("D", {"192.0.2.1"}));
+  EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
+}
+
+TEST_F(Chooser, NeitherAnUpdateNorARemovalOfAWiredDeviceChangesTheList) {
+  const Dictionary found = device("D");
+  page->updateKSDevice(found);
+  agents.answers["192.0.2.1"] = {kWired};
+  page->updateKSDevice(found);
+  EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
+  page->removeKSDevice(device("Wired"));
+  EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
+}
+
+TEST_F(Chooser, OneSearchAtATimeFeedsTheListWhichOnlyARefreshEmpties) {
+  const auto appear = [&](const std::string& name) {
+    const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
+    network.found(service);
+    network.resolves(service, {recording::ipv4Address(192, 0, 2, 1)},
+                     recording::txtData({"usb_MFG=Kestrel", "usb_MDL=Model 100"}));
+  };
+  page->startBrowsing();
+  page->startBrowsing();
+  EXPECT_EQ(network.browsers.size(), 1U);
+  appear("A");
+  page->stopBrowsing();
+  page->stopBrowsing();
+  EXPECT_THAT(network.browsers, IsEmpty());
+  appear("B");
+  EXPECT_THAT(rows(), ElementsAre("A 192.0.2.1*"));
+
+  int asked = 0;
+  NotificationCenter::defaultCenter().addObserver(
+      this, kDeviceWaitNotification, [&](const Notification& wait) {
+        ++asked;
+        EXPECT_EQ(wait.object, page.get());
+        EXPECT_EQ(std::any_cast<int>(wait.userInfo.find(kWaitTime)->second), 3);
+        EXPECT_THAT(rows(), IsEmpty());
+        EXPECT_EQ(network.browsers.size(), 1U);
+      });
+  page->refreshBrowsing();
+  NotificationCenter::defaultCenter().removeObserver(this);
+  EXPECT_EQ(asked, 1);
+}
+
+}  // namespace
+}  // namespace onramp

@@ -1,0 +1,206 @@
+"""Random walks over the wizard's real window while devices come and go.
+
+Usage: walk.py [--seed N] [--count N] [--silence SECONDS] MEDIUM
+
+Walk number i begins with seed N + i, so that a walk can be taken again: its seed and steps are
+printed when something is wrong with it. Wrong is: an end other than of its own accord, a main loop
+that is silent for longer than that (default 0.5), a window that cannot be closed in the end, and a
+hand-off file that is not whole.
+"""
+
+import argparse
+import concurrent.futures
+import os
+import pathlib
+import plistlib
+import random
+import subprocess
+import sys
+import tempfile
+import time
+
+import media
+from media import model
+from way import BUILT
+from onscreen.desktop import Desktop
+from onscreen.person import Person
+from practice_network import PracticeNetwork
+
+PRACTICE_NETWORK = pathlib.Path(__file__).resolve().parents[2] / "tools/practice-network"
+AT_A_TIME = 4
+STEPS = 14
+PATIENCE = 60
+CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu item")
+KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
+        "F10": 0.5, "Escape": 0.2}
+PRINTER = "_pdl-datastream._tcp"
+# Left to chance alone, most walks would end early and few would get far. There is no task bar that
+# could bring a hidden window back.
+WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2, "Quit": 0.1,
+           "Next": 4, "Actions": 2}
+# None of these leaves a question unanswered, for which the wizard would have to wait.
+ANSWERS = (2, 2, 2, 1, "missing", "text")
+
+
+class Wrong(Exception):
+    pass
+
+
+class Walk:
+    def __init__(self, desktop, network, seed, silence):
+        self.desktop, self.network, self.silence = desktop, network, silence
+        self.kind = f"Walk {seed}"
+        self.dice = random.Random(seed)
+        self.steps = []
+        self.longest = 0.0
+        self.devices = {}
+        self.seen = set()
+
+    def take(self):
+        self.desktop.forget()
+        with tempfile.TemporaryDirectory() as folder:
+            models = {f"Kestrel {self.kind}": model(usb=True, wireless=True)}
+            if self.dice.random() < 0.5:
+                models["Kestrel Cable"] = model(usb=True)
+            medium = media.make(pathlib.Path(folder) / "medium", BUILT, models,
+                                tool_status=self.dice.choice((0, 1, 1, 2, 9)))
+            program = medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
+            with Person(self.desktop, program, env={"LANG": "en_US.UTF-8"}) as person:
+                try:
+                    person.see("push button", "Next", PATIENCE)
+                    for _ in range(2):
+                        self.change_devices(person)
+                    self.walk(person)
+                    self.leave(person)
+                finally:
+                    for name in self.devices:
+                        self.network.remove(name)
+        self.check_files()
+
+    def walk(self, person):
+        for _ in range(STEPS):
+            step = self.dice.choices((self.click, self.press, self.change_devices, self.close),
+                                     (8, 5, 5, 0.3))[0]
+            try:
+                step(person)
+            except (TimeoutError, person.errors):
+                pass  # What was to be clicked has gone meanwhile.
+            self.listen(person, self.dice.choice((0, 0.1, 1)))
+            self.check_files()
+            if not person.is_running():
+                return
+
+    def click(self, person):
+        shown = person.everything()
+        self.seen |= {name for role, name, _ in shown if role == "label"}
+        controls = [one for one in shown if one[0] in CLICKABLE and one[1]]
+        if not controls:
+            return
+        weights = [WEIGHTS.get(name, 1) for _, name, _ in controls]
+        role, name, control = self.dice.choices(controls, weights)[0]
+        self.steps.append(f"click {role} {name!r}")
+        person.click_control(control)
+
+    def press(self, person):
+        keys = self.dice.choices(tuple(KEYS), tuple(KEYS.values()), k=self.dice.randint(1, 3))
+        self.steps.append(f"press {keys}")
+        person.press(*keys)
+
+    def close(self, person):
+        self.steps.append("close")
+        person.close_window()
+
+    def change_devices(self, _):
+        name = f"{self.kind} no. {self.dice.randint(1, 4)}"
+        self.steps.append(f"change {name!r}")
+        if name not in self.devices:
+            self.network.add(name, maker="Kestrel", model=self.kind,
+                             activeif=self.dice.choice(ANSWERS))
+            self.devices[name] = True
+        elif self.dice.random() < 0.5:
+            # It comes and goes as a service of the type that is browsed for; it goes on answering,
+            # since the wizard may be about to ask it.
+            self.devices[name] = not self.devices[name]
+            self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
+        else:
+            self.network.set(name, note=f"after step {len(self.steps)}")
+
+    def listen(self, person, seconds):
+        """Lets time pass in which the wizard has to answer all the time."""
+        until = time.monotonic() + seconds
+        while True:
+            silent = person.round_trip()
+            if silent is None:
+                return
+            self.longest = max(self.longest, silent)
+            if silent > self.silence:
+                raise Wrong(f"the main loop was silent for {silent:.2f} s")
+            if time.monotonic() >= until:
+                return
+            time.sleep(0.05)
+
+    def leave(self, person):
+        """It can be closed in the end: a search ends, and sheets and menus close with Escape."""
+        until = time.monotonic() + PATIENCE
+        while person.is_running():
+            if time.monotonic() > until:
+                raise Wrong("the window cannot be closed")
+            person.press("Escape")
+            person.close_window()
+            time.sleep(0.3)
+        if person.wait_for_end() != 0:
+            raise Wrong(f"it ended with status {person.wait_for_end()}")
+
+    def check_files(self):
+        for folder in (self.desktop.user_folder, self.desktop.local_folder):
+            for file in folder.rglob("com.kestrelimaging.*.plist"):
+                try:
+                    content = plistlib.loads(file.read_bytes())
+                except FileNotFoundError:
+                    continue
+                except Exception as error:
+                    raise Wrong(f"{file.name} is not whole: {error}") from error
+                if not {"Model", "Interface"} <= content.keys() and "PKG_FontSet" not in content:
+                    raise Wrong(f"{file.name} is not whole: {content}")
+
+
+def take_walks(seeds, silence):
+    """Whether nothing was wrong with these walks, which are taken one after the other."""
+    network = PracticeNetwork()
+    passed = True
+    with Desktop() as desktop:
+        for seed in seeds:
+            walk = Walk(desktop, network, seed, silence)
+            try:
+                walk.take()
+                print(f"walk {seed}: ok, {len(walk.steps)} steps, "
+                      f"silent for {walk.longest:.3f} s at most, seen: {', '.join(sorted(walk.seen))}",
+                      flush=True)
+            except (Wrong, RuntimeError, TimeoutError) as error:
+                passed = False
+                print(f"walk {seed}: {error}, after:\n  " + "\n  ".join(walk.steps), flush=True)
+    return passed
+
+
+def main():
+    parser = argparse.ArgumentParser()
+    parser.add_argument("--seed", type=int, default=1)
+    parser.add_argument("--count", type=int, default=4)
+    parser.add_argument("--step", type=int, default=0, help=argparse.SUPPRESS)
+    parser.add_argument("--silence", type=float, default=0.5)
+    options = parser.parse_args()
+    seeds = range(options.seed, options.seed + options.count, options.step or 1)
+    if options.step:
+        return take_walks(seeds, options.silence)
+    if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
+        os.execv(sys.executable, [sys.executable, PRACTICE_NETWORK, "/dev/null", sys.executable,
+                                  *sys.argv, BUILT])
+    with concurrent.futures.ThreadPoolExecutor(AT_A_TIME) as pool:
+        runs = pool.map(lambda first: subprocess.run(
+            [sys.executable, "-W", "ignore", __file__, "--seed", str(options.seed + first),
+             "--count", str(options.count - first), "--step", str(AT_A_TIME),
+             "--silence", str(options.silence), BUILT]).returncode, range(AT_A_TIME))
+        return not any(runs)
+
+
+sys.exit(not main())

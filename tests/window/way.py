@@ -1,0 +1,62 @@
+"""What tests of whole ways through the wizard have in common.
+
+The last argument of their program is a medium's folder with the application on it.
+"""
+
+import pathlib
+import plistlib
+import sys
+import tempfile
+import unittest
+
+sys.dont_write_bytecode = True
+sys.path.insert(0, str(pathlib.Path(__file__).resolve().parents[2] / "tools"))
+
+import media  # noqa: E402
+from onscreen import messages  # noqa: E402
+from onscreen.desktop import Desktop  # noqa: E402
+from onscreen.person import Person  # noqa: E402
+
+BUILT = pathlib.Path(sys.argv.pop()).resolve()
+TEXT = messages.read(BUILT, "en")
+OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": False,
+           "PKG_LabelTool": False, "PKG_FontSet": False}
+
+
+class WayTest(unittest.TestCase):
+    """A person on a desktop, and a medium of the test's own."""
+
+    @classmethod
+    def setUpClass(cls):
+        cls.desktop = cls.enterClassContext(Desktop())
+        cls.desktop.env["LANG"] = "en_US.UTF-8"
+
+    def setUp(self):
+        self.desktop.forget()
+        self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+
+    def start(self, models, arguments=(), env=None, **details):
+        self.medium = media.make(self.folder / "medium", BUILT, models, **details)
+        program = self.medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
+        return self.enterContext(Person(self.desktop, program, arguments, env))
+
+    def files(self):
+        """The hand-off files' contents by the last words of their names."""
+        found = {}
+        for folder in (self.desktop.user_folder, self.desktop.local_folder):
+            for path in folder.rglob("com.kestrelimaging.*"):
+                found[path.name.split(".")[2]] = plistlib.loads(path.read_bytes())
+        return found
+
+    def assert_installer_opened(self, person, model_file):
+        self.assertEqual(person.wait_for_end(), 0)
+        expected = {"installpkginfo": OPTIONS}
+        if model_file:
+            expected["instmodel"] = model_file
+        self.assertEqual(self.files(), expected)
+        self.assertEqual(self.desktop.opened(), [str(self.medium / "Packages/Kestrel.pkg")])
+
+    def assert_quit_without_a_trace(self, person):
+        self.assertEqual(person.wait_for_end(), 0)
+        self.assertEqual(self.files(), {})
+        self.assertEqual(self.desktop.opened(), [])

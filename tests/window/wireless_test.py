@@ -1,0 +1,307 @@
+"""Whole ways by the wireless row, in the wizard's real window on a practice network.
+
+Usage: wireless_test.py [TEST] MEDIUM, a medium's folder with the application on it.
+Every test has a process, a desktop and devices of its own, so several run at a time: most of a
+search is waiting.
+"""
+
+import concurrent.futures
+import os
+import pathlib
+import subprocess
+import sys
+import time
+import unittest
+
+import media
+from media import model
+from way import BUILT, TEXT, WayTest, messages
+from onscreen.processes import wait_for
+from practice_network import PracticeNetwork
+
+PRACTICE_NETWORK = pathlib.Path(__file__).resolve().parents[2] / "tools/practice-network"
+AT_A_TIME = 4
+PATIENCE = 60  # seconds, for what takes up to 15 where nothing else runs
+WIRELESS, WIRED = 2, 1
+GEAR, GEAR_TOOL, GEAR_REFRESH = "Actions", 1, 2
+SUPPORT_PAGE = "http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"
+
+
+class WirelessWays(WayTest):
+    def setUp(self):
+        super().setUp()
+        self.network = PracticeNetwork()
+        self.kind = self.id().rpartition("test_")[2][:30]
+        self.model = f"Kestrel {self.kind}"
+        self.text = TEXT
+
+    def add(self, name, **entries):
+        self.network.add(name, **{"maker": "Kestrel", "model": self.kind} | entries)
+        self.addCleanup(self.network.remove, name)
+
+    def add_devices(self, *names):
+        """The whole names of devices that answer "wireless", once they are established."""
+        whole = [f"{name} of {self.kind}" for name in names]
+        for name in whole:
+            self.add(name)
+        self.network.settle()
+        return whole
+
+    def search(self, env=None, **details):
+        """From the start to the search's beginning, with the mouse."""
+        person = self.start({self.model: model(usb=True, wired=True, wireless=True),
+                             "Kestrel Cable": model(usb=True)}, env=env, **details)
+        person.click("list item", self.model)
+        wait_for(lambda: person.has_state(person.see("list item", self.model), "selected"),
+                 PATIENCE, "the choice")
+        person.click("push button", self.text["BTN_NEXT"])
+        person.click("radio button", self.text["INST_TXT_WIFI"])
+        person.click("push button", self.text["BTN_NEXT"])
+        return person
+
+    def see_waiting(self, person):
+        person.see("label", self.text["INST_WAIT"])
+
+    def see_chooser(self, person):
+        person.see("label", self.text["INST_TXT_DEVLIST"], PATIENCE)
+        person.see_gone("label", self.text["INST_WAIT"], PATIENCE)
+
+    def search_in_vain(self, tool_status, env=None):
+        """To the return from a set-up tool that ended with `tool_status`."""
+        person = self.search(env, tool_status=tool_status)
+        self.see_tool_run()
+        return person
+
+    def see_tool_run(self):
+        called = self.medium / "tool"
+        arguments = wait_for(lambda: called.exists() and called.read_text(), PATIENCE, "the tool")
+        self.assertEqual(arguments, "-installer")
+
+    def see_not_found(self, person):
+        person.see("label", self.text["INST_TXT_ALERT_DEVICENOTFOUND"], PATIENCE)
+        person.see("label", self.text["INST_TXT_ALERT_WIFI_DEVICENOTFOUND"] + "\n\n" +
+                   self.text["INST_TXT_ALERT_CONFIRM_DEVICENOTFOUND_WIFI"])
+
+    def is_enabled(self, person, button):
+        return person.has_state(person.see("push button", self.text[button]), "enabled")
+
+    @staticmethod
+    def rows(person):
+        cells = [name for role, name, _ in person.everything() if role == "table cell"]
+        return list(zip(cells[::3], cells[1::3], cells[2::3]))
+
+    def names(self, person):
+        return [name for name, _, _ in self.rows(person)]
+
+    def assert_handed_on(self, person, name, address, own_model=None):
+        self.assert_installer_opened(person, {
+            "Model": own_model or self.model, "Interface": "WiFi", "Network": {
+                "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
+                "IP address": address}})
+
+    def hand_on(self, person, name):
+        """Chooses the device and goes on, which writes what the list has shown."""
+        person.click("table cell", name)
+        address = dict((row[0], row[2]) for row in self.rows(person))[name]
+        person.click("push button", self.text["BTN_NEXT"])
+        self.assert_handed_on(person, name, address)
+
+    def test_the_one_device_is_found_in_the_first_pause(self):
+        name = "Büro – 会議室"
+        self.add(name, addresses=["127.0.90.1"], note="2nd floor")
+        self.network.settle()
+        person = self.search()
+        self.see_waiting(person)
+        began = time.monotonic()
+        self.see_chooser(person)
+        self.assertLess(time.monotonic() - began, 9, "the wait went on after the device was there")
+        self.assertEqual(self.rows(person),
+                         [(name, TEXT["INST_TXT_CONNECTION_NETWORK"], "127.0.90.1")])
+        person.press("Return")
+        self.assert_handed_on(person, name, "127.0.90.1")
+
+    def test_only_matching_wireless_devices_are_listed(self):
+        others = {"on the cable": {"activeif": WIRED}, "without agent": {"activeif": "closed"},
+                  "without the object": {"activeif": "missing"}, "with a text": {"activeif": "text"},
+                  "of another maker": {"maker": "Heron"}, "in small letters": {"maker": "kestrel"},
+                  "in capital letters": {"model": self.kind.upper()},
+                  "with two blanks": {"model": f" {self.kind}"},
+                  "of another type": {"type": "_ipp._tcp"}}
+        for name, entries in others.items():
+            self.add(f"{name} {self.kind}", **entries)
+        wanted, = self.add_devices("Wanted")
+        person = self.search()
+        self.see_chooser(person)
+        self.assertEqual(self.names(person), [wanted])
+        # A second search takes in what the first did not wait for.
+        person.choose_from_menu(GEAR, GEAR_REFRESH)
+        self.see_waiting(person)
+        self.see_chooser(person)
+        self.assertEqual(self.names(person), [wanted])
+
+    def test_tool_that_exits_with_1_leads_back_to_the_connection(self):
+        self.add(f"wired {self.kind}", activeif=WIRED)
+        person = self.search_in_vain(tool_status=1)
+        wireless = person.see("radio button", TEXT["INST_TXT_WIFI"])
+        self.assertTrue(person.has_state(wireless, "checked"))
+        name, = self.add_devices("Late")
+        self.assertTrue(self.is_enabled(person, "BTN_BACK"))
+        person.click("push button", TEXT["BTN_NEXT"])
+        self.see_chooser(person)
+        self.hand_on(person, name)
+
+    def test_tool_that_exits_with_2_quits(self):
+        self.assert_quit_without_a_trace(self.search_in_vain(tool_status=2))
+
+    def test_other_exit_searches_again_and_so_does_the_person(self):
+        person = self.search_in_vain(tool_status=3)
+        person.see("label", TEXT["INST_TXT_DEVLIST"])
+        self.see_not_found(person)
+        self.assertFalse(person.sees("push button", TEXT["BTN_BACK"]))
+        person.click("push button", TEXT["BTN_OK"])
+        person.see_gone("alert")
+        self.assertFalse(self.is_enabled(person, "BTN_NEXT"))
+        self.assertEqual(self.desktop.opened(), [])
+        name, = self.add_devices("Late")
+        person.choose_from_menu(GEAR, GEAR_REFRESH)
+        self.see_waiting(person)
+        self.see_chooser(person)
+        self.hand_on(person, name)
+
+    def test_web_opens_the_support_page_of_a_japanese_user(self):
+        self.text = messages.read(BUILT, "ja")
+        person = self.search_in_vain(tool_status=0, env={"LANG": "ja_JP.UTF-8"})
+        self.see_not_found(person)
+        person.click("push button", self.text["BTN_WEB"])
+        wait_for(self.desktop.opened, PATIENCE, "the support page")
+        self.assertEqual(self.desktop.opened(), [SUPPORT_PAGE])
+        person.see_gone("alert")
+        self.assertFalse(self.is_enabled(person, "BTN_NEXT"))
+        person.click("push button", self.text["BTN_CANCEL"])
+        self.assertEqual(person.wait_for_end(), 0)
+        self.assertEqual(self.files(), {})
+
+    def test_the_window_cannot_be_closed_during_the_search(self):
+        person = self.search()
+        self.see_waiting(person)
+        person.close_window()
+        person.press("Escape")
+        self.add_devices("One")
+        self.see_chooser(person)
+        person.close_window()
+        self.assert_quit_without_a_trace(person)
+
+    def test_device_that_has_left_is_gone_after_a_refresh(self):
+        leaving, = self.add_devices("Leaving")
+        person = self.search()
+        self.see_chooser(person)
+        # Browsing is over: the list stays as it is.
+        self.network.remove(leaving)
+        time.sleep(2)
+        self.assertEqual(self.names(person), [leaving])
+        person.choose_from_menu(GEAR, GEAR_REFRESH)
+        self.see_waiting(person)
+        self.assertEqual(self.names(person), [])
+        staying, = self.add_devices("Staying")
+        self.see_chooser(person)
+        self.assertEqual(self.names(person), [staying])
+
+    def test_back_and_forth_keeps_list_and_choice(self):
+        names = self.add_devices("A", "B", "C")
+        person = self.search()
+        self.see_chooser(person)
+        for chosen in names:
+            person.click("table cell", chosen)
+            person.click("push button", TEXT["BTN_BACK"])
+            person.see("radio button", TEXT["INST_TXT_WIFI"])
+            person.press("Return")
+            self.see_chooser(person)
+            self.assertEqual(self.names(person), names)
+            cell = person.see("table cell", chosen)
+            self.assertTrue(person.has_state(cell, "selected"), chosen)
+        person.press("Return")
+        self.assertEqual(person.wait_for_end(), 0)
+        self.assertEqual(self.files()["instmodel"]["Network"]["Bonjour"]["name"], names[-1])
+
+    def test_the_first_address_that_answers_decides(self):
+        addresses = {f"{name} {self.kind}": [f"127.0.{net}.{host}" for host in (1, 2, 3)]
+                     for name, net in (("Silent", 91), ("Wired", 92))}
+        for name, own in addresses.items():
+            self.add(name, addresses=own)
+        self.network.settle()
+        person = self.search()
+        self.see_chooser(person)
+        # Which one is the first, Avahi decides.
+        first = {name: address for name, _, address in self.rows(person)}
+        silent, wired = addresses
+        for name, behaviour in ((silent, "silent"), (wired, WIRED)):
+            self.network.set(name, activeif=[behaviour if address == first[name] else WIRELESS
+                                             for address in addresses[name]])
+        began = time.monotonic()
+        person.choose_from_menu(GEAR, GEAR_REFRESH)
+        person.see("table cell", silent, PATIENCE)
+        self.see_chooser(person)
+        self.assertGreater(time.monotonic() - began, 3 * 2 * 2.0, "asked less often")
+        self.assertEqual(self.names(person), [silent])
+        person.press("Return")
+        self.assert_handed_on(person, silent, first[silent])
+
+    def test_without_a_model_list_all_models_are_searched_for(self):
+        kinds = {f"{letter} {self.kind}": letter for letter in "ABC"}
+        for kind, letter in kinds.items():
+            self.add(f"{letter} {self.kind}", model=kind)
+        self.network.settle()
+        person = self.start({f"Kestrel {kind}": model(usb=True, wireless=True)
+                             for kind, letter in kinds.items() if letter != "C"})
+        person.see("radio button", TEXT["INST_TXT_WIFI"])
+        person.press("Return")
+        self.see_chooser(person)
+        first, second = f"A {self.kind}", f"B {self.kind}"
+        self.assertEqual(self.names(person), [first, second])
+        person.click("table cell", second)
+        address = self.rows(person)[1][2]
+        person.press("Return")
+        self.assert_handed_on(person, second, address, own_model=f"Kestrel B {self.kind}")
+
+    def test_the_tool_started_by_hand_leads_where_it_says(self):
+        name, = self.add_devices("One")
+        person = self.search(tool_status=1)
+        self.see_chooser(person)
+        for status in (1, 0, 2):
+            media.make_tool(self.medium, status)
+            (self.medium / "tool").unlink(missing_ok=True)
+            person.choose_from_menu(GEAR, GEAR_TOOL)
+            self.see_tool_run()
+            if status == 2:
+                break
+            if status == 0:
+                self.see_waiting(person)
+            self.see_chooser(person)
+            self.assertEqual(self.names(person), [name])
+            self.assertTrue(self.is_enabled(person, "BTN_NEXT"))
+        self.assert_quit_without_a_trace(person)
+
+
+def run_all():
+    """Runs every test in a process of its own; whether all passed."""
+    names = unittest.defaultTestLoader.getTestCaseNames(WirelessWays)
+    with concurrent.futures.ThreadPoolExecutor(AT_A_TIME) as pool:
+        runs = pool.map(lambda name: subprocess.run(
+            [sys.executable, __file__, f"WirelessWays.{name}", BUILT], stderr=subprocess.PIPE,
+            text=True), names)
+        passed = True
+        for name, run in zip(names, runs):
+            print(f"{name}: {'failed' if run.returncode else 'ok'}", flush=True)
+            if run.returncode:
+                print(run.stderr)
+                passed = False
+    return passed
+
+
+if __name__ == "__main__":
+    if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
+        os.execv(sys.executable, [sys.executable, PRACTICE_NETWORK, "/dev/null", sys.executable,
+                                  *sys.argv, BUILT])
+    if len(sys.argv) > 1:
+        unittest.main(warnings="ignore")
+    sys.exit(not run_all())

@@ -1,0 +1,1 @@
+"""The ways on which the tour leads through any medium's wizard."""

@@ -1,0 +1,61 @@
+"""What the tour has to know of a medium to find its way through it."""
+
+import pathlib
+import plistlib
+
+from onscreen import messages
+
+_RESOURCES = "MacResources/CDCommonInfo.plist"
+
+
+class Unsuitable(Exception):
+    """The tour cannot be led through this medium; says why."""
+
+
+class Medium:
+    """A medium's folder with the application on it."""
+
+    def __init__(self, folder):
+        self.folder = pathlib.Path(folder)
+        self.program = self.folder / "Onramp OSX.app/Contents/Linux/Onramp OSX"
+        about = _read(self.folder / "Onramp OSX.app/Contents/Info.plist")
+        self._resources = _read(self.folder / about.get("CommonResourcePath", _RESOURCES))
+        self.language = messages.language(self.folder, "en")
+        self.text = messages.read(self.folder, self.language)
+
+    @property
+    def service_type(self):
+        """The type of the services that are browsed for, without the dot at its end."""
+        return self._resources.get("BonjourNetwork", "").rstrip(".")
+
+    def wireless_models(self):
+        """The models that can be set up over a wireless network, in the order of their names."""
+        contained = _read(self._path("CDInfo")).get("ContainedModel", {})
+        details = _read(self._path("ModelInfo")).get("Model", {})
+        wireless = [name for name in contained
+                    if details.get(name, {}).get("Interfaces", {}).get("WirelessLAN")]
+        if not wireless:
+            raise Unsuitable(f"{self._path('ModelInfo')} has no model with WirelessLAN: the wizard "
+                             "opens the package and shows no page")
+        return sorted(wireless, key=str.lower)
+
+    def unsupported_version(self):
+        """A version of the system that the medium refuses; None where it supports all."""
+        for bound, step in (("SystemMin", -1), ("SystemMax", 1)):
+            try:
+                major = int(self._resources[bound]["Major"])
+            except (KeyError, ValueError):
+                continue
+            if major:
+                return f"{major + step}.0.0"
+        return None
+
+    def _path(self, entry):
+        return self.folder / self._resources.get(entry, "")
+
+
+def _read(path):
+    try:
+        return plistlib.loads(path.read_bytes())
+    except (OSError, plistlib.InvalidFileException, ValueError) as error:
+        raise Unsuitable(f"{path} cannot be read as a property list: {error}") from error

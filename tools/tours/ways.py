@@ -1,0 +1,162 @@
+"""Ways through the wizard, with a picture of everything that there is to see on them."""
+
+from onscreen.person import Person
+from onscreen.processes import wait_for
+
+_LOCALES = {"en": "en_US"}
+_GEAR, _GEAR_REFRESH = "Actions", 2
+_LONGEST_SEARCH = 60  # seconds: five pauses of three, on a machine with much else to do
+
+
+class WentWrong(Exception):
+    """The wizard did not do what it should; says what."""
+
+
+class Tour:
+    """A person on a desktop before a medium's wizard. `network` is the practice network or None."""
+
+    def __init__(self, desktop, medium, pictures, network):
+        self._desktop = desktop
+        self._medium = medium
+        self._text = medium.text
+        self._pictures = pictures
+        self._network = network
+
+    def alert(self):
+        """A system that the medium does not support."""
+        version = self._medium.unsupported_version()
+        if not version:
+            print("The medium supports every system version: there is no alert to see.")
+            return
+        with self._start("--system-version", version) as person:
+            person.see("push button", self._text.get("BTN_CLOSE", "Close"))
+            person.picture(self._pictures / "alert.png")
+            person.press("Return")
+            _expect(person.wait_for_end() == 0 and not self._files(), "the alert's end")
+
+    def usb(self):
+        """Model list, connection type, USB, and the package opens."""
+        model = self._medium.wireless_models()[0]
+        with self._start() as person:
+            chosen = self._to_connection_page(person, model, "usb")
+            cable = next(name for role, name, _ in person.everything()
+                         if role == "radio button" and name != self._text["INST_TXT_WIFI"])
+            person.click("radio button", cable)
+            person.picture(self._pictures / "usb-3-cable.png")
+            person.click("push button", self._text["BTN_NEXT"])
+            self._see_package_open(person, 2 if chosen else 1)
+
+    def wireless(self):
+        """The same by the wireless row: devices are found, are gone, and are found again."""
+        model = next((name for name in self._medium.wireless_models() if " " in name), None)
+        if not model:
+            print("No device can match a model whose name has no blank: "
+                  "the wireless way ends in the set-up tool and is not walked.")
+            return
+        self._make_up_devices(model)
+        with self._start() as person:
+            self._to_connection_page(person, model, "wireless")
+            person.press("Return")
+            self._wait_for_search(person, "wireless-3-search.png")
+            person.see("table cell", model)
+            person.picture(self._pictures / "wireless-4-devices.png")
+
+            person.open_menu(_GEAR)
+            person.picture(self._pictures / "wireless-5-gear.png")
+            person.press("Escape")
+
+            self._let_devices(self._network.remove)
+            person.choose_from_menu(_GEAR, _GEAR_REFRESH)
+            self._wait_for_search(person, "wireless-6-search.png")
+            person.see("label", self._text.get("INST_TXT_ALERT_DEVICENOTFOUND", "Device not found"))
+            person.picture(self._pictures / "wireless-7-not-found.png")
+            person.press("Return")
+            person.see_gone("alert")
+            person.picture(self._pictures / "wireless-8-nothing.png")
+
+            self._let_devices(self._network.add)
+            self._network.settle()
+            person.choose_from_menu(_GEAR, _GEAR_REFRESH)
+            self._wait_for_search(person)
+            person.click("table cell", _second_of(model))
+            person.picture(self._pictures / "wireless-9-choice.png")
+            person.click("push button", self._text["BTN_NEXT"])
+            self._see_package_open(person, 2)
+
+    def _make_up_devices(self, model):
+        maker, kind = model.split(" ", 1)
+        entries = {"maker": maker, "model": kind, "type": self._medium.service_type}
+        for name in (model, _second_of(model), f"{model} (3)"):
+            self._network.add(name, **entries)
+        self._network.add(f"{model} on a cable", activeif=1, **entries)
+        self._network.settle()
+
+    def _let_devices(self, do):
+        for device in self._network.list():
+            do(device["name"])
+
+    def _start(self, *arguments):
+        self._desktop.forget()
+        language = self._medium.language
+        return Person(self._desktop, self._medium.program, arguments,
+                      env={"LANG": f"{_LOCALES.get(language, language)}.UTF-8"})
+
+    def _to_connection_page(self, person, model, way):
+        """Whether a model was chosen on the way; there is no list when all models are alike."""
+        title, list_title = (self._text[key]
+                             for key in ("INST_TXT_CONNECTIONTYPE", "INST_TXT_MODEL"))
+        wait_for(lambda: person.sees("label", title) or person.sees("label", list_title), 20,
+                 "the first page")
+        on_list = person.sees("label", list_title)
+        if on_list:
+            self._choose_model(person, model)
+            person.picture(self._pictures / f"{way}-1-models.png")
+            person.press("Return")
+            person.see("label", title)
+        person.picture(self._pictures / f"{way}-2-connection.png")
+        return on_list
+
+    def _choose_model(self, person, model):
+        """With the keyboard, since the model may be out of sight."""
+        person.see("list item")
+        person.press("Home")
+        while (selected := self._selected_model(person)) != model:
+            person.press("Down")
+            wait_for(lambda: self._selected_model(person) != selected, 10,
+                     f"{model!r} in the list, beyond {selected!r}")
+
+    @staticmethod
+    def _selected_model(person):
+        return wait_for(lambda: next(
+            (name for role, name, item in person.everything()
+             if role == "list item" and person.has_state(item, "selected")), None),
+            10, "a selected model")
+
+    def _wait_for_search(self, person, picture=None):
+        person.see("label", self._text["INST_WAIT"])
+        if picture:
+            person.picture(self._pictures / picture)
+        person.see_gone("label", self._text["INST_WAIT"], _LONGEST_SEARCH)
+
+    def _see_package_open(self, person, files):
+        status = person.wait_for_end()
+        _expect(status == 0, f"the wizard ended with status {status}")
+        for file in self._files():
+            print(f"\n{file.name}:\n{file.read_text(encoding='utf-8')}", end="")
+        _expect(len(self._files()) == files, f"the wizard did not write {files} hand-off file(s)")
+        _expect(self._desktop.opened(), "the wizard did not open the package")
+        print("\nopened: " + "\n".join(self._desktop.opened()))
+
+    def _files(self):
+        """The hand-off files, those for all users first."""
+        return sorted(self._desktop.local_folder.glob("*/*.plist")) + sorted(
+            self._desktop.user_folder.glob("*/*.plist"))
+
+
+def _second_of(model):
+    return f"{model} (2)"
+
+
+def _expect(condition, what):
+    if not condition:
+        raise WentWrong(what)
