@@ -33,6 +33,9 @@ Termination& termination() {
   return *instance;
 }
 
+// Whether the modal loop that runs was asked to end. Main thread only.
+bool isModalAborted = false;
+
 // A modal loop looks whether it was stopped when it has handled an event.
 void wakeEventLoop() {
   [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
@@ -86,13 +89,19 @@ void performOnMainThread(std::function<void()> action) {
   }
 }
 
+// The platform ends a modal loop for reasons of its own as well, such as a key that cancels; the
+// window is then still waited for.
 void runModalForWindow(const Window& window) {
   window.makeKeyAndOrderFront();
-  if (NSWindow* const modal = cocoa::nativeOf<NSWindow>(window)) [NSApp runModalForWindow:modal];
+  NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
+  isModalAborted = !modal;
+  while (!isModalAborted)
+    [NSApp runModalForWindow:modal];
 }
 
 void abortModal() {
   performOnMainThread([] {
+    isModalAborted = true;
     [NSApp stopModalWithCode:NSModalResponseAbort];
     wakeEventLoop();
   });

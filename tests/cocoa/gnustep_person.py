@@ -1,6 +1,7 @@
 """A person at the screen of the front end for Cocoa when it runs on GNUstep.
 
-Nothing there speaks AT-SPI. The program writes down what can be seen instead, by the same roles.
+Nothing there speaks AT-SPI. The program writes down what can be seen instead, by the same roles,
+when it is asked.
 """
 
 import json
@@ -13,6 +14,7 @@ from onscreen.processes import start, wait_for
 
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
 _LOOK_SECONDS = 20
+_ANSWER_SECONDS = 60
 _MENU_BAR_ITEM = "Onramp OSX"
 
 
@@ -24,10 +26,10 @@ class GNUstepPerson(Person):
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
         folder = pathlib.Path(desktop.env["HOME"])
-        self._seen = folder / "accessibility.json"
-        self._seen.unlink(missing_ok=True)
+        self._answer = folder / "accessibility.json"
+        self._question = folder / "accessibility.json.question"
         variables = {
-            "ONRAMP_ACCESSIBILITY_FILE": str(self._seen),
+            "ONRAMP_ACCESSIBILITY_FILE": str(self._answer),
             "GNUSTEP_CONFIG_FILE": str(self._configure(folder)),
             # Strings tables in UTF-8 are read in the locale's encoding.
             "LC_CTYPE": "C.UTF-8",
@@ -49,8 +51,14 @@ class GNUstepPerson(Person):
 
     def click_control(self, control):
         self._point_at(control)
-        # What is let go of in the moment of its pressing, GNUstep may see let go of first.
-        self.desktop.run(["xdotool", "mousedown", "1", "sleep", "0.1", "mouseup", "1"])
+        self.desktop.run(["xdotool", "mousedown", "1"])
+        self._wait_until_noticed()
+        self.desktop.run(["xdotool", "mouseup", "1"])
+
+    def _wait_until_noticed(self):
+        """What is let go of before its pressing was noticed, GNUstep sees let go of first."""
+        for _ in range(3):
+            self._read()
 
     def choose_from_menu(self, button, item):
         """Takes a button's `item`th menu entry. The menu is open as long as the button is held."""
@@ -58,7 +66,8 @@ class GNUstepPerson(Person):
         self.desktop.run(["xdotool", "mousedown", "1"])
         entries = wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
         self._point_at(entries[item - 1])
-        self.desktop.run(["xdotool", "sleep", "0.1", "mouseup", "1"])
+        self._wait_until_noticed()
+        self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):
         """The entries of the menu that is open; the menu bar has one of its own."""
@@ -88,8 +97,13 @@ class GNUstepPerson(Person):
                      if control["role"] == role and name in (None, control["name"])), None)
 
     def _read(self):
+        """What is on the screen; blocks as long as the program's loop does."""
+        self._answer.unlink(missing_ok=True)
+        self._question.touch()
+        wait_for(lambda: self._answer.exists() or not self.is_running(), _ANSWER_SECONDS,
+                 "an answer from the program")
         try:
-            return json.loads(self._seen.read_text(encoding="utf-8"))
+            return json.loads(self._answer.read_text(encoding="utf-8"))
         except FileNotFoundError:
             return []
 

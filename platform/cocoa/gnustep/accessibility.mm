@@ -1,14 +1,20 @@
 // What is on the screen, for programs that use the application from outside: GNUstep tells
-// assistive programs nothing. When ONRAMP_ACCESSIBILITY_FILE names a file, it holds all controls
-// that can be seen, as a JSON array of objects with role, name, states and frame (x, y, width and
-// height in pixels from the screen's upper left corner). Roles and states have the names that
-// AT-SPI gives them.
+// assistive programs nothing. Where ONRAMP_ACCESSIBILITY_FILE names a file, whoever wants to know
+// makes the file of that name with ".question" added to it. The application's loop takes the
+// question away and writes the answer: all controls that can be seen, as a JSON array of objects
+// with role, name, states and frame (x, y, width and height in pixels from the screen's upper left
+// corner). Roles and states have the names that AT-SPI gives them.
+
+#include <unistd.h>
+
+#include <string>
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
+#import "platform/cocoa/text.h"
 
 namespace {
 
-constexpr NSTimeInterval kInterval = 0.05;  // seconds
+constexpr NSTimeInterval kInterval = 0.02;  // seconds
 
 NSString* joined(NSString* first, NSString* second) {
   return [second length] > 0 ? second : first;
@@ -22,8 +28,8 @@ class Reader {
   void readWindow() {
     const bool isActive = [NSApp isActive] && [window_ isKeyWindow];
     NSView* const frame = [[window_ contentView] superview];
-    add(@"frame", [window_ title],
-        isActive ? [NSArray arrayWithObject:@"active"] : [NSArray array], frame, [frame bounds]);
+    add(@"frame", [window_ title], isActive ? [NSArray arrayWithObject:@"active"] : [NSArray array],
+        frame, [frame bounds]);
     read(frame);
   }
 
@@ -142,8 +148,8 @@ class Reader {
 }  // namespace
 
 @interface OnrampAccessibility : NSObject {
-  NSString* _path;
-  NSData* _written;
+  NSString* _answer;
+  std::string _question;
 }
 @end
 
@@ -155,7 +161,8 @@ class Reader {
         [[[NSProcessInfo processInfo] environment] objectForKey:@"ONRAMP_ACCESSIBILITY_FILE"];
     if (!path) return;
     OnrampAccessibility* const writer = [[[OnrampAccessibility alloc] init] autorelease];
-    writer->_path = [path retain];
+    writer->_answer = [path retain];
+    writer->_question = onramp::cocoa::toStdString(path) + ".question";
     [[NSNotificationCenter defaultCenter] addObserver:[writer retain]
                                              selector:@selector(begin:)
                                                  name:NSApplicationWillFinishLaunchingNotification
@@ -166,7 +173,7 @@ class Reader {
 - (void)begin:(NSNotification*)notification {
   NSTimer* const timer = [NSTimer timerWithTimeInterval:kInterval
                                                  target:self
-                                               selector:@selector(write:)
+                                               selector:@selector(answer:)
                                                userInfo:nil
                                                 repeats:YES];
   for (NSString *mode in [NSArray arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode,
@@ -175,17 +182,14 @@ class Reader {
   }
 }
 
-- (void)write:(NSTimer*)timer {
+- (void)answer:(NSTimer*)timer {
+  if (unlink(_question.c_str()) != 0) return;
   NSMutableArray* const found = [NSMutableArray array];
   for (NSWindow* window in [NSApp windows]) {
     if ([window isVisible]) Reader(window, found).readWindow();
   }
-  NSData* const text = [NSJSONSerialization dataWithJSONObject:found options:0 error:nullptr];
-  if ([text isEqualToData:_written]) return;
-  if ([text writeToFile:_path atomically:YES]) {
-    [_written release];
-    _written = [text retain];
-  }
+  [[NSJSONSerialization dataWithJSONObject:found options:0
+                                     error:nullptr] writeToFile:_answer atomically:YES];
 }
 
 @end

@@ -7,9 +7,15 @@
 namespace {
 
 using BeginSheet = void(id, SEL, NSWindow*, id, SEL, void*);
-using OpenURL = BOOL(id, SEL, NSURL*);
+using PerformKey = BOOL(id, SEL, NSEvent*);
 
 BeginSheet* originalBeginSheet = nullptr;
+PerformKey* originalPerformKey = nullptr;
+
+// Buttons that cannot be seen take no keys.
+BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
+  return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
+}
 
 // A window of fixed size shows no resize indicator, and no window prevents termination here.
 void ignore(id, SEL, BOOL) {}
@@ -81,6 +87,8 @@ BOOL openURL(id, SEL, NSURL* url) {
     originalBeginSheet = replaceMethod(
         [NSAlert class],
         @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:), beginSheet);
+    originalPerformKey =
+        replaceMethod([NSButton class], @selector(performKeyEquivalent:), performKeyEquivalent);
     replaceMethod([NSWorkspace class], @selector(openURL:), openURL);
     onramp::gnustep::addMethod([NSWindow class], @selector(setShowsResizeIndicator:), ignore);
     onramp::gnustep::addMethod([NSWindow class],
