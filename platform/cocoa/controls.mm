@@ -29,7 +29,7 @@ int RadioMatrix::selectedRow() const {
 void ImageView::setImage(const Image& image) const {
   const auto picture =
       Retained<NSImage>::adopt([[NSImage alloc] initByReferencingFile:toNSString(image.path)]);
-  [nativeOf<NSImageView>(*this) setImage:[picture.get() isValid] ? picture.get() : nil];
+  [nativeOf<NSImageView>(*this) setImage:picture.get()];
 }
 
 void ImageView::setImageScaling(ImageScaling scaling) const {
