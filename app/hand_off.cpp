@@ -7,8 +7,8 @@
 #include "media/text_order.h"
 #include "platform/bundle.h"
 #include "platform/folders.h"
-#include "platform/locale.h"
 #include "platform/property_list.h"
+#include "platform/user_locale.h"
 
 namespace onramp {
 

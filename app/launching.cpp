@@ -7,8 +7,8 @@
 #include "media/text_order.h"
 #include "platform/bundle.h"
 #include "platform/child_process.h"
-#include "platform/locale.h"
 #include "platform/run_loop.h"
+#include "platform/user_locale.h"
 #include "platform/workspace.h"
 
 namespace onramp {

@@ -4,9 +4,12 @@
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
 
+set_target_properties(onramp PROPERTIES
+  OUTPUT_NAME "Onramp OSX"
+  RUNTIME_OUTPUT_DIRECTORY "${onramp_contents}/Linux")
 configure_file(${PROJECT_SOURCE_DIR}/resources/Info.plist.in ${PROJECT_BINARY_DIR}/Info.plist @ONLY)
 file(GLOB onramp_languages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.lproj)
-file(GLOB onramp_interfaces CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/qt/*.ui)
+file(GLOB onramp_interfaces CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/${ONRAMP_UI}/*.*)
 
 set(copy_languages)
 foreach(folder IN LISTS onramp_languages)

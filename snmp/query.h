@@ -58,6 +58,7 @@ class snmp_table_request {
   explicit snmp_table_request(mib_table& table);
   snmp_table_request(const snmp_table_request&) = delete;
   snmp_table_request& operator=(const snmp_table_request&) = delete;
+  ~snmp_table_request() = default;
 
   /// To be sent, and to be decoded into. Its `request_id` is the caller's to set.
   [[nodiscard]] snmp_message& message() { return message_; }

@@ -8,8 +8,8 @@
 #include "platform/freedesktop/language.h"
 #include "platform/freedesktop/main_bundle.h"
 #include "platform/freedesktop/strings_table.h"
-#include "platform/locale.h"
 #include "platform/property_list.h"
+#include "platform/user_locale.h"
 
 namespace onramp {
 

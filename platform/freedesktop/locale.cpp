@@ -1,9 +1,8 @@
-#include "platform/locale.h"
-
 #include <cstdlib>
 #include <string_view>
 
 #include "platform/freedesktop/language.h"
+#include "platform/user_locale.h"
 
 namespace onramp {
 

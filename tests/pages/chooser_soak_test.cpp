@@ -32,12 +32,12 @@ class ChooserSoak : public Wizard {
     bool wireless = false;
   };
 
-  ChooserSoak() {
+  void SetUp() override {
+    Wizard::SetUp();
     Network::instance().reset();
     Agents::instance().reset();
     const Dictionary model = recording::model(true, false, true);
-    describe(
-        {{"Kestrel Model 100", model}, {"Kestrel Scan", recording::model(true, true, false)}});
+    describe({{"Kestrel Model 100", model}, {"Kestrel Scan", recording::model(true, true, false)}});
   }
 
   [[nodiscard]] int random(int below) {
@@ -163,7 +163,7 @@ class ChooserSoak : public Wizard {
 
 TEST_F(ChooserSoak, TheListIsWhatTheRulesGiveAndEveryWaitEnds) {
   const char* const wanted = std::getenv("ONRAMP_SOAK_EVENTS");
-  const int count = wanted ? std::atoi(wanted) : 1000;
+  const int count = wanted ? static_cast<int>(std::strtol(wanted, nullptr, 10)) : 1000;
   for (unsigned seed = 1; seed <= 3; ++seed) {
     SCOPED_TRACE(seed);
     run(seed, count);

@@ -28,7 +28,8 @@ Dictionary device(const std::string& name, const Array& addresses = {"192.0.2.1"
 
 class Chooser : public Wizard {
  protected:
-  Chooser() {
+  void SetUp() override {
+    Wizard::SetUp();
     agents.reset();
     network.reset();
     for (const char* address : {"192.0.2.1", "192.0.2.2", "192.0.2.3"})
@@ -38,7 +39,10 @@ class Chooser : public Wizard {
     page = std::static_pointer_cast<ChooseDeviceView>(delegate->loadView("ChooseDeviceView"));
     page->setSearchModelList({"Kestrel Model 50", "Kestrel Model 100"});
   }
-  ~Chooser() override { page->stopBrowsing(); }
+  void TearDown() override {
+    page->stopBrowsing();
+    Wizard::TearDown();
+  }
 
   /// "name address" of every row from the top, the selected one with a star.
   [[nodiscard]] std::vector<std::string> rows() const {

@@ -8,8 +8,8 @@
 #include "platform/child_process.h"
 #include "platform/folders.h"
 #include "platform/freedesktop/stand_in_system.h"
-#include "platform/locale.h"
 #include "platform/system_version.h"
+#include "platform/user_locale.h"
 #include "platform/workspace.h"
 #include "tests/recording/medium_folder.h"
 

@@ -36,8 +36,8 @@ KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "
 PRINTER = "_pdl-datastream._tcp"
 # Left to chance alone, most walks would end early and few would get far. There is no task bar that
 # could bring a hidden window back.
-WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2, "Quit": 0.1,
-           "Next": 4, "Actions": 2}
+WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
+           "Quit": 0.1, "Next": 4, "Actions": 2}
 # None of these leaves a question unanswered, for which the wizard would have to wait.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
 
@@ -83,7 +83,7 @@ class Walk:
                                      (8, 5, 5, 0.3))[0]
             try:
                 step(person)
-            except (TimeoutError, person.errors):
+            except (TimeoutError, *person.errors):
                 pass  # What was to be clicked has gone meanwhile.
             self.listen(person, self.dice.choice((0, 0.1, 1)))
             self.check_files()

@@ -121,7 +121,7 @@ class WirelessWays(WayTest):
         self.assert_handed_on(person, name, "127.0.90.1")
 
     def test_only_matching_wireless_devices_are_listed(self):
-        others = {"on the cable": {"activeif": WIRED}, "without agent": {"activeif": "closed"},
+        others = {"on the cable": {"activeif": WIRED},
                   "without the object": {"activeif": "missing"}, "with a text": {"activeif": "text"},
                   "of another maker": {"maker": "Heron"}, "in small letters": {"maker": "kestrel"},
                   "in capital letters": {"model": self.kind.upper()},

@@ -21,7 +21,7 @@ class Person:
         gi.require_version("Atspi", "2.0")
         from gi.repository import Atspi, GLib
         self._atspi = Atspi
-        self.errors = GLib.Error  # what the use of a control raises that is gone
+        self.errors = GLib.Error, AttributeError  # what the use of a control raises that is gone
         self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 
@@ -137,7 +137,7 @@ class Person:
             frame = self._application().get_child_at_index(0)
             frame.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
             return time.monotonic() - began - (waited() - waited_before)
-        except (AttributeError, OSError, self.errors):
+        except (OSError, *self.errors):
             return time.monotonic() - began if self.is_running() else None
 
     def _window_count(self):

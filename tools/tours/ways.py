@@ -61,12 +61,10 @@ class Tour:
             person.see("table cell", model)
             person.picture(self._pictures / "wireless-4-devices.png")
 
+            self._let_devices(self._network.remove)
             person.open_menu(_GEAR)
             person.picture(self._pictures / "wireless-5-gear.png")
-            person.press("Escape")
-
-            self._let_devices(self._network.remove)
-            person.choose_from_menu(_GEAR, _GEAR_REFRESH)
+            person.press(*["Down"] * _GEAR_REFRESH, "Return")
             self._wait_for_search(person, "wireless-6-search.png")
             person.see("label", self._text.get("INST_TXT_ALERT_DEVICENOTFOUND", "Device not found"))
             person.picture(self._pictures / "wireless-7-not-found.png")

@@ -1,0 +1,16 @@
+#pragma once
+
+#import <Foundation/Foundation.h>
+
+#include <functional>
+
+/// A function as the target of controls, menu items, timers and messages to other threads.
+@interface OnrampAction : NSObject {
+  std::function<void()> _function;
+}
+
++ (OnrampAction*)actionWithFunction:(std::function<void()>)function;
+
+- (void)perform:(id)sender;
+
+@end

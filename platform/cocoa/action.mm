@@ -1,0 +1,19 @@
+#import "platform/cocoa/action.h"
+
+#include <utility>
+
+@implementation OnrampAction
+
++ (OnrampAction*)actionWithFunction:(std::function<void()>)function {
+  OnrampAction* const action = [[[OnrampAction alloc] init] autorelease];
+  action->_function = std::move(function);
+  return action;
+}
+
+// The function may let go of the last reference to this object.
+- (void)perform:(id)sender {
+  [[self retain] autorelease];
+  _function();
+}
+
+@end

@@ -1,0 +1,93 @@
+#include "platform/application.h"
+
+#include <cstdio>
+
+#include "platform/bundle.h"
+#import "platform/cocoa/native.h"
+#import "platform/cocoa/retained.h"
+#import "platform/cocoa/termination.h"
+
+/// Passes on to the controller what the application and its window ask and tell.
+@interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
+  onramp::ApplicationDelegate* _delegate;
+}
+@end
+
+@implementation OnrampDelegate
+
+- (instancetype)initWithDelegate:(onramp::ApplicationDelegate&)delegate {
+  self = [super init];
+  if (self) _delegate = &delegate;
+  return self;
+}
+
+- (void)applicationWillFinishLaunching:(NSNotification*)notification {
+  _delegate->applicationWillFinishLaunching();
+}
+
+- (void)applicationDidFinishLaunching:(NSNotification*)notification {
+  _delegate->applicationDidFinishLaunching();
+}
+
+- (BOOL)applicationShouldTerminateAfterLastWindowClosed:(NSApplication*)application {
+  return _delegate->applicationShouldTerminateAfterLastWindowClosed();
+}
+
+- (BOOL)applicationSupportsSecureRestorableState:(NSApplication*)application {
+  return YES;
+}
+
+- (void)applicationWillTerminate:(NSNotification*)notification {
+  onramp::cocoa::wakeSleepersForTermination();
+}
+
+- (BOOL)windowShouldClose:(NSWindow*)window {
+  return _delegate->windowShouldClose(onramp::Window(onramp::cocoa::toNative(window)));
+}
+
+@end
+
+namespace onramp {
+
+using cocoa::Retained;
+
+// The arguments are the platform's: it reads its own options from them.
+int runApplication(int, char**, const std::string& mainInterfaceName,
+                   const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate) {
+  @autoreleasepool {
+    NSApplication* const application = [NSApplication sharedApplication];
+    const std::unique_ptr<ApplicationDelegate> delegate = makeDelegate();
+    const std::unique_ptr<Interface> mainInterface = Interface::load(mainInterfaceName, *delegate);
+    if (!mainInterface) {
+      std::fprintf(stderr, "%s: no interface file %s; copy the application anew\n",
+                   Bundle::main().path().c_str(), mainInterfaceName.c_str());
+      return 1;
+    }
+    const auto listener =
+        Retained<OnrampDelegate>::adopt([[OnrampDelegate alloc] initWithDelegate:*delegate]);
+    [application setDelegate:listener.get()];
+    [cocoa::nativeOf<NSWindow>(mainInterface->outlet<Window>("window")) setDelegate:listener.get()];
+    delegate->setOutlets(*mainInterface);
+    delegate->awakeFromNib();
+    [application run];
+    return 0;
+  }
+}
+
+void terminateApplication() {
+  [NSApp terminate:nil];
+}
+
+void hideApplication() {
+  [NSApp hide:nil];
+}
+
+void unhideApplication() {
+  [NSApp unhideWithoutActivation];
+}
+
+void activateIgnoringOtherApps() {
+  [NSApp activateIgnoringOtherApps:YES];
+}
+
+}  // namespace onramp

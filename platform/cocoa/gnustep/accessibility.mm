@@ -1,0 +1,195 @@
+// What is on the screen, for programs that use the application from outside: GNUstep tells
+// assistive programs nothing. Where ONRAMP_ACCESSIBILITY_FILE names a file, whoever wants to know
+// makes the file of that name with ".question" added to it. The application's loop takes the
+// question away and writes the answer: all controls that can be seen, as a JSON array of objects
+// with role, name, states and frame (x, y, width and height in pixels from the screen's upper left
+// corner). Roles and states have the names that AT-SPI gives them.
+
+#include <unistd.h>
+
+#include <string>
+
+#import "platform/cocoa/gnustep/appkit_additions.h"
+#import "platform/cocoa/text.h"
+
+namespace {
+
+constexpr NSTimeInterval kInterval = 0.02;  // seconds
+
+NSString* joined(NSString* first, NSString* second) {
+  return [second length] > 0 ? second : first;
+}
+
+// The controls of one window.
+class Reader {
+ public:
+  Reader(NSWindow* window, NSMutableArray* found) : window_(window), found_(found) {}
+
+  void readWindow() {
+    const bool isActive = [NSApp isActive] && [window_ isKeyWindow];
+    NSView* const frame = [[window_ contentView] superview];
+    add(@"frame", [window_ title], isActive ? [NSArray arrayWithObject:@"active"] : [NSArray array],
+        frame, [frame bounds]);
+    read(frame);
+  }
+
+ private:
+  void read(NSView* view) {
+    if ([view isHidden] || NSIsEmptyRect([view visibleRect])) return;
+    if ([view isKindOfClass:[NSTableView class]]) {
+      readTable(static_cast<NSTableView*>(view));
+    } else if ([view isKindOfClass:[NSTableHeaderView class]]) {
+      readHeader(static_cast<NSTableHeaderView*>(view));
+    } else if ([view isKindOfClass:[NSMatrix class]]) {
+      readMatrix(static_cast<NSMatrix*>(view));
+    } else if ([view isKindOfClass:[NSMenuView class]]) {
+      readMenu(static_cast<NSMenuView*>(view));
+    } else {
+      readControl(view);
+      for (NSView* subview in [view subviews])
+        read(subview);
+    }
+  }
+
+  void readControl(NSView* view) {
+    NSMutableArray* const states = [NSMutableArray array];
+    const bool isControl = [view isKindOfClass:[NSControl class]];
+    if (isControl && [static_cast<NSControl*>(view) isEnabled]) [states addObject:@"enabled"];
+    if ([window_ firstResponder] == view) [states addObject:@"focused"];
+    if ([view isKindOfClass:[NSPopUpButton class]]) {
+      add(@"button menu", joined([static_cast<NSPopUpButton*>(view) title], [view toolTip]), states,
+          view, [view bounds]);
+    } else if ([view isKindOfClass:[NSButton class]]) {
+      add(@"push button", [static_cast<NSButton*>(view) title], states, view, [view bounds]);
+    } else if ([view isKindOfClass:[NSTextField class]]) {
+      add(@"label", [static_cast<NSTextField*>(view) stringValue], states, view, [view bounds]);
+    } else if ([view isKindOfClass:[NSTextView class]]) {
+      add(@"label", [static_cast<NSTextView*>(view) string], states, view, [view bounds]);
+    } else if ([view isKindOfClass:[NSProgressIndicator class]]) {
+      add(@"progress bar", @"", states, view, [view bounds]);
+    }
+  }
+
+  // A row of a list is an item; a row of a table with headers is one for each column.
+  void readTable(NSTableView* table) {
+    NSString* const role = [table headerView] ? @"table cell" : @"list item";
+    const NSRange rows = [table rowsInRect:[table visibleRect]];
+    for (NSUInteger row = rows.location; row < NSMaxRange(rows); ++row) {
+      NSMutableArray* const states = [NSMutableArray array];
+      if ([table isEnabled]) [states addObject:@"enabled"];
+      if ([table isRowSelected:static_cast<NSInteger>(row)]) {
+        [states addObject:@"selected"];
+        if ([window_ firstResponder] == table) [states addObject:@"focused"];
+      }
+      NSInteger column = 0;
+      for (NSTableColumn* tableColumn in [table tableColumns]) {
+        id const text = [[table dataSource] tableView:table
+                            objectValueForTableColumn:tableColumn
+                                                  row:static_cast<NSInteger>(row)];
+        add(role, text, states, table,
+            [table frameOfCellAtColumn:column++ row:static_cast<NSInteger>(row)]);
+      }
+    }
+  }
+
+  void readHeader(NSTableHeaderView* header) {
+    NSInteger index = 0;
+    for (NSTableColumn* column in [[header tableView] tableColumns]) {
+      add(@"column header", [[column headerCell] stringValue], [NSArray array], header,
+          [header headerRectOfColumn:index++]);
+    }
+  }
+
+  void readMatrix(NSMatrix* matrix) {
+    for (NSInteger row = 0; row < [matrix numberOfRows]; ++row) {
+      NSButtonCell* const cell = [matrix cellAtRow:row column:0];
+      NSMutableArray* const states = [NSMutableArray array];
+      if ([matrix isEnabled] && [cell isEnabled]) [states addObject:@"enabled"];
+      if ([cell state] == NSOnState) [states addObject:@"checked"];
+      if ([window_ firstResponder] == matrix && [matrix selectedRow] == row) {
+        [states addObject:@"focused"];
+      }
+      add(@"radio button", [cell title], states, matrix, [matrix cellFrameAtRow:row column:0]);
+    }
+  }
+
+  void readMenu(NSMenuView* view) {
+    NSInteger index = 0;
+    for (NSMenuItem* item in [[view menu] itemArray]) {
+      const NSRect frame = [view rectOfItemAtIndex:index++];
+      if ([item isSeparatorItem]) continue;
+      NSArray* const states =
+          [item isEnabled] ? [NSArray arrayWithObject:@"enabled"] : [NSArray array];
+      add(@"menu item", [item title], states, view, frame);
+    }
+  }
+
+  void add(NSString* role, NSString* name, NSArray* states, NSView* view, NSRect rect) {
+    NSRect frame = [view convertRect:NSIntersectionRect(rect, [view visibleRect]) toView:nil];
+    if (NSIsEmptyRect(frame)) return;
+    frame.origin = [window_ convertBaseToScreen:frame.origin];
+    const CGFloat screenHeight = NSMaxY([[NSScreen mainScreen] frame]);
+    [found_ addObject:[NSDictionary
+                          dictionaryWithObjectsAndKeys:role, @"role", name ? name : @"", @"name",
+                                                       states, @"states", number(NSMinX(frame)),
+                                                       @"x", number(screenHeight - NSMaxY(frame)),
+                                                       @"y", number(NSWidth(frame)), @"width",
+                                                       number(NSHeight(frame)), @"height", nil]];
+  }
+
+  static NSNumber* number(CGFloat value) {
+    return [NSNumber numberWithLong:static_cast<long>(value)];
+  }
+
+  NSWindow* window_;
+  NSMutableArray* found_;
+};
+
+}  // namespace
+
+@interface OnrampAccessibility : NSObject {
+  NSString* _answer;
+  std::string _question;
+}
+@end
+
+@implementation OnrampAccessibility
+
++ (void)load {
+  @autoreleasepool {
+    NSString* const path =
+        [[[NSProcessInfo processInfo] environment] objectForKey:@"ONRAMP_ACCESSIBILITY_FILE"];
+    if (!path) return;
+    OnrampAccessibility* const writer = [[[OnrampAccessibility alloc] init] autorelease];
+    writer->_answer = [path retain];
+    writer->_question = onramp::cocoa::toStdString(path) + ".question";
+    [[NSNotificationCenter defaultCenter] addObserver:[writer retain]
+                                             selector:@selector(begin:)
+                                                 name:NSApplicationWillFinishLaunchingNotification
+                                               object:nil];
+  }
+}
+
+- (void)begin:(NSNotification*)notification {
+  NSTimer* const timer = [NSTimer timerWithTimeInterval:kInterval
+                                                 target:self
+                                               selector:@selector(answer:)
+                                               userInfo:nil
+                                                repeats:YES];
+  for (NSString *mode in [NSArray arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode,
+                                                   NSEventTrackingRunLoopMode, nil]) {
+    [[NSRunLoop currentRunLoop] addTimer:timer forMode:mode];
+  }
+}
+
+- (void)answer:(NSTimer*)timer {
+  if (unlink(_question.c_str()) != 0) return;
+  NSMutableArray* const found = [NSMutableArray array];
+  for (NSWindow* window in [NSApp windows]) {
+    if ([window isVisible]) Reader(window, found).readWindow();
+  }
+  [[NSJSONSerialization dataWithJSONObject:found options:0
+                                     error:nullptr] writeToFile:_answer atomically:YES];
+}
+
+@end

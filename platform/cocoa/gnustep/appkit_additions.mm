@@ -1,0 +1,100 @@
+// The rest of what GNUstep's AppKit lacks.
+
+#import "platform/cocoa/gnustep/appkit_additions.h"
+
+#import "platform/cocoa/gnustep/method_exchange.h"
+
+namespace {
+
+using BeginSheet = void(id, SEL, NSWindow*, id, SEL, void*);
+using PerformKey = BOOL(id, SEL, NSEvent*);
+
+BeginSheet* originalBeginSheet = nullptr;
+PerformKey* originalPerformKey = nullptr;
+
+// Buttons that cannot be seen take no keys.
+BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
+  return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
+}
+
+// A window of fixed size shows no resize indicator, and no window prevents termination here.
+void ignore(id, SEL, BOOL) {}
+
+}  // namespace
+
+/// A sheet that waits for its turn.
+@interface OnrampWaitingSheet : NSObject {
+ @public
+  NSAlert* _alert;
+  NSWindow* _window;
+  id _delegate;
+  SEL _didEnd;
+}
+@end
+
+@implementation OnrampWaitingSheet
+
+- (void)begin {
+  originalBeginSheet(_alert,
+                     @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:),
+                     _window, _delegate, _didEnd, nullptr);
+}
+
+- (void)dealloc {
+  [_alert release];
+  [_window release];
+  [super dealloc];
+}
+
+@end
+
+namespace {
+
+// GNUstep runs a sheet before it returns to who asked for it.
+void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) {
+  OnrampWaitingSheet* const sheet = [[[OnrampWaitingSheet alloc] init] autorelease];
+  sheet->_alert = [self retain];
+  sheet->_window = [window retain];
+  sheet->_delegate = delegate;
+  sheet->_didEnd = didEnd;
+  [sheet performSelector:@selector(begin) withObject:nil afterDelay:0];
+}
+
+// GNUstep's workspace knows GNUstep's programs only; the desktop's opener knows all.
+BOOL openURL(id, SEL, NSURL* url) {
+  NSTask* const task = [[[NSTask alloc] init] autorelease];
+  NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
+  [task setLaunchPath:@"/usr/bin/env"];
+  [task setArguments:[NSArray arrayWithObjects:@"xdg-open", address, nil]];
+  @try {
+    [task launch];
+  } @catch (NSException*) {
+    return NO;
+  }
+  return YES;
+}
+
+}  // namespace
+
+@interface OnrampAppKitAdditions : NSObject
+@end
+
+@implementation OnrampAppKitAdditions
+
++ (void)load {
+  @autoreleasepool {
+    using onramp::gnustep::replaceMethod;
+    originalBeginSheet = replaceMethod(
+        [NSAlert class],
+        @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:), beginSheet);
+    originalPerformKey =
+        replaceMethod([NSButton class], @selector(performKeyEquivalent:), performKeyEquivalent);
+    replaceMethod([NSWorkspace class], @selector(openURL:), openURL);
+    onramp::gnustep::addMethod([NSWindow class], @selector(setShowsResizeIndicator:), ignore);
+    onramp::gnustep::addMethod([NSWindow class],
+                               @selector(setPreventsApplicationTerminationWhenModal:), ignore);
+    [NSButton exposeBinding:@"title"];
+  }
+}
+
+@end

@@ -1,0 +1,78 @@
+// Views that know the identifiers of their interface files.
+
+#import "platform/cocoa/gnustep/appkit_additions.h"
+#import "platform/cocoa/gnustep/method_exchange.h"
+
+namespace {
+
+using InitWithCoder = id(id, SEL, NSCoder*);
+using Dealloc = void(id, SEL);
+
+InitWithCoder* originalViewInit = nullptr;
+InitWithCoder* originalCustomViewInit = nullptr;
+Dealloc* originalDealloc = nullptr;
+
+// Identifiers by view; a view takes its own out when it goes.
+NSMapTable* identifiers() {
+  static NSMapTable* const table =
+      NSCreateMapTable(NSNonOwnedPointerMapKeyCallBacks, NSObjectMapValueCallBacks, 64);
+  return table;
+}
+
+id identified(id view, NSCoder* coder) {
+  if ([coder allowsKeyedCoding] && [coder containsValueForKey:@"identifier"]) {
+    [view setIdentifier:[coder decodeObjectForKey:@"identifier"]];
+  }
+  return view;
+}
+
+id viewInit(id self, SEL selector, NSCoder* coder) {
+  return identified(originalViewInit(self, selector, coder), coder);
+}
+
+// A custom view is made in the place of the object that is decoded.
+id customViewInit(id self, SEL selector, NSCoder* coder) {
+  return identified(originalCustomViewInit(self, selector, coder), coder);
+}
+
+void dealloc(id self, SEL selector) {
+  NSMapRemove(identifiers(), self);
+  originalDealloc(self, selector);
+}
+
+}  // namespace
+
+@implementation NSView (OnrampIdentification)
+
+- (NSString*)identifier {
+  return static_cast<NSString*>(NSMapGet(identifiers(), self));
+}
+
+- (void)setIdentifier:(NSString*)identifier {
+  if (identifier) {
+    NSMapInsert(identifiers(), self, identifier);
+  } else {
+    NSMapRemove(identifiers(), self);
+  }
+}
+
+// GNUstep tells assistive programs nothing.
+- (void)setAccessibilityLabel:(NSString*)label {
+}
+
+@end
+
+@interface OnrampViewIdentifiers : NSObject
+@end
+
+@implementation OnrampViewIdentifiers
+
++ (void)load {
+  using onramp::gnustep::replaceMethod;
+  originalViewInit = replaceMethod([NSView class], @selector(initWithCoder:), viewInit);
+  originalCustomViewInit =
+      replaceMethod(NSClassFromString(@"NSCustomView"), @selector(initWithCoder:), customViewInit);
+  originalDealloc = replaceMethod([NSView class], @selector(dealloc), dealloc);
+}
+
+@end

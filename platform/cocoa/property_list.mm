@@ -1,0 +1,152 @@
+#include "platform/property_list.h"
+
+#include <cstring>
+#include <utility>
+
+#import "platform/cocoa/property_list.h"
+#import "platform/cocoa/text.h"
+
+namespace onramp {
+
+namespace {
+
+constexpr unsigned long long kMostBytes = 16U << 20U;
+constexpr int kDeepestNesting = 128;
+constexpr int kMostObjects = 1 << 18;
+
+// Turns a property list into a value, as far as the limits go.
+class Reader {
+ public:
+  std::optional<Value> read(id object, int depth) {
+    if (depth > kDeepestNesting || ++objects_ > kMostObjects) return std::nullopt;
+    if ([object isKindOfClass:[NSString class]]) return Value(cocoa::toStdString(object));
+    if ([object isKindOfClass:[NSNumber class]]) return number(object);
+    if ([object isKindOfClass:[NSDictionary class]]) return dictionary(object, depth);
+    if ([object isKindOfClass:[NSArray class]]) return array(object, depth);
+    if ([object isKindOfClass:[NSData class]]) return data(object);
+    if ([object isKindOfClass:[NSDate class]]) {
+      return Value(Date{[object timeIntervalSinceReferenceDate]});
+    }
+    return std::nullopt;
+  }
+
+ private:
+  // The two booleans are objects of their own; every other number says by its type what it is.
+  static Value number(NSNumber* number) {
+    if (number == [NSNumber numberWithBool:YES]) return Value(true);
+    if (number == [NSNumber numberWithBool:NO]) return Value(false);
+    const char* const type = [number objCType];
+    const bool isReal =
+        std::strcmp(type, @encode(double)) == 0 || std::strcmp(type, @encode(float)) == 0;
+    if (isReal) return Value([number doubleValue]);
+    const std::int64_t signedValue = [number longLongValue];
+    const bool isPastSigned =
+        signedValue < 0 && [number compare:[NSNumber numberWithInt:0]] == NSOrderedDescending;
+    return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
+  }
+
+  static Value data(NSData* data) {
+    const auto* const bytes = static_cast<const std::byte*>([data bytes]);
+    return Value(Data(bytes, bytes + [data length]));
+  }
+
+  std::optional<Value> array(NSArray* array, int depth) {
+    Array values;
+    for (id object in array) {
+      std::optional<Value> value = read(object, depth + 1);
+      if (!value) return std::nullopt;
+      values.push_back(*std::move(value));
+    }
+    return Value(std::move(values));
+  }
+
+  std::optional<Value> dictionary(NSDictionary* dictionary, int depth) {
+    std::vector<Dictionary::Pair> pairs;
+    for (id key in dictionary) {
+      std::optional<Value> value = read([dictionary objectForKey:key], depth + 1);
+      if (!value || ![key isKindOfClass:[NSString class]]) return std::nullopt;
+      pairs.emplace_back(cocoa::toStdString(key), *std::move(value));
+    }
+    return Value(Dictionary(std::move(pairs)));
+  }
+
+  int objects_ = 0;
+};
+
+struct ToPropertyList {
+  id operator()(bool value) const { return [NSNumber numberWithBool:value]; }
+  id operator()(std::int64_t value) const { return [NSNumber numberWithLongLong:value]; }
+  id operator()(std::uint64_t value) const { return [NSNumber numberWithUnsignedLongLong:value]; }
+  id operator()(double value) const { return [NSNumber numberWithDouble:value]; }
+  id operator()(const std::string& value) const { return cocoa::toNSString(value); }
+  id operator()(const Data& value) const {
+    return [NSData dataWithBytes:value.data() length:value.size()];
+  }
+  id operator()(const Date& value) const {
+    return [NSDate dateWithTimeIntervalSinceReferenceDate:value.secondsSinceReferenceDate];
+  }
+  id operator()(const Array& values) const {
+    NSMutableArray* const array = [NSMutableArray array];
+    for (const Value& value : values)
+      [array addObject:cocoa::toPropertyList(value)];
+    return array;
+  }
+  id operator()(const Dictionary& pairs) const {
+    NSMutableDictionary* const dictionary = [NSMutableDictionary dictionary];
+    for (const auto& [key, value] : pairs) {
+      [dictionary setObject:cocoa::toPropertyList(value) forKey:cocoa::toNSString(key)];
+    }
+    return dictionary;
+  }
+};
+
+// Only a file that is small enough is read at all.
+NSData* contents(NSString* path) {
+  NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:path
+                                                                                    error:nullptr];
+  return attributes && [attributes fileSize] <= kMostBytes ? [NSData dataWithContentsOfFile:path]
+                                                           : nil;
+}
+
+}  // namespace
+
+namespace cocoa {
+
+std::optional<Dictionary> toDictionary(id object) {
+  const std::optional<Value> value = Reader().read(object, 0);
+  const Dictionary* const dictionary = value ? value->as<Dictionary>() : nullptr;
+  return dictionary ? std::optional(*dictionary) : std::nullopt;
+}
+
+id toPropertyList(const Value& value) {
+  return std::visit(ToPropertyList(), value.storage());
+}
+
+}  // namespace cocoa
+
+std::optional<Dictionary> loadDictionary(const std::string& path) {
+  @autoreleasepool {
+    NSData* const data = contents(cocoa::toNSString(path));
+    if (!data) return std::nullopt;
+    @try {
+      return cocoa::toDictionary([NSPropertyListSerialization
+          propertyListWithData:data
+                       options:NSPropertyListImmutable
+                        format:nullptr
+                         error:nullptr]);
+    } @catch (NSException*) {
+      return std::nullopt;
+    }
+  }
+}
+
+bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path) {
+  NSData* const data =
+      [NSPropertyListSerialization dataWithPropertyList:cocoa::toPropertyList(dictionary)
+                                                 format:NSPropertyListXMLFormat_v1_0
+                                                options:0
+                                                  error:nullptr];
+  return [data writeToFile:cocoa::toNSString(path) atomically:YES];
+}
+
+}  // namespace onramp

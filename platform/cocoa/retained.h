@@ -1,0 +1,39 @@
+#pragma once
+
+#import <Foundation/Foundation.h>
+
+#include <utility>
+
+namespace onramp::cocoa {
+
+/// Owns one reference to an Objective-C object, or none.
+template <typename Class>
+class Retained {
+ public:
+  Retained() = default;
+
+  /// Adds a reference of its own.
+  explicit Retained(Class* object) : object_([object retain]) {}
+
+  /// Takes over the reference that alloc, new or copy gave.
+  [[nodiscard]] static Retained adopt(Class* object) {
+    Retained owner;
+    owner.object_ = object;
+    return owner;
+  }
+
+  Retained(const Retained& other) : Retained(other.object_) {}
+  Retained(Retained&& other) noexcept : object_(std::exchange(other.object_, nil)) {}
+  Retained& operator=(Retained other) noexcept {
+    std::swap(object_, other.object_);
+    return *this;
+  }
+  ~Retained() { [object_ release]; }
+
+  [[nodiscard]] Class* get() const { return object_; }
+
+ private:
+  Class* object_ = nil;
+};
+
+}  // namespace onramp::cocoa

@@ -1,0 +1,116 @@
+#include "platform/run_loop.h"
+
+#import <AppKit/AppKit.h>
+
+#include <chrono>
+#include <condition_variable>
+#include <memory>
+#include <mutex>
+#include <utility>
+
+#import "platform/cocoa/action.h"
+#import "platform/cocoa/native.h"
+#import "platform/cocoa/termination.h"
+
+namespace onramp {
+
+namespace {
+
+NSArray* allModes() {
+  return [NSArray arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode,
+                                   NSEventTrackingRunLoopMode, nil];
+}
+
+struct Termination {
+  std::mutex mutex;
+  std::condition_variable changed;
+  bool asked = false;
+};
+
+// Never destroyed: the process may exit while a thread still sleeps.
+Termination& termination() {
+  static Termination* const instance = std::make_unique<Termination>().release();
+  return *instance;
+}
+
+// Whether the modal loop that runs was asked to end. Main thread only.
+bool isModalAborted = false;
+
+// A modal loop looks whether it was stopped when it has handled an event.
+void wakeEventLoop() {
+  [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
+                                      location:NSZeroPoint
+                                 modifierFlags:0
+                                     timestamp:0
+                                  windowNumber:0
+                                       context:nil
+                                       subtype:0
+                                         data1:0
+                                         data2:0]
+           atStart:NO];
+}
+
+}  // namespace
+
+namespace cocoa {
+
+void wakeSleepersForTermination() {
+  {
+    const std::lock_guard lock(termination().mutex);
+    termination().asked = true;
+  }
+  termination().changed.notify_all();
+}
+
+}  // namespace cocoa
+
+// The action may run a loop of its own, in which its timer must not fire again.
+void scheduleTimer(double seconds, std::function<void()> action) {
+  OnrampAction* const once =
+      [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
+        if (const auto pending = std::exchange(action, nullptr)) pending();
+      }];
+  NSTimer* const timer = [NSTimer timerWithTimeInterval:seconds
+                                                 target:once
+                                               selector:@selector(perform:)
+                                               userInfo:nil
+                                                repeats:NO];
+  for (NSString* mode in allModes())
+    [[NSRunLoop mainRunLoop] addTimer:timer forMode:mode];
+}
+
+void performOnMainThread(std::function<void()> action) {
+  @autoreleasepool {
+    [[OnrampAction actionWithFunction:std::move(action)]
+        performSelectorOnMainThread:@selector(perform:)
+                         withObject:nil
+                      waitUntilDone:NO
+                              modes:allModes()];
+  }
+}
+
+// The platform ends a modal loop for reasons of its own as well, such as a key that cancels; the
+// window is then still waited for.
+void runModalForWindow(const Window& window) {
+  window.makeKeyAndOrderFront();
+  NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
+  isModalAborted = !modal;
+  while (!isModalAborted)
+    [NSApp runModalForWindow:modal];
+}
+
+void abortModal() {
+  performOnMainThread([] {
+    isModalAborted = true;
+    [NSApp stopModalWithCode:NSModalResponseAbort];
+    wakeEventLoop();
+  });
+}
+
+bool sleepOffMainThread(std::uint32_t seconds) {
+  std::unique_lock lock(termination().mutex);
+  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
+                                         [] { return termination().asked; });
+}
+
+}  // namespace onramp

@@ -1,0 +1,41 @@
+#pragma once
+
+#include <CoreFoundation/CoreFoundation.h>
+
+#include <utility>
+
+namespace onramp::corefoundation {
+
+/// Owns one reference to a Core Foundation object, or none.
+template <typename Ref>
+class Reference {
+ public:
+  Reference() = default;
+
+  /// Takes over the reference that an operation named Create or Copy gave.
+  explicit Reference(Ref object) : object_(object) {}
+
+  /// Adds a reference of its own to an object that someone else owns.
+  [[nodiscard]] static Reference retaining(Ref object) {
+    if (object) CFRetain(object);
+    return Reference(object);
+  }
+
+  Reference(const Reference& other) : Reference(retaining(other.object_)) {}
+  Reference(Reference&& other) noexcept : object_(std::exchange(other.object_, nullptr)) {}
+  Reference& operator=(Reference other) noexcept {
+    std::swap(object_, other.object_);
+    return *this;
+  }
+  ~Reference() {
+    if (object_) CFRelease(object_);
+  }
+
+  [[nodiscard]] Ref get() const { return object_; }
+  explicit operator bool() const { return object_ != nullptr; }
+
+ private:
+  Ref object_ = nullptr;
+};
+
+}  // namespace onramp::corefoundation

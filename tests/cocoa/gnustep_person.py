@@ -1,0 +1,129 @@
+"""A person at the screen of the front end for Cocoa when it runs on GNUstep.
+
+Nothing there speaks AT-SPI. The program writes down what can be seen instead, by the same roles,
+when it is asked.
+"""
+
+import json
+import os
+import pathlib
+import time
+
+from onscreen.person import Person
+from onscreen.processes import start, wait_for
+
+_SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
+_LOOK_SECONDS = 20
+_ANSWER_SECONDS = 60
+_MENU_BAR_ITEM = "Onramp OSX"
+
+
+class GNUstepPerson(Person):
+    """Starts a program on a desktop and uses it. Use it in a `with` statement."""
+
+    errors = ()  # what the use of a control raises that is gone
+
+    def __init__(self, desktop, program, arguments=(), env=None):
+        self.desktop = desktop
+        folder = pathlib.Path(desktop.env["HOME"])
+        self._answer = folder / "accessibility.json"
+        self._question = folder / "accessibility.json.question"
+        variables = {
+            "ONRAMP_ACCESSIBILITY_FILE": str(self._answer),
+            "GNUSTEP_CONFIG_FILE": str(self._configure(folder)),
+            # Strings tables in UTF-8 are read in the locale's encoding.
+            "LC_CTYPE": "C.UTF-8",
+        } | self._options_as_environment(list(arguments))
+        self.process = start([str(program)], env=desktop.env | variables | (env or {}))
+
+    def everything(self):
+        return [(control["role"], control["name"], control) for control in self._read()]
+
+    def has_state(self, control, state):
+        return state in control["states"]
+
+    def click(self, role, name=None):
+        def clickable():
+            control = self.see(role, name)
+            return control if self.has_state(control, "enabled") else None
+
+        self.click_control(wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} enabled"))
+
+    def click_control(self, control):
+        self._point_at(control)
+        self.desktop.run(["xdotool", "mousedown", "1"])
+        self._wait_until_noticed()
+        self.desktop.run(["xdotool", "mouseup", "1"])
+
+    def _wait_until_noticed(self):
+        """What is let go of before its pressing was noticed, GNUstep sees let go of first."""
+        for _ in range(3):
+            self._read()
+
+    def choose_from_menu(self, button, item):
+        """Takes a button's `item`th menu entry. The menu is open as long as the button is held."""
+        self._point_at(self.see("button menu", button))
+        self.desktop.run(["xdotool", "mousedown", "1"])
+        entries = wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
+        self._point_at(entries[item - 1])
+        self._wait_until_noticed()
+        self.desktop.run(["xdotool", "mouseup", "1"])
+
+    def _menu_entries(self):
+        """The entries of the menu that is open; the menu bar has one of its own."""
+        items = [control for control in self._read() if control["role"] == "menu item"]
+        return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
+
+    def _point_at(self, control):
+        self.desktop.run(["xdotool", "mousemove", str(control["x"] + control["width"] // 2),
+                          str(control["y"] + control["height"] // 2), "sleep", "0.05"])
+
+    def see(self, role, name=None, seconds=_LOOK_SECONDS):
+        super().see(role, name, seconds)
+        return self._at_rest(role, name)
+
+    def _at_rest(self, role, name):
+        """The control once it stays where it is: a new window is moved by the window manager."""
+        seen = None
+        while True:
+            now = self._look(role, name)
+            if now == seen or now is None:
+                return seen
+            seen = now
+            time.sleep(0.12)
+
+    def _look(self, role, name):
+        return next((control for control in self._read()
+                     if control["role"] == role and name in (None, control["name"])), None)
+
+    def _read(self):
+        """What is on the screen; blocks as long as the program's loop does."""
+        self._answer.unlink(missing_ok=True)
+        self._question.touch()
+        wait_for(lambda: self._answer.exists() or not self.is_running(), _ANSWER_SECONDS,
+                 "an answer from the program")
+        try:
+            return json.loads(self._answer.read_text(encoding="utf-8"))
+        except FileNotFoundError:
+            return []
+
+    def _configure(self, folder):
+        """The system's own GNUstep, with application-support folders on this desktop."""
+        own = {"GNUSTEP_USER_DIR_LIBRARY": os.path.relpath(self.desktop.user_folder, folder),
+               "GNUSTEP_LOCAL_LIBRARY": str(self.desktop.local_folder)}
+        lines = [line for line in _SYSTEM_CONFIGURATION.read_text(encoding="utf-8").splitlines()
+                 if line.split("=")[0] not in own]
+        file = folder / "GNUstep.conf"
+        file.write_text("\n".join(lines + [f"{k}={v}" for k, v in own.items()]) + "\n",
+                        encoding="utf-8")
+        file.chmod(0o600)
+        return file
+
+    @staticmethod
+    def _options_as_environment(arguments):
+        """This front end has no options of its own: what they set, it takes from the environment."""
+        if not arguments:
+            return {}
+        option, value = arguments
+        assert option == "--system-version"
+        return {"ONRAMP_SYSTEM_VERSION": value}

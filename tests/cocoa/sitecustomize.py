@@ -1,0 +1,14 @@
+"""With this folder in PYTHONPATH, every test of tests/window uses the front end for Cocoa on GNUstep.
+
+Python imports it as it starts, in the processes that a test starts as well.
+"""
+
+import pathlib
+import sys
+
+sys.path.append(str(pathlib.Path(__file__).resolve().parents[2] / "tools"))
+
+import gnustep_person  # noqa: E402
+import onscreen.person  # noqa: E402
+
+onscreen.person.Person = gnustep_person.GNUstepPerson
