@@ -66,7 +66,8 @@ class GNUstepPerson(Person):
         self.desktop.run(["xdotool", "mousedown", "1"])
         entries = wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
         self._point_at(entries[item - 1])
-        self._wait_until_noticed()
+        wait_for(lambda: self.has_state((self._menu_entries() or entries)[item - 1], "selected"),
+                 _LOOK_SECONDS, f"entry {item} of {button!r} to be noticed")
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):

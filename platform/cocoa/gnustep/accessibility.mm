@@ -114,13 +114,14 @@ class Reader {
   }
 
   void readMenu(NSMenuView* view) {
-    NSInteger index = 0;
+    NSInteger index = -1;
     for (NSMenuItem* item in [[view menu] itemArray]) {
-      const NSRect frame = [view rectOfItemAtIndex:index++];
+      ++index;
       if ([item isSeparatorItem]) continue;
-      NSArray* const states =
-          [item isEnabled] ? [NSArray arrayWithObject:@"enabled"] : [NSArray array];
-      add(@"menu item", [item title], states, view, frame);
+      NSMutableArray* const states = [NSMutableArray array];
+      if ([item isEnabled]) [states addObject:@"enabled"];
+      if ([view highlightedItemIndex] == index) [states addObject:@"selected"];
+      add(@"menu item", [item title], states, view, [view rectOfItemAtIndex:index]);
     }
   }
 
