@@ -14,7 +14,7 @@ from onscreen.person import Person
 from onscreen.processes import start, wait_for
 
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
-_LOOK_SECONDS = 20
+_LOOK_SECONDS = 60  # GNUstep is slow where much else runs
 _ANSWER_SECONDS = 60
 _MENU_BAR_ITEM = "Onramp OSX"
 
