@@ -16,6 +16,7 @@ from onscreen.processes import start, wait_for
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
 _LOOK_SECONDS = 60  # GNUstep is slow where much else runs
 _ANSWER_SECONDS = 60
+_PRESS_SECONDS = 3
 _MENU_BAR_ITEM = "Onramp OSX"
 
 
@@ -52,14 +53,17 @@ class GNUstepPerson(Person):
 
     def click_control(self, control):
         self._point_at(control)
+        before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
-        self._wait_until_noticed()
+        # What is let go of before its pressing was noticed, GNUstep sees let go of first. An open
+        # menu takes the mouse for itself: its presses are never counted.
+        deadline = time.monotonic() + _PRESS_SECONDS
+        while self._noticed_presses() == before and time.monotonic() < deadline:
+            pass
         self.desktop.run(["xdotool", "mouseup", "1"])
 
-    def _wait_until_noticed(self):
-        """What is let go of before its pressing was noticed, GNUstep sees let go of first."""
-        for _ in range(3):
-            self._read()
+    def _noticed_presses(self):
+        return self._read()[0]["presses"] if self.is_running() else 0
 
     def choose_from_menu(self, button, item):
         """Takes a button's `item`th menu entry. The menu is open as long as the button is held."""
@@ -112,7 +116,7 @@ class GNUstepPerson(Person):
         try:
             return json.loads(self._answer.read_text(encoding="utf-8"))
         except FileNotFoundError:
-            return []
+            return [{"role": "application", "name": "", "states": [], "presses": 0}]
 
     def _configure(self, folder):
         """The system's own GNUstep, with application-support folders on this desktop."""

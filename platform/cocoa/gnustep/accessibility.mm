@@ -3,18 +3,30 @@
 // makes the file of that name with ".question" added to it. The application's loop takes the
 // question away and writes the answer: all controls that can be seen, as a JSON array of objects
 // with role, name, states and frame (x, y, width and height in pixels from the screen's upper left
-// corner). Roles and states have the names that AT-SPI gives them.
+// corner). Roles and states have the names that AT-SPI gives them. The first object, of the role
+// "application", has the number of presses of the mouse's button that were noticed so far.
 
 #include <unistd.h>
 
 #include <string>
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
+#import "platform/cocoa/gnustep/method_exchange.h"
 #import "platform/cocoa/text.h"
 
 namespace {
 
 constexpr NSTimeInterval kInterval = 0.02;  // seconds
+
+using SendEvent = void(id, SEL, NSEvent*);
+
+SendEvent* originalSendEvent = nullptr;
+int presses = 0;
+
+void sendEvent(id self, SEL selector, NSEvent* event) {
+  if ([event type] == NSLeftMouseDown) ++presses;
+  originalSendEvent(self, selector, event);
+}
 
 NSString* joined(NSString* first, NSString* second) {
   return [second length] > 0 ? second : first;
@@ -164,6 +176,8 @@ class Reader {
     OnrampAccessibility* const writer = [[[OnrampAccessibility alloc] init] autorelease];
     writer->_answer = [path retain];
     writer->_question = onramp::cocoa::toStdString(path) + ".question";
+    originalSendEvent =
+        onramp::gnustep::replaceMethod([NSWindow class], @selector(sendEvent:), sendEvent);
     [[NSNotificationCenter defaultCenter] addObserver:[writer retain]
                                              selector:@selector(begin:)
                                                  name:NSApplicationWillFinishLaunchingNotification
@@ -185,7 +199,12 @@ class Reader {
 
 - (void)answer:(NSTimer*)timer {
   if (unlink(_question.c_str()) != 0) return;
-  NSMutableArray* const found = [NSMutableArray array];
+  NSDictionary* const application =
+      [NSDictionary dictionaryWithObjectsAndKeys:@"application", @"role",
+                                                 [[NSProcessInfo processInfo] processName], @"name",
+                                                 [NSArray array], @"states",
+                                                 [NSNumber numberWithInt:presses], @"presses", nil];
+  NSMutableArray* const found = [NSMutableArray arrayWithObject:application];
   for (NSWindow* window in [NSApp windows]) {
     if ([window isVisible]) Reader(window, found).readWindow();
   }
