@@ -4,6 +4,7 @@ Nothing there speaks AT-SPI. The program writes down what can be seen instead, b
 when it is asked.
 """
 
+import itertools
 import json
 import os
 import pathlib
@@ -13,7 +14,7 @@ from onscreen.person import Person
 from onscreen.processes import start, wait_for
 
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
-_LOOK_SECONDS = 20
+_LOOK_SECONDS = 60  # GNUstep is slow where much else runs
 _ANSWER_SECONDS = 60
 _MENU_BAR_ITEM = "Onramp OSX"
 
@@ -65,9 +66,14 @@ class GNUstepPerson(Person):
         self._point_at(self.see("button menu", button))
         self.desktop.run(["xdotool", "mousedown", "1"])
         entries = wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
-        self._point_at(entries[item - 1])
-        wait_for(lambda: self.has_state((self._menu_entries() or entries)[item - 1], "selected"),
-                 _LOOK_SECONDS, f"entry {item} of {button!r} to be noticed")
+        nudge = itertools.cycle((0, 1))
+
+        def noticed():
+            # A pointer that stands still from before the menu was ready is never noticed.
+            self._point_at(entries[item - 1], next(nudge))
+            return self.has_state((self._menu_entries() or entries)[item - 1], "selected")
+
+        wait_for(noticed, _LOOK_SECONDS, f"entry {item} of {button!r} to be noticed")
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):
@@ -75,8 +81,8 @@ class GNUstepPerson(Person):
         items = [control for control in self._read() if control["role"] == "menu item"]
         return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
 
-    def _point_at(self, control):
-        self.desktop.run(["xdotool", "mousemove", str(control["x"] + control["width"] // 2),
+    def _point_at(self, control, nudge=0):
+        self.desktop.run(["xdotool", "mousemove", str(control["x"] + control["width"] // 2 + nudge),
                           str(control["y"] + control["height"] // 2), "sleep", "0.05"])
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
