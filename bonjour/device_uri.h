@@ -23,7 +23,8 @@ struct ServiceInstance {
 [[nodiscard]] std::optional<std::string> percentUnescaped(std::string_view text);
 
 /// The instance that a URI of the form scheme://name.type.domain names; nothing when a piece of it
-/// is missing or the domain is not "local.".
+/// is missing or the domain is not "local.". The type is the one before the first "_tcp." (else
+/// "_udp."), so a name that has or ends in such a label leads astray.
 [[nodiscard]] std::optional<ServiceInstance> serviceInstanceOf(std::string_view uri);
 
 /// The host name in a URL's authority part (RFC 3986 section 3.2), ASCII only; nothing when the

@@ -20,8 +20,9 @@ long allocations = 0;
 
 // Every allocation of the process, those inside the library included, passes through here.
 extern "C" {
-void* __libc_malloc(std::size_t size);
-void* __libc_calloc(std::size_t count, std::size_t size);
+// The C library's names.
+void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
+void* __libc_calloc(std::size_t count, std::size_t size);  // NOLINT(bugprone-reserved-identifier)
 
 void* malloc(std::size_t size) {
   ++allocations;
@@ -55,6 +56,7 @@ struct Ours {
   }
   Ours(const Ours&) = delete;
   Ours& operator=(const Ours&) = delete;
+  ~Ours() = default;
 
   void build() { check(onramp::snmp_encode_message(message, buffer, length) == 0, "encoding"); }
 

@@ -55,10 +55,14 @@ bool MainWindow::performKeyEquivalent(int key) {
 
 namespace {
 
+// The panel has no loop of its own: a search's wait goes on and ends underneath it.
 void showAboutPanel(QWidget* window) {
-  QMessageBox::about(
-      window, window->windowTitle(),
-      window->windowTitle() + QLatin1Char('\n') + QApplication::applicationVersion());
+  auto* const panel = makeChild<QMessageBox>(window);
+  panel->setAttribute(Qt::WA_DeleteOnClose);
+  panel->setWindowModality(Qt::NonModal);
+  panel->setWindowTitle(window->windowTitle());
+  panel->setText(window->windowTitle() + QLatin1Char('\n') + QApplication::applicationVersion());
+  panel->show();
 }
 
 }  // namespace

@@ -80,6 +80,8 @@ void runModalForWindow(const Window& window) {
   modalLoops().push_back(&loop);
   loop.exec();
   modalLoops().pop_back();
+  // Clicks and keys that waited while the main thread was busy were meant for what was shown then.
+  if (!qt::isTerminating()) QCoreApplication::processEvents();
 }
 
 void abortModal() {

@@ -29,6 +29,7 @@ void Window::makeKeyWindow() const {
 void Window::orderFront() const {
   auto* const window = nativeOf<QWidget>(*this);
   if (!window) return;
+  window->setWindowState(window->windowState() & ~Qt::WindowMinimized);
   window->show();
   window->raise();
 }

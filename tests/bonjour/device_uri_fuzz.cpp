@@ -21,7 +21,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   const std::string escaped = onramp::percentEscaped(text);
   const bool utf8 = onramp::isUtf8(text);
   if (onramp::percentUnescaped(escaped).has_value() != utf8) std::abort();
-  if (utf8 && text.find('.') == std::string::npos) {
+  // The dots before the type and in a name are not escaped, so "_tcp" and a dot may come too early.
+  const bool ambiguous = text.find('.') != std::string::npos || text.ends_with("_tcp");
+  if (utf8 && !ambiguous) {
     const onramp::ServiceInstance whole{text, "_ipp._tcp.", "local."};
     if (onramp::serviceInstanceOf("dnssd://" + escaped + "._ipp._tcp.local.") != whole) {
       std::abort();

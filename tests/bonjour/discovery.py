@@ -82,6 +82,11 @@ class Search(Process):
         return self.wait(lambda _: len(self.events(word, name)) >= count
                          and self.events(word, name)[-1])
 
+    def comes_to(self, word, name, patience):
+        """Whether there is such an event within `patience` seconds."""
+        with self._news:
+            return self._news.wait_for(lambda: bool(self.events(word, name)), patience)
+
     def processor_seconds(self):
         return float(self.events("cpu")[0][2])
 

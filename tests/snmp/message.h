@@ -48,6 +48,7 @@ struct Message {
   }
   Message(const Message&) = delete;
   Message& operator=(const Message&) = delete;
+  ~Message() = default;
 
   void reset() {
     for (std::size_t i = 0; i < varbinds.size(); ++i) {
