@@ -34,7 +34,7 @@ int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
 /// Asks the application to end. The main loop, and a modal one inside it, stop; no timer or event
-/// is handled any more. Returns to the caller, who ends what it is doing.
+/// is handled any more. May not return; where it does, the caller ends what it is doing.
 void terminateApplication();
 
 /// Takes all windows off the screen, and brings those back that hideApplication() took.
