@@ -42,7 +42,7 @@ std::vector<std::string> split(std::string_view text, std::string_view separator
 std::string minimumText(std::string version) {
   constexpr std::string_view kEnd = ".0";
   if (version.ends_with(kEnd)) version.resize(version.size() - kEnd.size());
-  const std::string text = localized(
+  std::string text = localized(
       "INST_TXT_ALERT_OSMIN",
       "Please check the system requirements for your model and install on proper OS version.\n"
       "Please retry it after updating your system to Mac OS X %@ or greater.");

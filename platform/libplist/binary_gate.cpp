@@ -50,9 +50,9 @@ bool isNumberSize(std::uint64_t size) {
   return size == 1 || size == 2 || size == 4 || size == 8;
 }
 
-class Walk {
+class BinaryWalk {
  public:
-  explicit Walk(std::string_view bytes) : bytes_(bytes) {}
+  explicit BinaryWalk(std::string_view bytes) : bytes_(bytes) {}
 
   bool run() {
     if (bytes_.size() < kHeader.size() + kTrailerSize || !bytes_.starts_with(kHeader)) return false;
@@ -188,7 +188,7 @@ class Walk {
 }  // namespace
 
 bool mayReadBinary(std::string_view bytes) {
-  return bytes.size() <= kMostBytes && Walk(bytes).run();
+  return bytes.size() <= kMostBytes && BinaryWalk(bytes).run();
 }
 
 }  // namespace onramp::libplist

@@ -13,9 +13,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-class Walk {
+class XmlWalk {
  public:
-  explicit Walk(std::string& text) : text_(text) {}
+  explicit XmlWalk(std::string& text) : text_(text) {}
 
   bool run() {
     if (text_.find('\0') != kNone) return false;
@@ -119,7 +119,7 @@ class Walk {
 }  // namespace
 
 bool mayReadXML(std::string& text) {
-  return text.size() <= kMostBytes && Walk(text).run();
+  return text.size() <= kMostBytes && XmlWalk(text).run();
 }
 
 }  // namespace onramp::libplist

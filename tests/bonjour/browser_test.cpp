@@ -24,9 +24,9 @@ void PrintTo(const Event& event, std::ostream* out) {
   *out << event.what << ' ' << (event.service ? event.service->name().value_or("?") : "null");
 }
 
-class Recorder final : public KSBonjourObserver {
+class ServiceRecorder final : public KSBonjourObserver {
  public:
-  explicit Recorder(const KSBonjour& watched) : browser(watched) {}
+  explicit ServiceRecorder(const KSBonjour& watched) : browser(watched) {}
   void addBonjourService(const NetServiceRef& service) override { note("add", service); }
   void removeBonjourService(const NetServiceRef& service) override { note("remove", service); }
   void resolvedBonjourService(const NetServiceRef& service) override { note("resolved", service); }
@@ -55,7 +55,7 @@ class BrowserTest : public ::testing::Test {
 
   Network& network = Network::instance();
   std::shared_ptr<KSBonjour> browser = KSBonjour::initWithType("_ipp._tcp.");
-  std::shared_ptr<Recorder> recorder = std::make_shared<Recorder>(*browser);
+  std::shared_ptr<ServiceRecorder> recorder = std::make_shared<ServiceRecorder>(*browser);
   NetServiceRef onOne = Network::service("Kestrel", "_ipp._tcp.");
   NetServiceRef onTwo = Network::service("Kestrel", "_ipp._tcp.");
   NetServiceRef onThree = Network::service("Kestrel", "_ipp._tcp.");
@@ -123,7 +123,7 @@ TEST_F(BrowserTest, RemovalsOfUnknownServicesAreForwardedAsNull) {
 
 TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
   const auto scanners = KSBonjour::initWithType("_scanner._tcp.");
-  const auto scannerRecorder = std::make_shared<Recorder>(*scanners);
+  const auto scannerRecorder = std::make_shared<ServiceRecorder>(*scanners);
   scanners->addKSBonjourObserver(scannerRecorder);
   scanners->startBrowsing();
 

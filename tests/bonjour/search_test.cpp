@@ -13,7 +13,7 @@ using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 using namespace recording;
 
-class Recorder final : public KSDeviceObserver {
+class DeviceRecorder final : public KSDeviceObserver {
  public:
   void addKSDevice(const Dictionary& device) override { note("add", device); }
   void updateKSDevice(const Dictionary& device) override { note("update", device); }
@@ -41,7 +41,7 @@ class SearchTest : public ::testing::Test {
 
   Network& network = Network::instance();
   std::shared_ptr<KSBonjourSearch> search = KSBonjourSearch::init();
-  std::shared_ptr<Recorder> recorder = std::make_shared<Recorder>();
+  std::shared_ptr<DeviceRecorder> recorder = std::make_shared<DeviceRecorder>();
   NetServiceRef onOne = Network::service("Kestrel", "_ipp._tcp.");
   NetServiceRef onTwo = Network::service("Kestrel", "_ipp._tcp.");
 };

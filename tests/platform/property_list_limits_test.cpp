@@ -18,7 +18,7 @@ std::string repeated(const std::string& text, std::size_t times) {
   return result;
 }
 
-std::string plist(const std::string& inside) {
+std::string plistWith(const std::string& inside) {
   return "<plist version=\"1.0\"><dict><key>k</key>" + inside + "</dict></plist>";
 }
 
@@ -83,19 +83,19 @@ TEST(Limits, AHostileFileIsUnreadableAndCostsLittle) {
   const TemporaryFolder folder;
   const std::pair<const char*, std::string> cases[] = {
       {"XML nested 200,000 deep",
-       plist(repeated("<array>", 200000) + repeated("</array>", 200000))},
+       plistWith(repeated("<array>", 200000) + repeated("</array>", 200000))},
       {"XML nested behind comments that seem to close it",
-       plist(repeated("<array><!--</array>-->", 100000) + repeated("</array>", 100000))},
+       plistWith(repeated("<array><!--</array>-->", 100000) + repeated("</array>", 100000))},
       {"XML nested behind what seems to be an instruction",
-       "<?>" + plist(repeated("<array>", 100000) + repeated("</array>", 100000)) + "?>"},
+       "<?>" + plistWith(repeated("<array>", 100000) + repeated("</array>", 100000)) + "?>"},
       {"a document type with an internal part",
-       "<!DOCTYPE plist [<!ENTITY a \"b\">]>" + plist("<true/>")},
-      {"two million elements", plist("<array>" + repeated("<true/>", 2000000) + "</array>")},
+       "<!DOCTYPE plist [<!ENTITY a \"b\">]>" + plistWith("<true/>")},
+      {"two million elements", plistWith("<array>" + repeated("<true/>", 2000000) + "</array>")},
       {"a text of a million entities",
-       plist("<string>" + repeated("&amp;", 1000000) + "</string>")},
+       plistWith("<string>" + repeated("&amp;", 1000000) + "</string>")},
       {"a dictionary of 100,000 keys that hash alike",
-       plist("<dict>" + repeated("<key>aa</key><true/>", 100000) + "</dict>")},
-      {"a file of 17 MiB", plist("<string>" + std::string(17 << 20, 'x') + "</string>")},
+       plistWith("<dict>" + repeated("<key>aa</key><true/>", 100000) + "</dict>")},
+      {"a file of 17 MiB", plistWith("<string>" + std::string(17 << 20, 'x') + "</string>")},
       {"shared references that grow to 10^13 objects", arrays(13, 10)},
       {"binary lists nested 100,000 deep", arrays(100000, 1)},
       {"a shared text that grows to 200 GB",
@@ -108,7 +108,7 @@ TEST(Limits, AHostileFileIsUnreadableAndCostsLittle) {
                       })},
       {"a list that holds itself",
        dictionaryOver(2, [](std::size_t i) { return "\xA1" + reference(5 - i); })}};
-  const long usual = load(folder.holding("usual", plist("<true/>"))).peakKilobytes;
+  const long usual = load(folder.holding("usual", plistWith("<true/>"))).peakKilobytes;
   for (const auto& [name, bytes] : cases) {
     const Outcome outcome = load(folder.holding("list", bytes));
     EXPECT_FALSE(outcome.read) << name;
@@ -125,12 +125,12 @@ TEST(Limits, LeaveRoomForWhatMediaHold) {
               "<key>USB</key><true/></dict></dict>";
   }
   const std::pair<const char*, std::string> cases[] = {
-      {"20,000 models", plist("<dict>" + models + "</dict>")},
-      {"lists 100 deep", plist(repeated("<array>", 100) + repeated("</array>", 100))},
+      {"20,000 models", plistWith("<dict>" + models + "</dict>")},
+      {"lists 100 deep", plistWith(repeated("<array>", 100) + repeated("</array>", 100))},
       {"binary lists 100 deep", arrays(100, 1)},
       {"shared references", arrays(4, 14)},
       {"a long text with entities",
-       plist("<string>" + repeated("text &amp; text ", 1000) + "</string>")}};
+       plistWith("<string>" + repeated("text &amp; text ", 1000) + "</string>")}};
   for (const auto& [name, bytes] : cases)
     EXPECT_TRUE(loadDictionary(folder.holding("list", bytes))) << name;
 }

@@ -73,8 +73,10 @@ std::optional<DatagramSocket> DatagramSocket::open() {
 
 DatagramSocket::DatagramSocket(DatagramSocket&& other) noexcept = default;
 DatagramSocket& DatagramSocket::operator=(DatagramSocket&& other) noexcept = default;
-// NOLINTNEXTLINE(performance-trivially-destructible): other backends have a socket to close.
-DatagramSocket::~DatagramSocket() = default;
+// What was not received goes with the socket.
+DatagramSocket::~DatagramSocket() {
+  pendingReply().reset();
+}
 
 bool DatagramSocket::permitBroadcast() {
   return true;

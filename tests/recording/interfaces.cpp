@@ -73,6 +73,7 @@ InterfaceOwner& ownerOf(const Object& object) {
 using recording::Object;
 
 struct Interface::Tree {
+  Tree(const std::string& name, InterfaceOwner& owner) : loaded{name, owner} {}
   recording::LoadedInterface loaded;
 };
 
@@ -139,7 +140,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
   if (parts.empty() || recording::FrontEnd::instance().missingInterfaces.contains(name)) {
     return nullptr;
   }
-  auto tree = std::unique_ptr<Tree>(new Tree{{name, owner}});
+  auto tree = std::make_unique<Tree>(name, owner);
   tree->loaded.add(OutletKind::kView, name);
   for (const Part& part : parts) {
     bindAsTheFilesDo(tree->loaded.add(part.kind, part.name), owner.boundTexts());

@@ -151,6 +151,7 @@ Dictionary model(bool usb, bool wired, bool wireless) {
 
 Dictionary containing(const std::vector<std::string>& models) {
   std::vector<Dictionary::Pair> pairs;
+  pairs.reserve(models.size());
   for (const std::string& name : models)
     pairs.emplace_back(name, Dictionary());
   return Dictionary{{"ContainedModel", Dictionary(std::move(pairs))}, {"KSCSeriesCode", "KS7"}};
