@@ -3,8 +3,9 @@
 Usage: soak.py [--seconds S] [--events N] [--seed N] MEDIUM
 
 Searches again all the time, and tells how the wizard's memory and its waits have gone. Wrong is: an
-end, a wait that outlives its five pauses, a list that in the end is not what is there, and memory
-that grows from the first fifth to the last by more than a few hundredths.
+end, a wait that outlives its five pauses, a list that in the end is not what is there, memory that
+grows from the first fifth to the last by more than a few hundredths, and an exit status other than 0
+when the window is closed, such as that of a build with a leak checker.
 """
 
 import argparse
@@ -106,6 +107,9 @@ def judge(person, crowd, waits, sizes):
         wrong.append("memory grew")
     if listed != crowd.to_be_listed():
         wrong.append(f"listed {listed}, there {crowd.to_be_listed()}")
+    person.close_window()
+    if status := person.wait_for_end(60):
+        wrong.append(f"it ended with status {status}")
     return wrong
 
 
@@ -123,7 +127,8 @@ def main():
         medium = media.make(pathlib.Path(folder) / "medium", BUILT,
                             {"Kestrel Soak": model(usb=True, wireless=True)})
         program = medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
-        with Person(desktop, program, env={"LANG": "en_US.UTF-8"}) as person:
+        checkers = {name: value for name, value in os.environ.items() if name.endswith("SAN_OPTIONS")}
+        with Person(desktop, program, env={"LANG": "en_US.UTF-8"} | checkers) as person:
             person.see("label", TEXT["INST_TXT_CONNECTIONTYPE"])
             person.press("Return")
             person.see("label", TEXT["INST_TXT_DEVLIST"], 60)
