@@ -46,15 +46,23 @@ void Bus::process() {
   do {
     more = sd_bus_process(bus_.get(), nullptr);
   } while (more > 0);
-  sent();
+  if (more < 0) {
+    fail();
+  } else {
+    sent();
+  }
+}
+
+void Bus::fail() {
+  api_.watch_update(watch_, AvahiWatchEvent{});
+  timer_.stop();
+  if (lost_) std::exchange(lost_, nullptr)();
 }
 
 void Bus::sent() {
   const int events = sd_bus_get_events(bus_.get());
   if (events < 0) {
-    api_.watch_update(watch_, AvahiWatchEvent{});
-    timer_.stop();
-    if (lost_) std::exchange(lost_, nullptr)();
+    fail();
     return;
   }
   // Both sides name the events as poll() does.

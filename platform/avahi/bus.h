@@ -43,6 +43,7 @@ class Bus {
 
   static int took(sd_bus_message* message, void* self, sd_bus_error* error);
   void process();
+  void fail();
 
   const AvahiPoll& api_;
   std::function<void()> lost_;

@@ -10,6 +10,8 @@ namespace {
 
 // What fails at once is not tried again at once, so that nothing ever keeps the processor busy.
 constexpr std::chrono::milliseconds kRetryPause{1000};
+// A client whose first question found the daemon hanging does not notice when that goes on.
+constexpr std::chrono::seconds kPatienceWithClient{10};
 
 // Freeing takes as many calls as asking does, and in a burst of services the next one waits.
 constexpr std::chrono::milliseconds kQuiet{50};
@@ -20,13 +22,13 @@ constexpr std::size_t kMostFinished = 200;
 
 Connection::Connection(Loop& loop)
     : loop_(loop),
-      retry_(loop, [this] { client_ ? startJobs() : connect(); }),
+      retry_(loop, [this] { connected_ ? startJobs() : connect(); }),
       quiet_(loop, [this] { freeFinished(); }) {}
 
 Connection::~Connection() {
   freeFinished();
   for (const auto& job : jobs_)
-    job->stop();
+    free(*job);
 }
 
 void Connection::add(const std::shared_ptr<Job>& job) {
@@ -40,8 +42,7 @@ void Connection::add(const std::shared_ptr<Job>& job) {
 }
 
 void Connection::remove(const std::shared_ptr<Job>& job) {
-  if (jobs_.erase(job) == 0) return;
-  job->stop();
+  if (jobs_.erase(job) != 0) free(*job);
 }
 
 void Connection::finish(const std::shared_ptr<Job>& job) {
@@ -64,7 +65,12 @@ void Connection::restart(const std::shared_ptr<Job>& job) {
 
 void Connection::freeFinished() {
   for (const auto& job : std::exchange(finished_, {}))
-    job->stop();
+    free(*job);
+}
+
+void Connection::free(Job& job) {
+  job.stop();
+  job.finish();
 }
 
 void Connection::retryLater() {
@@ -86,6 +92,7 @@ void Connection::connect() {
     static_cast<Connection*>(self)->stateChanged(state);
   };
   // Without a daemon the client waits for one to appear on the bus; without a bus there is none.
+  client_.reset();
   bus_ = Bus::open(loop_, [this] { loop_.post([this] { disconnect(); }); });
   if (bus_) {
     client_.reset(avahi_client_new(&loop_.api(), AVAHI_CLIENT_NO_FAIL, callback, this, nullptr));
@@ -120,6 +127,7 @@ void Connection::stateChanged(AvahiClientState state) {
       loop_.post([this] { disconnect(); });
       break;
     case AVAHI_CLIENT_CONNECTING:
+      retry_.ensure(kPatienceWithClient);
       break;
   }
 }

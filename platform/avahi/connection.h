@@ -53,6 +53,7 @@ class Connection {
   void startJobs();
   void retryLater();
   void freeFinished();
+  static void free(Job& job);
 
   Loop& loop_;
   Timer retry_;

@@ -3,6 +3,7 @@
 #include <avahi-client/client.h>
 #include <avahi-client/lookup.h>
 #include <avahi-common/simple-watch.h>
+#include <avahi-common/strlst.h>
 
 #include <memory>
 
@@ -23,5 +24,6 @@ using PollHandle = Handle<AvahiSimplePoll, avahi_simple_poll_free>;
 using ClientHandle = Handle<AvahiClient, avahi_client_free>;
 using ServiceBrowserHandle = Handle<AvahiServiceBrowser, avahi_service_browser_free>;
 using ServiceResolverHandle = Handle<AvahiServiceResolver, avahi_service_resolver_free>;
+using StringListHandle = Handle<AvahiStringList, avahi_string_list_free>;
 
 }  // namespace onramp::avahi

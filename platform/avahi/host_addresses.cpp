@@ -61,9 +61,10 @@ void HostAddresses::browse(std::optional<RecordBrowser>& browser, std::uint16_t 
   ++unanswered_;
   browser.emplace(connection_.bus(), interface_, host_, type,
                   [this](const RecordBrowser::Event& event) { happened(event); });
+  if (!browser->asked()) fail();
 }
 
-void HostAddresses::whenKnown(std::function<void()> action) {
+void HostAddresses::whenKnown(std::function<void(bool known)> action) {
   waiting_.push_back(std::move(action));
   check();
 }
@@ -81,8 +82,10 @@ std::vector<AvahiAddress> HostAddresses::addresses() const {
 
 void HostAddresses::happened(const RecordBrowser::Event& event) {
   const auto address = addressIn(event);
-  if (event.kind == AVAHI_BROWSER_CACHE_EXHAUSTED || event.kind == AVAHI_BROWSER_FAILURE) {
+  if (event.kind == AVAHI_BROWSER_CACHE_EXHAUSTED) {
     exhausted();
+  } else if (event.kind == AVAHI_BROWSER_FAILURE) {
+    fail();
   } else if (event.kind == AVAHI_BROWSER_NEW && address) {
     records_.push_back({event.protocol, *address});
     check();
@@ -100,6 +103,11 @@ void HostAddresses::exhausted() {
   check();
 }
 
+void HostAddresses::fail() {
+  failed_ = true;
+  check();
+}
+
 bool HostAddresses::known() const {
   if (unanswered_ != 0 || records_.empty()) return false;
   return !patient_ || std::any_of(records_.begin(), records_.end(), [](const Record& record) {
@@ -108,12 +116,13 @@ bool HostAddresses::known() const {
 }
 
 void HostAddresses::check() {
-  if (waiting_.empty() || !known()) return;
+  if (waiting_.empty() || !(failed_ || known())) return;
   connection_.loop().post([weak = weak_from_this()] {
     const auto self = weak.lock();
-    if (!self) return;
+    // What was known may have been withdrawn meanwhile.
+    if (!self || !(self->failed_ || self->known())) return;
     for (const auto& action : std::exchange(self->waiting_, {}))
-      action();
+      action(!self->failed_);
   });
 }
 

@@ -30,9 +30,10 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
   /// Asks for IPv6 addresses too.
   void wantIPv6();
 
-  /// Calls `action` once, outside of any callback of Avahi, when addresses are known and either one
-  /// is IPv4 or there has been time enough for one. Dropped with the last holder of this object.
-  void whenKnown(std::function<void()> action);
+  /// Calls `action` once, outside of any callback of Avahi: with true when addresses are known and
+  /// either one is IPv4 or there has been time enough for one, with false when the daemon failed.
+  /// Dropped with the last holder of this object.
+  void whenKnown(std::function<void(bool known)> action);
 
   /// The addresses in the order in which the daemon told of them, each once.
   [[nodiscard]] std::vector<AvahiAddress> addresses() const;
@@ -50,6 +51,7 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
   void browse(std::optional<RecordBrowser>& browser, std::uint16_t type);
   void happened(const RecordBrowser::Event& event);
   void exhausted();
+  void fail();
   void check();
   [[nodiscard]] bool known() const;
 
@@ -57,9 +59,10 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
   AvahiIfIndex interface_;
   std::string host_;
   std::vector<Record> records_;
-  std::vector<std::function<void()>> waiting_;
+  std::vector<std::function<void(bool known)>> waiting_;
   int unanswered_ = 0;  ///< browsers that still go through what is known at once
   bool patient_ = true;
+  bool failed_ = false;
   Timer patience_;
   std::optional<RecordBrowser> ipv4_;
   std::optional<RecordBrowser> ipv6_;

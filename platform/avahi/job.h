@@ -27,6 +27,9 @@ class Job : public std::enable_shared_from_this<Job> {
 
   /// Called after stop() when the daemon went or failed: what it told does not hold any more.
   virtual void lost() = 0;
+
+  /// Called once, after all else.
+  virtual void finish() {}
 };
 
 }  // namespace onramp::avahi

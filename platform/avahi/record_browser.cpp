@@ -39,7 +39,8 @@ RecordBrowser::RecordBrowser(Bus& bus, AvahiIfIndex interface, const std::string
   const int status = sd_bus_call_method_async(
       bus.get(), &slot, kDaemon, "/", kServer, "RecordBrowserPrepare", answered, hold.get(),
       "iisqqu", interface, AVAHI_PROTO_UNSPEC, name.c_str(), AVAHI_DNS_CLASS_IN, type, 0U);
-  if (status < 0) return;
+  asked_ = status >= 0;
+  if (!asked_) return;
   sd_bus_slot_set_destroy_callback(
       slot, [](void* held) { const std::unique_ptr<Hold> freed(static_cast<Hold*>(held)); });
   static_cast<void>(hold.release());

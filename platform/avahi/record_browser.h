@@ -37,11 +37,15 @@ class RecordBrowser {
   RecordBrowser& operator=(const RecordBrowser&) = delete;
   ~RecordBrowser();
 
+  /// False when the question could not even be sent, so that nothing will be reported.
+  [[nodiscard]] bool asked() const { return asked_; }
+
  private:
   struct Object;
 
   // The daemon's answer may come when this is gone, and then has to be told so.
   std::shared_ptr<Object> object_;
+  bool asked_ = false;
 };
 
 }  // namespace onramp::avahi

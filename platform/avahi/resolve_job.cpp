@@ -14,9 +14,11 @@ namespace onramp::avahi {
 
 namespace {
 
-Data wireForm(AvahiStringList* txt) {
-  Data data(avahi_string_list_serialize(txt, nullptr, 0));
-  data.resize(avahi_string_list_serialize(txt, data.data(), data.size()));
+// The list begins with the record's first string; Avahi writes a list from its end.
+Data wireForm(const AvahiStringList* txt) {
+  const StringListHandle reversed(avahi_string_list_reverse(avahi_string_list_copy(txt)));
+  Data data(avahi_string_list_serialize(reversed.get(), nullptr, 0));
+  data.resize(avahi_string_list_serialize(reversed.get(), data.data(), data.size()));
   return data;
 }
 
@@ -95,9 +97,13 @@ void ResolveJob::found(AvahiIfIndex interface, const char* host, std::uint16_t p
   if (host_) return;
   host_ = connection_->addressesOf(interface, host);
   if (service_.protocol != AVAHI_PROTO_INET) host_->wantIPv6();
-  host_->whenKnown([weak = weak_from_this()] {
+  host_->whenKnown([weak = weak_from_this()](bool known) {
     const auto job = std::static_pointer_cast<ResolveJob>(weak.lock());
     if (!job || !job->host_) return;
+    if (!known) {
+      job->connection_->restart(job);
+      return;
+    }
     Resolution resolution{{}, std::move(job->txt_)};
     for (const AvahiAddress& address : job->host_->addresses()) {
       resolution.addressing.push_back(socketAddress(address, job->port_, job->host_->interface()));

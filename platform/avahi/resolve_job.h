@@ -38,6 +38,8 @@ class ResolveJob final : public Job {
   [[nodiscard]] bool running() const override { return !resolvers_.empty(); }
   void stop() override;
   void lost() override {}
+  // The last one to hold the job may be the main thread, and the timer is the loop's.
+  void finish() override { timeUp_.reset(); }
 
  private:
   static void called(AvahiServiceResolver* resolver, AvahiIfIndex interface, AvahiProtocol protocol,

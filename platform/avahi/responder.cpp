@@ -3,6 +3,7 @@
 #include <chrono>
 #include <optional>
 #include <utility>
+#include <vector>
 
 #include "platform/avahi/connection.h"
 #include "platform/avahi/loop.h"
@@ -14,6 +15,50 @@ namespace {
 // A daemon that answers at all does so in milliseconds; one that hangs keeps its callers for half a
 // minute, and no one wants to watch a window that long that they have closed.
 constexpr std::chrono::seconds kPatienceAtTheEnd{1};
+
+struct Ending {
+  std::future<void> ended;
+  std::thread thread;
+
+  [[nodiscard]] bool isOver(std::chrono::seconds patience) const {
+    return ended.wait_for(patience) == std::future_status::ready;
+  }
+
+  void await() {
+    if (isOver(kPatienceAtTheEnd)) {
+      thread.join();
+    } else {
+      thread.detach();
+    }
+  }
+};
+
+bool isProgramEnding = false;
+
+// Threads that were told to end. They are waited for when the program ends, not before.
+class Endings {
+ public:
+  Endings() = default;
+  Endings(const Endings&) = delete;
+  Endings& operator=(const Endings&) = delete;
+  ~Endings() {
+    isProgramEnding = true;
+    for (Ending& ending : endings_)
+      ending.await();
+  }
+
+  void add(Ending last) {
+    std::erase_if(endings_, [](Ending& ending) {
+      const bool over = ending.isOver(std::chrono::seconds(0));
+      if (over) ending.thread.join();
+      return over;
+    });
+    endings_.push_back(std::move(last));
+  }
+
+ private:
+  std::vector<Ending> endings_;
+};
 
 }  // namespace
 
@@ -41,11 +86,13 @@ Responder::Responder() : work_(std::make_shared<Work>()) {
 
 Responder::~Responder() {
   work_->loop.post([work = work_.get()] { work->loop.quit(); });
-  if (ended_.wait_for(kPatienceAtTheEnd) == std::future_status::ready) {
-    thread_.join();
-  } else {
-    thread_.detach();
+  Ending ending{std::move(ended_), std::move(thread_)};
+  if (isProgramEnding) {
+    ending.await();
+    return;
   }
+  static Endings endings;
+  endings.add(std::move(ending));
 }
 
 void Responder::add(std::shared_ptr<Job> job) {

@@ -3,6 +3,7 @@
 #include <QCoreApplication>
 #include <QEventLoop>
 #include <QTimer>
+#include <atomic>
 #include <chrono>
 #include <cmath>
 #include <condition_variable>
@@ -32,6 +33,10 @@ std::vector<QEventLoop*>& modalLoops() {
   static std::vector<QEventLoop*> loops;
   return loops;
 }
+
+// Set from the request for the end of a modal loop until it has ended. What else waits for the main
+// thread may keep it for seconds each, so it waits until then.
+std::atomic<bool> isAborting = false;
 
 }  // namespace
 
@@ -67,8 +72,13 @@ void scheduleTimer(double seconds, std::function<void()> action) {
 void performOnMainThread(std::function<void()> action) {
   QMetaObject::invokeMethod(
       qApp,
-      [action = std::move(action)] {
-        if (!qt::isTerminating()) action();
+      [action = std::move(action)]() mutable {
+        if (qt::isTerminating()) return;
+        if (isAborting && qt::isModal()) {
+          performOnMainThread(std::move(action));
+        } else {
+          action();
+        }
       },
       Qt::QueuedConnection);
 }
@@ -79,15 +89,22 @@ void runModalForWindow(const Window& window) {
   QEventLoop loop;
   modalLoops().push_back(&loop);
   loop.exec();
-  modalLoops().pop_back();
   // Clicks and keys that waited while the main thread was busy were meant for what was shown then.
   if (!qt::isTerminating()) QCoreApplication::processEvents();
+  modalLoops().pop_back();
+  isAborting = false;
 }
 
 void abortModal() {
-  performOnMainThread([] {
-    if (!modalLoops().empty()) modalLoops().back()->quit();
-  });
+  isAborting = true;
+  const auto abort = [] {
+    if (modalLoops().empty()) {
+      isAborting = false;
+    } else {
+      modalLoops().back()->quit();
+    }
+  };
+  QMetaObject::invokeMethod(qApp, abort, Qt::QueuedConnection);
 }
 
 bool sleepOffMainThread(std::uint32_t seconds) {

@@ -29,8 +29,8 @@ class NetworkTest(unittest.TestCase):
                                   "model": "Model 100"} | entries)
         self.addCleanup(self.network.remove, name)
 
-    def publish(self, name):
-        publisher = subprocess.Popen(["avahi-publish", "-s", name, TYPE, "631"],
+    def publish(self, name, *txt):
+        publisher = subprocess.Popen(["avahi-publish", "-s", name, TYPE, "631", *txt],
                                      stderr=subprocess.DEVNULL)
         self.addCleanup(publisher.wait)
         self.addCleanup(publisher.terminate)
@@ -118,10 +118,10 @@ class NetworkTest(unittest.TestCase):
         self.addCleanup(subprocess.run, ["ip", "link", "delete", "twin0"], check=True)
         self.avahi.restart(allow_interfaces=f"{INTERFACE},twin0", publish_addresses="yes")
         self.addCleanup(self.avahi.restart)
-        publisher = self.publish("Twin")
+        publisher = self.publish("Twin", "usb_MFG=Kestrel", "usb_MDL=first", "usb_MDL=second")
         with Search(PROBE, TYPE) as search:
             search.wait_for("found", "Twin", 2)
-            search.wait_for("update", "Twin")
+            self.assertEqual(search.wait_for("update", "Twin")[3], "Kestrel first")
             subprocess.run(["ip", "link", "set", "twin0", "down"], check=True)
             search.wait_for("gone", "Twin")
             updates = len(search.events("update", "Twin"))
@@ -147,6 +147,15 @@ class NetworkTest(unittest.TestCase):
         for name in names:
             self.network.add(name, type=TYPE, activeif="closed", addresses=["192.0.2.100"])
             self.addCleanup(self.network.remove, name)
+        with Search(PROBE, TYPE) as search:
+            search.wait(lambda _: names <= {event[2] for event in search.events("update")})
+
+    def test_a_daemon_that_refuses_is_asked_again(self):
+        names = {f"Flock {number}" for number in range(12)}
+        for name in names:
+            self.add(name)
+        self.avahi.restart(objects_per_client_max="5")
+        self.addCleanup(self.avahi.restart)
         with Search(PROBE, TYPE) as search:
             search.wait(lambda _: names <= {event[2] for event in search.events("update")})
 
