@@ -23,7 +23,7 @@ constexpr std::array kRenamed = {
     Renamed{"polish", "pl"},    Renamed{"czech", "cs"},   Renamed{"hungarian", "hu"},
     Renamed{"turkish", "tr"},   Renamed{"greek", "el"},   Renamed{"arabic", "ar"},
     Renamed{"hebrew", "he"},    Renamed{"thai", "th"},    Renamed{"ukrainian", "uk"},
-    Renamed{"nb", "no"},        Renamed{"iw", "he"},      Renamed{"in", "id"}};
+    Renamed{"iw", "he"},        Renamed{"in", "id"}};
 
 bool isLetter(char c) {
   return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
@@ -65,9 +65,14 @@ std::string chineseScript(std::string_view region) {
   return region == "TW" || region == "HK" || region == "MO" ? "Hant" : "Hans";
 }
 
+// Bokmål is what a bundle that offers Norwegian offers.
+std::string_view offeredAs(std::string_view code) {
+  return code == "nb" ? "no" : code;
+}
+
 // How well an offered language serves a preferred one; 0 when not at all.
 int fitness(const Language& offered, const Language& preferred) {
-  if (offered.code.empty() || offered.code != preferred.code) return 0;
+  if (offered.code.empty() || offeredAs(offered.code) != offeredAs(preferred.code)) return 0;
   if (!offered.script.empty() && !preferred.script.empty() && offered.script != preferred.script) {
     return 0;
   }

@@ -31,7 +31,7 @@ TEST(Language, IsToldFromEveryWayOfWritingIt) {
                         {"es-419", "es", "", ""},
                         {"EN_us", "en", "", "US"},
                         {"yue-Hant", "yue", "Hant", ""},
-                        {"nb_NO", "no", "", "NO"},
+                        {"nb_NO", "nb", "", "NO"},
                         {"Base", "", "", ""},
                         {"", "", "", ""},
                         {"../en", "", "", ""}};
@@ -57,6 +57,7 @@ TEST(Language, IsChosenByLocaleThenLanguageThenDevelopment) {
                         {{"English", "Japanese"}, {"fr"}, "en", {"English"}},
                         {{"en", "fr"}, {"ko", "fr_CA"}, "en", {"fr", "en"}},
                         {{"en", "pt-BR"}, {"pt_PT"}, "en", {"pt-BR", "en"}},
+                        {{"en", "no"}, {"nb_NO"}, "en", {"no", "en"}},
                         {{"en", "zh_CN", "zh_TW"}, {"zh_CN"}, "en", {"zh_CN", "en"}},
                         {{"en", "zh-Hans", "zh-Hant"}, {"zh_TW"}, "en", {"zh-Hant", "en"}},
                         {{"en", "zh-Hans"}, {"zh_TW"}, "en", {"en"}},
