@@ -86,7 +86,10 @@ void Connection::connect() {
     static_cast<Connection*>(self)->stateChanged(state);
   };
   // Without a daemon the client waits for one to appear on the bus; without a bus there is none.
-  client_.reset(avahi_client_new(&loop_.api(), AVAHI_CLIENT_NO_FAIL, callback, this, nullptr));
+  bus_ = Bus::open(loop_, [this] { loop_.post([this] { disconnect(); }); });
+  if (bus_) {
+    client_.reset(avahi_client_new(&loop_.api(), AVAHI_CLIENT_NO_FAIL, callback, this, nullptr));
+  }
   if (!client_) retryLater();
 }
 
@@ -96,6 +99,7 @@ void Connection::disconnect() {
   for (const auto& job : jobs_)
     job->stop();
   client_.reset();
+  bus_.reset();
   for (const auto& job : jobs_)
     job->lost();
   retryLater();

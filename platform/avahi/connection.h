@@ -7,6 +7,7 @@
 #include <utility>
 #include <vector>
 
+#include "platform/avahi/bus.h"
 #include "platform/avahi/handles.h"
 #include "platform/avahi/job.h"
 #include "platform/avahi/loop.h"
@@ -41,6 +42,8 @@ class Connection {
                                                            const std::string& host);
 
   [[nodiscard]] AvahiClient* client() const { return client_.get(); }
+  /// There while jobs run.
+  [[nodiscard]] Bus& bus() const { return *bus_; }
   [[nodiscard]] Loop& loop() const { return loop_; }
 
  private:
@@ -55,8 +58,9 @@ class Connection {
   Timer retry_;
   Timer quiet_;
   ClientHandle client_;
+  std::unique_ptr<Bus> bus_;
   bool connected_ = false;
-  // Jobs hold objects of the client, so they come after it.
+  // Jobs hold objects of the client and on the bus, so they come after these.
   std::map<std::pair<AvahiIfIndex, std::string>, std::weak_ptr<HostAddresses>> hosts_;
   std::set<std::shared_ptr<Job>> jobs_;
   std::vector<std::shared_ptr<Job>> finished_;

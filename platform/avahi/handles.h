@@ -23,6 +23,5 @@ using PollHandle = Handle<AvahiSimplePoll, avahi_simple_poll_free>;
 using ClientHandle = Handle<AvahiClient, avahi_client_free>;
 using ServiceBrowserHandle = Handle<AvahiServiceBrowser, avahi_service_browser_free>;
 using ServiceResolverHandle = Handle<AvahiServiceResolver, avahi_service_resolver_free>;
-using RecordBrowserHandle = Handle<AvahiRecordBrowser, avahi_record_browser_free>;
 
 }  // namespace onramp::avahi

@@ -22,16 +22,16 @@ bool sameAddress(const AvahiAddress& a, const AvahiAddress& b) {
   return avahi_address_cmp(&a, &b) == 0;
 }
 
-std::optional<AvahiAddress> addressIn(std::uint16_t type, const void* data, std::size_t size) {
+std::optional<AvahiAddress> addressIn(const RecordBrowser::Event& event) {
   AvahiAddress address{};
-  if (type == AVAHI_DNS_TYPE_A && size == sizeof address.data.ipv4) {
+  if (event.type == AVAHI_DNS_TYPE_A && event.data.size() == sizeof address.data.ipv4) {
     address.proto = AVAHI_PROTO_INET;
-  } else if (type == AVAHI_DNS_TYPE_AAAA && size == sizeof address.data.ipv6) {
+  } else if (event.type == AVAHI_DNS_TYPE_AAAA && event.data.size() == sizeof address.data.ipv6) {
     address.proto = AVAHI_PROTO_INET6;
   } else {
     return std::nullopt;
   }
-  std::memcpy(address.data.data, data, size);
+  std::memcpy(address.data.data, event.data.data(), event.data.size());
   return address;
 }
 
@@ -49,20 +49,18 @@ HostAddresses::HostAddresses(Connection& connection, AvahiIfIndex interface, std
 std::shared_ptr<HostAddresses> HostAddresses::lookUp(Connection& connection, AvahiIfIndex interface,
                                                      const std::string& host) {
   std::shared_ptr<HostAddresses> self(new HostAddresses(connection, interface, host));
-  self->ipv4_ = self->browse(AVAHI_DNS_TYPE_A);
-  return self->ipv4_ ? self : nullptr;
+  self->browse(self->ipv4_, AVAHI_DNS_TYPE_A);
+  return self;
 }
 
 void HostAddresses::wantIPv6() {
-  if (!ipv6_) ipv6_ = browse(AVAHI_DNS_TYPE_AAAA);
+  if (!ipv6_) browse(ipv6_, AVAHI_DNS_TYPE_AAAA);
 }
 
-RecordBrowserHandle HostAddresses::browse(std::uint16_t type) {
-  RecordBrowserHandle browser(avahi_record_browser_new(connection_.client(), interface_,
-                                                       AVAHI_PROTO_UNSPEC, host_.c_str(),
-                                                       AVAHI_DNS_CLASS_IN, type, {}, called, this));
-  if (browser) ++unanswered_;
-  return browser;
+void HostAddresses::browse(std::optional<RecordBrowser>& browser, std::uint16_t type) {
+  ++unanswered_;
+  browser.emplace(connection_.bus(), interface_, host_, type,
+                  [this](const RecordBrowser::Event& event) { happened(event); });
 }
 
 void HostAddresses::whenKnown(std::function<void()> action) {
@@ -81,30 +79,17 @@ std::vector<AvahiAddress> HostAddresses::addresses() const {
   return addresses;
 }
 
-void HostAddresses::called(AvahiRecordBrowser*, AvahiIfIndex, AvahiProtocol protocol,
-                           AvahiBrowserEvent event, const char*, std::uint16_t, std::uint16_t type,
-                           const void* data, std::size_t size, AvahiLookupResultFlags, void* self) {
-  auto& host = *static_cast<HostAddresses*>(self);
-  switch (event) {
-    case AVAHI_BROWSER_NEW:
-      if (const auto address = addressIn(type, data, size)) {
-        host.records_.push_back({protocol, *address});
-        host.check();
-      }
-      break;
-    case AVAHI_BROWSER_REMOVE:
-      if (const auto address = addressIn(type, data, size)) {
-        std::erase_if(host.records_, [&](const Record& r) {
-          return r.heardBy == protocol && sameAddress(r.address, *address);
-        });
-      }
-      break;
-    case AVAHI_BROWSER_CACHE_EXHAUSTED:
-    case AVAHI_BROWSER_FAILURE:
-      host.exhausted();
-      break;
-    case AVAHI_BROWSER_ALL_FOR_NOW:
-      break;
+void HostAddresses::happened(const RecordBrowser::Event& event) {
+  const auto address = addressIn(event);
+  if (event.kind == AVAHI_BROWSER_CACHE_EXHAUSTED || event.kind == AVAHI_BROWSER_FAILURE) {
+    exhausted();
+  } else if (event.kind == AVAHI_BROWSER_NEW && address) {
+    records_.push_back({event.protocol, *address});
+    check();
+  } else if (event.kind == AVAHI_BROWSER_REMOVE && address) {
+    std::erase_if(records_, [&](const Record& r) {
+      return r.heardBy == event.protocol && sameAddress(r.address, *address);
+    });
   }
 }
 

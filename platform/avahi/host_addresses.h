@@ -5,11 +5,12 @@
 #include <cstdint>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
-#include "platform/avahi/handles.h"
 #include "platform/avahi/loop.h"
+#include "platform/avahi/record_browser.h"
 
 namespace onramp::avahi {
 
@@ -21,7 +22,7 @@ class Connection;
 /// thread only.
 class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
  public:
-  /// Starts to look; null when the daemon would not.
+  /// Starts to look.
   [[nodiscard]] static std::shared_ptr<HostAddresses> lookUp(Connection& connection,
                                                              AvahiIfIndex interface,
                                                              const std::string& host);
@@ -46,12 +47,8 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
 
   HostAddresses(Connection& connection, AvahiIfIndex interface, std::string host);
 
-  [[nodiscard]] RecordBrowserHandle browse(std::uint16_t type);
-
-  static void called(AvahiRecordBrowser* browser, AvahiIfIndex interface, AvahiProtocol protocol,
-                     AvahiBrowserEvent event, const char* name, std::uint16_t recordClass,
-                     std::uint16_t type, const void* data, std::size_t size,
-                     AvahiLookupResultFlags flags, void* self);
+  void browse(std::optional<RecordBrowser>& browser, std::uint16_t type);
+  void happened(const RecordBrowser::Event& event);
   void exhausted();
   void check();
   [[nodiscard]] bool known() const;
@@ -64,8 +61,8 @@ class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
   int unanswered_ = 0;  ///< browsers that still go through what is known at once
   bool patient_ = true;
   Timer patience_;
-  RecordBrowserHandle ipv4_;
-  RecordBrowserHandle ipv6_;
+  std::optional<RecordBrowser> ipv4_;
+  std::optional<RecordBrowser> ipv6_;
 };
 
 }  // namespace onramp::avahi

@@ -94,10 +94,6 @@ void ResolveJob::found(AvahiIfIndex interface, const char* host, std::uint16_t p
   txt_ = wireForm(txt);
   if (host_) return;
   host_ = connection_->addressesOf(interface, host);
-  if (!host_) {
-    connection_->restart(shared_from_this());
-    return;
-  }
   if (service_.protocol != AVAHI_PROTO_INET) host_->wantIPv6();
   host_->whenKnown([weak = weak_from_this()] {
     const auto job = std::static_pointer_cast<ResolveJob>(weak.lock());

@@ -130,6 +130,18 @@ class NetworkTest(unittest.TestCase):
             publisher.terminate()
             search.wait_for("remove", "Twin")
 
+    def test_a_device_is_found_by_either_protocol_or_both(self):
+        self.addCleanup(self.avahi.restart)
+        for ipv4, ipv6, addresses in (("yes", "yes", "192.0.2.1"), ("no", "yes", "")):
+            with self.subTest(ipv4=ipv4, ipv6=ipv6):
+                self.avahi.restart(publish_addresses="yes", use_ipv4=ipv4, use_ipv6=ipv6)
+                publisher = self.publish("Dual")
+                with Search(PROBE, TYPE) as search:
+                    search.wait_for("found", "Dual", [ipv4, ipv6].count("yes"))
+                    self.assertEqual(search.wait_for("update", "Dual")[6], addresses)
+                    publisher.terminate()
+                    search.wait_for("remove", "Dual")
+
     def test_two_hundred_devices_at_once(self):
         names = {f"Flock {number}" for number in range(200)}
         for name in names:

@@ -7,6 +7,10 @@ import time
 from .processes import start, stop, wait_for
 
 _LOOK_SECONDS = 20
+# Qt keeps an object for each look at each cell of a table and never frees it, so cells are looked at
+# only when one is wanted.
+_TABLES = ("list", "table", "tree", "tree table")
+_IN_TABLES = ("list item", "table cell", "table column header")
 
 
 class Person:
@@ -173,22 +177,25 @@ class Person:
                 match.append(control)
             return not match
 
-        self._visit(self._application(), visit)
+        self._visit(self._application(), visit, tables=role in _IN_TABLES)
         return match[0] if match else None
 
-    def _visit(self, control, visit):
+    def _visit(self, control, visit, tables=True):
         """Shows `visit` what is on the screen, depth first; objects that vanish are passed over."""
         if control is None:
             self._overlooked = True
             return True
         try:
-            is_application = control.get_role_name() == "application"
+            role = control.get_role_name()
+            is_application = role == "application"
             if not is_application and not self.has_state(control, "showing"):
                 return True
             if not is_application and visit(control) is False:
                 return False
+            if role in _TABLES and not tables:
+                return True
             children = [control.get_child_at_index(i) for i in range(control.get_child_count())]
         except self.errors:
             self._overlooked = True
             return True
-        return all(self._visit(child, visit) for child in children)
+        return all(self._visit(child, visit, tables) for child in children)
