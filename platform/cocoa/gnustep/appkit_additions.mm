@@ -76,8 +76,8 @@ BOOL openURL(id, SEL, NSURL* url) {
 
 }  // namespace
 
-/// What an interface file says of a control's name for assistive programs. GNUstep makes the objects
-/// of a file from its elements' names, and loads no file with one that it cannot make.
+/// What an interface file says of a control's name for assistive programs. GNUstep makes the
+/// objects of a file from its elements' names, and loads no file with one that it cannot make.
 @interface IBAccessibilityConnection : NSObject
 @end
 
