@@ -10,7 +10,9 @@ namespace onramp {
 
 /// A folder laid out as a resource bundle: Contents/Info.plist, Contents/Resources with one folder
 /// of string tables a language, and for an application its executable in a folder named after the
-/// system. Nothing is cached: every question is answered from the disk as it is now.
+/// system. The class keeps nothing but the path. What it is asked is answered from the disk, except
+/// where the system keeps what it has read of a bundle, as macOS does: a bundle is not to be
+/// changed while the program runs.
 class Bundle {
  public:
   /// The running application's own bundle.

@@ -9,7 +9,7 @@
 namespace onramp::cocoa {
 
 /// The property-list object as a dictionary; nothing when it is none, or goes past the limits of
-/// nesting depth and number of objects.
+/// nesting depth, number of objects and bytes of texts and data.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
 /// `value` as a property-list object.

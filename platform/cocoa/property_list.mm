@@ -19,7 +19,7 @@ class Reader {
  public:
   std::optional<Value> read(id object, int depth) {
     if (depth > kDeepestNesting || ++objects_ > kMostObjects) return std::nullopt;
-    if ([object isKindOfClass:[NSString class]]) return Value(cocoa::toStdString(object));
+    if ([object isKindOfClass:[NSString class]]) return string(object);
     if ([object isKindOfClass:[NSNumber class]]) return number(object);
     if ([object isKindOfClass:[NSDictionary class]]) return dictionary(object, depth);
     if ([object isKindOfClass:[NSArray class]]) return array(object, depth);
@@ -45,7 +45,19 @@ class Reader {
     return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
   }
 
-  static Value data(NSData* data) {
+  // Objects may share a text or data, values copy it: what that comes to is limited like a file.
+  bool takes(unsigned long long bytes) {
+    bytes_ += bytes;
+    return bytes_ <= kMostBytes;
+  }
+
+  std::optional<Value> string(NSString* string) {
+    if (!takes([string length])) return std::nullopt;
+    return Value(cocoa::toStdString(string));
+  }
+
+  std::optional<Value> data(NSData* data) {
+    if (!takes([data length])) return std::nullopt;
     const auto* const bytes = static_cast<const std::byte*>([data bytes]);
     return Value(Data(bytes, bytes + [data length]));
   }
@@ -64,13 +76,16 @@ class Reader {
     std::vector<Dictionary::Pair> pairs;
     for (id key in dictionary) {
       std::optional<Value> value = read([dictionary objectForKey:key], depth + 1);
-      if (!value || ![key isKindOfClass:[NSString class]]) return std::nullopt;
+      if (!value || ![key isKindOfClass:[NSString class]] || !takes([key length])) {
+        return std::nullopt;
+      }
       pairs.emplace_back(cocoa::toStdString(key), *std::move(value));
     }
     return Value(Dictionary(std::move(pairs)));
   }
 
   int objects_ = 0;
+  unsigned long long bytes_ = 0;
 };
 
 struct ToPropertyList {
@@ -100,12 +115,13 @@ struct ToPropertyList {
   }
 };
 
-// Only a file that is small enough is read at all.
+// Only a file that is small enough is read at all. The attributes are a link's own.
 NSData* contents(NSString* path) {
-  NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:path
+  NSString* const file = [path stringByResolvingSymlinksInPath];
+  NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file
                                                                                     error:nullptr];
-  return attributes && [attributes fileSize] <= kMostBytes ? [NSData dataWithContentsOfFile:path]
-                                                           : nil;
+  const bool isFile = [[attributes fileType] isEqualToString:NSFileTypeRegular];
+  return isFile && [attributes fileSize] <= kMostBytes ? [NSData dataWithContentsOfFile:file] : nil;
 }
 
 }  // namespace

@@ -36,6 +36,14 @@ Termination& termination() {
 // Whether the modal loop that runs was asked to end. Main thread only.
 bool isModalAborted = false;
 
+// The action may run a loop of its own, in which its timer must not fire again. What it holds ends
+// where it has run, not with the last reference to the object, which another thread may have.
+OnrampAction* once(std::function<void()> action) {
+  return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
+    if (const auto pending = std::exchange(action, nullptr)) pending();
+  }];
+}
+
 // A modal loop looks whether it was stopped when it has handled an event.
 void wakeEventLoop() {
   [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
@@ -64,14 +72,9 @@ void wakeSleepersForTermination() {
 
 }  // namespace cocoa
 
-// The action may run a loop of its own, in which its timer must not fire again.
 void scheduleTimer(double seconds, std::function<void()> action) {
-  OnrampAction* const once =
-      [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
-        if (const auto pending = std::exchange(action, nullptr)) pending();
-      }];
   NSTimer* const timer = [NSTimer timerWithTimeInterval:seconds
-                                                 target:once
+                                                 target:once(std::move(action))
                                                selector:@selector(perform:)
                                                userInfo:nil
                                                 repeats:NO];
@@ -81,11 +84,10 @@ void scheduleTimer(double seconds, std::function<void()> action) {
 
 void performOnMainThread(std::function<void()> action) {
   @autoreleasepool {
-    [[OnrampAction actionWithFunction:std::move(action)]
-        performSelectorOnMainThread:@selector(perform:)
-                         withObject:nil
-                      waitUntilDone:NO
-                              modes:allModes()];
+    [once(std::move(action)) performSelectorOnMainThread:@selector(perform:)
+                                              withObject:nil
+                                           waitUntilDone:NO
+                                                   modes:allModes()];
   }
 }
 

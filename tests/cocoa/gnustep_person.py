@@ -69,11 +69,14 @@ class GNUstepPerson(Person):
         """Takes a button's `item`th menu entry. The menu is open as long as the button is held."""
         self._point_at(self.see("button menu", button))
         self.desktop.run(["xdotool", "mousedown", "1"])
-        entries = wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
         nudge = itertools.cycle((0, 1))
 
         def noticed():
+            # The menu's window is put in its place late, so the entries are looked for at every try.
             # A pointer that stands still from before the menu was ready is never noticed.
+            entries = self._menu_entries()
+            if not entries:
+                return False
             self._point_at(entries[item - 1], next(nudge))
             return self.has_state((self._menu_entries() or entries)[item - 1], "selected")
 
@@ -106,6 +109,9 @@ class GNUstepPerson(Person):
     def _look(self, role, name):
         return next((control for control in self._read()
                      if control["role"] == role and name in (None, control["name"])), None)
+
+    def _ask(self):
+        self._read()
 
     def _read(self):
         """What is on the screen; blocks as long as the program's loop does."""

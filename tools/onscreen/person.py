@@ -138,11 +138,15 @@ class Person:
 
         try:
             began, waited_before = time.monotonic(), waited()
-            frame = self._application().get_child_at_index(0)
-            frame.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
+            self._ask()
             return time.monotonic() - began - (waited() - waited_before)
         except (OSError, *self.errors):
             return time.monotonic() - began if self.is_running() else None
+
+    def _ask(self):
+        """Asks the program something small and waits for the answer."""
+        frame = self._application().get_child_at_index(0)
+        frame.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
 
     def _window_count(self):
         return len(self.desktop.run(["xdotool", "search", "--onlyvisible", "--pid",

@@ -60,6 +60,12 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
   [sheet performSelector:@selector(begin) withObject:nil afterDelay:0];
 }
 
+// Applications tell each other nothing here. GNUstep starts a daemon for that, and does not launch
+// when that is slow to answer.
+id noDistributedCenter(id, SEL) {
+  return nil;
+}
+
 // GNUstep's workspace knows GNUstep's programs only; the desktop's opener knows all.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
@@ -76,6 +82,19 @@ BOOL openURL(id, SEL, NSURL* url) {
 
 }  // namespace
 
+/// What an interface file says of a control's name for assistive programs. GNUstep makes the
+/// objects of a file from its elements' names, and loads no file with one that it cannot make.
+@interface IBAccessibilityConnection : NSObject
+@end
+
+@implementation IBAccessibilityConnection
+
+- (instancetype)initWithCoder:(NSCoder*)coder {
+  return [super init];
+}
+
+@end
+
 @interface OnrampAppKitAdditions : NSObject
 @end
 
@@ -90,6 +109,8 @@ BOOL openURL(id, SEL, NSURL* url) {
     originalPerformKey =
         replaceMethod([NSButton class], @selector(performKeyEquivalent:), performKeyEquivalent);
     replaceMethod([NSWorkspace class], @selector(openURL:), openURL);
+    replaceMethod(object_getClass([NSDistributedNotificationCenter class]),
+                  @selector(defaultCenter), noDistributedCenter);
     onramp::gnustep::addMethod([NSWindow class], @selector(setShowsResizeIndicator:), ignore);
     onramp::gnustep::addMethod([NSWindow class],
                                @selector(setPreventsApplicationTerminationWhenModal:), ignore);
