@@ -18,8 +18,7 @@ class Connection;
 
 /// All addresses of a host on one interface. (Avahi's resolver gives one address only, and that of
 /// the family that the service was found by.) IPv6 is asked for where somebody wants it or nothing
-/// else is there: each question costs as much time as all else that a resolve does. On the loop's
-/// thread only.
+/// else is there, since each question is one more for the daemon. On the loop's thread only.
 class HostAddresses : public std::enable_shared_from_this<HostAddresses> {
  public:
   /// Starts to look.
