@@ -3,19 +3,104 @@
 
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "netconfig/current_interface.h"
 #include "netconfig/local_address_cache.h"
 #include "netconfig/local_address_list.h"
-#include "tests/netconfig/scripted_store.h"
+#include "platform/dynamic_store.h"
 
 namespace onramp {
 namespace {
 
-using scripted::Step;
-using scripted::Store;
 using ::testing::ElementsAre;
+
+enum class Step { kNone, kCreate, kKey, kCopy };
+
+/// A store that holds and does what a test says, and remembers how it was called.
+struct Store {
+  Dictionary contents;
+  Step failing = Step::kNone;
+  int error = 0;  ///< what lastDynamicStoreError reports
+  std::vector<std::string> log;
+  DynamicStoreCallback callback;  ///< of the session that was last created with one
+
+  /// The contents become these, and the installed callback hears of it.
+  void change(Dictionary newContents) {
+    contents = std::move(newContents);
+    callback({"State:/Network/Interface/some/IPv4"});
+  }
+
+  void note(std::string call, const std::vector<std::string>& keys,
+            const std::vector<std::string>& patterns) {
+    for (const auto& [word, texts] : {std::pair(" keys", keys), {" patterns", patterns}}) {
+      call += word;
+      for (const std::string& text : texts)
+        call += " " + text;
+    }
+    log.push_back(call);
+  }
+};
+
+Store& script() {
+  static Store store;
+  return store;
+}
+
+}  // namespace
+
+struct DynamicStore {};
+struct DynamicStoreSource {};
+
+DynamicStoreRef createDynamicStore(const std::string& name, DynamicStoreCallback callback) {
+  script().log.push_back((callback ? "create with callback " : "create ") + name);
+  if (script().failing == Step::kCreate) return nullptr;
+  if (callback) script().callback = std::move(callback);
+  return std::make_shared<DynamicStore>();
+}
+
+std::optional<std::string> createNetworkInterfaceEntityKey(std::string_view domain,
+                                                           std::string_view interface,
+                                                           std::string_view entity) {
+  if (script().failing == Step::kKey) return std::nullopt;
+  return std::string(domain) + "interface:" + std::string(interface) + ":" + std::string(entity);
+}
+
+std::optional<std::string> createNetworkGlobalEntityKey(std::string_view domain,
+                                                        std::string_view entity) {
+  if (script().failing == Step::kKey) return std::nullopt;
+  return std::string(domain) + "global:" + std::string(entity);
+}
+
+std::optional<Dictionary> copyMultiple(const DynamicStoreRef& store,
+                                       const std::vector<std::string>& keys,
+                                       const std::vector<std::string>& patterns) {
+  script().note("copy", keys, patterns);
+  if (!store || script().failing == Step::kCopy) return std::nullopt;
+  return script().contents;
+}
+
+bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::string>& keys,
+                         const std::vector<std::string>& patterns) {
+  script().note("notify", keys, patterns);
+  return store != nullptr;
+}
+
+DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int order) {
+  script().log.push_back("source of order " + std::to_string(order));
+  return store ? std::make_shared<DynamicStoreSource>() : nullptr;
+}
+
+void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
+  script().log.emplace_back(source ? "add source" : "add null source");
+}
+
+int lastDynamicStoreError() {
+  return script().error;
+}
+
+namespace {
 
 Dictionary ipv4State(const Array& addresses, const Array& masks, const Array& broadcasts) {
   return {{"Addresses", addresses}, {"SubnetMasks", masks}, {"BroadcastAddresses", broadcasts}};
@@ -37,7 +122,7 @@ class Netconfig : public ::testing::Test {
     store.log.clear();
   }
 
-  Store& store = Store::instance();
+  Store& store = script();
 };
 
 TEST_F(Netconfig, ListHoldsTheAddressArraysOfEveryStateThatIsADictionary) {
@@ -94,9 +179,8 @@ TEST_F(Netconfig, AccessorsGiveTheFirstTextOfAnEntry) {
   EXPECT_EQ(*local_broadcast_address_at(list, 0), "10.255.255.255");
   EXPECT_EQ(*local_broadcast_address_at(list, 1), "10.1.1.1");
   EXPECT_EQ(local_subnet_mask_at(list, 1), nullptr);
-  for (std::size_t index = 1; index < 6; ++index) {
+  for (std::size_t index = 1; index < 6; ++index)
     EXPECT_EQ(local_address_at(list, index), nullptr) << index;
-  }
   EXPECT_EQ(local_address_list_count(nullptr), 0U);
   EXPECT_EQ(local_address_at(nullptr, 0), nullptr);
 }

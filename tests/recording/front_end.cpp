@@ -77,10 +77,6 @@ Object& FrontEnd::object(const std::string& name) {
   return *found;
 }
 
-bool FrontEnd::has(const std::string& name) const {
-  return findLiveObject(name) != nullptr;
-}
-
 void FrontEnd::click(const std::string& buttonName) {
   const Object& button = object(buttonName);
   if (button.hidden || !button.enabled) return;
@@ -97,10 +93,6 @@ void FrontEnd::runTimers() {
     now_ = timer.due;
     timer.action();
   }
-}
-
-bool FrontEnd::pumpUntil(const std::function<bool()>& done, double seconds) {
-  return runPosted(done, std::chrono::duration<double>(seconds));
 }
 
 }  // namespace onramp::recording
