@@ -30,15 +30,6 @@ class Navigation : public Wizard {
   }
 };
 
-TEST_F(Navigation, AWiredModelGoesStraightToThePackage) {
-  describeTwoModels();
-  launch();
-  chooseModel("Cable");
-  screen.click("rightMostButton");
-  EXPECT_EQ(medium.modelFile(), (Dictionary{{"Model", "Cable"}, {"Interface", "Default"}}));
-  expectPackageOpenedAndQuit();
-}
-
 TEST_F(Navigation, AWirelessModelIsAskedForItsConnection) {
   goToConnectionPage();
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
@@ -50,16 +41,6 @@ TEST_F(Navigation, AWirelessModelIsAskedForItsConnection) {
   chooseRow(1);
   screen.click("rightMostButton");
   EXPECT_EQ(medium.modelFile(), (Dictionary{{"Model", "All"}, {"Interface", "Default"}}));
-  expectPackageOpenedAndQuit();
-}
-
-TEST_F(Navigation, WithoutAChosenModelUSBWritesNoModelFile) {
-  describe({{"A", model(true, false, true)}});
-  launch();
-  chooseRow(1);
-  screen.click("rightMostButton");
-  EXPECT_FALSE(medium.modelFile());
-  EXPECT_TRUE(medium.optionsFile());
   expectPackageOpenedAndQuit();
 }
 

@@ -166,9 +166,10 @@ TEST_F(NetServiceTest, TheSystemVersionChoosesTheURIScheme) {
 
 TEST_F(NetServiceTest, ADeviceURILeadsBackToItsDevice) {
   for (const std::string name : {"50% off; #1 @ \"home\" <a>|b\\c^`{d}", "Büro 3. Stock", "_udp"}) {
-    network.answers = {{name + "._ipp._tcp.local.", {ipv4Address(192, 0, 2, 7)}}};
+    network.answers = {{name + "._pdl-datastream._tcp.local.", {ipv4Address(192, 0, 2, 7)}}};
     std::optional<std::vector<std::string>> addresses;
-    const std::string uri = KSNetServiceCreateDeviceURI(name, "_ipp._tcp.", "local.");
+    const std::string uri = KSNetServiceCreateDeviceURI(name, "_pdl-datastream._tcp.", "local.");
+    EXPECT_TRUE(uri.ends_with("/?bidi"));
     EXPECT_EQ(KSNetServiceCopyAddressesForDeviceURI(uri, &addresses, 2.5), 0) << uri;
     EXPECT_THAT(addresses, Optional(ElementsAre("192.0.2.7"))) << uri;
     EXPECT_EQ(network.timeouts.back(), 2.5);

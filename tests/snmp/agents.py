@@ -34,20 +34,24 @@ def always(answer):
     return lambda send, request: send(answer(identifier_of(request)))
 
 
+def bound_to(address, port=0):
+    stranger = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
+    stranger.bind((address, port))
+    return stranger
+
+
+def from_other_port(send, request):
+    with bound_to("127.0.2.2") as other_port:
+        send(reply(identifier_of(request), TWO), other_port)
+
+
 def with_strangers(send, request):
     identifier = identifier_of(request)
-    with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as other_port, \
-         socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as other_address:
-        other_address.bind(("127.0.2.250", 0))
+    with bound_to("127.0.2.3") as other_port, bound_to("127.0.2.250", PORT) as other_address:
         send(reply(identifier, ONE), other_port)
         send(reply(identifier, ONE), other_address)
     for _ in range(2):
         send(reply(identifier, TWO))
-
-
-def from_other_port(send, request):
-    with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as other_port:
-        send(reply(identifier_of(request), TWO), other_port)
 
 
 ODD = {
@@ -66,9 +70,7 @@ ODD = {
 def start_odd_agents():
     selector = selectors.DefaultSelector()
     for address, behaviour in ODD.items():
-        listener = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
-        listener.bind((address, PORT))
-        selector.register(listener, selectors.EVENT_READ, behaviour)
+        selector.register(bound_to(address, PORT), selectors.EVENT_READ, behaviour)
 
     def serve():
         while True:
