@@ -1,4 +1,4 @@
-"""Discovery against real parts: network_test.py PROBE NODE_FOLDER, started on two hosts with a
+"""Discovery against real parts: network_test.py PROBE, started on two hosts with a
 cable between them. The devices are Avahi's on the other host, and another implementation's here."""
 
 import os
@@ -15,7 +15,7 @@ import discovery
 from practice_network.control import PracticeNetwork
 from discovery import INTERFACE, Avahi, Process, Search
 
-PROBE, NODE_FOLDER = (os.path.abspath(argument) for argument in sys.argv[1:3])
+PROBE = os.path.abspath(sys.argv[1])
 TYPE = "_ipp._tcp"
 
 
@@ -81,10 +81,9 @@ class NetworkTest(unittest.TestCase):
 
     def test_a_second_implementation_is_understood(self):
         with Search(PROBE, TYPE) as search:
-            with Process("node", HERE / "second_responder.js", INTERFACE, "Harrier (2)", "ipp",
-                         "631", "usb_MFG=Harrier", "usb_MDL=Jet 7", "note=Attic",
-                         cwd=NODE_FOLDER) as responder:
-                responder.wait(lambda lines: "published Harrier (2)" in lines)
+            with Process(sys.executable, HERE / "second_responder.py", "192.0.2.1", "Harrier (2)",
+                         TYPE, "631", "usb_MFG=Harrier", "usb_MDL=Jet 7", "note=Attic") as responder:
+                responder.wait(lambda lines: "published" in lines)
                 event = search.wait_for("update", "Harrier (2)")
                 self.assertEqual(event[3:5], ["Harrier Jet 7", "Attic"])
                 self.assertEqual(event[6], "192.0.2.1")
@@ -216,4 +215,4 @@ class NetworkTest(unittest.TestCase):
 
 if __name__ == "__main__":
     discovery.enclose(HERE / "network.toml")
-    unittest.main(argv=sys.argv[:1] + sys.argv[3:], verbosity=2)
+    unittest.main(argv=sys.argv[:1] + sys.argv[2:], verbosity=2)

@@ -5,7 +5,6 @@ import itertools
 import os
 import plistlib
 import re
-import struct
 import subprocess
 import unittest
 from pathlib import Path
@@ -134,14 +133,11 @@ class Medium(unittest.TestCase):
     def test_the_set_up_tool_ends_with_the_status_it_is_told(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
-        for told, status in ((None, 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):
+        for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):
             with self.subTest(told):
-                environment = {name: value for name, value in os.environ.items()
-                               if name != "ONRAMP_EXAMPLE_TOOL_STATUS"}
-                if told is not None:
-                    environment["ONRAMP_EXAMPLE_TOOL_STATUS"] = told
-                run = subprocess.run([program, "-installer"], env=environment, timeout=30,
-                                     capture_output=True, text=True, check=False)
+                run = subprocess.run([program, "-installer"], timeout=30, capture_output=True,
+                                     env=os.environ | {"ONRAMP_EXAMPLE_TOOL_STATUS": told},
+                                     text=True, check=False)
                 self.assertEqual(status, run.returncode)
                 self.assertIn("-installer", run.stderr)
 
@@ -163,14 +159,6 @@ class ApplicationResources(unittest.TestCase):
     def test_countries_are_keyed_by_codes_in_capitals(self):
         countries = plistlib.loads((RESOURCES / "SupportedKOL.plist").read_bytes())["Country"]
         self.assertEqual([], [code for code in countries if not re.fullmatch("[A-Z]{2}", code)])
-
-    def test_pictures_are_drawn_at_two_pixels_a_point(self):
-        images = MEDIUM / "MacResources/Images"
-        sizes = {RESOURCES / "Background.png": (340, 240), images / "wirelessLan.png": (192, 192),
-                 images / "usb.png": (192, 192), images / "wiredLan.png": (192, 192)}
-        for path, size in sizes.items():
-            with self.subTest(path.name):
-                self.assertEqual(size, struct.unpack(">II", path.read_bytes()[16:24]))
 
 
 if __name__ == "__main__":

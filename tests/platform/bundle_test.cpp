@@ -17,23 +17,18 @@ TEST(Language, IsToldFromEveryWayOfWritingIt) {
     const char* script;
     const char* region;
   };
-  const Case cases[] = {
-
-      {"pt-BR", "pt", "", "BR"},
-
-      {"zh-Hant", "zh", "Hant", ""},
-      {"zh_TW", "zh", "Hant", "TW"},
-
-      {"zh-Hant-HK", "zh", "Hant", "HK"},
-      {"German", "de", "", ""},
-
-      {"es-419", "es", "", ""},
-      {"EN_us", "en", "", "US"},
-      {"yue-Hant", "yue", "Hant", ""},
-
-      {"Base", "", "", ""},
-      {"", "", "", ""},
-      {"../en", "", "", ""}};
+  const Case cases[] = {{"de_DE@euro", "de", "", "DE"},
+                        {"pt-BR", "pt", "", "BR"},
+                        {"zh-Hant", "zh", "Hant", ""},
+                        {"zh_TW", "zh", "Hant", "TW"},
+                        {"zh-Hant-HK", "zh", "Hant", "HK"},
+                        {"German", "de", "", ""},
+                        {"es-419", "es", "", ""},
+                        {"EN_us", "en", "", "US"},
+                        {"yue-Hant", "yue", "Hant", ""},
+                        {"Base", "", "", ""},
+                        {"", "", "", ""},
+                        {"../en", "", "", ""}};
   for (const Case& c : cases) {
     const Language language = Language::parse(c.identifier);
     EXPECT_EQ(language.code, c.code) << c.identifier;

@@ -71,6 +71,10 @@ class FrontEnd {
   /// Runs the scheduled timers, earliest first, until none is left or the application terminates.
   void runTimers();
 
+  // What the seam's functions ask for.
+  void schedule(double seconds, std::function<void()> action);
+  [[nodiscard]] Object* menuBar();
+
   // What the program did.
   std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
   std::vector<ShownAlert> alerts;
@@ -83,7 +87,7 @@ class FrontEnd {
   std::function<void(int pause)> duringPause;  ///< called on the main thread, counted from 1
 
  private:
-  friend struct Access;
+  Object& addMenuObject(OutletKind kind, const std::string& text);
 
   struct Timer {
     double due;
@@ -92,7 +96,7 @@ class FrontEnd {
 
   double now_ = 0;
   std::list<Timer> timers_;
-  std::list<std::unique_ptr<Object>> menus_;
+  std::list<Object> menus_;  // the menu bar first
   std::unique_ptr<Interface> mainInterface_;
 };
 
