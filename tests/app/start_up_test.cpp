@@ -122,14 +122,6 @@ std::map<std::string, std::string> filesBelow(const std::string& folder) {
   return files;
 }
 
-TEST_F(StartUp, NeedsNothingOnTheMedium) {
-  launch();
-  EXPECT_EQ(page(), "");
-  EXPECT_EQ(medium.opened(0), std::vector<std::string>());
-  screen.runTimers();
-  EXPECT_TRUE(screen.terminated);
-}
-
 TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
   const std::string texts =
       "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
