@@ -35,9 +35,9 @@ def always(answer):
 
 
 def bound_to(address, port=0):
-    stranger = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
-    stranger.bind((address, port))
-    return stranger
+    bound = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
+    bound.bind((address, port))
+    return bound
 
 
 def from_other_port(send, request):
