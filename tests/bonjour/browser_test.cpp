@@ -153,6 +153,17 @@ TEST_F(BrowserTest, StoppingDropsTheTableAndRunningResolvesSilently) {
   browser->stopBrowsing();
 }
 
+TEST_F(BrowserTest, ARestartBeginsCleanWithOneBrowse) {
+  network.found(onOne);
+  browser->startBrowsing();
+  browser->startBrowsing();
+  EXPECT_EQ(network.browsers.size(), 1u);
+  EXPECT_FALSE(contains());
+  recorder->events.clear();
+  network.found(onOne);
+  EXPECT_THAT(recorder->events, ElementsAre(Event{"add", onOne}));
+}
+
 }  // namespace
 
 }  // namespace onramp
