@@ -59,13 +59,17 @@ function(onramp_namespace_test name)
   endif()
 endfunction()
 
-# onramp_fuzz(NAME SOURCES… [LINK libraries…]): a libFuzzer program. ctest gives it a short run that
-# starts from the folder corpus/NAME beside its source; finds go to the build folder.
+# onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]): a libFuzzer program. ctest gives it a
+# short run that starts from the folder corpus/NAME, or another one there, beside its source; finds go
+# to the build folder.
 function(onramp_fuzz name)
   if(NOT ONRAMP_FUZZ)
     return()
   endif()
-  cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
+  cmake_parse_arguments(ARG "" "CORPUS" "LINK" ${ARGN})
+  if(NOT ARG_CORPUS)
+    set(ARG_CORPUS ${name})
+  endif()
   add_executable(${name} ${ARG_UNPARSED_ARGUMENTS})
   target_link_libraries(${name} PRIVATE onramp_options ${ARG_LINK})
   target_link_options(${name} PRIVATE -fsanitize=fuzzer)
@@ -73,6 +77,6 @@ function(onramp_fuzz name)
   add_test(NAME ${name}
     COMMAND ${name} -runs=100000 -max_total_time=20 -timeout=5 -print_final_stats=1
       -artifact_prefix=${CMAKE_CURRENT_BINARY_DIR}/${name}-found/
-      ${CMAKE_CURRENT_BINARY_DIR}/${name}-found ${CMAKE_CURRENT_SOURCE_DIR}/corpus/${name})
+      ${CMAKE_CURRENT_BINARY_DIR}/${name}-found ${CMAKE_CURRENT_SOURCE_DIR}/corpus/${ARG_CORPUS})
   set_tests_properties(${name} PROPERTIES TIMEOUT 120)
 endfunction()

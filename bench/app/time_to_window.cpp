@@ -51,13 +51,9 @@ void end(pid_t process) {
 }  // namespace
 
 int main(int argc, char** argv) {
-  if (argc < 2) {
-    std::fprintf(stderr, "usage: time_to_window PROGRAM [ARGUMENT…], with DISPLAY set\n");
-    return 2;
-  }
   const DisplayHandle display(XOpenDisplay(nullptr), XCloseDisplay);
-  if (!display) {
-    std::fprintf(stderr, "time_to_window: there is no display; set DISPLAY\n");
+  if (argc < 2 || !display) {
+    std::fprintf(stderr, "usage: time_to_window PROGRAM [ARGUMENT…], with DISPLAY set\n");
     return 2;
   }
   const unsigned long before = middlePixel(display.get());

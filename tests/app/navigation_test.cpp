@@ -30,15 +30,6 @@ class Navigation : public Wizard {
   }
 };
 
-TEST_F(Navigation, AWiredModelGoesStraightToThePackage) {
-  describeTwoModels();
-  launch();
-  chooseModel("Cable");
-  screen.click("rightMostButton");
-  EXPECT_EQ(medium.modelFile(), (Dictionary{{"Model", "Cable"}, {"Interface", "Default"}}));
-  expectPackageOpenedAndQuit();
-}
-
 TEST_F(Navigation, AWirelessModelIsAskedForItsConnection) {
   goToConnectionPage();
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
@@ -53,50 +44,28 @@ TEST_F(Navigation, AWirelessModelIsAskedForItsConnection) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(Navigation, WithoutAChosenModelUSBWritesNoModelFile) {
-  describe({{"A", model(true, false, true)}});
-  launch();
-  chooseRow(1);
-  screen.click("rightMostButton");
-  EXPECT_FALSE(medium.modelFile());
-  EXPECT_TRUE(medium.optionsFile());
-  expectPackageOpenedAndQuit();
-}
-
-TEST_F(Navigation, BackReturnsToTheModelChosenBefore) {
-  describe({{"A", model(true, false, true)}, {"B", model(true, true, true)}});
-  launch();
-  chooseModel("B");
-  screen.click("rightMostButton");
-  screen.click("rightButton");
-  EXPECT_EQ(page(), "ModelListView");
-  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
-  EXPECT_EQ(modelList().selectedObject(), (Dictionary{{"model", "B"}}));
-  EXPECT_EQ(screen.log.back(), "front");
-}
-
 TEST_F(Navigation, CancelQuitsFromEveryPageAndWritesNothing) {
-  const std::function<void()> ways[] = {[&] {
-                                          describeTwoModels();
-                                          launch();
-                                          screen.click("rightButton");
-                                        },
-                                        [&] {
-                                          goToConnectionPage();
-                                          screen.click("leftButton");
-                                        },
-                                        [&] {
-                                          describe({{"A", model(true, false, true)}});
-                                          launch();
-                                          screen.click("rightButton");
-                                        },
-                                        [&] {
-                                          searchInVainWithTool(0);
-                                          screen.click("rightButton");
-                                        }};
-  for (const auto& way : ways) {
+  const std::function<void()> fromTheList = [&] {
+    describeTwoModels();
+    launch();
+    screen.click("rightButton");
+  };
+  const std::function<void()> fromTheConnection = [&] {
+    goToConnectionPage();
+    screen.click("leftButton");
+  };
+  const std::function<void()> fromTheFirstPage = [&] {
+    describe({{"A", model(true, false, true)}});
+    launch();
+    screen.click("rightButton");
+  };
+  const std::function<void()> fromTheChooser = [&] {
+    searchInVainWithTool(0);
+    screen.click("rightButton");
+  };
+  for (const auto& cancel : {fromTheList, fromTheConnection, fromTheFirstPage, fromTheChooser}) {
     screen.reset();
-    way();
+    cancel();
     EXPECT_TRUE(screen.terminated);
     EXPECT_FALSE(medium.modelFile());
     EXPECT_FALSE(medium.optionsFile());

@@ -3,6 +3,7 @@
 #include <iterator>
 #include <map>
 
+#include "platform/property_list.h"
 #include "tests/app/wizard.h"
 
 namespace onramp {
@@ -95,12 +96,16 @@ TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
   EXPECT_EQ(buttons(), "[BTN_CANCEL][次へ]");
 }
 
+// Puts a property list where an earlier run left one.
+void leaveFile(const std::string& file) {
+  std::filesystem::create_directories(std::filesystem::path(file).parent_path());
+  ASSERT_TRUE(writeDictionaryAtomically({}, file));
+}
+
 TEST_F(StartUp, RemovesWhatAnEarlierRunHandedOver) {
   describeTwoModels();
-  for (const std::string& file : {medium.modelFilePath(), medium.optionsFilePath()}) {
-    std::filesystem::create_directories(std::filesystem::path(file).parent_path());
-    std::filesystem::copy_file(medium.path("MacResources/CDInfo.plist"), file);
-  }
+  for (const std::string& file : {medium.modelFilePath(), medium.optionsFilePath()})
+    leaveFile(file);
   launch();
   EXPECT_FALSE(medium.modelFile());
   EXPECT_FALSE(medium.optionsFile());
@@ -115,14 +120,6 @@ std::map<std::string, std::string> filesBelow(const std::string& folder) {
     files[entry.path().string()] = std::string(std::istreambuf_iterator<char>(file), {});
   }
   return files;
-}
-
-TEST_F(StartUp, NeedsNothingOnTheMedium) {
-  launch();
-  EXPECT_EQ(page(), "");
-  EXPECT_EQ(medium.opened(0), std::vector<std::string>());
-  screen.runTimers();
-  EXPECT_TRUE(screen.terminated);
 }
 
 TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
@@ -204,61 +201,51 @@ TEST_F(StartUp, GoesOnWithoutAPageWhoseInterfaceFileIsMissing) {
   EXPECT_TRUE(screen.terminated) << "with no page, every button quits";
 }
 
-struct SystemCase {
-  const char* system;
-  Dictionary minimum;
-  Dictionary maximum;
-  const char* alert;  // a part of the alert's text; empty for a supported system
-};
-
 Dictionary version(Value major, Value minor, Value bugFix) {
   return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
 }
 
-class SystemRange : public Wizard, public testing::WithParamInterface<SystemCase> {};
-
-TEST_P(SystemRange, IsCheckedBeforeAnythingElse) {
-  const SystemCase& c = GetParam();
-  describeTwoModels(Dictionary{{"SystemMin", c.minimum}, {"SystemMax", c.maximum}});
-  medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
-  std::filesystem::create_directories(std::filesystem::path(medium.modelFilePath()).parent_path());
-  std::filesystem::copy_file(medium.path("MacResources/CDInfo.plist"), medium.modelFilePath());
-  launch();
-  if (*c.alert == '\0') {
-    EXPECT_TRUE(screen.alerts.empty());
-    EXPECT_EQ(page(), "ModelListView");
-    return;
+TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
+  const Dictionary none = version("0", "0", "0");
+  const struct {
+    const char* system;
+    Dictionary minimum;
+    Dictionary maximum;
+    std::string alert;  // a part of the alert's text; empty for a supported system
+  } cases[] = {{"10.5.8", version(10, 6, 0), none, "Mac OS X 10.6 or"},
+               {"10.6.0", version("10", "6", "0"), none, ""},
+               {"10.9.9", version(10, 10, 0), none, "Mac OS X 10.10 or"},
+               {"10.6.2", version(10, 6, 3), none, "Mac OS X 10.6.3 or"},
+               {"9.9.9", version(10, 0, 0), none, "Mac OS X 10.0 or"},
+               {"10.9.5", none, version(10, 9, "X"), ""},
+               {"10.10.0", none, version(10, 9, "X"), "Solutions Center"},
+               {"10.9.2", none, version(10, 9, 3), ""},
+               {"10.9.3", none, version("10", "9", "3"), "Solutions Center"},
+               {"11.0", none, version(10, 15, "x"), "Solutions Center"},
+               {"10.9", none, version(10, 9, 1), ""},
+               {"10.9", none, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
+               {"99.9.9", none, none, ""},
+               {"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
+               // Outside both: the maximum is looked at first.
+               {"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}};
+  for (const auto& c : cases) {
+    SCOPED_TRACE(std::string(c.system) + ' ' + c.alert);
+    screen.reset();
+    describeTwoModels(Dictionary{{"SystemMin", c.minimum}, {"SystemMax", c.maximum}});
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
+    leaveFile(medium.modelFilePath());
+    launch();
+    EXPECT_EQ(medium.modelFile().has_value(), !c.alert.empty())
+        << "no hand-off file is touched before the check";
+    EXPECT_EQ(page(), c.alert.empty() ? "ModelListView" : "");
+    ASSERT_EQ(screen.alerts.size(), c.alert.empty() ? 0U : 1U);
+    if (c.alert.empty()) continue;
+    EXPECT_NE(screen.alerts[0].informativeText.find(c.alert), std::string::npos)
+        << screen.alerts[0].informativeText;
+    EXPECT_EQ(screen.alerts[0].buttonTitle, "Close");
+    EXPECT_EQ(screen.log, (std::vector<std::string>{"center", "close", "alert", "terminate"}));
   }
-  ASSERT_EQ(screen.alerts.size(), 1U);
-  EXPECT_NE(screen.alerts[0].informativeText.find(c.alert), std::string::npos)
-      << screen.alerts[0].informativeText;
-  EXPECT_EQ(screen.alerts[0].buttonTitle, "Close");
-  EXPECT_EQ(screen.log, (std::vector<std::string>{"center", "close", "alert", "terminate"}));
-  EXPECT_EQ(page(), "");
-  EXPECT_TRUE(medium.modelFile()) << "no hand-off file is touched before the check";
 }
-
-const Dictionary kNone = version("0", "0", "0");
-
-INSTANTIATE_TEST_SUITE_P(
-    Systems, SystemRange,
-    testing::Values(
-        SystemCase{"10.5.8", version(10, 6, 0), kNone, "Mac OS X 10.6 or"},
-        SystemCase{"10.6.0", version("10", "6", "0"), kNone, ""},
-        SystemCase{"10.9.9", version(10, 10, 0), kNone, "Mac OS X 10.10 or"},
-        SystemCase{"10.6.2", version(10, 6, 3), kNone, "Mac OS X 10.6.3 or"},
-        SystemCase{"9.9.9", version(10, 0, 0), kNone, "Mac OS X 10.0 or"},
-        SystemCase{"10.9.5", kNone, version(10, 9, "X"), ""},
-        SystemCase{"10.10.0", kNone, version(10, 9, "X"), "Solutions Center"},
-        SystemCase{"10.9.2", kNone, version(10, 9, 3), ""},
-        SystemCase{"10.9.3", kNone, version("10", "9", "3"), "Solutions Center"},
-        SystemCase{"11.0", kNone, version(10, 15, "x"), "Solutions Center"},
-        SystemCase{"10.9", kNone, version(10, 9, 1), ""},
-        SystemCase{"10.9", kNone, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
-        SystemCase{"99.9.9", kNone, kNone, ""},
-        SystemCase{"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
-        // Outside both: the maximum is looked at first.
-        SystemCase{"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}));
 
 TEST_F(StartUp, FillsTheMinimumIntoAsManyPlacesAsTheTextHas) {
   describeTwoModels(Dictionary{{"SystemMin", version(10, 11, 0)}});

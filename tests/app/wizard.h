@@ -6,6 +6,7 @@
 #include <string>
 
 #include "app/OnrampOSXAppDelegate.h"
+#include "pages/ChooseDeviceView.h"
 #include "platform/array_controller.h"
 #include "tests/recording/front_end.h"
 #include "tests/recording/medium_folder.h"
@@ -59,6 +60,16 @@ class Wizard : public testing::Test {
 
   void chooseModel(const std::string& name) const {
     modelList().setSelectedObject(Dictionary{{"model", name}});
+  }
+
+  /// "name address" of every row of the device list from the top.
+  [[nodiscard]] std::vector<std::string> deviceRows() const {
+    std::vector<std::string> rows;
+    for (const Dictionary& entry : screen.object("deviceListView").content->arrangedObjects()) {
+      rows.push_back(entry.string(ChooseDeviceView::kDevice).value_or("?") + ' ' +
+                     entry.string(ChooseDeviceView::kLocation).value_or("?"));
+    }
+    return rows;
   }
 
   void chooseRow(int row) const { screen.object("connectionTypeRadioButton").selectedRow = row; }

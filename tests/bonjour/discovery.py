@@ -101,7 +101,11 @@ class Avahi:
         process = pathlib.Path("/proc", str(self._pid()))
         os.kill(self._pid(), signal.SIGKILL)
         # A new one does not start while there is any trace of the old one.
-        self._wait(lambda: not process.exists())
+        deadline = time.monotonic() + PATIENCE
+        while process.exists():
+            if time.monotonic() > deadline:
+                raise AssertionError("avahi-daemon does not end")
+            time.sleep(0.01)
 
     def freeze(self):
         os.kill(self._pid(), signal.SIGSTOP)
@@ -127,14 +131,6 @@ class Avahi:
 
     def _pid(self):
         return int(self.pid_file.read_text())
-
-    @staticmethod
-    def _wait(condition):
-        deadline = time.monotonic() + PATIENCE
-        while not condition():
-            if time.monotonic() > deadline:
-                raise AssertionError("avahi-daemon does not end")
-            time.sleep(0.01)
 
 
 def announce_pointer(service_type, target_labels):

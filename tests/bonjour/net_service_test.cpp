@@ -1,7 +1,7 @@
 #include <gmock/gmock.h>
 
 #include "bonjour/KSNetService.h"
-#include "tests/bonjour/medium_stub.h"
+#include "tests/recording/medium_folder.h"
 #include "tests/recording/network.h"
 
 namespace onramp {
@@ -30,7 +30,6 @@ class NetServiceTest : public ::testing::Test {
  protected:
   NetServiceTest() {
     network.reset();
-    testing_medium::medium() = {};
     events.clear();
   }
 
@@ -155,38 +154,25 @@ TEST_F(NetServiceTest, UnusableTxtDataGivesNoTexts) {
 }
 
 TEST_F(NetServiceTest, TheSystemVersionChoosesTheURIScheme) {
-  struct Case {
-    std::optional<std::int32_t> version;
-    const char* uri;
-  };
-  for (const Case& c : {Case{0x1095, "dnssd://A%20B%281%29._printer._tcp.local."},
-                        Case{0x1060, "dnssd://A%20B%281%29._printer._tcp.local."},
-                        Case{0x1058, "mdns://A%20B%281%29._printer._tcp.local."},
-                        Case{std::nullopt, "mdns://A%20B%281%29._printer._tcp.local."}}) {
-    testing_medium::medium().systemVersion = c.version;
-    EXPECT_EQ(KSNetServiceCreateDeviceURI("A B(1)", "_printer._tcp.", "local."), c.uri);
+  MediumFolder medium;
+  for (const auto& [version, scheme] :
+       {std::pair{"10.9.5", "dnssd"}, {"10.6.0", "dnssd"}, {"10.5.8", "mdns"}, {"none", "mdns"}}) {
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", version);
+    EXPECT_EQ(KSNetServiceCreateDeviceURI("A B(1)", "_printer._tcp.", "local."),
+              std::string(scheme) + "://A%20B%281%29._printer._tcp.local.");
   }
   EXPECT_EQ(KSNetServiceCopyDeviceURI(nullptr), std::nullopt);
 }
 
 TEST_F(NetServiceTest, ADeviceURILeadsBackToItsDevice) {
-  const std::vector<std::string> names = {"Office Printer",
-                                          "A B(1)",
-                                          "50% off; #1 @ \"home\" <a>|b\\c^`{d}",
-                                          "Büro 3. Stock",
-                                          "🖨️ Drucker",
-                                          "_udp",
-                                          "a/b?c:d&e=f+g,h",
-                                          std::string(63, 'x')};
-  for (const std::string& name : names) {
-    for (const char* type : {"_pdl-datastream._tcp.", "_ipp._tcp.", "_printer._tcp."}) {
-      network.answers = {{name + '.' + type + "local.", {ipv4Address(192, 0, 2, 7)}}};
-      std::optional<std::vector<std::string>> addresses;
-      const std::string uri = KSNetServiceCreateDeviceURI(name, type, "local.");
-      EXPECT_EQ(KSNetServiceCopyAddressesForDeviceURI(uri, &addresses, 2.5), 0) << uri;
-      EXPECT_THAT(addresses, Optional(ElementsAre("192.0.2.7"))) << uri;
-      EXPECT_EQ(network.timeouts.back(), 2.5);
-    }
+  for (const std::string name : {"50% off; #1 @ \"home\" <a>|b\\c^`{d}", "Büro 3. Stock", "_udp"}) {
+    network.answers = {{name + "._pdl-datastream._tcp.local.", {ipv4Address(192, 0, 2, 7)}}};
+    std::optional<std::vector<std::string>> addresses;
+    const std::string uri = KSNetServiceCreateDeviceURI(name, "_pdl-datastream._tcp.", "local.");
+    EXPECT_TRUE(uri.ends_with("/?bidi"));
+    EXPECT_EQ(KSNetServiceCopyAddressesForDeviceURI(uri, &addresses, 2.5), 0) << uri;
+    EXPECT_THAT(addresses, Optional(ElementsAre("192.0.2.7"))) << uri;
+    EXPECT_EQ(network.timeouts.back(), 2.5);
   }
 }
 

@@ -4,7 +4,6 @@
 //
 //   bonjour_probe search TYPE       a KSBonjourSearch for TYPE
 //   bonjour_probe addresses URI SECONDS
-//   bonjour_probe resolve NAME TYPE resolves for ever, without a browse
 
 #include <sys/resource.h>
 #include <unistd.h>
@@ -17,9 +16,11 @@
 #include "bonjour/KSBonjourSearch.h"
 #include "bonjour/KSDevice.h"
 #include "bonjour/KSNetService.h"
+#include "platform/bundle.h"
+#include "platform/property_list.h"
 #include "platform/run_loop.h"
-#include "tests/bonjour/medium_stub.h"
-#include "tests/recording/front_end.h"
+#include "platform/system_version.h"
+#include "tests/recording/loop.h"
 
 namespace onramp {
 
@@ -28,6 +29,7 @@ namespace {
 using Clock = std::chrono::steady_clock;
 
 const Clock::time_point start = Clock::now();
+std::string browsedType;
 
 void print(const char* what, const std::string& details) {
   const std::chrono::duration<double> since = Clock::now() - start;
@@ -35,10 +37,10 @@ void print(const char* what, const std::string& details) {
   std::fflush(stdout);
 }
 
-std::string joined(const Array* texts) {
+std::string joined(const std::vector<std::string>& texts) {
   std::string all;
-  for (const Value& text : *texts)
-    all += (all.empty() ? "" : ",") + *text.as<std::string>();
+  for (const std::string& text : texts)
+    all += (all.empty() ? "" : ",") + text;
   return all;
 }
 
@@ -48,7 +50,10 @@ std::string describe(const Dictionary& device) {
        {KSDevice::kDisplayName, KSDevice::kModelName, KSDevice::kLocation, KSDevice::kDeviceURI}) {
     text += device.string(key).value_or("?") + '\t';
   }
-  return text + joined(device.array(KSDevice::kIPAddressList));
+  std::vector<std::string> addresses;
+  for (const Value& address : *device.array(KSDevice::kIPAddressList))
+    addresses.push_back(*address.as<std::string>());
+  return text + joined(addresses);
 }
 
 class Printer final : public KSDeviceObserver {
@@ -77,7 +82,7 @@ void runUntilInputEnds() {
     }
     performOnMainThread([&ended] { ended = true; });
   });
-  recording::FrontEnd::instance().pumpUntil([&ended] { return ended; }, 3600);
+  recording::runPosted([&ended] { return ended; }, std::chrono::hours(1));
   waiter.join();
 
   rusage usage{};
@@ -89,7 +94,7 @@ void runUntilInputEnds() {
 }
 
 int search(const std::string& type) {
-  testing_medium::medium().browsedType = type;
+  browsedType = type;
   const auto printer = std::make_shared<Printer>();
   const auto bonjour = KSBonjourSearch::init();
   bonjour->addKSDeviceObserver(printer);
@@ -104,24 +109,8 @@ int search(const std::string& type) {
 int addresses(const std::string& uri, double timeout) {
   std::optional<std::vector<std::string>> list;
   const int status = KSNetServiceCopyAddressesForDeviceURI(uri, &list, timeout);
-  std::string all;
-  for (const std::string& address : list.value_or(std::vector<std::string>()))
-    all += (all.empty() ? "" : ",") + address;
-  print(status == 0 ? "addresses" : "failed", all);
+  print(status == 0 ? "addresses" : "failed", joined(list.value_or(std::vector<std::string>())));
   return status;
-}
-
-int resolve(const std::string& name, const std::string& type) {
-  ServiceClientCallbacks callbacks;
-  callbacks.resolved = [](const NetServiceRef& s) {
-    print("resolved", describe(KSDevice::initWithService(s, {})));
-  };
-  const auto service = NetService::create("local.", type, name, 0);
-  print("start", name);
-  KSNetServiceResolveAsync(service, &callbacks);
-  runUntilInputEnds();
-  KSNetServiceCancelResolve(service);
-  return 0;
 }
 
 int run(const std::vector<std::string>& arguments) {
@@ -129,15 +118,29 @@ int run(const std::vector<std::string>& arguments) {
   if (arguments.size() == 3 && arguments[0] == "addresses") {
     return addresses(arguments[1], std::stod(arguments[2]));
   }
-  if (arguments.size() == 3 && arguments[0] == "resolve") {
-    return resolve(arguments[1], arguments[2]);
-  }
-  std::fputs("usage: bonjour_probe search TYPE | addresses URI SECONDS | resolve NAME TYPE\n",
-             stderr);
+  std::fputs("usage: bonjour_probe search TYPE | addresses URI SECONDS\n", stderr);
   return 2;
 }
 
 }  // namespace
+
+// All that a search asks of medium and system.
+
+Bundle Bundle::main() {
+  return Bundle("/medium/Onramp OSX.app");
+}
+
+std::optional<std::string> Bundle::infoString(std::string_view) const {
+  return "resources";
+}
+
+std::optional<Dictionary> loadDictionary(const std::string&) {
+  return Dictionary{{"CDInfo", "description"}, {"BonjourNetwork", browsedType}};
+}
+
+std::optional<std::int32_t> gestaltSystemVersion() {
+  return 0x1095;
+}
 
 }  // namespace onramp
 

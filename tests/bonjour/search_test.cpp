@@ -2,7 +2,7 @@
 
 #include "bonjour/KSBonjourSearch.h"
 #include "bonjour/KSDevice.h"
-#include "tests/bonjour/medium_stub.h"
+#include "tests/recording/medium_folder.h"
 #include "tests/recording/network.h"
 
 namespace onramp {
@@ -33,12 +33,15 @@ class SearchTest : public ::testing::Test {
  protected:
   SearchTest() {
     network.reset();
-    testing_medium::medium() = {};
+    browseFor("_ipp._tcp.");
     search->addKSDeviceObserver(recorder);
     search->startBrowsing();
   }
   void TearDown() override { search->stopBrowsing(); }
 
+  void browseFor(const char* type) const { medium.describe({{"BonjourNetwork", type}}, {}, {}); }
+
+  MediumFolder medium;
   Network& network = Network::instance();
   std::shared_ptr<KSBonjourSearch> search = KSBonjourSearch::init();
   std::shared_ptr<DeviceRecorder> recorder = std::make_shared<DeviceRecorder>();
@@ -86,7 +89,7 @@ TEST_F(SearchTest, StoppedBrowsersStayAndAnswerNothing) {
   search->stopBrowsing();
   EXPECT_EQ(search->supportTypes("Kestrel", "local."), Array());
 
-  testing_medium::medium().browsedType = "_pdl-datastream._tcp.";
+  browseFor("_pdl-datastream._tcp.");
   search->startBrowsing();
   const NetServiceRef raw = Network::service("Kestrel", "_pdl-datastream._tcp.");
   network.found(raw);

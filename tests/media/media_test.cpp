@@ -1,6 +1,5 @@
 #include <gtest/gtest.h>
 
-#include "media/CommonMessage.h"
 #include "media/KSInstallerInfo.h"
 #include "media/KSOROSXCD.h"
 #include "media/KSOROSXModel.h"
@@ -115,20 +114,6 @@ TEST(InstallerInformation, HasDefaultsForEveryMissingPart) {
   EXPECT_EQ(sparse.supportSystemMin(), minimum);
   EXPECT_EQ(sparse.WLANtoolURL(), FileURL{medium.path("").substr(0, medium.path("").size() - 1)})
       << "without a tool, the folder that holds the application";
-}
-
-TEST(CommonMessage, FallsBackWithoutABundleAndWithoutAKey) {
-  MediumFolder medium;
-  medium.setEnvironment("LANG", "de_DE.UTF-8");
-  EXPECT_EQ(localized("BTN_NEXT"), "BTN_NEXT");
-  const std::string bundle = "MacResources/CDCommonMessage.bundle/Contents/";
-  medium.write(bundle + "Resources/en.lproj/Localizable.strings",
-               std::string("\"BTN_NEXT\" = \"Next\"; \"ONLY\" = \"English\";"));
-  EXPECT_EQ(localized("BTN_NEXT", "x"), "Next") << "the development language, when no other";
-  medium.write(bundle + "Resources/de.lproj/Localizable.strings",
-               std::string("\"BTN_NEXT\" = \"Weiter\";"));
-  EXPECT_EQ(localized("BTN_NEXT", "x"), "Weiter");
-  EXPECT_EQ(localized("ONLY", "fallback"), "fallback");
 }
 
 }  // namespace

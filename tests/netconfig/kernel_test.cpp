@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstdlib>
 #include <fstream>
+#include <map>
 #include <optional>
 #include <string>
 #include <vector>
@@ -27,27 +28,10 @@ void ip(const std::string& arguments) {
   ASSERT_EQ(std::system(("ip " + arguments).c_str()), 0) << arguments;
 }
 
-std::vector<std::string> split(const std::string& line, char separator) {
-  std::vector<std::string> pieces(1);
-  for (const char c : line) {
-    if (c == separator) {
-      pieces.emplace_back();
-    } else {
-      pieces.back() += c;
-    }
-  }
-  return pieces;
-}
-
 // The configuration by iproute2.
 struct Configuration {
-  struct Interface {
-    std::string name;
-    std::string firstAddress;
-    std::string entry;
-  };
-
-  std::vector<Interface> interfaces;
+  std::vector<std::string> entries;
+  std::map<std::string, std::string> firstAddresses;  // by interface
   std::string primary;
 
   static Configuration read() {
@@ -56,23 +40,12 @@ struct Configuration {
               0);
     std::ifstream file(path);
     Configuration configuration;
-    for (std::string line; std::getline(file, line);) {
-      const std::vector<std::string> fields = split(line, '|');
-      if (fields[0] == "primary") {
-        configuration.primary = fields[1];
-      } else {
-        configuration.interfaces.push_back(
-            {fields[0], split(fields[1], ',')[0], fields[1] + "|" + fields[2] + "|" + fields[3]});
-      }
+    std::getline(file, configuration.primary);
+    for (std::string name, address, entry; file >> name >> address >> entry;) {
+      configuration.firstAddresses[name] = address;
+      configuration.entries.push_back(entry);
     }
     return configuration;
-  }
-
-  [[nodiscard]] std::vector<std::string> entries() const {
-    std::vector<std::string> texts;
-    for (const Interface& interface : interfaces)
-      texts.push_back(interface.entry);
-    return texts;
   }
 };
 
@@ -82,10 +55,9 @@ std::vector<std::string> entriesOf(const local_address_list& list) {
     std::string text;
     for (const char* key : {"Addresses", "SubnetMasks", "BroadcastAddresses"}) {
       const Array* array = value.as<Dictionary>()->array(key);
-      for (std::size_t i = 0; array && i < array->size(); ++i) {
-        text += (i ? "," : "") + *(*array)[i].as<std::string>();
-      }
-      if (key != std::string_view("BroadcastAddresses")) text += "|";
+      for (const Value& address : array ? *array : Array{})
+        text += *address.as<std::string>() + ",";
+      text += "|";
     }
     texts.push_back(text);
   }
@@ -100,9 +72,8 @@ class Kernel : public ::testing::Test {
     ip("link set lo up");
     ip("link add near type veth peer name far");
     ip("link add left type veth peer name right");
-    for (const char* name : {"near", "far", "left", "right"}) {
+    for (const char* name : {"near", "far", "left", "right"})
       ip(std::string("link set up ") + name);
-    }
   }
 
   void TearDown() override {
@@ -171,20 +142,18 @@ const Scenario kScenarios[] = {
 TEST_F(Kernel, AgreesWithIproute2) {
   for (const Scenario& scenario : kScenarios) {
     SCOPED_TRACE(scenario.name);
-    for (const char* command : scenario.commands) {
+    for (const char* command : scenario.commands)
       ip(command);
-    }
     const Configuration expected = Configuration::read();
-    ASSERT_EQ(expected.interfaces.size(), scenario.interfaces);
+    ASSERT_EQ(expected.entries.size(), scenario.interfaces);
     ASSERT_EQ(expected.primary, scenario.primary);
 
     local_address_list list;
     EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(&list), 0);
-    EXPECT_THAT(entriesOf(list), UnorderedElementsAreArray(expected.entries()));
+    EXPECT_THAT(entriesOf(list), UnorderedElementsAreArray(expected.entries));
     EXPECT_EQ(KSSCCopyCurrentInterfaceName().value_or(""), expected.primary);
-    for (const auto& interface : expected.interfaces) {
-      EXPECT_EQ(KSSCcurrentAddressWithInterfaceName(interface.name), interface.firstAddress);
-    }
+    for (const auto& [name, address] : expected.firstAddresses)
+      EXPECT_EQ(KSSCcurrentAddressWithInterfaceName(name), address);
     EXPECT_EQ(KSSCcurrentAddressWithInterfaceName("absent"), std::nullopt);
     TearDown();
     SetUp();
@@ -195,7 +164,7 @@ TEST_F(Kernel, AgreesWithIproute2) {
 TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   AddNetworkInterfaceListChangeCallbackSCF();
   const auto follows = [] {
-    const std::vector<std::string> expected = Configuration::read().entries();
+    const std::vector<std::string> expected = Configuration::read().entries;
     const auto agrees = [&] {
       std::vector<std::string> cached = entriesOf(local_address_cache_copy());
       return std::is_permutation(cached.begin(), cached.end(), expected.begin(), expected.end());

@@ -1,7 +1,6 @@
 #include <gmock/gmock.h>
 
 #include "bonjour/KSDevice.h"
-#include "pages/ChooseDeviceView.h"
 #include "platform/notification_center.h"
 #include "tests/app/wizard.h"
 #include "tests/recording/agents.h"
@@ -44,15 +43,11 @@ class Chooser : public Wizard {
     Wizard::TearDown();
   }
 
-  /// "name address" of every row from the top, the selected one with a star.
+  /// The rows from the top, the selected one with a star.
   [[nodiscard]] std::vector<std::string> rows() const {
-    const ArrayController& controller = *screen.object("deviceListView").content;
-    std::vector<std::string> rows;
-    for (const Dictionary& entry : controller.arrangedObjects()) {
-      rows.push_back(entry.string(ChooseDeviceView::kDevice).value_or("?") + ' ' +
-                     entry.string(ChooseDeviceView::kLocation).value_or("?"));
-      if (rows.size() - 1 == controller.selectionIndex()) rows.back() += '*';
-    }
+    std::vector<std::string> rows = deviceRows();
+    const auto selected = screen.object("deviceListView").content->selectionIndex();
+    if (selected) rows.at(*selected) += '*';
     return rows;
   }
 

@@ -17,21 +17,15 @@ TEST(Language, IsToldFromEveryWayOfWritingIt) {
     const char* script;
     const char* region;
   };
-  const Case cases[] = {{"ja", "ja", "", ""},
-                        {"ja_JP.UTF-8", "ja", "", "JP"},
-                        {"de_DE@euro", "de", "", "DE"},
+  const Case cases[] = {{"de_DE@euro", "de", "", "DE"},
                         {"pt-BR", "pt", "", "BR"},
-                        {"zh_CN", "zh", "Hans", "CN"},
                         {"zh-Hant", "zh", "Hant", ""},
                         {"zh_TW", "zh", "Hant", "TW"},
-                        {"zh-Hans-CN", "zh", "Hans", "CN"},
                         {"zh-Hant-HK", "zh", "Hant", "HK"},
                         {"German", "de", "", ""},
-                        {"Japanese", "ja", "", ""},
                         {"es-419", "es", "", ""},
                         {"EN_us", "en", "", "US"},
                         {"yue-Hant", "yue", "Hant", ""},
-                        {"nb_NO", "nb", "", "NO"},
                         {"Base", "", "", ""},
                         {"", "", "", ""},
                         {"../en", "", "", ""}};

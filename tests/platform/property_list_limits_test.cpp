@@ -6,7 +6,7 @@
 #include <functional>
 
 #include "platform/property_list.h"
-#include "tests/platform/temporary_folder.h"
+#include "tests/recording/temporary_folder.h"
 
 namespace onramp {
 namespace {

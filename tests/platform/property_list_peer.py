@@ -1,5 +1,5 @@
-"""Reads the property list FIRST, holds it against what the test wrote, and writes it anew as
-XML to SECOND and as binary to THIRD."""
+"""Another reader and writer of property lists: write XML BINARY writes a list of every kind of value in
+both forms, and check FILE holds a list against that one."""
 
 import datetime
 import math
@@ -44,19 +44,20 @@ def same(value, expected):
     if type(value) is not type(expected):
         return False
     if isinstance(expected, dict):
-        return value.keys() == expected.keys() and all(
-            same(value[key], expected[key]) for key in expected
-        )
+        return value.keys() == expected.keys() and all(same(value[k], expected[k]) for k in value)
     if isinstance(expected, list):
         return len(value) == len(expected) and all(map(same, value, expected))
     return value == expected
 
 
-with open(sys.argv[1], "rb") as file:
-    found = plistlib.load(file)
-for key in sorted(found.keys() | EXPECTED.keys()):
-    if key not in found or key not in EXPECTED or not same(found[key], EXPECTED[key]):
-        sys.exit(f"{sys.argv[1]}: {key!r} is {found.get(key)!r}, not {EXPECTED.get(key)!r}")
-for path, form in ((sys.argv[2], plistlib.FMT_XML), (sys.argv[3], plistlib.FMT_BINARY)):
-    with open(path, "wb") as file:
-        plistlib.dump(found, file, fmt=form)
+operation, path, *more = sys.argv[1:]
+if operation == "write":
+    for target, form in ((path, plistlib.FMT_XML), (more[0], plistlib.FMT_BINARY)):
+        with open(target, "wb") as file:
+            plistlib.dump(EXPECTED, file, fmt=form)
+else:
+    with open(path, "rb") as file:
+        found = plistlib.load(file)
+    for key in sorted(found.keys() | EXPECTED.keys()):
+        if key not in found or key not in EXPECTED or not same(found[key], EXPECTED[key]):
+            sys.exit(f"{path}: {key!r} is {found.get(key)!r}, not {EXPECTED.get(key)!r}")

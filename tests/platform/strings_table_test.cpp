@@ -3,7 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "platform/property_list.h"
-#include "tests/platform/temporary_folder.h"
+#include "tests/recording/temporary_folder.h"
 
 namespace onramp {
 namespace {

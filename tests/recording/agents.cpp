@@ -1,9 +1,11 @@
 #include "tests/recording/agents.h"
 
 #include <algorithm>
+#include <cstdlib>
 #include <utility>
 
 #include "platform/datagram_socket.h"
+#include "tests/snmp/message.h"
 
 namespace onramp {
 
@@ -22,22 +24,14 @@ std::optional<Reply>& pendingReply() {
   return reply;
 }
 
-// A request for one object as its answer (RFC 1157): another PDU, and an INTEGER of one byte, one
-// byte longer than the NULL in its place, at the end. All lengths are of one byte.
+// A request for one object as the answer to it.
 std::vector<std::uint8_t> answerTo(std::span<const std::uint8_t> request, int value) {
-  std::vector<std::uint8_t> bytes(request.begin(), request.end() - 2);
-  const std::size_t version = 2;
-  const std::size_t community = version + 2 + bytes.at(version + 1);
-  const std::size_t pdu = community + 2 + bytes.at(community + 1);
-  std::size_t list = pdu + 2;
-  for (int field = 0; field < 3; ++field)
-    list += 2U + bytes.at(list + 1);
-  for (const std::size_t enclosing : {std::size_t{0}, pdu, list, list + 2})
-    ++bytes.at(enclosing + 1);
-  bytes.at(pdu) = 0xA2;
-  for (const int byte : {0x02, 0x01, value})
-    bytes.push_back(static_cast<std::uint8_t>(byte));
-  return bytes;
+  Message message(1);
+  if (message.decode(request)) std::abort();
+  message.message.pdu_type = kPduResponse;
+  message.varbinds[0].type = kTagInteger;
+  message.varbinds[0].int_value = value;
+  return message.encode();
 }
 
 }  // namespace

@@ -11,25 +11,6 @@
 
 namespace onramp::recording {
 
-/// What the seam's functions below may change of the front end.
-struct Access {
-  static void schedule(double seconds, std::function<void()> action) {
-    FrontEnd& frontEnd = FrontEnd::instance();
-    frontEnd.timers_.push_back({frontEnd.now_ + seconds, std::move(action)});
-  }
-  static Object& newMenuObject(OutletKind kind, std::string text) {
-    auto object = std::make_unique<Object>();
-    object->kind = kind;
-    object->text = std::move(text);
-    FrontEnd::instance().menus_.push_back(std::move(object));
-    return *FrontEnd::instance().menus_.back();
-  }
-  static Object* firstMenuObject() {
-    auto& menus = FrontEnd::instance().menus_;
-    return menus.empty() ? nullptr : menus.front().get();
-  }
-};
-
 FrontEnd& FrontEnd::instance() {
   static FrontEnd frontEnd;
   return frontEnd;
@@ -49,14 +30,28 @@ void FrontEnd::reset() {
   now_ = 0;
   resetLoop();
 
-  Object& bar = Access::newMenuObject(OutletKind::kMenu, "");
-  Object& item = Access::newMenuObject(OutletKind::kMenuItem, "Onramp OSX");
-  Object& menu = Access::newMenuObject(OutletKind::kMenu, "");
+  Object& bar = addMenuObject(OutletKind::kMenu, "");
+  Object& item = addMenuObject(OutletKind::kMenuItem, "Onramp OSX");
+  Object& menu = addMenuObject(OutletKind::kMenu, "");
   bar.subviews = {&item};
   item.subviews = {&menu};
-  for (const char* title : {"About", "Hide", "Hide Others", "Show All", "Quit"}) {
-    menu.subviews.push_back(&Access::newMenuObject(OutletKind::kMenuItem, title));
-  }
+  for (const char* title : {"About", "Hide", "Hide Others", "Show All", "Quit"})
+    menu.subviews.push_back(&addMenuObject(OutletKind::kMenuItem, title));
+}
+
+Object& FrontEnd::addMenuObject(OutletKind kind, const std::string& text) {
+  menus_.emplace_back();
+  menus_.back().kind = kind;
+  menus_.back().text = text;
+  return menus_.back();
+}
+
+Object* FrontEnd::menuBar() {
+  return menus_.empty() ? nullptr : &menus_.front();
+}
+
+void FrontEnd::schedule(double seconds, std::function<void()> action) {
+  timers_.push_back({now_ + seconds, std::move(action)});
 }
 
 void FrontEnd::launch(ApplicationDelegate& delegate) {
@@ -77,10 +72,6 @@ Object& FrontEnd::object(const std::string& name) {
   return *found;
 }
 
-bool FrontEnd::has(const std::string& name) const {
-  return findLiveObject(name) != nullptr;
-}
-
 void FrontEnd::click(const std::string& buttonName) {
   const Object& button = object(buttonName);
   if (button.hidden || !button.enabled) return;
@@ -99,19 +90,14 @@ void FrontEnd::runTimers() {
   }
 }
 
-bool FrontEnd::pumpUntil(const std::function<bool()>& done, double seconds) {
-  return runPosted(done, std::chrono::duration<double>(seconds));
-}
-
 }  // namespace onramp::recording
 
 namespace onramp {
 
-using recording::Access;
 using recording::FrontEnd;
 
 void scheduleTimer(double seconds, std::function<void()> action) {
-  Access::schedule(seconds, std::move(action));
+  FrontEnd::instance().schedule(seconds, std::move(action));
 }
 
 void terminateApplication() {
@@ -131,7 +117,7 @@ void activateIgnoringOtherApps() {
 }
 
 Menu mainMenu() {
-  recording::Object* const bar = Access::firstMenuObject();
+  recording::Object* const bar = FrontEnd::instance().menuBar();
   return Menu(bar ? bar->native() : nullptr);
 }
 

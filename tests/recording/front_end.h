@@ -22,13 +22,11 @@ struct Object {
   std::string name;
   bool hidden = false;
   bool enabled = true;
-  bool animating = false;
   std::string text;                                  ///< of a text field, a window, a menu item
   std::map<std::pair<int, int>, std::string> cells;  ///< titles by row and column
   int selectedRow = -1;
   std::string imagePath;
   ImageScaling scaling = ImageScaling::kProportionallyDown;
-  std::map<std::string, std::string> headers;
   ArrayController* content = nullptr;
   std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
   Object* superview = nullptr;
@@ -66,7 +64,6 @@ class FrontEnd {
 
   /// The live object of that name that was loaded last; a test fails hard without it.
   [[nodiscard]] Object& object(const std::string& name);
-  [[nodiscard]] bool has(const std::string& name) const;
 
   /// The user clicks a button: nothing happens when it is hidden or disabled.
   void click(const std::string& buttonName);
@@ -74,8 +71,9 @@ class FrontEnd {
   /// Runs the scheduled timers, earliest first, until none is left or the application terminates.
   void runTimers();
 
-  /// Runs what other threads have posted to the main thread, waiting up to `seconds` for `done`.
-  bool pumpUntil(const std::function<bool()>& done, double seconds);
+  // What the seam's functions ask for.
+  void schedule(double seconds, std::function<void()> action);
+  [[nodiscard]] Object* menuBar();
 
   // What the program did.
   std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
@@ -89,7 +87,7 @@ class FrontEnd {
   std::function<void(int pause)> duringPause;  ///< called on the main thread, counted from 1
 
  private:
-  friend struct Access;
+  Object& addMenuObject(OutletKind kind, const std::string& text);
 
   struct Timer {
     double due;
@@ -98,7 +96,7 @@ class FrontEnd {
 
   double now_ = 0;
   std::list<Timer> timers_;
-  std::list<std::unique_ptr<Object>> menus_;
+  std::list<Object> menus_;  // the menu bar first
   std::unique_ptr<Interface> mainInterface_;
 };
 

@@ -85,35 +85,36 @@ struct Part {
 };
 
 // What the interface files hold besides their layout.
-std::vector<Part> partsOf(const std::string& interfaceName) {
+const std::vector<Part>& partsOf(const std::string& interfaceName) {
   using enum OutletKind;
-  if (interfaceName == "MainMenu") {
-    return {{kWindow, "window"},         {kView, "mainView"},     {kImageView, "mBackGroundView"},
-            {kButton, "leftMostButton"}, {kButton, "leftButton"}, {kButton, "rightButton"},
-            {kButton, "rightMostButton"}};
-  }
-  if (interfaceName == "ModelListView") {
-    return {{kTableView, "modelListView"},
-            {kTextField, "modelListTitle"},
-            {kTextField, "modelListDescriptionTextField"}};
-  }
-  if (interfaceName == "ConnectionTypeView") {
-    return {{kTextField, "connectionTypeTitle"},
-            {kTextField, "connectionDescriptionTextField"},
-            {kRadioMatrix, "connectionTypeRadioButton"},
-            {kImageView, "connectionTypeImage1"},
-            {kImageView, "connectionTypeImage2"},
-            {kTextField, "progressTxtField"},
-            {kProgressIndicator, "progress"}};
-  }
-  if (interfaceName == "ChooseDeviceView") {
-    return {{kTableView, "deviceListView"},
-            {kTextField, "deviceListTitle"},
-            {kPopUpButton, "deviceListPopupButton"},
-            {kTextField, "progressTxtField"},
-            {kProgressIndicator, "progress"}};
-  }
-  return {};
+  static std::map<std::string, std::vector<Part>> parts = {
+      {"MainMenu",
+       {{kWindow, "window"},
+        {kView, "mainView"},
+        {kImageView, "mBackGroundView"},
+        {kButton, "leftMostButton"},
+        {kButton, "leftButton"},
+        {kButton, "rightButton"},
+        {kButton, "rightMostButton"}}},
+      {"ModelListView",
+       {{kTableView, "modelListView"},
+        {kTextField, "modelListTitle"},
+        {kTextField, "modelListDescriptionTextField"}}},
+      {"ConnectionTypeView",
+       {{kTextField, "connectionTypeTitle"},
+        {kTextField, "connectionDescriptionTextField"},
+        {kRadioMatrix, "connectionTypeRadioButton"},
+        {kImageView, "connectionTypeImage1"},
+        {kImageView, "connectionTypeImage2"},
+        {kTextField, "progressTxtField"},
+        {kProgressIndicator, "progress"}}},
+      {"ChooseDeviceView",
+       {{kTableView, "deviceListView"},
+        {kTextField, "deviceListTitle"},
+        {kPopUpButton, "deviceListPopupButton"},
+        {kTextField, "progressTxtField"},
+        {kProgressIndicator, "progress"}}}};
+  return parts[interfaceName];
 }
 
 void bindAsTheFilesDo(Object& object, KeyValueTexts& texts) {
@@ -136,7 +137,7 @@ Interface::Interface(std::unique_ptr<Tree> tree) : tree_(std::move(tree)) {}
 Interface::~Interface() = default;
 
 std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwner& owner) {
-  const std::vector<Part> parts = partsOf(name);
+  const std::vector<Part>& parts = partsOf(name);
   if (parts.empty() || recording::FrontEnd::instance().missingInterfaces.contains(name)) {
     return nullptr;
   }

@@ -17,12 +17,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-std::string temporaryFolder() {
-  std::string name = (fs::temp_directory_path() / "onramp-test-XXXXXX").string();
-  if (!mkdtemp(name.data())) std::abort();
-  return name;
-}
-
 std::string contents(const std::string& path) {
   std::ifstream file(path);
   std::ostringstream text;
@@ -32,14 +26,12 @@ std::string contents(const std::string& path) {
 
 }  // namespace
 
-MediumFolder::MediumFolder() : root_(temporaryFolder()) {
-  fs::create_directories(root_ + "/bin");
-  std::ofstream(root_ + "/bin/xdg-open")
-      << "#!/bin/sh\nprintf '%s\\n' \"$1\" >> '" << root_ << "/opened'\n";
-  fs::permissions(root_ + "/bin/xdg-open", fs::perms::owner_all);
-  setEnvironment("PATH", root_ + "/bin:" + std::getenv("PATH"));
-  setEnvironment("XDG_DATA_HOME", root_ + "/user");
-  setEnvironment("XDG_DATA_DIRS", root_ + "/local");
+MediumFolder::MediumFolder() {
+  write("../bin/xdg-open", "#!/bin/sh\nprintf '%s\\n' \"$1\" >> '" + root_ / "opened" + "'\n");
+  makeExecutable("../bin/xdg-open");
+  setEnvironment("PATH", root_ / "bin:" + std::getenv("PATH"));
+  setEnvironment("XDG_DATA_HOME", root_ / "user");
+  setEnvironment("XDG_DATA_DIRS", root_ / "local");
   setEnvironment("ONRAMP_SYSTEM_VERSION", "10.9.5");
   for (const char* variable : {"LANGUAGE", "LC_ALL", "LC_MESSAGES"}) {
     setEnvironment(variable, std::nullopt);
@@ -60,12 +52,10 @@ MediumFolder::~MediumFolder() {
       unsetenv(name.c_str());
     }
   }
-  std::error_code ignored;
-  fs::remove_all(root_, ignored);
 }
 
 std::string MediumFolder::path(const std::string& relative) const {
-  return root_ + "/medium/" + relative;
+  return root_ / "medium/" + relative;
 }
 
 void MediumFolder::write(const std::string& relative, const std::string& bytes) const {
@@ -94,19 +84,19 @@ void MediumFolder::describe(const Dictionary& resources, const Dictionary& cdInf
 void MediumFolder::addSetUpTool(int status) const {
   write("Setup.app/Contents/Info.plist",
         Dictionary{{"CFBundleExecutable", "setup"}, {"CFBundleDisplayName", "Wireless Setup"}});
-  write("Setup.app/Contents/Linux/setup", "#!/bin/sh\nprintf '%s' \"$*\" > '" + root_ +
-                                              "/tool'\nexit " + std::to_string(status) + "\n");
+  write("Setup.app/Contents/Linux/setup", "#!/bin/sh\nprintf '%s' \"$*\" > '" + root_ / "tool" +
+                                              "'\nexit " + std::to_string(status) + "\n");
   makeExecutable("Setup.app/Contents/Linux/setup");
 }
 
 std::string MediumFolder::setUpToolArguments() const {
-  return contents(root_ + "/tool");
+  return contents(root_ / "tool");
 }
 
 std::vector<std::string> MediumFolder::opened(std::size_t count) const {
   std::vector<std::string> lines;
   for (int attempt = 0; attempt < 1000; ++attempt) {
-    std::istringstream text(contents(root_ + "/opened"));
+    std::istringstream text(contents(root_ / "opened"));
     lines.clear();
     for (std::string line; std::getline(text, line);)
       lines.push_back(line);
@@ -117,11 +107,11 @@ std::vector<std::string> MediumFolder::opened(std::size_t count) const {
 }
 
 std::string MediumFolder::optionsFilePath() const {
-  return root_ + "/local/KestrelImaging/com.kestrelimaging.installpkginfo.plist";
+  return root_ / "local/KestrelImaging/com.kestrelimaging.installpkginfo.plist";
 }
 
 std::string MediumFolder::modelFilePath() const {
-  return root_ + "/user/KestrelImaging/com.kestrelimaging.instmodel.plist";
+  return root_ / "user/KestrelImaging/com.kestrelimaging.instmodel.plist";
 }
 
 std::optional<Dictionary> MediumFolder::optionsFile() const {

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "platform/value.h"
+#include "tests/recording/temporary_folder.h"
 
 namespace onramp::recording {
 
@@ -47,7 +48,7 @@ class MediumFolder {
   void setEnvironment(const std::string& name, const std::optional<std::string>& value);
 
  private:
-  std::string root_;
+  TemporaryFolder root_;
   std::map<std::string, std::optional<std::string>> before_;
 };
 

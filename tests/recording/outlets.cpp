@@ -70,13 +70,8 @@ void ImageView::setImageScaling(ImageScaling scaling) const {
   if (Object* const view = object(*this)) view->scaling = scaling;
 }
 
-void ProgressIndicator::startAnimation() const {
-  if (Object* const indicator = object(*this)) indicator->animating = true;
-}
-
-void ProgressIndicator::stopAnimation() const {
-  if (Object* const indicator = object(*this)) indicator->animating = false;
-}
+void ProgressIndicator::startAnimation() const {}
+void ProgressIndicator::stopAnimation() const {}
 
 void TableView::bind(ArrayController& controller) const {
   if (Object* const table = object(*this)) table->content = &controller;
@@ -85,10 +80,7 @@ void TableView::bind(ArrayController& controller) const {
 void TableView::setAllowsColumnReordering(bool) const {}
 void TableView::setAllowsColumnSelection(bool) const {}
 void TableView::setColumnEditable(std::string_view, bool) const {}
-
-void TableView::setColumnHeader(std::string_view identifier, const std::string& title) const {
-  if (Object* const table = object(*this)) table->headers[std::string(identifier)] = title;
-}
+void TableView::setColumnHeader(std::string_view, const std::string&) const {}
 
 std::size_t PopUpButton::numberOfItems() const {
   const Object* const popUp = object(*this);

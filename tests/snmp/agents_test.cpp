@@ -66,11 +66,11 @@ TEST(Query, TellsRefusalsAndWrongTypesFromSilence) {
   } cases[] = {
       {"object missing", "127.0.1.3", false, 2},
       {"string for an integer", "127.0.1.4", false, 0},
-      {"no binding at all", "127.0.2.10", false, 0},
-      {"another request's identifier", "127.0.2.5", true, -1},
-      {"malformed", "127.0.2.9", true, -1},
-      {"one binding more than asked for", "127.0.2.11", true, -1},
-      {"empty datagram", "127.0.2.13", true, -1},
+      {"no binding at all", "127.0.2.5", false, 0},
+      {"another request's identifier", "127.0.2.1", true, -1},
+      {"malformed", "127.0.2.4", true, -1},
+      {"one binding more than asked for", "127.0.2.6", true, -1},
+      {"empty datagram", "127.0.2.8", true, -1},
   };
   for (const auto& c : cases) {
     const Answer answer = ask(c.address);
@@ -81,25 +81,25 @@ TEST(Query, TellsRefusalsAndWrongTypesFromSilence) {
 }
 
 TEST(Query, TakesOnlyWhatTheDeviceAskedSends) {
-  EXPECT_EQ(ask("127.0.2.7").activeIF(), 2) << "strangers answer first, and otherwise";
-  EXPECT_EQ(ask("127.0.2.8").activeIF(), 2) << "the same answer twice";
-  EXPECT_EQ(ask("127.0.2.14").activeIF(), 2) << "with more than is ever read behind it";
+  EXPECT_EQ(ask("127.0.2.3").activeIF(), 2)
+      << "strangers answer first, and otherwise; it does twice";
+  EXPECT_EQ(ask("127.0.2.9").activeIF(), 2) << "with more than is ever read behind it";
   EXPECT_EQ(ask("127.0.1.2").activeIF(), 1) << "after these";
   Answer answer;
-  EXPECT_GE(timeOf([&] { answer = ask("127.0.2.6"); }), milliseconds(2000));
+  EXPECT_GE(timeOf([&] { answer = ask("127.0.2.2"); }), milliseconds(2000));
   EXPECT_TRUE(answer.noReply) << "from another port only";
 }
 
 TEST(Query, WaitsTwoSecondsForAnAnswer) {
-  EXPECT_EQ(ask("127.0.2.3").activeIF(), 2) << "after 1.5 s";
-  EXPECT_TRUE(ask("127.0.2.4").noReply) << "after 2.5 s";
+  EXPECT_EQ(ask("127.0.1.7").activeIF(), 2) << "after 1 s";
+  EXPECT_TRUE(ask("127.0.1.8").noReply) << "after 2.5 s";
   EXPECT_EQ(ask("127.0.1.2").activeIF(), 1) << "the late answer does no harm";
 }
 
 TEST(Query, KeepsAShorterNameForLaterRequests) {
   const snmp_oid name = active_interface_table.entries[0].oid;
   const std::vector<std::uint16_t> arcs(name.arcs, name.arcs + name.count);
-  EXPECT_EQ(ask("127.0.2.12").activeIF(), 2);
+  EXPECT_EQ(ask("127.0.2.7").activeIF(), 2);
   EXPECT_EQ(active_interface_table.entries[0].oid.count, 6);
   EXPECT_EQ(ask("127.0.1.1").errorStatus, 2) << "asked for 1.3.6.1.4.1";
   active_interface_table.entries[0].oid = name;
@@ -116,27 +116,19 @@ TEST(Query, SetsTheFlagForATextThatIsNoAddress) {
   EXPECT_FALSE(answer.noReply);
 }
 
-TEST(Wireless, IsWhatTheFirstAnsweringAddressSays) {
+// Which answer counts, the chooser's tests say.
+TEST(Wireless, IsWhatADeviceSays) {
   EXPECT_TRUE(snmp_active_interface_is_wireless({"127.0.1.1", "127.0.1.2"}));
-  EXPECT_FALSE(snmp_active_interface_is_wireless({"127.0.1.2", "127.0.1.1"}));
   EXPECT_FALSE(snmp_active_interface_is_wireless({"127.0.1.3", "127.0.1.1"})) << "refused";
-  EXPECT_FALSE(snmp_active_interface_is_wireless({"127.0.1.4", "127.0.1.1"})) << "wrong type";
   EXPECT_FALSE(snmp_active_interface_is_wireless({5, "127.0.1.1"})) << "no text";
-  EXPECT_FALSE(snmp_active_interface_is_wireless({}));
 }
 
 TEST(Wireless, ASilentAddressCostsThreeAttemptsOfTwoRequests) {
   bool wireless = true;
-  const auto took = timeOf([&] { wireless = snmp_active_interface_is_wireless({"127.0.2.1"}); });
+  const auto took = timeOf([&] { wireless = snmp_active_interface_is_wireless({"127.0.1.6"}); });
   EXPECT_FALSE(wireless);
   EXPECT_GE(took, milliseconds(6 * 2000 + 3 * 20));
   EXPECT_LT(took, milliseconds(6 * 4000));
-  EXPECT_EQ(ask("127.0.3.1").activeIF(), 6) << "requests";
-}
-
-TEST(Wireless, AnAddressThatMissedARequestIsAskedThreeTimesAndItsLastAnswerCounts) {
-  EXPECT_TRUE(snmp_active_interface_is_wireless({"127.0.2.2"}));
-  EXPECT_EQ(ask("127.0.3.2").activeIF(), 4) << "two in the first attempt, one in each other";
 }
 
 constexpr std::uint16_t kSystemRoom = 9;
@@ -192,7 +184,7 @@ TEST(GetAndSet, HandOnTheErrorStatusAndAskForTheNextObject) {
 TEST(Exchange, LeavesNoDescriptorOpen) {
   const long before = openDescriptors();
   for (int i = 0; i < 2000; ++i) {
-    for (const char* const address : {"127.0.1.1", "127.0.2.5", "127.0.2.9", "127.0.2.13"})
+    for (const char* const address : {"127.0.1.1", "127.0.2.1", "127.0.2.4", "127.0.2.8"})
       ask(address);
     Message m(1);
     EXPECT_EQ(snmp_exchange(m.message, "127.0.1.1", kModeNoNetwork), SNMP_ERR_CODEC);

@@ -1,4 +1,3 @@
-#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include "snmp/ber_reader.h"
@@ -9,8 +8,6 @@ namespace onramp {
 
 namespace {
 
-using testing::ElementsAreArray;
-
 template <typename Put>
 std::vector<std::uint8_t> written(Put put, std::size_t room = 1000) {
   std::vector<std::uint8_t> bytes(room);
@@ -20,62 +17,42 @@ std::vector<std::uint8_t> written(Put put, std::size_t room = 1000) {
   return bytes;
 }
 
-TEST(Integers, TakeTheFewestBytesAndMaskNegativeValuesInPlace) {
+TEST(Integers, TakeTheFewestBytesAndAreSignExtendedByTheirNumber) {
   const struct {
     std::int64_t value;
     const char* bytes;
-    std::int64_t masked;
+    std::int64_t read;
+    std::uint64_t asUnsigned;  // what is left of the value in its place, too
   } cases[] = {
-      {0, "02 01 00", 0},
-      {127, "02 01 7F", 127},
-      {128, "02 02 00 80", 128},
-      {0x7FFF, "02 02 7F FF", 0x7FFF},
-      {0x8000, "02 03 00 80 00", 0x8000},
-      {0x7FFFFF, "02 03 7F FF FF", 0x7FFFFF},
-      {0x800000, "02 04 00 80 00 00", 0x800000},
-      {INT32_MAX, "02 04 7F FF FF FF", INT32_MAX},
-      {-1, "02 01 FF", 0xFF},
-      {-128, "02 01 80", 0x80},
-      {-129, "02 02 FF 7F", 0xFF7F},
-      {-32768, "02 02 80 00", 0x8000},
-      {-32769, "02 03 FF 7F FF", 0xFF7FFF},
-      {-0x800000, "02 03 80 00 00", 0x800000},
-      {-0x800001, "02 04 FF 7F FF FF", 0xFF7FFFFF},
-      {INT32_MIN, "02 04 80 00 00 00", 0x80000000},
+      {0, "02 01 00", 0, 0},
+      {127, "02 01 7F", 127, 127},
+      {128, "02 02 00 80", 128, 128},
+      {0x7FFF, "02 02 7F FF", 0x7FFF, 0x7FFF},
+      {0x8000, "02 03 00 80 00", 0x8000, 0x8000},
+      {0x7FFFFF, "02 03 7F FF FF", 0x7FFFFF, 0x7FFFFF},
+      {0x800000, "02 04 00 80 00 00", 0x800000, 0x800000},
+      {INT32_MAX, "02 04 7F FF FF FF", INT32_MAX, INT32_MAX},
+      {-1, "02 01 FF", -1, 0xFF},
+      {-128, "02 01 80", -128, 0x80},
+      {-129, "02 02 FF 7F", -129, 0xFF7F},
+      {-32768, "02 02 80 00", -32768, 0x8000},
+      {-32769, "02 03 FF 7F FF", 0xFFFF7FFF, 0xFF7FFF},
+      {-0x800000, "02 03 80 00 00", 0xFF800000, 0x800000},
+      {-0x800001, "02 04 FF 7F FF FF", 0xFF7FFFFF, 0xFF7FFFFF},
+      {INT32_MIN, "02 04 80 00 00 00", 0x80000000, 0x80000000},
   };
   for (const auto& c : cases) {
     std::int64_t value = c.value;
-    EXPECT_EQ(written([&](ber_writer& out) { return ber_put_int(out, value, 2); }), hex(c.bytes));
-    EXPECT_EQ(value, c.masked);
     const auto bytes = hex(c.bytes);
+    EXPECT_EQ(written([&](ber_writer& out) { return ber_put_int(out, value, 2); }), bytes);
+    EXPECT_EQ(static_cast<std::uint64_t>(value), c.asUnsigned);
     ber_reader in{std::span<const std::uint8_t>(bytes).subspan(2)};
+    ber_reader again = in;
+    std::uint64_t asUnsigned = 0;
     EXPECT_EQ(ber_get_int(in, value, bytes[1]), SNMP_OK);
-    EXPECT_EQ(static_cast<std::int32_t>(value), c.value);
-  }
-}
-
-TEST(Integers, AreSignExtendedByTheirLength) {
-  const struct {
-    const char* bytes;
-    std::int64_t asInt;
-    std::uint64_t asUint;
-  } cases[] = {
-      {"80", -128, 0x80},
-      {"80 00", -32768, 0x8000},
-      {"80 00 00", 0xFF800000, 0x800000},
-      {"FF FF FF FF", 0xFFFFFFFF, 0xFFFFFFFF},
-      {"00 00 00 05", 5, 5},
-  };
-  for (const auto& c : cases) {
-    const auto bytes = hex(c.bytes);
-    const auto length = static_cast<std::uint16_t>(bytes.size());
-    ber_reader in(bytes);
-    ber_reader again(bytes);
-    std::int64_t asInt = 0;
-    std::uint64_t asUint = 0;
-    EXPECT_EQ(ber_get_int(in, asInt, length) | ber_get_uint(again, asUint, length), SNMP_OK);
-    EXPECT_EQ(asInt, c.asInt);
-    EXPECT_EQ(asUint, c.asUint);
+    EXPECT_EQ(ber_get_uint(again, asUnsigned, bytes[1]), SNMP_OK);
+    EXPECT_EQ(value, c.read);
+    EXPECT_EQ(asUnsigned, c.asUnsigned);
     EXPECT_EQ(in.remaining() + again.remaining(), 0U);
   }
 }
@@ -85,8 +62,6 @@ TEST(Integers, UnsignedOnesWithTheTopBitSetTakeALeadingZero) {
             hex("41 04 7F FF FF FF"));
   EXPECT_EQ(written([](ber_writer& out) { return ber_put_uint(out, 0x80000000, 0x42); }),
             hex("42 05 00 80 00 00 00"));
-  EXPECT_EQ(written([](ber_writer& out) { return ber_put_uint(out, ~0ULL, 0x43); }),
-            hex("43 05 00 FF FF FF FF"));
 }
 
 TEST(Lengths, HaveThreeFormsAndNoOther) {
@@ -108,48 +83,12 @@ TEST(Lengths, HaveThreeFormsAndNoOther) {
   }
 }
 
-TEST(ObjectIdentifiers, AreWrittenAndReadBack) {
-  const struct {
-    std::vector<std::uint16_t> arcs;
-    const char* bytes;
-  } cases[] = {
-      {{1, 3}, "06 01 2B"},
-      {{6, 15}, "06 01 FF"},
-      {{1, 3, 127, 128}, "06 04 2B 7F 81 00"},
-      {{1, 3, 16383, 16384, 65535}, "06 09 2B FF 7F 81 80 00 83 FF 7F"},
-  };
-  for (const auto& c : cases) {
-    auto arcs = c.arcs;
-    const auto count = static_cast<std::uint16_t>(arcs.size());
-    snmp_oid oid{count, count, arcs.data()};
-    const auto bytes = hex(c.bytes);
-    EXPECT_EQ(written([&](ber_writer& out) { return ber_put_oid(out, oid); }), bytes);
-    for (const std::uint16_t room : {count, static_cast<std::uint16_t>(count - 1)}) {
-      std::vector<std::uint16_t> storage(count, 99);
-      snmp_oid target{room, room, storage.data()};
-      ber_reader in{std::span<const std::uint8_t>(bytes).subspan(2)};
-      EXPECT_EQ(ber_get_oid(in, &target, bytes[1]), room == count ? SNMP_OK : SNMP_ERR_CODEC);
-      EXPECT_EQ(target.count, room);
-      EXPECT_EQ(storage.back(), room == count ? c.arcs.back() : 99) << "beyond the room";
-    }
-  }
-}
-
-TEST(ObjectIdentifiers, ThatCannotBeEncodedAreRefused) {
-  std::vector<std::uint16_t> arcs(300, 1);
-  const auto put = [&](std::uint16_t count) {
-    return written([&](ber_writer& out) {
-             return ber_put_oid(out, snmp_oid{count, count, arcs.data()});
-           })
-        .size();
-  };
-  EXPECT_EQ(put(1), 0U);
-  EXPECT_EQ(put(128), 129U);
-  EXPECT_EQ(put(129), 131U) << "the 0x81 form";
-  EXPECT_EQ(put(256), 258U);
-  EXPECT_EQ(put(257), 0U);
-  arcs[0] = 7;
-  EXPECT_EQ(put(2), 0U) << "7 x 40 + 1 is no byte";
+TEST(ObjectIdentifiers, TakeOneByteForTheirFirstTwoArcs) {
+  std::uint16_t arcs[] = {6, 15};
+  EXPECT_EQ(ber_oid_size({2, 2, arcs}), 1U);
+  EXPECT_EQ(ber_oid_size({1, 2, arcs}), 0U) << "there have to be two";
+  arcs[1] = 16;
+  EXPECT_EQ(ber_oid_size({2, 2, arcs}), 0U) << "6 x 40 + 16 is no byte";
 }
 
 TEST(ObjectIdentifiers, CompareByArcsAndThenByWhetherTheFirstEndsEarlier) {
@@ -162,23 +101,12 @@ TEST(ObjectIdentifiers, CompareByArcsAndThenByWhetherTheFirstEndsEarlier) {
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {3, 3, a}), 0);
 }
 
-TEST(Strings, AreCopiedWithinTheirRoomOrReferredTo) {
+TEST(Strings, AreReferredToWithinTheInput) {
   const auto bytes = hex("61 62 63");
-  std::uint8_t storage[4] = {};
-  snmp_octets target{9, 2, storage};
+  snmp_octets target{9, 2, nullptr};
   ber_reader in(bytes);
-  EXPECT_EQ(ber_get_octets(in, &target, 3), SNMP_ERR_CODEC);
-  EXPECT_EQ(ber_get_octets(in, nullptr, 3), SNMP_ERR_CODEC);
-  EXPECT_EQ(ber_get_octets(in, nullptr, 0), SNMP_OK);
-  EXPECT_EQ(in.remaining(), 3U);
-  target.capacity = 3;
-  EXPECT_EQ(ber_get_octets(in, &target, 3), SNMP_OK);
-  EXPECT_THAT(storage, ElementsAreArray({'a', 'b', 'c', '\0'}));
-  EXPECT_EQ(target.length, 3);
-
-  ber_reader again(bytes);
-  EXPECT_EQ(ber_get_octets_ref(again, &target, 4), SNMP_ERR_CODEC);
-  EXPECT_EQ(ber_get_octets_ref(again, &target, 2), SNMP_OK);
+  EXPECT_EQ(ber_get_octets_ref(in, &target, 4), SNMP_ERR_CODEC);
+  EXPECT_EQ(ber_get_octets_ref(in, &target, 2), SNMP_OK);
   EXPECT_EQ(target.bytes, bytes.data());
   EXPECT_EQ(target.capacity, 0) << "nothing may be written to the input";
 }

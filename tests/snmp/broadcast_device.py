@@ -4,28 +4,17 @@ decent agent does."""
 import socket
 import sys
 
-NAME = bytes.fromhex("2b06010401a112020404895801" "0200")
+from replies import binding, element, integer, reply
 
-
-def tlv(tag, *contents):
-    content = b"".join(contents)
-    length = len(content)
-    return (bytes([tag, length]) if length < 128
-            else bytes([tag, 0x82]) + length.to_bytes(2, "big")) + content
-
-
-def reply(value, status=0, value_tag=2, community=b"corridor"):
-    binding = tlv(0x30, tlv(6, NAME), tlv(value_tag, value.to_bytes(2, "big")))
-    pdu = tlv(0xA2, tlv(2, b"\x63"), tlv(2, bytes([status])), tlv(2, b"\0"), tlv(0x30, binding))
-    return tlv(0x30, tlv(2, b"\0"), tlv(4, community), pdu)
-
-
+IDENTIFIER = integer(99)
+SEVEN = reply(IDENTIFIER, binding(integer(7)))
 REPLIES = {
     # Only the last two are proper ones.
-    "stutter": [b"", b"no message", reply(7)[:-1], reply(7, status=2), reply(7, value_tag=4),
-                reply(7), reply(7)],
+    "stutter": [b"", b"no message", SEVEN[:-1], reply(IDENTIFIER, binding(integer(7)), status=2),
+                reply(IDENTIFIER, binding(element(4, b"\7"))), SEVEN, SEVEN],
     # Together they take more room than a socket has by default.
-    "flood": [reply(number, community=b"corridor" * 80) for number in range(300)],
+    "flood": [reply(IDENTIFIER, binding(integer(number)), community=b"corridor" * 80)
+              for number in range(300)],
 }
 
 device = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)

@@ -19,7 +19,8 @@ TEST(Decoding, ReadsARealReplyInPlace) {
   EXPECT_EQ(m.message.varbind_count, 1U);
   EXPECT_EQ(m.varbinds[0].type, kTagInteger);
   EXPECT_EQ(m.varbinds[0].int_value, 2);
-  EXPECT_EQ(m.names[0].count, 14);
+  EXPECT_THAT(std::span(m.names[0].arcs, m.names[0].count),
+              testing::ElementsAre(1, 3, 6, 1, 4, 1, 4242, 2, 4, 4, 1240, 1, 2, 0));
   EXPECT_EQ(m.octets[0].bytes, nullptr) << "an integer clears the string beside it";
   EXPECT_EQ(m.octets[0].length + m.octets[0].capacity, 0);
 }
@@ -127,21 +128,6 @@ TEST(Malformed, EveryTruncationIsRefused) {
     const std::vector<std::uint8_t> cut(reply.begin(), reply.begin() + static_cast<long>(length));
     EXPECT_EQ(m.decode(cut), SNMP_ERR_CODEC) << length;
     EXPECT_TRUE(m.guardsIntact());
-  }
-}
-
-TEST(Malformed, EverySingleByteChangeStaysWithinTheStorage) {
-  Message m(1, 14, 2);
-  for (std::size_t at = 0; at < realReply().size(); ++at) {
-    for (int byte = 0; byte < 256; ++byte) {
-      auto reply = realReply();
-      reply[at] = static_cast<std::uint8_t>(byte);
-      const snmp_status status = m.decode(reply);
-      EXPECT_TRUE(status == SNMP_OK || status == SNMP_ERR_CODEC);
-      EXPECT_LE(m.message.varbind_count, 1U);
-      EXPECT_LE(m.names[0].count, 14);
-      EXPECT_TRUE(m.guardsIntact());
-    }
   }
 }
 

@@ -24,24 +24,16 @@ name = "Büro 北"
 maker = "Kestrel"
 model = "Model 100"
 note = "2nd floor"
-addresses = ["127.0.1.1", "127.0.1.2", "127.0.1.3"]
-activeif = ["silent", 2, -7]
+addresses = ["127.0.1.1", "127.0.1.2"]
 [[device]]
 name = "Scanner"
 maker = "Kestrel"
 model = "Scan 50"
 type = ["_scanner._tcp", "_ipp._tcp"]
 port = 4000
-activeif = "missing"
 [[device]]
 name = "Odd"
 addresses = ["127.0.1.20"]
-activeif = "text"
-[[device]]
-name = "Later"
-addresses = ["127.0.1.30"]
-delay = 0.5
-present = false
 """
 
 
@@ -59,28 +51,11 @@ def browse(service_type):
             for row in rows}
 
 
-def ask(address, seconds=0.3):
-    """What snmpget prints for the device interface object: a value, or the reason for none."""
-    result = run("snmpget", "-v1", "-Ov", "-c", "corridor", "-r0", f"-t{seconds}", address, OBJECT)
-    return result.stdout.strip() or result.stderr
-
-
 class FromInside(unittest.TestCase):
     """Runs as the command of a network of DEVICES."""
 
     def setUp(self):
         self.network = PracticeNetwork()
-
-    def assert_gone(self, name):
-        """Avahi's caches keep what said goodbye for another second, as all mDNS caches do."""
-        deadline = time.monotonic() + 10
-        # Without -r: resolving what just left takes avahi-browse seconds.
-        while f";{name};" in run("avahi-browse", "-ptk", "_pdl-datastream._tcp").stdout:
-            self.assertLess(time.monotonic(), deadline, f"{name} is still there")
-
-    def restore(self, name, **entries):
-        self.addCleanup(self.network.settle)
-        self.addCleanup(self.network.set, name, **entries)
 
     def test_services_carry_the_keys_of_their_type(self):
         printers = browse("_pdl-datastream._tcp")
@@ -92,43 +67,27 @@ class FromInside(unittest.TestCase):
         self.assertEqual(browse("_ipp._tcp")["Scanner"][1:],
                          ("4000", {"usb_MFG=Kestrel", "usb_MDL=Scan 50"}))
 
-    def test_each_address_answers_in_its_own_way(self):
-        scanner, = (one["addresses"][0] for one in self.network.list() if one["name"] == "Scanner")
-        for address, answer in (("127.0.1.1", "Timeout"), ("127.0.1.2", "INTEGER: 2"),
-                                ("127.0.1.3", "INTEGER: -7"), ("127.0.1.20", 'STRING: "two"'),
-                                (scanner, "noSuchName"), ("127.0.1.30", "Timeout")):
-            with self.subTest(address):
-                self.assertIn(answer, ask(address))
-
-    def test_a_device_comes_slow_to_answer_and_goes(self):
-        self.network.add("Later")
-        self.network.settle()
-        self.assertIn("Later", browse("_pdl-datastream._tcp"))
-        self.assertIn("Timeout", ask("127.0.1.30", seconds=0.1))
-        self.assertIn("INTEGER: 2", ask("127.0.1.30", seconds=20))
-        self.network.remove("Later")
-        self.assert_gone("Later")
-        self.assertIn("Timeout", ask("127.0.1.30"))
-
     def test_a_new_device_can_be_made_up(self):
         run(TOOL, "ctl", "add", "New one", "maker=Kestrel", "model=Model 300",
             'addresses=["10.1.2.3"]', "activeif=7", check=True)
         self.network.settle()
         self.assertEqual(browse("_pdl-datastream._tcp")["New one"],
                          ("10.1.2.3", "9100", {"usb_MFG=Kestrel", "usb_MDL=Model 300"}))
-        self.assertIn("INTEGER: 7", ask("10.1.2.3"))
+        self.assertIn("INTEGER: 7", run("snmpget", "-v1", "-Ov", "-c", "corridor", "10.1.2.3",
+                                        OBJECT).stdout)
         self.network.remove("New one")
 
-    def test_a_device_changes_under_its_name_and_gets_another(self):
-        self.restore("Odd", addresses=["127.0.1.20"], activeif="text", note="")
-        self.network.set("Odd", addresses=["127.0.1.21"], activeif=1, note="Attic")
+    def test_a_device_gets_another_name(self):
         self.network.rename("Odd", "Even")
+        self.addCleanup(self.network.settle)
         self.addCleanup(self.network.rename, "Even", "Odd")
         self.network.settle()
-        self.assert_gone("Odd")
-        self.assertEqual(browse("_pdl-datastream._tcp")["Even"], ("127.0.1.21", "9100", {"note=Attic"}))
-        self.assertIn("INTEGER: 1", ask("127.0.1.21"))
-        self.assertIn("Timeout", ask("127.0.1.20"))
+        # Avahi's caches keep what said goodbye for another second, as all mDNS caches do. Without
+        # -r, because resolving what just left takes avahi-browse seconds.
+        deadline = time.monotonic() + 10
+        while ";Odd;" in run("avahi-browse", "-ptk", "_pdl-datastream._tcp").stdout:
+            self.assertLess(time.monotonic(), deadline, "the old name is still there")
+        self.assertEqual(browse("_pdl-datastream._tcp")["Even"], ("127.0.1.20", "9100", set()))
 
     def test_devices_are_back_after_the_daemon_was_away(self):
         self.network.stop_daemon()
@@ -213,13 +172,9 @@ class FromOutside(unittest.TestCase):
                 ('[[device]]\nname = "A"\nmodle = "x"', 'device "A".*did you mean "model"'),
                 ('[[device]]\nname = "A"\n' * 2, 'device "A": the name is used twice'),
                 (f'[[device]]\nname = "{"ü" * 32}"', "1 to 63 bytes"),
-                ('[[device]]\nname = "A"\nport = 65536', "from 1 to 65535, not 65536"),
                 ('[[device]]\nname = "A"\nactiveif = "quiet"', '"silent", "closed".*\'quiet\''),
                 ('[[device]]\nname = "A"\nactiveif = [1, 2]', "2 values for 1 addresses"),
                 ('[[device]]\nname = "A"\naddresses = ["127.0.1"]', "list of different addresses"),
-                ('[[device]]\nname = "A"\ntype = "ipp"', "a service type such as"),
-                ('[[device]]\nname = "A"\ndelay = -1', "seconds from 0"),
-                ('[[device]]\nname = "A"\npresent = "no"', "true or false"),
                 (f'[[device]]\nname = "A"\nnote = "{"n" * 260}"', "note is too long"),
                 ('[[device]]\nname = "A"\naddresses = ["127.0.1.1"]\n'
                  '[[device]]\nname = "B"\naddresses = ["127.0.1.1"]', "another device's address")):

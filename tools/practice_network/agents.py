@@ -20,6 +20,12 @@ class AgentError(Exception):
     """An agent did not come up; says why."""
 
 
+def listens(address):
+    """Whether something on this host takes requests at that address."""
+    number = socket.inet_aton(address)[::-1].hex().upper()
+    return f" {number}:{PORT:04X} " in pathlib.Path("/proc/net/udp").read_text()
+
+
 class Agents:
     """The agents of all devices that are present."""
 
@@ -88,8 +94,7 @@ class _Agent:
     def is_listening(self):
         if self._process.poll() is not None:
             raise AgentError(f"snmpd at {self.address} ended at once:\n{self.log()}")
-        number = socket.inet_aton(self.address)[::-1].hex().upper()
-        return f" {number}:{PORT:04X} " in pathlib.Path("/proc/net/udp").read_text()
+        return listens(self.address)
 
     def log(self):
         return self._log.read_text(errors="replace") if self._log.exists() else ""
