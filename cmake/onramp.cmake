@@ -18,10 +18,14 @@ if(ONRAMP_FUZZ)
   add_compile_options(-fsanitize=fuzzer-no-link)
 endif()
 
-# onramp_library(NAME SOURCES… [LINK libraries…]): a room's static library.
+# onramp_library(NAME SOURCES… [LINK libraries…]): a room's static library. Its files are compiled one
+# by one in unity builds, too: a program needs backends only for those that it uses.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
+  if(NOT ONRAMP_LINT)
+    set_target_properties(${name} PROPERTIES UNITY_BUILD OFF)
+  endif()
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 

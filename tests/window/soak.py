@@ -1,3 +1,4 @@
+#!/usr/bin/python3
 """The wizard's chooser while devices come, go and change for minutes on end.
 
 Usage: soak.py [--seconds S] [--events N] [--seed N] MEDIUM

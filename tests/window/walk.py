@@ -1,3 +1,4 @@
+#!/usr/bin/python3
 """Random walks over the wizard's real window while devices come and go.
 
 Usage: walk.py [--seed N] [--count N] [--silence SECONDS] MEDIUM
