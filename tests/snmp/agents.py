@@ -1,3 +1,4 @@
+#!/usr/bin/python3
 """Runs a command where SNMP agents answer on loopback: agents.py COMMAND [ARGUMENT ...].
 
 127.0.1.x are net-snmp's agents, 127.0.2.x misbehave. All of it lives in namespaces of its own (see
