@@ -44,6 +44,17 @@ TEST_F(Navigation, AWirelessModelIsAskedForItsConnection) {
   expectPackageOpenedAndQuit();
 }
 
+TEST_F(Navigation, BackReturnsToTheModelChosenBefore) {
+  describe({{"A", model(true, false, true)}, {"B", model(true, true, true)}});
+  launch();
+  chooseModel("B");
+  screen.click("rightMostButton");
+  screen.click("rightButton");
+  EXPECT_EQ(page(), "ModelListView");
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
+  EXPECT_EQ(modelList().selectedObject(), (Dictionary{{"model", "B"}}));
+}
+
 TEST_F(Navigation, CancelQuitsFromEveryPageAndWritesNothing) {
   const std::function<void()> fromTheList = [&] {
     describeTwoModels();

@@ -26,6 +26,14 @@ TEST(TxtRecord, ReadsAttributesAsTheyAreOnTheWire) {
   EXPECT_EQ(record->value("absent"), std::nullopt);
 }
 
+TEST(TxtRecord, ReadsRecordsOfThePermittedSize) {
+  std::vector<std::string> strings(34, "key=" + std::string(240, 'v'));
+  strings.emplace_back("last=" + std::string(250, 'z'));
+  const Data data = txtData(strings);
+  ASSERT_GT(data.size(), 8500u);
+  EXPECT_EQ(TxtRecord::parse(data)->value("last"), std::string(250, 'z'));
+}
+
 TEST(TxtRecord, DataThatEndsWithinAStringIsNone) {
   const Data whole = txtData({"a=1", "b=22"});
   for (std::size_t size = 0; size <= whole.size(); ++size) {

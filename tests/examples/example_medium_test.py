@@ -101,6 +101,15 @@ class Messages(unittest.TestCase):
 
 
 class Medium(unittest.TestCase):
+    def test_every_property_list_and_strings_table_parses(self):
+        lists = [*MEDIUM.rglob("*.plist"), *RESOURCES.glob("*.plist"), RESOURCES / "Info.plist.in"]
+        for path in lists:
+            with self.subTest(path.name):
+                self.assertIsInstance(plistlib.loads(path.read_bytes()), dict)
+        for path in [*MEDIUM.rglob("*.strings"), *RESOURCES.rglob("*.strings")]:
+            with self.subTest(path.name):
+                self.assertTrue(strings_table(path))
+
     def test_every_place_that_the_resource_dictionary_names_exists(self):
         common = common_info()
         package = common["PkgInfo"]

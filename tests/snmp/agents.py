@@ -104,7 +104,8 @@ def main(arguments):
         os.execv(program, [program, sys.executable, __file__, "--inside", *arguments])
     os.environ["PATH"] += ":/usr/sbin:/sbin"
     subprocess.run(["ip", "link", "set", "lo", "up"], check=True)
-    Agents("/run/agents").start([
+    agents = Agents("/run/agents")
+    agents.start([
         types.SimpleNamespace(name=address, addresses=[address], behaviour=lambda one=answer: [one],
                               delay=delay)
         for address, (answer, delay) in REAL.items()])

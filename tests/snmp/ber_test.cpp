@@ -89,6 +89,18 @@ TEST(ObjectIdentifiers, TakeOneByteForTheirFirstTwoArcs) {
   EXPECT_EQ(ber_oid_size({1, 2, arcs}), 0U) << "there have to be two";
   arcs[1] = 16;
   EXPECT_EQ(ber_oid_size({2, 2, arcs}), 0U) << "6 x 40 + 16 is no byte";
+
+  const auto bytes = hex("2B");
+  ber_reader in(bytes);
+  snmp_oid withoutRoom{1, 1, arcs};
+  EXPECT_EQ(ber_get_oid(in, &withoutRoom, 1), SNMP_ERR_CODEC);
+  EXPECT_EQ(arcs[1], 16) << "nothing is written behind it";
+}
+
+TEST(ObjectIdentifiers, HaveAtMost255BytesOfContent) {
+  std::vector<std::uint16_t> arcs(257, 1);
+  EXPECT_EQ(ber_oid_size({256, 256, arcs.data()}), 255U);
+  EXPECT_EQ(ber_oid_size({257, 257, arcs.data()}), 0U);
 }
 
 TEST(ObjectIdentifiers, CompareByArcsAndThenByWhetherTheFirstEndsEarlier) {
@@ -101,10 +113,11 @@ TEST(ObjectIdentifiers, CompareByArcsAndThenByWhetherTheFirstEndsEarlier) {
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {3, 3, a}), 0);
 }
 
-TEST(Strings, AreReferredToWithinTheInput) {
+TEST(Strings, NeedAPlaceOrAreReferredToWithinTheInput) {
   const auto bytes = hex("61 62 63");
   snmp_octets target{9, 2, nullptr};
   ber_reader in(bytes);
+  EXPECT_EQ(ber_get_octets(in, nullptr, 2), SNMP_ERR_CODEC) << "there is no place for it";
   EXPECT_EQ(ber_get_octets_ref(in, &target, 4), SNMP_ERR_CODEC);
   EXPECT_EQ(ber_get_octets_ref(in, &target, 2), SNMP_OK);
   EXPECT_EQ(target.bytes, bytes.data());
