@@ -9,14 +9,14 @@ namespace {
 
 using SetTime = void(id, SEL, unsigned long);
 
-constexpr unsigned long kHalfOfAllTimes = 1UL << 31;  // milliseconds in 32 bits, which wrap around
+// Times are milliseconds in 32 bits: a step back that is greater than this is a wrap around.
+constexpr unsigned long kGreatestStepBack = 0xF0000000UL;
 
 SetTime* originalSetLastTime = nullptr;
 unsigned long lastTime = 0;
 
 void setLastTime(id self, SEL selector, unsigned long time) {
-  const bool isEarlier = ((time - lastTime) & 0xFFFFFFFFUL) >= kHalfOfAllTimes;
-  if (lastTime != 0 && isEarlier) return;
+  if (time < lastTime && lastTime - time < kGreatestStepBack) return;
   lastTime = time;
   originalSetLastTime(self, selector, time);
 }
@@ -29,10 +29,12 @@ void setLastTime(id self, SEL selector, unsigned long time) {
 @implementation OnrampEventTimes
 
 + (void)load {
-  [[NSNotificationCenter defaultCenter] addObserver:self
-                                           selector:@selector(replace:)
-                                               name:NSApplicationWillFinishLaunchingNotification
-                                             object:nil];
+  @autoreleasepool {
+    [[NSNotificationCenter defaultCenter] addObserver:self
+                                             selector:@selector(replace:)
+                                                 name:NSApplicationWillFinishLaunchingNotification
+                                               object:nil];
+  }
 }
 
 // What speaks to the X server is loaded with the application object.

@@ -1,4 +1,4 @@
-// An application that can be hidden and shown again. Where it has no icon of its own to click on,
+// An application that can hide itself and come back. Where it has no icon of its own to click on,
 // GNUstep makes an icon of each window instead, and a window that is brought back before its icon
 // is on the screen is not always given the keyboard.
 
@@ -7,13 +7,22 @@
 
 namespace {
 
+using Hide = void(id, SEL, id);
+
+Hide* originalHide = nullptr;
+
 // From front to back, while the application is hidden.
 NSMutableArray* hiddenWindows() {
   static NSMutableArray* const windows = [[NSMutableArray alloc] init];
   return windows;
 }
 
-void hide(id self, SEL, id) {
+// Whoever hides it from the menu needs the icons to bring it back.
+void hide(id self, SEL selector, id sender) {
+  if (sender) {
+    originalHide(self, selector, sender);
+    return;
+  }
   for (NSWindow* window in [self orderedWindows]) {
     if (![window isVisible] || ![window canHide]) continue;
     [hiddenWindows() addObject:window];
@@ -37,7 +46,7 @@ void unhideWithoutActivation(id, SEL) {
 
 + (void)load {
   using onramp::gnustep::replaceMethod;
-  replaceMethod([NSApplication class], @selector(hide:), hide);
+  originalHide = replaceMethod([NSApplication class], @selector(hide:), hide);
   replaceMethod([NSApplication class], @selector(unhideWithoutActivation), unhideWithoutActivation);
 }
 
