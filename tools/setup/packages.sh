@@ -1,10 +1,9 @@
-# Sourced by the scripts at the root: installs what packages.txt names and this machine lacks.
+# Sourced by the scripts at the root: installs what lists of packages name and this machine lacks.
 
 install_packages() {
   local list=$1 missing
-  missing=$(sed 's/[[:space:]]*#.*//; /^$/d' "$list" | while read -r package program; do
-    { [ -n "$program" ] && command -v "$program" >/dev/null; } ||
-      dpkg-query -W -f '${db:Status-Status}' "$package" 2>/dev/null | grep -qx installed ||
+  missing=$(sed 's/[[:space:]]*#.*//; /^$/d' "$list" | while read -r package; do
+    dpkg-query -W -f '${db:Status-Status}' "$package" 2>/dev/null | grep -qx installed ||
       echo "$package"
   done)
   [ -z "$missing" ] && return
