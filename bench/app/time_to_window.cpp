@@ -51,9 +51,13 @@ void end(pid_t process) {
 }  // namespace
 
 int main(int argc, char** argv) {
-  const DisplayHandle display(XOpenDisplay(nullptr), XCloseDisplay);
-  if (argc < 2 || !display) {
+  if (argc < 2) {
     std::fprintf(stderr, "usage: time_to_window PROGRAM [ARGUMENT…], with DISPLAY set\n");
+    return 2;
+  }
+  const DisplayHandle display(XOpenDisplay(nullptr), XCloseDisplay);
+  if (!display) {
+    std::fprintf(stderr, "time_to_window: there is no display; set DISPLAY\n");
     return 2;
   }
   const unsigned long before = middlePixel(display.get());

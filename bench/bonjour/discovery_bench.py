@@ -5,7 +5,7 @@ Usage: discovery_bench.py [BUILD], the folder of a release build (default build/
 
 Each time is from the start of the program to its line about the last service that it has resolved.
 Warm: one host, all in its daemon's cache. Cold: two hosts with a cable between them, and a daemon
-without any cache for each single search.
+without any cache for each single search. Then the processor time of a search that idles.
 """
 
 import pathlib
@@ -23,6 +23,7 @@ from practice_network.control import PracticeNetwork  # noqa: E402
 TYPE = "_ipp._tcp"
 COUNTS = (1, 20, 200)
 ROUNDS = {"warm": 15, "cold": 5}
+IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
@@ -84,10 +85,21 @@ def compare(state, probe):
               f"(quartiles {low:.2f} to {high:.2f})", flush=True)
 
 
+def idle(probe):
+    with discovery.Search(probe, TYPE) as search:
+        search.wait_for("update", "Kestrel 1")
+        time.sleep(IDLE_SECONDS)
+        search.end()
+        print(f"idle for {IDLE_SECONDS} s with {COUNTS[-1]} services found: "
+              f"{search.processor_seconds():.3f} s of processor time, start included")
+
+
 def main():
     match sys.argv[1:]:
         case ["--inside", state, probe]:
             compare(state, probe)
+            if state == "warm":
+                idle(probe)
             return 0
     build = pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/release").resolve()
     probe = build / "tests/bonjour/bonjour_probe"

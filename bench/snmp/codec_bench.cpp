@@ -1,5 +1,5 @@
 // Encodes the request for ActiveIF and decodes its reply, with this codec and with net-snmp's
-// library in turns, and prints times and ratios of one message.
+// library in turns, and prints times, ratios and allocations of one message.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -11,6 +11,28 @@
 
 #include "bench/snmp/median.h"
 #include "tests/snmp/message.h"
+
+namespace {
+
+long allocations = 0;
+
+}  // namespace
+
+// Every allocation of the process, those inside the library included, passes through here.
+extern "C" {
+// The C library's names.
+void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
+void* __libc_calloc(std::size_t count, std::size_t size);  // NOLINT(bugprone-reserved-identifier)
+
+void* malloc(std::size_t size) {
+  ++allocations;
+  return __libc_malloc(size);
+}
+void* calloc(std::size_t count, std::size_t size) {
+  ++allocations;
+  return __libc_calloc(count, size);
+}
+}
 
 namespace {
 
@@ -93,10 +115,22 @@ class NetSnmp {
   size_t offset_ = 0;
 };
 
-void report(const char* what, const Samples& ours, const Samples& peer) {
-  std::printf("%s  %6.1f ns [%.1f, %.1f]   net-snmp %6.1f ns [%.1f, %.1f]   %5.1f times as fast\n",
-              what, ours.median(), ours.quantile(0.05), ours.quantile(0.95), peer.median(),
-              peer.quantile(0.05), peer.quantile(0.95), peer.median() / ours.median());
+template <typename Work>
+double allocationsOf(Work work) {
+  const long before = allocations;
+  for (int i = 0; i < kMessagesPerRound; ++i)
+    work();
+  return static_cast<double>(allocations - before) / kMessagesPerRound;
+}
+
+void report(const char* what, const Samples& ours, const Samples& peer, double ourAllocations,
+            double peerAllocations) {
+  std::printf(
+      "%s  %6.1f ns [%.1f, %.1f]   net-snmp %6.1f ns [%.1f, %.1f]   %5.1f times as fast"
+      "   allocations %g, net-snmp %g\n",
+      what, ours.median(), ours.quantile(0.05), ours.quantile(0.95), peer.median(),
+      peer.quantile(0.05), peer.quantile(0.95), peer.median() / ours.median(), ourAllocations,
+      peerAllocations);
 }
 
 }  // namespace
@@ -129,7 +163,9 @@ int main() {
   }
   std::printf("Medians of %d rounds of %d messages of %zu bytes [5 %%, 95 %%]\n", kRounds,
               kMessagesPerRound, a.size());
-  report("encode", ourBuild, peerBuild);
-  report("decode", ourParse, peerParse);
+  report("encode", ourBuild, peerBuild, allocationsOf([&] { request.build(); }),
+         allocationsOf([&] { peer.build(); }));
+  report("decode", ourParse, peerParse, allocationsOf([&] { answer.parse(reply); }),
+         allocationsOf([&] { peer.parse(reply); }));
   return 0;
 }

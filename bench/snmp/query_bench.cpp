@@ -1,13 +1,13 @@
 // One whole query, from the request to the result, beside the bare exchange of the same bytes with
-// the same agent over a socket that is opened for it, in turns.
+// the same agent, in turns.
 
-#include <chrono>
+#include <array>
 #include <cstdio>
 #include <cstdlib>
 #include <string>
 
 #include "bench/snmp/median.h"
-#include "platform/datagram_socket.h"
+#include "bench/snmp/posix/bare_exchange.h"
 #include "snmp/codec.h"
 #include "snmp/query.h"
 
@@ -25,10 +25,13 @@ constexpr int kWarmUp = 100;
 
 int main(int argc, char** argv) {
   const std::string address = argc > 1 ? argv[1] : "127.0.1.1";
+  const auto agent = onramp::parseIPv4(address);
   onramp::snmp_table_request request(onramp::active_interface_table);
   onramp::snmp_packet packet{};
   std::uint16_t length = 0;
-  if (onramp::snmp_encode_message(request.message(), packet, length)) giveUp("there is no request");
+  if (!agent || onramp::snmp_encode_message(request.message(), packet, length)) {
+    giveUp("the argument is no IPv4 address");
+  }
 
   Samples query;
   Samples bare;
@@ -43,10 +46,8 @@ int main(int argc, char** argv) {
     });
     bare.measure(1, [&] {
       onramp::snmp_packet reply;
-      auto socket = onramp::DatagramSocket::open();
-      if (!socket ||
-          !socket->sendTo(onramp::snmp_agent_at(address), std::span(packet).first(length)) ||
-          !socket->waitReadable(std::chrono::seconds(2)) || !socket->receive(reply)) {
+      if (bareExchange(agent->bits, onramp::kSnmpPort, std::span(packet).first(length), reply) ==
+          0) {
         giveUp("the agent does not answer the bare request");
       }
     });

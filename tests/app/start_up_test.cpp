@@ -205,6 +205,14 @@ Dictionary version(Value major, Value minor, Value bugFix) {
   return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
 }
 
+TEST_F(StartUp, NeedsNothingOnTheMedium) {
+  launch();
+  EXPECT_EQ(page(), "");
+  EXPECT_EQ(medium.opened(0), std::vector<std::string>());
+  screen.runTimers();
+  EXPECT_TRUE(screen.terminated);
+}
+
 TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
   const Dictionary none = version("0", "0", "0");
   const struct {

@@ -164,6 +164,32 @@ TEST_F(BrowserTest, ARestartBeginsCleanWithOneBrowse) {
   EXPECT_THAT(recorder->events, ElementsAre(Event{"add", onOne}));
 }
 
+TEST_F(BrowserTest, ABrowseThatCannotStartLeavesAnIdleBrowser) {
+  network.searchesStart = false;
+  browser->startBrowsing();
+  EXPECT_THAT(network.browsers, IsEmpty());
+  const auto typeless = KSBonjour::initWithType(std::nullopt);
+  network.log.clear();
+  typeless->startBrowsing();
+  EXPECT_THAT(network.log, IsEmpty());
+}
+
+TEST_F(BrowserTest, AnObserverMayEndTheBrowserFromWithin) {
+  class Ender final : public KSBonjourObserver {
+   public:
+    explicit Ender(std::shared_ptr<KSBonjour>& held) : browser(held) {}
+    void addBonjourService(const NetServiceRef&) override { browser.reset(); }
+    void removeBonjourService(const NetServiceRef&) override {}
+    void resolvedBonjourService(const NetServiceRef&) override {}
+    std::shared_ptr<KSBonjour>& browser;
+  };
+  browser->addKSBonjourObserver(std::make_shared<Ender>(browser));
+  network.found(onOne);
+  EXPECT_EQ(browser, nullptr);
+  EXPECT_FALSE(Network::isResolving(onOne));
+  EXPECT_THAT(network.browsers, IsEmpty());
+}
+
 }  // namespace
 
 }  // namespace onramp

@@ -21,6 +21,7 @@ struct Store {
   Step failing = Step::kNone;
   int error = 0;                  ///< what lastDynamicStoreError reports
   DynamicStoreCallback callback;  ///< of the session that was last created with one
+  std::optional<bool> source;     ///< that was last added to the main loop: whether it was one
 
   /// The contents become these, and the installed callback hears of it.
   void change(Dictionary newContents) {
@@ -74,7 +75,9 @@ DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int) {
   return store ? std::make_shared<DynamicStoreSource>() : nullptr;
 }
 
-void addSourceToMainLoop(const DynamicStoreSourceRef&) {}
+void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
+  script().source = source != nullptr;
+}
 
 int lastDynamicStoreError() {
   return script().error;
@@ -213,6 +216,15 @@ TEST_F(Netconfig, CacheIsFilledAndFollowsEveryChange) {
   store.failing = Step::kCopy;
   store.change({});
   EXPECT_EQ(local_address_cache_copy(), nullptr);
+}
+
+TEST_F(Netconfig, SourceIsAddedEvenWhenItIsNull) {
+  for (const auto& [step, isSource] : {std::pair{Step::kCreate, false}, {Step::kKey, true}}) {
+    store.failing = step;
+    store.source.reset();
+    AddNetworkInterfaceListChangeCallbackSCF();
+    EXPECT_EQ(store.source, isSource);
+  }
 }
 
 TEST_F(Netconfig, InterfacesAreAskedForByKey) {

@@ -131,6 +131,21 @@ TEST(Malformed, EveryTruncationIsRefused) {
   }
 }
 
+TEST(Malformed, EverySingleByteChangeStaysWithinTheStorage) {
+  Message m(1, 14, 2);
+  for (std::size_t at = 0; at < realReply().size(); ++at) {
+    for (int byte = 0; byte < 256; ++byte) {
+      auto reply = realReply();
+      reply[at] = static_cast<std::uint8_t>(byte);
+      const snmp_status status = m.decode(reply);
+      EXPECT_TRUE(status == SNMP_OK || status == SNMP_ERR_CODEC);
+      EXPECT_LE(m.message.varbind_count, 1U);
+      EXPECT_LE(m.names[0].count, 14);
+      EXPECT_TRUE(m.guardsIntact());
+    }
+  }
+}
+
 TEST(Malformed, TheMistakesOfOtherCodecsAreNotMade) {
   const std::string body = "02 01 00 04 00 a2 0b 02 01 07 02 01 00 02 01 00 30 00";
   const struct {

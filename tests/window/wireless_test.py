@@ -22,7 +22,7 @@ from practice_network import PracticeNetwork
 PRACTICE_NETWORK = pathlib.Path(__file__).resolve().parents[2] / "tools/practice-network"
 AT_A_TIME = 4
 PATIENCE = 60  # seconds, for what takes up to 15 where nothing else runs
-WIRED = 1
+WIRELESS, WIRED = 2, 1
 GEAR, GEAR_TOOL, GEAR_REFRESH = "Actions", 1, 2
 SUPPORT_PAGE = "http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"
 
@@ -222,6 +222,29 @@ class WirelessWays(WayTest):
         person.press("Return")
         self.assertEqual(person.wait_for_end(), 0)
         self.assertEqual(self.files()["instmodel"]["Network"]["Bonjour"]["name"], names[-1])
+
+    def test_the_first_address_that_answers_decides(self):
+        addresses = {f"{name} {self.kind}": [f"127.0.{net}.{host}" for host in (1, 2, 3)]
+                     for name, net in (("Silent", 91), ("Wired", 92))}
+        for name, own in addresses.items():
+            self.add(name, addresses=own)
+        self.network.settle()
+        person = self.search()
+        self.see_chooser(person)
+        # Which one is the first, Avahi decides.
+        first = {name: address for name, _, address in self.rows(person)}
+        silent, wired = addresses
+        for name, behaviour in ((silent, "silent"), (wired, WIRED)):
+            self.network.set(name, activeif=[behaviour if address == first[name] else WIRELESS
+                                             for address in addresses[name]])
+        began = time.monotonic()
+        person.choose_from_menu(GEAR, GEAR_REFRESH)
+        person.see("table cell", silent, PATIENCE)
+        self.see_chooser(person)
+        self.assertGreater(time.monotonic() - began, 3 * 2 * 2.0, "asked less often")
+        self.assertEqual(self.names(person), [silent])
+        person.press("Return")
+        self.assert_handed_on(person, silent, first[silent])
 
     def test_without_a_model_list_all_models_are_searched_for(self):
         kinds = {f"{letter} {self.kind}": letter for letter in "ABC"}

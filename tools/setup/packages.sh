@@ -1,4 +1,4 @@
-# Sourced by the scripts at the root: installs what lists of packages name and this machine lacks.
+# Sourced by the scripts at the root: installs what a list of packages names and this machine lacks.
 
 install_packages() {
   local list=$1 missing
