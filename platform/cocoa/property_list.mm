@@ -10,15 +10,12 @@ namespace onramp {
 
 namespace {
 
-constexpr unsigned long long kMostBytes = 16U << 20U;
-constexpr int kDeepestNesting = 128;
-constexpr int kMostObjects = 1 << 18;
-
 // Turns a property list into a value, as far as the limits go.
 class Reader {
  public:
-  std::optional<Value> read(id object, int depth) {
-    if (depth > kDeepestNesting || ++objects_ > kMostObjects) return std::nullopt;
+  std::optional<Value> read(id object, std::size_t depth) {
+    if (depth > kMostPropertyListDepth || ++objects_ > kMostPropertyListObjects)
+      return std::nullopt;
     if ([object isKindOfClass:[NSString class]]) return string(object);
     if ([object isKindOfClass:[NSNumber class]]) return number(object);
     if ([object isKindOfClass:[NSDictionary class]]) return dictionary(object, depth);
@@ -48,7 +45,7 @@ class Reader {
   // Objects may share a text or data, values copy it: what that comes to is limited like a file.
   bool takes(unsigned long long bytes) {
     bytes_ += bytes;
-    return bytes_ <= kMostBytes;
+    return bytes_ <= kMostPropertyListBytes;
   }
 
   std::optional<Value> string(NSString* string) {
@@ -62,7 +59,7 @@ class Reader {
     return Value(Data(bytes, bytes + [data length]));
   }
 
-  std::optional<Value> array(NSArray* array, int depth) {
+  std::optional<Value> array(NSArray* array, std::size_t depth) {
     Array values;
     for (id object in array) {
       std::optional<Value> value = read(object, depth + 1);
@@ -72,7 +69,7 @@ class Reader {
     return Value(std::move(values));
   }
 
-  std::optional<Value> dictionary(NSDictionary* dictionary, int depth) {
+  std::optional<Value> dictionary(NSDictionary* dictionary, std::size_t depth) {
     std::vector<Dictionary::Pair> pairs;
     for (id key in dictionary) {
       std::optional<Value> value = read([dictionary objectForKey:key], depth + 1);
@@ -121,7 +118,9 @@ NSData* contents(NSString* path) {
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file
                                                                                     error:nullptr];
   const bool isFile = [[attributes fileType] isEqualToString:NSFileTypeRegular];
-  return isFile && [attributes fileSize] <= kMostBytes ? [NSData dataWithContentsOfFile:file] : nil;
+  return isFile && [attributes fileSize] <= kMostPropertyListBytes
+             ? [NSData dataWithContentsOfFile:file]
+             : nil;
 }
 
 }  // namespace

@@ -2,15 +2,10 @@
 
 #import <AppKit/AppKit.h>
 
-#include <chrono>
-#include <condition_variable>
-#include <memory>
-#include <mutex>
 #include <utility>
 
 #import "platform/cocoa/action.h"
 #import "platform/cocoa/native.h"
-#import "platform/cocoa/termination.h"
 
 namespace onramp {
 
@@ -19,18 +14,6 @@ namespace {
 NSArray* allModes() {
   return [NSArray arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode,
                                    NSEventTrackingRunLoopMode, nil];
-}
-
-struct Termination {
-  std::mutex mutex;
-  std::condition_variable changed;
-  bool asked = false;
-};
-
-// Never destroyed: the process may exit while a thread still sleeps.
-Termination& termination() {
-  static Termination* const instance = std::make_unique<Termination>().release();
-  return *instance;
 }
 
 // Whether the modal loop that runs was asked to end. Main thread only.
@@ -59,18 +42,6 @@ void wakeEventLoop() {
 }
 
 }  // namespace
-
-namespace cocoa {
-
-void wakeSleepersForTermination() {
-  {
-    const std::lock_guard lock(termination().mutex);
-    termination().asked = true;
-  }
-  termination().changed.notify_all();
-}
-
-}  // namespace cocoa
 
 void scheduleTimer(double seconds, std::function<void()> action) {
   NSTimer* const timer = [NSTimer timerWithTimeInterval:seconds
@@ -107,12 +78,6 @@ void abortModal() {
     [NSApp stopModalWithCode:NSModalResponseAbort];
     wakeEventLoop();
   });
-}
-
-bool sleepOffMainThread(std::uint32_t seconds) {
-  std::unique_lock lock(termination().mutex);
-  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
-                                         [] { return termination().asked; });
 }
 
 }  // namespace onramp
