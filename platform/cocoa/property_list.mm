@@ -81,7 +81,7 @@ class Reader {
     return Value(Dictionary(std::move(pairs)));
   }
 
-  int objects_ = 0;
+  std::uint64_t objects_ = 0;
   unsigned long long bytes_ = 0;
 };
 
