@@ -2,7 +2,7 @@
 
 namespace onramp::cocoa {
 
-/// Makes every sleep off the main thread end: the application is about to terminate.
+/// Ends every sleepOffMainThread(), because the application is about to terminate.
 void wakeSleepersForTermination();
 
 }  // namespace onramp::cocoa
