@@ -7,13 +7,13 @@
 #include <string_view>
 #include <vector>
 
+#include "base/notification_center.h"
+#include "base/value.h"
 #include "media/KSInstallerInfo.h"
 #include "pages/ConnectionTypeView.h"
 #include "pages/page.h"
 #include "platform/application.h"
-#include "platform/notification_center.h"
 #include "platform/outlets.h"
-#include "platform/value.h"
 
 namespace onramp {
 

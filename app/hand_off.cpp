@@ -2,9 +2,9 @@
 #include <system_error>
 
 #include "app/OnrampOSXAppDelegate.h"
+#include "base/ascii.h"
 #include "media/KSOROSXCD.h"
 #include "media/medium.h"
-#include "media/text_order.h"
 #include "platform/bundle.h"
 #include "platform/folders.h"
 #include "platform/property_list.h"
@@ -21,7 +21,7 @@ constexpr const char* kInterface = "Interface";
 
 // "com.vendor.kind.plist"
 std::string fileName(const std::string& vendor, const std::string& kind) {
-  return "com." + lowercased(vendor) + "." + kind + ".plist";
+  return "com." + asciiLowercased(vendor) + "." + kind + ".plist";
 }
 
 // Other users' runs and the installer must be able to replace what lies in the folder. A path as

@@ -3,8 +3,8 @@
 #include <system_error>
 
 #include "app/OnrampOSXAppDelegate.h"
+#include "base/ascii.h"
 #include "media/KSOROSXCD.h"
-#include "media/text_order.h"
 #include "platform/bundle.h"
 #include "platform/child_process.h"
 #include "platform/run_loop.h"
@@ -28,8 +28,7 @@ constexpr int kToolAsksToQuit = 2;
 // The characters of RFC 3986; with any other one the text is no address.
 bool isURLCharacter(char c) {
   constexpr std::string_view kPunctuation = "-._~:/?#[]@!$&'()*+,;=%";
-  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') ||
-         kPunctuation.find(c) != std::string_view::npos;
+  return isASCIILetterOrDigit(c) || kPunctuation.find(c) != std::string_view::npos;
 }
 
 std::optional<int> runSetUpTool(const std::optional<FileURL>& tool) {
@@ -96,7 +95,7 @@ std::optional<std::string> OnrampOSXAppDelegate::FAQ_URL() {
   const std::string series =
       KSOROSXCD::initWithCDInfo().string(KSOROSXCD::kKSCSeriesCode).value_or("");
   const std::string url = std::string(kSupportSite) + "/g/d/c2f2/" + series + "/" +
-                          localeLanguageCode() + "/" + lowercased(localeCountryCode()) + "/";
+                          localeLanguageCode() + "/" + asciiLowercased(localeCountryCode()) + "/";
   return std::all_of(url.begin(), url.end(), isURLCharacter) ? std::optional(url) : std::nullopt;
 }
 

@@ -1,6 +1,6 @@
 #include "app/OnrampOSXAppDelegate.h"
+#include "base/ascii.h"
 #include "media/CommonMessage.h"
-#include "media/text_order.h"
 #include "platform/alert.h"
 #include "platform/system_version.h"
 
@@ -69,7 +69,8 @@ SystemSupport OnrampOSXAppDelegate::supportedOSMaxCheck() const {
   if (system.major != major) return newerIf(system.major > major);
   const std::int64_t minor = maximum.integerValue(kMinor);
   if (system.minor != minor) return newerIf(system.minor > minor);
-  if (lowercased(maximum.string(kBugFix).value_or("")) == "x") return SystemSupport::kSupported;
+  if (asciiLowercased(maximum.string(kBugFix).value_or("")) == "x")
+    return SystemSupport::kSupported;
   // The bug-fix release is the first one that is not supported, unlike the other two bounds.
   return newerIf(system.bugFix >= maximum.integerValue(kBugFix));
 }

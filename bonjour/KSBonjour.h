@@ -7,8 +7,8 @@
 #include <string_view>
 #include <vector>
 
+#include "base/notification_center.h"
 #include "platform/net_service.h"
-#include "platform/notification_center.h"
 
 namespace onramp {
 

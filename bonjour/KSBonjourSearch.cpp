@@ -3,9 +3,9 @@
 #include <algorithm>
 #include <utility>
 
+#include "base/notification_center.h"
 #include "bonjour/KSDevice.h"
 #include "media/KSOROSXCD.h"
-#include "platform/notification_center.h"
 
 namespace onramp {
 

@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
+#include "base/value.h"
 #include "bonjour/KSBonjour.h"
-#include "platform/value.h"
 
 namespace onramp {
 

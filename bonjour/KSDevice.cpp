@@ -33,14 +33,14 @@ Dictionary KSDevice::initWithService(const NetServiceRef& service,
   std::string modelName;
   if (manufacturer && model) modelName = *manufacturer + ' ' + *model;
 
-  return Dictionary{{std::string(kDisplayName), name.value_or("")},
-                    {std::string(kModelName), std::move(modelName)},
-                    {std::string(kBonjourServiceType), types.value_or(Array())},
-                    {std::string(kUSBManufacturer), manufacturer.value_or("")},
-                    {std::string(kUSBModel), model.value_or("")},
-                    {std::string(kLocation), note.value_or("")},
-                    {std::string(kDeviceURI), uri.value_or("")},
-                    {std::string(kIPAddressList), std::move(addresses)}};
+  return Dictionary{{kDisplayName, name.value_or("")},
+                    {kModelName, std::move(modelName)},
+                    {kBonjourServiceType, types.value_or(Array())},
+                    {kUSBManufacturer, manufacturer.value_or("")},
+                    {kUSBModel, model.value_or("")},
+                    {kLocation, note.value_or("")},
+                    {kDeviceURI, uri.value_or("")},
+                    {kIPAddressList, std::move(addresses)}};
 }
 
 }  // namespace onramp

@@ -3,8 +3,8 @@
 #include <optional>
 #include <string_view>
 
+#include "base/value.h"
 #include "platform/net_service.h"
-#include "platform/value.h"
 
 namespace onramp {
 

@@ -1,9 +1,9 @@
 #include <string_view>
 
+#include "base/ascii.h"
+#include "base/text.h"
 #include "bonjour/KSNetService.h"
 #include "bonjour/txt_record.h"
-#include "bonjour/utf8.h"
-#include "media/text_order.h"
 
 namespace onramp {
 
@@ -28,7 +28,7 @@ std::optional<std::string> textUnder(const NetServiceRef& service, std::string_v
   const auto record = TxtRecord::parse(*data);
   if (!record) return std::nullopt;
   auto value = record->value(key);
-  if (value && !isUtf8(*value)) return std::nullopt;
+  if (value && !isUTF8(*value)) return std::nullopt;
   return value;
 }
 
@@ -55,7 +55,7 @@ std::optional<std::string> KSNetServiceCopyNote(const NetServiceRef& service) {
 
 bool KSNetServiceSupportsURF(const NetServiceRef& service) {
   const auto languages = service ? textUnder(service, "pdl") : std::nullopt;
-  return languages && lowercased(*languages).find("image/urf") != std::string::npos;
+  return languages && asciiLowercased(*languages).find("image/urf") != std::string::npos;
 }
 
 }  // namespace onramp

@@ -2,7 +2,8 @@
 
 #include <algorithm>
 
-#include "bonjour/utf8.h"
+#include "base/ascii.h"
+#include "base/text.h"
 
 namespace onramp {
 
@@ -12,23 +13,12 @@ constexpr std::string_view kAuthorityStart = "://";
 constexpr std::string_view kLocalDomain = "local.";
 constexpr std::size_t kProtocolLabelLength = 5;
 
-bool isLetterOrDigit(char c) {
-  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9');
-}
-
 bool staysInName(char c) {
-  return isLetterOrDigit(c) || std::string_view("-_.!~*'$").find(c) != std::string_view::npos;
+  return isASCIILetterOrDigit(c) || std::string_view("-_.!~*'$").find(c) != std::string_view::npos;
 }
 
 bool mayBeInURL(char c) {
   return c > ' ' && c < 0x7f && std::string_view("\"<>\\^`{|}").find(c) == std::string_view::npos;
-}
-
-std::optional<unsigned> hexDigit(char c) {
-  if (c >= '0' && c <= '9') return static_cast<unsigned>(c - '0');
-  if (c >= 'A' && c <= 'F') return static_cast<unsigned>(c - 'A') + 10;
-  if (c >= 'a' && c <= 'f') return static_cast<unsigned>(c - 'a') + 10;
-  return std::nullopt;
 }
 
 }  // namespace
@@ -60,13 +50,13 @@ std::optional<std::string> percentUnescaped(std::string_view text) {
       continue;
     }
     if (text.size() < 3) return std::nullopt;
-    const auto high = hexDigit(text[1]);
-    const auto low = hexDigit(text[2]);
+    const auto high = hexDigitValue(text[1]);
+    const auto low = hexDigitValue(text[2]);
     if (!high || !low) return std::nullopt;
     plain += static_cast<char>(*high << 4U | *low);
     text.remove_prefix(3);
   }
-  if (!isUtf8(plain)) return std::nullopt;
+  if (!isUTF8(plain)) return std::nullopt;
   return plain;
 }
 

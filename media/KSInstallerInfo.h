@@ -3,7 +3,7 @@
 #include <optional>
 #include <string>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 namespace onramp {
 

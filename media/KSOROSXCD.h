@@ -5,7 +5,7 @@
 #include <string_view>
 #include <vector>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 namespace onramp {
 

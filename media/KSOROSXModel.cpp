@@ -20,7 +20,7 @@ Dictionary KSOROSXModel::initWithName(const std::optional<std::string>& name,
   const auto models = modelInfoPlist ? modelInfoPlist->dictionary("Model") : std::nullopt;
   const auto entry = models ? models->dictionary(*name) : std::nullopt;
 
-  std::vector<Dictionary::Pair> pairs{{std::string(kName), *name}};
+  std::vector<Dictionary::Pair> pairs{{kName, *name}};
   Value identifier = "";
   Dictionary interfaces;
   if (entry) {

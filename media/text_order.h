@@ -9,7 +9,4 @@ namespace onramp {
 /// compare by code point. Texts that differ in case only keep their order.
 void sortIgnoringCase(std::vector<std::string>& texts);
 
-/// The text with the letters A to Z made small; other characters stay as they are.
-[[nodiscard]] std::string lowercased(std::string text);
-
 }  // namespace onramp

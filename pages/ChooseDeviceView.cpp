@@ -3,11 +3,11 @@
 #include <algorithm>
 #include <utility>
 
+#include "base/notification_center.h"
 #include "bonjour/KSDevice.h"
 #include "media/CommonMessage.h"
 #include "media/KSInstallerInfo.h"
 #include "platform/bundle.h"
-#include "platform/notification_center.h"
 #include "platform/run_loop.h"
 #include "snmp/query.h"
 

@@ -7,11 +7,11 @@
 #include <string_view>
 #include <vector>
 
+#include "base/array_controller.h"
+#include "base/value.h"
 #include "bonjour/KSBonjourSearch.h"
 #include "pages/page.h"
-#include "platform/array_controller.h"
 #include "platform/outlets.h"
-#include "platform/value.h"
 
 namespace onramp {
 

@@ -3,18 +3,11 @@
 #include <memory>
 #include <string>
 
+#include "media/connection_type.h"
 #include "pages/page.h"
 #include "platform/outlets.h"
 
 namespace onramp {
-
-/// The interfaces that a model, or all models of the medium, support besides wireless.
-enum class ConnectionType : unsigned char {
-  kNeither = 0,  ///< neither USB nor wired Ethernet, or the models disagree
-  kEthernet = 2,
-  kUSB = 3,
-  kUSBAndEthernet = 4,
-};
 
 /// The page that asks how the device is connected. Made anew each time it is shown.
 class ConnectionTypeView final : public Page {

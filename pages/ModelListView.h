@@ -4,8 +4,8 @@
 #include <optional>
 #include <string>
 
+#include "base/array_controller.h"
 #include "pages/page.h"
-#include "platform/array_controller.h"
 #include "platform/outlets.h"
 
 namespace onramp {

@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 namespace onramp {
 

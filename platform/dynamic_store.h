@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 /// The system's dynamic configuration store: what the computer's network is at this moment, as
 /// dictionaries under keys such as "State:/Network/Interface/en0/IPv4". Every operation stands for

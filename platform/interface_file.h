@@ -4,7 +4,7 @@
 #include <string>
 #include <string_view>
 
-#include "platform/key_value.h"
+#include "base/key_value.h"
 #include "platform/outlets.h"
 
 namespace onramp {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/value.h"
+#include "base/value.h"
 #include "snmp/query.h"
 
 namespace onramp {

@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/value.h"
+#include "base/value.h"
 #include "snmp/records.h"
 #include "snmp/status.h"
 #include "snmp/transport.h"

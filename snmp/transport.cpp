@@ -3,7 +3,7 @@
 #include <chrono>
 #include <string_view>
 
-#include "platform/value.h"
+#include "base/value.h"
 #include "snmp/ber_writer.h"
 #include "snmp/codec.h"
 

@@ -8,11 +8,11 @@
 #include <string>
 #include <vector>
 
+#include "base/value.h"
 #include "platform/avahi/browse_job.h"
 #include "platform/avahi/handles.h"
 #include "platform/avahi/job.h"
 #include "platform/avahi/loop.h"
-#include "platform/value.h"
 
 namespace onramp::avahi {
 

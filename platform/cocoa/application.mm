@@ -5,7 +5,7 @@
 #include "platform/bundle.h"
 #import "platform/cocoa/native.h"
 #import "platform/cocoa/retained.h"
-#import "platform/cocoa/termination.h"
+#include "platform/termination.h"
 
 /// Forwards the application's and the window's events and questions to the controller.
 @interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
@@ -38,7 +38,7 @@
 }
 
 - (void)applicationWillTerminate:(NSNotification*)notification {
-  onramp::cocoa::wakeSleepersForTermination();
+  onramp::beginTermination();
 }
 
 - (BOOL)windowShouldClose:(NSWindow*)window {

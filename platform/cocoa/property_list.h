@@ -4,7 +4,7 @@
 
 #include <optional>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 namespace onramp::cocoa {
 

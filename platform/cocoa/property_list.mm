@@ -10,15 +10,11 @@ namespace onramp {
 
 namespace {
 
-constexpr unsigned long long kMostBytes = 16U << 20U;
-constexpr int kDeepestNesting = 128;
-constexpr int kMostObjects = 1 << 18;
-
 // Converts a property list to a value, within the limits.
 class Reader {
  public:
-  std::optional<Value> read(id object, int depth) {
-    if (depth > kDeepestNesting || ++objects_ > kMostObjects) isExceeded_ = true;
+  std::optional<Value> read(id object, std::size_t depth) {
+    if (depth > kMostPropertyListDepth || ++objects_ > kMostPropertyListObjects) isExceeded_ = true;
     if (isExceeded_) return std::nullopt;
     if ([object isKindOfClass:[NSString class]]) return string(object);
     if ([object isKindOfClass:[NSNumber class]]) return number(object);
@@ -47,9 +43,9 @@ class Reader {
   }
 
   // Objects may share texts and data but values copy them, so the copies are limited like a file.
-  bool takes(unsigned long long bytes) {
+  bool takes(std::size_t bytes) {
     bytes_ += bytes;
-    if (bytes_ > kMostBytes) isExceeded_ = true;
+    if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;
     return !isExceeded_;
   }
 
@@ -66,7 +62,7 @@ class Reader {
 
   // Leaves out what is no property-list object: systems have put an NSURL into the information
   // dictionaries of bundles.
-  std::optional<Value> array(NSArray* array, int depth) {
+  std::optional<Value> array(NSArray* array, std::size_t depth) {
     Array values;
     for (id object in array) {
       std::optional<Value> value = read(object, depth + 1);
@@ -76,7 +72,7 @@ class Reader {
     return Value(std::move(values));
   }
 
-  std::optional<Value> dictionary(NSDictionary* dictionary, int depth) {
+  std::optional<Value> dictionary(NSDictionary* dictionary, std::size_t depth) {
     std::vector<Dictionary::Pair> pairs;
     for (id key in dictionary) {
       std::optional<Value> value = read([dictionary objectForKey:key], depth + 1);
@@ -88,8 +84,8 @@ class Reader {
     return Value(Dictionary(std::move(pairs)));
   }
 
-  int objects_ = 0;
-  unsigned long long bytes_ = 0;
+  std::uint64_t objects_ = 0;
+  std::size_t bytes_ = 0;
   bool isExceeded_ = false;
 };
 
@@ -127,7 +123,9 @@ NSData* contents(NSString* path) {
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file
                                                                                     error:nullptr];
   const bool isFile = [[attributes fileType] isEqualToString:NSFileTypeRegular];
-  return isFile && [attributes fileSize] <= kMostBytes ? [NSData dataWithContentsOfFile:file] : nil;
+  return isFile && [attributes fileSize] <= kMostPropertyListBytes
+             ? [NSData dataWithContentsOfFile:file]
+             : nil;
 }
 
 }  // namespace

@@ -2,16 +2,11 @@
 
 #import <AppKit/AppKit.h>
 
-#include <chrono>
-#include <condition_variable>
-#include <memory>
-#include <mutex>
 #include <utility>
 
 #include "platform/application.h"
 #import "platform/cocoa/action.h"
 #import "platform/cocoa/native.h"
-#import "platform/cocoa/termination.h"
 
 namespace onramp {
 
@@ -20,18 +15,6 @@ namespace {
 NSArray* allModes() {
   return [NSArray arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode,
                                    NSEventTrackingRunLoopMode, nil];
-}
-
-struct Termination {
-  std::mutex mutex;
-  std::condition_variable changed;
-  bool asked = false;
-};
-
-// Never destroyed: the process may exit while a thread still sleeps.
-Termination& termination() {
-  static Termination* const instance = std::make_unique<Termination>().release();
-  return *instance;
 }
 
 // Whether the running modal loop was asked to end. Main thread only.
@@ -60,18 +43,6 @@ void wakeEventLoop() {
 }
 
 }  // namespace
-
-namespace cocoa {
-
-void wakeSleepersForTermination() {
-  {
-    const std::lock_guard lock(termination().mutex);
-    termination().asked = true;
-  }
-  termination().changed.notify_all();
-}
-
-}  // namespace cocoa
 
 void scheduleTimer(double seconds, std::function<void()> action) {
   NSTimer* const timer = [NSTimer timerWithTimeInterval:seconds
@@ -109,12 +80,6 @@ void abortModal() {
     [NSApp stopModalWithCode:NSModalResponseAbort];
     wakeEventLoop();
   });
-}
-
-bool sleepOffMainThread(std::uint32_t seconds) {
-  std::unique_lock lock(termination().mutex);
-  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
-                                         [] { return termination().asked; });
 }
 
 }  // namespace onramp

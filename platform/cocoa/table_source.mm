@@ -1,6 +1,6 @@
 #import "platform/cocoa/table_source.h"
 
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 #import "platform/cocoa/text.h"
 
 @implementation OnrampTableSource

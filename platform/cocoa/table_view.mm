@@ -1,4 +1,4 @@
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 #import "platform/cocoa/native.h"
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/table_source.h"

@@ -5,8 +5,8 @@
 #include <string_view>
 #include <vector>
 
+#include "base/value.h"
 #include "platform/corefoundation/reference.h"
-#include "platform/value.h"
 
 namespace onramp::corefoundation {
 

@@ -4,6 +4,8 @@
 #include <array>
 #include <utility>
 
+#include "base/ascii.h"
+
 namespace onramp {
 
 namespace {
@@ -25,25 +27,6 @@ constexpr std::array kRenamed = {
     Renamed{"hebrew", "he"},    Renamed{"thai", "th"},    Renamed{"ukrainian", "uk"},
     Renamed{"iw", "he"},        Renamed{"in", "id"}};
 
-bool isLetter(char c) {
-  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
-}
-
-char small(char c) {
-  return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
-
-char capital(char c) {
-  return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
-}
-
-template <typename Convert>
-std::string converted(std::string_view text, Convert convert) {
-  std::string result(text);
-  std::transform(result.begin(), result.end(), result.begin(), convert);
-  return result;
-}
-
 std::string_view takePart(std::string_view& identifier) {
   const std::size_t end = std::min(identifier.find_first_of("-_"), identifier.size());
   const std::string_view part = identifier.substr(0, end);
@@ -52,12 +35,12 @@ std::string_view takePart(std::string_view& identifier) {
 }
 
 std::string codeOf(std::string_view name) {
-  std::string code = converted(name, small);
+  std::string code = asciiLowercased(std::string(name));
   for (const Renamed& renamed : kRenamed) {
     if (code == renamed.from) code = renamed.to;
   }
-  const bool valid =
-      (code.size() == 2 || code.size() == 3) && std::all_of(code.begin(), code.end(), isLetter);
+  const bool valid = (code.size() == 2 || code.size() == 3) &&
+                     std::all_of(code.begin(), code.end(), isASCIILetter);
   return valid ? code : std::string();
 }
 
@@ -104,12 +87,12 @@ Language Language::parse(std::string_view identifier) {
   language.code = codeOf(takePart(identifier));
   while (!identifier.empty()) {
     const std::string_view part = takePart(identifier);
-    if (!std::all_of(part.begin(), part.end(), isLetter)) continue;
+    if (!std::all_of(part.begin(), part.end(), isASCIILetter)) continue;
     if (part.size() == 4) {
-      language.script = converted(part, small);
-      language.script[0] = capital(language.script[0]);
+      language.script = asciiLowercased(std::string(part));
+      language.script[0] = asciiUppercased(language.script[0]);
     }
-    if (part.size() == 2) language.region = converted(part, capital);
+    if (part.size() == 2) language.region = asciiUppercased(std::string(part));
   }
   if (language.code == "zh" && language.script.empty()) {
     language.script = chineseScript(language.region);

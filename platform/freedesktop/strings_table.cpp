@@ -5,10 +5,10 @@
 #include <utility>
 #include <vector>
 
-#include "platform/libplist/file.h"
-#include "platform/libplist/limits.h"
+#include "base/ascii.h"
+#include "base/text.h"
+#include "platform/posix/file.h"
 #include "platform/property_list.h"
-#include "platform/text.h"
 
 namespace onramp {
 
@@ -32,17 +32,9 @@ bool isOctal(char c) {
   return c >= '0' && c <= '7';
 }
 
-std::optional<char32_t> hexadecimal(char c) {
-  if (c >= '0' && c <= '9') return c - '0';
-  if (c >= 'a' && c <= 'f') return c - 'a' + 10;
-  if (c >= 'A' && c <= 'F') return c - 'A' + 10;
-  return std::nullopt;
-}
-
 bool isWordCharacter(char c) {
   constexpr std::string_view kPunctuation = "_$/:.-";
-  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') ||
-         kPunctuation.find(c) != std::string_view::npos;
+  return isASCIILetterOrDigit(c) || kPunctuation.find(c) != std::string_view::npos;
 }
 
 class Parser {
@@ -53,7 +45,7 @@ class Parser {
     const bool braces = skipBlanks() && take('{');
     std::vector<Dictionary::Pair> pairs;
     while (skipBlanks() && !rest_.empty() && rest_.front() != '}') {
-      if (pairs.size() == libplist::kMostObjects || !entry(pairs)) return std::nullopt;
+      if (pairs.size() == kMostPropertyListObjects || !entry(pairs)) return std::nullopt;
     }
     if (braces && !take('}')) return std::nullopt;
     if (!skipBlanks() || !rest_.empty()) return std::nullopt;
@@ -152,14 +144,11 @@ class Parser {
   // One UTF-16 unit of up to four digits, or two that belong together.
   char32_t unicode() {
     const char32_t first = unit();
-    const bool lead = first >= 0xD800 && first <= 0xDBFF;
-    if (!lead || !rest_.starts_with("\\U")) return first;
+    if (!isLeadSurrogate(first) || !rest_.starts_with("\\U")) return first;
     const std::string_view before = rest_;
     rest_.remove_prefix(2);
     const char32_t second = unit();
-    if (second >= 0xDC00 && second <= 0xDFFF) {
-      return 0x10000 + ((first - 0xD800) << 10) + (second - 0xDC00);
-    }
+    if (isTrailSurrogate(second)) return joinedSurrogates(first, second);
     rest_ = before;
     return kReplacementCharacter;
   }
@@ -167,7 +156,7 @@ class Parser {
   char32_t unit() {
     char32_t code = 0;
     for (int i = 0; i < 4 && !rest_.empty(); ++i) {
-      const auto digit = hexadecimal(rest_.front());
+      const auto digit = hexDigitValue(rest_.front());
       if (!digit) break;
       code = code << 4 | *digit;
       rest_.remove_prefix(1);
@@ -185,7 +174,7 @@ std::optional<Dictionary> parseStrings(std::string_view text) {
 }
 
 std::optional<Dictionary> loadStringsTable(const std::string& path) {
-  const auto bytes = libplist::readFile(path, libplist::kMostBytes);
+  const auto bytes = posix::readFile(path, kMostPropertyListBytes);
   if (!bytes) return std::nullopt;
   if (bytes->starts_with("bplist")) return loadDictionary(path);
   const auto text = decodedText(*bytes);

@@ -3,8 +3,8 @@
 #include <algorithm>
 #include <vector>
 
-#include "platform/libplist/cursor.h"
-#include "platform/libplist/limits.h"
+#include "base/byte_reader.h"
+#include "platform/property_list.h"
 
 namespace onramp::libplist {
 
@@ -42,7 +42,8 @@ struct Cost {
   }
 
   [[nodiscard]] bool withinLimits() const {
-    return objects <= kMostObjects && bytes <= kMostBytes && depth <= kMostDepth;
+    return objects <= kMostPropertyListObjects && bytes <= kMostPropertyListBytes &&
+           depth <= kMostPropertyListDepth;
   }
 };
 
@@ -56,19 +57,21 @@ class BinaryWalk {
 
   bool run() {
     if (bytes_.size() < kHeader.size() + kTrailerSize || !bytes_.starts_with(kHeader)) return false;
-    Cursor trailer(bytes_, bytes_.size() - kTrailerSize + 6);
+    ByteReader trailer(bytes_.substr(bytes_.size() - kTrailerSize + 6));
     const std::uint64_t offsetSize = trailer.number(1).value_or(0);
     const std::uint64_t referenceSize = trailer.number(1).value_or(0);
     const std::uint64_t objects = trailer.number(8).value_or(0);
     const std::uint64_t root = trailer.number(8).value_or(0);
     const std::uint64_t table = trailer.number(8).value_or(0);
-    if (!isNumberSize(offsetSize) || !isNumberSize(referenceSize) || objects > kMostObjects ||
-        table < kHeader.size() || table > bytes_.size() - kTrailerSize) {
+    if (!isNumberSize(offsetSize) || !isNumberSize(referenceSize) ||
+        objects > kMostPropertyListObjects || table < kHeader.size() ||
+        table > bytes_.size() - kTrailerSize) {
       return false;
     }
     referenceSize_ = static_cast<std::size_t>(referenceSize);
     objects_ = bytes_.substr(0, static_cast<std::size_t>(table));
-    Cursor offsets(bytes_.substr(0, bytes_.size() - kTrailerSize), table);
+    ByteReader offsets(
+        bytes_.substr(objects_.size(), bytes_.size() - kTrailerSize - objects_.size()));
     offsets_.reserve(static_cast<std::size_t>(objects));
     for (std::uint64_t i = 0; i < objects; ++i) {
       const auto offset = offsets.number(static_cast<std::size_t>(offsetSize));
@@ -86,31 +89,37 @@ class BinaryWalk {
     Cost cost;
   };
 
+  // Over the object and all that follows it; empty when its offset lies outside the file.
+  [[nodiscard]] ByteReader objectAt(std::size_t index) const {
+    const std::uint64_t offset = offsets_[index];
+    return ByteReader(objects_.substr(std::min<std::uint64_t>(offset, objects_.size())));
+  }
+
   // Fills in the object's cost; false when the object is not to be built. Recursion ends at the
   // depth limit.
   bool visit(std::size_t index, std::size_t depth) {
     State& state = states_[index];
-    if (state.progress == Progress::kOpen || depth > kMostDepth) return false;
+    if (state.progress == Progress::kOpen || depth > kMostPropertyListDepth) return false;
     if (state.progress == Progress::kDone) return true;
     state.progress = Progress::kOpen;
-    Cursor object(objects_, offsets_[index]);
-    const auto marker = object.number(1);
-    if (!marker || !measure(*marker >> 4, *marker & 0xF, object, state.cost, depth)) return false;
+    ByteReader object = objectAt(index);
+    const auto marker = object.byte();
+    if (!marker || !measure(*marker >> 4U, *marker & 0xFU, object, state.cost, depth)) return false;
     state.progress = Progress::kDone;
     return state.cost.withinLimits();
   }
 
-  bool measure(std::uint64_t kind, std::uint64_t low, Cursor& object, Cost& cost,
+  bool measure(std::uint64_t kind, std::uint64_t low, ByteReader& object, Cost& cost,
                std::size_t depth) {
     switch (kind) {
       case kSimple:
         return low == 0x8 || low == 0x9;  // false and true; null has no place in a list
       case kInteger:
-        return low <= 4 && object.take(std::uint64_t{1} << low);
+        return low <= 4 && object.skip(std::uint64_t{1} << low);
       case kReal:
-        return (low == 2 || low == 3) && object.take(std::uint64_t{1} << low);
+        return (low == 2 || low == 3) && object.skip(std::uint64_t{1} << low);
       case kDate:
-        return low == 3 && object.take(8);
+        return low == 3 && object.skip(8);
       case kUID:
         return isNumberSize(low + 1) &&
                object.number(static_cast<std::size_t>(low) + 1).value_or(UINT64_MAX) <= UINT32_MAX;
@@ -130,23 +139,23 @@ class BinaryWalk {
   }
 
   // The count of a container's items or of a text's units; an impossible one when it is malformed.
-  static std::uint64_t count(std::uint64_t low, Cursor& object) {
+  static std::uint64_t count(std::uint64_t low, ByteReader& object) {
     if (low < 0xF) return low;
     const std::uint64_t marker = object.number(1).value_or(0);
     if (marker >> 4 != kInteger || (marker & 0xF) > 3) return UINT64_MAX;
     return object.number(std::size_t{1} << (marker & 0xF)).value_or(UINT64_MAX);
   }
 
-  static bool measureBytes(std::uint64_t units, std::uint64_t unitSize, Cursor& object,
+  static bool measureBytes(std::uint64_t units, std::uint64_t unitSize, ByteReader& object,
                            Cost& cost) {
-    if (units > kMostBytes) return false;
+    if (units > kMostPropertyListBytes) return false;
     cost.bytes = units * unitSize;
-    return object.take(cost.bytes).has_value();
+    return object.skip(cost.bytes);
   }
 
   // libplist ends the process at a key with a null character in it.
-  static bool measureUTF16(std::uint64_t units, Cursor& object, Cost& cost) {
-    Cursor text = object;
+  static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
+    ByteReader text = object;
     if (!measureBytes(units, 2, object, cost)) return false;
     for (std::uint64_t i = 0; i < units; ++i) {
       if (text.number(2) == 0U) return false;
@@ -154,8 +163,8 @@ class BinaryWalk {
     return true;
   }
 
-  bool measureItems(std::uint64_t items, Cursor& object, Cost& cost, std::size_t depth) {
-    if (items > kMostObjects) return false;
+  bool measureItems(std::uint64_t items, ByteReader& object, Cost& cost, std::size_t depth) {
+    if (items > kMostPropertyListObjects) return false;
     for (std::uint64_t i = 0; i < items; ++i) {
       const auto item = object.number(referenceSize_);
       if (!item || *item >= states_.size()) return false;
@@ -167,15 +176,15 @@ class BinaryWalk {
     return true;
   }
 
-  bool measureEntries(std::uint64_t entries, Cursor& object, Cost& cost, std::size_t depth) {
-    Cursor keys = object;
-    for (std::uint64_t i = 0; i < std::min(entries, kMostObjects); ++i) {
+  bool measureEntries(std::uint64_t entries, ByteReader& object, Cost& cost, std::size_t depth) {
+    ByteReader keys = object;
+    for (std::uint64_t i = 0; i < std::min(entries, kMostPropertyListObjects); ++i) {
       const auto key = keys.number(referenceSize_);
       if (!key || *key >= states_.size()) return false;
-      const auto marker = Cursor(objects_, offsets_[static_cast<std::size_t>(*key)]).number(1);
-      if (!marker || (*marker >> 4 != kASCII && *marker >> 4 != kUTF16)) return false;
+      const auto marker = objectAt(static_cast<std::size_t>(*key)).byte();
+      if (!marker || (*marker >> 4U != kASCII && *marker >> 4U != kUTF16)) return false;
     }
-    return entries <= kMostObjects && measureItems(2 * entries, object, cost, depth);
+    return entries <= kMostPropertyListObjects && measureItems(2 * entries, object, cost, depth);
   }
 
   std::string_view bytes_;
@@ -188,7 +197,7 @@ class BinaryWalk {
 }  // namespace
 
 bool mayReadBinary(std::string_view bytes) {
-  return bytes.size() <= kMostBytes && BinaryWalk(bytes).run();
+  return bytes.size() <= kMostPropertyListBytes && BinaryWalk(bytes).run();
 }
 
 }  // namespace onramp::libplist

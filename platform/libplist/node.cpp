@@ -8,8 +8,8 @@
 #include <string>
 #include <string_view>
 
-#include "platform/libplist/cursor.h"
-#include "platform/text.h"
+#include "base/byte_reader.h"
+#include "base/text.h"
 
 namespace onramp::libplist {
 
@@ -69,7 +69,9 @@ Value integerOf(plist_t node) {
 
 Value dateOf(plist_t node) {
   const std::string object = objectOf(node);
-  return Date{std::bit_cast<double>(Cursor(object, 1).number(8).value_or(0))};
+  ByteReader reader(object);
+  const bool hasMarker = reader.skip(1);
+  return Date{std::bit_cast<double>(hasMarker ? reader.number(8).value_or(0) : 0)};
 }
 
 Value dataOf(plist_t node) {

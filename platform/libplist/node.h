@@ -5,7 +5,7 @@
 #include <memory>
 #include <type_traits>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 namespace onramp::libplist {
 

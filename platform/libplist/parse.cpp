@@ -6,10 +6,10 @@
 #include <memory>
 #include <type_traits>
 
+#include "base/text.h"
 #include "platform/libplist/binary_gate.h"
 #include "platform/libplist/node.h"
 #include "platform/libplist/xml_gate.h"
-#include "platform/text.h"
 
 namespace onramp::libplist {
 

@@ -2,14 +2,14 @@
 
 #include <utility>
 
-#include "platform/libplist/file.h"
-#include "platform/libplist/limits.h"
 #include "platform/libplist/parse.h"
+#include "platform/posix/file.h"
+#include "platform/property_list.h"
 
 namespace onramp {
 
 std::optional<Dictionary> loadDictionary(const std::string& path) {
-  std::optional<std::string> bytes = libplist::readFile(path, libplist::kMostBytes);
+  std::optional<std::string> bytes = posix::readFile(path, kMostPropertyListBytes);
   const auto value = bytes ? libplist::parsePropertyList(std::move(*bytes)) : std::nullopt;
   const auto* const dictionary = value ? value->as<Dictionary>() : nullptr;
   return dictionary ? std::optional(*dictionary) : std::nullopt;
@@ -17,7 +17,7 @@ std::optional<Dictionary> loadDictionary(const std::string& path) {
 
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path) {
   const std::string xml = libplist::formatPropertyList(dictionary);
-  return !xml.empty() && libplist::writeFileAtomically(path, xml);
+  return !xml.empty() && posix::writeFileAtomically(path, xml);
 }
 
 }  // namespace onramp

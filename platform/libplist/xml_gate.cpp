@@ -5,13 +5,18 @@
 #include <string_view>
 #include <vector>
 
-#include "platform/libplist/limits.h"
+#include "platform/property_list.h"
 
 namespace onramp::libplist {
 
 namespace {
 
 constexpr std::size_t kNone = std::string::npos;
+
+// Steps that libplist may spend where its time grows with a square: on the keys of a dictionary (it
+// hashes them into a fixed number of chains) and on the entities of a text (it moves the rest of
+// the text up at each).
+constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XmlWalk {
  public:
@@ -65,12 +70,12 @@ class XmlWalk {
     std::string_view name = skipped_.substr(0, skipped_.find_first_of(" \t\r\n"));
     if (name.ends_with('/')) name.remove_suffix(1);
     if (name.starts_with('/')) return close(name.substr(1));
-    if (++objects_ > kMostObjects) return false;
+    if (++objects_ > kMostPropertyListObjects) return false;
     if (name == "key" && !containers_.empty()) ++containers_.back().keys;
     if (name == "integer" && !empty) blankLeadingZeros();
     if (empty || !isContainer(name)) return true;
     containers_.push_back({start_, name.size(), 0});
-    return containers_.size() <= kMostDepth + 1;  // the outermost is <plist>
+    return containers_.size() <= kMostPropertyListDepth + 1;  // the outermost is <plist>
   }
 
   static bool isContainer(std::string_view name) {
@@ -119,7 +124,7 @@ class XmlWalk {
 }  // namespace
 
 bool mayReadXML(std::string& text) {
-  return text.size() <= kMostBytes && XmlWalk(text).run();
+  return text.size() <= kMostPropertyListBytes && XmlWalk(text).run();
 }
 
 }  // namespace onramp::libplist

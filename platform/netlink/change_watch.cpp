@@ -38,12 +38,12 @@ std::unique_ptr<ChangeWatch> ChangeWatch::create(bool withRoutes) {
     return nullptr;
   }
   std::unique_ptr<ChangeWatch> watch(new ChangeWatch(std::move(socket)));
-  return watch->stop_.number() < 0 ? nullptr : std::move(watch);
+  return watch->stop_ ? std::move(watch) : nullptr;
 }
 
 ChangeWatch::~ChangeWatch() {
   if (!thread_.joinable()) return;
-  ::eventfd_write(stop_.number(), 1);
+  ::eventfd_write(stop_.get(), 1);
   thread_.join();
 }
 
@@ -54,7 +54,7 @@ void ChangeWatch::start(std::function<void()> changed) {
 void ChangeWatch::run(const std::function<void()>& changed) const {
   const int socket = nl_socket_get_fd(socket_.get());
   std::array<pollfd, 2> waited{{{.fd = socket, .events = POLLIN, .revents = 0},
-                                {.fd = stop_.number(), .events = POLLIN, .revents = 0}}};
+                                {.fd = stop_.get(), .events = POLLIN, .revents = 0}}};
   for (;;) {
     if (::poll(waited.data(), waited.size(), -1) < 0) {
       if (errno == EINTR) continue;

@@ -5,6 +5,7 @@
 #include <thread>
 
 #include "platform/netlink/handles.h"
+#include "platform/posix/descriptor.h"
 
 namespace onramp::netlink {
 
@@ -28,7 +29,7 @@ class ChangeWatch {
   void run(const std::function<void()>& changed) const;
 
   Socket socket_;
-  Descriptor stop_;
+  posix::Descriptor stop_;
   std::thread thread_;
 };
 

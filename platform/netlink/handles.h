@@ -2,7 +2,6 @@
 
 #include <netlink/object.h>
 #include <netlink/socket.h>
-#include <unistd.h>
 
 #include <memory>
 
@@ -18,23 +17,6 @@ struct Release {
 
 using Socket = std::unique_ptr<nl_sock, Release<nl_socket_free>>;
 using Object = std::unique_ptr<nl_object, Release<nl_object_put>>;
-
-/// Owns a file descriptor.
-class Descriptor {
- public:
-  explicit Descriptor(int number) : number_(number) {}
-  Descriptor(const Descriptor&) = delete;
-  Descriptor& operator=(const Descriptor&) = delete;
-  ~Descriptor() {
-    if (number_ >= 0) ::close(number_);
-  }
-
-  /// Negative when there is none.
-  [[nodiscard]] int number() const { return number_; }
-
- private:
-  int number_;
-};
 
 /// A new socket that speaks to the kernel's routing subsystem; null on failure.
 [[nodiscard]] Socket openRouteSocket();

@@ -112,8 +112,8 @@ struct Interface {
   }
 
   [[nodiscard]] Dictionary state() const {
-    const Dictionary state{{std::string(kSCPropNetIPv4Addresses), addresses},
-                           {std::string(kSCPropNetIPv4SubnetMasks), masks}};
+    const Dictionary state{{kSCPropNetIPv4Addresses, addresses},
+                           {kSCPropNetIPv4SubnetMasks, masks}};
     return broadcasts.empty() ? state : state.with(kSCPropNetIPv4BroadcastAddresses, broadcasts);
   }
 };
@@ -177,7 +177,7 @@ std::optional<Dictionary> readIPv4State(nl_sock* socket, bool withGlobal) {
     }
     if (primary == index) {
       state.emplace_back(*createNetworkGlobalEntityKey(kSCDynamicStoreDomainState, kSCEntNetIPv4),
-                         Dictionary{{std::string(kSCDynamicStorePropNetPrimaryInterface), name}});
+                         Dictionary{{kSCDynamicStorePropNetPrimaryInterface, name}});
     }
   }
   return Dictionary(std::move(state));

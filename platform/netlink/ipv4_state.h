@@ -2,8 +2,8 @@
 
 #include <optional>
 
+#include "base/value.h"
 #include "platform/netlink/handles.h"
-#include "platform/value.h"
 
 namespace onramp::netlink {
 

@@ -45,7 +45,7 @@ std::optional<Dictionary> Selection::read(nl_sock* socket) const {
   if (!state) return std::nullopt;
   std::vector<Dictionary::Pair> meant;
   std::copy_if(state->begin(), state->end(), std::back_inserter(meant),
-               [&](const Dictionary::Pair& pair) { return has(pair.first); });
+               [&](const Dictionary::Pair& pair) { return has(pair.key); });
   return Dictionary(std::move(meant));
 }
 

@@ -11,11 +11,12 @@
 #include <vector>
 
 #include "platform/bundle.h"
-#include "platform/freedesktop/stand_in_system.h"
 #include "platform/qt/loops.h"
 #include "platform/qt/main_window.h"
 #include "platform/qt/native.h"
 #include "platform/run_loop.h"
+#include "platform/standin/stand_in_system.h"
+#include "platform/termination.h"
 
 namespace onramp {
 
@@ -89,7 +90,7 @@ int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
 
   performOnMainThread([&delegate] {
     delegate->applicationWillFinishLaunching();
-    if (!qt::isTerminating()) delegate->applicationDidFinishLaunching();
+    if (!isTerminating()) delegate->applicationDidFinishLaunching();
   });
   return QApplication::exec();
 }

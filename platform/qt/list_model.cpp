@@ -5,7 +5,7 @@
 #include <QSize>
 #include <utility>
 
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 
 namespace onramp::qt {
 

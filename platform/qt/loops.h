@@ -2,9 +2,6 @@
 
 namespace onramp::qt {
 
-/// Whether the application was asked to terminate. Callable from any thread.
-[[nodiscard]] bool isTerminating();
-
 /// Whether a modal loop runs. Main thread only.
 [[nodiscard]] bool isModal();
 

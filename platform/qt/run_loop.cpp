@@ -6,27 +6,15 @@
 #include <atomic>
 #include <chrono>
 #include <cmath>
-#include <condition_variable>
-#include <mutex>
 #include <utility>
 #include <vector>
 
 #include "platform/qt/loops.h"
+#include "platform/termination.h"
 
 namespace onramp {
 
 namespace {
-
-struct Termination {
-  std::mutex mutex;
-  std::condition_variable changed;
-  bool asked = false;
-};
-
-Termination& termination() {
-  static Termination instance;
-  return instance;
-}
 
 // The modal loops that run now, the innermost last. Main thread only.
 std::vector<QEventLoop*>& modalLoops() {
@@ -42,21 +30,12 @@ std::atomic<bool> isAborting = false;
 
 namespace qt {
 
-bool isTerminating() {
-  const std::lock_guard lock(termination().mutex);
-  return termination().asked;
-}
-
 bool isModal() {
   return !modalLoops().empty();
 }
 
 void endAllLoops() {
-  {
-    const std::lock_guard lock(termination().mutex);
-    termination().asked = true;
-  }
-  termination().changed.notify_all();
+  beginTermination();
   QCoreApplication::exit(0);
 }
 
@@ -65,7 +44,7 @@ void endAllLoops() {
 void scheduleTimer(double seconds, std::function<void()> action) {
   const std::chrono::milliseconds delay(std::llround(seconds * 1000));
   QTimer::singleShot(delay, Qt::PreciseTimer, qApp, [action = std::move(action)] {
-    if (!qt::isTerminating()) action();
+    if (!isTerminating()) action();
   });
 }
 
@@ -73,7 +52,7 @@ void performOnMainThread(std::function<void()> action) {
   QMetaObject::invokeMethod(
       qApp,
       [action = std::move(action)]() mutable {
-        if (qt::isTerminating()) return;
+        if (isTerminating()) return;
         if (isAborting && qt::isModal()) {
           performOnMainThread(std::move(action));
         } else {
@@ -85,12 +64,12 @@ void performOnMainThread(std::function<void()> action) {
 
 void runModalForWindow(const Window& window) {
   window.makeKeyAndOrderFront();
-  if (qt::isTerminating()) return;
+  if (isTerminating()) return;
   QEventLoop loop;
   modalLoops().push_back(&loop);
   loop.exec();
   // Clicks and keys that waited while the main thread was busy were meant for what was shown then.
-  if (!qt::isTerminating()) QCoreApplication::processEvents();
+  if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;
 }
@@ -105,12 +84,6 @@ void abortModal() {
     }
   };
   QMetaObject::invokeMethod(qApp, abort, Qt::QueuedConnection);
-}
-
-bool sleepOffMainThread(std::uint32_t seconds) {
-  std::unique_lock lock(termination().mutex);
-  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
-                                         [] { return termination().asked; });
 }
 
 }  // namespace onramp

@@ -3,7 +3,7 @@
 #include <QItemSelectionModel>
 #include <QTreeView>
 
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 #include "platform/outlets.h"
 #include "platform/qt/list_model.h"
 #include "platform/qt/native.h"

@@ -6,8 +6,8 @@
 #include <string>
 
 #include "app/OnrampOSXAppDelegate.h"
+#include "base/array_controller.h"
 #include "pages/ChooseDeviceView.h"
-#include "platform/array_controller.h"
 #include "tests/recording/front_end.h"
 #include "tests/recording/medium_folder.h"
 

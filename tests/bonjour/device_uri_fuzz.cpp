@@ -4,14 +4,14 @@
 #include <cstdlib>
 #include <string>
 
+#include "base/text.h"
 #include "bonjour/device_uri.h"
-#include "bonjour/utf8.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const std::string text(reinterpret_cast<const char*>(data), size);
 
   if (const auto instance = onramp::serviceInstanceOf(text)) {
-    if (instance->domain != "local." || !onramp::isUtf8(instance->name)) std::abort();
+    if (instance->domain != "local." || !onramp::isUTF8(instance->name)) std::abort();
     if (!instance->type.ends_with("_tcp.") && !instance->type.ends_with("_udp.")) std::abort();
   }
   if (const auto host = onramp::hostOfURL(text)) {
@@ -19,7 +19,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   }
 
   const std::string escaped = onramp::percentEscaped(text);
-  const bool utf8 = onramp::isUtf8(text);
+  const bool utf8 = onramp::isUTF8(text);
   if (onramp::percentUnescaped(escaped).has_value() != utf8) std::abort();
   // The dots before the type and in a name are not escaped, so "_tcp" and a dot may come too early.
   const bool ambiguous = text.find('.') != std::string::npos || text.ends_with("_tcp");

@@ -5,8 +5,8 @@
 #include <cstdlib>
 #include <span>
 
+#include "base/text.h"
 #include "bonjour/txt_record.h"
-#include "bonjour/utf8.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const auto bytes = std::as_bytes(std::span(data, size));
@@ -14,7 +14,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     for (const char* key : {"usb_MFG", "mdl", "note", "pdl"}) {
       const auto value = record->value(key);
       if (value && value->size() + std::string_view(key).size() + 1 > 255) std::abort();
-      if (value) static_cast<void>(onramp::isUtf8(*value));
+      if (value) static_cast<void>(onramp::isUTF8(*value));
     }
   }
 

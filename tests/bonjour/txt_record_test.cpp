@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "bonjour/utf8.h"
+#include "base/text.h"
 #include "tests/recording/network.h"
 
 namespace onramp {
@@ -45,12 +45,12 @@ TEST(TxtRecord, DataThatEndsWithinAStringIsNone) {
 TEST(Utf8, TellsWellFormedTextFromOtherBytes) {
   for (const char* text : {"", "plain", "\x7f", "\u0080\u07ff", "\u0800\ud7ff\ue000\uffff",
                            "\U00010000\U0010ffff", "\ufeffmark"}) {
-    EXPECT_TRUE(isUtf8(text)) << text;
+    EXPECT_TRUE(isUTF8(text)) << text;
   }
   for (const char* text :
        {"\x80", "\xc1\xbf", "\xc3", "\xc3(", "\xe0\x9f\xbf", "\xed\xa0\x80", "\xe2\x82",
         "\xe2\x82(", "\xf0\x8f\xbf\xbf", "\xf4\x90\x80\x80", "\xf5\x80\x80\x80", "\xff"}) {
-    EXPECT_FALSE(isUtf8(text)) << text;
+    EXPECT_FALSE(isUTF8(text)) << text;
   }
 }
 

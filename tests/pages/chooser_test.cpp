@@ -1,7 +1,7 @@
 #include <gmock/gmock.h>
 
+#include "base/notification_center.h"
 #include "bonjour/KSDevice.h"
-#include "platform/notification_center.h"
 #include "tests/app/wizard.h"
 #include "tests/recording/agents.h"
 #include "tests/recording/network.h"
@@ -19,10 +19,10 @@ constexpr int kWireless = 2;
 
 Dictionary device(const std::string& name, const Array& addresses = {"192.0.2.1"},
                   const std::string& maker = "Kestrel", const std::string& model = "Model 100") {
-  return Dictionary{{std::string(KSDevice::kDisplayName), name},
-                    {std::string(KSDevice::kUSBManufacturer), maker},
-                    {std::string(KSDevice::kUSBModel), model},
-                    {std::string(KSDevice::kIPAddressList), addresses}};
+  return Dictionary{{KSDevice::kDisplayName, name},
+                    {KSDevice::kUSBManufacturer, maker},
+                    {KSDevice::kUSBModel, model},
+                    {KSDevice::kIPAddressList, addresses}};
 }
 
 class Chooser : public Wizard {

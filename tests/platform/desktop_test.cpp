@@ -7,7 +7,7 @@
 
 #include "platform/child_process.h"
 #include "platform/folders.h"
-#include "platform/freedesktop/stand_in_system.h"
+#include "platform/standin/stand_in_system.h"
 #include "platform/system_version.h"
 #include "platform/user_locale.h"
 #include "platform/workspace.h"

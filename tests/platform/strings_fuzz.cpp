@@ -2,8 +2,8 @@
 #include <cstdint>
 #include <cstdlib>
 
+#include "base/text.h"
 #include "platform/freedesktop/strings_table.h"
-#include "platform/text.h"
 
 // Whatever is read are texts in well-formed UTF-8.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {

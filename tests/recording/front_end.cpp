@@ -4,7 +4,7 @@
 #include <cstdio>
 #include <cstdlib>
 
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 #include "platform/run_loop.h"
 #include "tests/recording/interfaces.h"
 #include "tests/recording/loop.h"

@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/value.h"
+#include "base/value.h"
 #include "tests/recording/temporary_folder.h"
 
 namespace onramp::recording {

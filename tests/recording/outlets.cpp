@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 #include "tests/recording/front_end.h"
 
 namespace onramp {

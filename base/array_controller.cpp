@@ -1,4 +1,4 @@
-#include "platform/array_controller.h"
+#include "base/array_controller.h"
 
 #include <algorithm>
 #include <numeric>

@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-namespace onramp::libplist {
+namespace onramp::posix {
 
 /// The bytes of the regular file at `path`; nothing when it cannot be read, is something else than
 /// a file, or is larger than `most` bytes. Never waits for somebody to write.
@@ -16,4 +16,4 @@ namespace onramp::libplist {
 /// then gone again and what lay at `path` is untouched.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
 
-}  // namespace onramp::libplist
+}  // namespace onramp::posix

@@ -1,4 +1,4 @@
-#include "platform/value.h"
+#include "base/value.h"
 
 #include <algorithm>
 #include <cmath>
@@ -17,7 +17,7 @@ std::int64_t saturated(double number) {
 }
 
 bool keyIsLess(const Dictionary::Pair& pair, std::string_view key) {
-  return pair.first < key;
+  return pair.key < key;
 }
 
 }  // namespace
@@ -48,16 +48,16 @@ Dictionary::Dictionary(std::initializer_list<Pair> pairs)
 
 Dictionary::Dictionary(std::vector<Pair> pairs) {
   std::stable_sort(pairs.begin(), pairs.end(),
-                   [](const Pair& a, const Pair& b) { return a.first < b.first; });
+                   [](const Pair& a, const Pair& b) { return a.key < b.key; });
   pairs.erase(std::unique(pairs.begin(), pairs.end(),
-                          [](const Pair& a, const Pair& b) { return a.first == b.first; }),
+                          [](const Pair& a, const Pair& b) { return a.key == b.key; }),
               pairs.end());
   if (!pairs.empty()) pairs_ = std::make_shared<const std::vector<Pair>>(std::move(pairs));
 }
 
 const Value* Dictionary::find(std::string_view key) const {
   const Pair* const found = std::lower_bound(begin(), end(), key, keyIsLess);
-  return found != end() && found->first == key ? &found->second : nullptr;
+  return found != end() && found->key == key ? &found->value : nullptr;
 }
 
 std::optional<std::string> Dictionary::string(std::string_view key) const {

@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/value.h"
+#include "base/value.h"
 
 namespace onramp {
 

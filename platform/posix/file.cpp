@@ -1,4 +1,4 @@
-#include "platform/libplist/file.h"
+#include "platform/posix/file.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -6,33 +6,12 @@
 
 #include <cerrno>
 #include <cstdio>
-#include <utility>
 
-namespace onramp::libplist {
+#include "platform/posix/descriptor.h"
+
+namespace onramp::posix {
 
 namespace {
-
-class Descriptor {
- public:
-  explicit Descriptor(int number) : number_(number) {}
-  Descriptor(Descriptor&& other) noexcept : number_(std::exchange(other.number_, -1)) {}
-  Descriptor(const Descriptor&) = delete;
-  Descriptor& operator=(const Descriptor&) = delete;
-  Descriptor& operator=(Descriptor&&) = delete;
-  ~Descriptor() { close(); }
-
-  explicit operator bool() const { return number_ >= 0; }
-  [[nodiscard]] int get() const { return number_; }
-
-  /// False when what was written could not be kept after all.
-  bool close() {
-    const int number = std::exchange(number_, -1);
-    return number < 0 || ::close(number) == 0;
-  }
-
- private:
-  int number_;
-};
 
 // A new file of a name that nothing beside `path` has; its access rights follow the user's mask.
 Descriptor createBeside(const std::string& path, std::string& name) {
@@ -45,7 +24,7 @@ Descriptor createBeside(const std::string& path, std::string& name) {
     Descriptor file(open(name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666));
     if (file || errno != EEXIST) return file;
   }
-  return Descriptor(-1);
+  return Descriptor();
 }
 
 bool writeAll(int descriptor, std::string_view bytes) {
@@ -90,4 +69,4 @@ bool writeFileAtomically(const std::string& path, std::string_view bytes) {
   return false;
 }
 
-}  // namespace onramp::libplist
+}  // namespace onramp::posix

@@ -5,8 +5,8 @@
 #include <string_view>
 #include <utility>
 
-#include "platform/freedesktop/stand_in_system.h"
-#include "platform/value.h"
+#include "base/value.h"
+#include "platform/standin/stand_in_system.h"
 
 namespace onramp {
 

@@ -1,4 +1,4 @@
-#include "platform/text.h"
+#include "base/text.h"
 
 #include <algorithm>
 
@@ -7,14 +7,6 @@ namespace onramp {
 namespace {
 
 constexpr std::string_view kUTF8Mark = "\xEF\xBB\xBF";
-
-bool isLeadSurrogate(char32_t unit) {
-  return unit >= 0xD800 && unit <= 0xDBFF;
-}
-
-bool isTrailSurrogate(char32_t unit) {
-  return unit >= 0xDC00 && unit <= 0xDFFF;
-}
 
 unsigned char byteAt(std::string_view bytes, std::size_t index) {
   return static_cast<unsigned char>(bytes[index]);
@@ -39,7 +31,7 @@ std::optional<std::string> fromUTF16(std::string_view bytes, bool bigEndian) {
     if (isTrailSurrogate(character)) return std::nullopt;
     if (isLeadSurrogate(character)) {
       if (++i == units || !isTrailSurrogate(unitAt(i))) return std::nullopt;
-      character = 0x10000 + ((character - 0xD800) << 10) + (unitAt(i) - 0xDC00);
+      character = joinedSurrogates(character, unitAt(i));
     }
     appendUTF8(text, character);
   }
@@ -98,6 +90,13 @@ std::optional<char32_t> takeUTF8(std::string_view& text) {
   }
   text.remove_prefix(length - 1);
   return character;
+}
+
+bool isUTF8(std::string_view text) {
+  while (!text.empty()) {
+    if (!takeUTF8(text)) return false;
+  }
+  return true;
 }
 
 std::optional<std::string> decodedText(std::string_view bytes) {

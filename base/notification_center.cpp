@@ -1,4 +1,4 @@
-#include "platform/notification_center.h"
+#include "base/notification_center.h"
 
 #include <algorithm>
 #include <utility>

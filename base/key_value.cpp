@@ -1,4 +1,4 @@
-#include "platform/key_value.h"
+#include "base/key_value.h"
 
 #include <utility>
 

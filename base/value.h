@@ -31,7 +31,8 @@ using Array = std::vector<Value>;
 /// cheap.
 class Dictionary {
  public:
-  using Pair = std::pair<std::string, Value>;
+  /// A key and its value; see below.
+  struct Pair;
 
   /// The empty dictionary.
   Dictionary() = default;
@@ -98,9 +99,6 @@ class Value {
     return std::get_if<Kind>(&storage_);
   }
 
-  /// Booleans, integers and reals are all numbers.
-  [[nodiscard]] bool isNumber() const { return storage_.index() <= 3; }
-
   /// The truth of a number (non-zero is true); nothing for a value that is no number.
   [[nodiscard]] std::optional<bool> boolean() const;
 
@@ -112,6 +110,13 @@ class Value {
 
  private:
   Storage storage_;
+};
+
+struct Dictionary::Pair {
+  Pair(std::string_view name, Value content) : key(name), value(std::move(content)) {}
+  std::string key;
+  Value value;
+  friend bool operator==(const Pair& a, const Pair& b) = default;
 };
 
 /// The leading decimal integer of `text`, by the rule of Value::integerValue.

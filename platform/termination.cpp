@@ -1,0 +1,47 @@
+#include "platform/termination.h"
+
+#include <chrono>
+#include <condition_variable>
+#include <memory>
+#include <mutex>
+
+#include "platform/run_loop.h"
+
+namespace onramp {
+
+namespace {
+
+struct Termination {
+  std::mutex mutex;
+  std::condition_variable changed;
+  bool begun = false;
+};
+
+// Never destroyed: the process may exit while a thread still sleeps.
+Termination& termination() {
+  static Termination* const instance = std::make_unique<Termination>().release();
+  return *instance;
+}
+
+}  // namespace
+
+bool isTerminating() {
+  const std::lock_guard lock(termination().mutex);
+  return termination().begun;
+}
+
+void beginTermination() {
+  {
+    const std::lock_guard lock(termination().mutex);
+    termination().begun = true;
+  }
+  termination().changed.notify_all();
+}
+
+bool sleepOffMainThread(std::uint32_t seconds) {
+  std::unique_lock lock(termination().mutex);
+  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
+                                         [] { return termination().begun; });
+}
+
+}  // namespace onramp
