@@ -59,7 +59,7 @@ int runApplication(int, char**, const std::string& mainInterfaceName,
     const std::unique_ptr<ApplicationDelegate> delegate = makeDelegate();
     const std::unique_ptr<Interface> mainInterface = Interface::load(mainInterfaceName, *delegate);
     if (!mainInterface) {
-      std::fprintf(stderr, "%s: no interface file %s; copy the application anew\n",
+      std::fprintf(stderr, "%s: no interface file %s; copy the application again\n",
                    Bundle::main().path().c_str(), mainInterfaceName.c_str());
       return 1;
     }

@@ -1,6 +1,6 @@
-// Hides and unhides the application as AppKit does. GNUstep would make an icon of each window, since
-// the application has none to click on, and a window that is brought back before its icon is on the
-// screen does not always get the keyboard.
+// Hides and unhides the application as AppKit does. GNUstep would make an icon of each window,
+// since the application has none to click on, and a window that is brought back before its icon is
+// on the screen does not always get the keyboard.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
