@@ -29,8 +29,8 @@ void sendEvent(id self, SEL selector, NSEvent* event) {
   originalSendEvent(self, selector, event);
 }
 
-NSString* titleOr(NSString* title, NSString* toolTip) {
-  return [toolTip length] > 0 ? toolTip : title;
+NSString* nameOf(NSPopUpButton* button) {
+  return [[button toolTip] length] > 0 ? [button toolTip] : [button title];
 }
 
 // Collects the controls of one window.
@@ -70,8 +70,7 @@ class Reader {
     if (isControl && [static_cast<NSControl*>(view) isEnabled]) [states addObject:@"enabled"];
     if ([window_ firstResponder] == view) [states addObject:@"focused"];
     if ([view isKindOfClass:[NSPopUpButton class]]) {
-      add(@"button menu", titleOr([static_cast<NSPopUpButton*>(view) title], [view toolTip]),
-          states, view, [view bounds]);
+      add(@"button menu", nameOf(static_cast<NSPopUpButton*>(view)), states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSButton class]]) {
       add(@"push button", [static_cast<NSButton*>(view) title], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSTextField class]]) {
