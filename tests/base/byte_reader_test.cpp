@@ -9,7 +9,7 @@
 namespace onramp {
 namespace {
 
-using std::literals::operator""sv;
+using namespace std::literals;
 
 TEST(ByteReader, ReadsInOrderUpToTheEnd) {
   ByteReader reader("\x80text\x00\x01\x02\xFF\xFF\xFF\xFF\xFF\xFF\xFF\xFE!"sv);

@@ -10,8 +10,7 @@
 namespace onramp {
 namespace {
 
-using std::literals::operator""s;
-using std::literals::operator""sv;
+using namespace std::literals;
 
 // The characters of `bytes`, each byte that begins none as "?", written again.
 std::string readAndWritten(std::string_view bytes) {
