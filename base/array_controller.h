@@ -41,6 +41,12 @@ class ArrayController {
   /// Selects the first entry equal to `entry`; nothing is selected when there is none.
   void setSelectedObject(const Dictionary& entry);
 
+  /// Selects the entry at `index` because the user wants it. The table that is bound calls this.
+  void choose(std::size_t index);
+
+  /// Whether the user has chosen an entry since the last removeAllObjects().
+  [[nodiscard]] bool hasChoice() const { return hasChoice_; }
+
   /// A list with entries always has a selected one unless it was taken away on purpose: the first
   /// entry added is selected, and when the selected one is removed its successor is.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
@@ -55,6 +61,7 @@ class ArrayController {
 
   std::vector<Dictionary> entries_;
   std::optional<std::size_t> selection_;
+  bool hasChoice_ = false;
   std::atomic<std::size_t> count_ = 0;
   std::string sortKey_;
   std::function<void()> onChange_;

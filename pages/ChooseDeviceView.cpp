@@ -159,8 +159,12 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // The user's choice stays when a search reports the chosen device anew.
-  if (isSelected) deviceArrayController.setSelectedObject(entry);
+  // Until the user chooses, the first row is selected; their choice survives later reports.
+  if (!deviceArrayController.hasChoice()) {
+    deviceArrayController.setSelectionIndex(0);
+  } else if (isSelected) {
+    deviceArrayController.setSelectedObject(entry);
+  }
 }
 
 void ChooseDeviceView::removeServiceFromList(const Dictionary& device) {

@@ -121,10 +121,11 @@ TEST_F(Chooser, TheFirstAddressThatAnswersAtOnceDecides) {
   }
 }
 
-TEST_F(Chooser, SortsByNameAndReplacesWhatIsReportedAnew) {
+TEST_F(Chooser, SortsByNameAndSelectsTheFirstRowUntilTheUserChoosesOne) {
   for (const char* name : {"b", "C", "a"})
     page->updateKSDevice(device(name));
-  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
+  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1*", "a 192.0.2.1", "b 192.0.2.1"));
+  screen.object("deviceListView").content->choose(2);
   for (const char* name : {"a", "b", "C"})
     page->updateKSDevice(device(name));
   EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
