@@ -5,7 +5,7 @@ namespace onramp {
 
 namespace {
 
-// A flag that the record lacks counts as false.
+// A flag that is missing from the record counts as false.
 bool supports(const Dictionary& model, std::string_view connection) {
   return model.boolean(connection).value_or(false);
 }
@@ -39,7 +39,7 @@ ConnectionType OnrampOSXAppDelegate::checkIF(const std::vector<std::string>& mod
   const std::optional<Dictionary> info = KSOROSXModel::modelInfo();
   const ConnectionType first = typeOf(KSOROSXModel::initWithName(models.front(), info));
   for (const std::string& model : models) {
-    // The four types tell the four mixes of the two flags apart.
+    // Two models have the same type exactly when they agree on both connections.
     if (typeOf(KSOROSXModel::initWithName(model, info)) != first) return ConnectionType::kNeither;
   }
   return first;

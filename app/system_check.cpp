@@ -19,7 +19,7 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-// Components that the version does not have, as in 10.9, count as 0.
+// Components missing from the version, as in 10.9, count as 0.
 SystemVersion runningVersion() {
   const std::vector<std::string> components = OnrampOSXAppDelegate::getSystemVersion();
   const auto component = [&](std::size_t index) {
@@ -69,9 +69,10 @@ SystemSupport OnrampOSXAppDelegate::supportedOSMaxCheck() const {
   if (system.major != major) return newerIf(system.major > major);
   const std::int64_t minor = maximum.integerValue(kMinor);
   if (system.minor != minor) return newerIf(system.minor > minor);
-  if (asciiLowercased(maximum.string(kBugFix).value_or("")) == "x")
+  if (asciiLowercased(maximum.string(kBugFix).value_or("")) == "x") {
     return SystemSupport::kSupported;
-  // The bug-fix release is the first one that is not supported, unlike the other two bounds.
+  }
+  // This bound is exclusive, unlike the other two.
   return newerIf(system.bugFix >= maximum.integerValue(kBugFix));
 }
 

@@ -6,9 +6,9 @@
 
 namespace onramp {
 
-/// Runs the program at `executable` with `arguments` and blocks until it ends. Its exit status;
-/// nothing when it could not be started or was ended by a signal. Whether the main loop turns
-/// meanwhile is up to the platform.
+/// Runs the program at `executable` with `arguments`, blocks until it ends and returns its exit
+/// status. Nothing when the program could not be started or was ended by a signal. Callers must
+/// expect the user interface to freeze meanwhile.
 [[nodiscard]] std::optional<int> runAndWait(const std::string& executable,
                                             const std::vector<std::string>& arguments);
 
