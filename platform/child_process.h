@@ -6,9 +6,8 @@
 
 namespace onramp {
 
-/// Runs the program at `executable` with `arguments`, blocks until it ends and returns its exit
-/// status. Nothing when the program could not be started or was ended by a signal. Callers must
-/// expect the user interface to freeze meanwhile.
+/// Runs the program at `executable` with `arguments` and blocks the calling thread until it ends.
+/// Returns its exit status; nothing when it could not be started or was ended by a signal.
 [[nodiscard]] std::optional<int> runAndWait(const std::string& executable,
                                             const std::vector<std::string>& arguments);
 
