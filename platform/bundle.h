@@ -9,10 +9,10 @@
 namespace onramp {
 
 /// A folder laid out as a resource bundle: Contents/Info.plist, Contents/Resources with one folder
-/// of string tables a language, and for an application its executable in a folder named after the
-/// system. The class keeps nothing but the path. What it is asked is answered from the disk, except
-/// where the system keeps what it has read of a bundle, as macOS does: a bundle is not to be
-/// changed while the program runs.
+/// of string tables per language, and for an application its executable in a folder named after the
+/// system. The class stores nothing but the path and reads the disk for every answer. Some systems,
+/// such as macOS, cache what they have read of a bundle, so a bundle must not be changed while the
+/// program runs.
 class Bundle {
  public:
   /// The running application's own bundle.
@@ -30,6 +30,9 @@ class Bundle {
   /// The information dictionary's text under `key` if it is a string.
   [[nodiscard]] std::optional<std::string> infoString(std::string_view key) const;
 
+  /// The same in the user's language where the bundle's string table "InfoPlist" has the key.
+  [[nodiscard]] std::optional<std::string> localizedInfoString(const std::string& key) const;
+
   /// Path of the resource `name` with the extension `type` (without its dot; empty for none), or
   /// nothing when the bundle holds no such file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
@@ -39,9 +42,10 @@ class Bundle {
   /// not name one.
   [[nodiscard]] std::optional<std::string> executablePath() const;
 
-  /// The text under `key` in the string table `table` ("Localizable" when none is given) for the
-  /// user's preferred language among those the bundle offers, else for its development language;
-  /// `value` when the table has no such key.
+  /// The text under `key` in the string table `table` ("Localizable" when none is given), or
+  /// `value` when the table has no such key. The table is the one for the user's most preferred
+  /// language that the bundle offers. When it offers none of them, the bundle's development
+  /// language decides, then English, then any language that the bundle has.
   [[nodiscard]] std::string localizedString(const std::string& key, const std::string& value,
                                             const std::optional<std::string>& table) const;
 

@@ -22,13 +22,18 @@ inline constexpr std::uint64_t kMostPropertyListObjects = std::uint64_t{1} << 18
 /// Containers inside each other.
 inline constexpr std::size_t kMostPropertyListDepth = 128;
 
-/// The dictionary that the XML or binary property list at `path` holds. Nothing when the file is
-/// absent or unreadable, holds something else, or exceeds a limit above.
+/// The dictionary in the XML or binary property list at `path`. Nothing when the file is absent or
+/// unreadable, holds something else, or exceeds the limits that keep a hostile file from exhausting
+/// the process (size, nesting depth, number of objects).
 [[nodiscard]] std::optional<Dictionary> loadDictionary(const std::string& path);
 
 /// Writes `dictionary` as an XML property list. The file appears under its name whole or not at
 /// all: a temporary file beside it is moved into place. False when it could not be written;
 /// whatever lay at `path` before is then untouched.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
+
+/// Removes whatever lies at `path`, and the temporary files of writers of `path` that were killed.
+/// Failures are ignored.
+void removeDictionary(const std::string& path);
 
 }  // namespace onramp

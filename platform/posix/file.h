@@ -7,13 +7,18 @@
 
 namespace onramp::posix {
 
-/// The bytes of the regular file at `path`; nothing when it cannot be read, is something else than
-/// a file, or is larger than `most` bytes. Never waits for somebody to write.
+/// The bytes of the regular file at `path`. Nothing when it cannot be read, is not a regular file,
+/// or is larger than `most` bytes. Never waits for a writer.
 [[nodiscard]] std::optional<std::string> readFile(const std::string& path, std::size_t most);
 
-/// Puts `bytes` under `path` in one step: they are written and flushed to a temporary file in the
-/// same folder, which then takes the name. False when any of that failed; the temporary file is
-/// then gone again and what lay at `path` is untouched.
+/// Replaces the file at `path` by one with `bytes` in a single step: a temporary file in the same
+/// folder is written, flushed and renamed. False when any of that failed; the temporary file is
+/// then removed and whatever lay at `path` is unchanged.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
+
+/// Removes whatever lies at `path`, a folder with all that it holds as well, and the temporary
+/// files that writeFileAtomically() left for `path` in processes that no longer exist. Failures are
+/// ignored.
+void removeWithTemporaries(const std::string& path);
 
 }  // namespace onramp::posix
