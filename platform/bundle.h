@@ -30,6 +30,10 @@ class Bundle {
   /// kind.
   [[nodiscard]] std::optional<std::string> infoString(std::string_view key) const;
 
+  /// As infoString(), but in the user's language if the bundle's string table "InfoPlist" has the
+  /// key.
+  [[nodiscard]] std::optional<std::string> localizedInfoString(const std::string& key) const;
+
   /// Returns the path of the resource file `name`.`type`, where an empty `type` means a name
   /// without an extension. A file outside the language folders takes precedence over the user's
   /// language. Returns nothing when the bundle has no such file.
@@ -40,9 +44,10 @@ class Bundle {
   /// information dictionary names no program.
   [[nodiscard]] std::optional<std::string> executablePath() const;
 
-  /// The text under `key` in the string table `table` ("Localizable" when none is given) for the
-  /// user's preferred language among those the bundle offers, else for its development language;
-  /// `value` when the table has no such key.
+  /// The text under `key` in the string table `table` ("Localizable" when none is given), or
+  /// `value` when the table has no such key. The table is the one for the user's most preferred
+  /// language that the bundle offers. When it offers none of them, the bundle's development
+  /// language decides, then English, then any language that the bundle has.
   [[nodiscard]] std::string localizedString(const std::string& key, const std::string& value,
                                             const std::optional<std::string>& table) const;
 

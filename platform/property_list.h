@@ -33,4 +33,8 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 /// `path` is then unchanged.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
+/// Removes the file or the folder tree at `path`, and the temporary files that killed processes
+/// left when writing to it. Ignores failures.
+void removeDictionary(const std::string& path);
+
 }  // namespace onramp

@@ -16,4 +16,8 @@ namespace onramp::posix {
 /// and a file that was at `path` is unchanged.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
 
+/// Removes the file or the folder tree at `path`, and the temporary files that
+/// writeFileAtomically() left for `path` in processes that no longer exist. Ignores failures.
+void removeWithTemporaries(const std::string& path);
+
 }  // namespace onramp::posix
