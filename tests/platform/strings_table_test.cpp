@@ -13,6 +13,7 @@ TEST(StringsTable, FollowsTheGrammarOfOldStyleLists) {
       {"", {}},
       {" \n// nothing\n/* at ** all */", {}},
       {R"("a" = "b";)", {{"a", "b"}}},
+      {"// old line ends\r\"a\" = \"b\";\r", {{"a", "b"}}},
       {R"(/* first */ "a"="b"; // second
           "c" /* in */ = /* between */ "d" ;)",
        {{"a", "b"}, {"c", "d"}}},
