@@ -2,6 +2,7 @@
 
 #include <array>
 #include <cstdint>
+#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -100,5 +101,13 @@ class snmp_table_request {
 /// request unanswered is asked three times, 20 ms apart, and its last answer counts when no further
 /// address decides.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
+
+/// Makes one request to the device at an address, which is null for an entry that is no text.
+/// Returns what snmp_query_table does, and sets `no_reply` in the same case.
+using snmp_ask =
+    std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
+
+/// The same decision with requests made by `ask`, for callers that keep what is exchanged.
+[[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);
 
 }  // namespace onramp
