@@ -27,18 +27,6 @@ snmp_status ber_writer::put(std::span<const std::uint8_t> bytes) {
   return SNMP_OK;
 }
 
-snmp_status ber_put_length(ber_writer& out, std::size_t length) {
-  if (length > UINT16_MAX || out.put(static_cast<std::uint8_t>(length))) return SNMP_ERR_CODEC;
-  if (length < 0x80) return SNMP_OK;
-  if (length <= UINT8_MAX) return out.put(0x81);
-  return out.put(static_cast<std::uint8_t>(length >> 8)) || out.put(0x82) ? SNMP_ERR_CODEC
-                                                                          : SNMP_OK;
-}
-
-snmp_status ber_put_header(ber_writer& out, std::uint8_t tag, std::size_t end) {
-  return ber_put_length(out, out.size() - end) || out.put(tag) ? SNMP_ERR_CODEC : SNMP_OK;
-}
-
 snmp_status ber_put_octets(ber_writer& out, std::span<const std::uint8_t> bytes, std::uint8_t tag) {
   const std::size_t end = out.size();
   return out.put(bytes) || ber_put_header(out, tag, end) ? SNMP_ERR_CODEC : SNMP_OK;

@@ -39,11 +39,20 @@ class ber_writer {
 
 /// Puts a length field of one, two or three bytes (short form, 0x81, 0x82). A length above 65,535
 /// is refused.
-[[nodiscard]] snmp_status ber_put_length(ber_writer& out, std::size_t length);
+[[nodiscard]] inline snmp_status ber_put_length(ber_writer& out, std::size_t length) {
+  if (length > UINT16_MAX || out.put(static_cast<std::uint8_t>(length))) return SNMP_ERR_CODEC;
+  if (length < 0x80) return SNMP_OK;
+  if (length <= UINT8_MAX) return out.put(0x81);
+  const auto high = static_cast<std::uint8_t>(length >> 8);
+  return out.put(high) || out.put(0x82) ? SNMP_ERR_CODEC : SNMP_OK;
+}
 
 /// Puts the tag and the length field of an element whose content is what has been written since
 /// out.size() was `end`.
-[[nodiscard]] snmp_status ber_put_header(ber_writer& out, std::uint8_t tag, std::size_t end);
+[[nodiscard]] inline snmp_status ber_put_header(ber_writer& out, std::uint8_t tag,
+                                                std::size_t end) {
+  return ber_put_length(out, out.size() - end) || out.put(tag) ? SNMP_ERR_CODEC : SNMP_OK;
+}
 
 [[nodiscard]] snmp_status ber_put_octets(ber_writer& out, std::span<const std::uint8_t> bytes,
                                          std::uint8_t tag);
