@@ -10,6 +10,7 @@
 #include "base/notification_center.h"
 #include "base/value.h"
 #include "media/KSInstallerInfo.h"
+#include "media/system_range.h"
 #include "pages/ConnectionTypeView.h"
 #include "pages/page.h"
 #include "platform/application.h"
@@ -19,13 +20,6 @@ namespace onramp {
 
 class ChooseDeviceView;
 class ModelListView;
-
-/// How the running system stands to the range that the medium supports.
-enum class SystemSupport : std::uint32_t {
-  kSupported = 0,
-  kOlderThanMinimum = 1,
-  kNewerThanMaximum = 2,
-};
 
 /// Who started the wireless set-up tool: the wizard itself, after an empty search, or the user.
 enum class ToolStart { kAutomatic, kManual };

@@ -70,10 +70,7 @@ std::optional<std::string> firstAddress(const Dictionary& device) {
 }  // namespace
 
 std::string OnrampOSXAppDelegate::setVenderName() {
-  const std::optional<Dictionary> resources = medium::loadResourceDictionary();
-  std::string vendor = resources ? resources->string(medium::kVenderName).value_or("") : "";
-  std::erase(vendor, ' ');
-  return vendor;
+  return medium::vendorName(medium::loadResourceDictionary());
 }
 
 std::string OnrampOSXAppDelegate::InstallPKGInfoURL() {

@@ -3,6 +3,7 @@
 #include "app/OnrampOSXAppDelegate.h"
 #include "media/CommonMessage.h"
 #include "media/KSOROSXCD.h"
+#include "media/KSOROSXModel.h"
 #include "pages/ChooseDeviceView.h"
 #include "platform/bundle.h"
 
@@ -90,18 +91,19 @@ void OnrampOSXAppDelegate::applicationWillFinishLaunching() {
 void OnrampOSXAppDelegate::applicationDidFinishLaunching() {
   const std::vector<std::string> models = allContainedModels();
   mContainedModelCount = static_cast<std::uint32_t>(models.size());
-  if (!isSupportWiFi(models)) {
-    launchPackage();
-    quitMe();
-    return;
-  }
-  const ConnectionType shared = checkIF(models);
-  if (shared != ConnectionType::kNeither) {
-    showConnectionTypeView(shared);
-    setConnentionTypeViewButton();
-  } else {
-    showModelListView();
-    setModelListViewButton();
+  switch (firstPage(models, KSOROSXModel::modelInfo())) {
+    case FirstPage::kNone:
+      launchPackage();
+      quitMe();
+      return;
+    case FirstPage::kConnectionType:
+      showConnectionTypeView(checkIF(models));
+      setConnentionTypeViewButton();
+      break;
+    case FirstPage::kModelList:
+      showModelListView();
+      setModelListViewButton();
+      break;
   }
   window.makeKeyAndOrderFront();
 }

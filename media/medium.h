@@ -38,4 +38,7 @@ inline constexpr std::string_view kVenderName = "VenderName";
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 
+/// The vendor name that `resources` holds, without its blanks; empty when there is none.
+[[nodiscard]] std::string vendorName(const std::optional<Dictionary>& resources);
+
 }  // namespace onramp::medium

@@ -10,7 +10,7 @@ using cocoa::toStdString;
 
 namespace {
 
-// The platform keeps one object for each bundle that was opened.
+// NSBundle keeps one object for each bundle that was opened.
 NSBundle* bundleAt(const std::string& path) {
   return [NSBundle bundleWithPath:toNSString(path)];
 }

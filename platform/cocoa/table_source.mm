@@ -56,7 +56,7 @@
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// What the user has selected; a selection that they took away comes back.
+// Follows the user's selection. When they deselect the row, it is selected again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;
   const NSInteger row = [_table selectedRow];

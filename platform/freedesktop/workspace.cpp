@@ -9,7 +9,7 @@
 #include <system_error>
 #include <thread>
 
-#include "platform/freedesktop/process.h"
+#include "platform/posix/process.h"
 
 namespace onramp {
 
