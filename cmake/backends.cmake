@@ -1,4 +1,4 @@
-# Which backends a program is linked with: one for each part of the seam.
+# ONRAMP_BACKENDS: the backends that the program is linked with, one for each part of the seam.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)
