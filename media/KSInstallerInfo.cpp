@@ -1,8 +1,6 @@
 #include "media/KSInstallerInfo.h"
 
 #include <array>
-#include <cstdint>
-#include <string_view>
 
 #include "media/medium.h"
 #include "platform/system_version.h"
@@ -11,7 +9,14 @@ namespace onramp {
 
 namespace {
 
-// The key of the package for a system version in binary-coded decimal, if it has one.
+std::optional<std::string> packageName(const Dictionary& pkg) {
+  if (auto name = pkg.string("PkgName")) return name;
+  const auto key = packageKey(gestaltSystemVersion().value_or(0));
+  return key ? pkg.string(*key) : std::nullopt;
+}
+
+}  // namespace
+
 std::optional<std::string_view> packageKey(std::int32_t version) {
   struct Rule {
     std::int32_t atLeast;
@@ -29,14 +34,6 @@ std::optional<std::string_view> packageKey(std::int32_t version) {
   }
   return std::nullopt;
 }
-
-std::optional<std::string> packageName(const Dictionary& pkg) {
-  if (auto name = pkg.string("PkgName")) return name;
-  const auto key = packageKey(gestaltSystemVersion().value_or(0));
-  return key ? pkg.string(*key) : std::nullopt;
-}
-
-}  // namespace
 
 KSInstallerInfo::KSInstallerInfo() {
   setCDCommonInfoValue(medium::loadResourceDictionary());

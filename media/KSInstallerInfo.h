@@ -1,7 +1,9 @@
 #pragma once
 
+#include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 
 #include "base/value.h"
 
@@ -12,6 +14,10 @@ struct FileURL {
   std::string path;
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
+
+/// The key in "PkgInfo" of the package for a system version in binary-coded decimal; nothing when
+/// there is none for it. "PkgName" goes before it.
+[[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
 /// Where the installer package and the wireless set-up tool lie on the medium, and which systems
 /// the medium supports. Read once from the medium, when the object is made.

@@ -1,13 +1,20 @@
 // onramp-check: reads a finished medium as the wizard does and says what is wrong with it.
 
 #include <CLI/CLI.hpp>
+#include <cstdlib>
 #include <exception>
 #include <filesystem>
 #include <iostream>
 #include <string>
 
+#include "tools/check/check.h"
+#include "tools/check/output.h"
+
 namespace {
 
+using namespace onramp;
+
+constexpr int kFindings = 1;
 constexpr int kUnreadable = 2;
 
 constexpr const char* kFooter = R"(Examples:
@@ -38,8 +45,19 @@ int run(int count, char* arguments[]) {
               << "\" is no folder; give the folder that holds the application\n";
     return kUnreadable;
   }
-  std::cout << medium << ": a folder\n";
-  return 0;
+  const check::Report report = check::checkMedium(medium);
+  if (json) {
+    check::writeJSON(std::cout, report);
+  } else {
+    check::writeText(std::cout, report);
+  }
+  if (!std::cout.flush()) {
+    std::cerr << "onramp-check: the output could not be written; is its disk full?\n";
+    return kUnreadable;
+  }
+  const bool clean = report.count(check::Severity::kError) == 0 &&
+                     !(strict && report.count(check::Severity::kWarning) != 0);
+  return clean ? EXIT_SUCCESS : kFindings;
 }
 
 }  // namespace
