@@ -1,11 +1,10 @@
-#include <filesystem>
-
 #include "app/OnrampOSXAppDelegate.h"
 #include "media/CommonMessage.h"
 #include "media/KSOROSXCD.h"
 #include "media/KSOROSXModel.h"
 #include "pages/ChooseDeviceView.h"
 #include "platform/bundle.h"
+#include "platform/property_list.h"
 
 namespace onramp {
 
@@ -16,7 +15,7 @@ struct RetitledItem {
   const char* key;
 };
 
-// The message tables on the media spell the third key like this.
+// The message tables on the media misspell the third key in the same way.
 constexpr RetitledItem kApplicationMenuItems[] = {{"About", "APP_MENU_ABOUT"},
                                                   {"Hide", "APP_MENU_HIDE"},
                                                   {"Hide Others", "APP_MENU_HIDEOHTERS"},
@@ -30,11 +29,6 @@ void retitleApplicationMenu() {
     applicationMenu.itemWithTitle(item.title).setTitle(localized(item.key, item.title));
   }
   setMainMenu(menu);
-}
-
-void removeFile(const std::string& path) {
-  std::error_code ignored;
-  std::filesystem::remove(path, ignored);
 }
 
 }  // namespace
@@ -84,8 +78,8 @@ void OnrampOSXAppDelegate::applicationWillFinishLaunching() {
     return;
   }
   // What an earlier run left must not pass for this run's choices.
-  removeFile(instmodelPlistURL());
-  removeFile(InstallPKGInfoURL());
+  removeDictionary(instmodelPlistURL());
+  removeDictionary(InstallPKGInfoURL());
 }
 
 void OnrampOSXAppDelegate::applicationDidFinishLaunching() {
@@ -93,8 +87,7 @@ void OnrampOSXAppDelegate::applicationDidFinishLaunching() {
   mContainedModelCount = static_cast<std::uint32_t>(models.size());
   switch (firstPage(models, KSOROSXModel::modelInfo())) {
     case FirstPage::kNone:
-      launchPackage();
-      quitMe();
+      handOverAndQuit(std::nullopt);
       return;
     case FirstPage::kConnectionType:
       showConnectionTypeView(checkIF(models));

@@ -10,7 +10,8 @@ namespace onramp {
 namespace {
 
 std::optional<std::string> packageName(const Dictionary& pkg) {
-  if (auto name = pkg.string("PkgName")) return name;
+  // An entry of another type names no package either, but it still takes precedence.
+  if (pkg.find("PkgName")) return pkg.string("PkgName");
   const auto key = packageKey(gestaltSystemVersion().value_or(0));
   return key ? pkg.string(*key) : std::nullopt;
 }

@@ -38,6 +38,11 @@ std::optional<std::string> Bundle::infoString(std::string_view key) const {
   return infoDictionary().string(key);
 }
 
+std::optional<std::string> Bundle::localizedInfoString(const std::string& key) const {
+  const id text = [bundleAt(path_) objectForInfoDictionaryKey:toNSString(key)];
+  return [text isKindOfClass:[NSString class]] ? std::optional(toStdString(text)) : std::nullopt;
+}
+
 std::optional<std::string> Bundle::pathForResource(const std::string& name,
                                                    const std::string& type) const {
   return pathOrNothing([bundleAt(path_) pathForResource:toNSString(name) ofType:toNSString(type)]);

@@ -5,6 +5,7 @@
 
 #import "platform/cocoa/property_list.h"
 #import "platform/cocoa/text.h"
+#include "platform/posix/file.h"
 
 namespace onramp {
 
@@ -166,7 +167,12 @@ bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& 
                                                  format:NSPropertyListXMLFormat_v1_0
                                                 options:0
                                                   error:nullptr];
-  return [data writeToFile:cocoa::toNSString(path) atomically:YES];
+  if (!data) return false;
+  return posix::writeFileAtomically(path, {static_cast<const char*>([data bytes]), [data length]});
+}
+
+void removeDictionary(const std::string& path) {
+  posix::removeWithTemporaries(path);
 }
 
 }  // namespace onramp

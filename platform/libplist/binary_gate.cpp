@@ -47,8 +47,9 @@ struct Cost {
   }
 };
 
+// Offsets, references and UIDs take any number of bytes, not only powers of two.
 bool isNumberSize(std::uint64_t size) {
-  return size == 1 || size == 2 || size == 4 || size == 8;
+  return size >= 1 && size <= 8;
 }
 
 class BinaryWalk {

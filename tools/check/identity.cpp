@@ -4,6 +4,7 @@
 #include "base/ascii.h"
 #include "bonjour/identity_keys.h"
 #include "media/medium.h"
+#include "platform/lowercase.h"
 #include "tools/check/checks.h"
 #include "tools/check/spelling.h"
 
@@ -91,7 +92,7 @@ void checkVendor(const Lists& lists, Report& report) {
   const auto written = lists.resources->string(medium::kVenderName);
   if (!written) return;
   const std::string name = medium::vendorName(lists.resources);
-  const std::string file = "com." + asciiLowercased(name) + ".installpkginfo.plist";
+  const std::string file = "com." + lowercaseString(name) + ".installpkginfo.plist";
   Finding finding{.place = inResources(lists, medium::kVenderName),
                   .effect = "the package does not find the files that the wizard hands over",
                   .remedy = "write the maker's name in letters, digits and blanks"};
@@ -117,7 +118,7 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.found = quoted(*written) + ", with letters outside ASCII";
     finding.expected = "letters from A to Z, digits, blanks";
     finding.effect =
-        "the folder's and the files' names, which systems write and make small in different ways";
+        "names of a folder and of files that not every program writes in the same way";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }

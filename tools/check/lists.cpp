@@ -41,7 +41,7 @@ constexpr std::array kResourceRules{
 
 constexpr std::array kPackageRules{
     KeyRule{"PkgLocation", Kind::kPath, Need::kRequired, kNoPackage},
-    KeyRule{"PkgName", Kind::kText, Need::kOptional, "the package goes by the system's version"},
+    KeyRule{"PkgName", Kind::kText, Need::kOptional, kNoPackage},
     KeyRule{"104", Kind::kText, Need::kOptional, kNoPackage},
     KeyRule{"105", Kind::kText, Need::kOptional, kNoPackage},
     KeyRule{"106", Kind::kText, Need::kOptional, kNoPackage},

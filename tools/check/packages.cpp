@@ -223,7 +223,7 @@ class PackageCheck {
 
   void checkPackage(const Row& row) {
     const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
-    const std::string key = package.string("PkgName") ? "PkgName" : versionKey(row.from);
+    const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
         "on " + words(row.from, row.to) + " the window closes and nothing opens";
     if (!row.package.empty()) {
@@ -249,7 +249,7 @@ class PackageCheck {
       if (!isNumber(key)) continue;
       if (!knownKeys_.contains(key)) {
         neverUsed(key);
-      } else if (package.string("PkgName")) {
+      } else if (package.find("PkgName")) {
         shadowed += (shadowed.empty() ? "" : ", ") + quoted(key);
       } else if (!usedKeys_.contains(key)) {
         unsupported(key);
@@ -260,7 +260,7 @@ class PackageCheck {
                                 .place = placeOf(medium::kPkgInfo, "PkgName"),
                                 .found = "\"PkgName\" beside " + shadowed,
                                 .expected = "either \"PkgName\" or packages by version",
-                                .effect = "every system gets " + quoted(*package.string("PkgName")),
+                                .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
                                 .remedy = "remove \"PkgName\", or the keys that it goes before"});
   }
 
