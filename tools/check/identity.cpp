@@ -117,8 +117,7 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.severity = Severity::kWarning;
     finding.found = quoted(*written) + ", with letters outside ASCII";
     finding.expected = "letters from A to Z, digits, blanks";
-    finding.effect =
-        "names of a folder and of files that not every program writes in the same way";
+    finding.effect = "names of a folder and of files that not every program writes in the same way";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }

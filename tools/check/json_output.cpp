@@ -25,6 +25,18 @@ Json jsonOf(const Finding& finding) {
   return json;
 }
 
+const char* nameOf(FirstPage page) {
+  switch (page) {
+    case FirstPage::kNone:
+      return "package";
+    case FirstPage::kConnectionType:
+      return "connection type";
+    case FirstPage::kModelList:
+      break;
+  }
+  return "model list";
+}
+
 }  // namespace
 
 void writeJSON(std::ostream& out, const Report& report) {
@@ -50,7 +62,7 @@ void writeJSON(std::ostream& out, const Report& report) {
                   {"errors", report.count(Severity::kError)},
                   {"warnings", report.count(Severity::kWarning)},
                   {"findings", std::move(findings)},
-                  {"start", report.start},
+                  {"start", nameOf(report.start)},
                   {"models", std::move(models)},
                   {"systems", report.systems},
                   {"packages", std::move(packages)},

@@ -167,17 +167,7 @@ void describeModels(const Lists& lists, Report& report) {
                              record.boolean(KSOROSXModel::kSupportEthernet).value_or(false),
                              record.boolean(KSOROSXModel::kSupportWiFi).value_or(false)});
   }
-  switch (firstPage(names, lists.models)) {
-    case FirstPage::kNone:
-      report.start = "no page: the package opens at once, because no model supports wireless";
-      break;
-    case FirstPage::kConnectionType:
-      report.start = "the connection type: all models have the same connections by cable";
-      break;
-    case FirstPage::kModelList:
-      report.start = "the list of models";
-      break;
-  }
+  report.start = firstPage(names, lists.models);
 }
 
 }  // namespace onramp::check

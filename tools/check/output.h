@@ -13,4 +13,7 @@ void writeText(std::ostream& out, const Report& report);
 /// become replacement characters.
 void writeJSON(std::ostream& out, const Report& report);
 
+/// Writes the keys of all texts that the wizard shows, a line each, with the room that they have.
+void writeTexts(std::ostream& out);
+
 }  // namespace onramp::check

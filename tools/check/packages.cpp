@@ -256,12 +256,13 @@ class PackageCheck {
       }
     }
     if (shadowed.empty()) return;
-    report_.findings.push_back({.id = "package-shadowed",
-                                .place = placeOf(medium::kPkgInfo, "PkgName"),
-                                .found = "\"PkgName\" beside " + shadowed,
-                                .expected = "either \"PkgName\" or packages by version",
-                                .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
-                                .remedy = "remove \"PkgName\", or the keys that it goes before"});
+    report_.findings.push_back(
+        {.id = "package-shadowed",
+         .place = placeOf(medium::kPkgInfo, "PkgName"),
+         .found = "\"PkgName\" beside " + shadowed,
+         .expected = "either \"PkgName\" or packages by version",
+         .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
+         .remedy = "remove \"PkgName\", or the keys that it goes before"});
   }
 
   void neverUsed(const std::string& key) {

@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "media/connection_type.h"
 #include "tools/check/finding.h"
 
 namespace onramp::check {
@@ -32,11 +33,11 @@ struct LanguageRow {
 /// What is known of a medium once it is checked.
 struct Report {
   std::string medium{};
-  std::string application{};        ///< its folder's name; empty when there is none
-  std::vector<Finding> findings{};  ///< in the order in which the wizard comes across them
-  std::vector<ModelRow> models{};   ///< in the order of the wizard's list
-  std::string start{};              ///< what the wizard begins with, in words
-  std::string systems{};            ///< the supported range, in words
+  std::string application{};           ///< its folder's name; empty when there is none
+  std::vector<Finding> findings{};     ///< in the order in which the wizard comes across them
+  std::vector<ModelRow> models{};      ///< in the order of the wizard's list
+  FirstPage start = FirstPage::kNone;  ///< what the wizard begins with
+  std::string systems{};               ///< the supported range, in words
   std::vector<PackageRow> packages{};
   std::vector<LanguageRow> languages{};
 

@@ -1,8 +1,11 @@
 #include <algorithm>
+#include <cmath>
+#include <iomanip>
 #include <string>
 
 #include "base/text.h"
 #include "tools/check/output.h"
+#include "tools/check/shown_texts.h"
 
 namespace onramp::check {
 
@@ -56,6 +59,18 @@ void writeModels(std::ostream& out, const Report& report) {
   }
 }
 
+const char* startInWords(FirstPage page) {
+  switch (page) {
+    case FirstPage::kNone:
+      return "no page: the package opens at once, because no model supports wireless";
+    case FirstPage::kConnectionType:
+      return "the connection type: all models have the same connections by cable";
+    case FirstPage::kModelList:
+      break;
+  }
+  return "the list of models";
+}
+
 }  // namespace
 
 void writeText(std::ostream& out, const Report& report) {
@@ -65,7 +80,7 @@ void writeText(std::ostream& out, const Report& report) {
         << printable(sentences(finding)) << " [" << finding.id << "]\n";
   }
   writeModels(out, report);
-  out << "\nStarts with: " << report.start
+  out << "\nStarts with: " << startInWords(report.start)
       << "\nSystems: " << (report.systems.empty() ? "unknown" : report.systems) << '\n';
   for (const PackageRow& row : report.packages) {
     out << "  " << row.systems << ": "
@@ -78,6 +93,18 @@ void writeText(std::ostream& out, const Report& report) {
   out << '\n'
       << report.medium << ": " << report.count(Severity::kError) << " errors, "
       << report.count(Severity::kWarning) << " warnings, " << report.models.size() << " models\n";
+}
+
+void writeTexts(std::ostream& out) {
+  for (const ShownText& text : shownTexts()) {
+    out << std::left << std::setw(44) << text.key << std::right << std::setw(4);
+    if (text.width > 0) {
+      out << std::lround(text.width) << " × " << text.lines;
+    } else {
+      out << '-' << "    ";
+    }
+    out << "  " << (text.mostPlaceholders > 0 ? "%@ once or twice, " : "") << text.where << '\n';
+  }
 }
 
 }  // namespace onramp::check

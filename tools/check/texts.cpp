@@ -40,6 +40,17 @@ std::string joined(const std::vector<std::string>& words) {
   return text;
 }
 
+// Whether one of the `offered` languages serves users of `wanted`, and not only for want of a
+// better one.
+bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
+  const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
+  if (found.empty()) return false;
+  const Language first = Language::parse(found.front());
+  const Language language = Language::parse(wanted);
+  return first.code == language.code &&
+         (first.script.empty() || language.script.empty() || first.script == language.script);
+}
+
 class TextCheck {
  public:
   TextCheck(const MediumFiles& files, const Lists& lists)
@@ -201,17 +212,17 @@ class TextCheck {
     const auto information =
         files_.list(path, {{.file = path},
                            "the message bundle's list",
-                           "users of other languages see keys, or a language by chance"});
+                           "which language users of all others see is left to the system"});
     if (!information) return;
     const auto region = information->string(kKey);
     Finding finding{.id = "region-missing",
                     .place = {.file = path},
                     .found = "no \"CFBundleDevelopmentRegion\"",
                     .expected = "the language for users of all others, such as \"en\"",
-                    .effect = "users of other languages see keys, or a language by chance",
+                    .effect = "which language users of all others see is left to the system",
                     .remedy = "add it"};
     if (region) {
-      if (!languagesToSearch(languages_, {}, *region).empty()) return;
+      if (serves(languages_, *region)) return;
       finding.id = "region-without-texts";
       finding.place.key = {kKey};
       finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
@@ -231,7 +242,7 @@ class TextCheck {
     const std::vector<std::string> own = languagesIn(files_, resources);
     for (const std::string& language : languages_) {
       const bool unknown = Language::parse(language).code.empty();
-      if (unknown || !languagesToSearch(own, {language}, "").empty()) continue;
+      if (unknown || serves(own, language)) continue;
       report_.findings.push_back(
           {.id = "language-not-in-application",
            .severity = Severity::kWarning,
