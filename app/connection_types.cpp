@@ -3,46 +3,20 @@
 
 namespace onramp {
 
-namespace {
-
-// A flag that the record lacks counts as false.
-bool supports(const Dictionary& model, std::string_view connection) {
-  return model.boolean(connection).value_or(false);
-}
-
-ConnectionType typeOf(const Dictionary& model) {
-  return OnrampOSXAppDelegate::isIFType(supports(model, KSOROSXModel::kSupportUSB),
-                                        supports(model, KSOROSXModel::kSupportEthernet));
-}
-
-}  // namespace
-
 bool OnrampOSXAppDelegate::isSupportWiFi(const std::vector<std::string>& models) {
-  const std::optional<Dictionary> info = KSOROSXModel::modelInfo();
-  for (const std::string& model : models) {
-    if (supports(KSOROSXModel::initWithName(model, info), KSOROSXModel::kSupportWiFi)) return true;
-  }
-  return false;
+  return anySupportsWiFi(models, KSOROSXModel::modelInfo());
 }
 
 ConnectionType OnrampOSXAppDelegate::isIFType(bool usb, bool ethernet) {
-  if (usb) return ethernet ? ConnectionType::kUSBAndEthernet : ConnectionType::kUSB;
-  return ethernet ? ConnectionType::kEthernet : ConnectionType::kNeither;
+  return connectionType(usb, ethernet);
 }
 
 ConnectionType OnrampOSXAppDelegate::isIFType(const std::optional<std::string>& model) {
-  return typeOf(KSOROSXModel::initWithName(model));
+  return connectionType(KSOROSXModel::initWithName(model));
 }
 
 ConnectionType OnrampOSXAppDelegate::checkIF(const std::vector<std::string>& models) {
-  if (models.empty()) return ConnectionType::kNeither;
-  const std::optional<Dictionary> info = KSOROSXModel::modelInfo();
-  const ConnectionType first = typeOf(KSOROSXModel::initWithName(models.front(), info));
-  for (const std::string& model : models) {
-    // The four types tell the four mixes of the two flags apart.
-    if (typeOf(KSOROSXModel::initWithName(model, info)) != first) return ConnectionType::kNeither;
-  }
-  return first;
+  return sharedConnectionType(models, KSOROSXModel::modelInfo());
 }
 
 }  // namespace onramp

@@ -2,11 +2,12 @@
 #include <system_error>
 
 #include "app/OnrampOSXAppDelegate.h"
-#include "base/ascii.h"
+#include "bonjour/KSDevice.h"
 #include "media/KSOROSXCD.h"
 #include "media/medium.h"
 #include "platform/bundle.h"
 #include "platform/folders.h"
+#include "platform/lowercase.h"
 #include "platform/property_list.h"
 #include "platform/user_locale.h"
 
@@ -19,15 +20,15 @@ namespace fs = std::filesystem;
 constexpr const char* kModel = "Model";
 constexpr const char* kInterface = "Interface";
 
-// "com.vendor.kind.plist"
+// Such as "com.vendor.kind.plist".
 std::string fileName(const std::string& vendor, const std::string& kind) {
-  return "com." + asciiLowercased(vendor) + "." + kind + ".plist";
+  return "com." + lowercaseString(vendor) + "." + kind + ".plist";
 }
 
-// Other users' runs and the installer must be able to replace what lies in the folder. A path as
-// long as the system's own limit is left as it is.
+// Other users' runs and the installer must be able to replace what lies in the folder. A path that
+// does not fit the buffer for it, which is as long as the longest path on macOS, is left alone.
 void openToEveryone(const std::string& folder) {
-  constexpr std::size_t kPathBufferSize = 1024;
+  constexpr std::size_t kPathBufferSize = 1024;  // bytes, a closing zero included
   if (folder.size() >= kPathBufferSize) return;
   std::error_code ignored;
   fs::permissions(folder, fs::perms::all, ignored);
@@ -37,7 +38,7 @@ void setDefault(Dictionary& options, const char* key) {
   if (!options.find(key)) options = options.with(key, false);
 }
 
-// What the application knows of the online service in the user's country, if the medium offers it.
+// The application's entry for the user's country, if the medium offers the online service.
 Value onlineServiceOption(const Dictionary& options) {
   const Value* const offered = options.find("PKG_KestrelOnline");
   if (!offered || offered->boolean() == false) return false;
@@ -54,14 +55,14 @@ bool fontSetOption(const Dictionary& options) {
   return language == "ja" || language == "ko" || language == "zh";
 }
 
-// The records stand an empty text for what is not known.
+// In the records, an empty text stands for an unknown value.
 std::optional<std::string> knownText(const Dictionary& record, std::string_view key) {
   std::optional<std::string> text = record.string(key);
   return text && !text->empty() ? text : std::nullopt;
 }
 
 std::optional<std::string> firstAddress(const Dictionary& device) {
-  const Array* const addresses = device.array("IP address list");
+  const Array* const addresses = device.array(KSDevice::kIPAddressList);
   if (!addresses || addresses->empty()) return std::nullopt;
   const auto* const address = addresses->front().as<std::string>();
   return address ? std::optional(*address) : std::nullopt;
@@ -70,10 +71,7 @@ std::optional<std::string> firstAddress(const Dictionary& device) {
 }  // namespace
 
 std::string OnrampOSXAppDelegate::setVenderName() {
-  const std::optional<Dictionary> resources = medium::loadResourceDictionary();
-  std::string vendor = resources ? resources->string(medium::kVenderName).value_or("") : "";
-  std::erase(vendor, ' ');
-  return vendor;
+  return medium::vendorName(medium::loadResourceDictionary());
 }
 
 std::string OnrampOSXAppDelegate::InstallPKGInfoURL() {
@@ -114,12 +112,12 @@ Dictionary OnrampOSXAppDelegate::instmodelPlistWiFi(const std::optional<std::str
                                                     const std::optional<Dictionary>& property) {
   const auto type = knownText(KSOROSXCD::initWithCDInfo(), KSOROSXCD::kBonjourServiceType);
   if (property) {
-    const auto name = knownText(*property, "display name");
+    const auto name = knownText(*property, KSDevice::kDisplayName);
     const auto address = firstAddress(*property);
     if (name && type && address) {
       const Dictionary bonjour{{"name", *name}, {"type", *type}, {"domain", "local."}};
       const Dictionary network{{"Bonjour", bonjour}, {"IP address", *address}};
-      return Dictionary{{kModel, property->string("model name").value_or("")},
+      return Dictionary{{kModel, property->string(KSDevice::kModelName).value_or("")},
                         {kInterface, "WiFi"},
                         {"Network", network}};
     }

@@ -1,4 +1,5 @@
 #include <algorithm>
+#include <chrono>
 #include <filesystem>
 #include <system_error>
 
@@ -7,6 +8,7 @@
 #include "media/KSOROSXCD.h"
 #include "platform/bundle.h"
 #include "platform/child_process.h"
+#include "platform/property_list.h"
 #include "platform/run_loop.h"
 #include "platform/user_locale.h"
 #include "platform/workspace.h"
@@ -18,17 +20,31 @@ namespace {
 // The maker's support site.
 constexpr std::string_view kSupportSite = "http://support.kestrel.example";
 
-constexpr double kQuitDelay = 1.0;            // seconds
-constexpr double kHideBeforeToolDelay = 0.5;  // seconds
+// The package has this long to open before the application ends.
+constexpr std::chrono::milliseconds kQuitDelay{1000};
 
-// What the set-up tool answers by its exit status; every other status asks for a new search.
+// The window has this long to disappear before the tool blocks the main thread.
+constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
+
+// Exit statuses of the set-up tool. Any other one asks for a new search.
 constexpr int kToolAsksToGoBack = 1;
 constexpr int kToolAsksToQuit = 2;
 
-// The characters of RFC 3986; with any other one the text is no address.
-bool isURLCharacter(char c) {
-  constexpr std::string_view kPunctuation = "-._~:/?#[]@!$&'()*+,;=%";
-  return isASCIILetterOrDigit(c) || kPunctuation.find(c) != std::string_view::npos;
+// Whether `text` may stand in the path, query and fragment of an address (RFC 3986): characters of
+// these, at most one "#", and a "%" only before two hexadecimal digits.
+bool isURLText(std::string_view text) {
+  constexpr std::string_view kPunctuation = "-._~:/?#@!$&'()*+,;=";
+  for (std::size_t at = 0; at < text.size(); ++at) {
+    const char c = text[at];
+    if (c == '%') {
+      if (at + 2 >= text.size() || !hexDigitValue(text[at + 1]) || !hexDigitValue(text[at + 2])) {
+        return false;
+      }
+    } else if (!isASCIILetterOrDigit(c) && kPunctuation.find(c) == std::string_view::npos) {
+      return false;
+    }
+  }
+  return std::count(text.begin(), text.end(), '#') <= 1;
 }
 
 std::optional<int> runSetUpTool(const std::optional<FileURL>& tool) {
@@ -47,8 +63,15 @@ bool OnrampOSXAppDelegate::launchPackage() {
   return package && openFile(package->path);
 }
 
+void OnrampOSXAppDelegate::handOverAndQuit(const std::optional<Dictionary>& modelFile) {
+  if (modelFile) writeDictionaryAtomically(*modelFile, instmodelPlistURL());
+  launchPackage();
+  quitMe();
+}
+
 void OnrampOSXAppDelegate::quitMe() {
-  scheduleTimer(kQuitDelay, [this] { performTimerQuitMe(); });
+  scheduleTimer(std::chrono::duration<double>(kQuitDelay).count(),
+                [this] { performTimerQuitMe(); });
 }
 
 void OnrampOSXAppDelegate::performTimerQuitMe() {
@@ -65,7 +88,8 @@ void OnrampOSXAppDelegate::launchWLANToolManually() {
 
 void OnrampOSXAppDelegate::launchWLANTool(ToolStart start) {
   hideApplication();
-  scheduleTimer(kHideBeforeToolDelay, [this, start] { performLaunchWLANTool(start); });
+  scheduleTimer(std::chrono::duration<double>(kHideBeforeToolDelay).count(),
+                [this, start] { performLaunchWLANTool(start); });
 }
 
 void OnrampOSXAppDelegate::performLaunchWLANTool(ToolStart start) {
@@ -94,9 +118,9 @@ void OnrampOSXAppDelegate::performLaunchWLANTool(ToolStart start) {
 std::optional<std::string> OnrampOSXAppDelegate::FAQ_URL() {
   const std::string series =
       KSOROSXCD::initWithCDInfo().string(KSOROSXCD::kKSCSeriesCode).value_or("");
-  const std::string url = std::string(kSupportSite) + "/g/d/c2f2/" + series + "/" +
-                          localeLanguageCode() + "/" + asciiLowercased(localeCountryCode()) + "/";
-  return std::all_of(url.begin(), url.end(), isURLCharacter) ? std::optional(url) : std::nullopt;
+  const std::string path = "/g/d/c2f2/" + series + "/" + localeLanguageCode() + "/" +
+                           asciiLowercased(localeCountryCode()) + "/";
+  return isURLText(path) ? std::optional(std::string(kSupportSite) + path) : std::nullopt;
 }
 
 void OnrampOSXAppDelegate::openURL(const std::optional<std::string>& url) {

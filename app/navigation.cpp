@@ -1,20 +1,13 @@
 #include <utility>
 
 #include "app/OnrampOSXAppDelegate.h"
+#include "app/search_wait.h"
 #include "media/CommonMessage.h"
 #include "media/KSOROSXModel.h"
 #include "pages/ChooseDeviceView.h"
 #include "pages/ModelListView.h"
-#include "platform/property_list.h"
 
 namespace onramp {
-
-namespace {
-
-constexpr std::uint32_t kFirstSearchPause = 2;    // seconds
-constexpr std::uint32_t kChooserSearchPause = 3;  // seconds
-
-}  // namespace
 
 std::shared_ptr<Page> OnrampOSXAppDelegate::loadView(const std::string& name) {
   return loadPage(name, *this);
@@ -110,10 +103,18 @@ void OnrampOSXAppDelegate::setChooseDeviceViewButton() {
 }
 
 void OnrampOSXAppDelegate::performAction(std::string_view action) {
-  if (action == "rightMostButtonClicked") rightMostButtonClicked();
-  if (action == "rightButtonClicked") rightButtonClicked();
-  if (action == "leftButtonClicked") leftButtonClicked();
-  if (action == "leftMostButtonClicked") leftMostButtonClicked();
+  struct Action {
+    std::string_view name;
+    void (OnrampOSXAppDelegate::*perform)();
+  };
+  static constexpr Action kActions[] = {
+      {"rightMostButtonClicked", &OnrampOSXAppDelegate::rightMostButtonClicked},
+      {"rightButtonClicked", &OnrampOSXAppDelegate::rightButtonClicked},
+      {"leftButtonClicked", &OnrampOSXAppDelegate::leftButtonClicked},
+      {"leftMostButtonClicked", &OnrampOSXAppDelegate::leftMostButtonClicked}};
+  for (const Action& known : kActions) {
+    if (known.name == action) (this->*known.perform)();
+  }
 }
 
 void OnrampOSXAppDelegate::rightMostButtonClicked() {
@@ -154,18 +155,13 @@ void OnrampOSXAppDelegate::nextFromModelList(const ModelListView& page) {
     setConnentionTypeViewButton();
     return;
   }
-  writeDictionaryAtomically(instmodelPlistNotWiFi(mChoosedModel.value_or("")), instmodelPlistURL());
-  launchPackage();
-  quitMe();
+  handOverAndQuit(instmodelPlistNotWiFi(mChoosedModel.value_or("")));
 }
 
 void OnrampOSXAppDelegate::nextFromConnectionType(const ConnectionTypeView& page) {
   if (page.chooseDeviceType() != ConnectionTypeView::kWirelessRow) {
-    if (mChoosedModel) {
-      writeDictionaryAtomically(instmodelPlistNotWiFi(*mChoosedModel), instmodelPlistURL());
-    }
-    launchPackage();
-    quitMe();
+    handOverAndQuit(mChoosedModel ? std::optional(instmodelPlistNotWiFi(*mChoosedModel))
+                                  : std::nullopt);
     return;
   }
   if (ChooseDeviceView* const search = chooser()) search->startBrowsing();
@@ -178,9 +174,7 @@ void OnrampOSXAppDelegate::nextFromConnectionType(const ConnectionTypeView& page
 void OnrampOSXAppDelegate::nextFromChooser(const ChooseDeviceView& page) {
   const std::optional<Dictionary> entry = page.choosedDevice();
   const auto device = entry ? entry->dictionary(ChooseDeviceView::kKSDevice) : std::nullopt;
-  writeDictionaryAtomically(instmodelPlistWiFi(mChoosedModel, device), instmodelPlistURL());
-  launchPackage();
-  quitMe();
+  handOverAndQuit(instmodelPlistWiFi(mChoosedModel, device));
 }
 
 void OnrampOSXAppDelegate::backToModelList() {

@@ -1,4 +1,7 @@
+#include "app/search_wait.h"
+
 #include <any>
+#include <cstdint>
 
 #include "app/OnrampOSXAppDelegate.h"
 #include "media/CommonMessage.h"
@@ -11,9 +14,7 @@ namespace onramp {
 
 namespace {
 
-constexpr int kMostPauses = 5;
-
-// The sheet reads its message as a format, in which a percent sign is written twice.
+// The message texts are format strings, with "%%" for a percent sign. The sheet takes plain text.
 std::string textOfFormat(std::string format) {
   for (std::size_t at = format.find("%%"); at != std::string::npos; at = format.find("%%", at)) {
     format.erase(at++, 1);
@@ -23,40 +24,54 @@ std::string textOfFormat(std::string format) {
 
 }  // namespace
 
-void OnrampOSXAppDelegate::showProgress(const std::shared_ptr<Page>& page, std::uint32_t seconds) {
-  setWaiting(page, true);
+void OnrampOSXAppDelegate::showProgress(const std::shared_ptr<Page>& page,
+                                        std::chrono::seconds pause) {
+  setWaiting(page.get(), true);
   {
     OperationQueue queue;
-    queue.addOperation([this, seconds] { waitDeviceSearchTask(seconds); });
+    if (!queue.addOperation([this, pause] { waitDeviceSearchTask(pause); })) {
+      waitOnMainLoop(pause, kMostPauses);
+    }
     runModalForWindow(window);
   }
-  setWaiting(page, false);
+  if (ChooseDeviceView* const search = chooser()) search->stopBrowsing();
+  setWaiting(page.get(), false);
 }
 
-void OnrampOSXAppDelegate::setWaiting(const std::shared_ptr<Page>& page, bool waiting) {
-  if (auto* const connections = dynamic_cast<ConnectionTypeView*>(page.get())) {
+void OnrampOSXAppDelegate::setWaiting(Page* page, bool waiting) {
+  if (auto* const connections = dynamic_cast<ConnectionTypeView*>(page)) {
     connections->progressON(waiting);
-  } else if (auto* const devices = dynamic_cast<ChooseDeviceView*>(page.get())) {
+  } else if (auto* const devices = dynamic_cast<ChooseDeviceView*>(page)) {
     devices->progressON(waiting);
   }
-  ChooseDeviceView* const search = chooser();
-  if (search && !waiting) search->stopBrowsing();
   rightButton.setEnabled(!waiting);
   leftButton.setEnabled(!waiting);
   rightMostButton.setEnabled(!waiting);
-  if (search) search->deviceListPopupButtonEnable(!waiting);
+  if (ChooseDeviceView* const list = chooser()) list->deviceListPopupButtonEnable(!waiting);
   canWindowClose = !waiting;
 }
 
-void OnrampOSXAppDelegate::waitDeviceSearchTask(std::uint32_t seconds) const {
-  for (int pause = 0; pause < kMostPauses; ++pause) {
-    if (!sleepOffMainThread(seconds) || listedDevices() > 0) break;
+void OnrampOSXAppDelegate::waitDeviceSearchTask(std::chrono::seconds pause) const {
+  for (int pauses = 0; pauses < kMostPauses; ++pauses) {
+    if (!sleepOffMainThread(static_cast<std::uint32_t>(pause.count())) || listedDevices() > 0)
+      break;
   }
   abortModal();
 }
 
-void OnrampOSXAppDelegate::showProgressAtChooseDeviceView(std::uint32_t seconds) {
-  showProgress(mChooseDeviceViewController, seconds);
+// The same pauses for a system that has no thread left: the modal loop runs them as timers.
+void OnrampOSXAppDelegate::waitOnMainLoop(std::chrono::seconds pause, int pausesLeft) {
+  scheduleTimer(static_cast<double>(pause.count()), [this, pause, pausesLeft] {
+    if (pausesLeft > 1 && listedDevices() == 0) {
+      waitOnMainLoop(pause, pausesLeft - 1);
+    } else {
+      abortModal();
+    }
+  });
+}
+
+void OnrampOSXAppDelegate::showProgressAtChooseDeviceView(std::chrono::seconds pause) {
+  showProgress(mChooseDeviceViewController, pause);
   const bool found = listedDevices() > 0;
   if (!found) showListAlertSheet();
   rightMostButton.setEnabled(found);
@@ -67,7 +82,7 @@ void OnrampOSXAppDelegate::showProgressAtChooseDeviceViewByRefresh(
   const auto entry = notification.userInfo.find(kWaitTime);
   const auto* const seconds =
       entry == notification.userInfo.end() ? nullptr : std::any_cast<int>(&entry->second);
-  showProgressAtChooseDeviceView(seconds ? static_cast<std::uint32_t>(*seconds) : 0);
+  showProgressAtChooseDeviceView(std::chrono::seconds(seconds ? *seconds : 0));
 }
 
 void OnrampOSXAppDelegate::showListAlertSheet() {

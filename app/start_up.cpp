@@ -1,10 +1,10 @@
-#include <filesystem>
-
 #include "app/OnrampOSXAppDelegate.h"
 #include "media/CommonMessage.h"
 #include "media/KSOROSXCD.h"
+#include "media/KSOROSXModel.h"
 #include "pages/ChooseDeviceView.h"
 #include "platform/bundle.h"
+#include "platform/property_list.h"
 
 namespace onramp {
 
@@ -15,7 +15,7 @@ struct RetitledItem {
   const char* key;
 };
 
-// The message tables on the media spell the third key like this.
+// The message tables on the media misspell the third key in the same way.
 constexpr RetitledItem kApplicationMenuItems[] = {{"About", "APP_MENU_ABOUT"},
                                                   {"Hide", "APP_MENU_HIDE"},
                                                   {"Hide Others", "APP_MENU_HIDEOHTERS"},
@@ -29,11 +29,6 @@ void retitleApplicationMenu() {
     applicationMenu.itemWithTitle(item.title).setTitle(localized(item.key, item.title));
   }
   setMainMenu(menu);
-}
-
-void removeFile(const std::string& path) {
-  std::error_code ignored;
-  std::filesystem::remove(path, ignored);
 }
 
 }  // namespace
@@ -83,25 +78,25 @@ void OnrampOSXAppDelegate::applicationWillFinishLaunching() {
     return;
   }
   // What an earlier run left must not pass for this run's choices.
-  removeFile(instmodelPlistURL());
-  removeFile(InstallPKGInfoURL());
+  removeDictionary(instmodelPlistURL());
+  removeDictionary(InstallPKGInfoURL());
 }
 
 void OnrampOSXAppDelegate::applicationDidFinishLaunching() {
   const std::vector<std::string> models = allContainedModels();
   mContainedModelCount = static_cast<std::uint32_t>(models.size());
-  if (!isSupportWiFi(models)) {
-    launchPackage();
-    quitMe();
-    return;
-  }
-  const ConnectionType shared = checkIF(models);
-  if (shared != ConnectionType::kNeither) {
-    showConnectionTypeView(shared);
-    setConnentionTypeViewButton();
-  } else {
-    showModelListView();
-    setModelListViewButton();
+  switch (firstPage(models, KSOROSXModel::modelInfo())) {
+    case FirstPage::kNone:
+      handOverAndQuit(std::nullopt);
+      return;
+    case FirstPage::kConnectionType:
+      showConnectionTypeView(checkIF(models));
+      setConnentionTypeViewButton();
+      break;
+    case FirstPage::kModelList:
+      showModelListView();
+      setModelListViewButton();
+      break;
   }
   window.makeKeyAndOrderFront();
 }

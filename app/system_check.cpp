@@ -1,5 +1,4 @@
 #include "app/OnrampOSXAppDelegate.h"
-#include "base/ascii.h"
 #include "media/CommonMessage.h"
 #include "platform/alert.h"
 #include "platform/system_version.h"
@@ -13,19 +12,8 @@ constexpr const char* kMinor = "Minor";
 constexpr const char* kBugFix = "BugFix";
 constexpr std::string_view kPlaceholder = "%@";
 
-struct SystemVersion {
-  std::int64_t major = 0;
-  std::int64_t minor = 0;
-  std::int64_t bugFix = 0;
-};
-
-// Components that the version does not have, as in 10.9, count as 0.
 SystemVersion runningVersion() {
-  const std::vector<std::string> components = OnrampOSXAppDelegate::getSystemVersion();
-  const auto component = [&](std::size_t index) {
-    return index < components.size() ? leadingInteger(components[index]) : 0;
-  };
-  return {component(0), component(1), component(2)};
+  return systemVersion(OnrampOSXAppDelegate::getSystemVersion());
 }
 
 std::vector<std::string> split(std::string_view text, std::string_view separator) {
@@ -60,41 +48,20 @@ std::vector<std::string> OnrampOSXAppDelegate::getSystemVersion() {
 }
 
 SystemSupport OnrampOSXAppDelegate::supportedOSMaxCheck() const {
-  const SystemVersion system = runningVersion();
-  const Dictionary& maximum = mKSInstallerInfo.supportSystemMax();
-  const auto newerIf = [](bool newer) {
-    return newer ? SystemSupport::kNewerThanMaximum : SystemSupport::kSupported;
-  };
-  const std::int64_t major = maximum.integerValue(kMajor);
-  if (system.major != major) return newerIf(system.major > major);
-  const std::int64_t minor = maximum.integerValue(kMinor);
-  if (system.minor != minor) return newerIf(system.minor > minor);
-  if (asciiLowercased(maximum.string(kBugFix).value_or("")) == "x")
-    return SystemSupport::kSupported;
-  // The bug-fix release is the first one that is not supported, unlike the other two bounds.
-  return newerIf(system.bugFix >= maximum.integerValue(kBugFix));
+  return isNewerThan(mKSInstallerInfo.supportSystemMax(), runningVersion())
+             ? SystemSupport::kNewerThanMaximum
+             : SystemSupport::kSupported;
 }
 
 SystemSupport OnrampOSXAppDelegate::supportedOSMinCheck() const {
-  const SystemVersion system = runningVersion();
-  const Dictionary& minimum = mKSInstallerInfo.supportSystemMin();
-  const auto olderIf = [](bool older) {
-    return older ? SystemSupport::kOlderThanMinimum : SystemSupport::kSupported;
-  };
-  const std::int64_t major = minimum.integerValue(kMajor);
-  if (system.major != major) return olderIf(system.major < major);
-  const std::int64_t minor = minimum.integerValue(kMinor);
-  if (system.minor != minor) return olderIf(system.minor < minor);
-  return olderIf(system.bugFix < minimum.integerValue(kBugFix));
+  return isOlderThan(mKSInstallerInfo.supportSystemMin(), runningVersion())
+             ? SystemSupport::kOlderThanMinimum
+             : SystemSupport::kSupported;
 }
 
 SystemSupport OnrampOSXAppDelegate::installationCheck() const {
-  if (mKSInstallerInfo.supportSystemMax().integerValue(kMajor) != 0) {
-    const SystemSupport support = supportedOSMaxCheck();
-    if (support != SystemSupport::kSupported) return support;
-  }
-  if (mKSInstallerInfo.supportSystemMin().integerValue(kMajor) != 0) return supportedOSMinCheck();
-  return SystemSupport::kSupported;
+  return systemSupport(runningVersion(), mKSInstallerInfo.supportSystemMin(),
+                       mKSInstallerInfo.supportSystemMax());
 }
 
 std::string OnrampOSXAppDelegate::supportSystemMinString() const {

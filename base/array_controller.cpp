@@ -8,7 +8,7 @@ namespace onramp {
 
 namespace {
 
-// A view into the entry, so that sorting thousands of entries copies no text.
+// Returns a view, so that sorting thousands of entries copies no text.
 std::string_view sortText(const Dictionary& entry, const std::string& key) {
   const Value* const value = entry.find(key);
   const auto* const text = value ? value->as<std::string>() : nullptr;
@@ -29,7 +29,7 @@ void ArrayController::removeObject(const Dictionary& entry) {
   std::size_t kept = 0;
   std::optional<std::size_t> selection;
   for (std::size_t i = 0; i < entries_.size(); ++i) {
-    if (selection_ == i) selection = kept;  // for a removed entry: where its successor will be
+    if (selection_ == i) selection = kept;  // if this entry is removed, its successor moves here
     if (entries_[i] == entry) continue;
     if (kept != i) entries_[kept] = std::move(entries_[i]);
     ++kept;
@@ -44,6 +44,7 @@ void ArrayController::removeObject(const Dictionary& entry) {
 void ArrayController::removeAllObjects() {
   entries_.clear();
   selection_.reset();
+  hasChoice_ = false;
   entriesChanged();
 }
 
@@ -70,6 +71,11 @@ void ArrayController::rearrange() {
 void ArrayController::setSelectionIndex(std::size_t index) {
   selection_ = index < entries_.size() ? std::optional(index) : std::nullopt;
   if (onSelect_) onSelect_();
+}
+
+void ArrayController::choose(std::size_t index) {
+  hasChoice_ = true;
+  setSelectionIndex(index);
 }
 
 void ArrayController::setSelectedObject(const Dictionary& entry) {

@@ -11,43 +11,53 @@
 
 namespace onramp {
 
-/// Holds a list's entries, their order and the selection, and feeds the table that shows them.
-/// Main thread only, but for arrangedCount().
+/// Holds the entries of a list, their order and the selection, and updates the table that shows
+/// them. All functions except arrangedCount() must be called on the main thread.
 class ArrayController {
  public:
-  /// Entries are shown in ascending order of their text under `key`, compared byte by byte, from
-  /// the next rearrange() on. Without a sort key they stay in the order in which they were added.
+  /// Makes rearrange() sort the entries by their text under `key`, ascending, compared byte by
+  /// byte. An entry without such a text sorts as if the text were empty. Without a sort key entries
+  /// stay in the order in which they were added.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
-  /// Appends entries; they take their places at the next rearrange().
+  /// Appends `entries`. The next rearrange() sorts them in. If the list was empty, the first of
+  /// them becomes the selected entry.
   void addObjects(std::vector<Dictionary> entries);
 
-  /// Removes every entry equal to `entry`.
+  /// Removes every entry equal to `entry`. If the selected entry is among them, the next entry that
+  /// stays becomes selected, or the last one when no entry follows.
   void removeObject(const Dictionary& entry);
 
   void removeAllObjects();
 
-  /// Sorts the entries anew. The selected entry stays selected.
+  /// Sorts the entries by the sort key. Entries that compare equal keep their order. The selected
+  /// entry stays selected.
   void rearrange();
 
   [[nodiscard]] const std::vector<Dictionary>& arrangedObjects() const { return entries_; }
 
-  /// The number of listed entries. Callable from any thread.
+  /// The number of entries. Callable from any thread.
   [[nodiscard]] std::size_t arrangedCount() const { return count_; }
 
-  /// Selects the entry at `index`; past the end, nothing is selected.
+  /// Selects the entry at `index`. An index past the end clears the selection.
   void setSelectionIndex(std::size_t index);
 
-  /// Selects the first entry equal to `entry`; nothing is selected when there is none.
+  /// Selects the first entry equal to `entry`. Clears the selection when there is none.
   void setSelectedObject(const Dictionary& entry);
 
-  /// A list with entries always has a selected one unless it was taken away on purpose: the first
-  /// entry added is selected, and when the selected one is removed its successor is.
+  /// Selects the entry at `index` because the user wants it. The table that is bound calls this.
+  void choose(std::size_t index);
+
+  /// Whether the user has chosen an entry since the last removeAllObjects().
+  [[nodiscard]] bool hasChoice() const { return hasChoice_; }
+
+  /// The selected entry; nothing when the list is empty or the selection was cleared.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 
-  /// `onChange` is called after every change of the entries, `onSelect` after every other change of
-  /// the selection. The table that is bound sets them; there is one at the most.
+  /// Sets what a table does about changes: `onChange` is called now and after every change of the
+  /// entries, `onSelect` after a change of the selection alone. They replace those of an earlier
+  /// call; empty functions unbind the table.
   void bind(std::function<void()> onChange, std::function<void()> onSelect);
 
  private:
@@ -55,6 +65,7 @@ class ArrayController {
 
   std::vector<Dictionary> entries_;
   std::optional<std::size_t> selection_;
+  bool hasChoice_ = false;
   std::atomic<std::size_t> count_ = 0;
   std::string sortKey_;
   std::function<void()> onChange_;

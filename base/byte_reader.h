@@ -8,9 +8,10 @@
 
 namespace onramp {
 
-/// Reads bytes that come from the network or the medium, front to back and never past their end. A
-/// read that does not fit returns nothing and leaves the reader where it was. A copy reads on
-/// independently, so it serves to look ahead. The bytes have to outlive the reader.
+/// Reads bytes that come from the network or the medium, from front to back and never past their
+/// end. A read that does not fit returns nothing and does not move the reader. A copy has a
+/// position of its own, which allows looking ahead. The bytes must outlive the reader and all
+/// copies.
 class ByteReader {
  public:
   explicit ByteReader(std::span<const std::byte> bytes) : rest_(bytes) {}
@@ -20,7 +21,7 @@ class ByteReader {
   [[nodiscard]] std::size_t remaining() const { return rest_.size(); }
   [[nodiscard]] bool atEnd() const { return rest_.empty(); }
 
-  /// The next byte.
+  /// Reads one byte.
   [[nodiscard]] std::optional<std::uint8_t> byte() {
     if (rest_.empty()) return std::nullopt;
     const auto value = std::to_integer<std::uint8_t>(rest_.front());
@@ -28,7 +29,7 @@ class ByteReader {
     return value;
   }
 
-  /// The next `count` bytes.
+  /// Reads `count` bytes.
   [[nodiscard]] std::optional<std::span<const std::byte>> take(std::uint64_t count) {
     if (count > rest_.size()) return std::nullopt;
     const auto taken = rest_.first(static_cast<std::size_t>(count));
@@ -36,14 +37,14 @@ class ByteReader {
     return taken;
   }
 
-  /// The next `count` bytes as characters.
+  /// Reads `count` bytes as characters.
   [[nodiscard]] std::optional<std::string_view> text(std::uint64_t count) {
     const auto taken = take(count);
     if (!taken) return std::nullopt;
     return std::string_view(reinterpret_cast<const char*>(taken->data()), taken->size());
   }
 
-  /// The unsigned big-endian number in the next `size` bytes. A size above 8 returns nothing.
+  /// Reads an unsigned big-endian number of `size` bytes; nothing also when `size` is above 8.
   [[nodiscard]] std::optional<std::uint64_t> number(std::size_t size) {
     if (size > sizeof(std::uint64_t)) return std::nullopt;
     const auto bytes = take(size);
@@ -54,10 +55,11 @@ class ByteReader {
     return value;
   }
 
-  /// Moves past the next `count` bytes; false, and no move, when fewer are left.
+  /// Moves past the next `count` bytes. Returns false, without moving, when fewer are left.
   [[nodiscard]] bool skip(std::uint64_t count) { return take(count).has_value(); }
 
-  /// Makes the input end after the next `count` bytes; false, and no change, when fewer are left.
+  /// Makes the input end after the next `count` bytes. Returns false, without a change, when fewer
+  /// are left.
   [[nodiscard]] bool narrow(std::uint64_t count) {
     if (count > rest_.size()) return false;
     rest_ = rest_.first(static_cast<std::size_t>(count));

@@ -8,18 +8,20 @@
 
 namespace onramp {
 
-/// Texts under keys, each shown wherever an interface file binds its key. Main thread only.
+/// A table of texts by key. A text is shown wherever an interface file binds its key. All functions
+/// must be called on the main thread.
 class KeyValueTexts {
  public:
   using Setter = std::function<void(const std::string&)>;
 
-  /// Stores the text and hands it to everything bound to the key.
+  /// Stores `text` under `key` and passes it to every setter bound to the key.
   void setValueForKey(const std::string& text, std::string_view key);
 
-  /// The text under `key`; empty when none was set.
+  /// Returns the text under `key`; empty when none was set.
   [[nodiscard]] std::string valueForKey(std::string_view key) const;
 
-  /// Calls `setter` with the key's text now, if it has one, and with every later one.
+  /// Calls `setter` now if `key` has a text, and again whenever a text is set for it. A setter
+  /// stays bound as long as this object lives.
   void bind(std::string_view key, Setter setter);
 
  private:

@@ -9,35 +9,35 @@
 
 namespace onramp {
 
-/// What a notification carries besides its name. Each name has its own keys and types, said where
-/// it is posted.
+/// The data of a notification. The keys and the types of their values depend on the notification's
+/// name and are documented where the name is declared.
 using UserInfo = std::map<std::string, std::any, std::less<>>;
 
 struct Notification {
   std::string name;
-  const void* object = nullptr;  ///< who posted it, for comparison only; may be null
+  const void* object = nullptr;  ///< the poster, for comparison only; may be null
   UserInfo userInfo;
 };
 
-/// Hands every posted notification to those who observe its name, at once, in the order in which
-/// they registered. Main thread only.
+/// Delivers every posted notification to the observers of its name, synchronously and in the order
+/// in which they were added. All functions must be called on the main thread.
 class NotificationCenter {
  public:
   using Handler = std::function<void(const Notification&)>;
 
-  /// The process's one default centre.
+  /// The centre that the whole process shares.
   [[nodiscard]] static NotificationCenter& defaultCenter();
 
-  /// Calls `handler` for every posting of `name`, whoever posts it, until `observer` is removed.
-  /// `observer` is an identity only; it is never dereferenced.
+  /// Calls `handler` for every notification `name` from any poster, until `observer` is removed.
+  /// `observer` only identifies the observation and is never dereferenced.
   void addObserver(const void* observer, std::string_view name, Handler handler);
 
-  /// Ends all observations of `observer`. An observer removed while a notification is handed round
-  /// does not get it any more.
+  /// Removes all observations of `observer`. An observer removed during a delivery that has not
+  /// reached it yet is not called.
   void removeObserver(const void* observer);
 
-  /// Handlers may add and remove observers and post further notifications; an observer added while
-  /// a notification is handed round does not get that one.
+  /// Calls the observers of the notification's name. Handlers may add and remove observers and post
+  /// further notifications. An observer added during a delivery does not get that notification.
   void post(const Notification& notification);
 
  private:

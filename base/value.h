@@ -16,10 +16,10 @@ namespace onramp {
 
 class Value;
 
-/// Raw bytes, as a property list's data element holds them.
+/// The bytes of a property list's data element.
 using Data = std::vector<std::byte>;
 
-/// A point in time, in seconds since 2001-01-01 00:00:00 UTC, as property lists count it.
+/// A point in time, in seconds since 2001-01-01 00:00:00 UTC, the epoch of property lists.
 struct Date {
   double secondsSinceReferenceDate = 0;
   friend auto operator<=>(const Date&, const Date&) = default;
@@ -27,42 +27,44 @@ struct Date {
 
 using Array = std::vector<Value>;
 
-/// An immutable, string-keyed record. Copies share their contents, so passing one by value is
-/// cheap.
+/// An immutable table of values by text key. Copies share their contents, so passing one by value
+/// is cheap.
 class Dictionary {
  public:
-  /// A key and its value; see below.
+  /// A key and its value.
   struct Pair;
 
   /// The empty dictionary.
   Dictionary() = default;
 
-  /// Of several pairs with the same key the first one counts.
+  /// If several pairs have the same key, the first one counts.
   Dictionary(std::initializer_list<Pair> pairs);
   explicit Dictionary(std::vector<Pair> pairs);
 
-  /// The value under `key`, or null when there is none. Lives as long as this dictionary's
-  /// contents.
+  /// Returns the value under `key`, or null when there is none. The pointer is valid while this
+  /// dictionary or a copy of it exists.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
-  /// The value under `key` if it is a string, a dictionary, an array; nothing (or null) otherwise.
+  /// Return the value under `key` if it is of the function's kind, otherwise nothing or null. The
+  /// array pointer is valid while this dictionary or a copy of it exists.
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;
 
-  /// The truth of the number under `key`; nothing when it is absent or not a number.
+  /// Whether the number or boolean under `key` is other than zero; nothing when the value is absent
+  /// or of another kind.
   [[nodiscard]] std::optional<bool> boolean(std::string_view key) const;
 
-  /// The integer reading of the value under `key`; 0 when it is absent. See Value::integerValue.
+  /// Returns the value under `key` converted by Value::integerValue(); 0 when it is absent.
   [[nodiscard]] std::int64_t integerValue(std::string_view key) const;
 
-  /// This dictionary with `value` under `key`, whether or not the key was there before.
+  /// Returns a copy that has `value` under `key`, in place of an earlier value if there was one.
   [[nodiscard]] Dictionary with(std::string_view key, Value value) const;
 
   [[nodiscard]] std::size_t size() const;
   [[nodiscard]] bool empty() const { return size() == 0; }
 
-  /// Pairs in ascending byte order of their keys.
+  /// The pairs in ascending byte order of their keys.
   [[nodiscard]] const Pair* begin() const;
   [[nodiscard]] const Pair* end() const;
 
@@ -75,7 +77,7 @@ class Dictionary {
 /// One property-list value.
 class Value {
  public:
-  /// An integer is signed wherever it fits; the unsigned kind holds those of 2^63 and above only.
+  /// An integer is stored as signed if it fits. The unsigned kind holds only integers from 2^63 on.
   using Storage = std::variant<bool, std::int64_t, std::uint64_t, double, std::string, Data, Date,
                                Array, Dictionary>;
 
@@ -93,17 +95,20 @@ class Value {
 
   [[nodiscard]] const Storage& storage() const { return storage_; }
 
-  /// The value as that kind, or null when it is of another kind.
+  /// Returns the content if it is of type `Kind`, otherwise null. The pointer is valid as long as
+  /// the value.
   template <typename Kind>
   [[nodiscard]] const Kind* as() const {
     return std::get_if<Kind>(&storage_);
   }
 
-  /// The truth of a number (non-zero is true); nothing for a value that is no number.
+  /// Whether a number or boolean is other than zero; nothing for all other kinds.
   [[nodiscard]] std::optional<bool> boolean() const;
 
-  /// A number cut to an integer and kept within the signed 64-bit range; for a string likewise its
-  /// leading decimal integer, after blanks and a sign; 0 for everything else.
+  /// Converts the value to an integer. A real number is cut towards zero; NaN gives 0. A string
+  /// gives the decimal integer that it begins with, after white space and one sign; 0 without one.
+  /// A result outside the signed 64-bit range gives the nearest end of the range. All other kinds
+  /// give 0.
   [[nodiscard]] std::int64_t integerValue() const;
 
   friend bool operator==(const Value& a, const Value& b) { return a.storage_ == b.storage_; }
@@ -119,7 +124,7 @@ struct Dictionary::Pair {
   friend bool operator==(const Pair& a, const Pair& b) = default;
 };
 
-/// The leading decimal integer of `text`, by the rule of Value::integerValue.
+/// Returns the decimal integer that `text` begins with, as Value::integerValue() does for a string.
 [[nodiscard]] std::int64_t leadingInteger(std::string_view text);
 
 }  // namespace onramp

@@ -1,4 +1,4 @@
-# Which backends a program is linked with: one for each part of the seam.
+# ONRAMP_BACKENDS: the backends that the program is linked with, one for each part of the seam.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)
@@ -12,8 +12,8 @@ else()
   set(ONRAMP_UI qt CACHE STRING "The front end: qt, or cocoa to try the one of macOS on GNUstep")
   set_property(CACHE ONRAMP_UI PROPERTY STRINGS qt cocoa)
   if(ONRAMP_UI STREQUAL "qt")
-    set(ONRAMP_BACKENDS onramp_qt onramp_avahi onramp_freedesktop onramp_libplist onramp_standin onramp_posix
-      onramp_sockets)
+    set(ONRAMP_BACKENDS onramp_qt onramp_avahi onramp_freedesktop onramp_xdg_open onramp_libplist onramp_standin
+      onramp_posix onramp_sockets)
   elseif(ONRAMP_UI STREQUAL "cocoa")
     include(gnustep)
     set(ONRAMP_BACKENDS onramp_cocoa onramp_gnustep onramp_avahi onramp_standin onramp_posix onramp_sockets)

@@ -1,5 +1,5 @@
-# Assembles a medium to run from: the example medium's files with the application's bundle beside
-# them. The build tree's own copy lies in ONRAMP_MEDIUM.
+# Assembles a medium that the application can run from, in ONRAMP_MEDIUM: the example medium's files
+# and the application's bundle.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
@@ -18,7 +18,7 @@ foreach(folder IN LISTS onramp_languages)
     ${onramp_contents}/Resources/${language})
 endforeach()
 
-# The folders of the example medium go first, so that nothing stays there that is no longer in it.
+# Old folders are removed first, so that files deleted from the example medium do not stay.
 add_custom_target(medium ALL
   COMMAND ${CMAKE_COMMAND} -E rm -rf ${ONRAMP_MEDIUM}/MacResources ${ONRAMP_MEDIUM}/Packages
     ${ONRAMP_MEDIUM}/Utilities ${onramp_contents}/Resources

@@ -1,15 +1,16 @@
-# What every room's library and every test is built with.
+# Common options, and a function for each kind of target.
 
 add_library(onramp_options INTERFACE)
 target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})
 target_compile_options(onramp_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
-  # GCC 12 takes the libraries' own string concatenation for an overlapping copy.
+  # GCC 12 mistakes string concatenation in the standard library for an overlapping copy.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
-  # The calls for network services and the system's version have no successors in C.
+  # The C functions for network services and the system's version are deprecated without successors.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
-# Every object file is instrumented, third-party headers' code included, so these are global.
+# These options are global, so that every object file is instrumented, including code from
+# third-party headers.
 if(ONRAMP_SANITIZE)
   add_compile_options(-fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
   add_link_options(-fsanitize=address,undefined)
@@ -19,7 +20,7 @@ if(ONRAMP_FUZZ)
 endif()
 
 # onramp_library(NAME SOURCES… [LINK libraries…]): a room's static library. Its files are compiled one
-# by one in unity builds, too: a program needs backends only for those that it uses.
+# by one even in unity builds, so that a program needs backends only for the files that it uses.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
@@ -29,9 +30,9 @@ function(onramp_library name)
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 
-# onramp_backend(NAME SOURCES… [LINK libraries…]): what fulfils the seam, or a part of it. Its objects
-# are linked as they are: the rooms' libraries refer to them and come after them on the linker's
-# line, where it would no longer take them out of a static library.
+# onramp_backend(NAME SOURCES… [LINK libraries…]): an implementation of the seam or a part of it. It is
+# an object library, because the rooms' libraries refer to it and come after it on the linker's
+# command line, where the linker would ignore a static library.
 function(onramp_backend name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})
@@ -50,9 +51,9 @@ function(onramp_test name)
   set_tests_properties(${name} PROPERTIES TIMEOUT 300)
 endfunction()
 
-# onramp_namespace_test(NAME …): as onramp_test, but as root of a network namespace of its own; skipped
-# where there can be none. What ctest runs a test through, CMake calls an emulator. The test finds
-# its scripts in SOURCE_FOLDER.
+# onramp_namespace_test(NAME …): as onramp_test, but the test runs as root in a new network namespace
+# and is skipped where none can be made. CMake calls the program that ctest runs a test through an
+# emulator. SOURCE_FOLDER is defined as the folder of the test's scripts.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})
@@ -63,9 +64,9 @@ function(onramp_namespace_test name)
   endif()
 endfunction()
 
-# onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]): a libFuzzer program. ctest gives it a
-# short run that starts from the folder corpus/NAME, or another one there, beside its source; finds go
-# to the build folder.
+# onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]): a libFuzzer program. ctest runs it
+# briefly on the seeds in the folder corpus/NAME, or corpus/CORPUS, beside its source. Inputs that it
+# finds go to the build folder.
 function(onramp_fuzz name)
   if(NOT ONRAMP_FUZZ)
     return()

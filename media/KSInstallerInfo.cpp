@@ -11,7 +11,8 @@ namespace onramp {
 
 namespace {
 
-// The key of the package for a system version in binary-coded decimal, if it has one.
+// The key of the package for a system version, which is in binary-coded decimal; nothing when
+// versions like it have no key.
 std::optional<std::string_view> packageKey(std::int32_t version) {
   struct Rule {
     std::int32_t atLeast;
@@ -31,7 +32,8 @@ std::optional<std::string_view> packageKey(std::int32_t version) {
 }
 
 std::optional<std::string> packageName(const Dictionary& pkg) {
-  if (auto name = pkg.string("PkgName")) return name;
+  // An entry of another type names no package either, but it still takes precedence.
+  if (pkg.find("PkgName")) return pkg.string("PkgName");
   const auto key = packageKey(gestaltSystemVersion().value_or(0));
   return key ? pkg.string(*key) : std::nullopt;
 }

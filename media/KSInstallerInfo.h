@@ -13,16 +13,17 @@ struct FileURL {
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
 
-/// Where the installer package and the wireless set-up tool lie on the medium, and which systems
-/// the medium supports. Read once from the medium, when the object is made.
+/// The places of the installer package and the wireless set-up tool on the medium, and the systems
+/// that the medium supports. The constructor reads the medium; nothing is read afterwards.
 class KSInstallerInfo {
  public:
   /// Reads the medium that the application lies on.
   KSInstallerInfo();
 
-  /// Sets everything from a medium resource dictionary; from none, the defaults.
+  /// Sets everything from a medium resource dictionary, or to the defaults when there is none.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
+  // Each sets its own part.
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);
@@ -34,8 +35,8 @@ class KSInstallerInfo {
   /// resource dictionary could not be read.
   [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
 
-  /// Version dictionaries with "Major", "Minor" and "BugFix", as strings or numbers. A "Major" of 0
-  /// sets no bound, and that is the default.
+  /// Version dictionaries with "Major", "Minor" and "BugFix", as strings or numbers. A "Major" of
+  /// 0, which is the default, sets no bound.
   [[nodiscard]] const Dictionary& supportSystemMin() const { return mSystemMin; }
   [[nodiscard]] const Dictionary& supportSystemMax() const { return mSystemMax; }
 

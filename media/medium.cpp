@@ -36,4 +36,10 @@ std::optional<Dictionary> loadNamedDictionary(const std::optional<Dictionary>& r
   return relativePath ? loadDictionary(fullPath(relativePath)) : std::nullopt;
 }
 
+std::string vendorName(const std::optional<Dictionary>& resources) {
+  std::string vendor = resources ? resources->string(kVenderName).value_or("") : "";
+  std::erase(vendor, ' ');
+  return vendor;
+}
+
 }  // namespace onramp::medium

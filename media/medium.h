@@ -18,24 +18,27 @@ inline constexpr std::string_view kSystemMax = "SystemMax";
 inline constexpr std::string_view kWLANtool = "WLANtool";
 inline constexpr std::string_view kVenderName = "VenderName";
 
-/// The path without closing "/"; the root stays "/".
+/// `path` without a closing "/"; the root stays "/".
 [[nodiscard]] std::string withoutClosingSlash(std::string path);
 
-/// The full path of `relativePath`, which counts from the folder that holds the bundle at
-/// `bundlePath`. A null relative path gives that folder; a bundle path of one component gives the
-/// relative path as it stands. A closing "/" is dropped. Nothing is asked of the disk.
+/// The full path of `relativePath`, which is relative to the folder that holds the bundle at
+/// `bundlePath`. Without a relative path the result is that folder; when the bundle's path has one
+/// component, it is the relative path. A closing "/" is dropped. The disk is not accessed.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 
 /// The same for the running application's bundle.
 [[nodiscard]] std::string fullPath(const std::optional<std::string>& relativePath);
 
-/// The medium resource dictionary, read from the medium anew; nothing when it cannot be read.
+/// Reads the medium resource dictionary; nothing when it cannot be read.
 [[nodiscard]] std::optional<Dictionary> loadResourceDictionary();
 
-/// The property-list dictionary whose relative path `resources` holds under `key`; nothing when the
-/// path is absent or no such file can be read.
+/// Reads the property-list dictionary whose relative path `resources` holds under `key`; nothing
+/// when the path is absent or the file cannot be read.
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
+
+/// The vendor name that `resources` holds, without its blanks; empty when there is none.
+[[nodiscard]] std::string vendorName(const std::optional<Dictionary>& resources);
 
 }  // namespace onramp::medium

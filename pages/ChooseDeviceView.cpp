@@ -1,10 +1,10 @@
 #include "pages/ChooseDeviceView.h"
 
-#include <algorithm>
 #include <utility>
 
 #include "base/notification_center.h"
 #include "bonjour/KSDevice.h"
+#include "bonjour/model_match.h"
 #include "media/CommonMessage.h"
 #include "media/KSInstallerInfo.h"
 #include "platform/bundle.h"
@@ -15,14 +15,12 @@ namespace onramp {
 
 namespace {
 
-constexpr int kRefreshWaitSeconds = 3;
-
-// A tool without a name of its own is called by its file's name.
+// The tool's display name in the user's language, or its file's name when it has none.
 std::string setupToolName() {
   const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
   if (!tool) return "";
   if (const auto bundle = Bundle::open(tool->path)) {
-    if (auto name = bundle->infoString("CFBundleDisplayName")) return *name;
+    if (auto name = bundle->localizedInfoString("CFBundleDisplayName")) return *name;
   }
   std::string name = tool->path.substr(tool->path.rfind('/') + 1);
   return name.substr(0, name.rfind('.'));
@@ -101,7 +99,7 @@ void ChooseDeviceView::stopBrowsing() {
   if (!mBonjourSearch) return;
   mBonjourSearch->stopBrowsing();
   mBonjourSearch->removeKSDeviceObserver(this);
-  // The search may be what calls, so it stays until the current event is over.
+  // The search may be the caller, so it exists until the current event is over.
   performOnMainThread([search = std::exchange(mBonjourSearch, nullptr)] {});
 }
 
@@ -113,7 +111,7 @@ void ChooseDeviceView::refreshBrowsing() {
   NotificationCenter::defaultCenter().post(
       {.name = std::string(kDeviceWaitNotification),
        .object = this,
-       .userInfo = {{std::string(kWaitTime), kRefreshWaitSeconds}}});
+       .userInfo = {{std::string(kWaitTime), static_cast<int>(kRefreshPause.count())}}});
 }
 
 void ChooseDeviceView::setupWizardMenu() {
@@ -143,9 +141,7 @@ void ChooseDeviceView::removeKSDevice(const Dictionary& device) {
 }
 
 bool ChooseDeviceView::doesMatchedModel(const Dictionary& device) const {
-  const std::string model = device.string(KSDevice::kUSBManufacturer).value_or("") + " " +
-                            device.string(KSDevice::kUSBModel).value_or("");
-  return std::find(searchModelList.begin(), searchModelList.end(), model) != searchModelList.end();
+  return isOneOf(searchModelList, device);
 }
 
 bool ChooseDeviceView::doesWiFi(const Dictionary& device) {
@@ -159,8 +155,12 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // The user's choice stays when a search reports the chosen device anew.
-  if (isSelected) deviceArrayController.setSelectedObject(entry);
+  // Until the user chooses, the first row is selected; their choice survives later reports.
+  if (!deviceArrayController.hasChoice()) {
+    deviceArrayController.setSelectionIndex(0);
+  } else if (isSelected) {
+    deviceArrayController.setSelectedObject(entry);
+  }
 }
 
 void ChooseDeviceView::removeServiceFromList(const Dictionary& device) {
@@ -172,13 +172,7 @@ void ChooseDeviceView::deviceListPopupButtonEnable(bool enable) {
 }
 
 void ChooseDeviceView::progressON(bool on) {
-  if (on) {
-    progress.startAnimation();
-  } else {
-    progress.stopAnimation();
-  }
-  progress.setHidden(!on);
-  progressTxtField.setHidden(!on);
+  showWaiting(progress, progressTxtField, on);
 }
 
 }  // namespace onramp

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <cstddef>
 #include <memory>
 #include <optional>
@@ -15,18 +16,18 @@
 
 namespace onramp {
 
-// What the page asks the application for, by notification.
+// Notifications with which the page asks the application for something.
 
 /// Launch the wireless set-up tool. Carries nothing.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Wait for the device search. Carries under kWaitTime the seconds per pause, an int.
+/// Wait for the device search. Carries the seconds per pause, an int, under kWaitTime.
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
-/// The page that lists the devices found on the network: those of the models looked for that say
-/// themselves that they are on wireless. Made once; its list and its search survive page changes.
-/// While it searches, the search holds it: stopBrowsing() lets go.
+/// The page that lists the devices found on the network that are of a model being looked for and
+/// that themselves report being on wireless. The page is made once; its list and its search survive
+/// page changes. The search owns the page while it runs; stopBrowsing() ends that.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
@@ -37,6 +38,9 @@ class ChooseDeviceView final : public Page,
   static constexpr std::string_view kLocation = "location";    ///< string, its first address
   static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
 
+  /// The length of a pause in the wait that a refresh asks for.
+  static constexpr std::chrono::seconds kRefreshPause{3};
+
   explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
   ChooseDeviceView(const ChooseDeviceView&) = delete;
   ChooseDeviceView& operator=(const ChooseDeviceView&) = delete;
@@ -45,10 +49,10 @@ class ChooseDeviceView final : public Page,
   /// The models to look for, as "manufacturer model" texts.
   void setSearchModelList(std::vector<std::string> models);
 
-  /// Starts a new search; the list keeps what it has.
+  /// Starts a new search, ending the one that runs. The list keeps its entries.
   void startBrowsing();
 
-  /// Ends the search; the list keeps what it has. Without a search, nothing.
+  /// Ends the search. The list keeps its entries. Does nothing when no search is running.
   void stopBrowsing();
 
   /// Empties the list, starts a new search and asks the application to wait for it.
@@ -60,29 +64,31 @@ class ChooseDeviceView final : public Page,
   /// The number of devices listed. Callable from any thread.
   [[nodiscard]] std::size_t deviceArrayControllerCnt() const;
 
-  /// The selected list entry; nothing when none is selected.
+  /// The selected list entry; nothing when no entry is selected.
   [[nodiscard]] std::optional<Dictionary> choosedDevice() const;
 
+  /// Enables or disables the pop-up button with the page's commands.
   void deviceListPopupButtonEnable(bool enable);
 
   /// Shows or hides the waiting state.
   void progressON(bool on);
 
-  /// From the search. Asking a device whether it is on wireless may block for seconds.
+  /// Called by the search. The first two ask the device whether it is on wireless, which may block
+  /// for seconds.
   void addKSDevice(const Dictionary& device) override;
   void updateKSDevice(const Dictionary& device) override;
   void removeKSDevice(const Dictionary& device) override;
 
-  /// Whether the device is one of the models looked for. Without any, none is.
+  /// Whether the device is of a model being looked for. Always false when no models have been set.
   [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
 
-  /// Whether the device answers that it is on wireless. Blocks.
+  /// Whether the device answers that it is on wireless. Blocks for seconds when it does not answer.
   [[nodiscard]] static bool doesWiFi(const Dictionary& device);
 
-  /// Lists the device, in place of an entry equal to the one that it makes.
+  /// Adds the device's entry to the list, replacing an equal entry if there is one.
   void setServiceToList(const Dictionary& device);
 
-  /// Takes the entry equal to the one that the device makes off the list.
+  /// Removes the device's entry from the list.
   void removeServiceFromList(const Dictionary& device);
 
  private:
@@ -92,7 +98,7 @@ class ChooseDeviceView final : public Page,
   std::shared_ptr<KSBonjourSearch> mBonjourSearch;  ///< null when not browsing
   std::vector<std::string> searchModelList;
 
-  // The controller comes before the table that is bound to it.
+  // The table is bound to the controller, which is therefore destroyed after it.
   ArrayController deviceArrayController;
   TableView deviceListView;
   TextField deviceListTitle;

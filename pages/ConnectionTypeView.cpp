@@ -49,13 +49,7 @@ void ConnectionTypeView::setChooseButton(int row, int column) {
 }
 
 void ConnectionTypeView::progressON(bool on) {
-  if (on) {
-    progress.startAnimation();
-  } else {
-    progress.stopAnimation();
-  }
-  progress.setHidden(!on);
-  progressTxtField.setHidden(!on);
+  showWaiting(progress, progressTxtField, on);
   connectionTypeRadioButton.setEnabled(!on);
 }
 

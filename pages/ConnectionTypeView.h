@@ -9,24 +9,25 @@
 
 namespace onramp {
 
-/// The page that asks how the device is connected. Made anew each time it is shown.
+/// The page that asks how the device is connected. A new one is made each time it is shown.
 class ConnectionTypeView final : public Page {
  public:
-  /// The rows of the choice.
+  // Rows of the radio buttons.
   static constexpr int kWirelessRow = 0;
   static constexpr int kWiredRow = 1;
 
   explicit ConnectionTypeView(std::unique_ptr<Interface> interface);
 
-  /// Sets both choices' titles and images; the selection stays.
+  /// Sets the titles and images of both choices. The selection does not change.
   void setConnectionType(ConnectionType type);
 
   /// The selected row: kWirelessRow or kWiredRow.
   [[nodiscard]] int chooseDeviceType() const;
 
+  /// Selects a choice.
   void setChooseButton(int row, int column);
 
-  /// Shows or hides the waiting state, in which nothing can be chosen.
+  /// Shows or hides the waiting state, in which the choice cannot be changed.
   void progressON(bool on);
 
   /// Full path of the medium's folder of images.

@@ -10,22 +10,22 @@
 
 namespace onramp {
 
-/// The page that lists the medium's models. Made anew each time it is shown.
+/// The page that lists the medium's models. A new one is made each time it is shown.
 class ModelListView final : public Page {
  public:
   explicit ModelListView(std::unique_ptr<Interface> interface);
 
-  /// Name of the selected model; nothing when none is.
+  /// Name of the selected model; nothing when no model is selected.
   [[nodiscard]] std::optional<std::string> choosedModelName() const;
 
-  /// Selects the model of that name.
+  /// Selects the model with that name; nothing is selected when the list has none.
   void setChoosedModel(const std::string& name);
 
  private:
   void awakeFromNib();
   void addModelToList();
 
-  // The controller comes before the table that is bound to it.
+  // The table is bound to the controller, which is therefore destroyed after it.
   ArrayController modelArrayController;
   TableView modelListView;
   TextField modelListTitle;

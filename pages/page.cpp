@@ -23,4 +23,11 @@ std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner) {
   return std::make_shared<Page>(std::move(interface));
 }
 
+void showWaiting(const ProgressIndicator& progress, const TextField& text, bool on) {
+  if (on) progress.startAnimation();
+  progress.setHidden(!on);
+  if (!on) progress.stopAnimation();
+  text.setHidden(!on);
+}
+
 }  // namespace onramp

@@ -2,13 +2,16 @@
 
 #include <memory>
 #include <string>
+#include <string_view>
+#include <utility>
 
 #include "platform/interface_file.h"
+#include "platform/outlets.h"
 
 namespace onramp {
 
-/// What the window shows at a time: a view and everything loaded with it. Which page it is, its
-/// class says; a view of a class that this program does not know is a plain Page.
+/// One page of the wizard: a view and everything loaded with it. Its class tells which page it is;
+/// a view of a class that this program does not know gives a plain Page.
 class Page {
  public:
   explicit Page(std::unique_ptr<Interface> interface) : interface_(std::move(interface)) {}
@@ -28,7 +31,10 @@ class Page {
   std::unique_ptr<Interface> interface_;
 };
 
-/// The page made from the interface file `name`; null when the file is missing or holds no view.
+/// Makes the page in the interface file `name`. Null when the file is missing or holds no view.
 [[nodiscard]] std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner);
+
+/// Shows or hides a page's waiting state: a turning spinner and the text beside it.
+void showWaiting(const ProgressIndicator& progress, const TextField& text, bool on);
 
 }  // namespace onramp

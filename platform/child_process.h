@@ -6,9 +6,8 @@
 
 namespace onramp {
 
-/// Runs the program at `executable` with `arguments` and blocks until it ends. Its exit status;
-/// nothing when it could not be started or was ended by a signal. Whether the main loop turns
-/// meanwhile is up to the platform.
+/// Runs the program at `executable` with `arguments` and blocks the calling thread until it ends.
+/// Returns its exit status; nothing when it could not be started or was ended by a signal.
 [[nodiscard]] std::optional<int> runAndWait(const std::string& executable,
                                             const std::vector<std::string>& arguments);
 

@@ -5,12 +5,13 @@
 namespace onramp {
 
 enum class FolderDomain {
-  kUser,   ///< the current user's own
-  kLocal,  ///< shared by all users of this computer
+  kUser,   ///< the current user's folder
+  kLocal,  ///< the folder that all users of this computer share
 };
 
-/// Absolute path of the domain's application-support folder, without a closing "/". The folder is
-/// created when it is absent; that this failed shows only when something is written there.
+/// Returns the absolute path of the domain's application-support folder, without a trailing "/".
+/// Tries to create the folder if it does not exist; a failure shows only when a file is written
+/// there.
 [[nodiscard]] std::string applicationSupportFolder(FolderDomain domain);
 
 }  // namespace onramp

@@ -1,13 +1,14 @@
 #pragma once
 
 #include <functional>
+#include <system_error>
 #include <thread>
 #include <vector>
 
 namespace onramp {
 
-/// Runs operations off the main thread, each on a thread of its own. Destruction waits for all of
-/// them, so whatever an operation refers to has to outlive the queue, not the operation.
+/// Runs operations off the main thread, each on its own thread. The destructor waits for all of
+/// them, so whatever an operation refers to must exist until the queue is destroyed.
 class OperationQueue {
  public:
   OperationQueue() = default;
@@ -18,8 +19,14 @@ class OperationQueue {
       thread.join();
   }
 
-  void addOperation(std::function<void()> operation) {
-    threads_.emplace_back(std::move(operation));
+  /// Starts `operation`. False when the system gives no thread for it; it is then not run.
+  [[nodiscard]] bool addOperation(std::function<void()> operation) {
+    try {
+      threads_.emplace_back(std::move(operation));
+    } catch (const std::system_error&) {
+      return false;
+    }
+    return true;
   }
 
  private:

@@ -9,26 +9,32 @@
 
 namespace onramp {
 
-// The limits of a property list that is read. The description of a medium with 5,000 models takes
-// about a megabyte and 60,000 objects, four levels deep.
+// Limits on the property lists that are read. For comparison, the description of a medium with
+// 5,000 models takes about a megabyte and 60,000 objects, nested four levels deep.
 
-/// Bytes of a file, and of all texts and data that the shared references of a binary list expand
-/// to.
+/// The maximum size of a file in bytes. Also the maximum total size of all texts and data after
+/// expanding the shared references of a binary list.
 inline constexpr std::size_t kMostPropertyListBytes = std::size_t{16} << 20;
 
-/// Containers, texts, numbers … of a list. A shared object counts wherever it is referred to.
+/// The maximum number of values in a list, containers included. A shared object counts once for
+/// each reference to it.
 inline constexpr std::uint64_t kMostPropertyListObjects = std::uint64_t{1} << 18;
 
-/// Containers inside each other.
+/// The maximum nesting depth of containers.
 inline constexpr std::size_t kMostPropertyListDepth = 128;
 
-/// The dictionary that the XML or binary property list at `path` holds. Nothing when the file is
-/// absent or unreadable, holds something else, or exceeds a limit above.
+/// Reads the dictionary in the XML or binary property list at `path`. Returns nothing when the file
+/// is absent, unreadable or malformed, holds something other than a dictionary, or exceeds a limit
+/// above.
 [[nodiscard]] std::optional<Dictionary> loadDictionary(const std::string& path);
 
-/// Writes `dictionary` as an XML property list. The file appears under its name whole or not at
-/// all: a temporary file beside it is moved into place. False when it could not be written;
-/// whatever lay at `path` before is then untouched.
+/// Writes `dictionary` to `path` as an XML property list. The write is atomic: a temporary file in
+/// the same folder is completed and then renamed. Returns false when it failed; a file that was at
+/// `path` is then unchanged.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
+
+/// Removes the file or the folder tree at `path`, and the temporary files that killed processes
+/// left when writing to it. Ignores failures.
+void removeDictionary(const std::string& path);
 
 }  // namespace onramp

@@ -17,7 +17,7 @@ struct Termination {
   bool begun = false;
 };
 
-// Never destroyed: the process may exit while a thread still sleeps.
+// Never destroyed, because a thread may still sleep while the process exits.
 Termination& termination() {
   static Termination* const instance = std::make_unique<Termination>().release();
   return *instance;

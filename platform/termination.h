@@ -2,13 +2,13 @@
 
 namespace onramp {
 
-// How a front end tells threads that sleep that the application is about to end. Each function is
-// callable from any thread.
+// Connects a front end, which knows when the application terminates, with the threads that sleep in
+// sleepOffMainThread(). Both functions are callable from any thread.
 
 /// Whether beginTermination() was called.
 [[nodiscard]] bool isTerminating();
 
-/// Makes every sleepOffMainThread() return false, now and later.
+/// Makes every current and future call of sleepOffMainThread() return false.
 void beginTermination();
 
 }  // namespace onramp

@@ -5,13 +5,14 @@
 
 namespace onramp {
 
-/// The user's language as a two- or three-letter ISO 639 code in small letters, such as "ja".
+/// The user's language as an ISO 639 code of two or three lower-case letters, such as "ja".
 [[nodiscard]] std::string localeLanguageCode();
 
-/// The user's country as a two-letter ISO 3166 code in capitals, such as "JP"; empty when unknown.
+/// The user's country as an ISO 3166 code of two upper-case letters, such as "JP"; empty when
+/// unknown.
 [[nodiscard]] std::string localeCountryCode();
 
-/// The languages that the user reads, most preferred first, as identifiers such as "zh_CN" or "de".
+/// The user's languages, most preferred first, as identifiers such as "zh_CN" or "de".
 [[nodiscard]] std::vector<std::string> preferredLanguages();
 
 }  // namespace onramp

@@ -4,12 +4,12 @@
 
 namespace onramp {
 
-/// Has the desktop open the file or bundle at `path` with the program made for it. Returns at once;
-/// true when the desktop took the request.
+/// Asks the desktop to open the file or bundle at `path` in its default program. Does not wait for
+/// that program. Returns whether the desktop accepted the request.
 bool openFile(const std::string& path);
 
-/// Has the desktop open `url` in the user's browser. Returns at once; true when the desktop took
-/// the request.
+/// Asks the desktop to open `url` in the user's browser. Does not wait for the browser. Returns
+/// whether the desktop accepted the request.
 bool openURL(const std::string& url);
 
 }  // namespace onramp

@@ -4,7 +4,7 @@
 
 #include <functional>
 
-/// A function as the target of controls, menu items, timers and messages to other threads.
+/// Wraps a function as the target of controls, menu items, timers and messages between threads.
 @interface OnrampAction : NSObject {
   std::function<void()> _function;
 }

@@ -10,7 +10,7 @@
   return action;
 }
 
-// The function may let go of the last reference to this object.
+// The function may release the last reference to this object.
 - (void)perform:(id)sender {
   [[self retain] autorelease];
   _function();

@@ -7,7 +7,7 @@
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
-/// Gets a sheet's answer, passes it on and lets go of itself.
+/// Receives a sheet's answer, passes it on and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }
@@ -25,8 +25,9 @@
          returnCode:(NSInteger)returnCode
         contextInfo:(void*)contextInfo {
   [self autorelease];
-  _didEnd(returnCode == NSAlertFirstButtonReturn ? onramp::kAlertDefaultReturn
-                                                 : onramp::kAlertOtherReturn);
+  // A sheet may also be ended from elsewhere, with a code that is none of its buttons'.
+  _didEnd(returnCode == NSAlertSecondButtonReturn ? onramp::kAlertOtherReturn
+                                                  : onramp::kAlertDefaultReturn);
 }
 
 @end
@@ -52,6 +53,8 @@ void runCriticalAlert(const std::string& messageText, const std::string& informa
   const Retained<NSAlert> alert = makeAlert(messageText, informativeText);
   [alert.get() setAlertStyle:NSCriticalAlertStyle];
   [alert.get() addButtonWithTitle:toNSString(buttonTitle)];
+  // The alert at launch comes before the application is active, and would open behind the Finder.
+  [NSApp activateIgnoringOtherApps:YES];
   [alert.get() runModal];
 }
 
@@ -60,6 +63,8 @@ void beginAlertSheet(const AlertSheet& sheet, const Window& window,
   const Retained<NSAlert> alert = makeAlert(sheet.title, sheet.message);
   [alert.get() addButtonWithTitle:toNSString(sheet.defaultButton)];
   [alert.get() addButtonWithTitle:toNSString(sheet.otherButton)];
+  // The user may quit or log out while the sheet is up.
+  [[alert.get() window] setPreventsApplicationTerminationWhenModal:NO];
   [alert.get() beginSheetModalForWindow:cocoa::nativeOf<NSWindow>(window)
                           modalDelegate:[[OnrampSheetEnd alloc] initWithFunction:std::move(didEnd)]
                          didEndSelector:@selector(alertDidEnd:returnCode:contextInfo:)

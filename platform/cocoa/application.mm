@@ -7,7 +7,7 @@
 #import "platform/cocoa/retained.h"
 #include "platform/termination.h"
 
-/// Passes on to the controller what the application and its window ask and tell.
+/// Forwards the application's and the window's events and questions to the controller.
 @interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
   onramp::ApplicationDelegate* _delegate;
 }
@@ -51,7 +51,7 @@ namespace onramp {
 
 using cocoa::Retained;
 
-// The arguments are the platform's: it reads its own options from them.
+// AppKit reads its own options from the process's arguments.
 int runApplication(int, char**, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate) {
   @autoreleasepool {
@@ -59,7 +59,7 @@ int runApplication(int, char**, const std::string& mainInterfaceName,
     const std::unique_ptr<ApplicationDelegate> delegate = makeDelegate();
     const std::unique_ptr<Interface> mainInterface = Interface::load(mainInterfaceName, *delegate);
     if (!mainInterface) {
-      std::fprintf(stderr, "%s: no interface file %s; copy the application anew\n",
+      std::fprintf(stderr, "%s: no interface file %s; copy the application again\n",
                    Bundle::main().path().c_str(), mainInterfaceName.c_str());
       return 1;
     }
@@ -83,7 +83,7 @@ void hideApplication() {
 }
 
 void unhideApplication() {
-  [NSApp unhideWithoutActivation];
+  [NSApp unhide:nil];
 }
 
 void activateIgnoringOtherApps() {

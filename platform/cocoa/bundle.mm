@@ -10,7 +10,7 @@ using cocoa::toStdString;
 
 namespace {
 
-// The platform keeps one object for each bundle that was opened.
+// NSBundle keeps one object for each bundle that was opened.
 NSBundle* bundleAt(const std::string& path) {
   return [NSBundle bundleWithPath:toNSString(path)];
 }
@@ -36,6 +36,11 @@ Dictionary Bundle::infoDictionary() const {
 
 std::optional<std::string> Bundle::infoString(std::string_view key) const {
   return infoDictionary().string(key);
+}
+
+std::optional<std::string> Bundle::localizedInfoString(const std::string& key) const {
+  const id text = [bundleAt(path_) objectForInfoDictionaryKey:toNSString(key)];
+  return [text isKindOfClass:[NSString class]] ? std::optional(toStdString(text)) : std::nullopt;
 }
 
 std::optional<std::string> Bundle::pathForResource(const std::string& name,

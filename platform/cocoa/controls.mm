@@ -55,7 +55,7 @@ void PopUpButton::removeItem(std::size_t index) const {
   [nativeOf<NSPopUpButton>(*this) removeItemAtIndex:static_cast<NSInteger>(index)];
 }
 
-// A menu item does not own its target, but its represented object it does.
+// A menu item retains its represented object but not its target, so the action is both.
 void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {
   NSPopUpButton* const button = nativeOf<NSPopUpButton>(*this);
   if (!button) return;

@@ -4,18 +4,18 @@
 
 #include "platform/interface_file.h"
 
-/// Stands for an InterfaceOwner towards an interface file: bindings to any key of it show the
-/// owner's text under that key.
+/// The file's owner in an interface file, in place of an InterfaceOwner. A binding to any of its
+/// keys shows the InterfaceOwner's text under that key.
 @interface OnrampFileOwner : NSObject {
   onramp::InterfaceOwner* _owner;
   NSMutableSet* _boundKeys;
   NSWindow* _window;
 }
 
-/// `owner` outlives the object.
+/// `owner` must outlive the object.
 - (instancetype)initWithOwner:(onramp::InterfaceOwner&)owner;
 
-/// The window that the file connects to the outlet of this name; nil without one.
+/// The window that the file connects to the outlet "window"; nil when it connects none.
 - (NSWindow*)window;
 - (void)setWindow:(NSWindow*)window;
 

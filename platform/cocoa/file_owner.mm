@@ -23,12 +23,12 @@
   return _window;
 }
 
-// The interface that the window was loaded with owns it.
+// Not retained: the interface that the window was loaded with owns it.
 - (void)setWindow:(NSWindow*)window {
   _window = window;
 }
 
-// A binding asks for its key's text first; from then on it is told of every new one.
+// A binding begins by asking for its key's value. From then on it is notified of every change.
 - (id)valueForUndefinedKey:(NSString*)key {
   const std::string name = onramp::cocoa::toStdString(key);
   if (![_boundKeys containsObject:key]) {

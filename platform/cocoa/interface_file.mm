@@ -67,8 +67,7 @@ NSView* findView(NSView* view, NSString* identifier, Class kind) {
   return nil;
 }
 
-// What the file says in words itself, in the user's language. What a control without a title is
-// for, its tool tip says to the eye and, by the same words, to assistive programs.
+// Translates the tool tips, which also serve as accessibility labels of untitled controls.
 void localize(NSView* view, const std::string& interfaceName) {
   if (const std::string key = toStdString([view toolTip]); !key.empty()) {
     NSString* const text = toNSString(Bundle::main().localizedString(key, key, interfaceName));
@@ -79,14 +78,14 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// An action that the file sends to the first responder is one of the owner's.
+// Actions that the file sends to the first responder are the owner's.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {
     NSButton* const button = static_cast<NSButton*>(view);
     if ([button action] && ![button target]) {
-      std::string name = toStdString(NSStringFromSelector([button action]));
-      name.resize(name.find(':'));
+      const std::string selector = toStdString(NSStringFromSelector([button action]));
+      const std::string name = selector.substr(0, selector.find(':'));
       OnrampAction* const action =
           [OnrampAction actionWithFunction:[&owner, name] { owner.performAction(name); }];
       actions.emplace_back(action);
@@ -98,8 +97,8 @@ void connectActions(NSView* view, InterfaceOwner& owner,
     connectActions(subview, owner, actions);
 }
 
-// Null when there is no such file; a damaged one makes the loader raise an exception or report a
-// failure.
+// The file's top-level objects; nil when there is no such file or it is damaged, which the loader
+// reports by an exception or a result.
 NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
   NSArray* topLevelObjects = nil;
   @try {
@@ -116,7 +115,7 @@ NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
 
 Interface::Interface(std::unique_ptr<Tree> tree) : tree_(std::move(tree)) {}
 
-// A page that is still shown goes from the window with its interface.
+// Removes the page from the window if it is still shown.
 Interface::~Interface() {
   [rootView(tree_->topLevelObjects.get()) removeFromSuperview];
 }
@@ -133,7 +132,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {
-    // The wizard may end itself while a sheet or a modal loop has the window.
+    // The wizard may quit while a sheet or a modal loop runs on the window.
     [window setPreventsApplicationTerminationWhenModal:NO];
     localize([window contentView], name);
     connectActions([window contentView], owner, tree -> actions);
@@ -145,12 +144,12 @@ View Interface::view() const {
   return View(cocoa::toNative(rootView(tree_->topLevelObjects.get())));
 }
 
-// The file says the class by the view's identifier: the classes themselves are none of Cocoa's.
+// The identifier carries the page class, which AppKit does not know.
 std::string Interface::viewClass() const {
   return toStdString([rootView(tree_->topLevelObjects.get()) identifier]);
 }
 
-// Views go by their identifiers, the window by the owner's outlet.
+// Views are found by their identifiers, the window by the owner's outlet.
 NativeObject* Interface::find(std::string_view name, OutletKind kind) const {
   NSWindow* const window = [tree_->owner.get() window];
   if (kind == OutletKind::kWindow) return name == kWindowOutlet ? cocoa::toNative(window) : nullptr;

@@ -10,7 +10,7 @@ std::string localeLanguageCode() {
 }
 
 std::string localeCountryCode() {
-  return toStdString([[NSLocale currentLocale] objectForKey:NSLocaleCountryCode]);
+  return toStdString([[[NSLocale currentLocale] objectForKey:NSLocaleCountryCode] uppercaseString]);
 }
 
 std::vector<std::string> preferredLanguages() {

@@ -8,8 +8,9 @@
 
 namespace onramp::cocoa {
 
-/// The property-list object as a dictionary; nothing when it is none, or goes past the limits of
-/// nesting depth, number of objects and bytes of texts and data.
+/// Converts a property-list object to a dictionary. Leaves out members that are no property-list
+/// objects. Nothing when it is no dictionary, or exceeds the limits of nesting depth, number of
+/// objects, and bytes of texts and data.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
 /// `value` as a property-list object.

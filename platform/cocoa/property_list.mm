@@ -5,17 +5,18 @@
 
 #import "platform/cocoa/property_list.h"
 #import "platform/cocoa/text.h"
+#include "platform/posix/file.h"
 
 namespace onramp {
 
 namespace {
 
-// Turns a property list into a value, as far as the limits go.
+// Converts a property list to a value, within the limits.
 class Reader {
  public:
   std::optional<Value> read(id object, std::size_t depth) {
-    if (depth > kMostPropertyListDepth || ++objects_ > kMostPropertyListObjects)
-      return std::nullopt;
+    if (depth > kMostPropertyListDepth || ++objects_ > kMostPropertyListObjects) isExceeded_ = true;
+    if (isExceeded_) return std::nullopt;
     if ([object isKindOfClass:[NSString class]]) return string(object);
     if ([object isKindOfClass:[NSNumber class]]) return number(object);
     if ([object isKindOfClass:[NSDictionary class]]) return dictionary(object, depth);
@@ -28,7 +29,7 @@ class Reader {
   }
 
  private:
-  // The two booleans are objects of their own; every other number says by its type what it is.
+  // The two booleans are singletons; any other number's type tells its kind.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);
@@ -42,10 +43,11 @@ class Reader {
     return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
   }
 
-  // Objects may share a text or data, values copy it: what that comes to is limited like a file.
-  bool takes(unsigned long long bytes) {
+  // Objects may share texts and data but values copy them, so the copies are limited like a file.
+  bool takes(std::size_t bytes) {
     bytes_ += bytes;
-    return bytes_ <= kMostPropertyListBytes;
+    if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;
+    return !isExceeded_;
   }
 
   std::optional<Value> string(NSString* string) {
@@ -59,12 +61,14 @@ class Reader {
     return Value(Data(bytes, bytes + [data length]));
   }
 
+  // Leaves out what is no property-list object: systems have put an NSURL into the information
+  // dictionaries of bundles.
   std::optional<Value> array(NSArray* array, std::size_t depth) {
     Array values;
     for (id object in array) {
       std::optional<Value> value = read(object, depth + 1);
-      if (!value) return std::nullopt;
-      values.push_back(*std::move(value));
+      if (isExceeded_) return std::nullopt;
+      if (value) values.push_back(*std::move(value));
     }
     return Value(std::move(values));
   }
@@ -73,16 +77,17 @@ class Reader {
     std::vector<Dictionary::Pair> pairs;
     for (id key in dictionary) {
       std::optional<Value> value = read([dictionary objectForKey:key], depth + 1);
-      if (!value || ![key isKindOfClass:[NSString class]] || !takes([key length])) {
-        return std::nullopt;
-      }
+      if (isExceeded_) return std::nullopt;
+      if (!value || ![key isKindOfClass:[NSString class]]) continue;
+      if (!takes([key length])) return std::nullopt;
       pairs.emplace_back(cocoa::toStdString(key), *std::move(value));
     }
     return Value(Dictionary(std::move(pairs)));
   }
 
   std::uint64_t objects_ = 0;
-  unsigned long long bytes_ = 0;
+  std::size_t bytes_ = 0;
+  bool isExceeded_ = false;
 };
 
 struct ToPropertyList {
@@ -112,7 +117,8 @@ struct ToPropertyList {
   }
 };
 
-// Only a file that is small enough is read at all. The attributes are a link's own.
+// The bytes of a regular file within the size limit. Links are resolved first, because the
+// attributes of a link are its own.
 NSData* contents(NSString* path) {
   NSString* const file = [path stringByResolvingSymlinksInPath];
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file
@@ -161,7 +167,12 @@ bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& 
                                                  format:NSPropertyListXMLFormat_v1_0
                                                 options:0
                                                   error:nullptr];
-  return [data writeToFile:cocoa::toNSString(path) atomically:YES];
+  if (!data) return false;
+  return posix::writeFileAtomically(path, {static_cast<const char*>([data bytes]), [data length]});
+}
+
+void removeDictionary(const std::string& path) {
+  posix::removeWithTemporaries(path);
 }
 
 }  // namespace onramp

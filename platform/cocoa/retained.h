@@ -12,10 +12,10 @@ class Retained {
  public:
   Retained() = default;
 
-  /// Adds a reference of its own.
+  /// Retains `object`.
   explicit Retained(Class* object) : object_([object retain]) {}
 
-  /// Takes over the reference that alloc, new or copy gave.
+  /// Takes over the reference that alloc, new or copy returned.
   [[nodiscard]] static Retained adopt(Class* object) {
     Retained owner;
     owner.object_ = object;

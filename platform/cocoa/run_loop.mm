@@ -4,6 +4,7 @@
 
 #include <utility>
 
+#include "platform/application.h"
 #import "platform/cocoa/action.h"
 #import "platform/cocoa/native.h"
 
@@ -16,18 +17,18 @@ NSArray* allModes() {
                                    NSEventTrackingRunLoopMode, nil];
 }
 
-// Whether the modal loop that runs was asked to end. Main thread only.
+// Whether the running modal loop was asked to end. Main thread only.
 bool isModalAborted = false;
 
-// The action may run a loop of its own, in which its timer must not fire again. What it holds ends
-// where it has run, not with the last reference to the object, which another thread may have.
+// Runs `action` once only, even if its timer fires again inside a loop that the action runs.
+// Destroys it on the thread that ran it, although another thread may release the object last.
 OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
   }];
 }
 
-// A modal loop looks whether it was stopped when it has handled an event.
+// A modal loop checks whether it was stopped only after it has handled an event.
 void wakeEventLoop() {
   [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
                                       location:NSZeroPoint
@@ -62,9 +63,10 @@ void performOnMainThread(std::function<void()> action) {
   }
 }
 
-// The platform ends a modal loop for reasons of its own as well, such as a key that cancels; the
-// window is then still waited for.
+// AppKit may end a modal loop unasked, for example for a key that cancels; it is then run again.
 void runModalForWindow(const Window& window) {
+  // AppKit shows no window of a hidden application.
+  if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
   NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
   isModalAborted = !modal;

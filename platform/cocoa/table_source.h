@@ -6,21 +6,20 @@ namespace onramp {
 class ArrayController;
 }
 
-/// Shows an array controller's entries in a table and keeps both selections the same, for as long
-/// as it lives.
+/// Shows an array controller's entries in a table and keeps the two selections equal.
 @interface OnrampTableSource : NSObject <NSTableViewDataSource, NSTableViewDelegate> {
   NSTableView* _table;
   onramp::ArrayController* _controller;
   BOOL _isShowingSelection;
 }
 
-/// Keeps `table`; `controller` outlives the object.
+/// Retains `table`; `controller` must outlive the object.
 - (instancetype)initWithTable:(NSTableView*)table controller:(onramp::ArrayController&)controller;
 
-/// The controller's entries have changed.
+/// Call when the controller's entries have changed.
 - (void)reload;
 
-/// The controller's selection has changed.
+/// Call when the controller's selection has changed.
 - (void)showSelection;
 
 @end

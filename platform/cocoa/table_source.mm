@@ -56,14 +56,14 @@
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// What the user has selected; a selection that they took away comes back.
+// Follows the user's selection. When they deselect the row, it is selected again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;
   const NSInteger row = [_table selectedRow];
   if (row < 0) {
     [self showSelection];
   } else {
-    _controller->setSelectionIndex(static_cast<std::size_t>(row));
+    _controller->choose(static_cast<std::size_t>(row));
   }
 }
 

@@ -10,7 +10,7 @@ using cocoa::nativeOf;
 using cocoa::Retained;
 using cocoa::toNSString;
 
-// The table knows its source, the controller owns it: the source ends with the controller.
+// The controller owns the source, which the table only refers to.
 void TableView::bind(ArrayController& controller) const {
   NSTableView* const table = nativeOf<NSTableView>(*this);
   if (!table) return;

@@ -7,7 +7,7 @@ using cocoa::nativeOf;
 
 namespace {
 
-// The first control inside the view that takes the keyboard.
+// The first control inside the view, in subview order, that accepts the keyboard focus.
 NSView* firstKeyView(NSView* view) {
   if ([view isKindOfClass:[NSControl class]] && [view canBecomeKeyView]) return view;
   for (NSView* subview in [view subviews]) {

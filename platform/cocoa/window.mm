@@ -21,7 +21,11 @@ void Window::orderFront() const {
 }
 
 void Window::makeKeyAndOrderFront() const {
-  [nativeOf<NSWindow>(*this) makeKeyAndOrderFront:nil];
+  NSWindow* const window = nativeOf<NSWindow>(*this);
+  [window makeKeyAndOrderFront:nil];
+  // Since macOS 14 the system may decline to activate the application. Its window is then still
+  // brought in front of the active application's.
+  if (![NSApp isActive]) [window orderFrontRegardless];
 }
 
 void Window::close() const {

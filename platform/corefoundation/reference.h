@@ -12,10 +12,10 @@ class Reference {
  public:
   Reference() = default;
 
-  /// Takes over the reference that an operation named Create or Copy gave.
+  /// Takes over the reference that a function named Create or Copy returned.
   explicit Reference(Ref object) : object_(object) {}
 
-  /// Adds a reference of its own to an object that someone else owns.
+  /// Retains an object that somebody else owns.
   [[nodiscard]] static Reference retaining(Ref object) {
     if (object) CFRetain(object);
     return Reference(object);

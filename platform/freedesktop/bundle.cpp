@@ -25,7 +25,7 @@ bool isFile(const std::string& path) {
   return fs::is_regular_file(path, ignored);
 }
 
-// The languages that a resources folder has folders for.
+// The languages that have a folder in the resources folder, in an order of no meaning.
 std::vector<std::string> offeredLanguages(const std::string& resources) {
   std::vector<std::string> languages;
   std::error_code error;
@@ -59,6 +59,13 @@ Dictionary Bundle::infoDictionary() const {
 
 std::optional<std::string> Bundle::infoString(std::string_view key) const {
   return infoDictionary().string(key);
+}
+
+std::optional<std::string> Bundle::localizedInfoString(const std::string& key) const {
+  const auto path = pathForResource("InfoPlist", "strings");
+  const auto texts = path ? loadStringsTable(*path) : std::nullopt;
+  const auto text = texts ? texts->string(key) : std::nullopt;
+  return text ? text : infoString(key);
 }
 
 std::optional<std::string> Bundle::pathForResource(const std::string& name,

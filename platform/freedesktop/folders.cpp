@@ -12,7 +12,7 @@ namespace onramp {
 
 namespace {
 
-// The rules of the XDG base directories have relative paths ignored.
+// The XDG base directory specification says to ignore relative paths.
 std::string absolutePath(std::string_view path) {
   while (path.size() > 1 && path.ends_with('/'))
     path.remove_suffix(1);

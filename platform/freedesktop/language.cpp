@@ -15,7 +15,7 @@ struct Renamed {
   std::string_view to;
 };
 
-// Names that bundles had before codes came into use, and codes that were replaced.
+// Names that bundles used before language codes, and codes that have been replaced.
 constexpr std::array kRenamed = {
     Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},
     Renamed{"japanese", "ja"},  Renamed{"italian", "it"}, Renamed{"spanish", "es"},
@@ -48,12 +48,12 @@ std::string chineseScript(std::string_view region) {
   return region == "TW" || region == "HK" || region == "MO" ? "Hant" : "Hans";
 }
 
-// Bokmål is what a bundle that offers Norwegian offers.
+// A bundle that offers Norwegian offers Bokmål.
 std::string_view offeredAs(std::string_view code) {
   return code == "nb" ? "no" : code;
 }
 
-// How well an offered language serves a preferred one; 0 when not at all.
+// How well an offered language matches a preferred one; 0 when it does not match.
 int fitness(const Language& offered, const Language& preferred) {
   if (offered.code.empty() || offeredAs(offered.code) != offeredAs(preferred.code)) return 0;
   if (!offered.script.empty() && !preferred.script.empty() && offered.script != preferred.script) {
@@ -63,7 +63,8 @@ int fitness(const Language& offered, const Language& preferred) {
   return offered.region.empty() ? 2 : 1;
 }
 
-// Moves those of `offered` that serve `wanted` to the end of `chosen`, the fittest first.
+// Moves the languages in `offered` that match `wanted` to the end of `chosen`, the best match
+// first.
 bool choose(std::vector<std::string>& offered, const Language& wanted,
             std::vector<std::string>& chosen) {
   std::vector<std::pair<int, std::string>> fitting;
@@ -81,7 +82,7 @@ bool choose(std::vector<std::string>& offered, const Language& wanted,
 }  // namespace
 
 Language Language::parse(std::string_view identifier) {
-  // A POSIX locale's character set and modifier say nothing that counts here.
+  // The character set and the modifier of a POSIX locale do not matter here.
   identifier = identifier.substr(0, identifier.find_first_of(".@"));
   Language language;
   language.code = codeOf(takePart(identifier));
@@ -108,6 +109,12 @@ std::vector<std::string> languagesToSearch(std::vector<std::string> offered,
     if (choose(offered, Language::parse(identifier), chosen)) break;
   }
   choose(offered, Language::parse(development), chosen);
+  if (chosen.empty()) choose(offered, Language::parse("en"), chosen);
+  if (!chosen.empty()) return chosen;
+  std::erase_if(offered,
+                [](const std::string& name) { return Language::parse(name).code.empty(); });
+  const auto any = std::min_element(offered.begin(), offered.end());
+  if (any != offered.end()) chosen.push_back(*any);
   return chosen;
 }
 

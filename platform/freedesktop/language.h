@@ -6,20 +6,22 @@
 
 namespace onramp {
 
-/// What a language identifier says, whether it is written "zh_CN", "zh-Hans-CN", "zh_CN.UTF-8" or,
-/// as on old media, "German".
+/// The parts of a language identifier, in any of its spellings: "zh_CN", "zh-Hans-CN",
+/// "zh_CN.UTF-8" or, as on old media, "German".
 struct Language {
   std::string code;    ///< ISO 639, small letters; empty when the identifier is malformed
-  std::string script;  ///< ISO 15924, such as "Hans"; told from the region for Chinese
+  std::string script;  ///< ISO 15924, such as "Hans"; derived from the region for Chinese
   std::string region;  ///< ISO 3166, capitals; empty when not given
 
   [[nodiscard]] static Language parse(std::string_view identifier);
 };
 
-/// Which of the `offered` languages to look for a resource in, and in which order: those of the
-/// first of the `preferred` ones that has any, the exact region first, then the language without a
-/// region, then the same language of another region; after them those of the `development`
-/// language. A script is never exchanged for another one. Texts come back as they were offered.
+/// The `offered` languages in which to look for a resource, in that order, spelled as they were
+/// offered. First come those that match the first `preferred` language that has a match: the exact
+/// region, then the language without a region, then other regions of the language. Those that match
+/// `development` follow. When nothing matches, English is searched, and when that is not offered
+/// either, the first offered language in alphabetical order. A language in another script never
+/// matches.
 [[nodiscard]] std::vector<std::string> languagesToSearch(std::vector<std::string> offered,
                                                          const std::vector<std::string>& preferred,
                                                          const std::string& development);

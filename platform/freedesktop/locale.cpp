@@ -15,7 +15,7 @@ std::string environment(const char* name) {
   return value ? value : "";
 }
 
-// The locale that the environment names for messages; empty for the one that speaks no language.
+// The locale that the environment names for messages; empty for C and POSIX.
 std::string messagesLocale() {
   for (const char* const name : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
     const std::string locale = environment(name);
@@ -44,7 +44,7 @@ std::string localeCountryCode() {
 std::vector<std::string> preferredLanguages() {
   const std::string locale = messagesLocale();
   if (locale.empty()) return {kDefaultLanguage};
-  // As with gettext, the list counts only where messages are translated at all.
+  // As in gettext, the list is ignored in a locale without translations.
   const std::string list = environment("LANGUAGE") + ":" + locale;
   std::vector<std::string> languages;
   for (std::size_t at = 0; at <= list.size();) {

@@ -39,32 +39,46 @@ bool isWordCharacter(char c) {
 
 class Parser {
  public:
-  explicit Parser(std::string_view text) : rest_(text) {}
+  Parser(std::string_view text, ParseProblem& problem)
+      : text_(text), rest_(text), problem_(problem) {}
 
   std::optional<Dictionary> table() {
     const bool braces = skipBlanks() && take('{');
     std::vector<Dictionary::Pair> pairs;
     while (skipBlanks() && !rest_.empty() && rest_.front() != '}') {
-      if (pairs.size() == kMostPropertyListObjects || !entry(pairs)) return std::nullopt;
+      const bool full = pairs.size() == kMostPropertyListObjects;
+      if (full) refuse("more texts than the limit allows", at());
+      if (full || !entry(pairs)) return std::nullopt;
     }
-    if (braces && !take('}')) return std::nullopt;
-    if (!skipBlanks() || !rest_.empty()) return std::nullopt;
+    if (!problem_.reason.empty()) return std::nullopt;
+    if (braces && !take('}')) refuse("\"}\" expected", lastEnd_);
+    if (!skipBlanks() || !rest_.empty()) refuse("a \"}\" that closes nothing", at());
+    if (!problem_.reason.empty()) return std::nullopt;
     std::reverse(pairs.begin(), pairs.end());  // of equal keys a dictionary keeps the first
     return Dictionary(std::move(pairs));
   }
 
  private:
+  [[nodiscard]] std::size_t at() const { return text_.size() - rest_.size(); }
+
+  bool refuse(const char* reason, std::size_t where) {
+    problem_.note(reason, where);
+    return false;
+  }
+
   bool entry(std::vector<Dictionary::Pair>& pairs) {
-    const auto key = word();
+    const auto key = word("a key expected");
     if (!key || !skipBlanks()) return false;
     std::optional<std::string> text = key;
-    if (take('=')) {
+    const bool hasText = take('=');
+    if (hasText) {
       if (!skipBlanks()) return false;
-      text = word();
+      text = word("a text expected after \"=\"");
       if (!text || !skipBlanks()) return false;
     }
     pairs.emplace_back(*key, std::move(*text));
-    return take(';') || (!rest_.empty() && rest_.front() == '}');
+    return take(';') || (!rest_.empty() && rest_.front() == '}') ||
+           refuse(hasText ? "\";\" expected" : "\"=\" or \";\" expected", lastEnd_);
   }
 
   // Past blanks and comments; false when a comment does not end.
@@ -75,7 +89,7 @@ class Parser {
         rest_.remove_prefix(std::min(rest_.find_first_of("\n\r"), rest_.size()));
       } else if (rest_.starts_with("/*")) {
         const std::size_t end = rest_.find("*/", 2);
-        if (end == std::string_view::npos) return false;
+        if (end == std::string_view::npos) return refuse("a comment that does not end", at());
         rest_.remove_prefix(end + 2);
       } else {
         return true;
@@ -89,13 +103,26 @@ class Parser {
     return true;
   }
 
-  std::optional<std::string> word() {
-    if (take('"')) return quoted('"');
-    if (take('\'')) return quoted('\'');
-    const auto* const end = std::find_if_not(rest_.begin(), rest_.end(), isWordCharacter);
-    std::string word(rest_.begin(), end);
-    rest_.remove_prefix(word.size());
-    return word.empty() ? std::nullopt : std::optional(word);
+  // Nothing, for the reason `expected`, when no word stands here.
+  std::optional<std::string> word(const char* expected) {
+    const std::size_t start = at();
+    std::optional<std::string> word;
+    if (take('"')) {
+      word = quoted('"');
+    } else if (take('\'')) {
+      word = quoted('\'');
+    } else {
+      const auto* const end = std::find_if_not(rest_.begin(), rest_.end(), isWordCharacter);
+      if (end == rest_.begin()) {
+        refuse(expected, start);
+        return std::nullopt;
+      }
+      word = std::string(rest_.begin(), end);
+      rest_.remove_prefix(word->size());
+    }
+    if (!word) refuse("a quotation mark without its partner", start);
+    lastEnd_ = at();
+    return word;
   }
 
   std::optional<std::string> quoted(char quote) {
@@ -164,13 +191,21 @@ class Parser {
     return code;
   }
 
+  std::string_view text_;
   std::string_view rest_;
+  ParseProblem& problem_;
+  std::size_t lastEnd_ = 0;  ///< of the last key or text: where what should follow it is missing
 };
 
 }  // namespace
 
 std::optional<Dictionary> parseStrings(std::string_view text) {
-  return Parser(text).table();
+  ParseProblem unused;
+  return parseStrings(text, unused);
+}
+
+std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem) {
+  return Parser(text, problem).table();
 }
 
 std::optional<Dictionary> loadStringsTable(const std::string& path) {

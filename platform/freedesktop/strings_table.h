@@ -4,6 +4,7 @@
 #include <string>
 #include <string_view>
 
+#include "base/parse_problem.h"
 #include "base/value.h"
 
 namespace onramp {
@@ -15,7 +16,9 @@ namespace onramp {
 
 /// The pairs of a strings file's text: `"key" = "text";` in the grammar of old-style property
 /// lists, with comments. A key without a text stands for itself; of several texts for a key the
-/// last one counts. Nothing when the text breaks the grammar anywhere.
+/// last one counts. Nothing when the text breaks the grammar anywhere; the second form tells where
+/// and how.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
+[[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);
 
 }  // namespace onramp

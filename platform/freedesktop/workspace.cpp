@@ -9,7 +9,7 @@
 #include <system_error>
 #include <thread>
 
-#include "platform/freedesktop/process.h"
+#include "platform/posix/process.h"
 
 namespace onramp {
 
@@ -21,7 +21,7 @@ std::optional<std::string> programOnPath(std::string_view name) {
     const std::size_t end = rest.find(':');
     const std::string folder(rest.substr(0, end));
     rest.remove_prefix(end == std::string_view::npos ? rest.size() : end + 1);
-    // The empty entry, which stands for the current folder, is no place to run programs from.
+    // An empty entry means the current folder; programs are not run from there.
     if (folder.empty()) continue;
     std::string program = folder + "/" + std::string(name);
     std::error_code ignored;
@@ -36,15 +36,19 @@ bool openWithDesktop(const std::string& target) {
   const auto opener = programOnPath("xdg-open");
   const auto process = opener ? startProcess(*opener, {target}, Session::kOwn) : std::nullopt;
   if (!process) return false;
-  // Somebody has to wait for it, or a zombie stays until this program ends.
-  std::thread([process] { waitForProcess(*process); }).detach();
+  // A process that nobody waits for stays as a zombie until this program ends. That is harmless
+  // when the system gives no thread to wait in.
+  try {
+    std::thread([process] { waitForProcess(*process); }).detach();
+  } catch (const std::system_error&) {
+  }
   return true;
 }
 
 }  // namespace
 
 bool openFile(const std::string& path) {
-  // Nothing but a path begins like this: neither an option nor an address.
+  // With "./" in front, a relative path is taken neither for an option nor for an address.
   return openWithDesktop(path.starts_with('/') ? path : "./" + path);
 }
 

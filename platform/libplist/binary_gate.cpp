@@ -47,16 +47,20 @@ struct Cost {
   }
 };
 
+// Offsets, references and UIDs take any number of bytes, not only powers of two.
 bool isNumberSize(std::uint64_t size) {
-  return size == 1 || size == 2 || size == 4 || size == 8;
+  return size >= 1 && size <= 8;
 }
 
 class BinaryWalk {
  public:
-  explicit BinaryWalk(std::string_view bytes) : bytes_(bytes) {}
+  BinaryWalk(std::string_view bytes, ParseProblem& problem) : bytes_(bytes), problem_(problem) {}
 
   bool run() {
-    if (bytes_.size() < kHeader.size() + kTrailerSize || !bytes_.starts_with(kHeader)) return false;
+    if (!bytes_.starts_with(kHeader)) return refuse("a binary list of an unknown version", 0);
+    if (bytes_.size() < kHeader.size() + kTrailerSize) {
+      return refuse("a binary list that is cut off", bytes_.size());
+    }
     ByteReader trailer(bytes_.substr(bytes_.size() - kTrailerSize + 6));
     const std::uint64_t offsetSize = trailer.number(1).value_or(0);
     const std::uint64_t referenceSize = trailer.number(1).value_or(0);
@@ -66,7 +70,8 @@ class BinaryWalk {
     if (!isNumberSize(offsetSize) || !isNumberSize(referenceSize) ||
         objects > kMostPropertyListObjects || table < kHeader.size() ||
         table > bytes_.size() - kTrailerSize) {
-      return false;
+      return refuse("a binary list whose trailer (its last 32 bytes) is cut off or damaged",
+                    bytes_.size() - kTrailerSize);
     }
     referenceSize_ = static_cast<std::size_t>(referenceSize);
     objects_ = bytes_.substr(0, static_cast<std::size_t>(table));
@@ -75,14 +80,21 @@ class BinaryWalk {
     offsets_.reserve(static_cast<std::size_t>(objects));
     for (std::uint64_t i = 0; i < objects; ++i) {
       const auto offset = offsets.number(static_cast<std::size_t>(offsetSize));
-      if (!offset) return false;
+      if (!offset)
+        return refuse("a binary list whose table of offsets is cut off", objects_.size());
       offsets_.push_back(*offset);
     }
     states_.resize(offsets_.size());
-    return root < objects && visit(static_cast<std::size_t>(root), 0);
+    if (root >= objects) return refuse("a binary list without a root object", bytes_.size() - 16);
+    return visit(static_cast<std::size_t>(root), 0);
   }
 
  private:
+  bool refuse(const char* reason, std::uint64_t where) {
+    problem_.note(reason, static_cast<std::size_t>(std::min<std::uint64_t>(where, bytes_.size())));
+    return false;
+  }
+
   enum class Progress { kUnseen, kOpen, kDone };
   struct State {
     Progress progress = Progress::kUnseen;
@@ -99,14 +111,21 @@ class BinaryWalk {
   // depth limit.
   bool visit(std::size_t index, std::size_t depth) {
     State& state = states_[index];
-    if (state.progress == Progress::kOpen || depth > kMostPropertyListDepth) return false;
+    if (state.progress == Progress::kOpen) {
+      return refuse("a container that holds itself", offsets_[index]);
+    }
+    if (depth > kMostPropertyListDepth) {
+      return refuse("more containers inside each other than the limit allows", offsets_[index]);
+    }
     if (state.progress == Progress::kDone) return true;
     state.progress = Progress::kOpen;
     ByteReader object = objectAt(index);
     const auto marker = object.byte();
-    if (!marker || !measure(*marker >> 4U, *marker & 0xFU, object, state.cost, depth)) return false;
+    if (!marker || !measure(*marker >> 4U, *marker & 0xFU, object, state.cost, depth)) {
+      return refuse("a damaged object", offsets_[index]);
+    }
     state.progress = Progress::kDone;
-    return state.cost.withinLimits();
+    return state.cost.withinLimits() || refuse("more content than the limits allow", 0);
   }
 
   bool measure(std::uint64_t kind, std::uint64_t low, ByteReader& object, Cost& cost,
@@ -171,7 +190,7 @@ class BinaryWalk {
       const auto index = static_cast<std::size_t>(*item);
       if (!visit(index, depth + 1)) return false;
       cost.add(states_[index].cost);
-      if (!cost.withinLimits()) return false;
+      if (!cost.withinLimits()) return refuse("more content than the limits allow", 0);
     }
     return true;
   }
@@ -188,6 +207,7 @@ class BinaryWalk {
   }
 
   std::string_view bytes_;
+  ParseProblem& problem_;
   std::string_view objects_;  ///< the file up to the table of offsets
   std::size_t referenceSize_ = 0;
   std::vector<std::uint64_t> offsets_;
@@ -196,8 +216,12 @@ class BinaryWalk {
 
 }  // namespace
 
-bool mayReadBinary(std::string_view bytes) {
-  return bytes.size() <= kMostPropertyListBytes && BinaryWalk(bytes).run();
+bool mayReadBinary(std::string_view bytes, ParseProblem& problem) {
+  if (bytes.size() > kMostPropertyListBytes) {
+    problem.note("more bytes than the limit allows", 0);
+    return false;
+  }
+  return BinaryWalk(bytes, problem).run();
 }
 
 }  // namespace onramp::libplist

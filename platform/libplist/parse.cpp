@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <memory>
 #include <type_traits>
+#include <utility>
 
 #include "base/text.h"
 #include "platform/libplist/binary_gate.h"
@@ -55,18 +56,25 @@ void padYears(std::string& xml) {
 }  // namespace
 
 std::optional<Value> parsePropertyList(std::string bytes) {
+  ParseProblem unused;
+  return parsePropertyList(std::move(bytes), unused);
+}
+
+std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem) {
   const PlainNumbers plainNumbers;
   plist_t root = nullptr;
   if (bytes.starts_with("bplist")) {
-    if (!mayReadBinary(bytes)) return std::nullopt;
+    if (!mayReadBinary(bytes, problem)) return std::nullopt;
     plist_from_bin(bytes.data(), static_cast<std::uint32_t>(bytes.size()), &root);
   } else {
     std::optional<std::string> text = decodedText(bytes);
-    if (!text || !mayReadXML(*text)) return std::nullopt;
+    if (!text) problem.note("characters that are neither UTF-8 nor UTF-16", 0);
+    if (!text || !mayReadXML(*text, problem)) return std::nullopt;
     const std::string& xml = *text;
     plist_from_xml(xml.c_str(), static_cast<std::uint32_t>(xml.size()), &root);
   }
   const Node node(root);
+  if (!node) problem.note("no property list", 0);
   return node ? std::optional(valueOf(node.get())) : std::nullopt;
 }
 

@@ -20,4 +20,8 @@ bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& 
   return !xml.empty() && posix::writeFileAtomically(path, xml);
 }
 
+void removeDictionary(const std::string& path) {
+  posix::removeWithTemporaries(path);
+}
+
 }  // namespace onramp

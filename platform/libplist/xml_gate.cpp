@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstdint>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "platform/property_list.h"
@@ -20,24 +21,40 @@ constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XmlWalk {
  public:
-  explicit XmlWalk(std::string& text) : text_(text) {}
+  XmlWalk(std::string& text, ParseProblem& problem) : text_(text), problem_(problem) {}
 
   bool run() {
-    if (text_.find('\0') != kNone) return false;
+    if (const std::size_t null = text_.find('\0'); null != kNone) {
+      return refuse("a null character, which XML has no place for", null);
+    }
     while (at_ < text_.size()) {
       const std::size_t markup = std::min(text_.find('<', at_), text_.size());
       if (!characters(markup)) return false;
       at_ = markup;
       if (at_ < text_.size() && !markupHere()) return false;
     }
-    return containers_.empty();
+    return containers_.empty() || refuse("a container that is never closed", innermost().name);
   }
 
  private:
+  struct Container {
+    std::size_t name;
+    std::size_t nameSize;
+    std::uint64_t keys;
+  };
+
+  bool refuse(std::string reason, std::size_t where) {
+    problem_.note(std::move(reason), where);
+    return false;
+  }
+
+  [[nodiscard]] const Container& innermost() const { return containers_.back(); }
+
   bool characters(std::size_t end) {
     const std::string_view run = std::string_view(text_).substr(at_, end - at_);
     const auto entities = static_cast<std::uint64_t>(std::count(run.begin(), run.end(), '&'));
-    return spend(entities * run.size());
+    return spend(entities * run.size()) ||
+           refuse("more references (&…;) than a text may hold", at_);
   }
 
   bool markupHere() {
@@ -46,13 +63,16 @@ class XmlWalk {
     if (!here.starts_with("<!")) return skipPast(">", 1) && quotesArePaired("<") && tag();
     if (here.starts_with("<!--")) return skipPast("-->", 4);
     if (here.starts_with("<![CDATA[")) return skipPast("]]>", 9);
-    return here.starts_with("<!DOCTYPE") && skipPast(">", 9) && quotesArePaired("[");
+    if (!here.starts_with("<!DOCTYPE")) return refuse("markup of an unknown kind", at_);
+    return skipPast(">", 9) && quotesArePaired("[");
   }
 
   // Past the next `end`, from `from` characters on; the markup skipped is then `skipped_`.
   bool skipPast(std::string_view end, std::size_t from) {
     const std::size_t found = text_.find(end, at_ + from);
-    if (found == kNone) return false;
+    if (found == kNone) {
+      return refuse("markup that begins here and lacks its \"" + std::string(end) + "\"", at_);
+    }
     skipped_ = std::string_view(text_).substr(at_ + from, found - at_ - from);
     start_ = at_ + from;
     at_ = found + end.size();
@@ -60,9 +80,13 @@ class XmlWalk {
   }
 
   // Then the end found is no part of a quoted text. None of `refused` may stand in the markup.
-  [[nodiscard]] bool quotesArePaired(std::string_view refused = "") const {
-    return std::count(skipped_.begin(), skipped_.end(), '"') % 2 == 0 &&
-           skipped_.find_first_of(refused) == kNone;
+  [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
+    if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
+      return refuse("markup with a quotation mark that has no partner", start_);
+    }
+    const std::size_t found = skipped_.find_first_of(refused);
+    return found == kNone ||
+           refuse(std::string("a \"") + skipped_[found] + "\" inside other markup", start_);
   }
 
   bool tag() {
@@ -70,12 +94,17 @@ class XmlWalk {
     std::string_view name = skipped_.substr(0, skipped_.find_first_of(" \t\r\n"));
     if (name.ends_with('/')) name.remove_suffix(1);
     if (name.starts_with('/')) return close(name.substr(1));
-    if (++objects_ > kMostPropertyListObjects) return false;
+    if (++objects_ > kMostPropertyListObjects) {
+      return refuse("more than " + std::to_string(kMostPropertyListObjects) + " elements", start_);
+    }
     if (name == "key" && !containers_.empty()) ++containers_.back().keys;
     if (name == "integer" && !empty) blankLeadingZeros();
     if (empty || !isContainer(name)) return true;
     containers_.push_back({start_, name.size(), 0});
-    return containers_.size() <= kMostPropertyListDepth + 1;  // the outermost is <plist>
+    return containers_.size() <= kMostPropertyListDepth + 1 ||  // the outermost is <plist>
+           refuse("more than " + std::to_string(kMostPropertyListDepth) +
+                      " containers inside each other",
+                  start_);
   }
 
   static bool isContainer(std::string_view name) {
@@ -84,11 +113,16 @@ class XmlWalk {
 
   bool close(std::string_view name) {
     if (!isContainer(name)) return true;
-    if (containers_.empty()) return false;
-    const Container closed = containers_.back();
+    if (containers_.empty()) return refuse("a container's end without its beginning", start_);
+    const Container closed = innermost();
     containers_.pop_back();
-    return text_.compare(closed.name, closed.nameSize, name) == 0 &&
-           spend(closed.keys * closed.keys);
+    if (text_.compare(closed.name, closed.nameSize, name) != 0) {
+      return refuse("\"</" + std::string(name) + ">\" where \"</" +
+                        text_.substr(closed.name, closed.nameSize) + ">\" is expected",
+                    start_);
+    }
+    return spend(closed.keys * closed.keys) ||
+           refuse("more keys than dictionaries may hold", closed.name);
   }
 
   bool spend(std::uint64_t steps) {
@@ -106,13 +140,8 @@ class XmlWalk {
       text_[digit++] = ' ';
   }
 
-  struct Container {
-    std::size_t name;
-    std::size_t nameSize;
-    std::uint64_t keys;
-  };
-
   std::string& text_;
+  ParseProblem& problem_;
   std::size_t at_ = 0;
   std::size_t start_ = 0;
   std::string_view skipped_;
@@ -123,8 +152,12 @@ class XmlWalk {
 
 }  // namespace
 
-bool mayReadXML(std::string& text) {
-  return text.size() <= kMostPropertyListBytes && XmlWalk(text).run();
+bool mayReadXML(std::string& text, ParseProblem& problem) {
+  if (text.size() > kMostPropertyListBytes) {
+    problem.note("more than " + std::to_string(kMostPropertyListBytes) + " bytes", 0);
+    return false;
+  }
+  return XmlWalk(text, problem).run();
 }
 
 }  // namespace onramp::libplist

@@ -6,10 +6,11 @@
 
 namespace onramp::posix {
 
-/// Owns a file descriptor and closes it at destruction.
+/// Owns a file descriptor. The destructor closes it.
 class Descriptor {
  public:
-  /// Takes over `number`; a negative one, such as a failed call returns, owns nothing.
+  /// Takes ownership of `number`. A negative number, the result of a failed call, means no
+  /// descriptor.
   explicit Descriptor(int number = -1) : number_(number) {}
   Descriptor(Descriptor&& other) noexcept : number_(std::exchange(other.number_, -1)) {}
   Descriptor& operator=(Descriptor&& other) noexcept {
@@ -23,7 +24,7 @@ class Descriptor {
   explicit operator bool() const { return number_ >= 0; }
   [[nodiscard]] int get() const { return number_; }
 
-  /// Closes it now. False when the system could not keep what was written.
+  /// Closes the descriptor now. Returns false when the system reports that written data was lost.
   bool close() {
     const int number = std::exchange(number_, -1);
     return number < 0 || ::close(number) == 0;

@@ -1,11 +1,16 @@
 #include "platform/posix/file.h"
 
 #include <fcntl.h>
+#include <signal.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
+#include <charconv>
 #include <cstdio>
+#include <filesystem>
+#include <system_error>
+#include <vector>
 
 #include "platform/posix/descriptor.h"
 
@@ -13,12 +18,20 @@ namespace onramp::posix {
 
 namespace {
 
-// A new file of a name that nothing beside `path` has; its access rights follow the user's mask.
-Descriptor createBeside(const std::string& path, std::string& name) {
+namespace fs = std::filesystem;
+
+// A temporary file is called ".NAME.PROCESS-NUMBER". The limit on NAME keeps that within the 255
+// bytes that a name may have.
+std::string temporaryStem(const fs::path& path) {
+  constexpr std::size_t kMostNameBytes = 200;
+  return "." + path.filename().string().substr(0, kMostNameBytes) + ".";
+}
+
+// Creates a file next to `path` under a new name. Its access rights follow the user's mask.
+Descriptor createBeside(const fs::path& path, std::string& name) {
   constexpr int kMostTries = 100;  // a killed process may have left some of them
-  const std::size_t last = path.rfind('/') + 1;
   const std::string stem =
-      path.substr(0, last) + "." + path.substr(last) + "." + std::to_string(getpid()) + "-";
+      (path.parent_path() / temporaryStem(path)).string() + std::to_string(getpid()) + "-";
   for (int i = 0; i < kMostTries; ++i) {
     name = stem + std::to_string(i);
     Descriptor file(open(name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666));
@@ -35,6 +48,24 @@ bool writeAll(int descriptor, std::string_view bytes) {
     bytes.remove_prefix(static_cast<std::size_t>(written));
   }
   return true;
+}
+
+// Whether no process writes a file any more whose name ends with `processAndNumber`. One with this
+// process's own number was left by an earlier process.
+bool isLeftOver(std::string_view processAndNumber) {
+  constexpr std::string_view kDigits = "0123456789";
+  const std::size_t dash = processAndNumber.find('-');
+  if (dash == std::string_view::npos || dash == 0) return false;
+  const std::string_view process = processAndNumber.substr(0, dash);
+  const std::string_view number = processAndNumber.substr(dash + 1);
+  if (number.empty() || process.find_first_not_of(kDigits) != std::string_view::npos ||
+      number.find_first_not_of(kDigits) != std::string_view::npos) {
+    return false;
+  }
+  pid_t writer = 0;
+  const auto read = std::from_chars(process.data(), process.data() + process.size(), writer);
+  if (read.ec != std::errc() || writer <= 0) return false;
+  return writer == getpid() || (kill(writer, 0) != 0 && errno == ESRCH);
 }
 
 }  // namespace
@@ -67,6 +98,23 @@ bool writeFileAtomically(const std::string& path, std::string_view bytes) {
   if (written && closed && std::rename(temporary.c_str(), path.c_str()) == 0) return true;
   unlink(temporary.c_str());
   return false;
+}
+
+void removeWithTemporaries(const std::string& path) {
+  std::error_code ignored;
+  fs::remove_all(path, ignored);
+  const std::string stem = temporaryStem(path);
+  std::vector<fs::path> leftOver;
+  std::error_code error;
+  fs::directory_iterator entry(fs::path(path).parent_path(), error);
+  for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
+    const std::string name = entry->path().filename().string();
+    if (name.starts_with(stem) && isLeftOver(std::string_view(name).substr(stem.size()))) {
+      leftOver.push_back(entry->path());
+    }
+  }
+  for (const fs::path& file : leftOver)
+    fs::remove(file, ignored);
 }
 
 }  // namespace onramp::posix

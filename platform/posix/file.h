@@ -7,13 +7,17 @@
 
 namespace onramp::posix {
 
-/// The bytes of the regular file at `path`; nothing when it cannot be read, is something else than
-/// a file, or is larger than `most` bytes. Never waits for somebody to write.
+/// Reads the regular file at `path`. Returns nothing when it cannot be read, is not a regular file,
+/// or is larger than `most` bytes. Never blocks on a pipe.
 [[nodiscard]] std::optional<std::string> readFile(const std::string& path, std::size_t most);
 
-/// Puts `bytes` under `path` in one step: they are written and flushed to a temporary file in the
-/// same folder, which then takes the name. False when any of that failed; the temporary file is
-/// then gone again and what lay at `path` is untouched.
+/// Writes `bytes` to `path` atomically: writes and flushes a temporary file in the same folder,
+/// then renames it to `path`. Returns false when a step failed; the temporary file is then removed
+/// and a file that was at `path` is unchanged.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
+
+/// Removes the file or the folder tree at `path`, and the temporary files that
+/// writeFileAtomically() left for `path` in processes that no longer exist. Ignores failures.
+void removeWithTemporaries(const std::string& path);
 
 }  // namespace onramp::posix

@@ -4,8 +4,9 @@
 
 namespace onramp {
 
-/// Makes `version`, such as "10.9.5", the version of the macOS that this desktop stands in for.
-/// Without it the environment's ONRAMP_SYSTEM_VERSION counts, and without that 10.15.7.
+/// Sets the version of macOS that this desktop stands in for, such as "10.9.5". The default, also
+/// for an empty `version`, is the environment variable ONRAMP_SYSTEM_VERSION, or 10.15.7 without
+/// it.
 void setSystemVersion(std::string version);
 
 }  // namespace onramp

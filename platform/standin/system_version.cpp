@@ -25,7 +25,7 @@ std::string runningVersion() {
   return version && *version ? version : kDefaultVersion;
 }
 
-// The number before the next point, which is taken off with it.
+// Removes the text up to and including the next point, and returns its number.
 std::int64_t takeComponent(std::string_view& version, std::int64_t most) {
   const std::int64_t number = leadingInteger(version.substr(0, version.find('.')));
   version.remove_prefix(std::min(version.find('.'), version.size() - 1) + 1);
@@ -43,7 +43,7 @@ std::optional<std::string> productVersion() {
 }
 
 std::optional<std::int32_t> gestaltSystemVersion() {
-  // A point more, so that every component ends with one.
+  // Three more points, so that each of the three components ends with one.
   const std::string version = runningVersion() + "...";
   std::string_view rest = version;
   std::int64_t digits = takeComponent(rest, 9999);

@@ -35,7 +35,7 @@ void changed(SCDynamicStoreRef, CFArrayRef changedKeys, void* callback) {
   (*static_cast<const DynamicStoreCallback*>(callback))(keys);
 }
 
-// The session owns a copy of the callback for as long as the framework keeps the session.
+// The session owns a copy of the callback until the framework destroys the session.
 const void* copyCallback(const void* callback) {
   return std::make_unique<DynamicStoreCallback>(*static_cast<const DynamicStoreCallback*>(callback))
       .release();

@@ -1,3 +1,5 @@
+#include <gmock/gmock.h>
+
 #include <filesystem>
 
 #include "tests/app/wizard.h"
@@ -9,13 +11,7 @@ namespace fs = std::filesystem;
 
 using HandOff = Wizard;
 
-Dictionary device(const Value& addresses) {
-  return Dictionary{{"display name", "Office Printer"},
-                    {"model name", "Kestrel Model 200"},
-                    {"IP address list", addresses}};
-}
-
-TEST_F(HandOff, OptionsAreTheMediumsWithFiveGuaranteed) {
+TEST_F(HandOff, TheOptionsAreTheMediumsPlusFiveThatAreAlwaysThere) {
   medium.write("Onramp OSX.app/Contents/Resources/SupportedKOL.plist",
                Dictionary{{"Country", Dictionary{{"JP", Dictionary{{"Site", 3}}}, {"DE", true}}}});
   const Dictionary none{{"PKG_WebLink", false},
@@ -23,13 +19,12 @@ TEST_F(HandOff, OptionsAreTheMediumsWithFiveGuaranteed) {
                         {"PKG_RemoteTool", false},
                         {"PKG_LabelTool", false},
                         {"PKG_FontSet", false}};
-  struct Case {
+  const struct {
     const char* locale;
     Dictionary onMedium;
     Dictionary expected;
-  };
-  const Case cases[] = {
-      {"en_US.UTF-8", {}, none},
+  } cases[] = {
+      {"en_US.UTF-8", {{"PKG_FontSet", true}}, none},
       {"ja_JP.UTF-8", {}, none},
       {"ja_JP.UTF-8",
        {{"PKG_FontSet", false}, {"PKG_KestrelOnline", true}, {"PKG_WebLink", "x"}, {"Own", 5}},
@@ -38,61 +33,86 @@ TEST_F(HandOff, OptionsAreTheMediumsWithFiveGuaranteed) {
            .with("PKG_WebLink", "x")
            .with("Own", 5)},
       {"de_DE.UTF-8",
-       {{"PKG_FontSet", true}, {"PKG_KestrelOnline", "yes"}},
-       none.with("PKG_KestrelOnline", true)},
+       {{"PKG_RemoteTool", true}, {"PKG_LabelTool", 2}, {"PKG_KestrelOnline", "yes"}},
+       none.with("PKG_RemoteTool", true).with("PKG_LabelTool", 2).with("PKG_KestrelOnline", true)},
       {"de_DE.UTF-8", {{"PKG_KestrelOnline", false}}, none},
       {"fr_FR.UTF-8", {{"PKG_KestrelOnline", true}}, none},
+      {"C.UTF-8", {{"PKG_KestrelOnline", true}}, none},
+      {"ko_KR.UTF-8", {{"PKG_FontSet", false}}, none.with("PKG_FontSet", true)},
       {"zh_CN.UTF-8", {{"PKG_FontSet", false}}, none.with("PKG_FontSet", true)}};
-  for (const Case& c : cases) {
-    SCOPED_TRACE(c.locale);
-    medium.setEnvironment("LANG", c.locale);
-    installPKG = c.onMedium;
+  for (const auto& [locale, onMedium, expected] : cases) {
+    medium.setEnvironment("LANG", locale);
+    installPKG = onMedium;
     describeTwoModels();
     OnrampOSXAppDelegate::copyCDInfo();
-    EXPECT_EQ(medium.optionsFile(), c.expected);
+    EXPECT_EQ(medium.optionsFile(), expected) << locale;
   }
 }
 
-TEST_F(HandOff, TheWirelessFormNamesTheDeviceItself) {
+TEST_F(HandOff, ADeviceWithoutUsableDataIsHandedOverAsIfByCable) {
   describeTwoModels();
+  const Value addresses = Array{"192.0.2.7", "192.0.2.8"};
+  const Dictionary whole{{"display name", "Office Printer"},
+                         {"model name", "Kestrel Model 200"},
+                         {"IP address list", addresses}};
   const Dictionary bonjour{
       {"name", "Office Printer"}, {"type", "_printer._tcp."}, {"domain", "local."}};
-  const Dictionary network{{"Bonjour", bonjour}, {"IP address", "192.0.2.7"}};
   const Dictionary wireless{
-      {"Model", "Kestrel Model 200"}, {"Interface", "WiFi"}, {"Network", network}};
-  const Value addresses = Array{"192.0.2.7", "192.0.2.8"};
+      {"Model", "Kestrel Model 200"},
+      {"Interface", "WiFi"},
+      {"Network", Dictionary{{"Bonjour", bonjour}, {"IP address", "192.0.2.7"}}}};
   const Dictionary fallback{{"Model", "All"}, {"Interface", "Default"}};
   const auto form = [](const std::optional<std::string>& model,
                        const std::optional<Dictionary>& record) {
     return OnrampOSXAppDelegate::instmodelPlistWiFi(model, record);
   };
-  EXPECT_EQ(form("All", device(addresses)), wireless);
-  EXPECT_EQ(
-      form("All", (Dictionary{{"display name", "Office Printer"}, {"IP address list", addresses}})),
-      wireless.with("Model", ""));
-  EXPECT_EQ(form("All", device(Array{})), fallback);
-  EXPECT_EQ(form("All", (Dictionary{{"IP address list", addresses}})), fallback);
+  EXPECT_EQ(form("All", whole), wireless);
+  EXPECT_EQ(form("All", whole.with("model name", 5)), wireless.with("Model", ""));
+  EXPECT_EQ(form("All", whole.with("IP address list", Array{})), fallback);
+  EXPECT_EQ(form("All", whole.with("display name", "")), fallback);
   EXPECT_EQ(form("All", std::nullopt), fallback);
   EXPECT_EQ(form(std::nullopt, std::nullopt), fallback.with("Model", ""));
-
   describeTwoModels(Dictionary{{"BonjourNetwork", 1}});
-  EXPECT_EQ(form("All", device(addresses)), fallback) << "the medium names no service type";
+  EXPECT_EQ(form("All", whole), fallback) << "the medium names no service type";
 }
 
 TEST_F(HandOff, TheSharedFolderIsOpenToEveryoneAndTheUsersOwnIsNot) {
   describeTwoModels();
-  const auto permissions = [](const std::string& file) {
-    return fs::status(fs::path(file).parent_path()).permissions();
-  };
+  const auto permissions = [](const std::string& path) { return fs::status(path).permissions(); };
+  const std::string shared = fs::path(medium.optionsFilePath()).parent_path();
+  const std::string own = fs::path(medium.modelFilePath()).parent_path();
   EXPECT_EQ(OnrampOSXAppDelegate::InstallPKGInfoURL(), medium.optionsFilePath());
-  EXPECT_EQ(permissions(medium.optionsFilePath()), fs::perms::all);
+  EXPECT_EQ(permissions(shared), fs::perms::all);
   EXPECT_EQ(OnrampOSXAppDelegate::instmodelPlistURL(), medium.modelFilePath());
-  EXPECT_EQ(permissions(medium.modelFilePath()) & fs::perms::others_write, fs::perms::none);
+  EXPECT_EQ(permissions(own) & fs::perms::others_write, fs::perms::none);
+  OnrampOSXAppDelegate::copyCDInfo();
+  EXPECT_NE(permissions(medium.optionsFilePath()) & fs::perms::others_read, fs::perms::none)
+      << "the installer may run as another user";
 
-  fs::permissions(fs::path(medium.optionsFilePath()).parent_path(), fs::perms::owner_all);
+  fs::permissions(shared, fs::perms::owner_all);
   (void)OnrampOSXAppDelegate::InstallPKGInfoURL();
-  EXPECT_EQ(permissions(medium.optionsFilePath()), fs::perms::owner_all)
-      << "a folder that was there keeps its permissions";
+  EXPECT_EQ(permissions(shared), fs::perms::owner_all) << "an existing folder keeps them";
+}
+
+TEST_F(HandOff, TheVendorNameLosesItsBlanksAndInFileNamesItsCapitals) {
+  const struct {
+    Dictionary resources;
+    std::string folder;
+    std::string inFileName;
+  } cases[] = {
+      {{{"VenderName", "Kestrel Imaging  Works"}}, "KestrelImagingWorks", "kestrelimagingworks"},
+      {{{"VenderName", "Ärzte ÜBER ΣΩ Ж\uFF21 ıI"}},
+       "ÄrzteÜBERΣΩЖ\uFF21ıI",
+       "ärzteüberσωж\uFF41ıi"},
+      {{{"VenderName", 5}}, "", ""},
+      {{}, "", ""}};
+  medium.setEnvironment("LANG", "tr_TR.UTF-8");
+  for (const auto& [resources, folder, inFileName] : cases) {
+    medium.write("MacResources/Common.plist", resources);
+    EXPECT_EQ(OnrampOSXAppDelegate::setVenderName(), folder);
+    EXPECT_THAT(OnrampOSXAppDelegate::instmodelPlistURL(),
+                testing::EndsWith("/user/" + folder + "/com." + inFileName + ".instmodel.plist"));
+  }
 }
 
 TEST_F(HandOff, ThePackageIsOpenedEvenWhenNothingCanBeWritten) {
@@ -105,11 +125,17 @@ TEST_F(HandOff, ThePackageIsOpenedEvenWhenNothingCanBeWritten) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(HandOff, ASupportAddressThatIsNoneIsNotOpened) {
-  describeTwoModels();
-  EXPECT_EQ(OnrampOSXAppDelegate::FAQ_URL(), "http://support.kestrel.example/g/d/c2f2/KS7/en/us/");
-  medium.write("MacResources/CDInfo.plist", Dictionary{{"KSCSeriesCode", "two words"}});
-  EXPECT_EQ(OnrampOSXAppDelegate::FAQ_URL(), std::nullopt);
+TEST_F(HandOff, ASeriesCodeThatMakesNoAddressHasNoSupportPage) {
+  const std::pair<const char*, const char*> cases[] = {
+      {"KS7", "KS7"},         {"a%20b", "a%20b"}, {"a#b", "a#b"},
+      {"two words", nullptr}, {"50%", nullptr},   {"50%2", nullptr},
+      {"a#b#c", nullptr},     {"[x]", nullptr},   {"ü", nullptr}};
+  for (const auto& [series, part] : cases) {
+    medium.describe({}, Dictionary{{"KSCSeriesCode", series}}, {});
+    const std::string address =
+        part ? "http://support.kestrel.example/g/d/c2f2/" + std::string(part) + "/en/us/" : "none";
+    EXPECT_EQ(OnrampOSXAppDelegate::FAQ_URL().value_or("none"), address);
+  }
 }
 
 }  // namespace

@@ -1,50 +1,75 @@
+#include <gmock/gmock.h>
+#include <pthread.h>
+
+#include <cstdint>
+
+#include "platform/run_loop.h"
 #include "tests/app/wizard.h"
 
 namespace onramp {
 namespace {
 
 using recording::model;
+using ::testing::ElementsAre;
+using ::testing::IsEmpty;
+
+using Strings = std::vector<std::string>;
+using Pauses = std::vector<unsigned>;
+
+const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// To the connection page with "All" chosen.
-  void goToConnectionPage() {
-    describeTwoModels();
+  /// From a list of `models`, which must differ in their cables, to the first one's connection
+  /// page.
+  void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
+                              {"All", model(true, true, true)},
+                              {"Cable", model(true, false, false)}}) {
+    describe(models);
     launch();
-    chooseModel("All");
+    chooseModel(models.front().key);
     screen.click("rightMostButton");
     ASSERT_EQ(page(), "ConnectionTypeView");
   }
 
-  /// From the connection page, by the wireless row, to the set-up tool's end; nothing is found.
+  /// From the connection page, by a search that finds nothing, to the end of the set-up tool.
   void searchInVainWithTool(int exitStatus) {
-    goToConnectionPage();
     medium.addSetUpTool(exitStatus);
-    chooseRow(0);
     screen.click("rightMostButton");
     EXPECT_EQ(screen.log.back(), "hide");
+    EXPECT_THAT(screen.delays, ElementsAre(0.5));
     screen.log.clear();
     screen.pauses.clear();
     screen.runTimers();
     EXPECT_EQ(medium.setUpToolArguments(), "-installer");
   }
+
+  [[nodiscard]] Dictionary wirelessForm(const std::string& name, const std::string& ownModel,
+                                        const std::string& address) const {
+    const Dictionary bonjour{{"name", name}, {"type", "_printer._tcp."}, {"domain", "local."}};
+    return Dictionary{{"Model", ownModel},
+                      {"Interface", "WiFi"},
+                      {"Network", Dictionary{{"Bonjour", bonjour}, {"IP address", address}}}};
+  }
 };
 
-TEST_F(Navigation, AWirelessModelIsAskedForItsConnection) {
+TEST_F(Navigation, AModelChosenByCableIsHandedOverBeforeThePackageOpens) {
   goToConnectionPage();
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
+  EXPECT_EQ(connectionPage(), expectedConnectionPage("wiredLan.png", kUSBAndWired));
   EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedRow, 0);
-  EXPECT_EQ(screen.object("connectionTypeImage2").imagePath,
-            medium.path("MacResources/Images/wiredLan.png"));
   EXPECT_TRUE(screen.object("progress").hidden);
-
+  EXPECT_TRUE(screen.object("progressTxtField").hidden);
+  screen.duringOpening = [&] {
+    EXPECT_EQ(medium.modelFile(), (Dictionary{{"Model", "All"}, {"Interface", "Default"}}));
+    EXPECT_TRUE(medium.optionsFile());
+  };
   chooseRow(1);
   screen.click("rightMostButton");
-  EXPECT_EQ(medium.modelFile(), (Dictionary{{"Model", "All"}, {"Interface", "Default"}}));
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(Navigation, BackReturnsToTheModelChosenBefore) {
+TEST_F(Navigation, BackReturnsToTheListWithTheSameModelSelected) {
   describe({{"A", model(true, false, true)}, {"B", model(true, true, true)}});
   launch();
   chooseModel("B");
@@ -53,89 +78,164 @@ TEST_F(Navigation, BackReturnsToTheModelChosenBefore) {
   EXPECT_EQ(page(), "ModelListView");
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
   EXPECT_EQ(modelList().selectedObject(), (Dictionary{{"model", "B"}}));
+  EXPECT_EQ(screen.log.back(), "front");
 }
 
 TEST_F(Navigation, CancelQuitsFromEveryPageAndWritesNothing) {
-  const std::function<void()> fromTheList = [&] {
-    describeTwoModels();
-    launch();
-    screen.click("rightButton");
-  };
-  const std::function<void()> fromTheConnection = [&] {
-    goToConnectionPage();
-    screen.click("leftButton");
-  };
-  const std::function<void()> fromTheFirstPage = [&] {
-    describe({{"A", model(true, false, true)}});
-    launch();
-    screen.click("rightButton");
-  };
-  const std::function<void()> fromTheChooser = [&] {
-    searchInVainWithTool(0);
-    screen.click("rightButton");
-  };
-  for (const auto& cancel : {fromTheList, fromTheConnection, fromTheFirstPage, fromTheChooser}) {
+  const std::function<void()> ways[] = {[&] {
+                                          describeTwoModels();
+                                          launch();
+                                          screen.click("rightButton");
+                                        },
+                                        [&] {
+                                          goToConnectionPage();
+                                          screen.click("leftButton");
+                                        },
+                                        [&] {
+                                          describe({{"A", model(true, false, true)}});
+                                          launch();
+                                          screen.click("rightButton");
+                                        },
+                                        [&] {
+                                          goToConnectionPage();
+                                          searchInVainWithTool(0);
+                                          screen.click("rightButton");
+                                        }};
+  for (const auto& cancel : ways) {
     screen.reset();
     cancel();
     EXPECT_TRUE(screen.terminated);
     EXPECT_FALSE(medium.modelFile());
     EXPECT_FALSE(medium.optionsFile());
+    EXPECT_THAT(screen.opened, IsEmpty());
   }
 }
 
-TEST_F(Navigation, TheWaitHoldsTheWindowAndEndsAfterFivePauses) {
-  goToConnectionPage();
+// The device is switched on while the set-up tool runs, so only the search after it can find it.
+TEST_F(Navigation, TheToolBringsTheChosenModelsDeviceIntoTheNetwork) {
+  goToConnectionPage(
+      {{"Kestrel Model 100", model(true, true, true)}, {"Kestrel Scan", model(true, false, true)}});
   screen.duringPause = [&](int pause) {
     EXPECT_EQ(buttons(), "(BTN_CANCEL)(BTN_BACK)(BTN_NEXT)") << pause;
     EXPECT_FALSE(screen.object("deviceListPopupButton").enabled);
+    EXPECT_FALSE(screen.object("connectionTypeRadioButton").enabled);
     EXPECT_FALSE(delegate->windowShouldClose(Window()));
-    EXPECT_TRUE(screen.object("connectionTypeRadioButton").enabled == false);
+    const recording::Object& spinner = screen.object("progress");
+    EXPECT_TRUE(spinner.animating && !spinner.hidden && !screen.object("progressTxtField").hidden);
+    EXPECT_EQ(screen.object("progressTxtField").text, "INST_WAIT");
   };
+  medium.addSetUpTool(0);
   screen.click("rightMostButton");
-  EXPECT_EQ(screen.pauses, (std::vector<unsigned>{2, 2, 2, 2, 2}));
+  EXPECT_EQ(screen.pauses, (Pauses{2, 2, 2, 2, 2}));
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
   EXPECT_TRUE(screen.object("deviceListPopupButton").enabled);
   EXPECT_TRUE(screen.object("connectionTypeRadioButton").enabled);
   EXPECT_TRUE(delegate->windowShouldClose(Window()));
+  EXPECT_FALSE(screen.object("progress").animating);
+  EXPECT_TRUE(screen.object("progress").hidden && screen.object("progressTxtField").hidden);
+  EXPECT_THAT(network.browsers, IsEmpty());
+
+  screen.pauses.clear();
+  screen.duringPause = [&](int pause) {
+    EXPECT_EQ(page(), "ChooseDeviceView");
+    EXPECT_TRUE(screen.object("progress").animating);
+    if (pause != 2) return;
+    appear("Scanner", "Scan", 7);
+    appear("Office", "Model 100", 8);
+  };
+  screen.log.clear();
+  screen.runTimers();
+  EXPECT_EQ(screen.pauses, (Pauses{3, 3})) << "the wait ends with the pause that finds the device";
+  EXPECT_EQ(screen.log, (Strings{"key and front", "unhide", "activate", "key and front"}));
+  EXPECT_THAT(deviceRows(), ElementsAre("Office 192.0.2.8"));
+  EXPECT_THAT(screen.sheets, IsEmpty());
+  EXPECT_THAT(network.browsers, IsEmpty());
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no way back after the tool";
+  EXPECT_TRUE(screen.object("progress").hidden);
+
+  screen.click("rightMostButton");
+  EXPECT_EQ(medium.modelFile(), wirelessForm("Office", "Kestrel Model 100", "192.0.2.8"));
+  expectPackageOpenedAndQuit();
+}
+
+TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
+  describe({{"Kestrel Model 100", model(true, false, true)}});
+  launch();
+  EXPECT_EQ(connectionPage(), expectedConnectionPage("usb.png", "INST_TXT_USB"));
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no list to go back to";
+  screen.duringPause = [&](int pause) {
+    if (pause == 1) appear("Office", "Model 100", 8);
+  };
+  screen.click("rightMostButton");
+  EXPECT_EQ(screen.pauses, (Pauses{2})) << "the chooser shows what this search has found";
+  EXPECT_EQ(page(), "ChooseDeviceView");
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
+
+  // A refresh that finds nothing takes Next away; going back gives it back.
+  screen.duringPause = nullptr;
+  screen.pauses.clear();
+  chooseMenuItem(2);
+  EXPECT_EQ(screen.pauses, (Pauses{3, 3, 3, 3, 3}));
+  EXPECT_THAT(deviceRows(), IsEmpty());
+  EXPECT_EQ(screen.sheets.size(), 1U);
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK](BTN_NEXT)");
+  screen.click("rightButton");
+  EXPECT_EQ(connectionPage(), expectedConnectionPage("usb.png", "INST_TXT_USB"));
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
+
+  chooseRow(1);
+  screen.click("rightMostButton");
+  EXPECT_FALSE(medium.modelFile()) << "no model was chosen";
+  EXPECT_TRUE(medium.optionsFile());
+  expectPackageOpenedAndQuit();
 }
 
 TEST_F(Navigation, AToolThatAsksToGoBackShowsTheConnectionPageWithWirelessChosen) {
+  goToConnectionPage();
   searchInVainWithTool(1);
+  EXPECT_EQ(connectionPage(), expectedConnectionPage("wiredLan.png", kUSBAndWired));
   EXPECT_EQ(page(), "ConnectionTypeView");
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
   EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedRow, 0);
-  EXPECT_EQ(screen.log, (std::vector<std::string>{"unhide", "activate", "key and front"}));
+  EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedColumn, 0);
+  EXPECT_EQ(screen.log, (Strings{"unhide", "activate", "key and front"}));
 
-  // The pass is over: another empty search runs the tool again.
+  // The tool may run again after another empty search.
   screen.log.clear();
   screen.click("rightMostButton");
   EXPECT_EQ(screen.log.back(), "hide");
 }
 
 TEST_F(Navigation, AToolThatAsksToQuitEndsTheWizardUnseen) {
+  goToConnectionPage();
   searchInVainWithTool(2);
-  EXPECT_EQ(screen.log, std::vector<std::string>{"terminate"});
+  EXPECT_EQ(screen.log, Strings{"terminate"});
   EXPECT_FALSE(medium.optionsFile());
+  EXPECT_THAT(screen.opened, IsEmpty());
 }
 
-TEST_F(Navigation, AnyOtherToolStatusSearchesAgainOnTheChooser) {
+TEST_F(Navigation, ASheetThatFoundNothingOffersTheSupportPage) {
+  goToConnectionPage();
   searchInVainWithTool(0);
-  EXPECT_EQ(page(), "ChooseDeviceView");
-  EXPECT_EQ(screen.pauses, (std::vector<unsigned>{3, 3, 3, 3, 3}));
-  EXPECT_EQ(buttons(), "[BTN_CANCEL](BTN_NEXT)") << "there is no way back after an automatic run";
-  EXPECT_EQ(screen.log.back(), "key and front");
-
   ASSERT_EQ(screen.sheets.size(), 1U);
-  EXPECT_EQ(screen.sheets[0].sheet.title, "Device not found");
-  EXPECT_EQ(screen.sheets[0].sheet.message,
-            "No device could be found over the network\n\nPush the gear button");
-  screen.sheets[0].didEnd(kAlertDefaultReturn);
-  EXPECT_EQ(medium.opened(0).size(), 0U);
+  const auto& [sheet, didEnd] = screen.sheets[0];
+  EXPECT_EQ(sheet.title, "Device not found");
+  EXPECT_EQ(sheet.message, "No device could be found over the network\n\nPush the gear button");
+  EXPECT_EQ(sheet.defaultButton + '|' + sheet.otherButton, "OK|WEB");
+  for (const int answer : {kAlertDefaultReturn, 0, -1000})
+    didEnd(answer);
+  EXPECT_THAT(screen.opened, IsEmpty()) << "only the second button opens the page";
   medium.setEnvironment("LANG", "ja_JP.UTF-8");
-  screen.sheets[0].didEnd(kAlertOtherReturn);
-  EXPECT_EQ(medium.opened(1),
-            std::vector<std::string>{"http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"});
+  didEnd(kAlertOtherReturn);
+  EXPECT_THAT(screen.opened, ElementsAre("http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"));
   EXPECT_EQ(buttons(), "[BTN_CANCEL](BTN_NEXT)");
+
+  // The message is a format, in which a percent sign is written twice.
+  medium.setEnvironment("LANG", "en_US.UTF-8");
+  medium.write(kEnglishTexts,
+               std::string("INST_TXT_ALERT_WIFI_DEVICENOTFOUND = \"100%% of 5%%\";"));
+  delegate->showListAlertSheet();
+  EXPECT_EQ(screen.sheets[1].sheet.message, "100% of 5%\n\nPush the gear button");
 }
 
 TEST_F(Navigation, AToolThatCannotBeStartedCountsAsAnyOther) {
@@ -146,26 +246,22 @@ TEST_F(Navigation, AToolThatCannotBeStartedCountsAsAnyOther) {
   EXPECT_EQ(screen.log.back(), "key and front");
 }
 
-TEST_F(Navigation, TheChoosersMenuRefreshesAndStartsTheTool) {
+TEST_F(Navigation, AToolStartedFromTheMenuChangesNoPageWhenItAsksToGoBack) {
+  goToConnectionPage();
   searchInVainWithTool(0);
-  auto& items = screen.object("deviceListPopupButton").items;
-  ASSERT_EQ(items.size(), 3U);
-  EXPECT_EQ(items[0].first, "Gear");
-  EXPECT_EQ(items[1].first, "Setup...") << "named after its file: it was not there at the start";
-  EXPECT_EQ(items[2].first, "INST_TXT_REFRESH");
-
-  screen.pauses.clear();
-  items[2].second();
-  EXPECT_EQ(screen.pauses, (std::vector<unsigned>{3, 3, 3, 3, 3}));
-  EXPECT_EQ(screen.sheets.size(), 2U);
-
-  // Started by hand, the tool's wish to go back changes no page.
   medium.addSetUpTool(1);
   screen.log.clear();
-  items[1].second();
+  chooseMenuItem(1);
   screen.runTimers();
   EXPECT_EQ(page(), "ChooseDeviceView");
-  EXPECT_EQ(screen.log, (std::vector<std::string>{"hide", "unhide", "activate", "key and front"}));
+  EXPECT_EQ(screen.log, (Strings{"hide", "unhide", "activate", "key and front"}));
+}
+
+TEST_F(Navigation, AWaitTakesItsPausesFromTheOneWhoAsksForIt) {
+  goToConnectionPage();
+  delegate->showProgressAtChooseDeviceViewByRefresh(
+      {.name = {}, .object = nullptr, .userInfo = {{std::string(kWaitTime), 7}}});
+  EXPECT_EQ(screen.pauses, (Pauses{7, 7, 7, 7, 7}));
 }
 
 TEST_F(Navigation, QuittingDuringTheWaitEndsItAtOnce) {
@@ -175,6 +271,38 @@ TEST_F(Navigation, QuittingDuringTheWaitEndsItAtOnce) {
   EXPECT_EQ(screen.pauses.size(), 1U);
   screen.runTimers();
   EXPECT_EQ(medium.setUpToolArguments(), "");
+}
+
+// A thread's stack that no system has room for: no thread can be started while this exists.
+class NoThreads {
+ public:
+  NoThreads() {
+    pthread_getattr_default_np(&before_);
+    pthread_attr_t huge;
+    pthread_attr_init(&huge);
+    pthread_attr_setstacksize(&huge, std::size_t{1} << 60);
+    EXPECT_EQ(pthread_setattr_default_np(&huge), 0);
+    pthread_attr_destroy(&huge);
+  }
+  NoThreads(const NoThreads&) = delete;
+  NoThreads& operator=(const NoThreads&) = delete;
+  ~NoThreads() {
+    pthread_setattr_default_np(&before_);
+    pthread_attr_destroy(&before_);
+  }
+
+ private:
+  pthread_attr_t before_{};
+};
+
+TEST_F(Navigation, WithoutAThreadTheMainLoopMakesThePauses) {
+  goToConnectionPage();
+  const NoThreads noThreads;
+  performOnMainThread([&] { screen.runTimers(); });
+  screen.click("rightMostButton");
+  EXPECT_EQ(screen.delays, (std::vector<double>{2, 2, 2, 2, 2, 0.5}));
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
+  EXPECT_TRUE(delegate->windowShouldClose(Window()));
 }
 
 }  // namespace

@@ -1,9 +1,12 @@
+#include <gmock/gmock.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
 #include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <map>
 
-#include "platform/property_list.h"
 #include "tests/app/wizard.h"
 
 namespace onramp {
@@ -12,70 +15,61 @@ namespace {
 using recording::model;
 using StartUp = Wizard;
 
-TEST_F(StartUp, ShowsTheListWhenModelsDiffer) {
-  describeTwoModels();
+TEST_F(StartUp, ListsTheModelsByTheirExactSpellingWhenTheirCablesDiffer) {
+  describe({{"abc", model(true, true, true)}, {"ABD", model(true, false, true)}});
   launch();
   EXPECT_EQ(page(), "ModelListView");
+  EXPECT_EQ(screen.object("modelListTitle").text, "INST_TXT_MODEL");
+  EXPECT_EQ(screen.object("modelListDescriptionTextField").text, "INST_TXT_MODEL_DESC");
+  ASSERT_EQ(modelList().arrangedObjects().size(), 2U);
+  EXPECT_EQ(modelList().selectedObject(), (Dictionary{{"model", "ABD"}})) << "capitals come first";
+  EXPECT_EQ(modelList().selectionIndex(), 0U);
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
   EXPECT_EQ(screen.log.back(), "key and front");
 }
 
 TEST_F(StartUp, SkipsTheListWhenAllModelsShareTheirCables) {
-  const char* const kWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
-  struct Case {
+  const std::string wired =
+      expectedConnectionPage("wiredLan.png", "INST_TXT_USB\nINST_TXT_ETHERNET");
+  const std::string usb = expectedConnectionPage("usb.png", "INST_TXT_USB");
+  const struct {
     std::vector<Dictionary::Pair> models;
-    std::string page;
-    std::string secondChoice;
-  };
-  const Case cases[] = {
-      {{{"A", model(true, false, true)}}, "ConnectionTypeView", "INST_TXT_USB"},
-      {{{"A", model(true, true, true)}, {"B", model(true, true, false)}},
-       "ConnectionTypeView",
-       kWired},
-      {{{"A", model(false, true, true)}, {"B", model(false, true, true)}},
-       "ConnectionTypeView",
-       "INST_TXT_USB"},
-      {{{"A", model(true, true, true)}, {"B", model(true, false, true)}}, "ModelListView", ""},
-      {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, "ModelListView", ""},
-      {{{"A", model(true, false, true)},
-        {"No identifier", Dictionary{{"Interfaces", Dictionary{{"USB", true}}}}}},
-       "ModelListView",
-       ""}};
-  for (const Case& c : cases) {
+    std::string connectionPage;  // empty when the list is shown
+  } cases[] = {{{{"A", model(true, false, true)}}, usb},
+               {{{"A", model(true, true, false)}, {"B", model(true, true, true)}}, wired},
+               {{{"A", model(false, true, true)}, {"B", model(false, true, true)}}, usb},
+               {{{"A", model(true, true, true)}, {"B", model(true, false, true)}}, ""},
+               {{{"A", model(true, false, true)}, {"B", model(false, true, true)}}, ""},
+               {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, ""},
+               {{{"A", model(true, false, true)},
+                 {"No identifier", Dictionary{{"Interfaces", Dictionary{{"USB", true}}}}}},
+                ""}};
+  for (const auto& c : cases) {
     screen.reset();
     describe(c.models);
     launch();
-    EXPECT_EQ(page(), c.page);
-    if (c.page != "ConnectionTypeView") continue;
-    EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no list to go back to";
-    EXPECT_EQ(screen.object("connectionTypeRadioButton").cells[std::pair(1, 0)], c.secondChoice);
+    EXPECT_EQ(page(), c.connectionPage.empty() ? "ModelListView" : "ConnectionTypeView");
+    if (!c.connectionPage.empty()) {
+      EXPECT_EQ(connectionPage(), c.connectionPage);
+    }
+    EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no page to go back to";
   }
 }
 
 TEST_F(StartUp, OpensThePackageAtOnceWhenNoModelIsWireless) {
-  const std::vector<std::vector<Dictionary::Pair>> media = {
+  const std::vector<Dictionary::Pair> media[] = {
       {{"Cable", model(true, true, false)}},
       {},
       {{"No identifier", Dictionary{{"Interfaces", Dictionary{{"WirelessLAN", true}}}}}}};
-  for (std::size_t i = 0; i < media.size(); ++i) {
+  for (const auto& models : media) {
     screen.reset();
-    describe(media[i]);
+    describe(models);
     launch();
     EXPECT_EQ(page(), "");
-    EXPECT_EQ(medium.opened(i + 1).size(), i + 1);
     EXPECT_FALSE(medium.modelFile());
     EXPECT_TRUE(medium.optionsFile());
-    screen.runTimers();
-    EXPECT_TRUE(screen.terminated);
+    expectPackageOpenedAndQuit();
   }
-}
-
-TEST_F(StartUp, ListsModelsByTheirExactSpelling) {
-  describe({{"abc", model(true, true, true)}, {"ABD", model(true, false, true)}});
-  launch();
-  ASSERT_EQ(modelList().arrangedObjects().size(), 2U);
-  EXPECT_EQ(modelList().arrangedObjects()[0], (Dictionary{{"model", "ABD"}}));
-  EXPECT_EQ(modelList().selectionIndex(), 0U);
 }
 
 TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
@@ -83,7 +77,8 @@ TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
   medium.setEnvironment("LANG", "ja_JP.UTF-8");
   medium.write(
       "MacResources/CDCommonMessage.bundle/Contents/Resources/ja.lproj/Localizable.strings",
-      std::string("\"APP_MENU_HIDEOHTERS\" = \"他を隠す\"; \"BTN_NEXT\" = \"次へ\";"));
+      std::string("APP_MENU_ABOUT = a; APP_MENU_HIDE = h; APP_MENU_HIDEOHTERS = \"他を隠す\";"
+                  "APP_MENU_QUIT = q; BTN_NEXT = \"次へ\";"));
   medium.write("Onramp OSX.app/Contents/Resources/Background.png", std::string("picture"));
   launch();
   EXPECT_EQ(screen.object("window").text, "Onramp OSX");
@@ -91,24 +86,11 @@ TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
             medium.path("Onramp OSX.app/Contents/Resources/Background.png"));
   EXPECT_EQ(screen.object("mBackGroundView").scaling, ImageScaling::kAxesIndependently);
   const Menu menu = mainMenu().itemWithTitle("Onramp OSX").submenu();
-  EXPECT_TRUE(menu.itemWithTitle("他を隠す"));
-  EXPECT_TRUE(menu.itemWithTitle("Show All")) << "keeps its English title without a translation";
+  for (const char* title : {"a", "h", "他を隠す", "q", "Show All"})
+    EXPECT_TRUE(menu.itemWithTitle(title)) << title;
+  EXPECT_FALSE(screen.object("window").resizeIndicator);
+  EXPECT_EQ(screen.log.front(), "center");
   EXPECT_EQ(buttons(), "[BTN_CANCEL][次へ]");
-}
-
-// Puts a property list where an earlier run left one.
-void leaveFile(const std::string& file) {
-  std::filesystem::create_directories(std::filesystem::path(file).parent_path());
-  ASSERT_TRUE(writeDictionaryAtomically({}, file));
-}
-
-TEST_F(StartUp, RemovesWhatAnEarlierRunHandedOver) {
-  describeTwoModels();
-  for (const std::string& file : {medium.modelFilePath(), medium.optionsFilePath()})
-    leaveFile(file);
-  launch();
-  EXPECT_FALSE(medium.modelFile());
-  EXPECT_FALSE(medium.optionsFile());
 }
 
 // Every file below `folder` with its bytes.
@@ -122,9 +104,41 @@ std::map<std::string, std::string> filesBelow(const std::string& folder) {
   return files;
 }
 
+void leaveFile(const std::string& file) {
+  std::filesystem::create_directories(std::filesystem::path(file).parent_path());
+  std::ofstream(file) << "left over";
+}
+
+TEST_F(StartUp, RemovesWhatEarlierRunsLeft) {
+  describeTwoModels();
+  const pid_t ended = fork();  // a process number that nobody has any more
+  if (ended == 0) _exit(0);
+  waitpid(ended, nullptr, 0);
+  std::vector<std::string> kept;
+  for (const std::string& file : {medium.modelFilePath(), medium.optionsFilePath()}) {
+    const std::filesystem::path path(file);
+    const std::string temporary = path.parent_path() / ("." + path.filename().string() + ".");
+    leaveFile(file);
+    leaveFile(temporary + std::to_string(ended) + "-0");
+    leaveFile(temporary + std::to_string(getpid()) + "-12");
+    for (const std::string& other : {temporary + "1-0", temporary + "x-0", file + ".other"}) {
+      leaveFile(other);  // of a running writer, or of somebody else
+      kept.push_back(other);
+    }
+  }
+  std::filesystem::remove(medium.modelFilePath());
+  leaveFile(medium.modelFilePath() + "/a folder in the file's place");
+  launch();
+  std::vector<std::string> found;
+  for (const char* const folder : {"../user", "../local"}) {
+    for (const auto& [file, bytes] : filesBelow(medium.path(folder)))
+      found.push_back(std::filesystem::path(file).lexically_normal());
+  }
+  EXPECT_THAT(found, testing::UnorderedElementsAreArray(kept));
+}
+
 TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
-  const std::string texts =
-      "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
+  const std::string texts = kEnglishTexts;
   const std::string files[] = {"MacResources/Common.plist", "MacResources/CDInfo.plist",
                                "MacResources/ModelInfo.plist", "Onramp OSX.app/Contents/Info.plist",
                                texts};
@@ -181,17 +195,6 @@ TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
   }
 }
 
-TEST_F(StartUp, MakesTheVendorNameOfItsWords) {
-  const std::pair<Dictionary, std::string> cases[] = {
-      {{{"VenderName", "Kestrel Imaging  Works"}}, "KestrelImagingWorks"},
-      {{{"VenderName", 5}}, ""},
-      {{}, ""}};
-  for (const auto& [resources, expected] : cases) {
-    medium.write("MacResources/Common.plist", resources);
-    EXPECT_EQ(OnrampOSXAppDelegate::setVenderName(), expected);
-  }
-}
-
 TEST_F(StartUp, GoesOnWithoutAPageWhoseInterfaceFileIsMissing) {
   describeTwoModels();
   screen.missingInterfaces = {"ModelListView", "ChooseDeviceView"};
@@ -203,14 +206,6 @@ TEST_F(StartUp, GoesOnWithoutAPageWhoseInterfaceFileIsMissing) {
 
 Dictionary version(Value major, Value minor, Value bugFix) {
   return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
-}
-
-TEST_F(StartUp, NeedsNothingOnTheMedium) {
-  launch();
-  EXPECT_EQ(page(), "");
-  EXPECT_EQ(medium.opened(0), std::vector<std::string>());
-  screen.runTimers();
-  EXPECT_TRUE(screen.terminated);
 }
 
 TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
@@ -243,34 +238,34 @@ TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
     medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
     leaveFile(medium.modelFilePath());
     launch();
-    EXPECT_EQ(medium.modelFile().has_value(), !c.alert.empty())
+    EXPECT_EQ(std::filesystem::exists(medium.modelFilePath()), !c.alert.empty())
         << "no hand-off file is touched before the check";
     EXPECT_EQ(page(), c.alert.empty() ? "ModelListView" : "");
     ASSERT_EQ(screen.alerts.size(), c.alert.empty() ? 0U : 1U);
     if (c.alert.empty()) continue;
     EXPECT_NE(screen.alerts[0].informativeText.find(c.alert), std::string::npos)
         << screen.alerts[0].informativeText;
-    EXPECT_EQ(screen.alerts[0].buttonTitle, "Close");
+    EXPECT_EQ(screen.alerts[0].messageText + screen.alerts[0].buttonTitle,
+              "This OS version is not supported.\nSoftware cannot be installed.Close");
     EXPECT_EQ(screen.log, (std::vector<std::string>{"center", "close", "alert", "terminate"}));
   }
 }
 
 TEST_F(StartUp, FillsTheMinimumIntoAsManyPlacesAsTheTextHas) {
   describeTwoModels(Dictionary{{"SystemMin", version(10, 11, 0)}});
-  const std::pair<std::string, std::string> texts[] = {{"%@ bis %@.", "10.11 bis 10.11."},
+  const std::pair<std::string, std::string> texts[] = {{"%@ to %@.", "10.11 to 10.11."},
                                                        {"%@", "10.11"},
-                                                       {"neuer", "neuer"},
+                                                       {"newer", "newer"},
                                                        {"%@ %@ %@", "%@ %@ %@"}};
   for (const auto& [text, expected] : texts) {
     screen.reset();
     medium.write(
-        "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings",
-        "\"INST_TXT_ALERT_OSMIN\" = \"" + text + "\";");
+        kEnglishTexts,
+        "INST_TXT_ALERT_OS = head; BTN_CLOSE = close; INST_TXT_ALERT_OSMIN = \"" + text + "\";");
     launch();
     ASSERT_EQ(screen.alerts.size(), 1U);
     EXPECT_EQ(screen.alerts[0].informativeText, expected);
-    EXPECT_EQ(screen.alerts[0].messageText,
-              "This OS version is not supported.\nSoftware cannot be installed.");
+    EXPECT_EQ(screen.alerts[0].messageText + '|' + screen.alerts[0].buttonTitle, "head|close");
   }
 }
 

@@ -8,15 +8,24 @@
 #include "app/OnrampOSXAppDelegate.h"
 #include "base/array_controller.h"
 #include "pages/ChooseDeviceView.h"
+#include "tests/recording/agents.h"
 #include "tests/recording/front_end.h"
 #include "tests/recording/medium_folder.h"
+#include "tests/recording/network.h"
 
 namespace onramp {
 
-/// The wizard on a medium of the test's own, seen and used as a person does.
+inline constexpr const char* kEnglishTexts =
+    "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
+
+/// The wizard on a temporary medium and a scripted network, seen and used as a person does.
 class Wizard : public testing::Test {
  protected:
-  void SetUp() override { screen.reset(); }
+  void SetUp() override {
+    screen.reset();
+    network.reset();
+    agents.reset();
+  }
   void TearDown() override { screen.reset(); }
 
   /// A medium with a package and the two models "All" (USB, wired, wireless) and "Cable" (USB
@@ -29,7 +38,6 @@ class Wizard : public testing::Test {
 
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
-    names.reserve(models.size());
     for (const auto& [name, unused] : models)
       names.push_back(name);
     Dictionary resources{
@@ -38,7 +46,6 @@ class Wizard : public testing::Test {
         {"WLANtool", "Setup.app"}};
     for (const auto& [key, value] : more)
       resources = resources.with(key, value);
-    medium.write("Pkg/Kestrel.pkg", std::string("package"));
     medium.describe(resources, recording::containing(names).with("InstallPKG", installPKG),
                     Dictionary(models));
   }
@@ -62,6 +69,22 @@ class Wizard : public testing::Test {
     modelList().setSelectedObject(Dictionary{{"model", name}});
   }
 
+  void chooseRow(int row) const { screen.object("connectionTypeRadioButton").selectedRow = row; }
+
+  /// Runs a command of the chooser's menu, counted from the top.
+  void chooseMenuItem(std::size_t index) const {
+    screen.object("deviceListPopupButton").items.at(index).second();
+  }
+
+  /// A wireless device of the maker Kestrel comes to the network, at 192.0.2.`host`.
+  void appear(const std::string& name, const std::string& model, unsigned char host) const {
+    const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
+    agents.answers["192.0.2." + std::to_string(host)] = {2};
+    network.found(service);
+    network.resolves(service, {recording::ipv4Address(192, 0, 2, host)},
+                     recording::txtData({"usb_MFG=Kestrel", "usb_MDL=" + model}));
+  }
+
   /// "name address" of every row of the device list from the top.
   [[nodiscard]] std::vector<std::string> deviceRows() const {
     std::vector<std::string> rows;
@@ -71,8 +94,6 @@ class Wizard : public testing::Test {
     }
     return rows;
   }
-
-  void chooseRow(int row) const { screen.object("connectionTypeRadioButton").selectedRow = row; }
 
   /// "[title]" of every visible button from left to right, disabled ones as "(title)".
   [[nodiscard]] std::string buttons() const {
@@ -85,16 +106,42 @@ class Wizard : public testing::Test {
     return shown;
   }
 
-  /// The package was handed to the desktop, and the application ends a second later.
+  /// The connection page's heading, explanation, pictures and choices, a line each.
+  [[nodiscard]] std::string connectionPage() const {
+    auto& choices = screen.object("connectionTypeRadioButton").cells;
+    std::string shown;
+    for (const std::string& part :
+         {screen.object("connectionTypeTitle").text,
+          screen.object("connectionDescriptionTextField").text,
+          screen.object("connectionTypeImage1").imagePath, choices[std::pair(0, 0)],
+          screen.object("connectionTypeImage2").imagePath, choices[std::pair(1, 0)]}) {
+      shown += part + '\n';
+    }
+    return shown;
+  }
+
+  /// What connectionPage() should be for a model with that picture and those words for a cable.
+  [[nodiscard]] std::string expectedConnectionPage(const std::string& picture,
+                                                   const std::string& choice) const {
+    const std::string images = medium.path("MacResources/Images/");
+    return "INST_TXT_CONNECTIONTYPE\nINST_TXT_CONNECTIONTYPE_DESC\n" + images +
+           "wirelessLan.png\nINST_TXT_WIFI\n" + images + picture + '\n' + choice + '\n';
+  }
+
+  /// The desktop was asked to open the package and nothing else; a second later the application
+  /// ends.
   void expectPackageOpenedAndQuit() {
-    EXPECT_EQ(medium.opened(1), std::vector{medium.path("Pkg/Kestrel.pkg")});
+    EXPECT_EQ(screen.opened, std::vector{medium.path("Pkg/Kestrel.pkg")});
     EXPECT_FALSE(screen.terminated);
+    EXPECT_EQ(screen.delays.back(), 1.0);
     screen.runTimers();
     EXPECT_TRUE(screen.terminated);
   }
 
   recording::MediumFolder medium;
   recording::FrontEnd& screen = recording::FrontEnd::instance();
+  recording::Network& network = recording::Network::instance();
+  recording::Agents& agents = recording::Agents::instance();
   Dictionary installPKG;
   std::unique_ptr<OnrampOSXAppDelegate> delegate;
 };

@@ -1,7 +1,7 @@
-"""A person at the screen of the front end for Cocoa when it runs on GNUstep.
+"""A person at the screen of the Cocoa front end under GNUstep.
 
-Nothing there speaks AT-SPI. The program writes down what can be seen instead, by the same roles,
-when it is asked.
+GNUstep has no AT-SPI. Instead the program, asked through a file, writes down the controls that are
+visible, by the same roles (accessibility.mm).
 """
 
 import itertools
@@ -23,7 +23,7 @@ _MENU_BAR_ITEM = "Onramp OSX"
 class GNUstepPerson(Person):
     """Starts a program on a desktop and uses it. Use it in a `with` statement."""
 
-    errors = ()  # what the use of a control raises that is gone
+    errors = ()  # raised by the use of a control that is gone
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
@@ -33,7 +33,7 @@ class GNUstepPerson(Person):
         variables = {
             "ONRAMP_ACCESSIBILITY_FILE": str(self._answer),
             "GNUSTEP_CONFIG_FILE": str(self._configure(folder)),
-            # Strings tables in UTF-8 are read in the locale's encoding.
+            # GNUstep reads strings tables in the locale's encoding; ours are in UTF-8.
             "LC_CTYPE": "C.UTF-8",
         } | self._options_as_environment(list(arguments))
         self.process = start([str(program)], env=desktop.env | variables | (env or {}))
@@ -55,8 +55,8 @@ class GNUstepPerson(Person):
         self._point_at(control)
         before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
-        # What is let go of before its pressing was noticed, GNUstep sees let go of first. An open
-        # menu takes the mouse for itself: its presses are never counted.
+        # Released before GNUstep has noticed the press, the button looks released first. Presses
+        # inside an open menu, which grabs the mouse, are never counted.
         deadline = time.monotonic() + _PRESS_SECONDS
         while self._noticed_presses() == before and time.monotonic() < deadline:
             pass
@@ -66,14 +66,14 @@ class GNUstepPerson(Person):
         return self._read()[0]["presses"] if self.is_running() else 0
 
     def choose_from_menu(self, button, item):
-        """Takes a button's `item`th menu entry. The menu is open as long as the button is held."""
+        """Chooses a button's `item`th menu entry. The menu is open while the mouse button is held."""
         self._point_at(self.see("button menu", button))
         self.desktop.run(["xdotool", "mousedown", "1"])
         nudge = itertools.cycle((0, 1))
 
         def noticed():
-            # The menu's window is put in its place late, so the entries are looked for at every try.
-            # A pointer that stands still from before the menu was ready is never noticed.
+            # The menu's window moves into place late, so the entries are looked up at every try. A
+            # pointer that has not moved since before the menu was ready is never noticed.
             entries = self._menu_entries()
             if not entries:
                 return False
@@ -84,7 +84,7 @@ class GNUstepPerson(Person):
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):
-        """The entries of the menu that is open; the menu bar has one of its own."""
+        """The entries of the open menu, without the menu bar's."""
         items = [control for control in self._read() if control["role"] == "menu item"]
         return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
 
@@ -97,7 +97,7 @@ class GNUstepPerson(Person):
         return self._at_rest(role, name)
 
     def _at_rest(self, role, name):
-        """The control once it stays where it is: a new window is moved by the window manager."""
+        """The control once it has stopped moving: the window manager moves a new window."""
         seen = None
         while True:
             now = self._look(role, name)
@@ -114,7 +114,7 @@ class GNUstepPerson(Person):
         self._read()
 
     def _read(self):
-        """What is on the screen; blocks as long as the program's loop does."""
+        """The visible controls; blocks while the program's loop is blocked."""
         self._answer.unlink(missing_ok=True)
         self._question.touch()
         wait_for(lambda: self._answer.exists() or not self.is_running(), _ANSWER_SECONDS,
@@ -125,7 +125,7 @@ class GNUstepPerson(Person):
             return [{"role": "application", "name": "", "states": [], "presses": 0}]
 
     def _configure(self, folder):
-        """The system's own GNUstep, with application-support folders on this desktop."""
+        """Writes the system's GNUstep configuration with this desktop's folders."""
         own = {"GNUSTEP_USER_DIR_LIBRARY": os.path.relpath(self.desktop.user_folder, folder),
                "GNUSTEP_LOCAL_LIBRARY": str(self.desktop.local_folder)}
         lines = [line for line in _SYSTEM_CONFIGURATION.read_text(encoding="utf-8").splitlines()
@@ -138,7 +138,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """This front end has no options of its own: what they set, it takes from the environment."""
+        """The environment that stands for the options: the Cocoa front end has none."""
         if not arguments:
             return {}
         option, value = arguments

@@ -1,4 +1,4 @@
-"""With this folder in PYTHONPATH, every test of tests/window uses the front end for Cocoa on GNUstep.
+"""With this folder in PYTHONPATH, every test of tests/window uses the Cocoa front end under GNUstep.
 
 Python imports it as it starts, in the processes that a test starts as well.
 """

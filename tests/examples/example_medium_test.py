@@ -80,12 +80,13 @@ class Messages(unittest.TestCase):
                     self.assertEqual(english[key].count("%@"), text.count("%@"))
                     self.assertNotIn("%", text.replace("%@", ""))
 
-    def test_english_texts_are_those_that_the_sources_fall_back_to(self):
+    def test_the_fallbacks_in_the_sources_are_filled_like_the_texts(self):
         calls = re.findall(rf"localized\(\s*{KEY},\s*((?:{TEXT}\s*)+)\)", sources())
         fallbacks = {key: ast.literal_eval(f"({text})") for key, text in calls}
         self.assertIn("INST_TXT_ALERT_OSMIN", fallbacks)
         english = messages("en")
-        self.assertEqual(fallbacks, {key: english[key] for key in fallbacks})
+        self.assertEqual({key: english[key].count("%@") for key in fallbacks},
+                         {key: text.count("%@") for key, text in fallbacks.items()})
 
     def test_descriptions_name_the_next_button_as_it_is_titled(self):
         for language in LANGUAGES:

@@ -11,7 +11,7 @@ namespace {
 
 using recording::MediumFolder;
 
-TEST(FullPath, CountsFromTheFolderThatHoldsTheBundle) {
+TEST(FullPath, IsRelativeToTheFolderThatHoldsTheBundle) {
   struct Case {
     const char* bundle;
     std::optional<std::string> relative;
@@ -29,12 +29,13 @@ TEST(FullPath, CountsFromTheFolderThatHoldsTheBundle) {
   }
 }
 
-TEST(MediumDescription, TakesDefaultsForWhatIsMissingOrOfAnotherType) {
-  const Dictionary info{{"ContainedModel", Dictionary{{"ABD", 1}, {"abc", 1}, {"abE", 1}}},
-                        {"Type", Dictionary{{"Printer", "NO"}, {"TWAIN", 0}}},
-                        {"KSCSeriesCode", 7}};
+TEST(MediumDescription, HasADefaultForWhateverIsMissingOrOfAnotherType) {
+  const Dictionary info{
+      {"ContainedModel", Dictionary{{"ABD", 1}, {"abc", 1}, {"a_", 1}, {"abE", 1}}},
+      {"Type", Dictionary{{"Printer", "NO"}, {"TWAIN", 0}}},
+      {"KSCSeriesCode", 7}};
   const Dictionary common{{"BonjourNetwork", "_printer._tcp."}};
-  const Dictionary expected{{"contained models", Array{"abc", "ABD", "abE"}},
+  const Dictionary expected{{"contained models", Array{"a_", "abc", "ABD", "abE"}},
                             {"support Printer Pacakge", true},
                             {"support Scanner Package", false},
                             {"KSC Series Code", ""},
@@ -52,7 +53,7 @@ TEST(MediumDescription, TakesDefaultsForWhatIsMissingOrOfAnotherType) {
 }
 
 TEST(ModelRecord, FollowsTheModelInformation) {
-  const Dictionary interfaces{{"USB", "no"}, {"WiredLAN", 1}, {"WirelessLAN", "yes"}};
+  const Dictionary interfaces{{"USB", "no"}, {"WiredLAN", 1.0}, {"WirelessLAN", "yes"}};
   const Dictionary info{
       {"Model", Dictionary{{"Plain", Dictionary{{"KSCID", "p"}}},
                            {"Odd", Dictionary{{"KSCID", 5}, {"Interfaces", interfaces}}},
@@ -74,21 +75,31 @@ TEST(ModelRecord, FollowsTheModelInformation) {
 }
 
 TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
-  const Dictionary byVersion{
-      {"PkgLocation", "Packages/"}, {"104", "four.pkg"}, {"106", "six.pkg"}, {"109", "nine.pkg"}};
+  const Dictionary byVersion{{"PkgLocation", "Packages/"},
+                             {"104", "4"},
+                             {"105", "5"},
+                             {"106", "6"},
+                             {"107", "7"},
+                             {"109", "9"}};
   struct Case {
     const char* system;
     Dictionary package;
     std::optional<std::string> expected;
   };
   const Case cases[] = {
-      {"10.6.8", byVersion, "Packages/six.pkg"},
       {"10.3.9", byVersion, std::nullopt},
-      {"10.5.0", byVersion, std::nullopt},  // has a key, but the medium no package under it
-      {"10.15.7", byVersion, "Packages/nine.pkg"},
-      {"11.0.0", byVersion, "Packages/nine.pkg"},
-      {"101.0.0", byVersion, std::nullopt},  // past 0x100FF
+      {"10.4.0", byVersion, "Packages/4"},
+      {"10.5.9", byVersion, "Packages/5"},
+      {"10.6.0", byVersion, "Packages/6"},
+      {"10.7.5", byVersion, "Packages/7"},
+      {"10.8.5", byVersion, std::nullopt},  // has a key, but the medium has no package under it
+      {"10.9.0", byVersion, "Packages/9"},
+      {"11.0.0", byVersion, "Packages/9"},
+      {"100.9.9", byVersion, "Packages/9"},  // 0x10099
+      {"101.0.0", byVersion, std::nullopt},  // above 0x100FF
       {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+      {"10.6.8", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+      {"10.6.8", byVersion.with("PkgName", Array{}), std::nullopt},
       {"10.6.8", Dictionary{{"PkgName", "all.pkg"}}, std::nullopt}};
   for (const Case& c : cases) {
     MediumFolder medium;
@@ -99,7 +110,7 @@ TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
   }
 }
 
-TEST(InstallerInformation, HasDefaultsForEveryMissingPart) {
+TEST(InstallerInformation, HasADefaultForEveryMissingPart) {
   const Dictionary unbounded{{"Major", "0"}, {"Minor", "0"}, {"BugFix", "0"}};
   MediumFolder medium;
   const KSInstallerInfo unreadable;

@@ -3,8 +3,6 @@
 #include "base/notification_center.h"
 #include "bonjour/KSDevice.h"
 #include "tests/app/wizard.h"
-#include "tests/recording/agents.h"
-#include "tests/recording/network.h"
 
 namespace onramp {
 namespace {
@@ -12,6 +10,7 @@ namespace {
 using recording::Agents;
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
+using ::testing::Pair;
 
 constexpr int kSilent = Agents::kSilent;
 constexpr int kWired = 1;
@@ -29,14 +28,15 @@ class Chooser : public Wizard {
  protected:
   void SetUp() override {
     Wizard::SetUp();
-    agents.reset();
-    network.reset();
     for (const char* address : {"192.0.2.1", "192.0.2.2", "192.0.2.3"})
       agents.answers[address] = {kWireless};
     describeTwoModels();
     delegate = std::make_unique<OnrampOSXAppDelegate>();
-    page = std::static_pointer_cast<ChooseDeviceView>(delegate->loadView("ChooseDeviceView"));
+    load();
     page->setSearchModelList({"Kestrel Model 50", "Kestrel Model 100"});
+  }
+  void load() {
+    page = std::static_pointer_cast<ChooseDeviceView>(delegate->loadView("ChooseDeviceView"));
   }
   void TearDown() override {
     page->stopBrowsing();
@@ -51,10 +51,38 @@ class Chooser : public Wizard {
     return rows;
   }
 
-  Agents& agents = Agents::instance();
-  recording::Network& network = recording::Network::instance();
   std::shared_ptr<ChooseDeviceView> page;
 };
+
+TEST_F(Chooser, ComesUpWithItsTextsAndItsMenu) {
+  medium.write(kEnglishTexts, std::string("INST_TXT_DEVICE = name; INST_TXT_CONNECTION = way;"
+                                          "INST_TXT_IPADDRESS = place; INST_TXT_REFRESH = again;"));
+  load();
+  EXPECT_EQ(screen.object("deviceListTitle").text, "INST_TXT_DEVLIST");
+  EXPECT_EQ(screen.object("progressTxtField").text, "INST_WAIT");
+  EXPECT_TRUE(screen.object("progress").hidden && screen.object("progressTxtField").hidden);
+  const recording::Object& table = screen.object("deviceListView");
+  EXPECT_THAT(table.headers, ElementsAre(Pair("device", "name"), Pair("interface", "way"),
+                                         Pair("location", "place")));
+  EXPECT_THAT(table.fixedColumns, ElementsAre("device", "interface", "location"));
+  EXPECT_FALSE(table.columnsCanMove || table.columnsCanBeSelected);
+
+  const auto commands = [&] {
+    std::vector<std::string> titles;
+    for (const auto& [title, command] : screen.object("deviceListPopupButton").items)
+      titles.push_back(title);
+    return titles;
+  };
+  EXPECT_THAT(commands(), ElementsAre("Gear", "Setup...", "again")) << "the tool's file name";
+  medium.addSetUpTool(0);
+  load();
+  EXPECT_THAT(commands(), ElementsAre("Gear", "Wireless Setup...", "again"));
+  medium.setEnvironment("LANG", "de_DE.UTF-8");
+  medium.write("Setup.app/Contents/Resources/de.lproj/InfoPlist.strings",
+               std::string("CFBundleDisplayName = Einrichtung;"));
+  load();
+  EXPECT_THAT(commands(), ElementsAre("Gear", "Einrichtung...", "again"));
+}
 
 TEST_F(Chooser, ListsOnlyTheModelsLookedFor) {
   const struct {
@@ -84,7 +112,7 @@ TEST_F(Chooser, ListsOnlyTheModelsLookedFor) {
   EXPECT_THAT(rows(), IsEmpty());
 }
 
-TEST_F(Chooser, TheFirstAddressThatAnswersAtOnceDecides) {
+TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
   const struct {
     std::vector<std::vector<int>> answers;  // of each address
     std::vector<std::size_t> asked;         // requests to each address
@@ -100,7 +128,7 @@ TEST_F(Chooser, TheFirstAddressThatAnswersAtOnceDecides) {
       {{{kSilent}, {kWireless}, {kWired}}, {6, 1, 0}, true},
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
-      // Once unanswered, an address has its three attempts, and the next one is asked.
+      // After one unanswered request an address gets all its attempts, and then the next is asked.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},
@@ -121,10 +149,12 @@ TEST_F(Chooser, TheFirstAddressThatAnswersAtOnceDecides) {
   }
 }
 
-TEST_F(Chooser, SortsByNameAndReplacesWhatIsReportedAnew) {
+TEST_F(Chooser, SortsByNameAndSelectsTheFirstRowUntilTheUserChoosesOne) {
   for (const char* name : {"b", "C", "a"})
     page->updateKSDevice(device(name));
-  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
+  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1*", "a 192.0.2.1", "b 192.0.2.1"));
+  EXPECT_EQ(page->choosedDevice()->string("interface"), "Network");
+  screen.object("deviceListView").content->choose(2);
   for (const char* name : {"a", "b", "C"})
     page->updateKSDevice(device(name));
   EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
@@ -136,7 +166,7 @@ TEST_F(Chooser, AnUpdateWithAnotherAddressLeavesTheOldEntry) {
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*", "D 192.0.2.2"));
   page->removeKSDevice(device("D", {"192.0.2.2"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
-  // The other addresses are part of the record, too.
+  // The record holds the other addresses too, so this one is not equal to the listed one.
   page->removeKSDevice(device("D", {"192.0.2.1"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
 }
@@ -151,22 +181,20 @@ TEST_F(Chooser, NeitherAnUpdateNorARemovalOfAWiredDeviceChangesTheList) {
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
 }
 
-TEST_F(Chooser, OneSearchAtATimeFeedsTheListWhichOnlyARefreshEmpties) {
-  const auto appear = [&](const std::string& name) {
-    const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
-    network.found(service);
-    network.resolves(service, {recording::ipv4Address(192, 0, 2, 1)},
-                     recording::txtData({"usb_MFG=Kestrel", "usb_MDL=Model 100"}));
-  };
+TEST_F(Chooser, OneSearchAtATimeFillsTheListAndOnlyARefreshEmptiesIt) {
   page->startBrowsing();
   page->startBrowsing();
   EXPECT_EQ(network.browsers.size(), 1U);
-  appear("A");
+  appear("A", "Model 100", 1);
   page->stopBrowsing();
   page->stopBrowsing();
   EXPECT_THAT(network.browsers, IsEmpty());
-  appear("B");
+  appear("B", "Model 100", 1);
   EXPECT_THAT(rows(), ElementsAre("A 192.0.2.1*"));
+
+  page->startBrowsing();
+  chooseMenuItem(1);
+  EXPECT_THAT(network.browsers, IsEmpty()) << "the set-up tool's command ends the search";
 
   int asked = 0;
   NotificationCenter::defaultCenter().addObserver(

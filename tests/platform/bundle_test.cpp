@@ -10,7 +10,7 @@ namespace {
 
 using Names = std::vector<std::string>;
 
-TEST(Language, IsToldFromEveryWayOfWritingIt) {
+TEST(Language, IsReadInEverySpelling) {
   struct Case {
     const char* identifier;
     const char* code;
@@ -37,7 +37,7 @@ TEST(Language, IsToldFromEveryWayOfWritingIt) {
   }
 }
 
-TEST(Language, IsChosenByLocaleThenLanguageThenDevelopment) {
+TEST(Language, FallsBackToTheDevelopmentLanguageThenEnglishThenAny) {
   struct Case {
     Names offered;
     Names preferred;
@@ -59,7 +59,11 @@ TEST(Language, IsChosenByLocaleThenLanguageThenDevelopment) {
                         {{"en", "zh_CN"}, {"zh-Hans-SG"}, "en", {"zh_CN", "en"}},
                         {{"en", "zh"}, {"zh-Hans-CN"}, "en", {"zh", "en"}},
                         {{"sr", "sr-Latn"}, {"sr_RS"}, "en", {"sr", "sr-Latn"}},
-                        {{"ja"}, {"fr"}, "en", {}},
+                        {{"ja"}, {"fr"}, "en", {"ja"}},
+                        {{"ja", "en_GB"}, {"fr"}, "it", {"en_GB"}},
+                        {{"Base", "zh", "ko", "ja"}, {"zh_TW"}, "it", {"ja"}},
+                        {{"en", "zh_CN", "zh_TW"}, {"zh_MO"}, "en", {"zh_TW", "en"}},
+                        {{"Base"}, {"fr"}, "en", {}},
                         {{"en", "ja"}, {"fr"}, "ja_JP", {"ja"}},
                         {{}, {"en"}, "en", {}}};
   for (const Case& c : cases) {
@@ -82,19 +86,19 @@ class BundleOnMedium : public testing::Test {
   recording::MediumFolder medium;
 };
 
-TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAsTheDiskIsNow) {
+TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAndReadsTheDiskEachTime) {
   EXPECT_EQ(text("k"), "no bundle");
   resource("English.lproj/Localizable.strings", "k = english; only = english;");
   resource("zh_CN.lproj/Localizable.strings", "\"k\" = \"简体\";");
   medium.setEnvironment("LANG", "zh_CN.UTF-8");
   EXPECT_EQ(text("k"), "简体");
-  EXPECT_EQ(text("only"), "fallback") << "one table is asked";
+  EXPECT_EQ(text("only"), "fallback") << "only one language's table is read";
   medium.setEnvironment("LANG", "ko_KR.UTF-8");
   EXPECT_EQ(text("k"), "english");
   medium.setEnvironment("LANGUAGE", "pt:zh_CN");
   EXPECT_EQ(text("k"), "简体");
   medium.setEnvironment("LC_ALL", "C");
-  EXPECT_EQ(text("k"), "english") << "the list counts for nothing in the C locale";
+  EXPECT_EQ(text("k"), "english") << "the C locale ignores the list";
 
   medium.setEnvironment("LC_ALL", "ko_KR.UTF-8");
   medium.setEnvironment("LANGUAGE", std::nullopt);
@@ -108,7 +112,7 @@ TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAsTheDiskIsNow) {
   EXPECT_EQ(Bundle::open(medium.path("Some.bundle"))->localizedString("k", "v", "Other"), "v");
 }
 
-TEST_F(BundleOnMedium, FindsResourcesForEverybodyFirst) {
+TEST_F(BundleOnMedium, PrefersResourcesThatAreNotLocalized) {
   resource("Picture.png", "");
   resource("de.lproj/Picture.png", "");
   resource("de.lproj/Own.png", "");
@@ -124,7 +128,7 @@ TEST_F(BundleOnMedium, FindsResourcesForEverybodyFirst) {
   EXPECT_EQ(bundle->pathForResource("de", "lproj"), std::nullopt) << "a folder";
 }
 
-TEST_F(BundleOnMedium, NamesItsProgramWhereverThatLies) {
+TEST_F(BundleOnMedium, NamesItsProgramInEitherSystemsFolder) {
   medium.write("Some.bundle/Contents/Info.plist", Dictionary{{"CFBundleExecutable", "tool"}});
   const std::string contents = medium.path("Some.bundle/Contents/");
   const auto bundle = Bundle::open(medium.path("Some.bundle"));

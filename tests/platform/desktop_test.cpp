@@ -1,8 +1,10 @@
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 
 #include <chrono>
 #include <filesystem>
+#include <fstream>
 #include <thread>
 
 #include "platform/child_process.h"
@@ -18,7 +20,7 @@ namespace {
 
 using Environment = std::vector<std::pair<const char*, const char*>>;
 
-TEST(Desktop, TakesLanguageAndCountryFromTheUsualVariables) {
+TEST(Desktop, TakesLanguageAndCountryFromTheLocaleVariables) {
   struct Case {
     Environment environment;
     const char* language;
@@ -69,17 +71,35 @@ TEST(Desktop, KeepsApplicationSupportInTheXDGFolders) {
 
 TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   recording::MediumFolder medium;
-  medium.write("../bin/xdg-open", "#!/bin/sh\nsleep 0.2\nprintf '%s\\n' \"$#:$1\" >> '" +
-                                      medium.path("../opened") + "'\n");
-  medium.makeExecutable("../bin/xdg-open");
+  const std::string gate = medium.path("gate");
+  const std::string opened = medium.path("opened");
+  // The opener waits at the gate, then says how many words it got, the first one, and whether it
+  // leads a session.
+  medium.write("bin/xdg-open", "#!/bin/sh\ntimeout 60 cat '" + gate +
+                                   "' > /dev/null\nwords=\"$#:$1\"\n" +
+                                   "read -r line < /proc/$$/stat\nset -- $line\n" +
+                                   "[ \"$6\" = $$ ] && words=\"$words:own session\"\n" +
+                                   "printf '%s\\n' \"$words\" > '" + opened + ".part'\n" + "mv '" +
+                                   opened + ".part' '" + opened + "'\n");
+  medium.makeExecutable("bin/xdg-open");
+  medium.setEnvironment("PATH", medium.path("bin") + ":" + std::getenv("PATH"));
+  ASSERT_EQ(mkfifo(gate.c_str(), 0600), 0);
+  const auto throughTheGate = [&] {
+    EXPECT_FALSE(std::filesystem::exists(opened)) << "it waited for the opener";
+    std::ofstream(gate) << "go";
+    for (int i = 0; i < 1000 && !std::filesystem::exists(opened); ++i)
+      std::this_thread::sleep_for(std::chrono::milliseconds(10));
+    std::string line;
+    std::getline(std::ifstream(opened), line);
+    std::filesystem::remove(opened);
+    return line;
+  };
   EXPECT_TRUE(openFile("/a folder/-it's \"the\" $package.pkg"));
-  EXPECT_TRUE(medium.opened(0).empty()) << "it came back before the opener had done anything";
-  ASSERT_EQ(medium.opened(1).size(), 1U);
-  EXPECT_EQ(medium.opened(1)[0], "1:/a folder/-it's \"the\" $package.pkg");
+  EXPECT_EQ(throughTheGate(), "1:/a folder/-it's \"the\" $package.pkg:own session");
   EXPECT_TRUE(openFile("-v"));
-  EXPECT_EQ(medium.opened(2).back(), "1:./-v");
+  EXPECT_EQ(throughTheGate(), "1:./-v:own session");
   EXPECT_TRUE(openURL("http://support.kestrel.example/?a=b&c=d"));
-  EXPECT_EQ(medium.opened(3).back(), "1:http://support.kestrel.example/?a=b&c=d");
+  EXPECT_EQ(throughTheGate(), "1:http://support.kestrel.example/?a=b&c=d:own session");
   EXPECT_FALSE(openURL("--help"));
 
   const auto hasChildren = [] {
@@ -101,7 +121,7 @@ TEST(Desktop, OpensNothingWithoutAnOpener) {
   }
 }
 
-TEST(Desktop, TellsHowAChildProcessEnded) {
+TEST(Desktop, ReturnsHowAChildProcessEnded) {
   recording::MediumFolder medium;
   const auto script = [&](const std::string& commands) {
     medium.write("tool", "#!/bin/sh\n" + commands);
@@ -117,7 +137,7 @@ TEST(Desktop, TellsHowAChildProcessEnded) {
   EXPECT_EQ(runAndWait(medium.path(""), {}), std::nullopt);
 }
 
-TEST(Desktop, StandsInForTheSystemThatItIsTold) {
+TEST(Desktop, ReportsTheSystemVersionThatItIsGiven) {
   recording::MediumFolder medium;
   const std::pair<const char*, std::int32_t> cases[] = {
       {"10.6.8", 0x1068},  {"10.3.9", 0x1039},  {"10.15.7", 0x1097}, {"10.9", 0x1090},
@@ -134,7 +154,7 @@ TEST(Desktop, StandsInForTheSystemThatItIsTold) {
   }
   setSystemVersion("10.6.8");
   medium.setEnvironment("ONRAMP_SYSTEM_VERSION", "10.9.5");
-  EXPECT_EQ(productVersion(), "10.6.8") << "what the front end was told counts more";
+  EXPECT_EQ(productVersion(), "10.6.8") << "the front end's choice takes precedence";
   setSystemVersion("");
   EXPECT_EQ(productVersion(), "10.9.5");
 }

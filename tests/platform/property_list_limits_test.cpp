@@ -33,16 +33,18 @@ std::string reference(std::size_t index) {
   return bigEndian(index, 4);
 }
 
-// A binary list of these objects, the first one its root; references take four bytes.
-std::string binary(const std::vector<std::string>& objects) {
+// A binary list of these objects, with the first one as its root.
+std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
+                   int referenceSize = 4) {
   std::string bytes = "bplist00";
   std::string offsets;
   for (const std::string& object : objects) {
-    offsets += bigEndian(bytes.size(), 4);
+    offsets += bigEndian(bytes.size(), offsetSize);
     bytes += object;
   }
   const std::size_t table = bytes.size();
-  return bytes + offsets + std::string(6, '\0') + "\4\4" + bigEndian(objects.size(), 8) +
+  const std::string sizes{static_cast<char>(offsetSize), static_cast<char>(referenceSize)};
+  return bytes + offsets + std::string(6, '\0') + sizes + bigEndian(objects.size(), 8) +
          bigEndian(0, 8) + bigEndian(table, 8);
 }
 
@@ -55,7 +57,7 @@ std::string dictionaryOver(std::size_t count,
   return binary(objects);
 }
 
-// Each array holds the next one `times` times; the last object is a text.
+// Each array contains the next one `times` times; the last object is a text.
 std::string arrays(std::size_t depth, std::size_t times) {
   return dictionaryOver(depth + 1, [&](std::size_t i) {
     return i == depth + 2 ? std::string("\x51t")
@@ -68,7 +70,7 @@ struct Outcome {
   long peakKilobytes;
 };
 
-// Loads the file in a process of its own, whose memory can be told.
+// Loads the file in a separate process, to measure that one's memory.
 Outcome load(const std::string& path) {
   const pid_t loader = fork();
   if (loader == 0) _exit(loadDictionary(path) ? 0 : 1);
@@ -135,7 +137,20 @@ TEST(Limits, LeaveRoomForWhatMediaHold) {
     EXPECT_TRUE(loadDictionary(folder.holding("list", bytes))) << name;
 }
 
-TEST(Limits, EveryObjectOfABinaryListHasToBeWhole) {
+TEST(Limits, OffsetsAndReferencesTakeOneToEightBytes) {
+  const TemporaryFolder folder;
+  for (int size = 1; size <= 9; ++size) {
+    for (const auto& [offsets, references] : {std::pair(size, 1), std::pair(2, size)}) {
+      const std::string bytes =
+          binary({"\xD1" + bigEndian(1, references) + bigEndian(2, references), "\x51k", "\x51t"},
+                 offsets, references);
+      const auto expected = size <= 8 ? std::optional(Dictionary{{"k", "t"}}) : std::nullopt;
+      EXPECT_EQ(loadDictionary(folder.holding("list", bytes)), expected) << size;
+    }
+  }
+}
+
+TEST(Limits, EveryObjectOfABinaryListMustBeWhole) {
   const TemporaryFolder folder;
   const std::string whole = dictionaryOver(1, [](std::size_t) { return "\x51t"; });
   ASSERT_TRUE(loadDictionary(folder.holding("list", whole)));

@@ -2,19 +2,17 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
-#include <signal.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <chrono>
 #include <clocale>
+#include <functional>
 #include <limits>
-#include <random>
-#include <thread>
 
 #include "platform/child_process.h"
+#include "platform/failed_writes.h"
 #include "tests/recording/temporary_folder.h"
 
 namespace onramp {
@@ -60,7 +58,7 @@ TEST(PropertyList, HoldsEveryKindOfValueForAnotherReaderAndBack) {
   EXPECT_EQ(runAndWait(PYTHON, {PEER, "check", folder / "written"}), 0);
   EXPECT_EQ(loadDictionary(folder / "written"), *read);
 
-  // What would be read and written back alike if it were taken for something else.
+  // Values that could be misread and yet written back unchanged.
   const Dictionary known{{"true", true},
                          {"least", std::numeric_limits<std::int64_t>::min()},
                          {"greatest", std::numeric_limits<std::uint64_t>::max()},
@@ -107,7 +105,7 @@ TEST(PropertyList, ReadsXMLAsPeopleWriteIt) {
     EXPECT_EQ(loadDictionary(folder.holding("list", text)), dictionary) << text;
 }
 
-TEST(PropertyList, AnswersNothingForEverythingElse) {
+TEST(PropertyList, IsNothingWhenTheFileHoldsSomethingElse) {
   const std::string whole = plist("<key>k</key><string>text</string>");
   const std::string cases[] = {"",
                                "plain text",
@@ -127,57 +125,64 @@ TEST(PropertyList, AnswersNothingForEverythingElse) {
   EXPECT_EQ(loadDictionary(folder / "absent"), std::nullopt);
   EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
   EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
-  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "nobody will ever write to it";
+  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "it has no writer";
 }
 
-TEST(AtomicWriting, AFailureLeavesWhatWasThereAndNothingElse) {
+// Writes 5,000 bytes in a process that may write 1,024 to a file, and returns how it ended.
+int statusOfWriterPastItsLimit(const std::string& path, const std::function<void()>& prepare) {
+  const pid_t writer = fork();
+  if (writer == 0) {
+    const rlimit limit{1024, 1024};
+    setrlimit(RLIMIT_FSIZE, &limit);
+    prepare();
+    _exit(writeDictionaryAtomically(Dictionary{{"k", std::string(5000, 'x')}}, path) ? 1 : 0);
+  }
+  int status = -1;
+  EXPECT_EQ(waitpid(writer, &status, 0), writer);
+  return status;
+}
+
+TEST(AtomicWriting, AFailureLeavesTheOldFileAndNothingElse) {
   const TemporaryFolder folder;
   const Dictionary before{{"k", "before"}};
-  ASSERT_TRUE(writeDictionaryAtomically(before, folder / "list"));
+  const std::string longest(255, 'n');
+  for (const std::string& name : {std::string("list"), longest})
+    ASSERT_TRUE(writeDictionaryAtomically(before, folder / name));
   std::filesystem::create_directory(folder / "taken");
   EXPECT_FALSE(writeDictionaryAtomically(before, folder / "taken"));
   EXPECT_FALSE(writeDictionaryAtomically(before, folder / "no folder/list"));
 
+  EXPECT_EQ(statusOfWriterPastItsLimit(folder / "list", surviveFailedWrites), 0)
+      << "it ended, or took the failed write for a success";
+  EXPECT_EQ(loadDictionary(folder / "list"), before);
+  EXPECT_THAT(folder.names(), testing::UnorderedElementsAre("list", "taken", longest));
+}
+
+TEST(AtomicWriting, AWriterThatIsKilledLeavesTheOldFileAndWhatRemovingItRemovesToo) {
+  const TemporaryFolder folder;
+  const Dictionary before{{"k", "before"}};
+  const std::string longest(255, 'n');
+  for (const std::string& name : {std::string("list"), longest}) {
+    ASSERT_TRUE(writeDictionaryAtomically(before, folder / name));
+    EXPECT_TRUE(WIFSIGNALED(statusOfWriterPastItsLimit(folder / name, [] {})));
+    EXPECT_EQ(folder.names().size(), 2U) << "the list and a part of the next one";
+    EXPECT_EQ(loadDictionary(folder / name), before);
+    removeDictionary(folder / name);
+    EXPECT_THAT(folder.names(), testing::IsEmpty());
+  }
+}
+
+TEST(FailedWrites, ABrokenPipeEndsNothing) {
   const pid_t writer = fork();
   if (writer == 0) {
-    // The disk is full after a kilobyte.
-    signal(SIGXFSZ, SIG_IGN);
-    const rlimit limit{1024, 1024};
-    setrlimit(RLIMIT_FSIZE, &limit);
-    _exit(writeDictionaryAtomically(Dictionary{{"k", std::string(5000, 'x')}}, folder / "list"));
+    surviveFailedWrites();
+    int ends[2];
+    if (pipe(ends) == 0) close(ends[0]);
+    _exit(write(ends[1], "!", 1) == -1 ? 0 : 1);
   }
   int status = -1;
   ASSERT_EQ(waitpid(writer, &status, 0), writer);
-  EXPECT_EQ(status, 0) << "the writing succeeded";
-  EXPECT_EQ(loadDictionary(folder / "list"), before);
-  EXPECT_THAT(folder.names(), testing::UnorderedElementsAre("list", "taken"));
-}
-
-TEST(AtomicWriting, AKillAtAnyMomentLeavesTheOldFileOrTheNewOne) {
-  const TemporaryFolder folder;
-  const Dictionary versions[] = {Dictionary{{"k", std::string(200000, 'a')}},
-                                 Dictionary{{"k", std::string(300000, 'b')}}};
-  ASSERT_TRUE(writeDictionaryAtomically(versions[0], folder / "list"));
-  std::minstd_rand random(1);
-  for (int round = 0; round < 40; ++round) {
-    int pipeEnds[2];
-    ASSERT_EQ(pipe(pipeEnds), 0);
-    const pid_t writer = fork();
-    if (writer == 0) {
-      (void)!write(pipeEnds[1], "!", 1);
-      for (int i = 1;; ++i)
-        writeDictionaryAtomically(versions[i % 2], folder / "list");
-    }
-    char started = 0;
-    ASSERT_EQ(read(pipeEnds[0], &started, 1), 1);
-    std::this_thread::sleep_for(std::chrono::microseconds(random() % 40000));
-    kill(writer, SIGKILL);
-    ASSERT_EQ(waitpid(writer, nullptr, 0), writer);
-    close(pipeEnds[0]);
-    close(pipeEnds[1]);
-    const auto found = loadDictionary(folder / "list");
-    EXPECT_TRUE(found == versions[0] || found == versions[1]) << "round " << round;
-  }
+  EXPECT_EQ(status, 0);
 }
 
 }  // namespace

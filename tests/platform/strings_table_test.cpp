@@ -13,6 +13,7 @@ TEST(StringsTable, FollowsTheGrammarOfOldStyleLists) {
       {"", {}},
       {" \n// nothing\n/* at ** all */", {}},
       {R"("a" = "b";)", {{"a", "b"}}},
+      {"// old line ends\r\"a\" = \"b\";\r", {{"a", "b"}}},
       {R"(/* first */ "a"="b"; // second
           "c" /* in */ = /* between */ "d" ;)",
        {{"a", "b"}, {"c", "d"}}},
@@ -44,41 +45,22 @@ TEST(StringsTable, IsNothingWhenItBreaksTheGrammarAnywhere) {
   }
 }
 
-std::string utf16(const std::u16string& text, bool bigEndian) {
-  std::string bytes;
-  for (const char16_t unit : text) {
-    const auto high = static_cast<char>(unit >> 8);
-    const auto low = static_cast<char>(unit & 0xFF);
-    bytes += bigEndian ? std::string{high, low} : std::string{low, high};
-  }
-  return bytes;
-}
-
 TEST(StringsTable, IsReadInEveryFormThatMediaHold) {
-  const std::u16string text = u"\"k\" = \"次へ 🖨\";";
-  const Dictionary expected{{"k", "次へ 🖨"}};
+  const Dictionary expected{{"k", "次"}};
   const TemporaryFolder folder;
   ASSERT_TRUE(writeDictionaryAtomically(expected, folder / "xml"));
+  EXPECT_EQ(loadStringsTable(folder / "xml"), expected);
   const std::pair<const char*, std::string> files[] = {
-      {"UTF-8", "\"k\" = \"次へ 🖨\";"},
-      {"UTF-8 with a mark", "\xEF\xBB\xBF\"k\" = \"次へ 🖨\";"},
-      {"UTF-16, little-endian", "\xFF\xFE" + utf16(text, false)},
-      {"UTF-16, big-endian", "\xFE\xFF" + utf16(text, true)},
-      {"UTF-16, little-endian, without a mark", utf16(text, false)},
-      {"UTF-16, big-endian, without a mark", utf16(text, true)},
-      {"binary", std::string("bplist00\xD1\1\2\x51k\x65\x6B\x21\x30\x78\0\x20\xD8\x3D\xDD\xA8"
-                             "\x08\x0B\x0D\0\0\0\0\0\0\1\1\0\0\0\0\0\0\0\3\0\0\0\0\0\0\0\0"
-                             "\0\0\0\0\0\0\0\x18",
-                             24 + 3 + 32)}};
+      {"UTF-8", "\"k\" = \"次\";"},
+      {"UTF-16", std::string("\xFF\xFEk\0=\0\"\0\x21\x6B\"\0;\0", 14)},
+      {"binary", std::string("bplist00\xD1\1\2\x51k\x61\x6B\x21\x08\x0B\x0D\0\0\0\0\0\0\1\1"
+                             "\0\0\0\0\0\0\0\3\0\0\0\0\0\0\0\0\0\0\0\0\0\0\0\x10",
+                             16 + 3 + 32)}};
   for (const auto& [name, bytes] : files)
     EXPECT_EQ(loadStringsTable(folder.holding("table", bytes)), expected) << name;
-  EXPECT_EQ(loadStringsTable(folder / "xml"), expected);
 
-  for (const std::string& bytes :
-       {std::string("\"k\" = \"Gr\xF6\xDF"
-                    "e\";"),
-        utf16(text, false) + "x", "\xFE\xFF" + utf16(u"\"k\" = \"\xD800\";", true),
-        "<plist>" + utf16(text, false), std::string(17 << 20, ' ')}) {
+  for (const std::string& bytes : {std::string("\"k\" = \"Gr\xF6\xDF\";"),
+                                   std::string("<plist>\0", 8), std::string(17 << 20, ' ')}) {
     EXPECT_EQ(loadStringsTable(folder.holding("table", bytes)), std::nullopt)
         << bytes.substr(0, 40);
   }

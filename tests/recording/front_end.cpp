@@ -6,6 +6,7 @@
 
 #include "base/array_controller.h"
 #include "platform/run_loop.h"
+#include "platform/workspace.h"
 #include "tests/recording/interfaces.h"
 #include "tests/recording/loop.h"
 
@@ -24,8 +25,11 @@ void FrontEnd::reset() {
   alerts.clear();
   sheets.clear();
   pauses.clear();
+  delays.clear();
+  opened.clear();
   missingInterfaces.clear();
   duringPause = nullptr;
+  duringOpening = nullptr;
   terminated = false;
   now_ = 0;
   resetLoop();
@@ -51,7 +55,13 @@ Object* FrontEnd::menuBar() {
 }
 
 void FrontEnd::schedule(double seconds, std::function<void()> action) {
+  delays.push_back(seconds);
   timers_.push_back({now_ + seconds, std::move(action)});
+}
+
+void FrontEnd::open(const std::string& target) {
+  opened.push_back(target);
+  if (duringOpening) duringOpening();
 }
 
 void FrontEnd::launch(ApplicationDelegate& delegate) {
@@ -114,6 +124,16 @@ void unhideApplication() {
 }
 void activateIgnoringOtherApps() {
   FrontEnd::instance().log.emplace_back("activate");
+}
+
+bool openFile(const std::string& path) {
+  FrontEnd::instance().open(path);
+  return true;
+}
+
+bool openURL(const std::string& url) {
+  FrontEnd::instance().open(url);
+  return true;
 }
 
 Menu mainMenu() {

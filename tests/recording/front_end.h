@@ -16,18 +16,25 @@
 
 namespace onramp::recording {
 
-/// One object of the user interface, as the program has left it.
+/// One object of the user interface, in the state that the program has given it.
 struct Object {
   OutletKind kind = OutletKind::kView;
   std::string name;
   bool hidden = false;
   bool enabled = true;
+  bool animating = false;
+  bool resizeIndicator = true;
   std::string text;                                  ///< of a text field, a window, a menu item
   std::map<std::pair<int, int>, std::string> cells;  ///< titles by row and column
   int selectedRow = -1;
+  int selectedColumn = -1;
   std::string imagePath;
   ImageScaling scaling = ImageScaling::kProportionallyDown;
   ArrayController* content = nullptr;
+  std::map<std::string, std::string> headers;  ///< of a table's columns, by their identifiers
+  std::set<std::string> fixedColumns;          ///< those that the user cannot edit
+  bool columnsCanMove = true;
+  bool columnsCanBeSelected = true;
   std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
   Object* superview = nullptr;
   std::vector<Object*> subviews;
@@ -48,43 +55,48 @@ struct ShownSheet {
   std::function<void(int)> didEnd;
 };
 
-/// A front end without a screen: it keeps what the program shows and asks for, and plays the user
-/// and the clock. Time passes only when a test says so, or in a search wait, whose pauses take no
-/// time.
+/// A front end without a screen, and a desktop that opens nothing. It records what the program
+/// shows and asks for, and plays the user and the clock. Time passes only when a test says so, and
+/// in a search wait, whose pauses take no time.
 class FrontEnd {
  public:
   static FrontEnd& instance();
 
-  /// Back to the beginning, as for a new process.
+  /// Returns to the state of a new process.
   void reset();
 
   /// Launches the application for `delegate` as the platform does, up to the point where it waits
-  /// for the user. The delegate has to outlive what the test does with it.
+  /// for the user. The delegate must exist until the next reset().
   void launch(ApplicationDelegate& delegate);
 
-  /// The live object of that name that was loaded last; a test fails hard without it.
+  /// The most recently loaded object with that name. The process is aborted when there is none.
   [[nodiscard]] Object& object(const std::string& name);
 
-  /// The user clicks a button: nothing happens when it is hidden or disabled.
+  /// Clicks a button as the user would. Nothing happens when it is hidden or disabled.
   void click(const std::string& buttonName);
 
-  /// Runs the scheduled timers, earliest first, until none is left or the application terminates.
+  /// Runs the scheduled timers, the earliest first, until none is left or the application has
+  /// terminated.
   void runTimers();
 
   // What the seam's functions ask for.
   void schedule(double seconds, std::function<void()> action);
+  void open(const std::string& target);
   [[nodiscard]] Object* menuBar();
 
   // What the program did.
   std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
   std::vector<ShownAlert> alerts;
   std::vector<ShownSheet> sheets;
-  std::vector<unsigned> pauses;  ///< seconds of every pause off the main thread
+  std::vector<unsigned> pauses;     ///< seconds of every pause off the main thread
+  std::vector<double> delays;       ///< seconds of every timer, from its scheduling to its action
+  std::vector<std::string> opened;  ///< every path and address that the desktop was to open
   bool terminated = false;
 
   // What a test sets up.
   std::set<std::string> missingInterfaces;
   std::function<void(int pause)> duringPause;  ///< called on the main thread, counted from 1
+  std::function<void()> duringOpening;         ///< called while the desktop is asked to open
 
  private:
   Object& addMenuObject(OutletKind kind, const std::string& text);

@@ -11,8 +11,8 @@ namespace recording {
 
 namespace {
 
-// The objects of one loaded interface file, the root view first. All live ones know of each other,
-// so that tests find objects by name.
+// The objects of one loaded interface file, the root view first. A list of all loaded ones lets
+// tests find objects by name.
 class LoadedInterface {
  public:
   LoadedInterface(std::string className, InterfaceOwner& loadedFor)
@@ -84,7 +84,7 @@ struct Part {
   const char* name;
 };
 
-// What the interface files hold besides their layout.
+// The outlets in the interface files. A test holds them against the files and the program.
 const std::vector<Part>& partsOf(const std::string& interfaceName) {
   using enum OutletKind;
   static std::map<std::string, std::vector<Part>> parts = {

@@ -7,10 +7,10 @@
 
 namespace onramp::recording {
 
-/// The live object of that name that was loaded last, or null.
+/// The most recently loaded object with that name, or null.
 [[nodiscard]] Object* findLiveObject(const std::string& name);
 
-/// Whom the interface file with `object` was loaded for.
+/// The owner that the interface file with `object` was loaded for.
 [[nodiscard]] InterfaceOwner& ownerOf(const Object& object);
 
 }  // namespace onramp::recording

@@ -25,7 +25,7 @@ Loop& loop() {
   return instance;
 }
 
-// Longer than any test may take, so that a wait that never ends fails instead of hanging.
+// Longer than any test may take: a wait that would never end fails instead of hanging.
 constexpr std::chrono::seconds kForever{120};
 
 }  // namespace
@@ -91,7 +91,7 @@ void abortModal() {
 }
 
 bool sleepOffMainThread(std::uint32_t seconds) {
-  // The pause takes as long as what the test does in it, on the main thread.
+  // The pause lasts until the main thread has done what the test does in it.
   const auto passed = std::make_shared<bool>(false);
   performOnMainThread([seconds, passed] {
     recording::FrontEnd& frontEnd = recording::FrontEnd::instance();

@@ -5,13 +5,14 @@
 
 namespace onramp::recording {
 
-/// Forgets posted actions and makes the loop run again after a terminate.
+/// Drops posted actions and lets the loop run again after a termination.
 void resetLoop();
 
-/// Wakes everything that waits, for good.
+/// Ends the loop and wakes every waiting thread.
 void endLoop();
 
-/// Runs posted actions until `done` says so, the time is up or the loop is ended; whether `done`.
+/// Runs posted actions until `done` returns true, `most` has passed or the loop has ended. Returns
+/// what `done` returned last.
 bool runPosted(const std::function<bool()>& done, std::chrono::duration<double> most);
 
 }  // namespace onramp::recording

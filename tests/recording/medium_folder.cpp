@@ -1,11 +1,9 @@
 #include "tests/recording/medium_folder.h"
 
-#include <chrono>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <sstream>
-#include <thread>
 #include <utility>
 
 #include "platform/freedesktop/main_bundle.h"
@@ -27,9 +25,6 @@ std::string contents(const std::string& path) {
 }  // namespace
 
 MediumFolder::MediumFolder() {
-  write("../bin/xdg-open", "#!/bin/sh\nprintf '%s\\n' \"$1\" >> '" + root_ / "opened" + "'\n");
-  makeExecutable("../bin/xdg-open");
-  setEnvironment("PATH", root_ / "bin:" + std::getenv("PATH"));
   setEnvironment("XDG_DATA_HOME", root_ / "user");
   setEnvironment("XDG_DATA_DIRS", root_ / "local");
   setEnvironment("ONRAMP_SYSTEM_VERSION", "10.9.5");
@@ -91,19 +86,6 @@ void MediumFolder::addSetUpTool(int status) const {
 
 std::string MediumFolder::setUpToolArguments() const {
   return contents(root_ / "tool");
-}
-
-std::vector<std::string> MediumFolder::opened(std::size_t count) const {
-  std::vector<std::string> lines;
-  for (int attempt = 0; attempt < 1000; ++attempt) {
-    std::istringstream text(contents(root_ / "opened"));
-    lines.clear();
-    for (std::string line; std::getline(text, line);)
-      lines.push_back(line);
-    if (lines.size() >= count) break;
-    std::this_thread::sleep_for(std::chrono::milliseconds(10));
-  }
-  return lines;
 }
 
 std::string MediumFolder::optionsFilePath() const {

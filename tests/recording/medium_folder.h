@@ -10,41 +10,43 @@
 
 namespace onramp::recording {
 
-/// A medium in a temporary folder, with the application's bundle on it as the main bundle, private
-/// application-support folders, and an xdg-open that only writes down what it is to open. Removed
-/// at destruction, and so are the environment variables that it set.
+/// A medium in a temporary folder, which holds the application's main bundle, with its own
+/// application-support folders. The destructor removes it and restores the environment variables
+/// that it set.
 class MediumFolder {
  public:
-  /// An application bundle and nothing else.
+  /// Makes a medium with an application bundle and nothing else.
   MediumFolder();
   MediumFolder(const MediumFolder&) = delete;
   MediumFolder& operator=(const MediumFolder&) = delete;
   ~MediumFolder();
 
+  /// The full path of a file on the medium.
   [[nodiscard]] std::string path(const std::string& relative) const;
 
+  /// Write a file on the medium, and its folder if that is missing.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   void makeExecutable(const std::string& relative) const;
 
-  /// Writes the three property lists, with entries for "CDInfo" and "ModelInfo" added to
-  /// `resources`.
+  /// Writes the three property lists. `resources` gets the entries "CDInfo", "ModelInfo" and
+  /// "VenderName" ("Kestrel Imaging").
   void describe(const Dictionary& resources, const Dictionary& cdInfo,
                 const Dictionary& modelInfo) const;
 
-  /// A set-up tool on the medium that writes down its argument and exits with `status`.
+  /// Puts a set-up tool on the medium that records its arguments and exits with `status`.
   void addSetUpTool(int status) const;
+
+  /// The arguments of the tool's last run; empty when it has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// Everything that was opened so far, one a line; waits a while for the `count`th to arrive.
-  [[nodiscard]] std::vector<std::string> opened(std::size_t count) const;
-
-  /// The hand-off files with the vendor name "Kestrel Imaging"; nothing when absent.
+  /// The hand-off files for the vendor name "Kestrel Imaging"; nothing when a file is absent.
   [[nodiscard]] std::optional<Dictionary> optionsFile() const;
   [[nodiscard]] std::optional<Dictionary> modelFile() const;
   [[nodiscard]] std::string optionsFilePath() const;
   [[nodiscard]] std::string modelFilePath() const;
 
+  /// Sets or unsets an environment variable until the destructor restores it.
   void setEnvironment(const std::string& name, const std::optional<std::string>& value);
 
  private:
@@ -52,10 +54,10 @@ class MediumFolder {
   std::map<std::string, std::optional<std::string>> before_;
 };
 
-/// A model's entry in the model information.
+/// A model's entry in the model information, with the identifier "k1".
 [[nodiscard]] Dictionary model(bool usb, bool wired, bool wireless);
 
-/// A medium description whose "ContainedModel" has these names.
+/// A medium description that contains the models with these names.
 [[nodiscard]] Dictionary containing(const std::vector<std::string>& models);
 
 }  // namespace onramp::recording

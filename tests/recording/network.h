@@ -9,24 +9,24 @@
 
 namespace onramp::recording {
 
-/// A network without a wire: a test says what is found, what resolves and what is gone, and sees
-/// what the program asked for. Events reach the program at once, as from the main loop.
+/// A scripted network: a test says what is found, what resolves and what is gone, and sees what the
+/// program asked for. Events reach the program at once, as from the main loop.
 class Network {
  public:
   static Network& instance();
 
-  /// Back to the beginning; browsers and services of before are on no network any more.
+  /// Returns to the initial state. Earlier browsers and services get no more events.
   void reset();
 
-  /// A service object like those that browse events carry.
+  /// Makes a service object like those that browse events carry.
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
                                              const std::string& domain = "local.");
 
-  /// Tells every running browser of the service's type.
+  /// Tell every running browser for the service's type that the service was found or is gone.
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// Ends the service's running resolve; nothing happens when none runs.
+  /// End the service's running resolve; nothing happens when there is none.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);
 
@@ -36,20 +36,20 @@ class Network {
   static void fill(const NetServiceRef& service, std::vector<Data> addresses,
                    std::optional<Data> txt);
 
-  /// What a blocking resolve of "name.typedomain" finds; it fails for all others.
+  /// What a blocking resolve of "name.typedomain" finds. It fails for every other service.
   std::map<std::string, std::vector<Data>> answers;
 
   bool searchesStart = true;
   std::vector<std::string> log;  ///< every call of the seam, in order, such as "browser schedule"
   std::vector<double> timeouts;  ///< of every resolve
-  std::vector<NetServiceBrowser*> browsers;  ///< those that search
+  std::vector<NetServiceBrowser*> browsers;  ///< those that are searching
 };
 
-/// A socket address in the BSD layout.
+/// Socket addresses in the BSD layout.
 [[nodiscard]] Data ipv4Address(unsigned char a, unsigned char b, unsigned char c, unsigned char d);
 [[nodiscard]] Data ipv6Address();
 
-/// TXT data with one string for each of `strings`.
+/// TXT data that holds `strings`.
 [[nodiscard]] Data txtData(const std::vector<std::string>& strings);
 
 }  // namespace onramp::recording

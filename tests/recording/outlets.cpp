@@ -53,8 +53,11 @@ void RadioMatrix::setTitle(int row, int column, const std::string& title) const 
   if (Object* const matrix = object(*this)) matrix->cells[{row, column}] = title;
 }
 
-void RadioMatrix::selectCell(int row, int) const {
-  if (Object* const matrix = object(*this)) matrix->selectedRow = row;
+void RadioMatrix::selectCell(int row, int column) const {
+  Object* const matrix = object(*this);
+  if (!matrix) return;
+  matrix->selectedRow = row;
+  matrix->selectedColumn = column;
 }
 
 int RadioMatrix::selectedRow() const {
@@ -70,17 +73,34 @@ void ImageView::setImageScaling(ImageScaling scaling) const {
   if (Object* const view = object(*this)) view->scaling = scaling;
 }
 
-void ProgressIndicator::startAnimation() const {}
-void ProgressIndicator::stopAnimation() const {}
+void ProgressIndicator::startAnimation() const {
+  if (Object* const spinner = object(*this)) spinner->animating = true;
+}
+
+void ProgressIndicator::stopAnimation() const {
+  if (Object* const spinner = object(*this)) spinner->animating = false;
+}
 
 void TableView::bind(ArrayController& controller) const {
   if (Object* const table = object(*this)) table->content = &controller;
 }
 
-void TableView::setAllowsColumnReordering(bool) const {}
-void TableView::setAllowsColumnSelection(bool) const {}
-void TableView::setColumnEditable(std::string_view, bool) const {}
-void TableView::setColumnHeader(std::string_view, const std::string&) const {}
+void TableView::setAllowsColumnReordering(bool allows) const {
+  if (Object* const table = object(*this)) table->columnsCanMove = allows;
+}
+
+void TableView::setAllowsColumnSelection(bool allows) const {
+  if (Object* const table = object(*this)) table->columnsCanBeSelected = allows;
+}
+
+void TableView::setColumnEditable(std::string_view identifier, bool editable) const {
+  Object* const table = object(*this);
+  if (table && !editable) table->fixedColumns.emplace(identifier);
+}
+
+void TableView::setColumnHeader(std::string_view identifier, const std::string& title) const {
+  if (Object* const table = object(*this)) table->headers[std::string(identifier)] = title;
+}
 
 std::size_t PopUpButton::numberOfItems() const {
   const Object* const popUp = object(*this);
@@ -98,7 +118,10 @@ void PopUpButton::addItem(const std::string& title, std::function<void()> action
   if (Object* const popUp = object(*this)) popUp->items.emplace_back(title, std::move(action));
 }
 
-void Window::setShowsResizeIndicator(bool) const {}
+void Window::setShowsResizeIndicator(bool shows) const {
+  if (Object* const window = object(*this)) window->resizeIndicator = shows;
+}
+
 void Window::center() const {
   FrontEnd::instance().log.emplace_back("center");
 }

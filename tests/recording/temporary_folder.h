@@ -9,7 +9,7 @@
 
 namespace onramp {
 
-/// A folder of the test's own, removed at destruction.
+/// A temporary folder, which the destructor removes.
 class TemporaryFolder {
  public:
   TemporaryFolder()
@@ -25,7 +25,7 @@ class TemporaryFolder {
 
   [[nodiscard]] std::string operator/(const std::string& name) const { return path_ + "/" + name; }
 
-  /// The path of a file `name` with these bytes.
+  /// Writes a file `name` with these bytes and returns its path.
   [[nodiscard]] std::string holding(const std::string& name, const std::string& bytes) const {
     std::ofstream(*this / name, std::ios::binary) << bytes;
     return *this / name;

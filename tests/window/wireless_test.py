@@ -156,6 +156,7 @@ class WirelessWays(WayTest):
     def test_other_exit_searches_again_and_so_does_the_person(self):
         person = self.search_in_vain(tool_status=3)
         person.see("label", TEXT["INST_TXT_DEVLIST"])
+        self.see_waiting(person)
         self.see_not_found(person)
         self.assertFalse(person.sees("push button", TEXT["BTN_BACK"]))
         person.click("push button", TEXT["BTN_OK"])

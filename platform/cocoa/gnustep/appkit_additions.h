@@ -4,7 +4,7 @@
 
 #import <AppKit/AppKit.h>
 
-// What the front end uses of AppKit and GNUstep does not declare. Included ahead of every source.
+// Declares what the front end uses of AppKit and GNUstep lacks. Included ahead of every source.
 
 @interface NSView (OnrampIdentification)
 - (NSString*)identifier;

@@ -12,17 +12,17 @@ using PerformKey = BOOL(id, SEL, NSEvent*);
 BeginSheet* originalBeginSheet = nullptr;
 PerformKey* originalPerformKey = nullptr;
 
-// Buttons that cannot be seen take no keys.
+// A hidden button does not answer to its key equivalent.
 BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
   return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
 }
 
-// A window of fixed size shows no resize indicator, and no window prevents termination here.
+// GNUstep shows no resize indicator on a window of fixed size, and no window prevents termination.
 void ignore(id, SEL, BOOL) {}
 
 }  // namespace
 
-/// A sheet that waits for its turn.
+/// A sheet that begins on the loop's next turn.
 @interface OnrampWaitingSheet : NSObject {
  @public
   NSAlert* _alert;
@@ -50,7 +50,7 @@ void ignore(id, SEL, BOOL) {}
 
 namespace {
 
-// GNUstep runs a sheet before it returns to who asked for it.
+// GNUstep runs a sheet in a modal loop before it returns to the caller.
 void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) {
   OnrampWaitingSheet* const sheet = [[[OnrampWaitingSheet alloc] init] autorelease];
   sheet->_alert = [self retain];
@@ -60,13 +60,13 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
   [sheet performSelector:@selector(begin) withObject:nil afterDelay:0];
 }
 
-// Applications tell each other nothing here. GNUstep starts a daemon for that, and does not launch
-// when that is slow to answer.
+// The application exchanges no notifications with others. GNUstep would start a daemon for them,
+// and fail to launch when the daemon is slow to answer.
 id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// GNUstep's workspace knows GNUstep's programs only; the desktop's opener knows all.
+// GNUstep's workspace knows only GNUstep's programs; the desktop's opener knows all.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
@@ -82,8 +82,8 @@ BOOL openURL(id, SEL, NSURL* url) {
 
 }  // namespace
 
-/// What an interface file says of a control's name for assistive programs. GNUstep makes the
-/// objects of a file from its elements' names, and loads no file with one that it cannot make.
+/// A control's accessibility relation in an interface file. GNUstep creates an object for each
+/// element, and refuses the whole file if it lacks the class of one.
 @interface IBAccessibilityConnection : NSObject
 @end
 

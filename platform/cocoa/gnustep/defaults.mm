@@ -1,13 +1,14 @@
-// How GNUstep is to behave, as it looks it up itself.
+// Sets the user defaults that configure GNUstep.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
 namespace {
 
-// What is looked up before everything else.
+// The defaults domain that GNUstep searches first.
 NSString* const kFirstDomain = @"GSPrimaryDomain";
 
-// GNUstep looks for folders named after languages; those of a bundle are named after their codes.
+// GNUstep looks for folders named after languages, such as "German.lproj". A bundle's folders are
+// named after language codes.
 NSArray* languageCodes() {
   NSDictionary* const environment = [[NSProcessInfo processInfo] environment];
   NSMutableArray* const codes = [NSMutableArray array];
@@ -31,7 +32,7 @@ NSArray* languageCodes() {
 
 @implementation OnrampDefaults
 
-// The menu lies in the window, and there is no icon on the desktop.
+// The menu is shown in the window, and no icon on the desktop.
 + (void)load {
   @autoreleasepool {
     NSUserDefaults* const defaults = [NSUserDefaults standardUserDefaults];

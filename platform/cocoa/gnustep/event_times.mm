@@ -1,6 +1,6 @@
-// The time of the last event, which goes with every request for the keyboard. GNUstep takes it from
-// a window manager's "_NET_WM_PING" as well, whose number need not be a time: that of Openbox
-// counts from one. A request as old as that is refused.
+// Keeps the time of the last event correct. Every request for the keyboard carries it, and the
+// window manager refuses a request that looks old. GNUstep also takes the time from "_NET_WM_PING"
+// messages, whose number need not be a time: Openbox counts from one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -9,7 +9,7 @@ namespace {
 
 using SetTime = void(id, SEL, unsigned long);
 
-// Times are milliseconds in 32 bits: a step back that is greater than this is a wrap around.
+// Times are milliseconds in 32 bits. A greater step back than this is a wrap-around.
 constexpr unsigned long kGreatestStepBack = 0xF0000000UL;
 
 SetTime* originalSetLastTime = nullptr;
@@ -37,7 +37,7 @@ void setLastTime(id self, SEL selector, unsigned long time) {
   }
 }
 
-// What speaks to the X server is loaded with the application object.
+// GNUstep loads its X11 backend together with the application object.
 + (void)replace:(NSNotification*)notification {
   Class const server = NSClassFromString(@"XGServer");
   if (!server) return;

@@ -1,23 +1,28 @@
-// An application that can hide itself and come back. Where it has no icon of its own to click on,
-// GNUstep makes an icon of each window instead, and a window that is brought back before its icon
-// is on the screen is not always given the keyboard.
+// Hides and unhides the application as AppKit does. GNUstep would make an icon of each window,
+// since the application has none to click on, and a window that is brought back before its icon is
+// on the screen does not always get the keyboard.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
 
 namespace {
 
-using Hide = void(id, SEL, id);
+using Action = void(id, SEL, id);
+using Question = BOOL(id, SEL);
 
-Hide* originalHide = nullptr;
+Action* originalHide = nullptr;
+Action* originalUnhide = nullptr;
+Action* originalMakeKeyAndOrderFront = nullptr;
+Question* originalIsHidden = nullptr;
+bool isHiddenByItself = false;
 
-// From front to back, while the application is hidden.
+// The windows that were on the screen when the application was hidden, from front to back.
 NSMutableArray* hiddenWindows() {
   static NSMutableArray* const windows = [[NSMutableArray alloc] init];
   return windows;
 }
 
-// Whoever hides it from the menu needs the icons to bring it back.
+// A user who hides the application from the menu needs GNUstep's icons to bring it back.
 void hide(id self, SEL selector, id sender) {
   if (sender) {
     originalHide(self, selector, sender);
@@ -28,13 +33,29 @@ void hide(id self, SEL selector, id sender) {
     [hiddenWindows() addObject:window];
     [window orderOut:nil];
   }
+  isHiddenByItself = true;
   [self deactivate];
 }
 
-void unhideWithoutActivation(id, SEL) {
+void unhide(id self, SEL selector, id sender) {
+  if (!isHiddenByItself) {
+    originalUnhide(self, selector, sender);
+    return;
+  }
+  isHiddenByItself = false;
   for (NSWindow* window in [hiddenWindows() reverseObjectEnumerator])
     [window orderFrontRegardless];
   [hiddenWindows() removeAllObjects];
+  [self activateIgnoringOtherApps:YES];
+}
+
+BOOL isHidden(id self, SEL selector) {
+  return isHiddenByItself || originalIsHidden(self, selector);
+}
+
+// No window of a hidden application comes on the screen.
+void makeKeyAndOrderFront(id self, SEL selector, id sender) {
+  if (!isHiddenByItself) originalMakeKeyAndOrderFront(self, selector, sender);
 }
 
 }  // namespace
@@ -47,7 +68,10 @@ void unhideWithoutActivation(id, SEL) {
 + (void)load {
   using onramp::gnustep::replaceMethod;
   originalHide = replaceMethod([NSApplication class], @selector(hide:), hide);
-  replaceMethod([NSApplication class], @selector(unhideWithoutActivation), unhideWithoutActivation);
+  originalUnhide = replaceMethod([NSApplication class], @selector(unhide:), unhide);
+  originalIsHidden = replaceMethod([NSApplication class], @selector(isHidden), isHidden);
+  originalMakeKeyAndOrderFront =
+      replaceMethod([NSWindow class], @selector(makeKeyAndOrderFront:), makeKeyAndOrderFront);
 }
 
 @end

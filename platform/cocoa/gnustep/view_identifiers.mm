@@ -1,4 +1,4 @@
-// Views that know the identifiers of their interface files.
+// Gives views the identifiers that their interface file names.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -12,7 +12,7 @@ InitWithCoder* originalViewInit = nullptr;
 InitWithCoder* originalCustomViewInit = nullptr;
 Dealloc* originalDealloc = nullptr;
 
-// Identifiers by view; a view takes its own out when it goes.
+// Identifiers by view. A view's entry is removed when the view is deallocated.
 NSMapTable* identifiers() {
   static NSMapTable* const table =
       NSCreateMapTable(NSNonOwnedPointerMapKeyCallBacks, NSObjectMapValueCallBacks, 64);
@@ -30,7 +30,7 @@ id viewInit(id self, SEL selector, NSCoder* coder) {
   return identified(originalViewInit(self, selector, coder), coder);
 }
 
-// A custom view is made in the place of the object that is decoded.
+// A decoded NSCustomView is replaced by a view of its custom class.
 id customViewInit(id self, SEL selector, NSCoder* coder) {
   return identified(originalCustomViewInit(self, selector, coder), coder);
 }
@@ -56,7 +56,7 @@ void dealloc(id self, SEL selector) {
   }
 }
 
-// GNUstep tells assistive programs nothing.
+// GNUstep has no accessibility.
 - (void)setAccessibilityLabel:(NSString*)label {
 }
 

@@ -1,10 +1,11 @@
-// What is on the screen, for programs that use the application from outside: GNUstep tells
-// assistive programs nothing. Where ONRAMP_ACCESSIBILITY_FILE names a file, whoever wants to know
-// makes the file of that name with ".question" added to it. The application's loop takes the
-// question away and writes the answer: all controls that can be seen, as a JSON array of objects
-// with role, name, states and frame (x, y, width and height in pixels from the screen's upper left
-// corner). Roles and states have the names that AT-SPI gives them. The first object, of the role
-// "application", has the number of presses of the mouse's button that were noticed so far.
+// Tells a program outside what is on the screen, since GNUstep has no accessibility. The tests'
+// build links it into the application; gnustep_person.py is the other half of the protocol.
+//
+// ONRAMP_ACCESSIBILITY_FILE names the answer's file. To ask, create the file of that name with
+// ".question" appended. The application's loop removes the question and writes the answer: a JSON
+// array of all visible controls, each an object with role, name, states and frame (x, y, width and
+// height in pixels from the screen's upper left corner). Roles and states are named as in AT-SPI.
+// The first object has the role "application" and the number of mouse presses handled so far.
 
 #include <unistd.h>
 
@@ -28,11 +29,11 @@ void sendEvent(id self, SEL selector, NSEvent* event) {
   originalSendEvent(self, selector, event);
 }
 
-NSString* joined(NSString* first, NSString* second) {
-  return [second length] > 0 ? second : first;
+NSString* nameOf(NSPopUpButton* button) {
+  return [[button toolTip] length] > 0 ? [button toolTip] : [button title];
 }
 
-// The controls of one window.
+// Collects the controls of one window.
 class Reader {
  public:
   Reader(NSWindow* window, NSMutableArray* found) : window_(window), found_(found) {}
@@ -69,8 +70,7 @@ class Reader {
     if (isControl && [static_cast<NSControl*>(view) isEnabled]) [states addObject:@"enabled"];
     if ([window_ firstResponder] == view) [states addObject:@"focused"];
     if ([view isKindOfClass:[NSPopUpButton class]]) {
-      add(@"button menu", joined([static_cast<NSPopUpButton*>(view) title], [view toolTip]), states,
-          view, [view bounds]);
+      add(@"button menu", nameOf(static_cast<NSPopUpButton*>(view)), states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSButton class]]) {
       add(@"push button", [static_cast<NSButton*>(view) title], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSTextField class]]) {
@@ -82,7 +82,7 @@ class Reader {
     }
   }
 
-  // A row of a list is an item; a row of a table with headers is one for each column.
+  // A row is one item in a list, and one cell per column in a table with headers.
   void readTable(NSTableView* table) {
     NSString* const role = [table headerView] ? @"table cell" : @"list item";
     const NSRange rows = [table rowsInRect:[table visibleRect]];

@@ -1,6 +1,6 @@
 #include "platform/child_process.h"
 
-#include "platform/freedesktop/process.h"
+#include "platform/posix/process.h"
 
 namespace onramp {
 

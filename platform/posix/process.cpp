@@ -1,4 +1,4 @@
-#include "platform/freedesktop/process.h"
+#include "platform/posix/process.h"
 
 #include <signal.h>
 #include <spawn.h>
@@ -6,6 +6,9 @@
 #include <unistd.h>
 
 #include <cerrno>
+
+// macOS declares it in no header.
+extern char** environ;  // NOLINT(readability-redundant-declaration)
 
 namespace onramp {
 
