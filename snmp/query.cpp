@@ -31,11 +31,13 @@ void store(std::int32_t* out, std::uint64_t value) {
   if (out) *out = static_cast<std::int32_t>(value);
 }
 
-std::int64_t ask_active_if(const Value& address, bool& no_reply) {
-  const auto* const text = address.as<std::string>();
-  const auto result = snmp_query_table_retry(
-      &active_interface_table, text ? text->c_str() : nullptr, no_reply, nullptr, nullptr);
-  return result ? result->integerValue(kActiveIFKey) : 0;
+// Asks a second time when the first request gives nothing.
+template <typename Ask>
+std::optional<Dictionary> ask_twice(const Ask& ask) {
+  std::optional<Dictionary> result;
+  for (int call = 0; call < kCallsPerAttempt && !result; ++call)
+    result = ask();
+  return result;
 }
 
 }  // namespace
@@ -99,18 +101,25 @@ std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address
 std::optional<Dictionary> snmp_query_table_retry(mib_table* table, const char* address,
                                                  bool& out_no_reply, std::int32_t* out_error_status,
                                                  std::int32_t* out_error_index) {
-  std::optional<Dictionary> result;
-  for (int call = 0; call < kCallsPerAttempt && !result; ++call)
-    result = snmp_query_table(table, address, out_no_reply, out_error_status, out_error_index);
-  return result;
+  return ask_twice([&] {
+    return snmp_query_table(table, address, out_no_reply, out_error_status, out_error_index);
+  });
 }
 
 bool snmp_active_interface_is_wireless(const Array& addresses) {
+  return snmp_active_interface_is_wireless(addresses, [](const char* address, bool& no_reply) {
+    return snmp_query_table(&active_interface_table, address, no_reply, nullptr, nullptr);
+  });
+}
+
+bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask) {
   std::int64_t active_interface = 0;
   for (const Value& address : addresses) {
     bool no_reply = false;  // never cleared, so one unanswered request costs all three attempts
     for (int attempt = 0; attempt < kAttemptsPerAddress; ++attempt) {
-      active_interface = ask_active_if(address, no_reply);
+      const auto* const text = address.as<std::string>();
+      const auto result = ask_twice([&] { return ask(text ? text->c_str() : nullptr, no_reply); });
+      active_interface = result ? result->integerValue(kActiveIFKey) : 0;
       if (!no_reply) return active_interface == kActiveIFWireless;
       std::this_thread::sleep_for(kPauseBetweenAttempts);
     }
