@@ -74,7 +74,6 @@ std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem)
     plist_from_xml(xml->c_str(), static_cast<std::uint32_t>(xml->size()), &root);
   }
   const Node node(root);
-  if (!node) problem.note("no property list", 0);
   return node ? std::optional(valueOf(node.get())) : std::nullopt;
 }
 
