@@ -70,7 +70,7 @@ class Medium(unittest.TestCase):
         mixes = {tuple(model["Interfaces"][kind] for kind in kinds) for model in models.values()}
         self.assertEqual(set(itertools.product((False, True), repeat=3)) - {(False,) * 3}, mixes)
 
-    def test_the_set_up_tool_ends_with_the_status_it_is_told(self):
+    def test_the_set_up_tool_exits_with_the_status_that_it_is_given(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
         for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):
