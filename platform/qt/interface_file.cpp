@@ -3,7 +3,7 @@
 #include <QAbstractButton>
 #include <QAbstractItemView>
 #include <QAction>
-#include <QCoreApplication>
+#include <QApplication>
 #include <QFile>
 #include <QLabel>
 #include <QMenu>
@@ -16,6 +16,7 @@
 
 #include "platform/bundle.h"
 #include "platform/qt/image_view.h"
+#include "platform/qt/list_views.h"
 #include "platform/qt/native.h"
 #include "platform/qt/radio_matrix.h"
 #include "platform/qt/spinner.h"
@@ -24,7 +25,8 @@ namespace onramp {
 
 namespace {
 
-constexpr const char* kViewClass = "viewClass";
+constexpr double kHeadingScale = 1.5;
+constexpr double kGearScale = 1.5;
 
 QString textOf(std::string_view text) {
   return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
@@ -34,14 +36,11 @@ QString textOf(std::string_view text) {
 // which is how an interface file names a page's class.
 class Loader final : public QUiLoader {
  public:
-  explicit Loader(QObject* parent) : QUiLoader(parent) {
-    // Nothing here comes from a plug-in; looking for some costs time at every start.
-    clearPluginPaths();
-  }
+  using QUiLoader::QUiLoader;
 
   /// The application's one loader, since making one takes as long as loading a file.
   static Loader& shared() {
-    static Loader* const loader = qt::makeChild<Loader>(qApp);
+    static Loader* const loader = makeWithoutPlugIns();
     return *loader;
   }
 
@@ -53,16 +52,44 @@ class Loader final : public QUiLoader {
       widget = qt::makeChild<qt::RadioMatrixWidget>(parent);
     } else if (className == QLatin1String("Spinner")) {
       widget = qt::makeChild<qt::Spinner>(parent);
+    } else if (className == QLatin1String("QListView")) {
+      widget = qt::makeChild<qt::ListWidget>(parent);
+    } else if (className == QLatin1String("QTreeView")) {
+      widget = qt::makeChild<qt::ColumnsWidget>(parent);
     } else if (availableWidgets().contains(className)) {
       widget = QUiLoader::createWidget(className, parent, name);
     } else {
       widget = qt::makeChild<QWidget>(parent);
-      widget->setProperty(kViewClass, className);
+      widget->setProperty(qt::kViewClass, className);
     }
     if (widget) widget->setObjectName(name);
     return widget;
   }
+
+ private:
+  // A loader loads every Designer plug-in in reach when it is made, and with them half of Qt.
+  static Loader* makeWithoutPlugIns() {
+    const QStringList paths = QCoreApplication::libraryPaths();
+    QCoreApplication::setLibraryPaths({});
+    auto* const loader = qt::makeChild<Loader>(qApp);
+    QCoreApplication::setLibraryPaths(paths);
+    return loader;
+  }
 };
+
+void enlargeFont(QWidget& widget, double scale) {
+  QFont font = widget.font();
+  font.setPointSizeF(QApplication::font().pointSizeF() * scale);
+  widget.setFont(font);
+}
+
+// Sizes follow the user's text size.
+void enlargeFonts(QWidget& root) {
+  for (QWidget* const widget : root.findChildren<QWidget*>()) {
+    if (widget->property(qt::kHeading).toBool()) enlargeFont(*widget, kHeadingScale);
+    if (qobject_cast<QToolButton*>(widget)) enlargeFont(*widget, kGearScale);
+  }
+}
 
 // The texts that stand in the interface file itself, in the user's language.
 void localize(QWidget& root, const std::string& interfaceName) {
@@ -153,6 +180,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
   if (!tree->root) return nullptr;
 
   localize(*tree->root, name);
+  enlargeFonts(*tree->root);
   QList<QWidget*> widgets = tree->root->findChildren<QWidget*>();
   widgets.prepend(tree->root);
   for (QWidget* const widget : widgets) {
@@ -167,7 +195,7 @@ View Interface::view() const {
 }
 
 std::string Interface::viewClass() const {
-  return tree_->root ? tree_->root->property(kViewClass).toString().toStdString() : "";
+  return tree_->root ? tree_->root->property(qt::kViewClass).toString().toStdString() : "";
 }
 
 NativeObject* Interface::find(std::string_view name, OutletKind kind) const {
