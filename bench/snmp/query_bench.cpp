@@ -9,6 +9,7 @@
 #include "bench/snmp/median.h"
 #include "bench/snmp/posix/bare_exchange.h"
 #include "snmp/codec.h"
+#include "snmp/protocol.h"
 #include "snmp/query.h"
 
 namespace {
