@@ -10,7 +10,7 @@ namespace onramp::qt {
 
 namespace {
 
-constexpr int kTitleBarHeight = 32;  // as long as the window manager has not said it
+constexpr int kTitleBarHeight = 32;  // until the window manager has told it
 
 }  // namespace
 
@@ -25,7 +25,7 @@ bool ContentSize::eventFilter(QObject*, QEvent* event) {
   return false;
 }
 
-// Text that wraps needs a height that depends on the width.
+// The height of text that wraps depends on the width.
 QSize ContentSize::neededSize() const {
   const QLayout* const contents = window_->centralWidget()->layout();
   const int menu = window_->menuWidget() ? window_->menuWidget()->sizeHint().height() : 0;
@@ -48,7 +48,7 @@ void ContentSize::fit() {
   const QSize grown = size - window_->size();
   window_->setFixedSize(size);
   if (!window_->isVisible()) return;
-  // It grows around its middle, within the screen.
+  // The window's middle stays where it is, as far as the screen allows.
   const QPoint corner = window_->pos() - QPoint(grown.width(), grown.height()) / 2;
   const QPoint last = screen.bottomRight() - QPoint(size.width(), size.height() + title);
   window_->move(std::clamp(corner.x(), screen.left(), std::max(screen.left(), last.x())),

@@ -32,13 +32,13 @@ QString textOf(std::string_view text) {
   return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-// Makes this front end's own widgets, and a plain widget for every class that it does not know,
-// which is how an interface file names a page's class.
+// Makes this front end's own widgets. For a class that it does not know, it makes a plain widget
+// and keeps the name: this is how an interface file names a page's class.
 class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;
 
-  /// The application's one loader, since making one takes as long as loading a file.
+  /// The application's only loader. Making one takes as long as loading a file.
   static Loader& shared() {
     static Loader* const loader = makeWithoutPlugIns();
     return *loader;
@@ -67,7 +67,7 @@ class Loader final : public QUiLoader {
   }
 
  private:
-  // A loader loads every Designer plug-in in reach when it is made, and with them half of Qt.
+  // The constructor loads every Designer plug-in that it finds, and with them half of Qt.
   static Loader* makeWithoutPlugIns() {
     const QStringList paths = QCoreApplication::libraryPaths();
     QCoreApplication::setLibraryPaths({});
@@ -91,7 +91,7 @@ void enlargeFonts(QWidget& root) {
   }
 }
 
-// The texts that stand in the interface file itself, in the user's language.
+// Translates the texts that the interface file itself contains into the user's language.
 void localize(QWidget& root, const std::string& interfaceName) {
   const auto translated = [&](const QString& text) {
     const std::string key = text.toStdString();
@@ -105,7 +105,7 @@ void localize(QWidget& root, const std::string& interfaceName) {
   }
 }
 
-// "titleBinding" names the owner's text that a button or window shows.
+// The property "titleBinding" names the owner's text that a button or window shows.
 void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   const QString key = widget->property("titleBinding").toString();
   if (key.isEmpty()) return;
@@ -118,7 +118,7 @@ void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   });
 }
 
-// "action" names what a click asks the owner for.
+// The property "action" names the owner's action that a click performs.
 void connectAction(QWidget* widget, InterfaceOwner& owner) {
   auto* const button = qobject_cast<QAbstractButton*>(widget);
   const std::string action = widget->property("action").toString().toStdString();
@@ -157,8 +157,7 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// A page's root is a child of the window while it is shown, and goes with it if the window goes
-// first.
+// While a page is shown, its root is a child of the window, which may be destroyed first.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

@@ -2,6 +2,7 @@
 
 #include <QApplication>
 #include <QFontMetrics>
+#include <QSize>
 #include <utility>
 
 #include "base/array_controller.h"
@@ -52,6 +53,8 @@ QVariant ListModel::data(const QModelIndex& index, int role) const {
       return text(index.row(), columns_.at(index.column()));
     case Qt::AccessibleTextRole:
       return index.column() == 0 ? spokenName(index.row()) : QVariant();
+    case Qt::SizeHintRole:  // a single column is as wide as its view, and elides longer texts
+      return columns_.size() == 1 ? QSize(0, rowHeight()) : QVariant();
     default:
       return {};
   }

@@ -30,7 +30,7 @@ QSize ListWidget::minimumSizeHint() const {
   return {leastNameWidth() + frames, leastListHeight() + frames};
 }
 
-ColumnsWidget::ColumnsWidget(QWidget* parent) : QTreeView(parent) {
+ColumnsWidget::ColumnsWidget(QWidget* parent) : FramedView<QTreeView>(parent) {
   header()->setSectionResizeMode(QHeaderView::Interactive);
   header()->setStretchLastSection(true);
   setTextElideMode(Qt::ElideMiddle);

@@ -13,12 +13,29 @@ namespace onramp::qt {
 /// The least width of a column of names.
 [[nodiscard]] int leastNameWidth();
 
+/// Draws the whole frame again when the focus comes or goes. Qt's views draw only their rows again.
+template <typename View>
+class FramedView : public View {
+ public:
+  using View::View;
+
+ protected:
+  void focusInEvent(QFocusEvent* event) override {
+    View::focusInEvent(event);
+    QWidget::update();
+  }
+  void focusOutEvent(QFocusEvent* event) override {
+    View::focusOutEvent(event);
+    QWidget::update();
+  }
+};
+
 /// A list of one column.
-class ListWidget final : public QListView {
+class ListWidget final : public FramedView<QListView> {
   Q_OBJECT
 
  public:
-  using QListView::QListView;
+  using FramedView<QListView>::FramedView;
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }
   [[nodiscard]] QSize minimumSizeHint() const override;
@@ -29,7 +46,7 @@ class ListWidget final : public QListView {
 
 /// A list of several columns, each as wide as its contents. The first gets what the others leave
 /// and gives way to them. Once the user has dragged a column's edge, all widths are theirs.
-class ColumnsWidget final : public QTreeView {
+class ColumnsWidget final : public FramedView<QTreeView> {
   Q_OBJECT
 
  public:

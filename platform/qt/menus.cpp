@@ -75,7 +75,7 @@ void connectStandardMenuItems(QWidget* window) {
 
 using qt::nativeOf;
 
-// A menu is a QMenuBar or a QMenu, an item one of its actions.
+// A Menu stands for a QMenuBar or a QMenu, a MenuItem for one of its actions.
 
 MenuItem Menu::itemWithTitle(const std::string& title) const {
   const auto* const menu = nativeOf<QWidget>(*this);

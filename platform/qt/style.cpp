@@ -49,6 +49,18 @@ void drawDefaultFace(QPainter& painter, const QStyleOptionButton& button) {
   painter.restore();
 }
 
+// Fusion's own outline of a radio button cannot be seen on dark colours.
+void drawOutline(QPainter& painter, const QStyleOption& radioButton) {
+  painter.save();
+  painter.setRenderHint(QPainter::Antialiasing);
+  QColor color = radioButton.palette.color(QPalette::WindowText);
+  color.setAlphaF(0.6F);
+  painter.setPen(color);
+  painter.setBrush(Qt::NoBrush);
+  painter.drawEllipse(QRectF(radioButton.rect).adjusted(1, 1, -1, -1));
+  painter.restore();
+}
+
 bool isList(const QWidget* widget) {
   return qobject_cast<const QAbstractItemView*>(widget) != nullptr;
 }
@@ -99,6 +111,7 @@ void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, 
                           const QWidget* widget) const {
   if (element != PE_FrameFocusRect) {
     QProxyStyle::drawPrimitive(element, option, painter, widget);
+    if (element == PE_IndicatorRadioButton) drawOutline(*painter, *option);
   } else if (!isList(widget)) {  // a list has its ring around all rows
     drawRing(*painter, option->rect, option->palette.color(QPalette::Highlight));
   }

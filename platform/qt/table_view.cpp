@@ -17,8 +17,7 @@ namespace {
 using qt::ListModel;
 using qt::nativeOf;
 
-// A view has its model from the start: an interface file names the columns, and headers may be set
-// before there is anything to show.
+// Returns the view's model, which is made on first use: headers may be set before bind().
 ListModel* modelOf(QAbstractItemView* view) {
   if (!view) return nullptr;
   if (auto* const model = qobject_cast<ListModel*>(view->model())) return model;
@@ -54,7 +53,7 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// Takes over the row that the user has selected; a selection that they took away comes back.
+// Passes the row that the user selected to the controller. Selects it again after a deselection.
 void takeSelection(QAbstractItemView* view, ArrayController& controller) {
   const QModelIndexList rows = view->selectionModel()->selectedRows();
   if (rows.isEmpty()) {

@@ -33,7 +33,7 @@ class WindowEvents final : public QObject {
   /// Clicks the button with the focus or else the default one.
   bool performReturn();
 
-  /// Opens the first menu of the menu bar.
+  /// Selects the first menu of the menu bar, from where the arrow keys lead on.
   bool openMenu();
 
   QWidget* window_;

@@ -152,6 +152,7 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   ASSERT_TRUE(devices);
   listDevices(*devices);
   delegate->replaceMainView("", devices);
+  EXPECT_EQ(nameOf(*window->focusWidget()), "deviceListView");
   devices->progressON(true);
   expectEverythingFits();
 }
