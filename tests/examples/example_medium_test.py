@@ -1,4 +1,5 @@
-"""Holds the example medium and the application's own resources against what the sources read."""
+"""Holds the example medium and the application's own resources against what the sources read. That the
+medium is whole is what onramp-check's own test sees."""
 
 import ast
 import itertools
@@ -72,7 +73,7 @@ class Messages(unittest.TestCase):
                 self.assertEqual(asked, set(table))
                 self.assertEqual([], [key for key, text in table.items() if not text.strip()])
 
-    def test_texts_are_filled_like_the_english_ones_and_hold_no_other_percent_sign(self):
+    def test_texts_have_the_placeholders_of_the_english_ones_and_no_other_percent_sign(self):
         english = messages("en")
         for language in LANGUAGES:
             for key, text in messages(language).items():
@@ -102,36 +103,13 @@ class Messages(unittest.TestCase):
 
 
 class Medium(unittest.TestCase):
-    def test_every_property_list_and_strings_table_parses(self):
-        lists = [*MEDIUM.rglob("*.plist"), *RESOURCES.glob("*.plist"), RESOURCES / "Info.plist.in"]
-        for path in lists:
-            with self.subTest(path.name):
-                self.assertIsInstance(plistlib.loads(path.read_bytes()), dict)
-        for path in [*MEDIUM.rglob("*.strings"), *RESOURCES.rglob("*.strings")]:
-            with self.subTest(path.name):
-                self.assertTrue(strings_table(path))
-
-    def test_every_place_that_the_resource_dictionary_names_exists(self):
-        common = common_info()
-        package = common["PkgInfo"]
-        places = [common["CDInfo"], common["ModelInfo"], common["WLANtool"],
-                  f"{package['PkgLocation']}/{package['PkgName']}"]
-        for place in places:
-            with self.subTest(place):
-                self.assertFalse(place.startswith("/"))
-                self.assertTrue((MEDIUM / place).exists())
-
-    def test_the_models_agree_and_cover_every_mix_of_connections(self):
-        common = common_info()
-        models = medium_list(common["ModelInfo"])["Model"]
-        self.assertEqual(set(medium_list(common["CDInfo"])["ContainedModel"]), set(models))
+    def test_the_models_cover_every_mix_of_connections(self):
+        models = medium_list(common_info()["ModelInfo"])["Model"]
         kinds = ("USB", "WiredLAN", "WirelessLAN")
         mixes = {tuple(model["Interfaces"][kind] for kind in kinds) for model in models.values()}
         self.assertEqual(set(itertools.product((False, True), repeat=3)) - {(False,) * 3}, mixes)
-        # A model without an identifier offers no connection at all.
-        self.assertEqual([], [name for name, model in models.items() if not model.get("KSCID")])
 
-    def test_the_set_up_tool_ends_with_the_status_it_is_told(self):
+    def test_the_set_up_tool_exits_with_the_status_that_it_is_given(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
         for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):
