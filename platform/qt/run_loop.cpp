@@ -4,8 +4,6 @@
 #include <QEventLoop>
 #include <QTimer>
 #include <atomic>
-#include <chrono>
-#include <cmath>
 #include <utility>
 #include <vector>
 
@@ -41,8 +39,7 @@ void endAllLoops() {
 
 }  // namespace qt
 
-void scheduleTimer(double seconds, std::function<void()> action) {
-  const std::chrono::milliseconds delay(std::llround(seconds * 1000));
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
   QTimer::singleShot(delay, Qt::PreciseTimer, qApp, [action = std::move(action)] {
     if (!isTerminating()) action();
   });
