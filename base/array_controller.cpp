@@ -44,6 +44,7 @@ void ArrayController::removeObject(const Dictionary& entry) {
 void ArrayController::removeAllObjects() {
   entries_.clear();
   selection_.reset();
+  hasChoice_ = false;
   entriesChanged();
 }
 
@@ -70,6 +71,11 @@ void ArrayController::rearrange() {
 void ArrayController::setSelectionIndex(std::size_t index) {
   selection_ = index < entries_.size() ? std::optional(index) : std::nullopt;
   if (onSelect_) onSelect_();
+}
+
+void ArrayController::choose(std::size_t index) {
+  hasChoice_ = true;
+  setSelectionIndex(index);
 }
 
 void ArrayController::setSelectedObject(const Dictionary& entry) {

@@ -45,6 +45,12 @@ class ArrayController {
   /// Selects the first entry equal to `entry`. Clears the selection when there is none.
   void setSelectedObject(const Dictionary& entry);
 
+  /// Selects the entry at `index` because the user wants it. The table that is bound calls this.
+  void choose(std::size_t index);
+
+  /// Whether the user has chosen an entry since the last removeAllObjects().
+  [[nodiscard]] bool hasChoice() const { return hasChoice_; }
+
   /// The selected entry; nothing when the list is empty or the selection was cleared.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
@@ -59,6 +65,7 @@ class ArrayController {
 
   std::vector<Dictionary> entries_;
   std::optional<std::size_t> selection_;
+  bool hasChoice_ = false;
   std::atomic<std::size_t> count_ = 0;
   std::string sortKey_;
   std::function<void()> onChange_;

@@ -157,8 +157,12 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // The chosen device stays chosen when a search reports it again.
-  if (isSelected) deviceArrayController.setSelectedObject(entry);
+  // Until the user chooses, the first row is selected; their choice survives later reports.
+  if (!deviceArrayController.hasChoice()) {
+    deviceArrayController.setSelectionIndex(0);
+  } else if (isSelected) {
+    deviceArrayController.setSelectedObject(entry);
+  }
 }
 
 void ChooseDeviceView::removeServiceFromList(const Dictionary& device) {

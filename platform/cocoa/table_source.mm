@@ -63,7 +63,7 @@
   if (row < 0) {
     [self showSelection];
   } else {
-    _controller->setSelectionIndex(static_cast<std::size_t>(row));
+    _controller->choose(static_cast<std::size_t>(row));
   }
 }
 

@@ -58,14 +58,15 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// What the user has selected; a selection that they took away comes back.
+// Takes over the row that the user has selected; a selection that they took away comes back.
 void takeSelection(QAbstractItemView* view, ArrayController& controller) {
   const QModelIndexList rows = view->selectionModel()->selectedRows();
   if (rows.isEmpty()) {
     showSelection(view, controller);
-  } else {
-    controller.setSelectionIndex(static_cast<std::size_t>(rows.first().row()));
+    return;
   }
+  const auto row = static_cast<std::size_t>(rows.first().row());
+  if (row != controller.selectionIndex()) controller.choose(row);
 }
 
 }  // namespace
@@ -84,6 +85,10 @@ void TableView::bind(ArrayController& controller) const {
       [view, &controller] { showSelection(view, controller); });
   QObject::connect(view->selectionModel(), &QItemSelectionModel::selectionChanged, view,
                    [view, &controller] { takeSelection(view, controller); });
+  QObject::connect(view, &QAbstractItemView::pressed, view,
+                   [&controller](const QModelIndex& index) {
+                     controller.choose(static_cast<std::size_t>(index.row()));
+                   });
 }
 
 void TableView::setAllowsColumnReordering(bool allows) const {

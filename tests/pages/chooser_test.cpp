@@ -149,11 +149,12 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
   }
 }
 
-TEST_F(Chooser, SortsByNameAndReplacesADeviceReportedAgain) {
+TEST_F(Chooser, SortsByNameAndSelectsTheFirstRowUntilTheUserChoosesOne) {
   for (const char* name : {"b", "C", "a"})
     page->updateKSDevice(device(name));
-  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
+  EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1*", "a 192.0.2.1", "b 192.0.2.1"));
   EXPECT_EQ(page->choosedDevice()->string("interface"), "Network");
+  screen.object("deviceListView").content->choose(2);
   for (const char* name : {"a", "b", "C"})
     page->updateKSDevice(device(name));
   EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
