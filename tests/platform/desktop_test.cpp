@@ -7,7 +7,6 @@
 #include <fstream>
 #include <thread>
 
-#include "platform/child_process.h"
 #include "platform/folders.h"
 #include "platform/standin/stand_in_system.h"
 #include "platform/system_version.h"
@@ -119,22 +118,6 @@ TEST(Desktop, OpensNothingWithoutAnOpener) {
     EXPECT_FALSE(openFile("/package.pkg"));
     EXPECT_FALSE(openURL("http://support.kestrel.example/"));
   }
-}
-
-TEST(Desktop, ReturnsHowAChildProcessEnded) {
-  recording::MediumFolder medium;
-  const auto script = [&](const std::string& commands) {
-    medium.write("tool", "#!/bin/sh\n" + commands);
-    medium.makeExecutable("tool");
-    return medium.path("tool");
-  };
-  EXPECT_EQ(runAndWait(script("exit 0"), {}), 0);
-  EXPECT_EQ(runAndWait(script("[ \"$#:$1\" = '1:-installer' ] && exit 2"), {"-installer"}), 2);
-  EXPECT_EQ(runAndWait(script("kill -9 $$"), {}), std::nullopt);
-  EXPECT_EQ(runAndWait(medium.path("absent"), {}), std::nullopt);
-  medium.write("tool", std::string("no program"));
-  EXPECT_EQ(runAndWait(medium.path("tool"), {}), std::nullopt);
-  EXPECT_EQ(runAndWait(medium.path(""), {}), std::nullopt);
 }
 
 TEST(Desktop, ReportsTheSystemVersionThatItIsGiven) {
