@@ -3,24 +3,12 @@
 #include "base/ascii.h"
 #include "base/text.h"
 #include "bonjour/KSNetService.h"
+#include "bonjour/identity_keys.h"
 #include "bonjour/txt_record.h"
 
 namespace onramp {
 
 namespace {
-
-struct IdentityKeys {
-  std::string_view manufacturer;
-  std::string_view model;
-};
-
-std::optional<IdentityKeys> identityKeysOf(const std::optional<std::string>& type) {
-  if (type == "_pdl-datastream._tcp." || type == "_printer._tcp." || type == "_ipp._tcp.") {
-    return IdentityKeys{"usb_MFG", "usb_MDL"};
-  }
-  if (type == "_scanner._tcp.") return IdentityKeys{"mfg", "mdl"};
-  return std::nullopt;
-}
 
 std::optional<std::string> textUnder(const NetServiceRef& service, std::string_view key) {
   const auto data = service->txtData();
@@ -35,7 +23,8 @@ std::optional<std::string> textUnder(const NetServiceRef& service, std::string_v
 std::optional<std::string> identityText(const NetServiceRef& service,
                                         std::string_view IdentityKeys::*which) {
   if (!service) return std::nullopt;
-  const auto keys = identityKeysOf(service->type());
+  const auto type = service->type();
+  const auto keys = type ? identityKeysOf(*type) : std::nullopt;
   return keys ? textUnder(service, (*keys).*which) : std::nullopt;
 }
 

@@ -1,10 +1,10 @@
 #include "pages/ChooseDeviceView.h"
 
-#include <algorithm>
 #include <utility>
 
 #include "base/notification_center.h"
 #include "bonjour/KSDevice.h"
+#include "bonjour/model_match.h"
 #include "media/CommonMessage.h"
 #include "media/KSInstallerInfo.h"
 #include "platform/bundle.h"
@@ -141,9 +141,7 @@ void ChooseDeviceView::removeKSDevice(const Dictionary& device) {
 }
 
 bool ChooseDeviceView::doesMatchedModel(const Dictionary& device) const {
-  const std::string model = device.string(KSDevice::kUSBManufacturer).value_or("") + " " +
-                            device.string(KSDevice::kUSBModel).value_or("");
-  return std::find(searchModelList.begin(), searchModelList.end(), model) != searchModelList.end();
+  return isOneOf(searchModelList, device);
 }
 
 bool ChooseDeviceView::doesWiFi(const Dictionary& device) {

@@ -5,8 +5,9 @@
 
 namespace onramp {
 
-/// The first IPv4 address of the host `name`, dotted, asked of the system's name services; nothing
-/// when it has none. A dotted address stands for itself. Blocks as long as those services take.
+/// Asks the system's name services for the host `name` and returns its first IPv4 address, dotted;
+/// nothing when it has none. A dotted address is returned as it is. Blocks for as long as the name
+/// services take.
 [[nodiscard]] std::optional<std::string> lookUpIPv4Address(const std::string& name);
 
 }  // namespace onramp

@@ -1,42 +1,49 @@
 #include "snmp/ber_reader.h"
 
-#include <algorithm>
+#include <cstring>
+#include <optional>
+#include <span>
 
 namespace onramp {
 
-snmp_status ber_get_oid(ber_reader& in, snmp_oid* target, std::uint16_t length) {
-  if (!target) return SNMP_ERR_CODEC;
-  ber_reader ahead = in;
-  const auto content = ahead.take(length);
-  if (!content) return SNMP_ERR_CODEC;
+namespace {
 
-  const std::span<std::uint16_t> arcs(target->arcs, target->count);
-  std::size_t count = 0;
-  if (!content->empty()) {
-    if (arcs.size() < 2) return SNMP_ERR_CODEC;
-    arcs[0] = content->front() / 40;
-    arcs[1] = content->front() % 40;
-    count = 2;
-
-    std::uint32_t arc = 0;
-    bool inside = false;
-    for (const std::uint8_t byte : content->subspan(1)) {
-      arc = arc << 7 | (byte & 0x7FU);
-      if (arc > UINT16_MAX) return SNMP_ERR_CODEC;
-      inside = (byte & 0x80U) != 0;
-      if (inside) continue;
-      if (count == arcs.size()) return SNMP_ERR_CODEC;
-      arcs[count++] = static_cast<std::uint16_t>(arc);
-      arc = 0;
-    }
-    if (inside) return SNMP_ERR_CODEC;
+// Reads one arc: seven bits a byte, the highest first; all bytes but the last have the top bit set.
+// Nothing when the arc does not fit 16 bits or has no end.
+std::optional<std::uint16_t> next_arc(ByteReader& content) {
+  std::uint32_t arc = 0;
+  while (const auto byte = content.byte()) {
+    arc = arc << 7 | (*byte & 0x7FU);
+    if (arc > UINT16_MAX) return std::nullopt;
+    if (*byte < 0x80) return static_cast<std::uint16_t>(arc);
   }
-  target->count = static_cast<std::uint16_t>(count);
-  in = ahead;
+  return std::nullopt;
+}
+
+}  // namespace
+
+snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length) {
+  const auto bytes = in.take(length);
+  if (!target || !bytes) return SNMP_ERR_CODEC;
+  ByteReader content(*bytes);
+  const std::span<std::uint16_t> arcs(target->arcs, target->count);
+  std::uint16_t count = 0;
+  if (const auto first = content.byte()) {
+    if (arcs.size() < 2) return SNMP_ERR_CODEC;
+    arcs[0] = *first / 40;
+    arcs[1] = *first % 40;
+    count = 2;
+  }
+  while (!content.atEnd()) {
+    const auto arc = next_arc(content);
+    if (!arc || count == arcs.size()) return SNMP_ERR_CODEC;
+    arcs[count++] = *arc;
+  }
+  target->count = count;
   return SNMP_OK;
 }
 
-snmp_status ber_get_octets(ber_reader& in, snmp_octets* target, std::uint16_t length) {
+snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length) {
   if (length == 0) {
     if (target) target->length = 0;
     return SNMP_OK;
@@ -44,22 +51,20 @@ snmp_status ber_get_octets(ber_reader& in, snmp_octets* target, std::uint16_t le
   if (!target || length > target->capacity) return SNMP_ERR_CODEC;
   const auto content = in.take(length);
   if (!content) return SNMP_ERR_CODEC;
-  std::copy(content->begin(), content->end(), target->bytes);
+  std::memcpy(target->bytes, content->data(), length);
   target->length = length;
   return SNMP_OK;
 }
 
-snmp_status ber_get_octets_ref(ber_reader& in, snmp_octets* target, std::uint16_t length) {
+snmp_status ber_get_octets_ref(ByteReader& in, snmp_octets* target, std::uint16_t length) {
   if (length == 0) {
     if (target) target->length = 0;
     return SNMP_OK;
   }
-  if (!target) return SNMP_ERR_CODEC;
   const auto content = in.take(length);
-  if (!content) return SNMP_ERR_CODEC;
-  target->bytes = const_cast<std::uint8_t*>(content->data());
-  target->length = length;
-  target->capacity = 0;
+  if (!target || !content) return SNMP_ERR_CODEC;
+  const auto* const bytes = reinterpret_cast<const std::uint8_t*>(content->data());
+  *target = {.length = length, .capacity = 0, .bytes = const_cast<std::uint8_t*>(bytes)};
   return SNMP_OK;
 }
 

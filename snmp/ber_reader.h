@@ -2,97 +2,57 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <optional>
-#include <span>
 
+#include "base/byte_reader.h"
 #include "snmp/records.h"
 #include "snmp/status.h"
 
 namespace onramp {
 
-/// A cursor over received bytes that cannot leave them.
-class ber_reader {
- public:
-  explicit ber_reader(std::span<const std::uint8_t> bytes) : rest_(bytes) {}
+// The reading primitives (X.690 section 8, as RFC 1157 restricts it). Each moves the reader past
+// what it read and returns SNMP_OK, or returns SNMP_ERR_CODEC for malformed or missing bytes.
 
-  [[nodiscard]] std::size_t remaining() const { return rest_.size(); }
-
-  /// The next byte, which the cursor moves past; nothing at the end.
-  [[nodiscard]] std::optional<std::uint8_t> next() {
-    if (rest_.empty()) return std::nullopt;
-    const std::uint8_t byte = rest_.front();
-    rest_ = rest_.subspan(1);
-    return byte;
-  }
-
-  /// The next `count` bytes, which the cursor moves past; nothing, and no move, when fewer are
-  /// left.
-  [[nodiscard]] std::optional<std::span<const std::uint8_t>> take(std::size_t count) {
-    if (count > rest_.size()) return std::nullopt;
-    const auto taken = rest_.first(count);
-    rest_ = rest_.subspan(count);
-    return taken;
-  }
-
-  /// Lets the input end after `count` more bytes. False, and no change, when fewer are left.
-  [[nodiscard]] bool narrow(std::size_t count) {
-    if (count > rest_.size()) return false;
-    rest_ = rest_.first(count);
-    return true;
-  }
-
- private:
-  std::span<const std::uint8_t> rest_;
-};
-
-// The reading primitives (X.690 section 8, as RFC 1157 restricts it). Each moves the cursor past
-// what it read and answers SNMP_OK, or answers SNMP_ERR_CODEC and leaves the cursor where it was.
-
-/// One tag byte. Tags of more than one byte are refused.
-[[nodiscard]] inline snmp_status ber_get_tag(ber_reader& in, std::uint8_t& tag) {
+/// Reads one tag byte. A tag of more than one byte is refused, and the reader stays where it was.
+[[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
   constexpr std::uint8_t kHighTagNumber = 0x1F;
-  ber_reader ahead = in;
-  const auto byte = ahead.next();
+  ByteReader ahead = in;
+  const auto byte = ahead.byte();
   if (!byte || (*byte & kHighTagNumber) == kHighTagNumber) return SNMP_ERR_CODEC;
   tag = *byte;
   in = ahead;
   return SNMP_OK;
 }
 
-/// A length in the short form, or in the long form of one or two bytes. Whether as much input is
-/// left is for the caller to check.
-[[nodiscard]] inline snmp_status ber_get_length(ber_reader& in, std::uint16_t& length) {
-  ber_reader ahead = in;
-  const auto first = ahead.next();
+/// Reads a length in the short form, or in the long form of one or two bytes. Does not check
+/// whether the input has that many bytes left.
+[[nodiscard]] inline snmp_status ber_get_length(ByteReader& in, std::uint16_t& length) {
+  const auto first = in.byte();
   if (!first) return SNMP_ERR_CODEC;
   if (*first < 0x80) {
     length = *first;
-  } else {
-    const std::size_t count = *first & 0x7FU;
-    if (count < 1 || count > 2) return SNMP_ERR_CODEC;
-    const auto bytes = ahead.take(count);
-    if (!bytes) return SNMP_ERR_CODEC;
-    length = static_cast<std::uint16_t>(count == 1 ? (*bytes)[0] : (*bytes)[0] << 8 | (*bytes)[1]);
+    return SNMP_OK;
   }
-  in = ahead;
+  const std::size_t count = *first & 0x7FU;
+  if (count < 1 || count > 2) return SNMP_ERR_CODEC;
+  const auto number = in.number(count);
+  if (!number) return SNMP_ERR_CODEC;
+  length = static_cast<std::uint16_t>(*number);
   return SNMP_OK;
 }
 
-/// The 1 to 4 bytes of an integer, taken as unsigned.
-[[nodiscard]] inline snmp_status ber_get_uint(ber_reader& in, std::uint64_t& value,
+/// Reads an integer of 1 to 4 bytes as an unsigned number.
+[[nodiscard]] inline snmp_status ber_get_uint(ByteReader& in, std::uint64_t& value,
                                               std::uint16_t length) {
   if (length < 1 || length > 4) return SNMP_ERR_CODEC;
-  const auto bytes = in.take(length);
-  if (!bytes) return SNMP_ERR_CODEC;
-  value = 0;
-  for (const std::uint8_t byte : *bytes)
-    value = value << 8 | byte;
+  const auto number = in.number(length);
+  if (!number) return SNMP_ERR_CODEC;
+  value = *number;
   return SNMP_OK;
 }
 
-/// The 1 to 4 bytes of an integer. One or two bytes are sign-extended to 64 bits, three only to 32,
-/// four not at all: the low 32 bits hold the signed value.
-[[nodiscard]] inline snmp_status ber_get_int(ber_reader& in, std::int64_t& value,
+/// Reads an integer of 1 to 4 bytes. One or two bytes are sign-extended to 64 bits, three bytes to
+/// 32 bits, four bytes not at all. In every case the low 32 bits hold the signed value.
+[[nodiscard]] inline snmp_status ber_get_int(ByteReader& in, std::int64_t& value,
                                              std::uint16_t length) {
   std::uint64_t bits = 0;
   if (ber_get_uint(in, bits, length)) return SNMP_ERR_CODEC;
@@ -104,19 +64,21 @@ class ber_reader {
   return SNMP_OK;
 }
 
-/// An object identifier of `length` content bytes, into `target`, whose `count` is the room on
-/// entry and the arcs read on return. Refused without a target, when it needs more room, when an
-/// arc leaves 16 bits, and when the content ends inside an arc; the arcs read until then are
-/// stored.
-[[nodiscard]] snmp_status ber_get_oid(ber_reader& in, snmp_oid* target, std::uint16_t length);
+/// Reads an object identifier of `length` content bytes into `target`. On entry `target->count` is
+/// the number of arcs that fit; on return it is the number of arcs read. Refused without a target,
+/// when the arcs do not fit, when an arc does not fit 16 bits and when the content ends inside an
+/// arc. The arcs read before a refusal are stored, but `count` is unchanged then.
+[[nodiscard]] snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length);
 
-/// A string of `length` bytes, copied. Refused when it is not empty and there is no target, or when
-/// it exceeds the target's `capacity`.
-[[nodiscard]] snmp_status ber_get_octets(ber_reader& in, snmp_octets* target, std::uint16_t length);
+/// Copies a string of `length` bytes to `target`. Refused when the string is longer than
+/// `target->capacity`, and when there is no target for a string that is not empty.
+[[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
-/// The same without a copy: `bytes` points into the input, which must not be written, so `capacity`
-/// becomes 0.
-[[nodiscard]] snmp_status ber_get_octets_ref(ber_reader& in, snmp_octets* target,
+// The next function completes the primitives; no part of the program uses it.
+
+/// Like ber_get_octets, but makes `target->bytes` point into the input. `capacity` becomes 0,
+/// because the input must not be written to.
+[[nodiscard]] snmp_status ber_get_octets_ref(ByteReader& in, snmp_octets* target,
                                              std::uint16_t length);
 
 }  // namespace onramp

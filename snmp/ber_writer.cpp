@@ -1,46 +1,88 @@
 #include "snmp/ber_writer.h"
 
+#include <algorithm>
+
 namespace onramp {
 
 namespace {
 
-constexpr std::size_t kMaxOidContent = 0xFF;
+constexpr std::size_t kLongestOid = 0xFF;
 
-constexpr bool inOneByte(std::uint32_t arc) {
-  return arc < 1U << 7;
-}
-constexpr bool inTwoBytes(std::uint32_t arc) {
-  return arc < 1U << 14;
+snmp_status put_arc(ber_writer& out, std::uint16_t arc) {
+  std::uint8_t more = 0;
+  do {
+    if (out.put(static_cast<std::uint8_t>(more | (arc & 0x7FU)))) return SNMP_ERR_CODEC;
+    more = 0x80;
+    arc = static_cast<std::uint16_t>(arc >> 7);
+  } while (arc != 0);
+  return SNMP_OK;
 }
 
 }  // namespace
 
-std::size_t ber_oid_size(const snmp_oid& oid) {
-  const std::span<const std::uint16_t> arcs(oid.arcs, oid.count);
-  if (arcs.size() < 2 || arcs[0] * 40 + arcs[1] > UINT8_MAX) return 0;
-  std::size_t size = arcs.size() - 1;
-  for (const std::uint16_t arc : arcs.subspan(2)) {
-    if (!inOneByte(arc)) size += inTwoBytes(arc) ? 1 : 2;
-  }
-  return size <= kMaxOidContent ? size : 0;
+snmp_status ber_writer::put(std::span<const std::uint8_t> bytes) {
+  if (bytes.size() > left_) return SNMP_ERR_CODEC;
+  left_ -= bytes.size();
+  std::copy(bytes.begin(), bytes.end(), room_.begin() + static_cast<std::ptrdiff_t>(left_));
+  return SNMP_OK;
 }
 
-snmp_status ber_put_sized_oid(ber_writer& out, const snmp_oid& oid, std::size_t size) {
-  if (size == 0) return SNMP_ERR_CODEC;
-  const auto content = ber_put_element(out, kTagObjectIdentifier, static_cast<std::uint16_t>(size));
-  if (!content) return SNMP_ERR_CODEC;
+snmp_status ber_put_octets(ber_writer& out, std::span<const std::uint8_t> bytes, std::uint8_t tag) {
+  const std::size_t end = out.size();
+  return out.put(bytes) || ber_put_header(out, tag, end) ? SNMP_ERR_CODEC : SNMP_OK;
+}
 
-  const std::span<const std::uint16_t> arcs(oid.arcs, oid.count);
-  auto at = content->begin();
-  *at++ = static_cast<std::uint8_t>(arcs[0] * 40 + arcs[1]);
-  for (const std::uint16_t arc : arcs.subspan(2)) {
-    if (!inOneByte(arc)) {
-      if (!inTwoBytes(arc)) *at++ = static_cast<std::uint8_t>(0x80U | arc >> 14);
-      *at++ = static_cast<std::uint8_t>(0x80U | (arc >> 7 & 0x7FU));
-    }
-    *at++ = static_cast<std::uint8_t>(arc & 0x7FU);
+snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag) {
+  const std::size_t end = out.size();
+  const auto number = static_cast<std::int32_t>(value);
+  std::uint64_t written = 0;
+  bool complete = false;
+  for (unsigned shift = 0; !complete; shift += 8) {
+    const std::int32_t rest = number >> shift;
+    const auto byte = static_cast<std::uint8_t>(rest);
+    if (out.put(byte)) return SNMP_ERR_CODEC;
+    written |= std::uint64_t{byte} << shift;
+    complete = rest == static_cast<std::int8_t>(byte);
   }
-  return SNMP_OK;
+  if (number < 0) value = written;
+  return ber_put_header(out, tag, end);
+}
+
+snmp_status ber_put_int(ber_writer& out, std::int64_t& value, std::uint8_t tag) {
+  auto bits = static_cast<std::uint64_t>(value);
+  const snmp_status status = ber_put_int(out, bits, tag);
+  value = static_cast<std::int64_t>(bits);
+  return status;
+}
+
+snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag) {
+  const std::size_t end = out.size();
+  auto number = static_cast<std::uint32_t>(value);
+  for (; number >= 0x80; number >>= 8) {
+    if (out.put(static_cast<std::uint8_t>(number))) return SNMP_ERR_CODEC;
+  }
+  return out.put(static_cast<std::uint8_t>(number)) || ber_put_header(out, tag, end)
+             ? SNMP_ERR_CODEC
+             : SNMP_OK;
+}
+
+snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid) {
+  const std::span<const std::uint16_t> arcs(oid.arcs, oid.count);
+  if (arcs.size() < 2) return SNMP_ERR_CODEC;
+  const std::size_t end = out.size();
+  for (std::size_t i = arcs.size() - 1; i >= 2; --i) {
+    if (put_arc(out, arcs[i])) return SNMP_ERR_CODEC;
+  }
+  const int first = arcs[0] * 40 + arcs[1];
+  if (first > UINT8_MAX || out.put(static_cast<std::uint8_t>(first)) ||
+      out.size() - end > kLongestOid) {
+    return SNMP_ERR_CODEC;
+  }
+  return ber_put_header(out, kTagObjectIdentifier, end);
+}
+
+snmp_status ber_put_null(ber_writer& out) {
+  return ber_put_header(out, kTagNull, out.size());
 }
 
 }  // namespace onramp

@@ -1,9 +1,7 @@
 #pragma once
 
-#include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <optional>
 #include <span>
 
 #include "snmp/records.h"
@@ -11,167 +9,74 @@
 
 namespace onramp {
 
-/// A cursor over the room for a message that cannot leave it.
+/// Writes from a buffer's end towards its start and never beyond either. So an element's content is
+/// written before its header, and its length is known by then.
 class ber_writer {
  public:
-  explicit ber_writer(std::span<std::uint8_t> room) : rest_(room) {}
+  explicit ber_writer(std::span<std::uint8_t> room) : room_(room), left_(room.size()) {}
 
-  [[nodiscard]] std::size_t remaining() const { return rest_.size(); }
+  /// Bytes written so far.
+  [[nodiscard]] std::size_t size() const { return room_.size() - left_; }
 
-  /// The next `count` bytes, which are the caller's to fill; nothing, and no move, when fewer are
-  /// left.
-  [[nodiscard]] std::optional<std::span<std::uint8_t>> take(std::size_t count) {
-    if (count > rest_.size()) return std::nullopt;
-    const auto taken = rest_.first(count);
-    rest_ = rest_.subspan(count);
-    return taken;
+  /// Puts one byte before those written so far.
+  [[nodiscard]] snmp_status put(std::uint8_t byte) {
+    if (left_ == 0) return SNMP_ERR_CODEC;
+    room_[--left_] = byte;
+    return SNMP_OK;
   }
 
+  /// Puts `bytes` before those written so far.
+  [[nodiscard]] snmp_status put(std::span<const std::uint8_t> bytes);
+
  private:
-  std::span<std::uint8_t> rest_;
+  std::span<std::uint8_t> room_;
+  std::size_t left_;
 };
 
-// Sizes in bytes. What a writing primitive writes has exactly the size given here.
+// The writing primitives (X.690 section 8). Each puts one thing before what is written so far and
+// returns SNMP_OK. It returns SNMP_ERR_CODEC when the room is used up or the value has no form;
+// then part of the value may have been written.
 
-/// Of the length field for `length` bytes of content, 65,535 at most.
-[[nodiscard]] constexpr std::size_t ber_length_size(std::size_t length) {
-  return length < 0x80 ? 1 : length <= 0xFF ? 2 : 3;
+/// Puts a length field of one, two or three bytes (short form, 0x81, 0x82). A length above 65,535
+/// is refused.
+[[nodiscard]] inline snmp_status ber_put_length(ber_writer& out, std::size_t length) {
+  if (length > UINT16_MAX || out.put(static_cast<std::uint8_t>(length))) return SNMP_ERR_CODEC;
+  if (length < 0x80) return SNMP_OK;
+  if (length <= UINT8_MAX) return out.put(0x81);
+  const auto high = static_cast<std::uint8_t>(length >> 8);
+  return out.put(high) || out.put(0x82) ? SNMP_ERR_CODEC : SNMP_OK;
 }
 
-/// Of a whole element: tag, length field and content.
-[[nodiscard]] constexpr std::size_t ber_element_size(std::size_t content) {
-  return 1 + ber_length_size(content) + content;
-}
-
-/// Of the content of an element of at most 255 bytes of content, from the element's size.
-[[nodiscard]] constexpr std::size_t ber_content_size(std::size_t element) {
-  return element < ber_element_size(0x80) ? element - 2 : element - 3;
-}
-
-/// Of the content of an INTEGER, 1 to 4: the fewest bytes that hold the low 32 bits of `value` as a
-/// signed number.
-[[nodiscard]] constexpr std::size_t ber_int_size(std::uint64_t value) {
-  const auto bits = static_cast<std::uint32_t>(value);
-  const std::uint32_t magnitude = (bits & 0x80000000U) != 0 ? ~bits : bits;
-  return magnitude < 0x80U ? 1 : magnitude < 0x8000U ? 2 : magnitude < 0x800000U ? 3 : 4;
-}
-
-/// The lowest `size` bytes of `value`, 1 to 4.
-[[nodiscard]] constexpr std::uint64_t ber_low_bytes(std::uint64_t value, std::size_t size) {
-  return value & UINT32_MAX >> (32 - 8 * size);
-}
-
-/// Of the content of a Counter, Gauge or TimeTicks: the low 32 bits of `value` as an unsigned
-/// number. As in an INTEGER below 2^31; from there on 5 bytes, of which the first is zero, because
-/// their content is an INTEGER's and so must not look negative (RFC 1155 section 6, X.690
-/// section 8.3).
-[[nodiscard]] constexpr std::size_t ber_uint_size(std::uint64_t value) {
-  return (value & 0x80000000U) != 0 ? 5 : ber_int_size(value);
-}
-
-/// Of the content of an object identifier. 0 when it cannot be encoded: fewer than two arcs, first
-/// two arcs that do not fit one byte, or more than 255 bytes.
-[[nodiscard]] std::size_t ber_oid_size(const snmp_oid& oid);
-
-/// Fills `field`, of ber_length_size(length) bytes.
-inline void ber_fill_length(std::span<std::uint8_t> field, std::uint16_t length) {
-  field.back() = static_cast<std::uint8_t>(length);
-  if (length < 0x80) return;
-  field.front() = static_cast<std::uint8_t>(0x80U | (field.size() - 1));
-  if (length > 0xFF) field[1] = static_cast<std::uint8_t>(length >> 8);
-}
-
-// The writing primitives. Each moves the cursor past what it wrote and answers SNMP_OK, or answers
-// SNMP_ERR_CODEC and writes nothing when the room or the value does not do.
-
-/// A length field of one, two or three bytes (short form, 0x81, 0x82).
-[[nodiscard]] inline snmp_status ber_put_length(ber_writer& out, std::uint16_t length) {
-  const auto field = out.take(ber_length_size(length));
-  if (!field) return SNMP_ERR_CODEC;
-  ber_fill_length(*field, length);
-  return SNMP_OK;
-}
-
-/// The tag and the length of an element whose content the caller writes next.
+/// Puts the tag and the length field of an element whose content is what has been written since
+/// out.size() was `end`.
 [[nodiscard]] inline snmp_status ber_put_header(ber_writer& out, std::uint8_t tag,
-                                                std::uint16_t length) {
-  const auto header = out.take(1 + ber_length_size(length));
-  if (!header) return SNMP_ERR_CODEC;
-  header->front() = tag;
-  ber_fill_length(header->subspan(1), length);
-  return SNMP_OK;
+                                                std::size_t end) {
+  return ber_put_length(out, out.size() - end) || out.put(tag) ? SNMP_ERR_CODEC : SNMP_OK;
 }
 
-/// A whole element but for its content: `length` bytes, which are the caller's to fill. Nothing,
-/// and nothing is written, when the element does not fit.
-[[nodiscard]] inline std::optional<std::span<std::uint8_t>> ber_put_element(ber_writer& out,
-                                                                            std::uint8_t tag,
-                                                                            std::uint16_t length) {
-  const auto element = out.take(ber_element_size(length));
-  if (!element) return std::nullopt;
-  element->front() = tag;
-  ber_fill_length(element->subspan(1, ber_length_size(length)), length);
-  return element->last(length);
-}
-
-[[nodiscard]] inline snmp_status ber_put_octets(ber_writer& out,
-                                                std::span<const std::uint8_t> bytes,
-                                                std::uint8_t tag) {
-  if (bytes.size() > UINT16_MAX) return SNMP_ERR_CODEC;
-  const auto content = ber_put_element(out, tag, static_cast<std::uint16_t>(bytes.size()));
-  if (!content) return SNMP_ERR_CODEC;
-  std::copy(bytes.begin(), bytes.end(), content->begin());
-  return SNMP_OK;
-}
+[[nodiscard]] snmp_status ber_put_octets(ber_writer& out, std::span<const std::uint8_t> bytes,
+                                         std::uint8_t tag);
 
 [[nodiscard]] inline snmp_status ber_put_octets(ber_writer& out, const snmp_octets& octets,
                                                 std::uint8_t tag) {
   return ber_put_octets(out, std::span<const std::uint8_t>(octets.bytes, octets.length), tag);
 }
 
-/// The low 32 bits of `value` in `size` bytes, big-endian; a fifth byte is zero.
-[[nodiscard]] inline snmp_status ber_put_bits(ber_writer& out, std::uint32_t value,
-                                              std::size_t size, std::uint8_t tag) {
-  const auto element = out.take(2 + size);
-  if (!element) return SNMP_ERR_CODEC;
-  (*element)[0] = tag;
-  (*element)[1] = static_cast<std::uint8_t>(size);
-  std::size_t left = size;
-  for (std::uint8_t& byte : element->last(size))
-    byte = static_cast<std::uint8_t>(std::uint64_t{value} >> (8 * --left));
-  return SNMP_OK;
-}
+/// Puts the low 32 bits of `value` as a signed number, in the fewest bytes that hold it: 1 to 4.
+/// Replaces a negative value by the bytes written, read as an unsigned number; that is what
+/// ber_get_uint makes of them.
+[[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag);
+[[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::int64_t& value, std::uint8_t tag);
 
-/// An integer in `size` bytes, its ber_int_size. A negative value is cut down in place to the bytes
-/// written, which is the number that ber_get_uint reads when they come back.
-template <typename Integer>
-[[nodiscard]] inline snmp_status ber_put_sized_int(ber_writer& out, Integer& value,
-                                                   std::size_t size, std::uint8_t tag) {
-  const auto bits = static_cast<std::uint32_t>(value);
-  if (bits > INT32_MAX) value = static_cast<Integer>(ber_low_bytes(bits, size));
-  return ber_put_bits(out, bits, size, tag);
-}
+/// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks. From
+/// 2^31 on it takes 5 bytes, the first of them zero: the content is an INTEGER's, so it must not
+/// look negative (RFC 1155 section 6, X.690 section 8.3).
+[[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
-template <typename Integer>
-[[nodiscard]] snmp_status ber_put_int(ber_writer& out, Integer& value, std::uint8_t tag) {
-  return ber_put_sized_int(out, value, ber_int_size(static_cast<std::uint64_t>(value)), tag);
-}
+/// Puts an object identifier. Refused are fewer than two arcs, first two arcs that do not fit one
+/// byte, and more than 255 bytes of content.
+[[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
-/// An unsigned integer in ber_uint_size bytes.
-[[nodiscard]] inline snmp_status ber_put_uint(ber_writer& out, std::uint64_t value,
-                                              std::uint8_t tag) {
-  return ber_put_bits(out, static_cast<std::uint32_t>(value), ber_uint_size(value), tag);
-}
-
-/// An object identifier whose ber_oid_size is `size`.
-[[nodiscard]] snmp_status ber_put_sized_oid(ber_writer& out, const snmp_oid& oid, std::size_t size);
-
-[[nodiscard]] inline snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid) {
-  return ber_put_sized_oid(out, oid, ber_oid_size(oid));
-}
-
-[[nodiscard]] inline snmp_status ber_put_null(ber_writer& out) {
-  return ber_put_element(out, kTagNull, 0) ? SNMP_OK : SNMP_ERR_CODEC;
-}
+[[nodiscard]] snmp_status ber_put_null(ber_writer& out);
 
 }  // namespace onramp

@@ -23,7 +23,7 @@ constexpr const char* kLoopbackAddress = "127.0.0.1";
 constexpr int kReceiveAttempts = 256;
 constexpr std::chrono::seconds kListening{5};
 
-// Room for as many replies of any size that one link's frame holds.
+// Room for that many replies of up to one link frame each.
 constexpr std::size_t kReceiveBufferSize = std::size_t{kReceiveAttempts} * 2048;
 
 std::chrono::seconds wholeSeconds() {
@@ -42,10 +42,11 @@ std::optional<DatagramSocket> openBroadcastSocket() {
   return socket;
 }
 
-// One receive attempt: the result of the next reply, if one comes and is proper.
+// One receive attempt. Returns the result of a proper reply.
 std::optional<Dictionary> receiveResult(DatagramSocket& socket, snmp_table_request& request) {
   snmp_packet reply{};
-  const auto received = snmp_receive(socket, nullptr, reply);
+  if (!socket.waitReadable(kReceiveWait)) return std::nullopt;
+  const auto received = socket.receive(std::span(reply).first(kReplySize));
   if (!received) return std::nullopt;
   request.clear_values();
   if (snmp_decode_message(request.message(), std::span(reply).first(received->length)) ||
@@ -66,7 +67,9 @@ void searchSubnet(mib_table& table, const std::string& broadcast, Array& results
   if (snmp_encode_message(request.message(), encoded, length)) return;
   auto socket = openBroadcastSocket();
   if (!socket) return;
-  snmp_send(*socket, snmp_agent_at(*normalized), std::span(encoded).first(length));
+  if (socket->waitWritable(kSendWait)) {
+    socket->sendTo(snmp_agent_at(*normalized), std::span(encoded).first(length));
+  }
 
   const std::chrono::seconds sent = wholeSeconds();
   for (int attempt = 0; attempt < kReceiveAttempts && wholeSeconds() - sent <= kListening;

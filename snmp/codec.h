@@ -8,27 +8,35 @@
 
 namespace onramp {
 
-/// Writes `message` (RFC 1157 section 4) into `out_buffer` and its size into `out_length`. Sets
-/// every binding's `encoded_length` and masks negative integers in place, see ber_int_size. A
-/// binding whose `type` is none of 1, 2, 4, 5, 6 and 64 to 68 is written without a value.
-/// SNMP_ERR_CODEC when the message does not fit the buffer or a 16-bit length, when there are more
-/// bindings than the array has, when an object identifier cannot be encoded or when a value's
-/// record is missing; then nothing is written.
+/// Writes `message` (RFC 1157 section 4) to the start of `out_buffer` and its size to `out_length`.
+/// Sets every binding's `encoded_length`. A negative integer is replaced as ber_put_int says, so
+/// encoding the same message twice sends -1 first and 255 the second time. A binding whose `type`
+/// is not 1, 2, 4, 5, 6 or 64 to 68 is written without a value.
+///
+/// Returns SNMP_ERR_CODEC when the message does not fit the buffer or 16-bit lengths, when there
+/// are more bindings than the array has, when an object identifier has no encoding, and when a
+/// value's record is missing. The buffer's content is undefined then.
 [[nodiscard]] snmp_status snmp_encode_message(snmp_message& message,
                                               std::span<std::uint8_t> out_buffer,
                                               std::uint16_t& out_length);
 
-/// Fills `message` from a reply. Names, strings and object identifiers go to the records that the
-/// bindings already point at, for names and object identifiers with `count` as the room. The
-/// bindings' strings lie end to end in one buffer: every `octets_value` comes with `bytes` at its
-/// start, and leaves with `bytes` moved past the strings before its own and `capacity` lowered as
-/// much; the one of an integer or an object identifier leaves cleared. `community` points into
-/// `bytes`. A value of a type that the encoder does not know is not skipped, so that only an empty
-/// one can be followed by another binding.
+/// Fills `message` from a reply. Names, strings and object identifiers are written to the records
+/// that the bindings already point to. For names and object identifiers, `count` says on entry how
+/// many arcs fit. `message.community` points into `bytes`.
 ///
-/// SNMP_ERR_CODEC for anything malformed, for an element that is longer than what encloses it, and
-/// for names, strings or bindings beyond the room for them; what was decoded until then stays in
-/// place, and nothing is ever written beyond that room.
+/// All strings share one buffer, end to end. On entry every `octets_value->bytes` points to the
+/// start of that buffer. On return a string's `bytes` points past the strings before it, and its
+/// `capacity` is lower by their size; an integer's or object identifier's `octets_value` is
+/// cleared.
+///
+/// Only the list of bindings is held to its declared length: decoding ends with the first binding
+/// that reaches it. The lengths of the message, the PDU and a binding are read and not compared
+/// with anything. A value of an unknown type is not skipped: unless it is empty, decoding fails at
+/// the next binding.
+///
+/// Returns SNMP_ERR_CODEC for malformed or missing bytes, and for names, strings or bindings that
+/// do not fit. What was decoded until then stays in place. Nothing is ever read beyond `bytes` or
+/// written beyond the records' storage.
 [[nodiscard]] snmp_status snmp_decode_message(snmp_message& message,
                                               std::span<const std::uint8_t> bytes);
 

@@ -12,7 +12,8 @@ namespace {
 
 constexpr std::size_t kStringStride = 16;
 
-// The storage of one request's strings. Bindings that point into it are let go at the end.
+// Holds the strings of one request and then those of its reply, each up to kReplySize together. The
+// destructor takes it from the bindings again.
 class string_storage {
  public:
   explicit string_storage(std::span<snmp_varbind> bindings)
@@ -25,11 +26,10 @@ class string_storage {
     }
   }
 
-  /// Gives binding `i` what lies behind the first `offset` bytes, which are at most kReplySize.
+  /// Gives binding `i` the kReplySize bytes from `offset` on, which is at most kReplySize. So a
+  /// reply's strings fit wherever those of the request began.
   snmp_octets& give(std::size_t i, std::size_t offset) {
-    const auto room = std::span(bytes_).subspan(offset);
-    const auto size = static_cast<std::uint16_t>(room.size());
-    octets_[i] = {size, size, room.data()};
+    octets_[i] = {kReplySize, kReplySize, bytes_.data() + offset};
     bindings_[i].octets_value = &octets_[i];
     return octets_[i];
   }
@@ -37,8 +37,12 @@ class string_storage {
  private:
   std::span<snmp_varbind> bindings_;
   std::vector<snmp_octets> octets_;
-  std::array<std::uint8_t, kReplySize> bytes_{};
+  std::array<std::uint8_t, std::size_t{2} * kReplySize> bytes_{};
 };
+
+bool is_string(std::uint64_t type) {
+  return type == kTagOctetString || type == kTagIpAddress || type == kTagOpaque;
+}
 
 snmp_status copy_string(const snmp_octets* value, snmp_octets* target) {
   const std::uint16_t length = value ? value->length : std::uint16_t{0};
@@ -71,8 +75,8 @@ snmp_status exchange(snmp_message& message, std::span<snmp_result_slot> results,
   return copy_results(message, results);
 }
 
-// Fills the bindings from the slots that their indexes name. A string has a place of its own for
-// every binding, and one that is longer than that moves the later ones on.
+// Gives every binding its type, and a string a place in `strings`: one place every 16 bytes,
+// further on when the strings before it are longer.
 snmp_status take_slots(std::span<snmp_varbind> bindings, std::span<const snmp_result_slot> results,
                        string_storage& strings) {
   std::size_t used = 0;
@@ -81,12 +85,14 @@ snmp_status take_slots(std::span<snmp_varbind> bindings, std::span<const snmp_re
     if (binding.index >= results.size()) return SNMP_ERR_CODEC;
     const snmp_result_slot& slot = results[binding.index];
     binding.type = slot.type;
-    if (slot.type != kTagOctetString) continue;
+    if (!is_string(slot.type)) continue;
+    const snmp_octets* const source =
+        slot.type == kTagOctetString ? slot.octets : binding.octets_value;
     const std::size_t start = std::max(i * kStringStride, used);
-    if (!slot.octets || start + slot.octets->length > kReplySize) return SNMP_ERR_CODEC;
+    if (!source || start + source->length > kReplySize) return SNMP_ERR_CODEC;
     snmp_octets& octets = strings.give(i, start);
-    std::copy_n(slot.octets->bytes, slot.octets->length, octets.bytes);
-    octets.length = slot.octets->length;
+    std::copy_n(source->bytes, source->length, octets.bytes);
+    octets.length = source->length;
     used = start + (octets.length + kStringStride - 1) / kStringStride * kStringStride;
   }
   return SNMP_OK;

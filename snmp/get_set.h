@@ -8,7 +8,9 @@
 
 namespace onramp {
 
-/// What the caller of snmp_get or snmp_set expects of one binding, and where its value goes.
+// snmp_get and snmp_set complete the room; no part of the program calls them.
+
+/// The type that the caller expects of one binding, and the place for its value.
 struct snmp_result_slot {
   std::uint64_t unused = 0;
   std::uint64_t type = kTagNull;
@@ -17,19 +19,22 @@ struct snmp_result_slot {
 };
 
 /// Asks `address` (see snmp_exchange, also for `mode`) for the bindings of `message`, one for each
-/// slot, and copies the reply's values into the slots. Sends a get-next request when `pdu_type`
-/// says so, a get request otherwise. A string is followed by a zero byte where the slot has room
-/// for it. The bindings' `octets_value` is null afterwards. Answers snmp_exchange's status, or else
-/// the reply's error status, or SNMP_ERR_CODEC when a value has another type than its slot, does
-/// not fit it, or there is no slot or binding for one.
+/// slot, and copies the reply's values to the slots. Sends a get-next request when `pdu_type` says
+/// so, otherwise a get request. A string is followed by a zero byte when the slot has room for one.
+/// The bindings' `octets_value` is null afterwards.
+///
+/// Returns the status of snmp_exchange or else the reply's error status. Returns SNMP_ERR_CODEC
+/// when a value has another type than its slot or does not fit there, and when there is no slot for
+/// it.
 [[nodiscard]] snmp_status snmp_get(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 
-/// Sets the bindings of `message` at `address`. Binding i takes its type, and a string (type 4) its
-/// bytes too, from the slot that the binding's `index` names; other values are the binding's own.
-/// The values of the reply are copied into the slots, and the status is answered, as by snmp_get.
-/// SNMP_ERR_CODEC, and nothing is sent, when all strings together exceed kReplySize, each of them
-/// rounded up to 16 bytes. `octets_value` is null afterwards where it held a string of a slot.
+/// Sets the bindings of `message` at `address`. A binding takes its type from the slot that its
+/// `index` names, and its value too when that is a string (type 4); any other value is the
+/// binding's own. Copies the reply's values to the slots and returns the status as snmp_get does.
+///
+/// Returns SNMP_ERR_CODEC and sends nothing when the strings, each rounded up to 16 bytes, exceed
+/// kReplySize together. A binding's `octets_value` is null afterwards when it held a string.
 [[nodiscard]] snmp_status snmp_set(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 

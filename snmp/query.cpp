@@ -4,6 +4,8 @@
 #include <cstring>
 #include <thread>
 
+#include "snmp/protocol.h"
+
 namespace onramp {
 
 namespace {
@@ -12,14 +14,15 @@ constexpr int kAttemptsPerAddress = 3;
 constexpr int kCallsPerAttempt = 2;
 constexpr std::chrono::milliseconds kPauseBetweenAttempts{20};
 
-std::array<std::uint16_t, 14> active_if_arcs = {1, 3, 6, 1, 4, 1, 4242, 2, 4, 4, 1240, 1, 2, 0};
+std::array<std::uint16_t, kActiveIFObject.size()> active_if_arcs = kActiveIFObject;
 
 std::array<mib_entry, 1> active_if_entries = {
     {{kTagInteger, {active_if_arcs.size(), active_if_arcs.size(), active_if_arcs.data()}}}};
 
 constexpr std::array<mib_value_handler, 1> kActiveIFHandlers = {{{kActiveIFKey, decode_active_if}}};
 
-// `capacity` arcs of storage, of which as many bytes are compared: the first half of the name.
+// Compares as many bytes as the entry has arcs, which is the first half of its name. A reply is
+// decoded into the table's own names, so for those this always holds.
 bool names_match(const snmp_oid& entry, const snmp_oid& name) {
   return name.capacity >= entry.capacity && std::memcmp(entry.arcs, name.arcs, entry.capacity) == 0;
 }
@@ -28,11 +31,13 @@ void store(std::int32_t* out, std::uint64_t value) {
   if (out) *out = static_cast<std::int32_t>(value);
 }
 
-std::int64_t ask_active_if(const Value& address, bool& no_reply) {
-  const auto* const text = address.as<std::string>();
-  const auto result = snmp_query_table_retry(
-      &active_interface_table, text ? text->c_str() : nullptr, no_reply, nullptr, nullptr);
-  return result ? result->integerValue(kActiveIFKey) : 0;
+// Asks a second time when the first request gives nothing.
+template <typename Ask>
+std::optional<Dictionary> ask_twice(const Ask& ask) {
+  std::optional<Dictionary> result;
+  for (int call = 0; call < kCallsPerAttempt && !result; ++call)
+    result = ask();
+  return result;
 }
 
 }  // namespace
@@ -96,18 +101,25 @@ std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address
 std::optional<Dictionary> snmp_query_table_retry(mib_table* table, const char* address,
                                                  bool& out_no_reply, std::int32_t* out_error_status,
                                                  std::int32_t* out_error_index) {
-  std::optional<Dictionary> result;
-  for (int call = 0; call < kCallsPerAttempt && !result; ++call)
-    result = snmp_query_table(table, address, out_no_reply, out_error_status, out_error_index);
-  return result;
+  return ask_twice([&] {
+    return snmp_query_table(table, address, out_no_reply, out_error_status, out_error_index);
+  });
 }
 
 bool snmp_active_interface_is_wireless(const Array& addresses) {
+  return snmp_active_interface_is_wireless(addresses, [](const char* address, bool& no_reply) {
+    return snmp_query_table(&active_interface_table, address, no_reply, nullptr, nullptr);
+  });
+}
+
+bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask) {
   std::int64_t active_interface = 0;
   for (const Value& address : addresses) {
-    bool no_reply = false;  // of all attempts: one that went unanswered costs all three
+    bool no_reply = false;  // never cleared, so one unanswered request costs all three attempts
     for (int attempt = 0; attempt < kAttemptsPerAddress; ++attempt) {
-      active_interface = ask_active_if(address, no_reply);
+      const auto* const text = address.as<std::string>();
+      const auto result = ask_twice([&] { return ask(text ? text->c_str() : nullptr, no_reply); });
+      active_interface = result ? result->integerValue(kActiveIFKey) : 0;
       if (!no_reply) return active_interface == kActiveIFWireless;
       std::this_thread::sleep_for(kPauseBetweenAttempts);
     }

@@ -2,6 +2,7 @@
 
 #include <array>
 #include <cstdint>
+#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -13,18 +14,18 @@
 
 namespace onramp {
 
-/// One object to read.
+/// One object to ask for.
 struct mib_entry {
   std::uint64_t expected_type = kTagInteger;
-  snmp_oid oid;  ///< the name asked for, over storage that the reply's name is decoded into
+  snmp_oid oid;  ///< the name asked for; the reply's name is decoded into the same storage
 };
 
-/// Stores the value of a reply's binding under `name`. 0, or another number when the value does not
-/// do. The last argument is always 0.
+/// Stores the value of a reply's binding in `result` under `name`. Returns 0, or another number to
+/// refuse the value. The last argument is always 0.
 using mib_decode = snmp_status (*)(Dictionary& result, const char* name,
                                    const snmp_varbind& binding, std::uint64_t reserved);
 
-/// What becomes of the value of the entry at the same place.
+/// Handler for the entry at the same index.
 struct mib_value_handler {
   const char* name = nullptr;  ///< the result's key
   mib_decode decode = nullptr;
@@ -37,22 +38,21 @@ struct mib_table {
   const mib_value_handler* handlers = nullptr;
 };
 
-/// Keys of a result beside those of its table's handlers.
+/// Keys of a result in addition to those of its table's handlers.
 constexpr const char* kConnectionKey = "Connection";  ///< string, always "Network"
 constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's address
 
-constexpr const char* kActiveIFKey = "ActiveIF";
-constexpr std::int64_t kActiveIFWireless = 2;
+constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
-/// Asks for a device's active interface: ActiveIF, an integer. The name that a reply carries
-/// becomes the name of later requests, and a shorter one leaves room for no more arcs than it has.
+/// Asks for kActiveIFObject. The name in each reply replaces the one here and is what later
+/// requests ask for. After a shorter one, only names of at most that length fit.
 extern mib_table active_interface_table;
 
-/// Stores an INTEGER as a number of 32 bits; 1 for a value of any other type.
+/// Stores an INTEGER as a 32-bit number. Returns 1 for a value of any other type.
 [[nodiscard]] snmp_status decode_active_if(Dictionary& dictionary, const char* name,
                                            const snmp_varbind& binding, std::uint64_t reserved);
 
-/// A get request for the objects of a table, and the storage of its replies.
+/// A get request for the objects of a table, with the storage for its replies.
 class snmp_table_request {
  public:
   explicit snmp_table_request(mib_table& table);
@@ -60,15 +60,15 @@ class snmp_table_request {
   snmp_table_request& operator=(const snmp_table_request&) = delete;
   ~snmp_table_request() = default;
 
-  /// To be sent, and to be decoded into. Its `request_id` is the caller's to set.
+  /// The message to send, and to decode the reply into. The caller sets its `request_id`.
   [[nodiscard]] snmp_message& message() { return message_; }
 
-  /// Forgets the values of the reply before, so that another one can be decoded into the message.
+  /// Forgets the previous reply's values, so that another reply can be decoded into the message.
   void clear_values();
 
-  /// The result of the reply in the message: what the handlers store, and as the device's address
-  /// `address`. Nothing when the reply's names do not match the table's, or when the last entry's
-  /// handler refused its value; a refused value also drops those before it.
+  /// Returns what the handlers make of the reply in the message, plus `address` as the device's
+  /// address. A refused value drops everything stored before it, so nothing is returned when the
+  /// last entry's value is refused.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
  private:
@@ -79,26 +79,37 @@ class snmp_table_request {
   snmp_message message_;
 };
 
-/// Asks the device at `address`, dotted IPv4 text, for the objects of `table`. Nothing without a
-/// table or an address, when the device refuses or its values do not do, and when it gives no
-/// proper answer, in which case alone `out_no_reply` is set; it is never cleared. The error status
-/// and index of an answer go to the other two, which may be null. Blocks as snmp_exchange does.
+/// Asks the device at `address`, dotted IPv4 text, for the objects of `table`. Returns nothing when
+/// `table` or `address` is null, when the device refuses, when its values are unsuitable, and when
+/// no proper reply comes. `out_no_reply` is set in the last case only and is never cleared. A
+/// reply's error status and index are stored in the last two arguments, which may be null. Blocks
+/// as snmp_exchange does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
                                                          std::int32_t* out_error_index);
 
-/// The same, asking a second time when the first gives nothing.
+/// The same, asking a second time when the first request gives nothing.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table_retry(mib_table* table,
                                                                const char* address,
                                                                bool& out_no_reply,
                                                                std::int32_t* out_error_status,
                                                                std::int32_t* out_error_index);
 
-/// Whether the device with these addresses (strings) says that its active interface is the wireless
-/// one. Addresses are tried in order until one answers at the first request; one that leaves a
-/// request unanswered is asked three times, 20 ms apart, and its last answer counts when no further
-/// address decides.
+/// Returns whether the device with these addresses (strings) says that its active interface is the
+/// wireless one. Tries the addresses in order; the first that answers every request decides. One
+/// that leaves a request unanswered is tried three times, 20 ms apart, with up to two requests
+/// each. When no address decides, the result of the very last try does.
+///
+/// Blocks: an address that swallows all six requests takes 12 seconds.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
+
+/// Makes one request to the device at an address, which is null for an entry that is no text.
+/// Returns what snmp_query_table does, and sets `no_reply` in the same case.
+using snmp_ask =
+    std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
+
+/// The same decision with requests made by `ask`, for callers that keep what is exchanged.
+[[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);
 
 }  // namespace onramp

@@ -1,15 +1,10 @@
 #include "snmp/records.h"
 
 #include <algorithm>
-#include <string_view>
+
+#include "snmp/protocol.h"
 
 namespace onramp {
-
-namespace {
-
-constexpr std::string_view kCommunity = "corridor";
-
-}  // namespace
 
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count) {
   message.version = 0;

@@ -5,7 +5,7 @@
 
 namespace onramp {
 
-/// Tag bytes of the values that a binding can hold (X.690 section 8, RFC 1155 section 6).
+/// Tag bytes (X.690 section 8, RFC 1155 section 6).
 constexpr std::uint8_t kTagBoolean = 0x01;
 constexpr std::uint8_t kTagInteger = 0x02;
 constexpr std::uint8_t kTagOctetString = 0x04;
@@ -18,38 +18,38 @@ constexpr std::uint8_t kTagGauge = 0x42;
 constexpr std::uint8_t kTagTimeTicks = 0x43;
 constexpr std::uint8_t kTagOpaque = 0x44;
 
-/// Kinds of PDU, the low five bits of its tag (RFC 1157 section 4.1).
+/// Kinds of PDU: the low five bits of its tag (RFC 1157 section 4.1).
 constexpr std::uint64_t kPduGet = 0;
 constexpr std::uint64_t kPduGetNext = 1;
 constexpr std::uint64_t kPduResponse = 2;
 constexpr std::uint64_t kPduSet = 3;
 
-/// An object identifier over the caller's storage, in arcs of 16 bits. Larger arcs cannot be held.
+/// An object identifier in the caller's storage. Arcs above 65,535 cannot be represented.
 struct snmp_oid {
-  std::uint16_t count = 0;     ///< arcs in use; on entry to a decoder the room that it may fill
+  std::uint16_t count = 0;     ///< arcs in use; on entry to a decoder, how many arcs fit
   std::uint16_t capacity = 0;  ///< size of the storage, in arcs
   std::uint16_t* arcs = nullptr;
 };
 
-/// A byte string over the caller's storage. `bytes` to `bytes + capacity` may be written.
+/// A byte string in the caller's storage, `capacity` bytes from `bytes` on.
 struct snmp_octets {
   std::uint16_t length = 0;
   std::uint16_t capacity = 0;
   std::uint8_t* bytes = nullptr;
 };
 
-/// One variable binding. Only the value field that belongs to `type` means anything.
+/// One variable binding. Only the value field that belongs to `type` is used.
 struct snmp_varbind {
   std::uint64_t type = kTagNull;
   snmp_oid* name = nullptr;             ///< a reply's name is decoded into this same record
-  std::int64_t int_value = 0;           ///< of types 1, 2, 65, 66 and 67; 32 bits of it count
+  std::int64_t int_value = 0;           ///< of types 1, 2, 65, 66 and 67; the low 32 bits count
   snmp_octets* octets_value = nullptr;  ///< of types 4, 64 and 68
   snmp_oid* oid_value = nullptr;        ///< of type 6
-  std::uint16_t encoded_length = 0;     ///< set by the encoder: bytes of name and value together
+  std::uint16_t encoded_length = 0;     ///< set by the encoder: size of name and value together
   std::uint32_t index = 0;              ///< set by the decoder: position in the reply, from 0
 };
 
-/// One SNMPv1 message (RFC 1157 section 4). It owns nothing: every pointer is the caller's.
+/// One SNMPv1 message (RFC 1157 section 4). It owns none of the memory that it points to.
 struct snmp_message {
   std::uint64_t version = 0;
   std::uint16_t community_length = 0;
@@ -59,15 +59,17 @@ struct snmp_message {
   std::uint64_t error_status = 0;
   std::uint64_t error_index = 0;
   std::uint64_t varbind_count = 0;
-  std::span<snmp_varbind> varbinds;  ///< the array, whose size bounds what a decoder fills
+  std::span<snmp_varbind> varbinds;  ///< the whole array, not only those in use
 };
 
-/// Makes `message` an SNMPv1 request of the program's community with `varbind_count` NULL bindings
-/// (as many of them as the array has). `request_id` and `pdu_type` stay as they are.
+/// Makes `message` an SNMPv1 request with the community kCommunity. Sets `varbind_count` and makes
+/// that many bindings NULL, or all when the array has fewer. `request_id` and `pdu_type` are
+/// unchanged.
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
-/// -1 when `first` is less: its arc is, at the first difference, or it ends first. 1 when its arc
-/// is greater. 0 otherwise, so also for a `first` that goes on where `second` ends.
+/// Compares arc by arc. Returns -1 when `first` is less at the first difference or ends first, 1
+/// when it is greater there, and 0 otherwise: also when `second` ends first. No part of the program
+/// uses it.
 [[nodiscard]] int snmp_oid_compare(const snmp_oid& first, const snmp_oid& second);
 
 }  // namespace onramp

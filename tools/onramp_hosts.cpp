@@ -14,6 +14,7 @@
 #include "netconfig/local_address_list.h"
 #include "platform/dynamic_store.h"
 #include "snmp/broadcast_search.h"
+#include "snmp/protocol.h"
 
 namespace {
 

@@ -1,5 +1,5 @@
-// Encodes the request for ActiveIF and decodes its reply, with this codec and with net-snmp's
-// library in turns, and prints times, ratios and allocations of one message.
+// Encodes the request for ActiveIF and decodes its reply, in turns with this codec and net-snmp's
+// library. Prints the time for one message, the ratio and the allocations.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -10,6 +10,7 @@
 #include <cstring>
 
 #include "bench/snmp/median.h"
+#include "snmp/protocol.h"
 #include "tests/snmp/message.h"
 
 namespace {
@@ -18,7 +19,7 @@ long allocations = 0;
 
 }  // namespace
 
-// Every allocation of the process, those inside the library included, passes through here.
+// Counts every allocation of the process, including those inside the library.
 extern "C" {
 // The C library's names.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
@@ -39,9 +40,6 @@ namespace {
 constexpr int kRounds = 2001;
 constexpr int kMessagesPerRound = 500;
 
-constexpr std::array<std::uint16_t, 14> kActiveIF = {1, 3, 6, 1,    4, 1, 4242,
-                                                     2, 4, 4, 1240, 1, 2, 0};
-
 void check(bool fine, const char* what) {
   if (fine) return;
   std::fprintf(stderr, "snmp_codec_bench: %s failed, so there is nothing to compare\n", what);
@@ -50,7 +48,7 @@ void check(bool fine, const char* what) {
 
 struct Ours : onramp::Message {
   Ours() : Message(1) {
-    set(names[0], kActiveIF);
+    set(names[0], onramp::kActiveIFObject);
     message.request_id = 1234;
   }
 
@@ -75,8 +73,8 @@ class NetSnmp {
   NetSnmp() {
     snmp_sess_init(&session_);
     session_.version = SNMP_VERSION_1;
-    std::array<oid, kActiveIF.size()> name{};
-    std::copy(kActiveIF.begin(), kActiveIF.end(), name.begin());
+    std::array<oid, onramp::kActiveIFObject.size()> name{};
+    std::copy(onramp::kActiveIFObject.begin(), onramp::kActiveIFObject.end(), name.begin());
     request_ = snmp_pdu_create(SNMP_MSG_GET);
     request_->version = SNMP_VERSION_1;
     request_->reqid = 1234;
@@ -103,7 +101,7 @@ class NetSnmp {
     snmp_free_pdu(pdu);
   }
 
-  /// Built from the buffer's end towards its start.
+  /// net-snmp, too, builds from the buffer's end.
   [[nodiscard]] std::span<const std::uint8_t> request() const {
     return std::span(buffer_).last(offset_);
   }

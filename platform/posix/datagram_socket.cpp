@@ -4,13 +4,18 @@
 #include <netinet/in.h>
 #include <poll.h>
 #include <sys/socket.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <cerrno>
 #include <utility>
 
+#include "platform/posix/descriptor.h"
+
 namespace onramp {
+
+struct DatagramSocket::Native {
+  posix::Descriptor descriptor;
+};
 
 namespace {
 
@@ -38,54 +43,56 @@ bool waitFor(int descriptor, short event, std::chrono::nanoseconds timeout) {
 
 }  // namespace
 
+DatagramSocket::DatagramSocket(std::unique_ptr<Native> native) : native_(std::move(native)) {}
+DatagramSocket::DatagramSocket(DatagramSocket&& other) noexcept = default;
+DatagramSocket& DatagramSocket::operator=(DatagramSocket&& other) noexcept = default;
+DatagramSocket::~DatagramSocket() = default;
+
 std::optional<DatagramSocket> DatagramSocket::open() {
-  DatagramSocket socket(::socket(AF_INET, SOCK_DGRAM, 0));
-  if (socket.descriptor_ < 0) return std::nullopt;
-  if (::fcntl(socket.descriptor_, F_SETFL, O_NONBLOCK) != 0) return std::nullopt;
-  return socket;
+  posix::Descriptor descriptor(::socket(AF_INET, SOCK_DGRAM, 0));
+  if (!descriptor || ::fcntl(descriptor.get(), F_SETFL, O_NONBLOCK) != 0) return std::nullopt;
+  return DatagramSocket(std::make_unique<Native>(Native{std::move(descriptor)}));
 }
 
-DatagramSocket::DatagramSocket(DatagramSocket&& other) noexcept
-    : descriptor_(std::exchange(other.descriptor_, -1)) {}
-
-DatagramSocket& DatagramSocket::operator=(DatagramSocket&& other) noexcept {
-  std::swap(descriptor_, other.descriptor_);
-  return *this;
-}
-
-DatagramSocket::~DatagramSocket() {
-  if (descriptor_ >= 0) ::close(descriptor_);
+bool DatagramSocket::connect(const DatagramEndpoint& peer) {
+  const sockaddr_in address = socketAddress(peer);
+  return ::connect(native_->descriptor.get(), reinterpret_cast<const sockaddr*>(&address),
+                   sizeof address) == 0;
 }
 
 bool DatagramSocket::permitBroadcast() {
   const int on = 1;
-  return ::setsockopt(descriptor_, SOL_SOCKET, SO_BROADCAST, &on, sizeof on) == 0;
+  return ::setsockopt(native_->descriptor.get(), SOL_SOCKET, SO_BROADCAST, &on, sizeof on) == 0;
 }
 
 void DatagramSocket::setReceiveBufferSize(std::size_t bytes) {
   const int size = static_cast<int>(bytes);
-  ::setsockopt(descriptor_, SOL_SOCKET, SO_RCVBUF, &size, sizeof size);
+  ::setsockopt(native_->descriptor.get(), SOL_SOCKET, SO_RCVBUF, &size, sizeof size);
 }
 
 bool DatagramSocket::waitWritable(std::chrono::nanoseconds timeout) const {
-  return waitFor(descriptor_, POLLOUT, timeout);
+  return waitFor(native_->descriptor.get(), POLLOUT, timeout);
 }
 
 bool DatagramSocket::waitReadable(std::chrono::nanoseconds timeout) const {
-  return waitFor(descriptor_, POLLIN, timeout);
+  return waitFor(native_->descriptor.get(), POLLIN, timeout);
+}
+
+bool DatagramSocket::send(std::span<const std::uint8_t> bytes) {
+  return ::send(native_->descriptor.get(), bytes.data(), bytes.size(), 0) >= 0;
 }
 
 bool DatagramSocket::sendTo(const DatagramEndpoint& destination,
                             std::span<const std::uint8_t> bytes) {
   const sockaddr_in address = socketAddress(destination);
-  return ::sendto(descriptor_, bytes.data(), bytes.size(), 0,
+  return ::sendto(native_->descriptor.get(), bytes.data(), bytes.size(), 0,
                   reinterpret_cast<const sockaddr*>(&address), sizeof address) >= 0;
 }
 
 std::optional<DatagramSocket::Received> DatagramSocket::receive(std::span<std::uint8_t> buffer) {
   sockaddr_in sender{};
   socklen_t size = sizeof sender;
-  const ssize_t length = ::recvfrom(descriptor_, buffer.data(), buffer.size(), 0,
+  const ssize_t length = ::recvfrom(native_->descriptor.get(), buffer.data(), buffer.size(), 0,
                                     reinterpret_cast<sockaddr*>(&sender), &size);
   if (length < 0) return std::nullopt;
   return Received{static_cast<std::size_t>(length),

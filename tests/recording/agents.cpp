@@ -4,28 +4,24 @@
 #include <cstdlib>
 #include <utility>
 
-#include "platform/datagram_socket.h"
 #include "tests/snmp/message.h"
 
 namespace onramp {
+
+using recording::Agents;
+
+struct DatagramSocket::Native {
+  DatagramEndpoint peer;
+  std::optional<Agents::Bytes> reply;  ///< to the request under way
+  bool refused = false;                ///< what the peer's host did with it
+};
 
 namespace recording {
 
 namespace {
 
-struct Reply {
-  DatagramEndpoint sender;
-  std::vector<std::uint8_t> bytes;
-};
-
-// Of the one request that is under way; empty when it stays unanswered.
-std::optional<Reply>& pendingReply() {
-  static std::optional<Reply> reply;
-  return reply;
-}
-
-// A request for one object as the answer to it.
-std::vector<std::uint8_t> answerTo(std::span<const std::uint8_t> request, int value) {
+// Turns a request for one object into the answer to it.
+Agents::Bytes answerTo(const Agents::Bytes& request, int value) {
   Message message(1);
   if (message.decode(request)) std::abort();
   message.message.pdu_type = kPduResponse;
@@ -43,11 +39,9 @@ Agents& Agents::instance() {
 
 void Agents::reset() {
   *this = Agents();
-  pendingReply().reset();
 }
 
 int Agents::nextAnswer(const std::string& address) {
-  asked.push_back(address);
   const auto found = answers.find(address);
   if (found == answers.end() || found->second.empty()) return kSilent;
   std::vector<int>& values = found->second;
@@ -58,48 +52,54 @@ int Agents::nextAnswer(const std::string& address) {
 
 }  // namespace recording
 
-using recording::pendingReply;
-
-std::optional<DatagramSocket> DatagramSocket::open() {
-  pendingReply().reset();
-  return DatagramSocket(0);
-}
-
+DatagramSocket::DatagramSocket(std::unique_ptr<Native> native) : native_(std::move(native)) {}
 DatagramSocket::DatagramSocket(DatagramSocket&& other) noexcept = default;
 DatagramSocket& DatagramSocket::operator=(DatagramSocket&& other) noexcept = default;
-// What was not received goes with the socket.
-DatagramSocket::~DatagramSocket() {
-  pendingReply().reset();
+DatagramSocket::~DatagramSocket() = default;
+
+std::optional<DatagramSocket> DatagramSocket::open() {
+  if (!Agents::instance().socketsOpen) return std::nullopt;
+  return DatagramSocket(std::make_unique<Native>());
 }
 
-bool DatagramSocket::permitBroadcast() {
+bool DatagramSocket::connect(const DatagramEndpoint& peer) {
+  native_->peer = peer;
   return true;
 }
 
-bool DatagramSocket::waitWritable(std::chrono::nanoseconds) const {
+bool DatagramSocket::waitWritable(std::chrono::nanoseconds timeout) const {
+  Agents::instance().waits.push_back(timeout);
   return true;
 }
 
-bool DatagramSocket::waitReadable(std::chrono::nanoseconds) const {
-  return pendingReply().has_value();
+bool DatagramSocket::waitReadable(std::chrono::nanoseconds timeout) const {
+  Agents::instance().waits.push_back(timeout);
+  return native_->refused || native_->reply;
 }
 
-bool DatagramSocket::sendTo(const DatagramEndpoint& destination,
-                            std::span<const std::uint8_t> bytes) {
-  recording::Agents& agents = recording::Agents::instance();
-  const int value = agents.nextAnswer(dottedIPv4(destination.address));
-  if (value != recording::Agents::kSilent) {
-    pendingReply() = {destination, recording::answerTo(bytes, value)};
+bool DatagramSocket::send(std::span<const std::uint8_t> bytes) {
+  Agents& agents = Agents::instance();
+  const Agents::Bytes request(bytes.begin(), bytes.end());
+  const std::string address = dottedIPv4(native_->peer.address);
+  agents.asked.push_back(address);
+  agents.port = native_->peer.port;
+  if (agents.reply) {
+    native_->reply = agents.reply(request);
+    return true;
   }
+  const int answer = agents.nextAnswer(address);
+  native_->refused = answer == Agents::kRefused;
+  if (answer >= 0) native_->reply = recording::answerTo(request, answer);
   return true;
 }
 
 std::optional<DatagramSocket::Received> DatagramSocket::receive(std::span<std::uint8_t> buffer) {
-  if (!pendingReply()) return std::nullopt;
-  const auto reply = std::exchange(pendingReply(), std::nullopt);
-  const std::size_t length = std::min(buffer.size(), reply->bytes.size());
-  std::copy_n(reply->bytes.begin(), length, buffer.begin());
-  return Received{length, reply->sender};
+  native_->refused = false;
+  const auto reply = std::exchange(native_->reply, std::nullopt);
+  if (!reply) return std::nullopt;
+  const std::size_t length = std::min(buffer.size(), reply->size());
+  std::copy_n(reply->begin(), length, buffer.begin());
+  return Received{length, native_->peer};
 }
 
 }  // namespace onramp

@@ -58,7 +58,8 @@ TEST(BroadcastSearch, KeepsEveryProperReplyOfEverySubnet) {
 
   EXPECT_THAT(Array(wire, results.end()),
               UnorderedElementsAreArray({result("192.0.2.11", 1), result("192.0.2.12", 2),
-                                         result("192.0.2.13", 7), result("192.0.2.13", 7)}));
+                                         result("192.0.2.13", 7), result("192.0.2.13", 7),
+                                         result("192.0.2.13", 7)}));
 }
 
 }  // namespace

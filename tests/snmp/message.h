@@ -23,11 +23,23 @@ inline std::vector<std::uint8_t> hex(std::string_view text) {
   return bytes;
 }
 
-/// What snmpd answered to a request for ActiveIF: 2.
+/// What snmpd answered to request 7 for ActiveIF: 2.
 inline std::vector<std::uint8_t> realReply() {
   return hex(
       "30 30 02 01 00 04 08 63 6f 72 72 69 64 6f 72 a2 21 02 01 07 02 01 00 02 01 00 30 16 30 14 "
       "06 0f 2b 06 01 04 01 a1 12 02 04 04 89 58 01 02 00 02 01 02");
+}
+
+/// A reply to request 7 with these bindings, in hexadecimal; at most 255 bytes of them.
+inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8_t errorStatus = 0,
+                                           std::uint8_t errorIndex = 0) {
+  const auto list = hex(bindings);
+  auto reply = hex("30 00 02 01 00 04 00 a2 00 02 01 07 02 01 00 02 01 00 30 81 00");
+  reply[14] = errorStatus;
+  reply[17] = errorIndex;
+  reply.back() = static_cast<std::uint8_t>(list.size());
+  reply.insert(reply.end(), list.begin(), list.end());
+  return reply;
 }
 
 /// A request of `bindings` NULL bindings, named 1.3.1.1…, whose storage is followed by guards.

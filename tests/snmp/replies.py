@@ -13,13 +13,12 @@ def integer(number):
     return element(2, number.to_bytes(number.bit_length() // 8 + 1, "big", signed=True))
 
 
-SHORT_NAME = bytes.fromhex("2b 06 01 04 01")
-NAME = SHORT_NAME + bytes.fromhex("a1 12 02 04 04 89 58 01 02 00")
+NAME = bytes.fromhex("2b 06 01 04 01 a1 12 02 04 04 89 58 01 02 00")
 
 
-def binding(value, name=NAME):
+def binding(value):
     """A binding of the device interface object to an encoded value."""
-    return element(0x30, element(6, name) + value)
+    return element(0x30, element(6, NAME) + value)
 
 
 def reply(identifier, bindings, status=0, community=COMMUNITY):

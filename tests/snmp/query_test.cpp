@@ -1,0 +1,215 @@
+// Queries of agents that a test scripts: see tests/recording/agents.h.
+
+#include "snmp/query.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "snmp/protocol.h"
+#include "tests/recording/agents.h"
+#include "tests/snmp/message.h"
+
+namespace onramp {
+
+namespace {
+
+using recording::Agents;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+const std::int32_t kFirstIdentifier = snmp_request_counter;
+
+class Query : public testing::Test {
+ protected:
+  void SetUp() override {
+    agents.reset();
+    snmp_request_counter = 7;  // replyWith's
+  }
+  void TearDown() override {
+    snmp_oid& name = active_interface_table.entries[0].oid;
+    std::copy(kActiveIFObject.begin(), kActiveIFObject.end(), name.arcs);
+    name.count = kActiveIFObject.size();
+  }
+
+  void reply(const Agents::Bytes& bytes) {
+    agents.reply = [bytes](const Agents::Bytes&) { return bytes; };
+  }
+
+  Agents& agents = Agents::instance();
+};
+
+// What a query leaves, as a text: the result's numbers, the flag, the error status and index.
+std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
+  bool noReply = false;
+  std::int32_t status = -1;
+  std::int32_t index = -1;
+  const auto result = snmp_query_table(table, address, noReply, &status, &index);
+  std::string text;
+  for (const char* key : {"one", "two", "ActiveIF"}) {
+    if (result && result->find(key))
+      text += key + std::string(" ") + std::to_string(result->integerValue(key)) + " ";
+  }
+  return text + (result ? "" : "nothing ") + (noReply ? "no reply " : "") + std::to_string(status) +
+         " " + std::to_string(index);
+}
+
+// A binding of 1.3 to a value, in hexadecimal.
+std::string binding(const std::string& value) {
+  return "30 00 06 01 2B " + value;
+}
+
+TEST_F(Query, MakesAResultOfTheRepliesThatATableAsksFor) {
+  const auto one = binding("02 01 05");
+  const auto two = binding("02 04 80 00 00 00");
+  const auto text = binding("04 01 05");
+  auto stale = replyWith(one + two);
+  stale[11] = 6;
+  const struct {
+    const char* what;
+    Agents::Bytes reply;
+    const char* outcome;
+  } cases[] = {
+      {"two integers", replyWith(one + two), "one 5 two -2147483648 0 0"},
+      {"a refused value before another", replyWith(text + two), "two -2147483648 0 0"},
+      {"a refused value at the end", replyWith(one + text), "nothing 0 0"},
+      {"a counter for an integer", replyWith(one + binding("41 01 02")), "nothing 0 0"},
+      {"a missing value", replyWith(one), "nothing 0 0"},
+      {"no values", replyWith(""), "nothing 0 0"},
+      {"a refusal", replyWith(one + two, 2, 3), "nothing 2 3"},
+      {"a value more than asked for", replyWith(one + two + one), "nothing no reply -1 -1"},
+      {"another request's identifier", stale, "nothing no reply -1 -1"},
+      {"malformed", hex("30 07 02 84 DE AD BA BE 00"), "nothing no reply -1 -1"},
+      {"empty", {}, "nothing no reply -1 -1"},
+  };
+  std::uint16_t arcs[] = {1, 3, 1, 1, 3, 2};
+  mib_entry entries[2];
+  mib_value_handler handlers[] = {{"one", decode_active_if}, {"two", decode_active_if}};
+  mib_table table{entries, 2, handlers};
+  const auto ask = [&](const Agents::Bytes& bytes) {
+    for (std::size_t i = 0; i < 2; ++i)
+      entries[i].oid = {3, 3, arcs + 3 * i};
+    snmp_request_counter = 7;
+    reply(bytes);
+    return outcome(&table);
+  };
+  for (const auto& c : cases)
+    EXPECT_EQ(ask(c.reply), c.outcome) << c.what;
+  handlers[0].decode = nullptr;
+  EXPECT_EQ(ask(replyWith(text + two)), "two -2147483648 0 0");
+  table.count = 0;
+  EXPECT_EQ(ask(replyWith("")), "nothing 0 0");
+}
+
+TEST_F(Query, AsksTheAddressUnderTheNextIdentifierForTwoSecondsEach) {
+  EXPECT_EQ(kFirstIdentifier, 0);
+  agents.answers["127.0.1.2"] = {2};
+  bool noReply = false;
+  EXPECT_EQ(
+      snmp_query_table(&active_interface_table, "127.000.001.002", noReply, nullptr, nullptr),
+      (Dictionary{{"ActiveIF", 2}, {"Connection", "Network"}, {"IPaddress", "127.000.001.002"}}));
+  EXPECT_EQ(snmp_request_counter, 8);
+  EXPECT_EQ(agents.port, 161);
+  EXPECT_THAT(agents.asked, ElementsAre("127.0.1.2"));
+  EXPECT_THAT(agents.waits, ElementsAre(std::chrono::seconds(2), std::chrono::seconds(2)));
+}
+
+TEST_F(Query, TellsSilenceFromAQuestionThatCannotBeAsked) {
+  EXPECT_EQ(outcome(&active_interface_table), "nothing no reply -1 -1");
+  agents.answers["192.0.2.1"] = {Agents::kRefused};
+  EXPECT_EQ(outcome(&active_interface_table), "nothing no reply -1 -1");
+  EXPECT_EQ(agents.asked.size(), 2U);
+
+  agents.socketsOpen = false;
+  EXPECT_EQ(outcome(&active_interface_table), "nothing no reply -1 -1");
+  EXPECT_EQ(outcome(&active_interface_table, ""), "nothing no reply -1 -1");
+  EXPECT_EQ(outcome(&active_interface_table, nullptr), "nothing -1 -1");
+  EXPECT_EQ(outcome(nullptr), "nothing -1 -1");
+  EXPECT_EQ(agents.asked.size(), 2U);
+}
+
+TEST_F(Query, AsksForTheNameOfTheLatestReply) {
+  reply(replyWith("30 00 06 05 2B 06 01 04 01 02 01 02"));
+  EXPECT_EQ(outcome(&active_interface_table), "ActiveIF 2 0 0");
+  snmp_request_counter = 7;
+  agents.reply = [](const Agents::Bytes& request) {
+    Message m(1);
+    EXPECT_EQ(m.decode(request), SNMP_OK);
+    EXPECT_EQ(m.names[0].count, 6);
+    return realReply();
+  };
+  EXPECT_EQ(outcome(&active_interface_table), "nothing no reply -1 -1") << "14 arcs into 6";
+}
+
+TEST_F(Query, ReturnsTheStatusOfTheExchange) {
+  Message m(1);
+  m.message.request_id = 7;
+  EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNoNetwork), SNMP_ERR_CODEC);
+  EXPECT_THAT(agents.asked, IsEmpty());
+  EXPECT_EQ(std::string(m.message.community, m.message.community_length), "corridor");
+
+  reply(replyWith(binding("05 00")));
+  m.reset();
+  snmp_message_init(m.message, 1);
+  EXPECT_EQ(snmp_exchange(m.message, "somewhere", 0), SNMP_OK) << "any other mode sends";
+  EXPECT_THAT(agents.asked, ElementsAre("255.255.255.255"));
+  EXPECT_EQ(std::string(m.message.community, m.message.community_length), "corridor")
+      << "the reply's is gone";
+
+  snmp_request_counter = 6;
+  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT) << "stale";
+  agents.socketsOpen = false;
+  EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork), SNMP_ERR_TRANSPORT);
+  EXPECT_EQ(snmp_request_to_address(nullptr, "192.0.2.1"), SNMP_ERR_TRANSPORT);
+  EXPECT_EQ(snmp_request_to_address(&m.message, ""), SNMP_ERR_TRANSPORT);
+  snmp_message_init(m.message, 1);
+  m.varbinds[0].name = nullptr;
+  snmp_request_counter = INT32_MAX;
+  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_CODEC) << "no name";
+  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_CODEC) << "negative";
+  EXPECT_EQ(snmp_request_counter, INT32_MIN + 1);
+}
+
+TEST_F(Query, ReadsNoMoreThan1500Bytes) {
+  for (const std::size_t size : {1500U, 1501U}) {
+    auto bytes = hex("30 82 05 D8 02 01 00 04 82 05 C4");
+    bytes.resize(size - 13, 'c');
+    bytes[10] = static_cast<std::uint8_t>(size - 24);
+    const auto rest = hex("a2 0b 02 01 07 02 01 00 02 01 00 30 00");
+    bytes.insert(bytes.end(), rest.begin(), rest.end());
+    reply(bytes);
+    Message m(1);
+    EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork),
+              size == 1500 ? SNMP_OK : SNMP_ERR_CODEC);
+  }
+}
+
+TEST(Addresses, AreNormalizedPartByPart) {
+  const struct {
+    const char* text;
+    std::optional<std::string> normalized;
+  } cases[] = {
+      {"192.168.001.010", "192.168.1.10"},
+      {"10.0.0.1", "10.0.0.1"},
+      {"printer.local", "0.0"},
+      {"fe80::1", "0"},
+      {"1..2", "1.0.2"},
+      {" 7x.-3", "7.-3"},
+      {"1.2.3.4.5.6.7.8.9.1.2.3.4.5.6.7", "1.2.3.4.5.6.7.8.9.1.2.3.4.5.6.7"},
+      {"1.2.3.4.5.6.7.8.9.1.2.3.4.5.6.17", std::nullopt},
+      {"", std::nullopt},
+      {nullptr, std::nullopt},
+  };
+  for (const auto& c : cases)
+    EXPECT_EQ(snmp_normalize_ipv4(c.text), c.normalized) << (c.text ? c.text : "null");
+}
+
+TEST(Addresses, AreReadAndWrittenAsTheSystemDoes) {
+  EXPECT_EQ(parseIPv4("10.0.0.1"), IPv4Address{0x0A000001});
+  EXPECT_EQ(parseIPv4("010.0.0.1"), IPv4Address{0x08000001}) << "octal";
+  EXPECT_EQ(parseIPv4("256.0.0.1"), std::nullopt);
+  EXPECT_EQ(dottedIPv4(IPv4Address{0xC0000201}), "192.0.2.1");
+}
+
+}  // namespace
+
+}  // namespace onramp
