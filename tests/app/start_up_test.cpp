@@ -145,7 +145,7 @@ TEST_F(StartUp, ComesUpWhateverTheMediumLacks) {
   std::string wrongTypes = head;
   for (const char* key : {"CommonResourcePath", "CDInfo", "ModelInfo", "PkgInfo", "ContainedModel",
                           "Model", "VenderName", "SystemMax", "WLANtool"}) {
-    wrongTypes += key + number;
+    wrongTypes.append(key).append(number);
   }
   wrongTypes += "last</key><true/></dict></plist>";
   for (const std::string& file :
@@ -153,7 +153,7 @@ TEST_F(StartUp, ComesUpWhateverTheMediumLacks) {
         std::string("MacResources/ModelInfo.plist"), information, std::string(kEnglishTexts)}) {
     for (const std::string& content :
          {missing, head, std::string("<plist version=\"1.0\"><array/></plist>"), wrongTypes}) {
-      SCOPED_TRACE(file + ": " + content);
+      SCOPED_TRACE(testing::Message() << file << ": " << content);
       screen.reset();
       medium.write(information, Dictionary{{"CommonResourcePath", "MacResources/Common.plist"}});
       describeTwoModels();
