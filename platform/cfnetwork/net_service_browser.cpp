@@ -1,5 +1,6 @@
 #include <CoreServices/CoreServices.h>
 
+#include <chrono>
 #include <memory>
 #include <utility>
 #include <vector>
@@ -13,7 +14,7 @@ namespace onramp {
 namespace {
 
 // An error that comes at once must not keep the processor busy.
-constexpr double kRetryPause = 1;  // seconds
+constexpr std::chrono::seconds kRetryPause{1};
 
 using corefoundation::Reference;
 using corefoundation::toCFString;
@@ -90,8 +91,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     self->client_(self, flags, service, {}, self->info_);
   }
 
-  // The responder has gone, say. What was found is found again once it is back. Stopping a search
-  // may bring an error in its turn, which says nothing new.
+  // The responder may have gone away, for instance. The next search finds all services again, so
+  // they are reported as gone. Stopping a search may cause another error, which is ignored.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;
     isFailed_ = true;
@@ -121,7 +122,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Reference<CFStringRef> type_;
   std::vector<NetServiceRef> found_;
   unsigned long search_ = 0;  ///< tells this search's retry from a late one of an earlier one
-  bool isFailed_ = false;     ///< waits to be tried again
+  bool isFailed_ = false;     ///< the next try is pending
 };
 
 }  // namespace
