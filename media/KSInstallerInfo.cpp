@@ -1,8 +1,6 @@
 #include "media/KSInstallerInfo.h"
 
 #include <array>
-#include <cstdint>
-#include <string_view>
 
 #include "media/medium.h"
 #include "platform/system_version.h"
@@ -11,8 +9,15 @@ namespace onramp {
 
 namespace {
 
-// The key of the package for a system version, which is in binary-coded decimal; nothing when
-// versions like it have no key.
+std::optional<std::string> packageName(const Dictionary& pkg) {
+  // An entry of another type names no package either, but it still takes precedence.
+  if (pkg.find("PkgName")) return pkg.string("PkgName");
+  const auto key = packageKey(gestaltSystemVersion().value_or(0));
+  return key ? pkg.string(*key) : std::nullopt;
+}
+
+}  // namespace
+
 std::optional<std::string_view> packageKey(std::int32_t version) {
   struct Rule {
     std::int32_t atLeast;
@@ -30,15 +35,6 @@ std::optional<std::string_view> packageKey(std::int32_t version) {
   }
   return std::nullopt;
 }
-
-std::optional<std::string> packageName(const Dictionary& pkg) {
-  // An entry of another type names no package either, but it still takes precedence.
-  if (pkg.find("PkgName")) return pkg.string("PkgName");
-  const auto key = packageKey(gestaltSystemVersion().value_or(0));
-  return key ? pkg.string(*key) : std::nullopt;
-}
-
-}  // namespace
 
 KSInstallerInfo::KSInstallerInfo() {
   setCDCommonInfoValue(medium::loadResourceDictionary());

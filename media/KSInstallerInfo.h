@@ -1,7 +1,9 @@
 #pragma once
 
+#include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 
 #include "base/value.h"
 
@@ -12,6 +14,10 @@ struct FileURL {
   std::string path;
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
+
+/// Returns the key in "PkgInfo" of the package for a system version in binary-coded decimal, or
+/// nothing when versions like it have no key. "PkgName" takes precedence over these keys.
+[[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
 /// The places of the installer package and the wireless set-up tool on the medium, and the systems
 /// that the medium supports. The constructor reads the medium; nothing is read afterwards.

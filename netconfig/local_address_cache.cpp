@@ -33,7 +33,7 @@ void AddNetworkInterfaceListChangeCallbackSCF() {
                                                            kSCCompAnyRegex, kSCEntNetIPv4)) {
     setNotificationKeys(store, {}, {*pattern});
   }
-  // Whether or not the steps before have come to anything: the source may well be null.
+  // Unconditionally: a null source is accepted.
   addSourceToMainLoop(createRunLoopSource(store, 0));
 }
 

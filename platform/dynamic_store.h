@@ -9,10 +9,10 @@
 
 #include "base/value.h"
 
-/// The system's dynamic configuration store: what the computer's network is at this moment, as
-/// dictionaries under keys such as "State:/Network/Interface/en0/IPv4". Every operation stands for
-/// one of the SystemConfiguration framework's, which is one of the backends; the other fills the
-/// same keys from the Linux kernel.
+/// The system's dynamic configuration store: the computer's present network, as dictionaries under
+/// keys such as "State:/Network/Interface/en0/IPv4". Every operation stands for one of the
+/// SystemConfiguration framework, which is one backend; the other fills the same keys from the Linux
+/// kernel.
 ///
 /// Of the store's contents two kinds of entry are promised, both in the state domain:
 /// - an interface's IPv4 entity, for every interface that is up, can pass traffic (has its carrier,

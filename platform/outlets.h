@@ -10,7 +10,7 @@ namespace onramp {
 
 class ArrayController;
 
-/// What a handle stands for; only the linked front end knows what it is.
+/// The object behind a handle; only the linked front end knows its type.
 struct NativeObject;
 
 enum class OutletKind {
@@ -27,9 +27,10 @@ enum class OutletKind {
   kMenuItem,
 };
 
-/// A handle on an object of the user interface that the front end owns. Copies stand for the same
-/// object. An empty handle takes every request and does nothing, and so does a handle whose object
-/// is gone from an interface file: a page works as far as its file goes. Main thread only.
+/// A handle on an object of the user interface that the front end owns. Copies refer to the same
+/// object. An empty handle accepts every request and does nothing. The handle of an object that is
+/// missing from the interface file is empty, so a page works with whatever its file has. Main
+/// thread only.
 class Outlet {
  public:
   Outlet() = default;
@@ -54,10 +55,10 @@ class View : public Outlet {
   /// The first of the views inside this one; empty when there is none.
   [[nodiscard]] View firstSubview() const;
 
-  /// Puts `view` inside this one, filling it, and shows it. Its owner stays its owner.
+  /// Puts `view` inside this one, filling it, and shows it. The owner of `view` does not change.
   void addSubview(const View& view) const;
 
-  /// Takes this view out of the one that it is in; its owner keeps it.
+  /// Removes this view from the one that it is in. Its owner does not change.
   void removeFromSuperview() const;
 };
 
@@ -77,8 +78,8 @@ class TextField : public View {
   void setStringValue(const std::string& text) const;
 };
 
-/// A push button. Its title comes by binding, its click goes to the owner, both by the interface
-/// file.
+/// A push button. The interface file binds its title and names the owner's action that a click
+/// performs.
 class Button : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kButton;
@@ -116,12 +117,12 @@ class ImageView : public View {
   static constexpr OutletKind kKind = OutletKind::kImageView;
   using View::View;
 
-  /// A file that is missing or no image leaves the view empty.
+  /// A file that is missing or is not an image leaves the view empty.
   void setImage(const Image& image) const;
   void setImageScaling(ImageScaling scaling) const;
 };
 
-/// A spinner without a measure of how far things are.
+/// A spinner that does not show how much is done.
 class ProgressIndicator : public View {
  public:
   static constexpr OutletKind kKind = OutletKind::kProgressIndicator;
@@ -138,8 +139,8 @@ class TableView : public Control {
   static constexpr OutletKind kKind = OutletKind::kTableView;
   using Control::Control;
 
-  /// Shows the controller's entries and keeps both selections the same. `controller` has to outlive
-  /// the table, or another bind().
+  /// Shows the controller's entries and keeps both selections the same. `controller` must exist
+  /// until the table is destroyed or bound again.
   void bind(ArrayController& controller) const;
 
   void setAllowsColumnReordering(bool allows) const;
@@ -156,6 +157,9 @@ class PopUpButton : public Control {
 
   [[nodiscard]] std::size_t numberOfItems() const;
   void removeItem(std::size_t index) const;
+
+  /// Adds a command to the end of the menu. When the user chooses it, `action` runs on the main
+  /// thread after the menu has closed, so it may run a modal loop.
   void addItem(const std::string& title, std::function<void()> action) const;
 };
 
@@ -172,7 +176,7 @@ class Window : public Outlet {
   void orderFront() const;
   void makeKeyAndOrderFront() const;
 
-  /// Takes the window off the screen without asking anybody.
+  /// Takes the window off the screen without asking windowShouldClose().
   void close() const;
 };
 

@@ -1,5 +1,5 @@
-// Encodes the request for ActiveIF and decodes its reply, with this codec and with net-snmp's
-// library in turns, and prints times, ratios and allocations of one message.
+// Encodes the request for ActiveIF and decodes its reply, in turns with this codec and net-snmp's
+// library. Prints the time for one message, the ratio and the allocations.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -19,7 +19,7 @@ long allocations = 0;
 
 }  // namespace
 
-// Every allocation of the process, those inside the library included, passes through here.
+// Counts every allocation of the process, including those inside the library.
 extern "C" {
 // The C library's names.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
@@ -101,7 +101,7 @@ class NetSnmp {
     snmp_free_pdu(pdu);
   }
 
-  /// Built from the buffer's end towards its start.
+  /// net-snmp, too, builds from the buffer's end.
   [[nodiscard]] std::span<const std::uint8_t> request() const {
     return std::span(buffer_).last(offset_);
   }

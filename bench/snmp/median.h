@@ -4,10 +4,10 @@
 #include <chrono>
 #include <vector>
 
-/// The nanoseconds of repeated measurements of one thing.
+/// Repeated measurements of one thing, in nanoseconds.
 class Samples {
  public:
-  /// Runs `work` `times` times in a row and keeps the mean as one sample.
+  /// Runs `work` `times` times and keeps the mean as one sample.
   template <typename Work>
   void measure(int times, Work work) {
     const auto start = std::chrono::steady_clock::now();
@@ -19,7 +19,7 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// The value that the given part of the samples, 0 to 1, stays below.
+  /// Returns the value below which the given part of the samples lies; `part` is from 0 to 1.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());

@@ -1,5 +1,5 @@
-// One whole query, from the request to the result, beside the bare exchange of the same bytes with
-// the same agent, in turns.
+// Compares a whole query, from the request to the result, with the bare exchange of the same bytes
+// with the same agent, in turns.
 
 #include <array>
 #include <cstdio>

@@ -1,29 +1,26 @@
 #pragma once
 
-#include <avahi-client/client.h>
-#include <avahi-client/lookup.h>
-#include <avahi-common/simple-watch.h>
-#include <avahi-common/strlst.h>
+#include <systemd/sd-bus.h>
+#include <systemd/sd-event.h>
 
 #include <memory>
 
 namespace onramp::avahi {
 
-template <auto free>
-struct FreedBy {
+template <auto release>
+struct ReleasedBy {
   template <typename Object>
   void operator()(Object* object) const {
-    free(object);
+    release(object);
   }
 };
 
-template <typename Object, auto free>
-using Handle = std::unique_ptr<Object, FreedBy<free>>;
+template <typename Object, auto release>
+using Handle = std::unique_ptr<Object, ReleasedBy<release>>;
 
-using PollHandle = Handle<AvahiSimplePoll, avahi_simple_poll_free>;
-using ClientHandle = Handle<AvahiClient, avahi_client_free>;
-using ServiceBrowserHandle = Handle<AvahiServiceBrowser, avahi_service_browser_free>;
-using ServiceResolverHandle = Handle<AvahiServiceResolver, avahi_service_resolver_free>;
-using StringListHandle = Handle<AvahiStringList, avahi_string_list_free>;
+using EventLoop = Handle<sd_event, sd_event_unref>;
+using EventSource = Handle<sd_event_source, sd_event_source_disable_unref>;
+using Bus = Handle<sd_bus, sd_bus_close_unref>;
+using Message = Handle<sd_bus_message, sd_bus_message_unref>;
 
 }  // namespace onramp::avahi

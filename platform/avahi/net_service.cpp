@@ -1,15 +1,11 @@
 #include "platform/avahi/net_service.h"
 
-#include <avahi-common/domain.h>
-
 #include <algorithm>
 #include <chrono>
-#include <future>
 #include <utility>
 
-#include "platform/avahi/names.h"
-#include "platform/avahi/resolve_job.h"
-#include "platform/avahi/responder.h"
+#include "platform/avahi/daemon.h"
+#include "platform/avahi/resolve.h"
 #include "platform/run_loop.h"
 
 namespace onramp {
@@ -27,15 +23,15 @@ std::optional<std::chrono::milliseconds> timeLimitOf(double seconds) {
 
 class Service final : public NetService, public std::enable_shared_from_this<Service> {
  public:
-  explicit Service(Sighting sighting) : sighting_(std::move(sighting)) {}
+  explicit Service(Instance instance) : instance_(std::move(instance)) {}
   Service(const Service&) = delete;
   Service& operator=(const Service&) = delete;
   ~Service() override { Service::cancel(); }
 
-  [[nodiscard]] std::optional<std::string> name() const override { return sighting_.name; }
-  [[nodiscard]] std::optional<std::string> type() const override { return sighting_.type + '.'; }
+  [[nodiscard]] std::optional<std::string> name() const override { return instance_.name; }
+  [[nodiscard]] std::optional<std::string> type() const override { return instance_.type + '.'; }
   [[nodiscard]] std::optional<std::string> domain() const override {
-    return sighting_.domain + '.';
+    return instance_.domain + '.';
   }
   [[nodiscard]] std::vector<Data> addressing() const override { return addressing_; }
   [[nodiscard]] std::optional<Data> txtData() const override { return txt_; }
@@ -44,59 +40,67 @@ class Service final : public NetService, public std::enable_shared_from_this<Ser
     client_ = client;
     info_ = info;
   }
-  void schedule() override { scheduled_ = true; }
-  void unschedule() override { scheduled_ = false; }
+  void schedule() override { isScheduled_ = true; }
+  void unschedule() override { isScheduled_ = false; }
 
   bool resolveWithTimeout(double seconds) override;
   void cancel() override {
-    if (job_) responder_->remove(std::exchange(job_, nullptr));
+    resolve_.reset();
+    daemon_.reset();
   }
 
  private:
+  using TimeLimit = std::optional<std::chrono::milliseconds>;
+
+  bool startResolve(TimeLimit timeLimit);
+  bool resolveNow(TimeLimit timeLimit);
   void ended(unsigned long resolve, std::optional<Resolution> resolution);
   bool keep(std::optional<Resolution> resolution);
 
-  Sighting sighting_;
+  Instance instance_;
   std::vector<Data> addressing_;
   std::optional<Data> txt_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  bool scheduled_ = false;
-  std::shared_ptr<Responder> responder_ = Responder::shared();
-  std::shared_ptr<ResolveJob> job_;
-  unsigned long resolve_ = 0;  ///< tells the end of this resolve from a late one of an earlier one
+  bool isScheduled_ = false;
+  std::shared_ptr<Daemon> daemon_;  ///< held while a resolve runs
+  std::unique_ptr<Resolve> resolve_;
+  unsigned long resolves_ = 0;  ///< tells the end of this resolve from a late one of an earlier one
 };
 
 bool Service::resolveWithTimeout(double seconds) {
-  const bool possible = !job_ && avahi_is_valid_service_name(sighting_.name.c_str()) &&
-                        avahi_is_valid_service_type_strict(sighting_.type.c_str()) &&
-                        avahi_is_valid_domain_name(sighting_.domain.c_str());
-  if (!possible) return false;
-  const auto timeLimit = timeLimitOf(seconds);
+  if (resolve_) return false;
+  addressing_.clear();
+  txt_.reset();
+  return client_ ? startResolve(timeLimitOf(seconds)) : resolveNow(timeLimitOf(seconds));
+}
 
-  if (!client_) {
-    const auto answer = std::make_shared<std::promise<std::optional<Resolution>>>();
-    const auto job = std::make_shared<ResolveJob>(sighting_, timeLimit, [answer](auto resolution) {
-      answer->set_value(std::move(resolution));
+// The client is called from the main loop and not from within the daemon's, so that it may end
+// whatever it likes, and so that one that takes long delays no other service's resolve.
+bool Service::startResolve(TimeLimit timeLimit) {
+  daemon_ = Daemon::shared();
+  if (!daemon_) return false;
+  const auto report = [weak = weak_from_this(), number = ++resolves_](auto resolution) {
+    performOnMainThread([weak, number, resolution = std::move(resolution)] {
+      if (const auto service = weak.lock()) service->ended(number, resolution);
     });
-    responder_->add(job);
-    auto future = answer->get_future();
-    // The job's own limit does not hold while the daemon hangs.
-    if (timeLimit && future.wait_for(*timeLimit) != std::future_status::ready) {
-      responder_->remove(job);
-      return false;
-    }
-    return keep(future.get());
-  }
-
-  job_ = std::make_shared<ResolveJob>(
-      sighting_, timeLimit, [weak = weak_from_this(), resolve = ++resolve_](auto resolution) {
-        performOnMainThread([weak, resolve, resolution = std::move(resolution)] {
-          if (const auto service = weak.lock()) service->ended(resolve, resolution);
-        });
-      });
-  responder_->add(job_);
+  };
+  resolve_ = std::make_unique<Resolve>(*daemon_, instance_, timeLimit, report);
   return true;
+}
+
+// A connection to the daemon for this resolve alone: events for others wait meanwhile.
+bool Service::resolveNow(TimeLimit timeLimit) {
+  const auto daemon = Daemon::create();
+  if (!daemon) return false;
+  bool hasEnded = false;
+  std::optional<Resolution> found;
+  const Resolve resolve(*daemon, instance_, timeLimit, [&](auto resolution) {
+    found = std::move(resolution);
+    hasEnded = true;
+  });
+  daemon->runUntil([&] { return hasEnded || resolve.isRefused(); });
+  return keep(std::move(found));
 }
 
 bool Service::keep(std::optional<Resolution> resolution) {
@@ -107,16 +111,16 @@ bool Service::keep(std::optional<Resolution> resolution) {
 }
 
 void Service::ended(unsigned long resolve, std::optional<Resolution> resolution) {
-  if (!job_ || resolve != resolve_) return;
-  job_.reset();
+  if (!resolve_ || resolve != resolves_) return;
+  cancel();
   const NetServiceError error{keep(std::move(resolution)) ? 0 : kNetServiceErrorTimeout};
-  if (scheduled_ && client_) client_(shared_from_this(), error, info_);
+  if (isScheduled_ && client_) client_(shared_from_this(), error, info_);
 }
 
 }  // namespace
 
-NetServiceRef makeService(Sighting sighting) {
-  return std::make_shared<Service>(std::move(sighting));
+NetServiceRef makeService(Instance instance) {
+  return std::make_shared<Service>(std::move(instance));
 }
 
 }  // namespace avahi
@@ -124,8 +128,7 @@ NetServiceRef makeService(Sighting sighting) {
 NetServiceRef NetService::create(const std::string& domain, const std::string& type,
                                  const std::string& name, std::int32_t) {
   using avahi::withoutClosingDot;
-  return avahi::makeService({AVAHI_IF_UNSPEC, AVAHI_PROTO_UNSPEC, name, withoutClosingDot(type),
-                             withoutClosingDot(domain)});
+  return avahi::makeService({name, withoutClosingDot(type), withoutClosingDot(domain)});
 }
 
 }  // namespace onramp

@@ -1,13 +1,13 @@
-#include <avahi-common/domain.h>
-
 #include <map>
 #include <memory>
 #include <utility>
 
-#include "platform/avahi/browse_job.h"
-#include "platform/avahi/names.h"
+#include "platform/avahi/daemon.h"
 #include "platform/avahi/net_service.h"
-#include "platform/avahi/responder.h"
+#include "platform/avahi/query.h"
+#include "platform/avahi/records.h"
+#include "platform/avahi/sighting_watch.h"
+#include "platform/avahi/sightings.h"
 #include "platform/net_service.h"
 #include "platform/run_loop.h"
 
@@ -17,6 +17,9 @@ namespace avahi {
 
 namespace {
 
+constexpr const char* kLocalDomain = "local";
+constexpr int kDomainsToBrowse = 0;  // the daemon's number for this use of a domain browser
+
 class Browser final : public NetServiceBrowser, public std::enable_shared_from_this<Browser> {
  public:
   Browser(Client client, void* info) : client_(client), info_(info) {}
@@ -24,75 +27,148 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   Browser& operator=(const Browser&) = delete;
   ~Browser() override { Browser::stopSearch(); }
 
-  void schedule() override { scheduled_ = true; }
-  void unschedule() override { scheduled_ = false; }
+  void schedule() override { isScheduled_ = true; }
+  void unschedule() override { isScheduled_ = false; }
   bool searchForServices(const std::string& domain, const std::string& type) override;
   void invalidate() override {
     client_ = nullptr;
     stopSearch();
   }
-  void stopSearch() override {
-    if (!job_) return;
-    responder_->remove(std::exchange(job_, nullptr));
-    services_.clear();
-    ++search_;
-  }
+  void stopSearch() override;
 
  private:
-  void happened(unsigned long search, BrowseEvent event, const Sighting& sighting);
+  /// What is seen in one domain.
+  struct Browse {
+    Sightings<Instance> sightings;
+    std::unique_ptr<Query> query;
+  };
+
+  void browse(const std::string& domain);
+  void domainEvent(Query::Event event, sd_bus_message* message);
+  void serviceEvent(Browse& browse, Query::Event event, sd_bus_message* message);
+  void leave(const std::string& domain);
+  void found(const Instance& instance);
+  void gone(const Instance& instance);
   void tell(unsigned long flags, const NetServiceRef& service);
 
   Client client_;
   void* info_;
-  bool scheduled_ = false;
-  std::shared_ptr<Responder> responder_ = Responder::shared();
-  std::shared_ptr<BrowseJob> job_;
-  unsigned long search_ = 0;  ///< tells events of this search from late ones of an earlier one
-  // What was told of, so that a removal comes with the same object.
-  std::map<Sighting, NetServiceRef> services_;
+  bool isScheduled_ = false;
+  unsigned long search_ = 0;  ///< tells this search's events from late ones of an earlier one
+  std::string type_;
+  std::map<Instance, NetServiceRef> services_;  ///< so that a removal comes with the same object
+  std::shared_ptr<Daemon> daemon_;              ///< held while a search runs
+  std::map<std::string, Browse> browses_;       ///< by domain
+  Sightings<std::string> domains_;
+  std::unique_ptr<Query> domainQuery_;
 };
 
+// The domain browser names the domains that computer or network are configured for; it leaves out
+// the local one.
 bool Browser::searchForServices(const std::string& domain, const std::string& type) {
-  const std::string bareType = withoutClosingDot(type);
-  const std::string bareDomain = withoutClosingDot(domain);
-  const bool possible = client_ && !job_ && avahi_is_valid_service_type_generic(bareType.c_str()) &&
-                        avahi_is_valid_domain_name(bareDomain.c_str());
-  if (!possible) return false;
-  job_ = std::make_shared<BrowseJob>(
-      bareType, bareDomain,
-      [weak = weak_from_this(), search = search_](BrowseEvent event, const Sighting& sighting) {
-        performOnMainThread([weak, search, event, sighting] {
-          if (const auto browser = weak.lock()) browser->happened(search, event, sighting);
-        });
-      });
-  responder_->add(job_);
+  if (!client_ || daemon_) return false;
+  daemon_ = Daemon::shared();
+  if (!daemon_) return false;
+  type_ = withoutClosingDot(type);
+  browse(domain.empty() ? kLocalDomain : withoutClosingDot(domain));
+  if (!domain.empty()) return true;
+  domainQuery_ = std::make_unique<Query>(
+      *daemon_, "DomainBrowser",
+      [](sd_bus_message* call) {
+        return sd_bus_message_append(call, "iisiu", kAnyInterface, kAnyProtocol, "",
+                                     kDomainsToBrowse, 0U);
+      },
+      [this](Query::Event event, sd_bus_message* message) { domainEvent(event, message); });
   return true;
 }
 
-void Browser::happened(unsigned long search, BrowseEvent event, const Sighting& sighting) {
-  if (search != search_) return;
-  switch (event) {
-    case BrowseEvent::kFound:
-      if (const auto [entry, isNew] = services_.try_emplace(sighting); isNew) {
-        const NetServiceRef service = entry->second = makeService(sighting);
-        tell(0, service);
-      }
-      break;
-    case BrowseEvent::kGone:
-      if (const auto node = services_.extract(sighting)) tell(kNetServiceFlagRemove, node.mapped());
-      break;
-    case BrowseEvent::kAllGone:
-      // Whoever is told may end this search.
-      while (search == search_ && !services_.empty()) {
-        const auto node = services_.extract(services_.begin());
-        tell(kNetServiceFlagRemove, node.mapped());
-      }
-      break;
-  }
+void Browser::stopSearch() {
+  ++search_;
+  domainQuery_.reset();
+  domains_.clear();
+  browses_.clear();
+  services_.clear();
+  daemon_.reset();
 }
 
+void Browser::browse(const std::string& domain) {
+  const auto [entry, isNew] = browses_.try_emplace(domain);
+  if (!isNew) return;
+  Browse& browse = entry->second;
+  browse.query = std::make_unique<Query>(
+      *daemon_, "ServiceBrowser",
+      [type = type_, domain](sd_bus_message* call) {
+        return sd_bus_message_append(call, "iissu", kAnyInterface, kAnyProtocol, type.c_str(),
+                                     domain.c_str(), 0U);
+      },
+      [this, &browse](Query::Event event, sd_bus_message* message) {
+        serviceEvent(browse, event, message);
+      });
+}
+
+void Browser::leave(const std::string& domain) {
+  const auto browse = browses_.find(domain);
+  if (browse == browses_.end() || domain == kLocalDomain) return;
+  for (const Instance& instance : browse->second.sightings.clear())
+    gone(instance);
+  browses_.erase(browse);
+}
+
+void Browser::domainEvent(Query::Event event, sd_bus_message* message) {
+  if (event == Query::Event::kCacheExhausted) return;
+  if (event == Query::Event::kLost) {
+    for (const std::string& domain : domains_.clear())
+      leave(domain);
+    return;
+  }
+  Place place;
+  const char* domain = nullptr;
+  if (sd_bus_message_read(message, "iis", &place.first, &place.second, &domain) <= 0) return;
+  if (event == Query::Event::kFound && domains_.add(domain, place)) browse(domain);
+  if (event == Query::Event::kGone && domains_.remove(domain, place)) leave(domain);
+}
+
+void Browser::serviceEvent(Browse& browse, Query::Event event, sd_bus_message* message) {
+  if (event == Query::Event::kCacheExhausted) return;
+  if (event == Query::Event::kLost) {
+    for (const Instance& instance : browse.sightings.clear())
+      gone(instance);
+    return;
+  }
+  Place place;
+  const char* name = nullptr;
+  const char* type = nullptr;
+  const char* domain = nullptr;
+  if (sd_bus_message_read(message, "iisss", &place.first, &place.second, &name, &type, &domain) <=
+      0) {
+    return;
+  }
+  const Instance instance{name, type, domain};
+  tellSighting(instance, place, event == Query::Event::kGone);
+  if (event == Query::Event::kFound && browse.sightings.add(instance, place)) found(instance);
+  if (event == Query::Event::kGone && browse.sightings.remove(instance, place)) gone(instance);
+}
+
+void Browser::found(const Instance& instance) {
+  const NetServiceRef service = makeService(instance);
+  services_[instance] = service;
+  tell(0, service);
+}
+
+void Browser::gone(const Instance& instance) {
+  if (const auto node = services_.extract(instance)) tell(kNetServiceFlagRemove, node.mapped());
+}
+
+// The client is called from the main loop and not from within the daemon's, so that it may end
+// whatever it likes, and so that one that takes long delays no resolve.
 void Browser::tell(unsigned long flags, const NetServiceRef& service) {
-  if (client_ && scheduled_) client_(shared_from_this(), flags, service, {}, info_);
+  performOnMainThread([weak = weak_from_this(), search = search_, flags, service] {
+    const auto browser = weak.lock();
+    if (!browser || search != browser->search_ || !browser->client_ || !browser->isScheduled_) {
+      return;
+    }
+    browser->client_(browser, flags, service, {}, browser->info_);
+  });
 }
 
 }  // namespace

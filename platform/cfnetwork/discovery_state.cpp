@@ -7,4 +7,6 @@ std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }
 
+void watchSightings(std::function<void(const ServiceSighting&)>) {}
+
 }  // namespace onramp

@@ -14,7 +14,7 @@ namespace onramp {
 
 namespace {
 
-// An octal escape names a character of the NEXTSTEP set, whose lower half is ASCII.
+// Octal escapes name characters of the NEXTSTEP character set, whose lower half is ASCII.
 constexpr std::array<char16_t, 128> kNextStepUpperHalf = {
     0x00A0, 0x00C0, 0x00C1, 0x00C2, 0x00C3, 0x00C4, 0x00C5, 0x00C7, 0x00C8, 0x00C9, 0x00CA, 0x00CB,
     0x00CC, 0x00CD, 0x00CE, 0x00CF, 0x00D0, 0x00D1, 0x00D2, 0x00D3, 0x00D4, 0x00D5, 0x00D6, 0x00D9,
@@ -54,7 +54,7 @@ class Parser {
     if (braces && !take('}')) refuse("\"}\" expected", lastEnd_);
     if (!skipBlanks() || !rest_.empty()) refuse("a \"}\" that closes nothing", at());
     if (!problem_.reason.empty()) return std::nullopt;
-    std::reverse(pairs.begin(), pairs.end());  // of equal keys a dictionary keeps the first
+    std::reverse(pairs.begin(), pairs.end());  // a dictionary keeps the first of equal keys
     return Dictionary(std::move(pairs));
   }
 
@@ -81,7 +81,7 @@ class Parser {
            refuse(hasText ? "\";\" expected" : "\"=\" or \";\" expected", lastEnd_);
   }
 
-  // Past blanks and comments; false when a comment does not end.
+  // Skips blanks and comments. False when a comment does not end.
   bool skipBlanks() {
     for (;;) {
       rest_.remove_prefix(std::min(rest_.find_first_not_of(" \t\n\v\f\r"), rest_.size()));
@@ -157,7 +157,7 @@ class Parser {
     return true;
   }
 
-  // Up to three digits.
+  // A code of up to three digits.
   char32_t octal() {
     char32_t code = 0;
     for (int i = 0; i < 3 && !rest_.empty() && isOctal(rest_.front()); ++i) {
@@ -168,7 +168,7 @@ class Parser {
     return code < 0x80 ? code : kNextStepUpperHalf[code - 0x80];
   }
 
-  // One UTF-16 unit of up to four digits, or two that belong together.
+  // The character of one UTF-16 unit of up to four digits, or of two that form a pair.
   char32_t unicode() {
     const char32_t first = unit();
     if (!isLeadSurrogate(first) || !rest_.starts_with("\\U")) return first;
@@ -194,7 +194,7 @@ class Parser {
   std::string_view text_;
   std::string_view rest_;
   ParseProblem& problem_;
-  std::size_t lastEnd_ = 0;  ///< of the last key or text: where what should follow it is missing
+  std::size_t lastEnd_ = 0;  ///< of the last key or text, for reporting what is missing after it
 };
 
 }  // namespace

@@ -28,7 +28,8 @@ enum Kind : std::uint64_t {
   kDictionary = 0xD,
 };
 
-// What an object comes to with everything that it refers to, each reference counted anew.
+// What an object costs with everything that it refers to; a shared object counts at every
+// reference.
 struct Cost {
   std::uint64_t objects = 1;
   std::uint64_t bytes = 0;
@@ -101,14 +102,14 @@ class BinaryWalk {
     Cost cost;
   };
 
-  // Over the object and all that follows it; empty when its offset lies outside the file.
+  // A reader of the object and everything after it; empty when its offset lies outside the file.
   [[nodiscard]] ByteReader objectAt(std::size_t index) const {
     const std::uint64_t offset = offsets_[index];
     return ByteReader(objects_.substr(std::min<std::uint64_t>(offset, objects_.size())));
   }
 
-  // Fills in the object's cost; false when the object is not to be built. Recursion ends at the
-  // depth limit.
+  // Works out the object's cost. False when the object must not be built. The depth limit ends the
+  // recursion.
   bool visit(std::size_t index, std::size_t depth) {
     State& state = states_[index];
     if (state.progress == Progress::kOpen) {
@@ -157,7 +158,7 @@ class BinaryWalk {
     }
   }
 
-  // The count of a container's items or of a text's units; an impossible one when it is malformed.
+  // The number of a container's items or of a text's units; an impossible one when it is malformed.
   static std::uint64_t count(std::uint64_t low, ByteReader& object) {
     if (low < 0xF) return low;
     const std::uint64_t marker = object.number(1).value_or(0);
@@ -172,7 +173,7 @@ class BinaryWalk {
     return object.skip(cost.bytes);
   }
 
-  // libplist ends the process at a key with a null character in it.
+  // A key that contains a null character makes libplist end the process.
   static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
     ByteReader text = object;
     if (!measureBytes(units, 2, object, cost)) return false;

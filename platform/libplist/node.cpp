@@ -16,7 +16,7 @@ namespace onramp::libplist {
 namespace {
 
 struct Free {
-  // libplist hands out memory of malloc.
+  // libplist allocates with malloc().
   // NOLINTNEXTLINE(cppcoreguidelines-no-malloc,cppcoreguidelines-owning-memory)
   void operator()(void* memory) const { std::free(memory); }
 };
@@ -24,8 +24,9 @@ struct Free {
 template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
-// Through its own functions libplist tells -1 from 2^64-1 in neither direction and cuts dates to 32
-// bits. A binary list of just that one object does both; these are its objects' first bytes.
+// libplist's functions for numbers do not distinguish -1 from 2^64-1, and those for dates keep 32
+// bits. A binary list that holds only that object keeps everything; these are the objects' first
+// bytes.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;
@@ -49,7 +50,7 @@ Node nodeOfObject(const std::string& object) {
   return Node(node);
 }
 
-// The one object of the binary list made of `node`, from its first byte on.
+// The bytes of `node` in a binary list that holds nothing else.
 std::string objectOf(plist_t node) {
   char* bytes = nullptr;
   std::uint32_t size = 0;
@@ -117,7 +118,7 @@ Value dictionaryOf(plist_t node) {
   return Dictionary(std::move(pairs));
 }
 
-// XML 1.0 has no place for control characters, not even as references.
+// XML 1.0 does not allow control characters, not even as references.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());

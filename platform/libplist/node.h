@@ -16,13 +16,12 @@ struct NodeFree {
 /// A libplist node with everything below it.
 using Node = std::unique_ptr<std::remove_pointer_t<plist_t>, NodeFree>;
 
-/// The value that `node` stands for. A UID becomes what an XML list has in its place: a dictionary
-/// with the one key "CF$UID".
+/// The value of `node`. A UID becomes what an XML list has for it: a dictionary whose only key is
+/// "CF$UID".
 [[nodiscard]] Value valueOf(plist_t node);
 
-/// A node for `value`, fit for writing: what XML has no way to say is put into the nearest form
-/// that it has. Characters that may not stand in XML become the replacement character, and dates
-/// are kept within the years 1 to 9999.
+/// A node for `value`, in a form that XML can express: characters that XML does not allow become
+/// the replacement character, and dates are limited to the years 1 to 9999.
 [[nodiscard]] Node nodeOf(const Value& value);
 
 }  // namespace onramp::libplist

@@ -16,8 +16,8 @@ namespace onramp::libplist {
 
 namespace {
 
-// libplist reads and writes real numbers by the thread's locale, which for a desktop program is the
-// user's and may have a decimal comma.
+// libplist reads and writes real numbers in the thread's locale. In a desktop program that is the
+// user's locale, which may have a decimal comma.
 class PlainNumbers {
  public:
   PlainNumbers() : plain_(newlocale(LC_ALL_MASK, "C", nullptr)), before_(uselocale(plain_)) {}
@@ -37,7 +37,7 @@ struct XMLFree {
   void operator()(char* text) const { plist_to_xml_free(text); }
 };
 
-// An XML reader takes a bare carriage return for a line's end.
+// An XML reader turns a bare carriage return into a line feed, but not a reference to one.
 void referToCarriageReturns(std::string& xml) {
   for (std::size_t at = xml.find('\r'); at != std::string::npos; at = xml.find('\r', at))
     xml.replace(at, 1, "&#13;");
@@ -69,12 +69,11 @@ std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem)
   } else {
     std::optional<std::string> text = decodedText(bytes);
     if (!text) problem.note("characters that are neither UTF-8 nor UTF-16", 0);
-    if (!text || !mayReadXML(*text, problem)) return std::nullopt;
-    const std::string& xml = *text;
-    plist_from_xml(xml.c_str(), static_cast<std::uint32_t>(xml.size()), &root);
+    const auto xml = text ? admittedXML(std::move(*text), problem) : std::nullopt;
+    if (!xml) return std::nullopt;
+    plist_from_xml(xml->c_str(), static_cast<std::uint32_t>(xml->size()), &root);
   }
   const Node node(root);
-  if (!node) problem.note("no property list", 0);
   return node ? std::optional(valueOf(node.get())) : std::nullopt;
 }
 

@@ -8,9 +8,9 @@
 
 namespace onramp::libplist {
 
-/// The value that a file's bytes hold as an XML (UTF-8 or UTF-16) or binary property list; nothing
-/// when they hold none or go past the limits. The second form tells why; for markup that passes the
-/// limits' check but not libplist, that is all it knows.
+/// The value in the bytes of an XML (UTF-8 or UTF-16) or binary property list; nothing when they
+/// hold none or exceed the limits. The second form says why. It cannot say where libplist itself
+/// failed.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 

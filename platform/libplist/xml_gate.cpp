@@ -14,14 +14,14 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// Steps that libplist may spend where its time grows with a square: on the keys of a dictionary (it
-// hashes them into a fixed number of chains) and on the entities of a text (it moves the rest of
-// the text up at each).
+// The limit on steps where libplist takes quadratic time: on the keys of a dictionary, which it
+// hashes into a fixed number of chains, and on the entities of a text, where it moves the rest of
+// the text at each one.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
-class XmlWalk {
+class XMLWalk {
  public:
-  XmlWalk(std::string& text, ParseProblem& problem) : text_(text), problem_(problem) {}
+  XMLWalk(std::string& text, ParseProblem& problem) : text_(text), problem_(problem) {}
 
   bool run() {
     if (const std::size_t null = text_.find('\0'); null != kNone) {
@@ -67,7 +67,8 @@ class XmlWalk {
     return skipPast(">", 9) && quotesArePaired("[");
   }
 
-  // Past the next `end`, from `from` characters on; the markup skipped is then `skipped_`.
+  // Moves past the next `end`, looking from `from` characters ahead, and leaves the markup in
+  // between in `skipped_`.
   bool skipPast(std::string_view end, std::size_t from) {
     const std::size_t found = text_.find(end, at_ + from);
     if (found == kNone) {
@@ -79,7 +80,8 @@ class XmlWalk {
     return true;
   }
 
-  // Then the end found is no part of a quoted text. None of `refused` may stand in the markup.
+  // True when the `end` that skipPast() found is not inside a quoted text, and none of the
+  // characters in `refused` is in the markup.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
       return refuse("markup with a quotation mark that has no partner", start_);
@@ -152,12 +154,12 @@ class XmlWalk {
 
 }  // namespace
 
-bool mayReadXML(std::string& text, ParseProblem& problem) {
+std::optional<std::string> admittedXML(std::string text, ParseProblem& problem) {
   if (text.size() > kMostPropertyListBytes) {
     problem.note("more than " + std::to_string(kMostPropertyListBytes) + " bytes", 0);
-    return false;
+    return std::nullopt;
   }
-  return XmlWalk(text, problem).run();
+  return XMLWalk(text, problem).run() ? std::optional(std::move(text)) : std::nullopt;
 }
 
 }  // namespace onramp::libplist

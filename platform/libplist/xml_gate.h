@@ -1,15 +1,17 @@
 #pragma once
 
+#include <optional>
 #include <string>
 
 #include "base/parse_problem.h"
 
 namespace onramp::libplist {
 
-/// Whether `text` (UTF-8 without a byte-order mark) is markup that libplist can read within the
-/// limits. Markup that libplist might take apart in another way than the check does, such as
-/// document types with an internal part, is refused. Integers lose their leading zeros on the way,
-/// because libplist would read those as octal. `problem` learns why a text is refused.
-[[nodiscard]] bool mayReadXML(std::string& text, ParseProblem& problem);
+/// `text`, which is UTF-8 without a byte-order mark, in a form that libplist reads correctly and
+/// within the limits: blanks replace the leading zeros of integers, which libplist would take for
+/// octal numbers. Nothing when the markup exceeds the limits, or when libplist might parse it
+/// differently from this check, such as a document type with an internal part; `problem` then says
+/// why.
+[[nodiscard]] std::optional<std::string> admittedXML(std::string text, ParseProblem& problem);
 
 }  // namespace onramp::libplist

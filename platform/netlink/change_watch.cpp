@@ -14,8 +14,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// Takes all waiting messages off the socket. Changes that did not fit its buffer any more
-// (ENOBUFS) are changes too. False when the socket has come to its end.
+// Takes all waiting messages off the socket. Messages that did not fit its buffer (ENOBUFS) stand
+// for changes too. Returns false when the socket is unusable.
 bool drain(int socket) {
   for (;;) {
     std::uint8_t byte = 0;

@@ -9,19 +9,19 @@
 
 namespace onramp::netlink {
 
-/// Tells that something about the computer's interfaces, IPv4 addresses or, on request, IPv4 routes
-/// may have changed; what it is, the kernel has to be asked for.
+/// Reports that the computer's interfaces, IPv4 addresses or, on request, IPv4 routes may have
+/// changed. It does not say how; ask the kernel for the new state.
 class ChangeWatch {
  public:
-  /// Hears of changes from now on. Null on failure.
+  /// Starts to collect changes. Returns null on failure.
   [[nodiscard]] static std::unique_ptr<ChangeWatch> create(bool withRoutes);
 
   ChangeWatch(const ChangeWatch&) = delete;
   ChangeWatch& operator=(const ChangeWatch&) = delete;
   ~ChangeWatch();
 
-  /// Calls `changed` from a thread of the watch's own after every burst of changes, those since
-  /// creation included, until destruction, which waits for a running call. Once only.
+  /// Calls `changed` after every burst of changes since creation, on the watch's own thread. The
+  /// destructor ends this and waits for a running call. May be called once.
   void start(std::function<void()> changed);
 
  private:

@@ -5,20 +5,14 @@
 
 #include <memory>
 
+#include "base/released_by.h"
+
 namespace onramp::netlink {
 
-template <auto release>
-struct Release {
-  template <typename Handle>
-  void operator()(Handle* handle) const {
-    release(handle);
-  }
-};
+using Socket = std::unique_ptr<nl_sock, ReleasedBy<nl_socket_free>>;
+using Object = std::unique_ptr<nl_object, ReleasedBy<nl_object_put>>;
 
-using Socket = std::unique_ptr<nl_sock, Release<nl_socket_free>>;
-using Object = std::unique_ptr<nl_object, Release<nl_object_put>>;
-
-/// A new socket that speaks to the kernel's routing subsystem; null on failure.
+/// Opens a socket to the kernel's routing subsystem. Returns null on failure.
 [[nodiscard]] Socket openRouteSocket();
 
 }  // namespace onramp::netlink

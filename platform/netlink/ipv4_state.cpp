@@ -25,7 +25,7 @@ namespace onramp::netlink {
 
 namespace {
 
-// A dump that the kernel's tables changed under is asked for again, so many times in all.
+// How often a dump is requested, because a table that changes during a dump spoils it.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;
@@ -48,7 +48,7 @@ struct Collector {
   }
 };
 
-// All objects of one kind that the kernel holds and `wanted` wants, in the kernel's order.
+// Returns the kernel's objects of one kind for which `wanted` returns true, in the kernel's order.
 std::optional<Objects> dump(nl_sock* socket, int request, int family, bool (*wanted)(nl_object*)) {
   for (int attempt = 0; attempt < kDumpAttempts; ++attempt) {
     Collector collector{wanted, {}};
@@ -126,7 +126,7 @@ std::map<int, Interface> interfacesOf(const Objects& addresses) {
   return interfaces;
 }
 
-// The index of the interface that the preferred one of `routes` leads through.
+// Returns the index of the interface that the preferred route leads through.
 std::optional<int> primaryIndex(const Objects& routes) {
   std::optional<int> index;
   std::uint32_t lowest = 0;

@@ -1,4 +1,4 @@
-// Apart from the other operations, so that a program without a run loop can link those.
+// In a file apart, so that a program without a run loop can link the other operations.
 
 #include <atomic>
 #include <memory>
@@ -16,7 +16,7 @@ void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
   static std::vector<DynamicStoreSourceRef> sourcesOnLoop;
   sourcesOnLoop.push_back(source);
 
-  // Has the main thread look for changes, once however often the kernel tells of some meanwhile.
+  // Makes the main thread look for changes, once however many the kernel reports meanwhile.
   const auto posted = std::make_shared<std::atomic<bool>>(false);
   store->changesArrived = [posted, weak = std::weak_ptr(store)] {
     if (posted->exchange(true)) return;

@@ -10,7 +10,7 @@ namespace onramp {
 
 namespace netlink {
 
-// Null when the pattern cannot be read.
+// Returns null when the pattern is invalid.
 Selection::Pattern Selection::compile(const std::string& pattern) {
   auto compiled = std::make_unique<regex_t>();
   const std::string whole = "^(" + pattern + ")$";
@@ -43,10 +43,10 @@ bool Selection::hasGlobal() const {
 std::optional<Dictionary> Selection::read(nl_sock* socket) const {
   const std::optional<Dictionary> state = readIPv4State(socket, hasGlobal());
   if (!state) return std::nullopt;
-  std::vector<Dictionary::Pair> meant;
-  std::copy_if(state->begin(), state->end(), std::back_inserter(meant),
+  std::vector<Dictionary::Pair> selected;
+  std::copy_if(state->begin(), state->end(), std::back_inserter(selected),
                [&](const Dictionary::Pair& pair) { return has(pair.key); });
-  return Dictionary(std::move(meant));
+  return Dictionary(std::move(selected));
 }
 
 }  // namespace netlink

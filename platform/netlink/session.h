@@ -17,23 +17,24 @@ namespace onramp {
 
 namespace netlink {
 
-/// The keys that a request to the store means.
+/// The keys that a request to the store selects.
 class Selection {
  public:
-  /// No keys at all.
+  /// Selects nothing.
   Selection() = default;
 
-  /// By platform/dynamic_store.h's rules; nothing when a pattern cannot be read.
+  /// Makes a selection by the rules in platform/dynamic_store.h. Returns nothing when a pattern is
+  /// invalid.
   [[nodiscard]] static std::optional<Selection> of(const std::vector<std::string>& keys,
                                                    const std::vector<std::string>& patterns);
 
   [[nodiscard]] bool has(const std::string& key) const;
 
-  /// Whether the global IPv4 entity is among the keys.
+  /// Returns whether the global IPv4 entity is selected.
   [[nodiscard]] bool hasGlobal() const;
 
-  /// The entries of the system's present state that are meant; nothing when the kernel cannot be
-  /// asked.
+  /// Returns the selected entries of the system's present state, or nothing when the kernel cannot
+  /// be asked.
   [[nodiscard]] std::optional<Dictionary> read(nl_sock* socket) const;
 
  private:
@@ -57,14 +58,14 @@ struct DynamicStore {
   netlink::Socket socket;
   DynamicStoreCallback callback;
   netlink::Selection notified;
-  Dictionary known;  ///< the entries of `notified` as the callback was last told of them
-  std::function<void()> changesArrived;  ///< from the session's source, once that is on the loop
-  std::unique_ptr<netlink::ChangeWatch> watch;  ///< from the first setNotificationKeys on
+  Dictionary known;  ///< the entries of `notified` that the callback was last told about
+  std::function<void()> changesArrived;         ///< empty until the session's source is on the loop
+  std::unique_ptr<netlink::ChangeWatch> watch;  ///< null until setNotificationKeys()
 
-  /// Tells the callback which notified entries differ from those it knows, if any.
+  /// Calls the callback with the keys of the notified entries that have changed, if there are any.
   void tellChanges();
 
-  /// Lets the watch call `changesArrived`, when there are both.
+  /// Makes the watch call `changesArrived`, when both are set.
   void startWatch() const;
 };
 

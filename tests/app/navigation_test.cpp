@@ -43,14 +43,6 @@ class Navigation : public Wizard {
     screen.runTimers();
     EXPECT_EQ(medium.setUpToolArguments(), "-installer");
   }
-
-  [[nodiscard]] Dictionary wirelessForm(const std::string& name, const std::string& ownModel,
-                                        const std::string& address) const {
-    const Dictionary bonjour{{"name", name}, {"type", "_printer._tcp."}, {"domain", "local."}};
-    return Dictionary{{"Model", ownModel},
-                      {"Interface", "WiFi"},
-                      {"Network", Dictionary{{"Bonjour", bonjour}, {"IP address", address}}}};
-  }
 };
 
 TEST_F(Navigation, AModelChosenByCableIsHandedOverBeforeThePackageOpens) {
@@ -154,14 +146,17 @@ TEST_F(Navigation, TheToolBringsTheChosenModelsDeviceIntoTheNetwork) {
   EXPECT_TRUE(screen.object("progress").hidden);
 
   screen.click("rightMostButton");
-  EXPECT_EQ(medium.modelFile(), wirelessForm("Office", "Kestrel Model 100", "192.0.2.8"));
+  ASSERT_TRUE(medium.modelFile());
+  EXPECT_EQ(medium.modelFile()->string("Model"), "Kestrel Model 100");
+  EXPECT_EQ(medium.modelFile()->dictionary("Network")->string("IP address"), "192.0.2.8");
   expectPackageOpenedAndQuit();
 }
 
 TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
-  describe({{"Kestrel Model 100", model(true, false, true)}});
+  describe({{"Kestrel Model 100", model(true, true, true)}});
   launch();
-  EXPECT_EQ(connectionPage(), expectedConnectionPage("usb.png", "INST_TXT_USB"));
+  const std::string shared = expectedConnectionPage("wiredLan.png", kUSBAndWired);
+  EXPECT_EQ(connectionPage(), shared);
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no list to go back to";
   screen.duringPause = [&](int pause) {
     if (pause == 1) appear("Office", "Model 100", 8);
@@ -171,7 +166,7 @@ TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
   EXPECT_EQ(page(), "ChooseDeviceView");
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
 
-  // A refresh that finds nothing takes Next away; going back gives it back.
+  // A refresh that finds nothing disables Next, and going back enables it.
   screen.duringPause = nullptr;
   screen.pauses.clear();
   chooseMenuItem(2);
@@ -180,7 +175,7 @@ TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
   EXPECT_EQ(screen.sheets.size(), 1U);
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK](BTN_NEXT)");
   screen.click("rightButton");
-  EXPECT_EQ(connectionPage(), expectedConnectionPage("usb.png", "INST_TXT_USB"));
+  EXPECT_EQ(connectionPage(), shared);
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]");
 
   chooseRow(1);

@@ -93,7 +93,7 @@ TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
   EXPECT_EQ(buttons(), "[BTN_CANCEL][次へ]");
 }
 
-// Every file below `folder` with its bytes.
+// Every file below `folder`, with its contents.
 std::map<std::string, std::string> filesBelow(const std::string& folder) {
   std::map<std::string, std::string> files;
   for (const auto& entry : std::filesystem::recursive_directory_iterator(folder)) {
@@ -137,55 +137,35 @@ TEST_F(StartUp, RemovesWhatEarlierRunsLeft) {
   EXPECT_THAT(found, testing::UnorderedElementsAreArray(kept));
 }
 
-TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
-  const std::string texts = kEnglishTexts;
-  const std::string files[] = {"MacResources/Common.plist", "MacResources/CDInfo.plist",
-                               "MacResources/ModelInfo.plist", "Onramp OSX.app/Contents/Info.plist",
-                               texts};
-  struct Damage {
-    const char* name;
-    std::function<void(const std::string&)> apply;
-  };
-  const Damage damages[] = {
-      {"missing", [&](const std::string& f) { std::filesystem::remove(medium.path(f)); }},
-      {"truncated",
-       [&](const std::string& f) {
-         std::filesystem::resize_file(medium.path(f),
-                                      std::filesystem::file_size(medium.path(f)) / 2);
-       }},
-      {"a list",
-       [&](const std::string& f) {
-         medium.write(f, std::string("<plist version=\"1.0\"><array/></plist>"));
-       }},
-      {"wrong types", [&](const std::string& f) {
-         medium.write(f, Dictionary{{"CommonResourcePath", 1},
-                                    {"CDInfo", 1},
-                                    {"ModelInfo", 1},
-                                    {"PkgInfo", "x"},
-                                    {"ContainedModel", "x"},
-                                    {"Model", Array{1}},
-                                    {"VenderName", true},
-                                    {"SystemMax", 3},
-                                    {"WLANtool", 2.5}});
-       }}};
-  const std::string intact = medium.path("Onramp OSX.app/Contents/Info.plist");
-  const std::string copy = medium.path("../Info.plist");
-  std::filesystem::copy_file(intact, copy);
-  for (const std::string& file : files) {
-    for (const Damage& damage : damages) {
-      SCOPED_TRACE(file + " " + damage.name);
+TEST_F(StartUp, ComesUpWhateverTheMediumLacks) {
+  const std::string information = "Onramp OSX.app/Contents/Info.plist";
+  const std::string missing = "missing";
+  const std::string head = "<plist version=\"1.0\"><dict><key>";
+  const std::string number = "</key><integer>1</integer><key>";
+  std::string wrongTypes = head;
+  for (const char* key : {"CommonResourcePath", "CDInfo", "ModelInfo", "PkgInfo", "ContainedModel",
+                          "Model", "VenderName", "SystemMax", "WLANtool"}) {
+    wrongTypes.append(key).append(number);
+  }
+  wrongTypes += "last</key><true/></dict></plist>";
+  for (const std::string& file :
+       {std::string("MacResources/Common.plist"), std::string("MacResources/CDInfo.plist"),
+        std::string("MacResources/ModelInfo.plist"), information, std::string(kEnglishTexts)}) {
+    for (const std::string& content :
+         {missing, head, std::string("<plist version=\"1.0\"><array/></plist>"), wrongTypes}) {
+      SCOPED_TRACE(testing::Message() << file << ": " << content);
       screen.reset();
-      std::filesystem::copy_file(copy, intact, std::filesystem::copy_options::overwrite_existing);
+      medium.write(information, Dictionary{{"CommonResourcePath", "MacResources/Common.plist"}});
       describeTwoModels();
-      medium.write(texts, std::string("\"BTN_NEXT\" = \"Next\";"));
-      damage.apply(file);
+      medium.write(file, content);
+      if (content == missing) std::filesystem::remove(medium.path(file));
       const auto before = filesBelow(medium.path(""));
       launch();
-      if (file == texts) {
-        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "keys stand for themselves";
+      if (file == kEnglishTexts) {
+        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "keys are their own texts";
         screen.click("rightButton");
       } else {
-        // Without its description a medium has no wireless model: the wizard is not needed.
+        // A medium without its description has no wireless model, so the wizard is not needed.
         EXPECT_EQ(page(), "");
         screen.runTimers();
       }
@@ -195,7 +175,7 @@ TEST_F(StartUp, ComesUpWithWhateverTheMediumLacks) {
   }
 }
 
-TEST_F(StartUp, GoesOnWithoutAPageWhoseInterfaceFileIsMissing) {
+TEST_F(StartUp, GoesOnWithoutPagesWhoseInterfaceFilesAreMissing) {
   describeTwoModels();
   screen.missingInterfaces = {"ModelListView", "ChooseDeviceView"};
   launch();
@@ -208,7 +188,7 @@ Dictionary version(Value major, Value minor, Value bugFix) {
   return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
 }
 
-TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
+TEST_F(StartUp, ChecksTheSystemFirst) {
   const Dictionary none = version("0", "0", "0");
   const struct {
     const char* system;
@@ -229,7 +209,7 @@ TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
                {"10.9", none, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
                {"99.9.9", none, none, ""},
                {"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
-               // Outside both: the maximum is looked at first.
+               // Outside both bounds: the maximum is checked first.
                {"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}};
   for (const auto& c : cases) {
     SCOPED_TRACE(std::string(c.system) + ' ' + c.alert);
@@ -251,7 +231,7 @@ TEST_F(StartUp, ChecksTheSystemBeforeAnythingElse) {
   }
 }
 
-TEST_F(StartUp, FillsTheMinimumIntoAsManyPlacesAsTheTextHas) {
+TEST_F(StartUp, FillsTheMinimumIntoOneOrTwoPlaces) {
   describeTwoModels(Dictionary{{"SystemMin", version(10, 11, 0)}});
   const std::pair<std::string, std::string> texts[] = {{"%@ to %@.", "10.11 to 10.11."},
                                                        {"%@", "10.11"},

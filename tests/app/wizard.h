@@ -38,6 +38,7 @@ class Wizard : public testing::Test {
 
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
+    names.reserve(models.size());
     for (const auto& [name, unused] : models)
       names.push_back(name);
     Dictionary resources{

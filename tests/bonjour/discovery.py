@@ -12,7 +12,6 @@ import time
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
 PRACTICE_NETWORK = ROOT / "tools" / "practice-network"
-INTERFACE = "practice0"
 PATIENCE = 30  # Seconds until something counts as not happening at all.
 
 
@@ -75,7 +74,8 @@ class Search(Process):
 
     def events(self, word, name=None):
         fields = [line.split("\t") for line in self.lines]
-        return [event for event in fields if event[1] == word and name in (None, event[2])]
+        return [event for event in fields
+                if word in (None, event[1]) and name in (None, event[2])]
 
     def wait_for(self, word, name, count=1):
         """The last of at least `count` events of that kind, as its fields."""
@@ -128,6 +128,17 @@ class Avahi:
     def restart(self, **settings):
         self.kill()
         self.start(**settings)
+
+    def wait_for_interfaces(self, service_type, names):
+        """Waits until services of that type are seen on exactly those interfaces."""
+        deadline = time.monotonic() + PATIENCE
+        seen = None
+        while seen != names:
+            if time.monotonic() > deadline:
+                raise AssertionError(f"services are seen on {seen}, not on {names}")
+            output = subprocess.run(["avahi-browse", "-pc", service_type], text=True, check=True,
+                                    stdout=subprocess.PIPE).stdout
+            seen = {line.split(";")[1] for line in output.splitlines()}
 
     def _pid(self):
         return int(self.pid_file.read_text())

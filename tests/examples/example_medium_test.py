@@ -144,15 +144,6 @@ class Medium(unittest.TestCase):
 
 
 class ApplicationResources(unittest.TestCase):
-    def test_the_reason_to_use_the_local_network_is_given_in_every_language(self):
-        information = application_information()
-        reason = "NSLocalNetworkUsageDescription"
-        for language in LANGUAGES:
-            table = strings_table(RESOURCES / f"{language}.lproj/InfoPlist.strings")
-            self.assertTrue(table.get(reason, "").strip(), language)
-        english = strings_table(RESOURCES / "en.lproj/InfoPlist.strings")
-        self.assertEqual(english[reason], information[reason])
-
     def test_the_service_type_of_the_medium_may_be_browsed_for(self):
         information = application_information()
         self.assertIn(common_info()["BonjourNetwork"].rstrip("."), information["NSBonjourServices"])

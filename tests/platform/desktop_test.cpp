@@ -8,6 +8,7 @@
 #include <thread>
 
 #include "platform/child_process.h"
+#include "platform/failed_writes.h"
 #include "platform/folders.h"
 #include "platform/standin/stand_in_system.h"
 #include "platform/system_version.h"
@@ -135,6 +136,9 @@ TEST(Desktop, ReturnsHowAChildProcessEnded) {
   medium.write("tool", std::string("no program"));
   EXPECT_EQ(runAndWait(medium.path("tool"), {}), std::nullopt);
   EXPECT_EQ(runAndWait(medium.path(""), {}), std::nullopt);
+  surviveFailedWrites();
+  EXPECT_EQ(runAndWait(script("exec grep -q '^SigIgn:.*0000000$' /proc/self/status"), {}), 0)
+      << "the program inherits an ignored signal";
 }
 
 TEST(Desktop, ReportsTheSystemVersionThatItIsGiven) {

@@ -7,7 +7,6 @@
 #include "base/array_controller.h"
 #include "platform/run_loop.h"
 #include "platform/workspace.h"
-#include "tests/recording/interfaces.h"
 #include "tests/recording/loop.h"
 
 namespace onramp::recording {
@@ -74,18 +73,19 @@ void FrontEnd::launch(ApplicationDelegate& delegate) {
 }
 
 Object& FrontEnd::object(const std::string& name) {
-  Object* const found = findLiveObject(name);
-  if (!found) {
-    std::fprintf(stderr, "no live object named %s\n", name.c_str());
+  const auto found = std::find_if(loaded.rbegin(), loaded.rend(),
+                                  [&](const Object* each) { return each->name == name; });
+  if (found == loaded.rend()) {
+    std::fprintf(stderr, "no object named %s\n", name.c_str());
     std::abort();
   }
-  return *found;
+  return **found;
 }
 
 void FrontEnd::click(const std::string& buttonName) {
   const Object& button = object(buttonName);
   if (button.hidden || !button.enabled) return;
-  ownerOf(button).performAction(button.action);
+  button.owner->performAction(button.action);
 }
 
 void FrontEnd::runTimers() {

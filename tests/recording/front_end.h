@@ -38,8 +38,8 @@ struct Object {
   std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
   Object* superview = nullptr;
   std::vector<Object*> subviews;
-  std::string titleBinding;
   std::string action;
+  InterfaceOwner* owner = nullptr;  ///< whom its interface file was loaded for
 
   [[nodiscard]] NativeObject* native() { return reinterpret_cast<NativeObject*>(this); }
 };
@@ -82,6 +82,7 @@ class FrontEnd {
   // What the seam's functions ask for.
   void schedule(double seconds, std::function<void()> action);
   void open(const std::string& target);
+  std::vector<Object*> loaded;  ///< the objects of all loaded interface files, the latest last
   [[nodiscard]] Object* menuBar();
 
   // What the program did.

@@ -1,80 +1,40 @@
-#include "tests/recording/interfaces.h"
-
 #include <algorithm>
-#include <cstdlib>
+#include <list>
 #include <utility>
 #include <vector>
 
+#include "platform/interface_file.h"
+#include "tests/recording/front_end.h"
+
 namespace onramp {
 
-namespace recording {
-
-namespace {
-
-// The objects of one loaded interface file, the root view first. A list of all loaded ones lets
-// tests find objects by name.
-class LoadedInterface {
- public:
-  LoadedInterface(std::string className, InterfaceOwner& loadedFor)
-      : viewClass(std::move(className)), owner(loadedFor) {
-    live().push_back(this);
-  }
-  LoadedInterface(const LoadedInterface&) = delete;
-  LoadedInterface& operator=(const LoadedInterface&) = delete;
-  ~LoadedInterface() {
-    std::erase(live(), this);
-    for (const auto& object : objects) {
-      for (Object* const inner : object->subviews)
-        inner->superview = nullptr;
-      if (object->superview) std::erase(object->superview->subviews, object.get());
-    }
-  }
-
-  static std::vector<LoadedInterface*>& live() {
-    static std::vector<LoadedInterface*> interfaces;
-    return interfaces;
-  }
-
-  Object& add(OutletKind kind, const std::string& name) {
-    objects.push_back(std::make_unique<Object>());
-    objects.back()->kind = kind;
-    objects.back()->name = name;
-    return *objects.back();
-  }
-
-  std::string viewClass;
-  InterfaceOwner& owner;
-  std::vector<std::unique_ptr<Object>> objects;
-};
-
-}  // namespace
-
-Object* findLiveObject(const std::string& name) {
-  auto& interfaces = LoadedInterface::live();
-  for (auto loaded = interfaces.rbegin(); loaded != interfaces.rend(); ++loaded) {
-    for (const auto& object : (*loaded)->objects) {
-      if (object->name == name) return object.get();
-    }
-  }
-  return nullptr;
-}
-
-InterfaceOwner& ownerOf(const Object& object) {
-  for (LoadedInterface* const loaded : LoadedInterface::live()) {
-    for (const auto& candidate : loaded->objects) {
-      if (candidate.get() == &object) return loaded->owner;
-    }
-  }
-  std::abort();
-}
-
-}  // namespace recording
-
+using recording::FrontEnd;
 using recording::Object;
 
+// The objects of one loaded interface file, the root view first.
 struct Interface::Tree {
-  Tree(const std::string& name, InterfaceOwner& owner) : loaded{name, owner} {}
-  recording::LoadedInterface loaded;
+  Tree() = default;
+  Tree(const Tree&) = delete;
+  Tree& operator=(const Tree&) = delete;
+  ~Tree() {
+    for (Object& object : objects) {
+      for (Object* const inner : object.subviews)
+        inner->superview = nullptr;
+      if (object.superview) std::erase(object.superview->subviews, &object);
+      std::erase(FrontEnd::instance().loaded, &object);
+    }
+  }
+
+  Object& add(OutletKind kind, const std::string& name, InterfaceOwner& owner) {
+    Object& object = objects.emplace_back();
+    object.kind = kind;
+    object.name = name;
+    object.owner = &owner;
+    FrontEnd::instance().loaded.push_back(&object);
+    return object;
+  }
+
+  std::list<Object> objects;
 };
 
 namespace {
@@ -118,16 +78,12 @@ const std::vector<Part>& partsOf(const std::string& interfaceName) {
 }
 
 void bindAsTheFilesDo(Object& object, KeyValueTexts& texts) {
-  if (object.kind == OutletKind::kWindow) object.titleBinding = "windowTitle";
-  if (object.kind == OutletKind::kButton) {
-    object.titleBinding = object.name + "Title";
-    object.action = object.name + "Clicked";
-  }
+  if (object.kind == OutletKind::kButton) object.action = object.name + "Clicked";
   if (object.kind == OutletKind::kPopUpButton) {
     object.items = {{"Gear", nullptr}, {"Left over", nullptr}, {"From the file", nullptr}};
   }
-  if (object.titleBinding.empty()) return;
-  texts.bind(object.titleBinding, [&object](const std::string& text) { object.text = text; });
+  if (object.kind != OutletKind::kButton && object.kind != OutletKind::kWindow) return;
+  texts.bind(object.name + "Title", [&object](const std::string& text) { object.text = text; });
 }
 
 }  // namespace
@@ -138,28 +94,25 @@ Interface::~Interface() = default;
 
 std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwner& owner) {
   const std::vector<Part>& parts = partsOf(name);
-  if (parts.empty() || recording::FrontEnd::instance().missingInterfaces.contains(name)) {
-    return nullptr;
-  }
-  auto tree = std::make_unique<Tree>(name, owner);
-  tree->loaded.add(OutletKind::kView, name);
-  for (const Part& part : parts) {
-    bindAsTheFilesDo(tree->loaded.add(part.kind, part.name), owner.boundTexts());
-  }
+  if (parts.empty() || FrontEnd::instance().missingInterfaces.contains(name)) return nullptr;
+  auto tree = std::make_unique<Tree>();
+  tree->add(OutletKind::kView, name, owner);
+  for (const Part& part : parts)
+    bindAsTheFilesDo(tree->add(part.kind, part.name, owner), owner.boundTexts());
   return std::unique_ptr<Interface>(new Interface(std::move(tree)));
 }
 
 View Interface::view() const {
-  return View(tree_->loaded.objects.front()->native());
+  return View(tree_->objects.front().native());
 }
 
 std::string Interface::viewClass() const {
-  return tree_->loaded.viewClass;
+  return tree_->objects.front().name;
 }
 
 NativeObject* Interface::find(std::string_view name, OutletKind kind) const {
-  for (const auto& object : tree_->loaded.objects) {
-    if (object->name == name && object->kind == kind) return object->native();
+  for (Object& object : tree_->objects) {
+    if (object.name == name && object.kind == kind) return object.native();
   }
   return nullptr;
 }

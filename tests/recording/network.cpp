@@ -40,6 +40,8 @@ class ScriptedService final : public NetService,
   }
   bool resolveWithTimeout(double seconds) override {
     record("service resolve");
+    addresses.clear();
+    txt.reset();
     Network::instance().timeouts.push_back(seconds);
     if (client_) {
       resolving = true;

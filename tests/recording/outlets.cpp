@@ -12,114 +12,108 @@ namespace {
 using recording::FrontEnd;
 using recording::Object;
 
-Object* object(const Outlet& outlet) {
-  return reinterpret_cast<Object*>(outlet.native());
+// The object of a handle. For an empty one a spare, which nobody looks at.
+Object& object(const Outlet& outlet) {
+  static Object spare;
+  if (outlet) return *reinterpret_cast<Object*>(outlet.native());
+  return spare = Object();
 }
 
 }  // namespace
 
 void View::setHidden(bool hidden) const {
-  if (Object* const view = object(*this)) view->hidden = hidden;
+  object(*this).hidden = hidden;
 }
 
 View View::firstSubview() const {
-  const Object* const view = object(*this);
-  return View(view && !view->subviews.empty() ? view->subviews.front()->native() : nullptr);
+  const auto& inside = object(*this).subviews;
+  return View(inside.empty() ? nullptr : inside.front()->native());
 }
 
 void View::addSubview(const View& inner) const {
-  Object* const view = object(*this);
-  if (!view || !inner) return;
-  view->subviews.push_back(object(inner));
-  object(inner)->superview = view;
+  if (!*this || !inner) return;
+  object(*this).subviews.push_back(&object(inner));
+  object(inner).superview = &object(*this);
 }
 
 void View::removeFromSuperview() const {
-  Object* const view = object(*this);
-  if (!view || !view->superview) return;
-  std::erase(view->superview->subviews, view);
-  view->superview = nullptr;
+  Object& view = object(*this);
+  if (view.superview) std::erase(view.superview->subviews, &view);
+  view.superview = nullptr;
 }
 
 void Control::setEnabled(bool enabled) const {
-  if (Object* const control = object(*this)) control->enabled = enabled;
+  object(*this).enabled = enabled;
 }
 
 void TextField::setStringValue(const std::string& text) const {
-  if (Object* const field = object(*this)) field->text = text;
+  object(*this).text = text;
 }
 
 void RadioMatrix::setTitle(int row, int column, const std::string& title) const {
-  if (Object* const matrix = object(*this)) matrix->cells[{row, column}] = title;
+  object(*this).cells[{row, column}] = title;
 }
 
 void RadioMatrix::selectCell(int row, int column) const {
-  Object* const matrix = object(*this);
-  if (!matrix) return;
-  matrix->selectedRow = row;
-  matrix->selectedColumn = column;
+  object(*this).selectedRow = row;
+  object(*this).selectedColumn = column;
 }
 
 int RadioMatrix::selectedRow() const {
-  const Object* const matrix = object(*this);
-  return matrix ? matrix->selectedRow : 0;
+  return *this ? object(*this).selectedRow : 0;
 }
 
 void ImageView::setImage(const Image& image) const {
-  if (Object* const view = object(*this)) view->imagePath = image.path;
+  object(*this).imagePath = image.path;
 }
 
 void ImageView::setImageScaling(ImageScaling scaling) const {
-  if (Object* const view = object(*this)) view->scaling = scaling;
+  object(*this).scaling = scaling;
 }
 
 void ProgressIndicator::startAnimation() const {
-  if (Object* const spinner = object(*this)) spinner->animating = true;
+  object(*this).animating = true;
 }
 
 void ProgressIndicator::stopAnimation() const {
-  if (Object* const spinner = object(*this)) spinner->animating = false;
+  object(*this).animating = false;
 }
 
 void TableView::bind(ArrayController& controller) const {
-  if (Object* const table = object(*this)) table->content = &controller;
+  object(*this).content = &controller;
 }
 
 void TableView::setAllowsColumnReordering(bool allows) const {
-  if (Object* const table = object(*this)) table->columnsCanMove = allows;
+  object(*this).columnsCanMove = allows;
 }
 
 void TableView::setAllowsColumnSelection(bool allows) const {
-  if (Object* const table = object(*this)) table->columnsCanBeSelected = allows;
+  object(*this).columnsCanBeSelected = allows;
 }
 
 void TableView::setColumnEditable(std::string_view identifier, bool editable) const {
-  Object* const table = object(*this);
-  if (table && !editable) table->fixedColumns.emplace(identifier);
+  if (!editable) object(*this).fixedColumns.emplace(identifier);
 }
 
 void TableView::setColumnHeader(std::string_view identifier, const std::string& title) const {
-  if (Object* const table = object(*this)) table->headers[std::string(identifier)] = title;
+  object(*this).headers[std::string(identifier)] = title;
 }
 
 std::size_t PopUpButton::numberOfItems() const {
-  const Object* const popUp = object(*this);
-  return popUp ? popUp->items.size() : 0;
+  return object(*this).items.size();
 }
 
 void PopUpButton::removeItem(std::size_t index) const {
-  Object* const popUp = object(*this);
-  if (popUp && index < popUp->items.size()) {
-    popUp->items.erase(popUp->items.begin() + static_cast<std::ptrdiff_t>(index));
-  }
+  auto& items = object(*this).items;
+  items.erase(items.begin() + static_cast<std::ptrdiff_t>(index));
 }
 
 void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {
-  if (Object* const popUp = object(*this)) popUp->items.emplace_back(title, std::move(action));
+  object(*this).items.emplace_back(title, std::move(action));
 }
 
 void Window::setShowsResizeIndicator(bool shows) const {
-  if (Object* const window = object(*this)) window->resizeIndicator = shows;
+  object(*this).resizeIndicator = shows;
 }
 
 void Window::center() const {
@@ -139,21 +133,19 @@ void Window::close() const {
 }
 
 MenuItem Menu::itemWithTitle(const std::string& title) const {
-  if (const Object* const menu = object(*this)) {
-    for (Object* const item : menu->subviews) {
-      if (item->text == title) return MenuItem(item->native());
-    }
+  for (Object* const item : object(*this).subviews) {
+    if (item->text == title) return MenuItem(item->native());
   }
   return {};
 }
 
 Menu MenuItem::submenu() const {
-  const Object* const item = object(*this);
-  return Menu(item && !item->subviews.empty() ? item->subviews.front()->native() : nullptr);
+  const auto& inside = object(*this).subviews;
+  return Menu(inside.empty() ? nullptr : inside.front()->native());
 }
 
 void MenuItem::setTitle(const std::string& title) const {
-  if (Object* const item = object(*this)) item->text = title;
+  object(*this).text = title;
 }
 
 }  // namespace onramp

@@ -8,7 +8,6 @@ from pathlib import Path
 
 ROOT = Path(__file__).resolve().parents[2]
 PAGES = ("ModelListView", "ConnectionTypeView", "ChooseDeviceView")
-INTERFACES = ("MainMenu", *PAGES)
 
 # What each kind of outlet is in the interface files of Qt and of Cocoa.
 QT = {"QLabel": "TextField", "QPushButton": "Button", "QToolButton": "PopUpButton",
@@ -25,95 +24,20 @@ def text_of(path):
     return (ROOT / path).read_text(encoding="utf-8")
 
 
-class Sources:
-    """What the program asks for."""
-
-    def __init__(self):
-        self.navigation = text_of("app/navigation.cpp")
-        self.start_up = text_of("app/start_up.cpp")
-
-    def outlets(self, interface):
-        text = self.start_up if interface == "MainMenu" else text_of(f"pages/{interface}.cpp")
-        return {name: kind for kind, name in re.findall(r'outlet<(\w+)>\("(\w+)"\)', text)}
-
-    def actions(self):
-        return set(re.findall(r'\{"(\w+)", &OnrampOSXAppDelegate::\1\}', self.navigation))
-
-    def titles(self):
-        return set(re.findall(r'"(\w+Title)"', self.navigation + self.start_up))
-
-    def menu_items(self):
-        return (set(re.findall(r'\{"([\w ]+)", "APP_MENU_\w+"\}', self.start_up))
-                | set(re.findall(r'itemWithTitle\("([^"]+)"\)', self.start_up)))
-
-    @staticmethod
-    def columns(page):
-        text = text_of(f"pages/{page}.h") + text_of(f"pages/{page}.cpp")
-        shown = re.findall(r"setColumnHeader\((k\w+)", text) or ["kModel"]
-        constants = dict(re.findall(r'(k\w+) = "(\w+)";', text))
-        return {constants[name] for name in shown}
+NAVIGATION = text_of("app/navigation.cpp")
+START_UP = text_of("app/start_up.cpp")
 
 
-class QtFile:
-    def __init__(self, interface):
-        self.root = ElementTree.fromstring(text_of(f"resources/qt/{interface}.ui"))
-        self.page_class = self.root.find("widget").get("class")
-
-    def outlets(self):
-        return {widget.get("name"): QT.get(widget.get("class"))
-                for widget in self.root.iter("widget")}
-
-    def property(self, name):
-        """The texts of that property by the names of their objects."""
-        return {owner.get("name"): ["".join(text.itertext()) for text in found.iter("string")]
-                for owner in self.root.iter() for found in owner.findall("property")
-                if found.get("name") == name}
-
-    def actions(self):
-        buttons = {widget.get("name") for widget in self.root.iter("widget")}
-        return {name: text for name, (text,) in self.property("action").items() if name in buttons}
-
-    def titles(self):
-        return {name: text for name, (text,) in self.property("titleBinding").items()}
-
-    def columns(self):
-        return {column for columns in self.property("columns").values() for column in columns}
-
-    def menu_items(self):
-        names = {"applicationMenu", *(action.get("name") for action in self.root.iter("action"))}
-        texts = self.property("title") | self.property("text")
-        return {text for name, (text,) in texts.items() if name in names}
+def wanted_outlets(interface):
+    text = START_UP if interface == "MainMenu" else text_of(f"pages/{interface}.cpp")
+    return {name: kind for kind, name in re.findall(r'outlet<(\w+)>\("(\w+)"\)', text)}
 
 
-class CocoaFile:
-    def __init__(self, interface):
-        self.root = ElementTree.fromstring(text_of(f"resources/cocoa/{interface}.xib"))
-        first = next(iter(self.root.iter("customView")))
-        self.page_class = first.get("identifier")
-        outlets = {outlet.get("destination"): outlet.get("property")
-                   for outlet in self.root.iter("outlet")}
-        self.objects = [(each.get("identifier") or outlets.get(each.get("id")), each)
-                        for each in self.root.iter()]
-
-    def outlets(self):
-        return {name: COCOA.get(each.tag) for name, each in self.objects if name}
-
-    def connections(self, kind, attribute):
-        return {name: found.get(attribute) for name, each in self.objects if name
-                for found in each.findall(f"connections/{kind}")}
-
-    def actions(self):
-        return {name: selector.rstrip(":")
-                for name, selector in self.connections("action", "selector").items()}
-
-    def titles(self):
-        return self.connections("binding", "keyPath")
-
-    def columns(self):
-        return {column.get("identifier") for column in self.root.iter("tableColumn")}
-
-    def menu_items(self):
-        return {item.get("title") for item in self.root.iter("menuItem")}
+def wanted_columns(page):
+    text = text_of(f"pages/{page}.h") + text_of(f"pages/{page}.cpp")
+    constants = dict(re.findall(r'(k\w+) = "(\w+)";', text))
+    shown = re.findall(r"setColumnHeader\((k\w+)", text)
+    return {constants[name] for name in shown or ["kModel"]}
 
 
 def recorded_outlets(interface):
@@ -123,55 +47,83 @@ def recorded_outlets(interface):
     return {name: kind for kind, name in re.findall(r'\{k(\w+), "(\w+)"', parts)}
 
 
+class QtFile:
+    def __init__(self, interface):
+        root = ElementTree.fromstring(text_of(f"resources/qt/{interface}.ui"))
+        widgets = list(root.iter("widget"))
+        self.page_class = widgets[0].get("class")
+        self.outlets = {each.get("name"): QT.get(each.get("class")) for each in widgets}
+        texts = {}
+        for owner in root.iter():
+            for found in owner.findall("property"):
+                texts.setdefault(found.get("name"), {})[owner.get("name")] = [
+                    "".join(text.itertext()) for text in found.iter("string")]
+        names = {each.get("name") for each in widgets}
+        self.actions = {name: text for name, (text,) in texts.get("action", {}).items()
+                        if name in names}
+        self.titles = {name: text for name, (text,) in texts.get("titleBinding", {}).items()}
+        self.columns = {each for columns in texts.get("columns", {}).values() for each in columns}
+        self.menu_items = {"".join(text) for kind in ("title", "text")
+                           for text in texts.get(kind, {}).values()}
+
+
+class CocoaFile:
+    def __init__(self, interface):
+        root = ElementTree.fromstring(text_of(f"resources/cocoa/{interface}.xib"))
+        named = {each.get("destination"): each.get("property") for each in root.iter("outlet")}
+        objects = [(each.get("identifier") or named.get(each.get("id")), each)
+                   for each in root.iter()]
+
+        def connections(kind, attribute):
+            return {name: found.get(attribute) for name, each in objects if name
+                    for found in each.findall(f"connections/{kind}")}
+
+        self.page_class = next(root.iter("customView")).get("identifier")
+        self.outlets = {name: COCOA.get(each.tag) for name, each in objects if name}
+        self.actions = {name: selector.rstrip(":")
+                        for name, selector in connections("action", "selector").items()}
+        self.titles = connections("binding", "keyPath")
+        self.columns = {each.get("identifier") for each in root.iter("tableColumn")}
+        self.menu_items = {each.get("title") for each in root.iter("menuItem")}
+
+
 class InterfaceFiles(unittest.TestCase):
-    def setUp(self):
-        self.sources = Sources()
-        self.files = {(front, interface): made(interface) for interface in INTERFACES
-                      for front, made in (("qt", QtFile), ("cocoa", CocoaFile))}
-
-    def test_every_outlet_is_in_every_front_end_and_of_the_right_kind(self):
-        for interface in INTERFACES:
-            wanted = self.sources.outlets(interface)
+    def test_every_outlet_is_there_and_of_the_right_kind(self):
+        for interface in ("MainMenu", *PAGES):
+            wanted = wanted_outlets(interface)
             self.assertGreater(len(wanted), 2)
-            for front in ("qt", "cocoa"):
-                with self.subTest(interface, front=front):
-                    there = self.files[front, interface].outlets()
-                    self.assertEqual(wanted, {name: there.get(name) for name in wanted})
-            with self.subTest(interface, front="recording"):
-                self.assertEqual(wanted, recorded_outlets(interface))
+            self.assertEqual(wanted, recorded_outlets(interface), interface)
+            for made in (QtFile, CocoaFile):
+                there = made(interface).outlets
+                self.assertEqual(wanted, {name: there.get(name) for name in wanted},
+                                 f"{made.__name__} {interface}")
 
-    def test_every_page_has_its_class(self):
-        for (front, interface), file in self.files.items():
-            if interface in PAGES:
-                with self.subTest(interface, front=front):
-                    self.assertEqual(interface, file.page_class)
+    def test_every_page_has_its_class_and_every_list_its_columns(self):
+        for page in PAGES:
+            for made in (QtFile, CocoaFile):
+                file = made(page)
+                self.assertEqual(page, file.page_class, made.__name__)
+                columns = set() if page == "ConnectionTypeView" else wanted_columns(page)
+                self.assertEqual(columns, file.columns, f"{made.__name__} {page}")
 
     def test_every_button_does_its_action_and_shows_its_title(self):
-        buttons = {name for name, kind in self.sources.outlets("MainMenu").items()
-                   if kind == "Button"}
+        buttons = {name for name, kind in wanted_outlets("MainMenu").items() if kind == "Button"}
         actions = {name: f"{name}Clicked" for name in buttons}
-        titles = {name: f"{name}Title" for name in buttons} | {"window": "windowTitle"}
-        self.assertEqual(set(actions.values()), self.sources.actions())
-        self.assertLessEqual(self.sources.titles(), set(titles.values()))
-        for front in ("qt", "cocoa"):
-            with self.subTest(front):
-                file = self.files[front, "MainMenu"]
-                self.assertEqual(actions, file.actions())
-                self.assertEqual(titles, file.titles())
-
-    def test_every_column_has_its_identifier(self):
-        for interface in ("ModelListView", "ChooseDeviceView"):
-            for front in ("qt", "cocoa"):
-                with self.subTest(interface, front=front):
-                    self.assertEqual(self.sources.columns(interface),
-                                     self.files[front, interface].columns())
+        titles = {name: f"{name}Title" for name in (*buttons, "window")}
+        self.assertEqual(set(actions.values()), set(re.findall(
+            r'\{"(\w+)", &OnrampOSXAppDelegate::\1\}', NAVIGATION)))
+        self.assertLessEqual(set(re.findall(r'"(\w+Title)"', NAVIGATION + START_UP)),
+                             set(titles.values()))
+        for made in (QtFile, CocoaFile):
+            file = made("MainMenu")
+            self.assertEqual((actions, titles), (file.actions, file.titles), made.__name__)
 
     def test_every_menu_item_that_gets_another_title_is_found_by_its_own(self):
-        wanted = self.sources.menu_items()
+        wanted = set(re.findall(r'\{"([\w ]+)", "APP_MENU_\w+"\}', START_UP)
+                     + re.findall(r'itemWithTitle\("([^"]+)"\)', START_UP))
         self.assertEqual(6, len(wanted))
-        for front in ("qt", "cocoa"):
-            with self.subTest(front):
-                self.assertLessEqual(wanted, self.files[front, "MainMenu"].menu_items())
+        for made in (QtFile, CocoaFile):
+            self.assertLessEqual(wanted, made("MainMenu").menu_items, made.__name__)
 
 
 if __name__ == "__main__":

@@ -1,13 +1,21 @@
 // onramp-check: reads a finished medium as the wizard does and says what is wrong with it.
 
 #include <CLI/CLI.hpp>
+#include <cstdlib>
 #include <exception>
 #include <filesystem>
 #include <iostream>
 #include <string>
+#include <system_error>
+
+#include "tools/check/check.h"
+#include "tools/check/output.h"
 
 namespace {
 
+using namespace onramp;
+
+constexpr int kFindings = 1;
 constexpr int kUnreadable = 2;
 
 constexpr const char* kFooter = R"(Examples:
@@ -17,6 +25,13 @@ constexpr const char* kFooter = R"(Examples:
 Exit status: 0 when the medium is clean, 1 when something was found, 2 when the
 medium could not be read or the command line is wrong.)";
 
+// `status`, unless what was written did not arrive.
+int finish(int status) {
+  if (std::cout.flush()) return status;
+  std::cerr << "onramp-check: the output could not be written; is its disk full?\n";
+  return kUnreadable;
+}
+
 int run(int count, char* arguments[]) {
   CLI::App app("Checks a finished medium: what its users will see, and what is wrong with it.");
   app.name("onramp-check");
@@ -25,21 +40,41 @@ int run(int count, char* arguments[]) {
   std::string medium;
   bool json = false;
   bool strict = false;
-  app.add_option("MEDIUM", medium, "The folder that the application lies in")->required();
+  bool texts = false;
+  app.add_option("MEDIUM", medium, "The folder that the application lies in");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with 1 for warnings, too");
+  app.add_flag("--texts", texts, "Print the texts that the wizard shows, and how wide they may be");
   try {
     app.parse(count, arguments);
   } catch (const CLI::ParseError& error) {
     return app.exit(error) == 0 ? 0 : kUnreadable;
   }
-  if (!std::filesystem::is_directory(medium)) {
-    std::cerr << "onramp-check: \"" << medium
-              << "\" is no folder; give the folder that holds the application\n";
+  if (texts) {
+    check::writeTexts(std::cout);
+    return finish(EXIT_SUCCESS);
+  }
+  std::error_code ignored;
+  if (!std::filesystem::is_directory(medium, ignored)) {
+    std::cerr << "onramp-check: "
+              << (medium.empty() ? "no MEDIUM is named" : check::quoted(medium) + " is no folder")
+              << "; give the folder that holds the application\n";
     return kUnreadable;
   }
-  std::cout << medium << ": a folder\n";
-  return 0;
+  if (std::filesystem::directory_iterator(medium, ignored); ignored) {
+    std::cerr << "onramp-check: " << check::quoted(medium)
+              << " cannot be read: " << ignored.message() << '\n';
+    return kUnreadable;
+  }
+  const check::Report report = check::checkMedium(medium);
+  if (json) {
+    check::writeJSON(std::cout, report);
+  } else {
+    check::writeText(std::cout, report);
+  }
+  const bool clean = report.count(check::Severity::kError) == 0 &&
+                     !(strict && report.count(check::Severity::kWarning) != 0);
+  return finish(clean ? EXIT_SUCCESS : kFindings);
 }
 
 }  // namespace

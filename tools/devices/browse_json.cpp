@@ -56,7 +56,8 @@ Json jsonOfDevice(const JudgedDevice& judged) {
               {"gone", device.gone ? Json(*device.gone) : Json()},
               {"record", jsonOfRecord(device.record)},
               {"txt", txtStrings(device.txt)},
-              {"ipv6", device.ipv6}};
+              {"ipv6", device.ipv6},
+              {"sightings", device.sightings}};
   if (device.answer) {
     object["answer"] = jsonOfAnswer(*device.answer);
     object["delay"] = {{"seconds", judged.delay.seconds},

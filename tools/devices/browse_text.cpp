@@ -59,8 +59,14 @@ std::string paragraph(const std::string& text, const TextStyle& style) {
   return wrapped(text, style.width == 0 ? kUnlimited : style.width, 2);
 }
 
+// A service type ends in a dot already.
+std::string sentence(const std::string& text) {
+  return text.ends_with('.') ? text : text + '.';
+}
+
 std::string explanation(const Verdict& verdict) {
-  return verdict.why + '.' + (verdict.remedy.empty() ? "" : " Remedy: " + verdict.remedy + '.');
+  return sentence(verdict.why) +
+         (verdict.remedy.empty() ? "" : " Remedy: " + sentence(verdict.remedy));
 }
 
 std::string delayText(const Delay& delay) {
@@ -89,6 +95,9 @@ std::string listOf(const std::vector<std::string>& texts) {
 
 std::string detailsOf(const Device& device) {
   std::string out = "  domain " + device.domain + ", types " + listOf(device.types) + '\n';
+  if (!device.sightings.empty()) {
+    out += "  seen on " + listOf({device.sightings.begin(), device.sightings.end()}) + '\n';
+  }
   out += "  found after " + durationText(device.found);
   out += device.resolved ? ", resolved after " + durationText(*device.resolved) : ", not resolved";
   out += '\n';

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -19,10 +20,11 @@ struct Device {
   double found = 0;
   std::optional<double> resolved;
   std::optional<double> gone;
-  Dictionary record;              ///< a KSDevice record, once resolved
-  std::optional<Data> txt;        ///< the TXT record as on the wire
-  std::vector<std::string> ipv6;  ///< addresses that the wizard does not use
-  std::optional<Answer> answer;   ///< absent when it was not asked
+  Dictionary record;                ///< a KSDevice record, once resolved
+  std::optional<Data> txt;          ///< the TXT record as on the wire
+  std::vector<std::string> ipv6;    ///< addresses that the wizard does not use
+  std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"
+  std::optional<Answer> answer;     ///< absent when it was not asked
 };
 
 /// What the wizard reads from the medium for its search.

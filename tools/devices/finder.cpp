@@ -16,16 +16,31 @@ void Finder::start(const std::vector<std::string>& types) {
     browsers_.push_back(KSBonjour::initWithType(type));
   // Every browser tells its observers what all of them see, so one is observed.
   if (!browsers_.empty()) browsers_.front()->addKSBonjourObserver(shared_from_this());
+  watchSightings([this](const ServiceSighting& sighting) { sighted(sighting); });
   for (const auto& browser : browsers_)
     browser->startBrowsing();
 }
 
 void Finder::stop() {
   const auto self = shared_from_this();
+  watchSightings(nullptr);
   for (const auto& browser : browsers_) {
     browser->stopBrowsing();
     browser->removeKSBonjourObserver(this);
   }
+}
+
+void Finder::sighted(const ServiceSighting& sighting) {
+  const std::pair key(sighting.name, sighting.domain);
+  auto& places = sightings_[key];
+  const std::string place = sighting.interface + (sighting.isIPv6 ? " IPv6" : " IPv4");
+  if (sighting.isGone) {
+    places.erase(place);
+  } else {
+    places.insert(place);
+  }
+  const auto device = devices_.find(key);
+  if (device != devices_.end()) device->second.sightings = places;
 }
 
 std::vector<Device*> Finder::devices() {
@@ -48,6 +63,7 @@ Device* Finder::deviceOf(const NetServiceRef& service) {
     device.domain = *service->domain();
     device.type = *service->type();
     device.found = now();
+    device.sightings = sightings_[entry->first];
   }
   return &device;
 }

@@ -4,11 +4,13 @@
 #include <functional>
 #include <map>
 #include <memory>
+#include <set>
 #include <string>
 #include <utility>
 #include <vector>
 
 #include "bonjour/KSBonjour.h"
+#include "platform/discovery_state.h"
 #include "tools/devices/device.h"
 
 namespace onramp::devices {
@@ -41,12 +43,15 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
 
  private:
   Device* deviceOf(const NetServiceRef& service);
+  void sighted(const ServiceSighting& sighting);
 
   std::string preferred_;
   Changed changed_;
   std::chrono::steady_clock::time_point start_;
   std::vector<std::shared_ptr<KSBonjour>> browsers_;
   std::map<std::pair<std::string, std::string>, Device> devices_;
+  // Sightings come before the services that they are folded to.
+  std::map<std::pair<std::string, std::string>, std::set<std::string>> sightings_;
 };
 
 }  // namespace onramp::devices

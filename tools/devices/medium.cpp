@@ -7,7 +7,7 @@
 
 #include "media/KSOROSXCD.h"
 #include "platform/freedesktop/main_bundle.h"
-#include "platform/property_list.h"
+#include "tools/check/application.h"
 #include "tools/devices/text.h"
 
 namespace onramp::devices {
@@ -15,21 +15,6 @@ namespace onramp::devices {
 namespace {
 
 namespace fs = std::filesystem;
-
-// The application at the medium's top that names the medium's resources.
-std::optional<std::string> findApplication(const std::string& folder) {
-  std::vector<std::string> found;
-  std::error_code error;
-  fs::directory_iterator entry(folder, error);
-  for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
-    const std::string path = entry->path().string();
-    if (!path.ends_with(".app")) continue;
-    const auto information = loadDictionary(path + "/Contents/Info.plist");
-    if (information && information->find("CommonResourcePath")) found.push_back(path);
-  }
-  if (found.empty()) return std::nullopt;
-  return *std::min_element(found.begin(), found.end());
-}
 
 std::nullopt_t fail(const std::string& path, const std::string& problem) {
   std::cerr << "onramp-devices: " << inQuotes(path) << ' ' << problem << '\n';
@@ -44,13 +29,11 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
   if (error || !fs::is_directory(folder, error)) {
     return fail(path, "is no folder; give the folder that holds the application");
   }
-  const auto application = findApplication(folder);
-  if (!application) {
-    return fail(path,
-                "holds no application that names the medium's resources; give the folder "
-                "that holds the application");
+  const std::string application = check::findApplication(folder);
+  if (application.empty()) {
+    return fail(path, "holds no application; give the folder that holds it");
   }
-  setMainBundlePath(*application);
+  setMainBundlePath(folder + '/' + application);
   const Dictionary description = KSOROSXCD::initWithCDInfo();
   Medium medium{.path = path,
                 .type = description.string(KSOROSXCD::kBonjourServiceType).value_or(""),

@@ -9,6 +9,7 @@
 #include "bonjour/identity_keys.h"
 #include "bonjour/model_match.h"
 #include "bonjour/txt_record.h"
+#include "tools/check/spelling.h"
 #include "tools/devices/text.h"
 
 namespace onramp::devices {
@@ -81,6 +82,11 @@ std::string edgeBlanks(const std::string& announced) {
                                                    : "differs in blanks at its edges from";
 }
 
+std::string nearestOf(const std::string& announced, const Medium& medium) {
+  const auto nearest = check::Spelling(medium.models).nearest(announced);
+  return nearest ? ", the nearest is " + inQuotes(*nearest) : "";
+}
+
 }  // namespace
 
 std::vector<std::string> ipv4AddressesOf(const Dictionary& record) {
@@ -121,9 +127,10 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
       return differs("maker-twice", "repeats the maker, unlike", announced, known);
     }
   }
-  return Verdict{.id = "not-on-medium",
-                 .why = inQuotes(announced) + " is no model of this medium",
-                 .remedy = "take the medium that is made for this model, or add the model"};
+  return Verdict{
+      .id = "not-on-medium",
+      .why = inQuotes(announced) + " is no model of this medium" + nearestOf(announced, medium),
+      .remedy = "take the medium that is made for this model, or add the model"};
 }
 
 }  // namespace onramp::devices

@@ -37,13 +37,21 @@ Needs root or sudo; COMMAND runs as you in either case.
 """
 
 DETAILS = """
-the description is a TOML file with one table for each device:
+the description is a TOML file with one table for the network, which may be left out:
+    [network]
+    ipv6 = true                    false: IPv4 alone; default true
+    interfaces = 2                 1 or 2; default 1. Both see all devices, as Ethernet and Wi-Fi do
+                                   in one network. They are practice0 and practice1, without
+                                   --hosts 2 lo and practice1.
+    domains = ["annex.local"]      to be browsed besides "local"; default none
+and one table for each device:
     [[device]]
     name = "Kestrel Model 100"     the name in the wizard's list; all else may be left out
     maker = "Kestrel"              as in the medium's model names: maker, blank, model
     model = "Model 100"
     note = "2nd floor"             where it stands
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
+    domain = "annex.local"         default "local"; other domains have to end in ".local"
     port = 631                     default: the type's usual port
     addresses = ["127.0.1.9"]      or how many to choose for it; default 1
     activeif = 2                   what SNMP says: 2 is wireless, the default. "silent": takes the
@@ -61,6 +69,8 @@ the entries of the file, as KEY=VALUE):
     practice-network ctl set NAME KEY=VALUE ...       such as activeif=silent, delay=3, note=Attic
     practice-network ctl rename NAME NEW-NAME
     practice-network ctl remove NAME
+    practice-network ctl unplug INTERFACE             takes an interface away, as with its cable
+    practice-network ctl plug INTERFACE               brings it back
     practice-network ctl stop-daemon | start-daemon | restart-daemon      Avahi's
     practice-network ctl settle                       waits until all devices are established
 Python tests import PracticeNetwork from tools/practice_network for the same. Both find the network
@@ -153,7 +163,8 @@ def _steer(request):
     requests = parser.add_subparsers(dest="operation", required=True, metavar="REQUEST")
     for name, operands in (("add", ["name", "entries"]), ("remove", ["name"]),
                            ("rename", ["name", "new_name"]), ("set", ["name", "entries"]),
-                           ("list", []), ("settle", []), ("stop-daemon", []),
+                           ("list", []), ("unplug", ["interface"]), ("plug", ["interface"]),
+                           ("settle", []), ("stop-daemon", []),
                            ("start-daemon", []), ("restart-daemon", [])):
         one = requests.add_parser(name)
         for operand in operands:

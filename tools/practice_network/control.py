@@ -18,7 +18,7 @@ class PracticeNetwork:
     """The network that this process runs in, for tests and for `practice-network ctl`.
 
     Devices are named by their name. Entries are those of the description file: `maker`, `model`,
-    `note`, `type`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation returns when
+    `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation returns when
     the network has carried it out; Avahi takes another second to establish what is new, for which
     settle() waits. A refused operation raises ControlError and changes nothing.
     """
@@ -50,6 +50,13 @@ class PracticeNetwork:
     def list(self):
         """One dictionary a device: its entries, and its "state": "established" and others."""
         return self._ask("list")
+
+    def unplug(self, interface):
+        """Takes an interface away from devices and command; plug() brings it back."""
+        self._ask("unplug", interface)
+
+    def plug(self, interface):
+        self._ask("plug", interface)
 
     def stop_daemon(self):
         self._ask("stop_daemon")
@@ -85,7 +92,8 @@ class PracticeNetwork:
         return answer["result"]
 
 
-OPERATIONS = ("add", "remove", "rename", "set", "list", "stop_daemon", "start_daemon")
+OPERATIONS = ("add", "remove", "rename", "set", "list", "unplug", "plug", "stop_daemon",
+              "start_daemon")
 
 
 def serve(network, listener):

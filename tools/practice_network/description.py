@@ -1,4 +1,4 @@
-"""The description of the made-up devices: what may stand in it, and what is wrong with it."""
+"""The description of the network and its devices: what may stand in it, and what is wrong with it."""
 
 import dataclasses
 import difflib
@@ -25,6 +25,15 @@ class DescriptionError(Exception):
 
 
 @dataclasses.dataclass(frozen=True)
+class Settings:
+    """What the description says of the network itself."""
+
+    ipv6: bool = True
+    interfaces: int = 1
+    domains: tuple[str, ...] = ()
+
+
+@dataclasses.dataclass(frozen=True)
 class Device:
     """One made-up device. `addresses` may be a number: that many are then chosen by the network."""
 
@@ -33,6 +42,7 @@ class Device:
     model: str | None = None
     note: str | None = None
     type: tuple[str, ...] = (DEFAULT_TYPE,)
+    domain: str = "local"
     port: int | None = None
     addresses: int | tuple[str, ...] = 1
     activeif: tuple[int | str, ...] = (2,)
@@ -64,7 +74,7 @@ def address_count(addresses):
 
 
 def load(path):
-    """The devices of a description file, in its order."""
+    """The settings and the devices of a description file, these in its order."""
     try:
         with open(path, "rb") as file:
             content = tomllib.load(file)
@@ -75,10 +85,14 @@ def load(path):
     except tomllib.TOMLDecodeError as error:
         raise DescriptionError(f"{path}: is not valid TOML: {error}") from None
 
+    settings = content.pop("network", {})
+    if not isinstance(settings, dict):
+        raise DescriptionError(f"{path}: write [network], in single brackets, before its entries")
+    settings = Settings(**_read(settings, SETTING_READERS, f"{path}: network"))
     tables = content.pop("device", [])
     if content:
-        raise DescriptionError(f'{path}: unknown entry "{next(iter(content))}"; '
-                               "a device starts with the line [[device]]")
+        raise DescriptionError(f'{path}: unknown entry "{next(iter(content))}"; a device starts '
+                               "with the line [[device]], the network's settings with [network]")
     if not isinstance(tables, list) or not all(isinstance(table, dict) for table in tables):
         raise DescriptionError(f"{path}: write [[device]], in double brackets, before each device")
     devices = []
@@ -87,8 +101,8 @@ def load(path):
         devices.append(device(table, f"{path}: device {place}"))
         if any(earlier.name == devices[-1].name for earlier in devices[:-1]):
             raise DescriptionError(f"{path}: device {place}: the name is used twice; "
-                                   "give each device a name of its own")
-    return devices
+                                   "give each device a different name")
+    return settings, devices
 
 
 def device(table, place):
@@ -98,17 +112,7 @@ def device(table, place):
 
 def change(before, table, place):
     """The device `before` with the entries of `table` put in; a new one when `before` is None."""
-    values = {}
-    for key, value in table.items():
-        if key not in READERS:
-            near = difflib.get_close_matches(key, READERS, 1)
-            known = f'did you mean "{near[0]}"?' if near else f"known are {', '.join(READERS)}"
-            raise DescriptionError(f'{place}: unknown entry "{key}"; {known}')
-        reader, wanted = READERS[key]
-        try:
-            values[key] = reader(value)
-        except (TypeError, ValueError):
-            raise DescriptionError(f"{place}: {key} must be {wanted}, not {value!r}") from None
+    values = _read(table, READERS, place)
     if before is None and "name" not in values:
         raise DescriptionError(f"{place}: name is missing; give {READERS['name'][1]}")
 
@@ -123,6 +127,22 @@ def change(before, table, place):
                 raise DescriptionError(f"{place}: the text of {key} is too long; "
                                        "key and text may have 254 bytes together")
     return result
+
+
+def _read(table, readers, place):
+    """The table's values, each checked by the reader of its key."""
+    values = {}
+    for key, value in table.items():
+        if key not in readers:
+            near = difflib.get_close_matches(key, readers, 1)
+            known = f'did you mean "{near[0]}"?' if near else f"known are {', '.join(readers)}"
+            raise DescriptionError(f'{place}: unknown entry "{key}"; {known}')
+        reader, wanted = readers[key]
+        try:
+            values[key] = reader(value)
+        except (TypeError, ValueError):
+            raise DescriptionError(f"{place}: {key} must be {wanted}, not {value!r}") from None
+    return values
 
 
 def _text(value):
@@ -145,6 +165,18 @@ def _types(value):
         if not re.fullmatch(r"_(?=.*[A-Za-z])[A-Za-z0-9-]{2,15}\._(tcp|udp)", _text(service_type)):
             raise ValueError
     return types
+
+
+def _domain(value):
+    if not re.fullmatch(r"([A-Za-z0-9-]{1,63}\.)*local", _text(value)):
+        raise ValueError
+    return value
+
+
+def _domains(value):
+    if not isinstance(value, list):
+        raise TypeError
+    return tuple(map(_domain, value))
 
 
 def _whole(value, low, high):
@@ -177,7 +209,7 @@ def _delay(value):
     return value
 
 
-def _present(value):
+def _truth(value):
     if type(value) is not bool:
         raise TypeError
     return value
@@ -199,12 +231,19 @@ READERS = {
     "model": (_text, "a text"),
     "note": (_text, "a text"),
     "type": (_types, 'a service type such as "_ipp._tcp", or a list of different ones'),
+    "domain": (_domain, 'a domain such as "annex.local"'),
     "port": (lambda value: _whole(value, 1, 65535), "a whole number from 1 to 65535"),
     "addresses": (_addresses, 'a number from 1 to 32, or a list of different addresses such as '
                               '["127.0.1.9"]'),
     "activeif": (_activeif, 'a whole number, "silent", "closed", "missing" or "text", '
                             "or a list of these with one for each address"),
     "delay": (_delay, "a number of seconds from 0 to 3600"),
-    "present": (_present, "true or false"),
+    "present": (_truth, "true or false"),
     "txt": (_txt, 'a table of texts such as {rp = "auto"}'),
+}
+
+SETTING_READERS = {
+    "ipv6": (_truth, "true or false"),
+    "interfaces": (lambda value: _whole(value, 1, 2), "1 or 2"),
+    "domains": (_domains, 'a list of domains such as ["annex.local"]'),
 }

@@ -1,4 +1,4 @@
-"""One host of the practice network: its interface, its /run, its system bus and its Avahi."""
+"""One host of the practice network: its interfaces, its /run, its system bus and its Avahi."""
 
 import os
 import pathlib
@@ -10,6 +10,7 @@ BUS_SOCKET = "/run/dbus/system_bus_socket"
 BUS_ADDRESS = f"unix:path={BUS_SOCKET}"
 
 MULTICAST = "224.0.0.0/4"
+IN_FIRST_HOST = ("nsenter", "--target", "1", "--net")
 
 BUS_CONFIGURATION = f"""\
 <busconfig>
@@ -33,8 +34,9 @@ AVAHI_CONFIGURATION = """\
 [server]
 host-name={host_name}
 use-ipv4=yes
-use-ipv6=no
-allow-interfaces={interface}
+use-ipv6={ipv6}
+allow-interfaces={interfaces}
+browse-domains={domains}
 enable-dbus=yes
 clients-max=4096
 objects-per-client-max=65536
@@ -68,41 +70,79 @@ def take_over_run():
     RUN.mkdir()
 
 
-def loop_back():
-    """Makes the loopback interface of this network namespace the network."""
-    run("ip", "link", "set", "lo", "up", "multicast", "on")
-    run("ip", "route", "add", MULTICAST, "dev", "lo")
+def loop_back(second):
+    """Makes loopback this network namespace's network; `second` names another interface, or is
+    None."""
+    _configure("lo")
+    if second:
+        run("ip", "link", "add", second, "type", "veth", "peer", "name", "far-end")
+        run("ip", "link", "set", "far-end", "up")
+        _configure(second, "192.0.2.1/24")
 
 
-def plug_in_cable(name, own_address, first_address):
-    """Joins this network namespace and that of the first process by a virtual cable."""
-    first = ("nsenter", "--target", "1", "--net")
-    run("ip", "link", "add", name, "type", "veth", "peer", "name", name, "netns", "1")
-    for enter, address in (((), own_address), (first, first_address)):
-        run(*enter, "ip", "link", "set", "lo", "up")
-        run(*enter, "ip", "address", "add", address, "dev", name)
-        run(*enter, "ip", "link", "set", name, "up")
-        run(*enter, "ip", "route", "add", MULTICAST, "dev", name)
+def plug_in_cables(names):
+    """Joins this network namespace and that of the first process by virtual cables.
+
+    All are in one network, as those of a computer on Ethernet and Wi-Fi are: what a cable carries,
+    the next one carries when it is unplugged.
+    """
+    for number, name in enumerate(names):
+        run("ip", "link", "add", name, "type", "veth", "peer", "name", name, "netns", "1")
+        for enter, address in (((), f"192.0.2.{2 * number + 2}/24"),
+                               (IN_FIRST_HOST, f"192.0.2.{2 * number + 1}/24")):
+            if not number:
+                run(*enter, "ip", "link", "set", "lo", "up")
+                _set_kernel("ipv4/conf/all/ignore_routes_with_linkdown", 1, enter)
+            _configure(name, address, number, enter)
+
+
+def _configure(name, address=None, metric=0, enter=()):
+    # Addresses are this network's own, so that nobody need be asked for a second whether they are
+    # free.
+    _set_kernel(f"ipv6/conf/{name}/accept_dad", 0, enter)
+    if address:
+        run(*enter, "ip", "address", "add", address, "dev", name, "metric", str(metric))
+    _bring_up(name, metric, enter)
+
+
+def _bring_up(name, metric, enter):
+    run(*enter, "ip", "link", "set", name, "up", "multicast", "on")
+    run(*enter, "ip", "route", "replace", MULTICAST, "dev", name, "metric", str(metric))
+
+
+def _set_kernel(key, value, enter):
+    run(*enter, "sh", "-c", f"echo {value} > /proc/sys/net/{key}")
 
 
 class Host:
     """The host that this process's namespaces are, with its system bus, and Avahi once started."""
 
-    def __init__(self, name, interface):
+    def __init__(self, name, interfaces, settings):
         self._name = name
-        self._interface = interface
+        self.interfaces = interfaces
+        self._settings = settings
         self._avahi = None
         self._start_bus()
 
     def add_address(self, address):
-        run("ip", "address", "replace", address, "dev", self._interface)
+        run("ip", "address", "replace", address, "dev", self.interfaces[0])
+
+    def plug(self, interface, plugged):
+        """Brings an interface up, or down when not `plugged`, at both ends of a cable."""
+        for enter in ((), IN_FIRST_HOST):
+            if plugged:
+                _bring_up(interface, self.interfaces.index(interface), enter)
+            else:
+                run(*enter, "ip", "link", "set", interface, "down")
 
     def start_avahi(self):
         if self._avahi and self._avahi.poll() is None:
             return
         configuration = RUN / "avahi-daemon.conf"
-        configuration.write_text(
-            AVAHI_CONFIGURATION.format(host_name=self._name, interface=self._interface))
+        configuration.write_text(AVAHI_CONFIGURATION.format(
+            host_name=self._name, interfaces=",".join(self.interfaces),
+            domains=",".join(self._settings.domains),
+            ipv6="yes" if self._settings.ipv6 else "no"))
         self._avahi = _start("avahi-daemon", "-f", configuration, "--no-drop-root", "--no-chroot",
                              "--no-rlimits")
 

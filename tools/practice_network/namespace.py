@@ -14,13 +14,13 @@ from practice_network.agents import AgentError
 from practice_network.control import SOCKET_VARIABLE, serve
 from practice_network.description import DescriptionError
 from practice_network.host import (BUS_ADDRESS, RUN, Host, HostError, log, loop_back,
-                                   plug_in_cable, take_over_run)
+                                   plug_in_cables, take_over_run)
 from practice_network.network import Network
 from practice_network.publisher import PublishError, connect
 
 ENCLOSE = ["unshare", "--net", "--mount", "--pid", "--fork", "--kill-child", "--mount-proc"]
 LAUNCHER = str(pathlib.Path(__file__).resolve().parent.parent / "practice-network")
-CABLE = "practice0"
+CABLES = ("practice0", "practice1")
 BAD_INPUT = 2
 NETWORK_FAILED = 125
 
@@ -69,7 +69,8 @@ def inside(options):
         if devices.stdout.readline() != b"ready\n":
             return devices.wait()
         if options["hosts"] == 2:
-            Host("wizard", CABLE).start_avahi()
+            settings, _ = description.load(options["description"])
+            Host("wizard", CABLES[:settings.interfaces], settings).start_avahi()
             connect(BUS_ADDRESS)
     except (HostError, PublishError) as error:
         return _fail(error)
@@ -91,14 +92,17 @@ def inside(options):
 def devices(options):
     """The process that has the devices: on the command's host, or on a host of their own."""
     try:
+        settings, described = description.load(options["description"])
         if options["hosts"] == 2:
             take_over_run()
-            plug_in_cable(CABLE, "192.0.2.2/24", "192.0.2.1/24")
-            network = Network(Host("devices", CABLE), "192.0.2.0/24")
+            interfaces = CABLES[:settings.interfaces]
+            plug_in_cables(interfaces)
+            network = Network(Host("devices", interfaces, settings), "192.0.2.0/24")
         else:
-            loop_back()
-            network = Network(Host("practice", "lo"), "127.0.0.0/8")
-        network.load(description.load(options["description"]))
+            interfaces = ("lo", CABLES[1])[:settings.interfaces]
+            loop_back(*interfaces[1:] or (None,))
+            network = Network(Host("practice", interfaces, settings), "127.0.0.0/8")
+        network.load(described)
         network.settle()
     except DescriptionError as error:
         print(f"practice-network: {options['description']}: {error}", file=sys.stderr)

@@ -44,6 +44,19 @@ class Network:
                 if device.present:
                     self._publish(device)
 
+    def unplug(self, interface):
+        """Takes an interface away from both hosts; plug() brings it back."""
+        self._plug(interface, False)
+
+    def plug(self, interface):
+        self._plug(interface, True)
+
+    def _plug(self, interface, plugged):
+        if interface not in self._host.interfaces:
+            raise DescriptionError(f'interface "{interface}": is not known; known are '
+                                   + ", ".join(self._host.interfaces))
+        self._host.plug(interface, plugged)
+
     def settle(self, seconds=30):
         """Waits until everything is established that is published."""
         deadline = time.monotonic() + seconds
@@ -105,7 +118,7 @@ class Network:
             self._publisher.publish_addresses(after)
         if _service_part(before) != _service_part(after):
             self._publisher.await_probed(before)
-            if (before.type, before.port) == (after.type, after.port):
+            if _where(before) == _where(after):
                 self._publisher.publish_txt(after)
             else:
                 self._publisher.withdraw(before)
@@ -182,4 +195,8 @@ def _agent_part(device):
 
 
 def _service_part(device):
-    return [(one, device.port_of(one), device.txt_of(one)) for one in device.type]
+    return [(one, device.txt_of(one)) for one in device.type], _where(device)
+
+
+def _where(device):
+    return device.type, device.domain, device.port

@@ -68,7 +68,7 @@ class Publisher:
         self.publish_addresses(device)
         for service_type in device.type:
             entry.services.AddService(
-                ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name, service_type, "local",
+                ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name, service_type, device.domain,
                 entry.host, dbus.UInt16(device.port_of(service_type)), _txt(device, service_type))
         entry.services.Commit()
 
@@ -88,7 +88,7 @@ class Publisher:
         services = self._entries[device.name].services
         for service_type in device.type:
             services.UpdateServiceTxt(ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name,
-                                      service_type, "local", _txt(device, service_type))
+                                      service_type, device.domain, _txt(device, service_type))
 
     def withdraw(self, device):
         if entry := self._entries.pop(device.name, None):

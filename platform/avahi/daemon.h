@@ -1,0 +1,82 @@
+#pragma once
+
+#include <systemd/sd-bus.h>
+
+#include <functional>
+#include <map>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "platform/avahi/handles.h"
+#include "platform/avahi/loop_thread.h"
+#include "platform/avahi/timer.h"
+
+namespace onramp::avahi {
+
+class Query;
+
+/// The way to the Avahi daemon over the system's message bus. Bus and daemon may be absent, come
+/// and go at any time; queries last, and are put again to each new daemon. No call ever waits for
+/// the daemon. Main thread only. README.md tells the whole story.
+class Daemon {
+ public:
+  /// The one that the main thread's loop runs, alive for as long as somebody holds it. Null when a
+  /// descriptor or thread cannot be had.
+  [[nodiscard]] static std::shared_ptr<Daemon> shared();
+
+  /// One that runs only inside runUntil(); null when a descriptor cannot be had.
+  [[nodiscard]] static std::unique_ptr<Daemon> create();
+
+  Daemon(const Daemon&) = delete;
+  Daemon& operator=(const Daemon&) = delete;
+  ~Daemon() = default;
+
+  /// Blocks until `done`; false when the loop fails before.
+  bool runUntil(const std::function<bool()>& done);
+
+  /// How often the daemon has gone so far.
+  [[nodiscard]] unsigned losses() const { return losses_; }
+
+  [[nodiscard]] sd_event* loop() const { return loop_.get(); }
+
+ private:
+  friend class Query;
+  using Reply = std::function<void(sd_bus_message*)>;
+
+  explicit Daemon(EventLoop loop);
+
+  // For queries.
+  void add(Query* query);
+  void remove(Query* query);
+  void listen(const std::string& path, Query* query) { listeners_[path] = query; }
+  void stopListening(const std::string& path) { listeners_.erase(path); }
+  [[nodiscard]] Message newCall(const char* method) const;
+  bool call(sd_bus_message* message, Reply reply);
+  void tell(const std::string& path, const char* interface, const char* method);
+  void retryLater();
+
+  void connect();
+  bool watchDaemon();
+  void startDaemon();
+  [[nodiscard]] Message newBusCall(const char* method) const;
+  void arrived();
+  void lost();
+  void runSoon();
+  static int onMessage(sd_bus_message* message, void* self, sd_bus_error* error);
+  static int onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error* error);
+
+  // Destroyed from the last to the first: the thread polls the loop, and the bus and the timer
+  // belong to it.
+  EventLoop loop_;
+  Timer retry_;
+  std::vector<Query*> queries_;
+  std::map<std::string, Query*> listeners_;  ///< by the daemon's path of the query's object
+  unsigned losses_ = 0;
+  bool isPresent_ = false;    ///< the daemon is on the bus
+  bool isConnected_ = false;  ///< `bus_` is there and works
+  Bus bus_;
+  std::shared_ptr<LoopThread> thread_;
+};
+
+}  // namespace onramp::avahi

@@ -1,0 +1,76 @@
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <tuple>
+#include <vector>
+
+#include "base/value.h"
+#include "platform/avahi/query.h"
+
+namespace onramp::avahi {
+
+/// A service's name in its three parts, as the daemon has them: without escapes in the name,
+/// without closing dots.
+struct Instance {
+  std::string name;
+  std::string type;
+  std::string domain;
+  friend bool operator<(const Instance& a, const Instance& b) {
+    return std::tie(a.name, a.type, a.domain) < std::tie(b.name, b.type, b.domain);
+  }
+};
+
+/// The types of DNS records that are asked for (RFC 1035 section 3.2.2, RFC 3596, RFC 2782).
+enum class RecordType : std::uint16_t { kIPv4 = 1, kTXT = 16, kIPv6 = 28, kServer = 33 };
+
+/// All records of one name and type on any interface and protocol, for as long as this lives.
+class Records {
+ public:
+  struct Record {
+    std::int32_t interface;
+    std::int32_t protocol;
+    Data data;  ///< as on the wire, with names uncompressed
+    friend bool operator==(const Record&, const Record&) = default;
+  };
+
+  /// `name` is a domain name with escapes, without closing dot. `changed` is called from within the
+  /// daemon's loop and must not destroy this object.
+  Records(Daemon& daemon, const std::string& name, RecordType type, std::function<void()> changed);
+
+  /// In the order in which the daemon told of them.
+  [[nodiscard]] const std::vector<Record>& all() const { return records_; }
+
+  /// Whether the daemon has told all that it knew already.
+  [[nodiscard]] bool isCacheExhausted() const { return isCacheExhausted_; }
+
+  [[nodiscard]] bool isRefused() const { return query_.isRefused(); }
+
+ private:
+  void happened(Query::Event event, sd_bus_message* message);
+
+  std::function<void()> changed_;
+  std::vector<Record> records_;
+  bool isCacheExhausted_ = false;
+  Query query_;
+};
+
+/// The instance's full domain name, with escapes (RFC 6763 section 4.3).
+[[nodiscard]] std::string fullName(const Instance& instance);
+
+/// Where an SRV record says that a service is to be had.
+struct Server {
+  std::string host;  ///< a domain name with escapes, without closing dot
+  std::uint16_t port = 0;
+};
+
+/// What an SRV record's data says (RFC 2782); nothing when it is malformed.
+[[nodiscard]] std::optional<Server> serverIn(const Data& data);
+
+/// An address record's address as the seam's socket address; nothing when the data has the size of
+/// neither an IPv4 nor an IPv6 address.
+[[nodiscard]] std::optional<Data> socketAddress(const Records::Record& record, std::uint16_t port);
+
+}  // namespace onramp::avahi

@@ -1,0 +1,64 @@
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "base/value.h"
+#include "platform/avahi/daemon.h"
+#include "platform/avahi/records.h"
+#include "platform/avahi/timer.h"
+
+namespace onramp::avahi {
+
+/// What a resolve has found, in the form in which the seam gives it.
+struct Resolution {
+  std::vector<Data> addressing;
+  Data txt;
+};
+
+/// Looks for the server, the TXT record and the addresses of one service, on whatever interface
+/// and protocol they are to be had. It goes on until all are there or its time is up, however often
+/// the daemon goes and comes back.
+class Resolve {
+ public:
+  /// Called once, from within the daemon's loop; with nothing when the time was up. It must not
+  /// destroy the resolve.
+  using Report = std::function<void(std::optional<Resolution>)>;
+
+  /// The daemon must outlive the resolve.
+  Resolve(Daemon& daemon, const Instance& service,
+          std::optional<std::chrono::milliseconds> timeLimit, Report report);
+
+  /// Whether the daemon says that no service can have that name.
+  [[nodiscard]] bool isRefused() const { return server_ && server_->isRefused(); }
+
+ private:
+  void begin();
+  void ask(std::optional<Records>& records, const std::string& name, RecordType type);
+  void check();
+  [[nodiscard]] const Records* knownAddresses();
+  void end(std::optional<Resolution> resolution);
+
+  Daemon& daemon_;
+  std::string name_;
+  Report report_;
+  Timer check_;  ///< due when something has changed and all messages are read
+  Timer timeUp_;
+  Timer graceForIPv4_;
+  bool isGraceOver_ = false;
+  unsigned losses_ = 0;  ///< of the daemon, when the resolve began
+  // A daemon allows each client a limited number of questions, so each ends with its answer.
+  std::optional<Records> server_;
+  std::optional<Records> txt_;
+  std::optional<Records> ipv4_;
+  std::optional<Records> ipv6_;
+  std::string host_;
+  std::uint16_t port_ = 0;
+  std::optional<Data> txtData_;
+};
+
+}  // namespace onramp::avahi

@@ -1,0 +1,162 @@
+// What the macOS backends do with the frameworks' objects, on frameworks that stand in for them.
+
+#include <CoreServices/CoreServices.h>
+#include <SystemConfiguration/SystemConfiguration.h>
+#include <gmock/gmock.h>
+
+#include "platform/corefoundation/convert.h"
+#include "platform/dynamic_store.h"
+#include "platform/net_service.h"
+
+namespace onramp {
+namespace {
+
+using corefoundation::Reference;
+using corefoundation::toCFArray;
+using corefoundation::toCFString;
+using testing::ElementsAre;
+
+Data bytesOf(std::string_view text) {
+  const auto* const bytes = reinterpret_cast<const std::byte*>(text.data());
+  return {bytes, bytes + text.size()};
+}
+
+Reference<CFNetServiceRef> makeService() {
+  return Reference<CFNetServiceRef>(CFNetServiceCreate(nullptr, toCFString("local.").get(),
+                                                       toCFString("_ipp._tcp.").get(),
+                                                       toCFString("Büro").get(), 0));
+}
+
+struct Seen {
+  NetServiceBrowserRef browser;
+  NetServiceRef service;
+  unsigned long flags = 0;
+  std::int32_t code = 0;
+  int events = 0;
+
+  static void browsed(const NetServiceBrowserRef&, unsigned long flags,
+                      const NetServiceRef& service, const NetServiceError& error, void* info) {
+    auto& seen = *static_cast<Seen*>(info);
+    seen.service = service;
+    seen.flags = flags;
+    seen.code = error.code;
+    ++seen.events;
+  }
+
+  static void endBrowser(const NetServiceBrowserRef&, unsigned long, const NetServiceRef&,
+                         const NetServiceError&, void* info) {
+    static_cast<Seen*>(info)->browser.reset();
+  }
+
+  static void resolved(const NetServiceRef&, const NetServiceError& error, void* info) {
+    auto& seen = *static_cast<Seen*>(info);
+    seen.code = error.code;
+    ++seen.events;
+    seen.service.reset();
+  }
+};
+
+// Hands the browser's client an event, as the framework does while the browser is scheduled.
+void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
+  standin::Browser& browser = *standin::Browser::last;
+  ASSERT_TRUE(browser.isScheduled && browser.client);
+  CFStreamError error = {0, code};
+  browser.client(&browser, flags, found, &error, browser.info);
+}
+
+TEST(CFNetworkBrowser, HandsOnWhatIsFoundAndWhatWentWrong) {
+  Seen seen;
+  seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
+  seen.browser->schedule();
+  EXPECT_TRUE(seen.browser->searchForServices("local.", "_ipp._tcp."));
+  EXPECT_EQ(standin::Browser::last->searched, "_ipp._tcp. in local.");
+
+  const auto service = makeService();
+  deliver(kNetServiceFlagMoreComing, service.get(), 0);
+  ASSERT_TRUE(seen.service);
+  EXPECT_EQ(seen.service->name(), "Büro");
+  EXPECT_EQ(seen.service->type(), "_ipp._tcp.");
+  EXPECT_EQ(seen.service->domain(), "local.");
+  EXPECT_EQ(seen.flags, kNetServiceFlagMoreComing);
+
+  const NetServiceRef first = seen.service;
+  deliver(kNetServiceFlagRemove, service.get(), 0);
+  EXPECT_EQ(seen.service, first);
+  EXPECT_EQ(seen.flags, kNetServiceFlagRemove);
+}
+
+TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndIsSilentWhenUnscheduled) {
+  Seen seen;
+  seen.browser = NetServiceBrowser::create(Seen::endBrowser, &seen);
+  seen.browser->schedule();
+  const auto kept = Reference<CFNetServiceBrowserRef>::retaining(standin::Browser::last);
+  deliver(0, makeService().get(), 0);
+  EXPECT_FALSE(seen.browser);
+  EXPECT_EQ(kept.get()->client, nullptr);
+
+  seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
+  seen.browser->schedule();
+  seen.browser->unschedule();
+  EXPECT_FALSE(standin::Browser::last->isScheduled);
+}
+
+TEST(CFNetworkService, ResolvesIntoAddressesAndTextAndMayBeDroppedByItsClient) {
+  Seen seen;
+  seen.service = NetService::create("local.", "_ipp._tcp.", "Büro", 0);
+  auto* native = standin::Service::last;
+  const auto kept = Reference<CFNetServiceRef>::retaining(native);
+  EXPECT_TRUE(seen.service->addressing().empty());
+  EXPECT_EQ(seen.service->txtData(), std::nullopt);
+
+  seen.service->setClient(Seen::resolved, &seen);
+  seen.service->schedule();
+  EXPECT_TRUE(seen.service->resolveWithTimeout(5));
+  EXPECT_TRUE(native->isScheduled && native->isRunning);
+
+  standin::Object addresses(standin::kArray), txt(standin::kData, std::string("\3a=1", 4));
+  addresses.members = {new standin::Object(standin::kData, "one"),
+                       new standin::Object(standin::kData, std::string("t\0o", 3))};
+  native->addresses = &addresses;
+  native->txt = &txt;
+  EXPECT_THAT(seen.service->addressing(),
+              ElementsAre(bytesOf("one"), bytesOf(std::string("t\0o", 3))));
+  EXPECT_EQ(seen.service->txtData(), bytesOf("\3a=1"));
+
+  CFStreamError error = {0, kNetServiceErrorTimeout};
+  native->client(native, &error, native->info);
+  EXPECT_EQ(seen.code, kNetServiceErrorTimeout);
+  EXPECT_FALSE(native->isScheduled || native->isRunning || native->client);
+}
+
+TEST(CFNetworkService, IsNotMadeOfTextsThatAreNotUTF8) {
+  EXPECT_EQ(NetService::create("local.", "_ipp._tcp.", "B\xFCro", 0), nullptr);
+  EXPECT_EQ(corefoundation::toCFArray({"a", "\xFF", "b"}).get()->members.size(), 2U);
+}
+
+TEST(SystemConfigurationStore, AsksByKeysAndByPatternsAndLeavesOutWhatIsNoText) {
+  const DynamicStoreRef store = createDynamicStore("test");
+  const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
+  EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");
+  EXPECT_EQ(copyMultiple(store, {*key}, {}), (Dictionary{{"keys", Array{*key}}}));
+  EXPECT_EQ(copyMultiple(store, {}, {"a", "b"}), (Dictionary{{"patterns", Array{"a", "b"}}}));
+  EXPECT_EQ(copyMultiple(nullptr, {*key}, {}), std::nullopt);
+  EXPECT_EQ(lastDynamicStoreError(), kSCStatusNoStoreSession);
+}
+
+TEST(SystemConfigurationStore, KeepsItsCallbackAsLongAsItsSourceLives) {
+  std::vector<std::string> changed;
+  DynamicStoreRef store =
+      createDynamicStore("test", [&](const std::vector<std::string>& keys) { changed = keys; });
+  EXPECT_TRUE(setNotificationKeys(store, {"a"}, {}));
+  DynamicStoreSourceRef source = createRunLoopSource(store, 0);
+  addSourceToMainLoop(source);
+  store.reset();
+  standin::Store::last->change(toCFArray({"a", "b"}).get());
+  EXPECT_THAT(changed, ElementsAre("a", "b"));
+  source.reset();
+  EXPECT_EQ(standin::Store::last, nullptr);
+  EXPECT_EQ(createRunLoopSource(nullptr, 0), nullptr);
+}
+
+}  // namespace
+}  // namespace onramp

@@ -1,0 +1,295 @@
+"""Breaks a copy of the example medium in one way at a time and reads what onramp-check says.
+Arguments: the program, the application's information dictionary."""
+
+import json
+import os
+import plistlib
+import re
+import shutil
+import subprocess
+import sys
+import tempfile
+import unittest
+from pathlib import Path
+
+PROGRAM, INFORMATION = sys.argv[1:]
+ROOT = Path(__file__).resolve().parents[2]
+APPLICATION = "Onramp OSX.app/Contents"
+COMMON = "MacResources/CDCommonInfo.plist"
+DESCRIPTION = "MacResources/CDInfo.plist"
+MODELS = "MacResources/ModelInfo.plist"
+MESSAGES = "MacResources/CDCommonMessage.bundle/Contents"
+ENGLISH = f"{MESSAGES}/Resources/en.lproj/Localizable.strings"
+TOOL = "Utilities/Kestrel Wireless Setup.app/Contents"
+PROGRAM_OF_TOOL = f"{TOOL}/MacOS/Kestrel Wireless Setup"
+PACKAGE = "Packages/Kestrel Imaging Installer.pkg"
+MODEL = "Kestrel Model 100"
+PICTURE = "MacResources/Images/usb.png"
+
+
+def make_medium(folder):
+    shutil.copytree(ROOT / "examples/medium", folder)
+    resources = folder / APPLICATION / "Resources"
+    resources.mkdir(parents=True)
+    for source in ROOT.glob("resources/*.lproj"):
+        shutil.copytree(source, resources / source.name)
+    for name in ("Background.png", "SupportedKOL.plist"):
+        shutil.copy(ROOT / "resources" / name, resources)
+    shutil.copy(INFORMATION, folder / APPLICATION / "Info.plist")
+    program = folder / APPLICATION / "MacOS/Onramp OSX"
+    program.parent.mkdir()
+    program.touch(0o755)
+
+
+def run(*arguments, **options):
+    return subprocess.run((PROGRAM,) + arguments, capture_output=True, text=True, timeout=60,
+                          check=False, **options)
+
+
+# Each of these returns what breaks a medium's folder.
+
+def edit(path, change, form=plistlib.FMT_XML):
+    def breaker(folder):
+        contents = plistlib.loads((folder / path).read_bytes())
+        change(contents)
+        (folder / path).write_bytes(plistlib.dumps(contents, fmt=form))
+    return breaker
+
+
+def put(path, *keys_and_value):
+    *keys, last, value = keys_and_value
+
+    def change(contents):
+        for key in keys:
+            contents = contents[key]
+        contents[last] = value
+    return edit(path, change)
+
+
+def take(path, *keys):
+    def change(contents):
+        for key in keys[:-1]:
+            contents = contents[key]
+        del contents[keys[-1]]
+    return edit(path, change)
+
+
+def rename(path, old, new, *keys):
+    def change(contents):
+        for key in keys:
+            contents = contents[key]
+        contents[new] = contents.pop(old)
+    return edit(path, change)
+
+
+def replace(path, old, new):
+    def breaker(folder):
+        text = (folder / path).read_text(encoding="utf-8")
+        assert old in text, old
+        (folder / path).write_text(text.replace(old, new, 1), encoding="utf-8")
+    return breaker
+
+
+def remove(path):
+    def breaker(folder):
+        place = folder / path
+        shutil.rmtree(place) if place.is_dir() else place.unlink()
+    return breaker
+
+
+def write(path, contents):
+    def breaker(folder):
+        (folder / path).write_bytes(contents)
+    return breaker
+
+
+def cut_binary(folder):
+    edit(MODELS, lambda contents: None, plistlib.FMT_BINARY)(folder)
+    (folder / MODELS).write_bytes((folder / MODELS).read_bytes()[:-20])
+
+
+def many_texts(path):
+    return write(path, plistlib.dumps({f"key {i}": "x" for i in range(140000)}))
+
+
+def both(*breakers):
+    return lambda folder: [breaker(folder) for breaker in breakers]
+
+
+def packages(**keys):
+    return put(COMMON, "PkgInfo", {"PkgLocation": "Packages"} |
+               {key.removeprefix("v"): Path(PACKAGE).name for key in keys})
+
+
+def maximum(major, minor, bug_fix):
+    return put(COMMON, "SystemMax", {"Major": major, "Minor": minor, "BugFix": bug_fix})
+
+
+# What is done to the medium, the one finding's identifier, and parts of its text.
+MISTAKES = [
+    # The lists.
+    (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
+    (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
+    (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
+    (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "out of the medium"),
+    (put(COMMON, "Comment", "x"), "key-unknown", "does not read"),
+    (take(COMMON, "PkgInfo"), "key-missing", "PkgInfo", "nothing opens"),
+    (take(DESCRIPTION, "ContainedModel"), "key-missing", "ContainedModel", "no models"),
+    (put(COMMON, "SystemMin", "10.6"), "value-kind", 'the string "10.6"', "a dictionary"),
+    (put(DESCRIPTION, "InstallPKG", "PKG_KestrelOnline", "NO"), "value-kind", "boolean"),
+    (rename(DESCRIPTION, "PKG_WebLink", "PKG_WebLnk", "InstallPKG"), "key-misspelt", "PKG_WebLink"),
+    (put(MODELS, "Model", MODEL, "Interfaces", "USB", "NO"), "value-kind", '"NO"', "<false/>"),
+    (put(MODELS, "Model", MODEL, "x"), "value-kind", "a dictionary", "USB only"),
+    (cut_binary, "list-unreadable", "cut off", "opens at once"),
+    (replace(MODELS, "</dict>", "</array>"), "list-unreadable", '"</dict>" is expected'),
+    (replace(MODELS, "<true/>", "<treu/>"), "list-unreadable", "<treu>", "line 12"),
+    (replace(MODELS, "<true/>", ""), "list-unreadable", "no value follows"),
+    (write(MODELS, b""), "list-unreadable", "empty"),
+    (write(MODELS, plistlib.dumps(["x"])), "list-unreadable", "a dictionary"),
+    (many_texts(MODELS), "list-unreadable", "more than 262144 elements"),
+    (write(MODELS, b"<plist>" + b" " * (16 << 20)), "list-unreadable", "at most 16777216 bytes"),
+    (put(f"{APPLICATION}/Info.plist", "CommonResourcePath", 5), "value-kind", "a path"),
+    (remove("Onramp OSX.app"), "application-missing", "double-click"),
+    (remove(f"{APPLICATION}/MacOS/Onramp OSX"), "program-missing", "does not start"),
+    (replace(COMMON, "<key>CDInfo</key>", "<key>CDInfo</key><string>x</string><key>CDInfo</key>"),
+     "key-twice", "every key once"),
+    # The models.
+    (rename(DESCRIPTION, MODEL, "Kestrel Model 10 0", "ContainedModel"), "model-undescribed", MODEL),
+    (take(MODELS, "Model", MODEL), "model-undescribed", "does not have", "USB only"),
+    (take(DESCRIPTION, "ContainedModel", MODEL), "model-unoffered", "cannot be chosen"),
+    (take(MODELS, "Model", MODEL, "KSCID"), "key-missing", "KSCID", "no connection at all"),
+    (take(MODELS, "Model", MODEL, "Interfaces"), "key-missing", "Interfaces", "USB only"),
+    (both(*(put(path, key, "Kestrel100", {"KSCID": "x", "Interfaces":
+        {"USB": True, "WiredLAN": False, "WirelessLAN": True}})
+            for path, key in ((DESCRIPTION, "ContainedModel"), (MODELS, "Model")))),
+     "model-unannounceable", "without a blank"),
+    (both(rename(DESCRIPTION, MODEL, MODEL + " ", "ContainedModel"),
+          rename(MODELS, MODEL, MODEL + " ", "Model")), "model-blanks", "some really do"),
+    (both(*(put(path, key, MODEL.lower(), {"KSCID": "x", "Interfaces":
+        {"USB": True, "WiredLAN": False, "WirelessLAN": True}})
+            for path, key in ((DESCRIPTION, "ContainedModel"), (MODELS, "Model")))),
+     "model-twice", "capitals only"),
+    (both(put(DESCRIPTION, "ContainedModel", {}), put(MODELS, "Model", {}),
+          take(COMMON, "BonjourNetwork"), take(COMMON, "WLANtool")), "models-none", "at once"),
+    # Systems and packages.
+    (packages(v109=1), "package-none", "no package for 10.6.0 up to, but not including, 10.9.0"),
+    (put(COMMON, "PkgInfo", "PkgName", "None.pkg"), "path-missing", "Packages/None.pkg"),
+    (put(COMMON, "PkgInfo", "109", "Old.pkg"), "package-shadowed", '"109"', "every system gets"),
+    (put(COMMON, "PkgInfo", "110", "New.pkg"), "package-key-unknown", "no system uses"),
+    (packages(v105=1, v106=1, v107=1, v108=1, v109=1), "package-key-unused", "outside"),
+    (maximum("10", "15", "7"), "range-excludes-maximum", "10.15.7 itself is refused",
+     "10.6.0 up to, but not including, 10.15.7"),
+    (maximum("10", "5", "x"), "range-empty", "every system is refused"),
+    (maximum("10", "16", "last"), "version-number", '"last"', '"x"'),
+    (maximum("10", "14", "x"), "range-before-application", "10.15 and later"),
+    # The set-up tool.
+    (remove(PROGRAM_OF_TOOL), "program-missing", "Contents/MacOS/Kestrel Wireless Setup"),
+    (lambda folder: os.chmod(folder / PROGRAM_OF_TOOL, 0o644), "program-not-executable", "chmod"),
+    (take(f"{TOOL}/Info.plist", "CFBundleExecutable"), "program-unnamed", "CFBundleExecutable"),
+    (take(f"{TOOL}/Info.plist", "CFBundleDisplayName"), "tool-unnamed", "menu"),
+    (replace(f"{TOOL}/Resources/ja.lproj/InfoPlist.strings", "Kestrel", "Lumora"),
+     "tool-name-left-over", "Lumora", "without \"Kestrel\""),
+    (take(COMMON, "WLANtool"), "tool-none", "no set-up tool runs"),
+    (put(COMMON, "WLANtool", COMMON), "tool-no-bundle", ".app"),
+    # Texts.
+    (replace(ENGLISH, '"INST_TXT_WIFI" = "Wireless Network (Wi-Fi)";\n', ""),
+     "text-missing", "INST_TXT_WIFI", "de, ja, ko, zh_CN"),
+    (replace(ENGLISH, "INST_TXT_WIFI", "INST_TXT_WFI"), "text-misspelt", "INST_TXT_WIFI"),
+    (replace(ENGLISH, "macOS %@", "%@ %@ %@"), "text-placeholders", "3 times", "once or twice"),
+    (replace(ENGLISH, "No device was", "100 % no device was"), "text-percent", "macOS"),
+    (replace(ENGLISH, "Wireless Network", "Wireless Network, " * 5), "text-wide", "450 points"),
+    (replace(ENGLISH, '"Next";', '"";'), "text-empty", "button"),
+    (replace(ENGLISH, '"Next";', '"Next"'), "strings-unreadable", '";" expected', "line 9"),
+    (take(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion"), "region-missing", "left to the system"),
+    (put(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion", "fr"), "region-without-texts",
+     "de, en, ja, ko, zh_CN"),
+    (remove(f"{APPLICATION}/Resources/ko.lproj"), "language-not-in-application", "ko.lproj"),
+    (remove("MacResources/CDCommonMessage.bundle"), "path-missing", "INST_TXT_MODEL"),
+    (replace(ENGLISH, '"BTN_NEXT"', '"OTHER" = "x";\n"BTN_NEXT"'), "text-unknown", "not show"),
+    (lambda folder: (folder / MESSAGES / "Resources/Klingonese.lproj").mkdir(),
+     "language-unknown", "nobody sees"),
+    # Pictures.
+    (remove(PICTURE), "path-missing", "no picture beside USB"),
+    (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
+     "picture-size", "340 × 240", "192 × 192"),
+    (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "no whole PNG"),
+    # Names in the network and in files.
+    (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", '"_pdl-datastream._tcp."'),
+    (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
+    (put(COMMON, "BonjourNetwork", "_http._tcp."), "service-unknown", "which model"),
+    (take(COMMON, "BonjourNetwork"), "service-none", "no device is ever found"),
+    (put(f"{APPLICATION}/Info.plist", "NSBonjourServices", ["_ipp._tcp"]), "service-undeclared",
+     "_pdl-datastream._tcp"),
+    (put(COMMON, "VenderName", "Kestrel/Imaging"), "vendor-folder", "names no folder"),
+    (put(COMMON, "VenderName", "Kestrel " * 40), "vendor-long", "at most"),
+    (put(COMMON, "VenderName", "Kestrél"), "vendor-letters", "outside ASCII"),
+    (put(COMMON, "VenderName", " "), "vendor-empty", "an empty name"),
+    (put(DESCRIPTION, "KSCSeriesCode", "K S"), "series-address", "letters, digits"),
+]
+
+
+def words(finding):
+    line = f'line {finding["line"]}' if "line" in finding else ""
+    return " ".join([*(str(finding.get(part, "")) for part in (
+        "found", "expected", "nearest", "effect", "remedy")), *finding["key"], line])
+
+
+class OnrampCheck(unittest.TestCase):
+    def setUp(self):
+        folder = tempfile.TemporaryDirectory()
+        self.addCleanup(folder.cleanup)
+        self.medium = Path(folder.name) / "medium"
+        make_medium(self.medium)
+
+    def broken(self, breaker):
+        copy = self.medium.parent / "copy"
+        shutil.rmtree(copy, ignore_errors=True)
+        shutil.copytree(self.medium, copy)
+        breaker(copy)
+        return str(copy)
+
+    def test_finds_nothing_on_the_example_medium_and_says_what_users_will_see(self):
+        result = run("--strict", str(self.medium))
+        self.assertEqual((0, ""), (result.returncode, result.stderr), result.stdout)
+        for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the list of models",
+                     f": {PACKAGE}", "zh_CN (31 texts)", "0 errors, 0 warnings, 17 models"):
+            self.assertIn(line, result.stdout)
+
+    def test_tells_each_mistake_once_and_nothing_else(self):
+        for breaker, identifier, *parts in MISTAKES:
+            with self.subTest(identifier, parts=parts):
+                result = run("--json", "--strict", self.broken(breaker))
+                findings = json.loads(result.stdout)["findings"]
+                self.assertEqual([identifier], [finding["id"] for finding in findings], findings)
+                for part in parts:
+                    self.assertIn(part, words(findings[0]))
+                self.assertTrue(findings[0]["effect"] and findings[0]["remedy"], findings)
+                self.assertEqual(1, result.returncode)
+
+    def test_every_rule_is_among_the_mistakes(self):
+        sources = "".join(path.read_text() for path in (ROOT / "tools/check").glob("*.cpp"))
+        rules = set(re.findall(r'\bid = (?:\w+ \? )?"([a-z-]+)"', sources))
+        rules |= set(re.findall(r'\? "([a-z]+-[a-z]+)" : "[a-z]+-[a-z]+"', sources))
+        self.assertGreater(len(rules), 40)
+        self.assertEqual(set(), rules - {identifier for _, identifier, *_ in MISTAKES})
+
+    def test_a_line_has_the_place_the_cause_and_the_remedy(self):
+        result = run(self.broken(replace(ENGLISH, '"Next";', '"Next"')))
+        self.assertEqual(1, result.returncode)
+        line = result.stdout.splitlines()[0]
+        self.assertTrue(line.startswith(f'{ENGLISH}:9: error: ";" expected'), line)
+        self.assertIn("Users get: ", line)
+
+    def test_warnings_count_only_when_it_is_strict(self):
+        medium = self.broken(put(COMMON, "Comment", "x"))
+        self.assertEqual([0, 1], [run(medium).returncode, run("--strict", medium).returncode])
+
+    def test_tells_what_it_cannot_read(self):
+        for arguments in (["/nowhere"], [], ["--jsn", "."], [__file__]):
+            result = run(*arguments)
+            self.assertEqual((2, ""), (result.returncode, result.stdout))
+            self.assertTrue(result.stderr)
+
+
+if __name__ == "__main__":
+    unittest.main(argv=sys.argv[:1])

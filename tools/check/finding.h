@@ -1,0 +1,42 @@
+#pragma once
+
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace onramp::check {
+
+enum class Severity {
+  kError,    ///< users will see something wrong
+  kWarning,  ///< it may be meant, but it often is not
+};
+
+/// Where something was found.
+struct Place {
+  std::string file{};                 ///< relative to the medium
+  std::vector<std::string> key{};     ///< the path of keys in a property list or strings table
+  std::optional<std::size_t> line{};  ///< from 1
+  std::optional<std::size_t> byte{};  ///< from 0, in a binary file
+};
+
+/// One thing that is wrong with a medium. The texts are phrases without a full stop; an empty one
+/// is left out.
+struct Finding {
+  std::string id{};  ///< names the rule; stable, for programs
+  Severity severity = Severity::kError;
+  Place place{};
+  std::string found{};
+  std::string expected{};
+  std::string nearest{};  ///< the known spelling that was probably meant
+  std::string effect{};   ///< what users will see because of it
+  std::string remedy{};
+};
+
+/// `text` in quotation marks.
+[[nodiscard]] inline std::string quoted(std::string text) {
+  return '"' + std::move(text) + '"';
+}
+
+}  // namespace onramp::check

@@ -1,0 +1,218 @@
+#include "tools/check/lists.h"
+
+#include <algorithm>
+#include <array>
+#include <filesystem>
+#include <system_error>
+
+#include "base/ascii.h"
+#include "media/KSOROSXCD.h"
+#include "media/connection_type.h"
+#include "media/medium.h"
+#include "tools/check/key_rules.h"
+
+namespace onramp::check {
+
+namespace {
+
+constexpr const char* kPackageAtOnce =
+    "no page: every model counts as one without wireless, so the package opens at once";
+constexpr const char* kNoModels = "no page: the medium has no models, so the package opens at once";
+constexpr const char* kNoPackage = "nothing opens when the wizard ends";
+
+constexpr std::array kInformationRules{
+    KeyRule{"CommonResourcePath", Kind::kPath, Need::kRequired, kNoModels},
+    KeyRule{"CFBundleName", Kind::kText, Need::kAdvised, "a window without a title"},
+};
+
+constexpr std::array kResourceRules{
+    KeyRule{medium::kBonjourNetwork, Kind::kText, Need::kOptional,
+            "no device is ever found on the network"},
+    KeyRule{medium::kCDInfo, Kind::kPath, Need::kRequired, kNoModels},
+    KeyRule{medium::kModelInfo, Kind::kPath, Need::kRequired, kPackageAtOnce},
+    KeyRule{medium::kPkgInfo, Kind::kDictionary, Need::kRequired, kNoPackage},
+    KeyRule{medium::kSystemMin, Kind::kDictionary, Need::kOptional, "no system is too old"},
+    KeyRule{medium::kSystemMax, Kind::kDictionary, Need::kOptional, "no system is too new"},
+    KeyRule{medium::kVenderName, Kind::kText, Need::kRequired,
+            "the package does not find the wizard's files: their names lack the maker"},
+    KeyRule{medium::kWLANtool, Kind::kPath, Need::kOptional,
+            "no set-up tool runs when no wireless device is found"},
+};
+
+constexpr std::array kPackageRules{
+    KeyRule{"PkgLocation", Kind::kPath, Need::kRequired, kNoPackage},
+    KeyRule{"PkgName", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"104", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"105", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"106", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"107", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"108", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"109", Kind::kText, Need::kOptional, kNoPackage},
+};
+
+constexpr std::array kMinimumRules{
+    KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "no system is too old"},
+    KeyRule{"Minor", Kind::kNumberOrText, Need::kAdvised, "it counts as 0"},
+    KeyRule{"BugFix", Kind::kNumberOrText, Need::kAdvised, "it counts as 0"},
+};
+
+constexpr std::array kMaximumRules{
+    KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "no system is too new"},
+    KeyRule{"Minor", Kind::kNumberOrText, Need::kRequired,
+            "it counts as 0: every later minor version is refused"},
+    KeyRule{"BugFix", Kind::kNumberOrText, Need::kRequired,
+            "it counts as 0: all of that minor version is refused"},
+};
+
+constexpr std::array kDescriptionRules{
+    KeyRule{"ContainedModel", Kind::kDictionary, Need::kRequired, kNoModels},
+    KeyRule{"Type", Kind::kDictionary, Need::kOptional,
+            "the medium counts as one with a printer and a scanner package"},
+    KeyRule{"KSCSeriesCode", Kind::kText, Need::kAdvised,
+            "the support page's address lacks the series"},
+    KeyRule{"InstallPKG", Kind::kDictionary, Need::kOptional, "the package's options are all off"},
+};
+
+constexpr std::array kTypeRules{
+    KeyRule{"Printer", Kind::kBoolean, Need::kOptional, "it counts as true"},
+    KeyRule{"TWAIN", Kind::kBoolean, Need::kOptional, "it counts as true"},
+};
+
+constexpr std::array kOptionRules{
+    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets it as it is"},
+    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "it counts as true"},
+    KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional, "the package gets it as it is"},
+    KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional, "the package gets it as it is"},
+    KeyRule{"PKG_FontSet", Kind::kAny, Need::kOptional, "the fonts are not installed"},
+};
+
+constexpr std::array kModelInformationRules{
+    KeyRule{"Model", Kind::kDictionary, Need::kRequired, kPackageAtOnce},
+};
+
+constexpr std::array kModelRules{
+    KeyRule{"KSCID", Kind::kText, Need::kRequired,
+            "the model offers no connection at all: the package opens as soon as it is chosen"},
+    KeyRule{"Interfaces", Kind::kDictionary, Need::kAdvised, "the model has USB only"},
+};
+
+constexpr std::array kInterfaceRules{
+    KeyRule{"USB", Kind::kBoolean, Need::kAdvised, "the model counts as one with USB"},
+    KeyRule{"WiredLAN", Kind::kBoolean, Need::kAdvised,
+            "the model counts as one without a cable network"},
+    KeyRule{"WirelessLAN", Kind::kBoolean, Need::kAdvised,
+            "the model counts as one without wireless"},
+};
+
+bool isNumber(const std::string& key) {
+  return !key.empty() && std::all_of(key.begin(), key.end(), isASCIIDigit);
+}
+
+// Package keys of other versions have a report of their own.
+Dictionary withoutOtherVersions(const Dictionary& package) {
+  std::vector<Dictionary::Pair> pairs;
+  for (const auto& pair : package) {
+    const bool known = std::any_of(kPackageRules.begin(), kPackageRules.end(),
+                                   [&](const KeyRule& rule) { return rule.key == pair.key; });
+    if (known || !isNumber(pair.key)) pairs.push_back(pair);
+  }
+  return Dictionary(std::move(pairs));
+}
+
+// The rules for the dictionary under `key`, if there is one.
+void checkInner(const Dictionary& outer, DictionaryPlace place, std::string_view key,
+                std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report) {
+  const auto inner = outer.dictionary(key);
+  place.path.emplace_back(key);
+  if (inner) checkKeys(*inner, place, rules, otherKeys, report);
+}
+
+void checkResources(const Dictionary& resources, const std::string& path, Report& report) {
+  const DictionaryPlace top{path, {}};
+  checkKeys(resources, top, kResourceRules, OtherKeys::kReported, report);
+  if (const auto package = resources.dictionary(medium::kPkgInfo)) {
+    checkKeys(withoutOtherVersions(*package), {path, {std::string(medium::kPkgInfo)}},
+              kPackageRules, OtherKeys::kReported, report);
+  }
+  checkInner(resources, top, medium::kSystemMin, kMinimumRules, OtherKeys::kReported, report);
+  checkInner(resources, top, medium::kSystemMax, kMaximumRules, OtherKeys::kReported, report);
+}
+
+void checkDescription(const Dictionary& description, const std::string& path, Report& report) {
+  const DictionaryPlace top{path, {}};
+  checkKeys(description, top, kDescriptionRules, OtherKeys::kReported, report);
+  checkInner(description, top, "Type", kTypeRules, OtherKeys::kReported, report);
+  checkInner(description, top, "InstallPKG", kOptionRules, OtherKeys::kAllowed, report);
+}
+
+void checkModels(const Dictionary& models, const std::string& path, Report& report) {
+  checkKeys(models, {path, {}}, kModelInformationRules, OtherKeys::kReported, report);
+  const Dictionary entries = models.dictionary("Model").value_or(Dictionary());
+  for (const auto& [name, value] : entries) {
+    const DictionaryPlace place{path, {"Model", name}};
+    const auto* const entry = value.as<Dictionary>();
+    if (!entry) {
+      report.findings.push_back({.id = "value-kind",
+                                 .place = {.file = path, .key = place.path},
+                                 .found = described(value),
+                                 .expected = "a dictionary",
+                                 .effect = "the model has USB only",
+                                 .remedy = "write it as that"});
+      continue;
+    }
+    checkKeys(*entry, place, kModelRules, OtherKeys::kReported, report);
+    checkInner(*entry, place, "Interfaces", kInterfaceRules, OtherKeys::kReported, report);
+  }
+}
+
+// The list whose path `resources` has under `key`, and that path.
+std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists,
+                                    std::string_view key, const char* what, const char* effect,
+                                    std::string& path) {
+  const auto named = lists.resources ? lists.resources->string(key) : std::nullopt;
+  if (!named) return std::nullopt;
+  path = *named;
+  return files.list(path, {DictionaryPlace{lists.resourcesPath, {}}.of(key), what, effect});
+}
+
+}  // namespace
+
+std::vector<std::string> Lists::modelNames() const {
+  return containedModels(KSOROSXCD::initWithCDInfoPlist(description, resources));
+}
+
+bool Lists::anyWireless() const {
+  return anySupportsWiFi(modelNames(), models);
+}
+
+Lists readLists(const MediumFiles& files) {
+  Report& report = files.report();
+  Lists lists;
+  lists.resourcesPath = "MacResources/CDCommonInfo.plist";
+  if (!report.application.empty()) {
+    lists.informationPath = report.application + "/Contents/Info.plist";
+    lists.information =
+        files.list(lists.informationPath,
+                   {{.file = lists.informationPath}, "the application's list", kNoModels});
+    if (!lists.information) return lists;
+    checkKeys(*lists.information, {lists.informationPath, {}}, kInformationRules,
+              OtherKeys::kAllowed, report);
+    const auto path = lists.information->string("CommonResourcePath");
+    if (!path) return lists;
+    lists.resourcesPath = *path;
+  }
+  lists.resources = files.list(lists.resourcesPath,
+                               {DictionaryPlace{lists.informationPath, {}}.of("CommonResourcePath"),
+                                "the resource dictionary", kNoModels});
+  if (!lists.resources) return lists;
+  checkResources(*lists.resources, lists.resourcesPath, report);
+  lists.description = namedList(files, lists, medium::kCDInfo, "the medium description", kNoModels,
+                                lists.descriptionPath);
+  if (lists.description) checkDescription(*lists.description, lists.descriptionPath, report);
+  lists.models = namedList(files, lists, medium::kModelInfo, "the model information",
+                           kPackageAtOnce, lists.modelsPath);
+  if (lists.models) checkModels(*lists.models, lists.modelsPath, report);
+  return lists;
+}
+
+}  // namespace onramp::check

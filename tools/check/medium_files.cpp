@@ -1,0 +1,215 @@
+#include "tools/check/medium_files.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <system_error>
+#include <utility>
+
+#include "base/ascii.h"
+#include "base/text.h"
+#include "media/medium.h"
+#include "platform/freedesktop/strings_table.h"
+#include "platform/libplist/parse.h"
+#include "platform/posix/file.h"
+#include "platform/property_list.h"
+#include "tools/check/spelling.h"
+
+namespace onramp::check {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+std::size_t lineOf(const std::string& text, std::size_t offset) {
+  const auto end = text.begin() + static_cast<std::ptrdiff_t>(std::min(offset, text.size()));
+  return 1 + static_cast<std::size_t>(std::count(text.begin(), end, '\n'));
+}
+
+std::vector<std::string> namesIn(const std::string& folder) {
+  std::vector<std::string> names;
+  std::error_code error;
+  fs::directory_iterator entry(folder, error);
+  for (; !error && entry != fs::directory_iterator(); entry.increment(error))
+    names.push_back(entry->path().filename().string());
+  std::sort(names.begin(), names.end());
+  return names;
+}
+
+// The components of a path without "." and with ".." taken away; nothing when it leads out.
+std::optional<std::vector<std::string>> components(const std::string& path) {
+  std::vector<std::string> parts;
+  for (const fs::path& part : fs::path(path)) {
+    if (part == ".." && parts.empty()) return std::nullopt;
+    if (part == "..") {
+      parts.pop_back();
+    } else if (!part.empty() && part != "." && part != "/") {
+      parts.push_back(part.string());
+    }
+  }
+  return parts;
+}
+
+bool isInside(const std::string& path, const std::string& root) {
+  std::error_code error;
+  const fs::path real = fs::canonical(path, error);
+  if (error) return true;  // nothing lies there
+  const fs::path realRoot = fs::canonical(root, error);
+  return error || std::mismatch(realRoot.begin(), realRoot.end(), real.begin(), real.end()).first ==
+                      realRoot.end();
+}
+
+bool isXML(const std::string& text) {
+  const std::size_t first = text.find_first_not_of(" \t\r\n");
+  return first != std::string::npos && text[first] == '<';
+}
+
+// Why the wizard cannot read a file's bytes, with the place.
+void explain(const std::string& bytes, bool isStrings, Finding& finding) {
+  ParseProblem problem;
+  const auto text = bytes.starts_with("bplist") ? std::nullopt : decodedText(bytes);
+  const auto value = isStrings && text && !isXML(*text)
+                         ? std::optional<Value>()
+                         : libplist::parsePropertyList(bytes, problem);
+  if (isStrings && text && !isXML(*text)) static_cast<void>(parseStrings(*text, problem));
+  if (value) {
+    finding.found = "a property list whose outermost value is no dictionary";
+    finding.expected = "a dictionary";
+    return;
+  }
+  finding.found = problem.reason;
+  if (text) {
+    finding.place.line = lineOf(*text, problem.offset);
+  } else {
+    finding.place.byte = problem.offset;
+  }
+  if (!finding.found.empty()) return;
+  const XMLLines lines = text ? xmlLines(*text) : XMLLines();
+  finding.found = lines.problem.empty() ? "no property list" : lines.problem;
+  if (lines.problemLine > 0) finding.place.line = lines.problemLine;
+}
+
+}  // namespace
+
+MediumFiles::MediumFiles(std::string root, std::string application, Report& report)
+    : root_(std::move(root)), application_(std::move(application)), report_(report) {}
+
+std::string MediumFiles::fullPath(const std::string& relative) const {
+  return medium::fullPath(application_, relative);
+}
+
+std::vector<std::string> MediumFiles::names(const std::string& relative) const {
+  return namesIn(root_ + "/" + relative);
+}
+
+bool MediumFiles::exists(const std::string& relative, const PathUse& use) const {
+  Finding finding{.id = "path-outside", .place = use.place, .effect = use.effect};
+  const auto parts = components(relative);
+  if (!parts || !isInside(fullPath(relative), root_)) {
+    finding.found = use.what + " at " + quoted(relative) + ", which leads out of the medium";
+    finding.expected = "a path inside the medium";
+    finding.remedy = "put the file on the medium and write its path from the medium's top";
+    finding.effect = "it works only where such a file happens to lie; elsewhere " + use.effect;
+    report_.findings.push_back(std::move(finding));
+    return false;
+  }
+  std::string folder;
+  for (const std::string& part : *parts) {
+    const std::vector<std::string> there = names(folder);
+    if (!std::binary_search(there.begin(), there.end(), part)) {
+      const auto nearest = Spelling(there).nearest(part);
+      const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
+      finding.id = capitals ? "path-capitals" : "path-missing";
+      finding.found = use.what + " at " + quoted(relative) +
+                      (capitals ? ", which differs in capitals from the name on the medium"
+                                : ", where nothing lies");
+      finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
+                                        : quoted(part) + " in " + quoted(folder);
+      if (nearest) finding.nearest = *nearest;
+      finding.remedy = nearest ? "spell both alike" : "put it there, or correct the path";
+      report_.findings.push_back(std::move(finding));
+      return false;
+    }
+    folder += (folder.empty() ? "" : "/") + part;
+  }
+  return true;
+}
+
+void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& use,
+                                   bool isStrings) const {
+  Finding finding{.id = isStrings ? "strings-unreadable" : "list-unreadable",
+                  .place = {.file = relative},
+                  .effect = use.effect};
+  const std::string path = fullPath(relative);
+  std::error_code ignored;
+  if (fs::is_directory(path, ignored)) {
+    finding.found = "a folder";
+    finding.expected = "a property list";
+  } else if (const auto size = fs::file_size(path, ignored);
+             !ignored && size > kMostPropertyListBytes) {
+    finding.found = std::to_string(size) + " bytes";
+    finding.expected = "at most " + std::to_string(kMostPropertyListBytes) + " bytes";
+    finding.remedy = "spread the models over several media";
+  } else if (const auto bytes = posix::readFile(path, kMostPropertyListBytes); !bytes) {
+    finding.found = "a file that may not be read";
+    finding.remedy = "let everyone read it (chmod a+r)";
+  } else if (bytes->empty()) {
+    finding.found = "an empty file";
+  } else {
+    explain(*bytes, isStrings, finding);
+  }
+  if (finding.expected.empty()) {
+    finding.expected = isStrings ? "a strings table" : "a property list, XML or binary";
+  }
+  if (finding.remedy.empty()) {
+    finding.remedy =
+        finding.place.line ? "correct that line or the one before it" : "write the file again";
+  }
+  report_.findings.push_back(std::move(finding));
+}
+
+std::optional<Dictionary> MediumFiles::list(const std::string& relative, const PathUse& use) const {
+  if (!exists(relative, use)) return std::nullopt;
+  auto list = loadDictionary(fullPath(relative));
+  if (!list) {
+    reportUnreadable(relative, use, false);
+    return list;
+  }
+  for (const auto& [key, line] : linesOf(relative).twice) {
+    report_.findings.push_back({.id = "key-twice",
+                                .place = {.file = relative, .key = key, .line = line},
+                                .found = "a key that its dictionary has already",
+                                .expected = "every key once",
+                                .effect = "one of the two values, which one depends on the system",
+                                .remedy = "remove one of them"});
+  }
+  return list;
+}
+
+const XMLLines& MediumFiles::linesOf(const std::string& relative) const {
+  const auto known = lines_.find(relative);
+  if (known != lines_.end()) return known->second;
+  const auto bytes = posix::readFile(fullPath(relative), kMostPropertyListBytes);
+  const auto text = bytes ? decodedText(*bytes) : std::nullopt;
+  return lines_.emplace(relative, text && isXML(*text) ? xmlLines(*text) : XMLLines())
+      .first->second;
+}
+
+std::optional<Dictionary> MediumFiles::strings(const std::string& relative,
+                                               const PathUse& use) const {
+  if (!exists(relative, use)) return std::nullopt;
+  auto table = loadStringsTable(fullPath(relative));
+  if (!table) reportUnreadable(relative, use, true);
+  return table;
+}
+
+void MediumFiles::addLines() const {
+  for (Finding& finding : report_.findings) {
+    Place& place = finding.place;
+    if (place.line || place.key.empty() || !place.file.ends_with(".plist")) continue;
+    const XMLLines& lines = linesOf(place.file);
+    const auto line = lines.keys.find(place.key);
+    if (line != lines.keys.end()) place.line = line->second;
+  }
+}
+
+}  // namespace onramp::check

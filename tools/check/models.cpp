@@ -1,0 +1,173 @@
+#include <algorithm>
+#include <iterator>
+#include <map>
+#include <set>
+#include <utility>
+
+#include "base/ascii.h"
+#include "base/text.h"
+#include "media/KSOROSXModel.h"
+#include "media/connection_type.h"
+#include "tools/check/checks.h"
+#include "tools/check/key_rules.h"
+#include "tools/check/spelling.h"
+
+namespace onramp::check {
+
+namespace {
+
+constexpr std::string_view kContained = "ContainedModel";
+
+std::vector<std::string> keysOf(const Dictionary& dictionary) {
+  std::vector<std::string> keys;
+  keys.reserve(dictionary.size());
+  for (const auto& [key, unused] : dictionary)
+    keys.push_back(key);
+  return keys;
+}
+
+std::vector<std::string> onlyInFirst(const std::vector<std::string>& first,
+                                     const std::vector<std::string>& second) {
+  std::vector<std::string> names;
+  std::set_difference(first.begin(), first.end(), second.begin(), second.end(),
+                      std::back_inserter(names));
+  return names;
+}
+
+class ModelCheck {
+ public:
+  ModelCheck(const Lists& lists, Report& report) : lists_(lists), report_(report) {}
+
+  // A name of one list that is nearly one of the other is reported once, as a pair.
+  void compareLists() {
+    const auto contained = lists_.description->dictionary(kContained);
+    const auto described = lists_.models->dictionary("Model");
+    if (!contained || !described) return;
+    const std::vector<std::string> offered = keysOf(*contained);
+    const std::vector<std::string> known = keysOf(*described);
+    const std::vector<std::string> onlyKnown = onlyInFirst(known, offered);
+    std::set<std::string> paired;
+    Spelling unmatched(onlyKnown);
+    Spelling all(known);
+    for (const std::string& name : onlyInFirst(offered, known)) {
+      const auto pair = unmatched.nearest(name);
+      if (pair) paired.insert(*pair);
+      undescribed(name, pair ? pair : all.nearest(name));
+    }
+    for (const std::string& name : onlyKnown) {
+      if (!paired.contains(name)) unoffered(name);
+    }
+  }
+
+  void names() {
+    const auto contained = lists_.description->dictionary(kContained);
+    if (!contained) return;
+    if (contained->empty()) {
+      report_.findings.push_back(
+          {.id = "models-none",
+           .place = {.file = lists_.descriptionPath, .key = {std::string(kContained)}},
+           .found = "no models",
+           .expected = "the medium's models as keys",
+           .effect = "no page: the package opens at once",
+           .remedy = "add the models"});
+    }
+    std::map<std::string, std::string> spellings;
+    for (const auto& [name, unused] : *contained) {
+      announceable(name);
+      const auto [other, isNew] = spellings.try_emplace(asciiLowercased(name), name);
+      if (isNew) continue;
+      add(name, {.id = "model-twice",
+                 .severity = Severity::kWarning,
+                 .found = "a name that differs from " + quoted(other->second) + " in capitals only",
+                 .expected = "each model once, spelled as its devices announce it",
+                 .effect = "both names in the list; only one of them finds its devices",
+                 .remedy = "remove the wrong one"});
+    }
+  }
+
+ private:
+  // Adds a finding about a model's name in the medium description.
+  void add(const std::string& name, Finding finding) {
+    finding.place = {.file = lists_.descriptionPath, .key = {std::string(kContained), name}};
+    report_.findings.push_back(std::move(finding));
+  }
+
+  void undescribed(const std::string& name, const std::optional<std::string>& nearest) {
+    add(name, {.id = "model-undescribed",
+               .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
+               .expected = "the same name under \"Model\" there",
+               .nearest = nearest.value_or(""),
+               .effect = "the model has USB only: the package opens as soon as it is chosen",
+               .remedy = nearest ? "spell both alike" : "describe the model there"});
+  }
+
+  void unoffered(const std::string& name) {
+    report_.findings.push_back(
+        {.id = "model-unoffered",
+         .place = {.file = lists_.modelsPath, .key = {"Model", name}},
+         .found = "a model that " + quoted(lists_.descriptionPath) + " does not have",
+         .expected = "the same name under \"ContainedModel\" there",
+         .effect = "the model cannot be chosen",
+         .remedy = "add it there, or remove it here"});
+  }
+
+  // A device's name is the two texts of its announcement with a blank between them. A text is
+  // announced together with its key ("usb_MFG=") in at most 255 bytes.
+  void announceable(const std::string& name) {
+    constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
+    const std::size_t blank = name.find(' ');
+    const auto impossible = [&](std::string found, std::string expected, std::string remedy) {
+      add(name, {.id = "model-unannounceable",
+                 .found = std::move(found),
+                 .expected = std::move(expected),
+                 .effect = "no device of that name is ever found on the network",
+                 .remedy = std::move(remedy)});
+    };
+    const bool control = std::any_of(name.begin(), name.end(),
+                                     [](char c) { return static_cast<unsigned char>(c) < 0x20; });
+    if (blank == std::string::npos) {
+      impossible("a name without a blank", "the USB manufacturer, a blank, the USB model",
+                 "write both as the devices announce them");
+    } else if (name.size() > kMostBytes) {
+      impossible("a name of " + std::to_string(name.size()) + " bytes",
+                 "at most " + std::to_string(kMostBytes) + ", which is what a device can announce",
+                 "write it as the devices announce it");
+    } else if (control || !isUTF8(name)) {
+      impossible("a name with a line break, a tab or another control character",
+                 "printable characters", "take it out");
+    } else if (name.front() == ' ' || name.back() == ' ' || name.find("  ") != std::string::npos) {
+      const bool edge = name.front() == ' ' || name.back() == ' ';
+      add(name, {.id = "model-blanks",
+                 .severity = Severity::kWarning,
+                 .found = edge ? "a blank at the edge of the name" : "two blanks in a row",
+                 .expected = "the name exactly as the devices announce it",
+                 .effect = "only devices that announce these blanks are found; some really do",
+                 .remedy = "remove the blanks unless the devices announce them"});
+    }
+  }
+
+  const Lists& lists_;
+  Report& report_;
+};
+
+}  // namespace
+
+void checkModelNames(const Lists& lists, Report& report) {
+  if (!lists.description) return;
+  ModelCheck check(lists, report);
+  check.names();
+  if (lists.models) check.compareLists();
+}
+
+void describeModels(const Lists& lists, Report& report) {
+  const std::vector<std::string> names = lists.modelNames();
+  for (const std::string& name : names) {
+    const Dictionary record = KSOROSXModel::initWithName(name, lists.models);
+    report.models.push_back({name, record.boolean(KSOROSXModel::kSupportUSB).value_or(false),
+                             record.boolean(KSOROSXModel::kSupportEthernet).value_or(false),
+                             record.boolean(KSOROSXModel::kSupportWiFi).value_or(false)});
+  }
+  report.start = firstPage(names, lists.models);
+}
+
+}  // namespace onramp::check

@@ -1,0 +1,303 @@
+#include <algorithm>
+#include <array>
+#include <iterator>
+#include <set>
+
+#include "base/ascii.h"
+#include "media/KSInstallerInfo.h"
+#include "media/medium.h"
+#include "media/system_range.h"
+#include "platform/standin/stand_in_system.h"
+#include "platform/system_version.h"
+#include "tools/check/checks.h"
+#include "tools/check/key_rules.h"
+
+namespace onramp::check {
+
+namespace {
+
+using Version = std::array<std::int64_t, 3>;
+
+// Every system that may get another package than the one before it, down to the first.
+std::set<Version> differentSystems() {
+  constexpr std::int64_t kLastMinor = 16;
+  std::set<Version> systems{{11, 0, 0}};
+  for (std::int64_t minor = 0; minor <= kLastMinor; ++minor)
+    systems.insert({10, minor, 0});
+  return systems;
+}
+
+SystemVersion systemOf(const Version& version) {
+  return {version[0], version[1], version[2]};
+}
+
+bool isNumber(const std::string& text) {
+  return !text.empty() && std::all_of(text.begin(), text.end(), isASCIIDigit);
+}
+
+std::string dotted(const Version& version) {
+  const std::string text = std::to_string(version[0]) + "." + std::to_string(version[1]);
+  return version[2] == 0 && version[1] == 0 ? text : text + "." + std::to_string(version[2]);
+}
+
+Version boundOf(const Dictionary& bound) {
+  return {bound.integerValue("Major"), bound.integerValue("Minor"), bound.integerValue("BugFix")};
+}
+
+// The package's key by the wizard's own rule; empty for none.
+std::string versionKey(const Version& version) {
+  setSystemVersion(std::to_string(version[0]) + "." + std::to_string(version[1]) + "." +
+                   std::to_string(version[2]));
+  return std::string(packageKey(gestaltSystemVersion().value_or(0)).value_or(""));
+}
+
+bool takesAllBugFixes(const Dictionary& maximum) {
+  Version beyond = boundOf(maximum);
+  beyond[2] = INT64_MAX;
+  return !isNewerThan(maximum, systemOf(beyond));
+}
+
+class PackageCheck {
+ public:
+  PackageCheck(const MediumFiles& files, const Lists& lists)
+      : files_(files), lists_(lists), report_(files.report()) {
+    info_.setCDCommonInfoValue(lists.resources);
+  }
+
+  void run() {
+    describeRange();
+    checkNumbers(medium::kSystemMin, info_.supportSystemMin());
+    checkNumbers(medium::kSystemMax, info_.supportSystemMax());
+    checkEmptyRange();
+    checkNamedMaximum();
+    checkApplicationsOwnMinimum();
+    if (!lists_.resources->dictionary(medium::kPkgInfo)) return;
+    findPackages();
+    checkKeysThatNobodyUses();
+  }
+
+ private:
+  [[nodiscard]] Place placeOf(std::string_view dictionary, std::string_view key = "") const {
+    Place place{.file = lists_.resourcesPath, .key = {std::string(dictionary)}};
+    if (!key.empty()) place.key.emplace_back(key);
+    return place;
+  }
+
+  [[nodiscard]] bool isSupported(const Version& version) const {
+    return systemSupport(systemOf(version), info_.supportSystemMin(), info_.supportSystemMax()) ==
+           SystemSupport::kSupported;
+  }
+
+  // The first system above the range; nothing when there is none.
+  [[nodiscard]] std::optional<Version> end() const {
+    const Dictionary& maximum = info_.supportSystemMax();
+    if (!isBound(maximum)) return std::nullopt;
+    Version end = boundOf(maximum);
+    if (takesAllBugFixes(maximum)) end = {end[0], end[1] + 1, 0};
+    return end;
+  }
+
+  [[nodiscard]] Version begin() const {
+    const Dictionary& minimum = info_.supportSystemMin();
+    return isBound(minimum) ? boundOf(minimum) : Version{};
+  }
+
+  // "10.13.0 up to, but not including, 13.0", or to the range's end.
+  [[nodiscard]] std::string words(const Version& from, const std::optional<Version>& to) const {
+    const std::string first = from == Version{} ? "" : dotted(from);
+    if (!to) return first.empty() ? "every system" : first + " and later";
+    const Dictionary& maximum = info_.supportSystemMax();
+    const bool isEnd = to == end() && takesAllBugFixes(maximum);
+    const Version last = boundOf(maximum);
+    const std::string until =
+        isEnd ? "up to the last " + std::to_string(last[0]) + "." + std::to_string(last[1]) + ".x"
+              : "up to, but not including, " + dotted(*to);
+    return first.empty() ? until : first + " " + until;
+  }
+
+  void describeRange() { report_.systems = words(begin(), end()); }
+
+  void checkNumbers(std::string_view which, const Dictionary& bound) {
+    for (const char* const key : {"Major", "Minor", "BugFix"}) {
+      const auto text = bound.string(key);
+      if (!text) continue;
+      const bool every = which == medium::kSystemMax && key == std::string_view("BugFix") &&
+                         asciiLowercased(*text) == "x";
+      if (isNumber(*text) || every) continue;
+      report_.findings.push_back(
+          {.id = "version-number",
+           .place = placeOf(which, key),
+           .found = "the string " + quoted(*text),
+           .expected = which == medium::kSystemMax && key == std::string_view("BugFix")
+                           ? "a number, or \"x\" for all of that minor version"
+                           : "a number",
+           .effect = "it counts as " + std::to_string(leadingInteger(*text)),
+           .remedy = "write a number"});
+    }
+  }
+
+  void checkEmptyRange() {
+    if (!isBound(info_.supportSystemMax())) return;
+    if (isSupported(begin())) return;
+    report_.findings.push_back({.id = "range-empty",
+                                .place = placeOf(medium::kSystemMax),
+                                .found = "a range that no system lies in: " + report_.systems,
+                                .expected = "a newest system that is newer than the oldest",
+                                .effect = "every system is refused",
+                                .remedy = "correct \"SystemMin\" or \"SystemMax\""});
+  }
+
+  // A maximum with a number for its bug-fix release is fine where it begins a major version.
+  void checkNamedMaximum() {
+    const Dictionary& maximum = info_.supportSystemMax();
+    const auto text = maximum.string("BugFix");
+    const bool written = text ? isNumber(*text) : maximum.find("BugFix") != nullptr;
+    if (!isBound(maximum) || !written || takesAllBugFixes(maximum)) return;
+    const Version named = boundOf(maximum);
+    if ((named[1] == 0 && named[2] == 0) || !isSupported(begin())) return;
+    const std::string name = dotted(named);
+    report_.findings.push_back(
+        {.id = "range-excludes-maximum",
+         .severity = Severity::kWarning,
+         .place = placeOf(medium::kSystemMax, "BugFix"),
+         .found = "a range of " + report_.systems,
+         .expected = "\"x\" for \"BugFix\" to take all of " + std::to_string(named[0]) + "." +
+                     std::to_string(named[1]) + ", or the first release that is refused",
+         .effect = name + " itself is refused as too new",
+         .remedy = "leave it only if " + name + " is meant to be refused"});
+  }
+
+  void checkApplicationsOwnMinimum() {
+    constexpr const char* kKey = "LSMinimumSystemVersion";
+    const auto own = lists_.information ? lists_.information->string(kKey) : std::nullopt;
+    if (!own || !isSupported(begin())) return;
+    const std::size_t point = std::min(own->find('.'), own->size());
+    const SystemVersion oldest =
+        systemVersion({own->substr(0, point), own->substr(std::min(point + 1, own->size()))});
+    const Dictionary& maximum = info_.supportSystemMax();
+    if (!isBound(maximum) || !isNewerThan(maximum, oldest)) return;
+    report_.findings.push_back({.id = "range-before-application",
+                                .place = {.file = lists_.informationPath, .key = {kKey}},
+                                .found = "an application for " + *own + " and later",
+                                .expected = "one that starts on " + report_.systems,
+                                .effect = "no system both starts the wizard and is supported",
+                                .remedy = "widen the range with \"SystemMax\""});
+  }
+
+  // The package of one system by the wizard's own rule, as a path from the medium's top.
+  [[nodiscard]] std::string packageFor(const Version& version) {
+    usedKeys_.insert(versionKey(version));
+    info_.loadPkgURL(lists_.resources);
+    const std::optional<FileURL>& url = info_.pkgURL();
+    return url ? url->path.substr(files_.fullPath("").size() + 1) : std::string();
+  }
+
+  void findPackages() {
+    std::set<Version> starts = differentSystems();
+    for (const Version& system : starts)
+      knownKeys_.insert(versionKey(system));
+    starts.insert(begin());
+    if (const auto last = end()) starts.insert(*last);
+    for (auto start = starts.begin(); start != starts.end(); ++start) {
+      const auto next = std::next(start);
+      if (!isSupported(*start)) continue;
+      const std::string package = packageFor(*start);
+      const auto to = next == starts.end() ? std::nullopt : std::optional(*next);
+      if (!rows_.empty() && rows_.back().package == package) {
+        rows_.back().to = to;
+      } else {
+        rows_.push_back({*start, to, package});
+      }
+    }
+    for (const Row& row : rows_) {
+      report_.packages.push_back({words(row.from, row.to), row.package});
+      checkPackage(row);
+    }
+  }
+
+  struct Row {
+    Version from;
+    std::optional<Version> to;
+    std::string package;
+  };
+
+  void checkPackage(const Row& row) {
+    const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
+    const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
+    const std::string effect =
+        "on " + words(row.from, row.to) + " the window closes and nothing opens";
+    if (!row.package.empty()) {
+      const PathUse use{placeOf(medium::kPkgInfo, key), "the package", effect};
+      if (checked_.insert(row.package).second) static_cast<void>(files_.exists(row.package, use));
+      return;
+    }
+    // Another kind of value under the key, or no folder, has been reported.
+    if (package.find(key) || !package.string("PkgLocation")) return;
+    report_.findings.push_back(
+        {.id = "package-none",
+         .place = placeOf(medium::kPkgInfo),
+         .found = "no package for " + words(row.from, row.to),
+         .expected = key.empty() ? "\"PkgName\"" : "\"PkgName\" or " + quoted(key),
+         .effect = effect,
+         .remedy = "name the package, or raise \"SystemMin\""});
+  }
+
+  void checkKeysThatNobodyUses() {
+    const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
+    std::string shadowed;
+    for (const auto& [key, value] : package) {
+      if (!isNumber(key)) continue;
+      if (!knownKeys_.contains(key)) {
+        neverUsed(key);
+      } else if (package.find("PkgName")) {
+        shadowed += (shadowed.empty() ? "" : ", ") + quoted(key);
+      } else if (!usedKeys_.contains(key)) {
+        unsupported(key);
+      }
+    }
+    if (shadowed.empty()) return;
+    report_.findings.push_back(
+        {.id = "package-shadowed",
+         .place = placeOf(medium::kPkgInfo, "PkgName"),
+         .found = "\"PkgName\" beside " + shadowed,
+         .expected = "either \"PkgName\" or packages by version",
+         .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
+         .remedy = "remove \"PkgName\", or the keys that it goes before"});
+  }
+
+  void neverUsed(const std::string& key) {
+    report_.findings.push_back({.id = "package-key-unknown",
+                                .place = placeOf(medium::kPkgInfo, key),
+                                .found = "a key that no system uses",
+                                .expected = "\"104\" to \"109\"",
+                                .effect = "10.9 and every later system gets what \"109\" names",
+                                .remedy = "move the name to \"109\", or remove the key"});
+  }
+
+  void unsupported(const std::string& key) {
+    report_.findings.push_back({.id = "package-key-unused",
+                                .severity = Severity::kWarning,
+                                .place = placeOf(medium::kPkgInfo, key),
+                                .found = "a key for systems outside the supported range",
+                                .expected = "packages for " + report_.systems,
+                                .effect = "nothing: that package never opens",
+                                .remedy = "remove the key, or widen the range"});
+  }
+
+  const MediumFiles& files_;
+  const Lists& lists_;
+  Report& report_;
+  KSInstallerInfo info_;
+  std::vector<Row> rows_;
+  std::set<std::string> knownKeys_;
+  std::set<std::string> usedKeys_;  ///< by supported systems
+  std::set<std::string> checked_;
+};
+
+}  // namespace
+
+void checkPackages(const MediumFiles& files, const Lists& lists) {
+  if (lists.resources) PackageCheck(files, lists).run();
+}
+
+}  // namespace onramp::check

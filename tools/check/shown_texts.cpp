@@ -1,0 +1,133 @@
+#include "tools/check/shown_texts.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+
+#include "base/text.h"
+
+namespace onramp::check {
+
+namespace {
+
+constexpr double kTitleSize = 17 * 1.06;  // bold letters are wider
+constexpr double kPage = 616;
+constexpr double kButton = 84;
+constexpr double kHeader = 11;
+
+constexpr std::array kTexts{
+    ShownText{.key = "APP_MENU_ABOUT", .where = "application menu", .hasFallback = true},
+    ShownText{.key = "APP_MENU_HIDE", .where = "application menu", .hasFallback = true},
+    ShownText{.key = "APP_MENU_HIDEOHTERS", .where = "application menu", .hasFallback = true},
+    ShownText{.key = "APP_MENU_QUIT", .where = "application menu", .hasFallback = true},
+    ShownText{.key = "APP_MENU_SHOWALL", .where = "application menu", .hasFallback = true},
+    ShownText{.key = "BTN_BACK", .where = "button", .width = kButton},
+    ShownText{.key = "BTN_CANCEL", .where = "button", .width = kButton},
+    ShownText{.key = "BTN_CLOSE", .where = "alert's button", .hasFallback = true},
+    ShownText{.key = "BTN_NEXT", .where = "button", .width = kButton},
+    ShownText{.key = "BTN_OK", .where = "alert's button", .hasFallback = true},
+    ShownText{.key = "BTN_WEB", .where = "alert's button", .hasFallback = true},
+    ShownText{.key = "INST_TXT_ALERT_CONFIRM_DEVICENOTFOUND_WIFI",
+              .where = "sheet when no device is found",
+              .hasFallback = true},
+    ShownText{.key = "INST_TXT_ALERT_DEVICENOTFOUND",
+              .where = "sheet when no device is found",
+              .hasFallback = true},
+    ShownText{.key = "INST_TXT_ALERT_OS", .where = "alert on other systems", .hasFallback = true},
+    ShownText{
+        .key = "INST_TXT_ALERT_OSMAX", .where = "alert on newer systems", .hasFallback = true},
+    ShownText{.key = "INST_TXT_ALERT_OSMIN",
+              .where = "alert on older systems",
+              .mostPlaceholders = 2,
+              .hasFallback = true},
+    ShownText{.key = "INST_TXT_ALERT_WIFI_DEVICENOTFOUND",
+              .where = "sheet when no device is found",
+              .hasFallback = true},
+    ShownText{
+        .key = "INST_TXT_CONNECTION", .where = "column's header", .width = 128, .size = kHeader},
+    ShownText{.key = "INST_TXT_CONNECTIONTYPE",
+              .where = "title of the connection type",
+              .width = kPage,
+              .size = kTitleSize},
+    ShownText{.key = "INST_TXT_CONNECTIONTYPE_DESC",
+              .where = "below that title",
+              .width = kPage,
+              .lines = 2},
+    ShownText{.key = "INST_TXT_CONNECTION_NETWORK",
+              .where = "column of the chooser",
+              .width = 134,
+              .hasFallback = true},
+    ShownText{.key = "INST_TXT_DEVICE", .where = "column's header", .width = 308, .size = kHeader},
+    ShownText{.key = "INST_TXT_DEVLIST",
+              .where = "title of the chooser",
+              .width = 546,
+              .size = kTitleSize,
+              .lines = 2},
+    ShownText{.key = "INST_TXT_ETHERNET", .where = "connection to choose", .width = 450},
+    ShownText{
+        .key = "INST_TXT_IPADDRESS", .where = "column's header", .width = 130, .size = kHeader},
+    ShownText{.key = "INST_TXT_MODEL",
+              .where = "title of the model list",
+              .width = kPage,
+              .size = kTitleSize},
+    ShownText{
+        .key = "INST_TXT_MODEL_DESC", .where = "below that title", .width = kPage, .lines = 2},
+    ShownText{.key = "INST_TXT_REFRESH", .where = "chooser's menu"},
+    ShownText{.key = "INST_TXT_USB", .where = "connection to choose", .width = 450},
+    ShownText{.key = "INST_TXT_WIFI", .where = "connection to choose", .width = 450},
+    ShownText{.key = "INST_WAIT", .where = "beside the turning wheel", .width = 588},
+};
+
+struct Range {
+  char32_t first;
+  char32_t last;
+};
+
+// Blocks whose characters fill a square.
+constexpr std::array kSquare{
+    Range{0x1100, 0x115F}, Range{0x2E80, 0xA4CF},   Range{0xAC00, 0xD7A3},
+    Range{0xF900, 0xFAFF}, Range{0xFE30, 0xFE4F},   Range{0xFF00, 0xFF60},
+    Range{0xFFE0, 0xFFE6}, Range{0x1F300, 0x1FAFF}, Range{0x20000, 0x3FFFD}};
+
+// Of the letters' size.
+double relativeWidth(char32_t character) {
+  constexpr std::string_view kNarrow = " !'(),.:;I[]fijlrt|";
+  constexpr std::string_view kWide = "%@MWmw";
+  if (character < 0x80) {
+    const char c = static_cast<char>(character);
+    if (kNarrow.find(c) != std::string_view::npos) return 0.3;
+    if (kWide.find(c) != std::string_view::npos) return 0.85;
+    return c >= 'A' && c <= 'Z' ? 0.66 : 0.55;
+  }
+  if (character >= 0x300 && character <= 0x36F) return 0;  // accents on the letter before
+  const bool square = std::any_of(kSquare.begin(), kSquare.end(), [&](const Range& range) {
+    return character >= range.first && character <= range.last;
+  });
+  return square ? 1 : 0.58;
+}
+
+}  // namespace
+
+std::span<const ShownText> shownTexts() {
+  return kTexts;
+}
+
+double estimatedWidth(std::string_view text, double size) {
+  double width = 0;
+  while (!text.empty())
+    width += size * relativeWidth(takeUTF8(text).value_or(kReplacementCharacter));
+  return width;
+}
+
+int estimatedLines(std::string_view text, double size, double width) {
+  int lines = 0;
+  for (;;) {
+    const std::size_t end = std::min(text.find('\n'), text.size());
+    const double wide = estimatedWidth(text.substr(0, end), size);
+    lines += std::max(1, static_cast<int>(std::ceil(std::min(wide / width, 1000.0))));
+    if (end == text.size()) return lines;
+    text.remove_prefix(end + 1);
+  }
+}
+
+}  // namespace onramp::check

@@ -1,0 +1,272 @@
+#include <algorithm>
+#include <cmath>
+#include <filesystem>
+#include <map>
+#include <set>
+#include <system_error>
+
+#include "platform/freedesktop/language.h"
+#include "tools/check/checks.h"
+#include "tools/check/shown_texts.h"
+#include "tools/check/spelling.h"
+
+namespace onramp::check {
+
+namespace {
+
+constexpr std::string_view kLanguageFolder = ".lproj";
+const std::string kBundle = "MacResources/CDCommonMessage.bundle";
+
+std::vector<std::string> languagesIn(const MediumFiles& files, const std::string& resources) {
+  std::vector<std::string> languages;
+  for (const std::string& name : files.names(resources)) {
+    if (!name.ends_with(kLanguageFolder) || name == "Base.lproj") continue;
+    languages.push_back(name.substr(0, name.size() - kLanguageFolder.size()));
+  }
+  return languages;
+}
+
+std::size_t placeholders(const std::string& text) {
+  std::size_t count = 0;
+  for (std::size_t at = text.find("%@"); at != std::string::npos; at = text.find("%@", at + 2))
+    ++count;
+  return count;
+}
+
+std::string joined(const std::vector<std::string>& words) {
+  std::string text;
+  for (const std::string& word : words)
+    text += (text.empty() ? "" : ", ") + word;
+  return text;
+}
+
+// Whether one of the `offered` languages serves users of `wanted`, and not only for want of a
+// better one.
+bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
+  const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
+  if (found.empty()) return false;
+  const Language first = Language::parse(found.front());
+  const Language language = Language::parse(wanted);
+  return first.code == language.code &&
+         (first.script.empty() || language.script.empty() || first.script == language.script);
+}
+
+class TextCheck {
+ public:
+  TextCheck(const MediumFiles& files, const Lists& lists)
+      : files_(files), lists_(lists), report_(files.report()) {}
+
+  void run() {
+    constexpr const char* kEffect = "keys such as \"INST_TXT_MODEL\" instead of texts";
+    if (!files_.exists(kBundle, {{.file = kBundle}, "the message bundle", kEffect})) return;
+    languages_ = languagesIn(files_, kBundle + "/Contents/Resources");
+    for (const std::string& language : languages_)
+      read(language, kEffect);
+    for (const auto& [language, table] : tables_)
+      check(language, table);
+    checkDevelopmentRegion();
+    checkApplicationLanguages();
+  }
+
+ private:
+  static std::string tablePath(const std::string& language) {
+    return kBundle + "/Contents/Resources/" + language + std::string(kLanguageFolder) +
+           "/Localizable.strings";
+  }
+
+  void read(const std::string& language, const std::string& effect) {
+    const std::string path = tablePath(language);
+    if (Language::parse(language).code.empty()) {
+      report_.findings.push_back({.id = "language-unknown",
+                                  .severity = Severity::kWarning,
+                                  .place = {.file = kBundle + "/Contents/Resources/" + language +
+                                                    std::string(kLanguageFolder)},
+                                  .found = "a folder that names no language",
+                                  .expected = "a code such as \"de\" or \"zh_TW\"",
+                                  .effect = "nobody sees its texts",
+                                  .remedy = "rename the folder"});
+      return;
+    }
+    const auto table = files_.strings(path, {{.file = path},
+                                             "the texts of " + quoted(language),
+                                             "users of " + quoted(language) + " see " + effect});
+    if (table) tables_.emplace(language, *table);
+  }
+
+  void check(const std::string& language, const Dictionary& table) {
+    std::vector<std::string> absent;
+    LanguageRow row{.name = language};
+    for (const ShownText& shown : shownTexts()) {
+      const Value* const value = table.find(shown.key);
+      const auto text = table.string(shown.key);
+      if (!value) absent.emplace_back(shown.key);
+      if (!text) continue;
+      ++row.texts;
+      checkText(language, shown, *text);
+    }
+    report_.languages.push_back(row);
+    Spelling spelling(absent);
+    std::set<std::string> meant;
+    for (const auto& [key, unused] : table) {
+      const bool known = std::any_of(shownTexts().begin(), shownTexts().end(),
+                                     [&](const ShownText& shown) { return shown.key == key; });
+      if (!known) unknown(language, key, spelling.nearest(key), meant);
+    }
+    for (const std::string& key : absent) {
+      if (!meant.contains(key)) missing(language, key);
+    }
+  }
+
+  [[nodiscard]] static std::string effectOf(const std::string& language, std::string_view key) {
+    const auto shown = std::find_if(shownTexts().begin(), shownTexts().end(),
+                                    [&](const ShownText& text) { return text.key == key; });
+    return "users of " + quoted(language) + " see " +
+           (shown->hasFallback ? std::string("an English text") : quoted(std::string(key))) + " (" +
+           std::string(shown->where) + ")";
+  }
+
+  void unknown(const std::string& language, const std::string& key,
+               const std::optional<std::string>& nearest, std::set<std::string>& meant) {
+    Finding finding{.id = "text-unknown",
+                    .severity = Severity::kWarning,
+                    .place = {.file = tablePath(language), .key = {key}},
+                    .found = "a text that the wizard does not show",
+                    .effect = "nothing",
+                    .remedy = "remove it"};
+    if (nearest && meant.insert(*nearest).second) {
+      finding.id = "text-misspelt";
+      finding.severity = Severity::kError;
+      finding.found = "an unknown key";
+      finding.expected = quoted(*nearest);
+      finding.nearest = *nearest;
+      finding.effect = effectOf(language, *nearest);
+      finding.remedy = "rename the key";
+    }
+    report_.findings.push_back(std::move(finding));
+  }
+
+  void missing(const std::string& language, const std::string& key) {
+    std::vector<std::string> others;
+    for (const auto& [other, table] : tables_) {
+      if (table.find(key)) others.push_back(other);
+    }
+    report_.findings.push_back(
+        {.id = "text-missing",
+         .place = {.file = tablePath(language)},
+         .found = "no " + quoted(key),
+         .expected = others.empty() ? "a text" : "a text, as in " + joined(others),
+         .effect = effectOf(language, key),
+         .remedy = "add it"});
+  }
+
+  void checkText(const std::string& language, const ShownText& shown, const std::string& text) {
+    Finding finding{.place = {.file = tablePath(language), .key = {std::string(shown.key)}},
+                    .effect = effectOf(language, shown.key)};
+    const std::size_t count = placeholders(text);
+    const bool filled = shown.mostPlaceholders > 0;
+    const bool wrongCount = filled ? count < 1 || count > shown.mostPlaceholders : count > 0;
+    if (text.find_first_not_of(" \t\r\n") == std::string::npos) {
+      finding.id = "text-empty";
+      finding.found = "an empty text";
+      finding.effect = "nothing where a text belongs (" + std::string(shown.where) + ")";
+      finding.remedy = "write the text";
+    } else if (wrongCount) {
+      finding.id = "text-placeholders";
+      finding.found = "\"%@\" " + std::to_string(count) + " times";
+      finding.expected = filled ? "once or twice" : "none";
+      finding.effect = filled && count == 0
+                           ? "an alert that does not say which version is needed"
+                           : "\"%@\" as it stands (" + std::string(shown.where) + ")";
+      finding.remedy = filled ? "leave it where the version belongs" : "remove it";
+    } else if (shown.where == "sheet when no device is found" &&
+               text.find('%') != std::string::npos) {
+      finding.id = "text-percent";
+      finding.found = "a \"%\", which macOS takes for the beginning of a placeholder";
+      finding.expected = "a text without \"%\"";
+      finding.effect = "a damaged text, or the end of the program, on macOS";
+      finding.remedy = "write it in words";
+    } else {
+      tooWide(shown, text, finding);
+    }
+    if (!finding.id.empty()) report_.findings.push_back(std::move(finding));
+  }
+
+  static void tooWide(const ShownText& shown, const std::string& text, Finding& finding) {
+    if (shown.width == 0 || estimatedLines(text, shown.size, shown.width) <= shown.lines) return;
+    finding.id = "text-wide";
+    finding.severity = Severity::kWarning;
+    finding.found = "a text about " +
+                    std::to_string(std::lround(estimatedWidth(text, shown.size))) +
+                    " points wide, by an estimate without fonts";
+    const std::string width = std::to_string(std::lround(shown.width)) + " points";
+    finding.expected = shown.lines == 1
+                           ? "at most " + width
+                           : "at most " + std::to_string(shown.lines) + " lines of " + width;
+    finding.effect = "a text that is probably cut off (" + std::string(shown.where) + ")";
+    finding.remedy = "shorten it, or look at it with the wizard";
+  }
+
+  void checkDevelopmentRegion() {
+    constexpr const char* kKey = "CFBundleDevelopmentRegion";
+    const std::string path = kBundle + "/Contents/Info.plist";
+    const auto information =
+        files_.list(path, {{.file = path},
+                           "the message bundle's list",
+                           "which language users of all others see is left to the system"});
+    if (!information) return;
+    const auto region = information->string(kKey);
+    Finding finding{.id = "region-missing",
+                    .place = {.file = path},
+                    .found = "no \"CFBundleDevelopmentRegion\"",
+                    .expected = "the language for users of all others, such as \"en\"",
+                    .effect = "which language users of all others see is left to the system",
+                    .remedy = "add it"};
+    if (region) {
+      if (serves(languages_, *region)) return;
+      finding.id = "region-without-texts";
+      finding.place.key = {kKey};
+      finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
+      finding.expected = "one of " + joined(languages_);
+      finding.remedy = "name one of these, or add its texts";
+    } else if (information->find(kKey)) {
+      finding.place.key = {kKey};
+      finding.found = "another value than a string";
+    }
+    report_.findings.push_back(std::move(finding));
+  }
+
+  // What the medium cannot bring: the application's own texts.
+  void checkApplicationLanguages() {
+    if (!lists_.information) return;
+    const std::string resources = report_.application + "/Contents/Resources";
+    const std::vector<std::string> own = languagesIn(files_, resources);
+    for (const std::string& language : languages_) {
+      const bool unknown = Language::parse(language).code.empty();
+      if (unknown || serves(own, language)) continue;
+      report_.findings.push_back(
+          {.id = "language-not-in-application",
+           .severity = Severity::kWarning,
+           .place = {.file = resources},
+           .found = "no " + quoted(language + std::string(kLanguageFolder)),
+           .expected = "the languages of the message bundle; there are " + joined(own),
+           .effect =
+               "users of " + quoted(language) +
+               " read in English why the network is used, and hear the gear's name in English",
+           .remedy = "have the application built with these texts"});
+    }
+  }
+
+  const MediumFiles& files_;
+  const Lists& lists_;
+  Report& report_;
+  std::vector<std::string> languages_;
+  std::map<std::string, Dictionary> tables_;
+};
+
+}  // namespace
+
+void checkTexts(const MediumFiles& files, const Lists& lists) {
+  TextCheck(files, lists).run();
+}
+
+}  // namespace onramp::check

@@ -1,0 +1,157 @@
+#include <filesystem>
+#include <system_error>
+
+#include "base/ascii.h"
+#include "media/medium.h"
+#include "platform/bundle.h"
+#include "tools/check/checks.h"
+
+namespace onramp::check {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr const char* kDisplayName = "CFBundleDisplayName";
+
+std::string firstWord(const std::string& text) {
+  return text.substr(0, text.find(' '));
+}
+
+bool isExecutable(const std::string& path) {
+  std::error_code ignored;
+  const fs::perms any = fs::perms::owner_exec | fs::perms::group_exec | fs::perms::others_exec;
+  return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
+}
+
+// Reports a bundle's program that is not there or cannot be started.
+void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::string& relative,
+                  const char* effect) {
+  const std::string list = relative + "/Contents/Info.plist";
+  Finding finding{.place = {.file = list, .key = {"CFBundleExecutable"}}, .effect = effect};
+  const auto program = bundle.executablePath();
+  std::error_code ignored;
+  if (!program) {
+    finding.id = "program-unnamed";
+    finding.place.key.clear();
+    finding.found = "no \"CFBundleExecutable\"";
+    finding.expected = "the program's file name";
+    finding.remedy = "add it";
+  } else if (!fs::is_regular_file(*program, ignored)) {
+    const std::string name = bundle.infoString("CFBundleExecutable").value_or("");
+    finding.id = "program-missing";
+    finding.found = "a program " + quoted(name) + " that is not there";
+    finding.expected = quoted(relative + "/Contents/MacOS/" + name);
+    finding.remedy = "put the program there";
+  } else if (!isExecutable(*program)) {
+    finding.id = "program-not-executable";
+    finding.found = "a program that may not be executed: " +
+                    quoted(program->substr(files.fullPath("").size() + 1));
+    finding.expected = "a file that everyone may execute";
+    finding.remedy = "chmod a+x, and master the medium on a file system that keeps it";
+  }
+  if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
+}
+
+// A translation that keeps the name of the maker whose medium was copied.
+void checkTranslations(const MediumFiles& files, const std::string& relative,
+                       const std::string& name, const std::string& vendor) {
+  const std::string maker = firstWord(vendor);
+  const auto names = [&](const std::string& text) {
+    return asciiLowercased(text).find(asciiLowercased(maker)) != std::string::npos;
+  };
+  if (maker.empty() || !names(name)) return;
+  const std::string resources = relative + "/Contents/Resources";
+  for (const std::string& folder : files.names(resources)) {
+    const std::string table = resources + "/" + folder + "/InfoPlist.strings";
+    std::error_code ignored;
+    if (!folder.ends_with(".lproj") || !fs::exists(files.fullPath(table), ignored)) continue;
+    const auto texts = files.strings(
+        table, {{.file = table}, "the tool's names", "the tool's untranslated name on macOS"});
+    const auto translated = texts ? texts->string(kDisplayName) : std::nullopt;
+    if (!translated || names(*translated)) continue;
+    files.report().findings.push_back(
+        {.id = "tool-name-left-over",
+         .severity = Severity::kWarning,
+         .place = {.file = table, .key = {kDisplayName}},
+         .found = "the name " + quoted(*translated) + ", without " + quoted(maker),
+         .expected = "a translation of " + quoted(name),
+         .effect = "on macOS, users of that language read that name",
+         .remedy = "translate the name that the tool has now"});
+  }
+}
+
+}  // namespace
+
+void checkTool(const MediumFiles& files, const Lists& lists) {
+  constexpr const char* kEffect =
+      "when no wireless device is found, no set-up tool runs; the search begins again instead";
+  const Dictionary resources = lists.resources.value_or(Dictionary());
+  const Place place{.file = lists.resourcesPath, .key = {std::string(medium::kWLANtool)}};
+  const auto relative = resources.string(medium::kWLANtool);
+  if (!relative) {
+    if (!lists.resources || resources.find(medium::kWLANtool) || !lists.anyWireless()) return;
+    files.report().findings.push_back({.id = "tool-none",
+                                       .severity = Severity::kWarning,
+                                       .place = {.file = lists.resourcesPath},
+                                       .found = "no \"WLANtool\"",
+                                       .expected = "the wireless set-up tool's path",
+                                       .effect = kEffect,
+                                       .remedy = "add it"});
+    return;
+  }
+  if (!files.exists(*relative, {place, "the wireless set-up tool", kEffect})) return;
+  const auto bundle = Bundle::open(files.fullPath(*relative));
+  if (!bundle) {
+    files.report().findings.push_back({.id = "tool-no-bundle",
+                                       .place = place,
+                                       .found = "a file at " + quoted(*relative),
+                                       .expected = "an application's folder",
+                                       .effect = kEffect,
+                                       .remedy = "name the folder that ends in \".app\""});
+    return;
+  }
+  const std::string list = *relative + "/Contents/Info.plist";
+  const auto information = files.list(list, {{.file = list}, "the set-up tool's list", kEffect});
+  if (!information) return;
+  checkProgram(files, *bundle, *relative, kEffect);
+  const auto name = information->string(kDisplayName);
+  if (name) {
+    checkTranslations(files, *relative, *name, resources.string(medium::kVenderName).value_or(""));
+    return;
+  }
+  files.report().findings.push_back({.id = "tool-unnamed",
+                                     .place = {.file = list},
+                                     .found = "no \"CFBundleDisplayName\"",
+                                     .expected = "the tool's name, a string",
+                                     .effect = "an entry without a name in the chooser's menu",
+                                     .remedy = "add it"});
+}
+
+void checkApplication(const MediumFiles& files, const Lists& lists) {
+  if (!lists.information) return;
+  const std::string& application = files.report().application;
+  const auto bundle = Bundle::open(files.application());
+  if (bundle) {
+    checkProgram(files, *bundle, application, "the wizard does not start");
+  }
+  const auto options =
+      lists.description ? lists.description->dictionary("InstallPKG") : std::nullopt;
+  const Value* const online = options ? options->find("PKG_KestrelOnline") : nullptr;
+  if (!online || online->boolean() == false) return;
+  const std::string countries = application + "/Contents/Resources/SupportedKOL.plist";
+  const auto list =
+      files.list(countries, {{.file = countries},
+                             "the list of countries with the online service",
+                             "the package is told that the online service is not available"});
+  if (!list || list->dictionary("Country")) return;
+  files.report().findings.push_back(
+      {.id = "key-missing",
+       .place = {.file = countries},
+       .found = "no \"Country\"",
+       .expected = "a dictionary by country code",
+       .effect = "the package is told that the online service is not available",
+       .remedy = "add it"});
+}
+
+}  // namespace onramp::check
