@@ -217,6 +217,13 @@ class Networks(unittest.TestCase):
                                  *sys.argv[1:4], tests)
                     self.assertEqual(result.returncode, 0, result.stderr)
 
+    def test_a_broadcast_reaches_a_practice_network_of_two_hosts(self):
+        with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:
+            description.write('[[device]]\nname = "Far"\n')
+            description.flush()
+            result = run(TOOL, "--hosts", "2", description.name, PROGRAM, "hosts")
+        self.assertIn("  address 192.0.2.10  ActiveIF 2 (wireless)\n", result.stdout, result.stderr)
+
 
 if __name__ == "__main__":
     inside = sys.argv[4:]
