@@ -27,7 +27,7 @@ void postResolved(const NetServiceRef& service) {
   post(kResolvedNotification, {{std::string(kServiceInfo), service}});
 }
 
-// The one table that all browses and resolves of the process share.
+// The one table that all browses and resolves of the process share. Each new browser fills it.
 ServiceClientCallbacks& clientCallbacks() {
   static ServiceClientCallbacks callbacks;
   return callbacks;
@@ -62,7 +62,7 @@ void KSBonjour::removeKSBonjourObserver(const KSBonjourObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// Observers may remove themselves from within, so each round goes over a copy of the array.
+// Observers may remove themselves meanwhile, so each round uses a copy of the array.
 
 void KSBonjour::notifyAddToKSBonjourObserver(const NetServiceRef& service) const {
   for (const auto& observer : std::vector(_aryObserver))
@@ -124,13 +124,13 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   }
   const auto stored = _services->find(*key);
   Entry& entry = stored->second;
-  // Not the notification's own service where a newer duplicate has taken its place.
+  // A newer duplicate may have replaced the notification's own service.
   const NetServiceRef storedService = entry.service;
   const bool wasValid = std::exchange(entry.isValid, false);
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
-    // Only the first removal since the last resolve counts: an entry seen three times or more
-    // outlives removals in quick succession.
+    // Only the first removal since the last resolve counts, so an entry that was reported three
+    // times or more survives removals in quick succession. This is meant.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {
@@ -153,7 +153,7 @@ std::string KSBonjour::keyForService(const std::string& name, const std::string&
   return name + '.' + type + domain;
 }
 
-// The key of a service that belongs in this browser's table; nothing for any other.
+// The key of a service that belongs into this browser's table. Nothing for any other.
 std::optional<std::string> KSBonjour::ownKeyOf(const NetServiceRef& service) const {
   if (!service || !_services) return std::nullopt;
   const auto name = service->name();

@@ -12,9 +12,9 @@
 
 namespace onramp {
 
-// What the browsers tell each other of, on the default notification centre, posted by no one in
-// particular. All carry a NetServiceRef under kServiceInfo; add and remove carry the browse flags,
-// an unsigned long, under kAddFlagInfo and kRemoveFlagsInfo.
+// The notifications that browsers exchange on the default notification centre. They are posted
+// without a sender. All carry a NetServiceRef under kServiceInfo. Add and remove carry the browse
+// flags, an unsigned long, under kAddFlagInfo and kRemoveFlagsInfo.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
 inline constexpr std::string_view kRemoveNotification = "removeNotificationInternal";
 inline constexpr std::string_view kResolvedNotification = "resolveNotificationInternal";
@@ -22,8 +22,8 @@ inline constexpr std::string_view kServiceInfo = "service";
 inline constexpr std::string_view kAddFlagInfo = "flag";
 inline constexpr std::string_view kRemoveFlagsInfo = "flags";
 
-/// Told what browsers find, of whatever type: every started browser forwards what all of them see.
-/// A service may be null.
+/// Receives what browsers find, whatever its type, because every started browser forwards the
+/// events of all of them.
 class KSBonjourObserver {
  public:
   KSBonjourObserver() = default;
@@ -31,17 +31,21 @@ class KSBonjourObserver {
   KSBonjourObserver& operator=(const KSBonjourObserver&) = delete;
   virtual ~KSBonjourObserver() = default;
 
+  /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
+  /// Called when a service is gone, after the table has been updated. An entry that is still
+  /// counted stays there. `service` is the table's object, or null when the browser's table has
+  /// none.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
+  /// Called when a service's addresses and texts are known, after the table has been updated.
   virtual void resolvedBonjourService(const NetServiceRef& service) = 0;
 };
 
 /// Browses for services of one type, resolves each one found and keeps a table of them. A service
-/// seen several times, say on two network interfaces, is one entry that counts how often. Main
-/// thread only.
+/// that is reported several times is one entry, which counts how often. Main thread only.
 class KSBonjour {
  public:
-  /// An idle browser for `type`; one without a type never starts.
+  /// Creates an idle browser for `type`. One without a type never starts.
   [[nodiscard]] static std::shared_ptr<KSBonjour> initWithType(std::optional<std::string> type);
 
   KSBonjour(const KSBonjour&) = delete;
@@ -50,19 +54,21 @@ class KSBonjour {
 
   [[nodiscard]] const std::optional<std::string>& type() const { return _type; }
 
-  /// Observers are retained and told in the order in which they were added.
+  /// Observers are retained and called in the order in which they were added. They may remove
+  /// themselves or destroy the browser.
   void addKSBonjourObserver(std::shared_ptr<KSBonjourObserver> observer);
   void removeKSBonjourObserver(const KSBonjourObserver* observer);
 
+  // Each calls the operation of that name on every observer.
   void notifyAddToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyRemoveToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyResolvedToKSBonjourObserver(const NetServiceRef& service) const;
 
-  /// Starts with an empty table, anew if it runs already. A browse that cannot start leaves the
+  /// Starts with an empty table, after stopping if it runs. A browse that cannot start leaves the
   /// browser idle.
   void startBrowsing();
 
-  /// Ends the browse and forgets the table; observers are not told of it.
+  /// Ends the browse and forgets the table without calling observers.
   void stopBrowsing();
 
   // Handlers of the three notifications.
@@ -74,7 +80,7 @@ class KSBonjour {
   [[nodiscard]] static std::string keyForService(const std::string& name, const std::string& type,
                                                  const std::string& domain);
 
-  // Answers from the table: false or null for whatever is not in it, and for a null text.
+  // What the table says: false or null for what is not in it, and for a null text.
   [[nodiscard]] bool isServiceContained(const std::optional<std::string>& name,
                                         const std::optional<std::string>& type,
                                         const std::optional<std::string>& domain) const;
@@ -88,7 +94,7 @@ class KSBonjour {
     NetServiceRef service;
     int referenceCount = 0;    ///< adds outstanding for the key
     bool didResolved = false;  ///< a resolve has completed
-    bool isValid = true;  ///< false once a removal has hit the entry, until it is resolved anew
+    bool isValid = true;       ///< false from a removal until the next resolve has completed
   };
   using Table = std::map<std::string, Entry>;
 

@@ -43,7 +43,7 @@ void KSBonjourSearch::removeKSDeviceObserver(const KSDeviceObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// Observers may remove themselves from within, so each round goes over a copy of the array.
+// Observers may remove themselves meanwhile, so each round uses a copy of the array.
 
 void KSBonjourSearch::notifyAddToKSDeviceObserver(const Dictionary& device) const {
   for (const auto& observer : std::vector(_aryObserver))
@@ -69,9 +69,10 @@ void KSBonjourSearch::startBrowsing() {
   _aryKSBonjour.push_back(browser);
 }
 
+// Stopped browsers stay in the array and answer every question with false.
 void KSBonjourSearch::stopBrowsing() {
   NotificationCenter::defaultCenter().removeObserver(this);
-  // The browsers' hold on this object may be the last one.
+  // The browsers may be this object's last owners.
   const auto self = weak_from_this().lock();
   for (const auto& browser : _aryKSBonjour) {
     browser->stopBrowsing();
@@ -100,7 +101,7 @@ void KSBonjourSearch::resolvedBonjourService(const NetServiceRef& service) {
     return b->isServiceContained(id.name, id.type, id.domain) &&
            b->didServiceResolved(id.name, id.type, id.domain);
   });
-  // The browser that reports has stored the entry already, so the usual news is an update.
+  // The browser that reports has stored the entry before, so this is usually an update.
   if (known) {
     notifyUpdateToKSDeviceObserver(record);
   } else {

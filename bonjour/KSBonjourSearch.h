@@ -10,8 +10,7 @@
 
 namespace onramp {
 
-/// Told of devices, each as a KSDevice record. An update of a device that the observer does not
-/// know is an addition.
+/// Receives the devices of a search, each as a KSDevice record.
 class KSDeviceObserver {
  public:
   KSDeviceObserver() = default;
@@ -19,13 +18,17 @@ class KSDeviceObserver {
   KSDeviceObserver& operator=(const KSDeviceObserver&) = delete;
   virtual ~KSDeviceObserver() = default;
 
+  /// Called when a device is resolved that no browser's table has.
   virtual void addKSDevice(const Dictionary& device) = 0;
+  /// Called when a device is resolved, or is gone once but still counted. This is the usual way in
+  /// which a new device is announced: observers add one that they do not know.
   virtual void updateKSDevice(const Dictionary& device) = 0;
+  /// Called when a device is gone.
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
-/// Searches the network for the medium's devices and tells of each one once it is resolved. While
-/// it runs, it and its browsers hold each other: stopBrowsing() lets go. Main thread only.
+/// Searches the network for the medium's devices and reports each one when it is resolved. While it
+/// runs, it and its browsers own each other; stopBrowsing() ends that. Main thread only.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:
@@ -35,18 +38,20 @@ class KSBonjourSearch final : public KSBonjourObserver,
   KSBonjourSearch& operator=(const KSBonjourSearch&) = delete;
   ~KSBonjourSearch() override;
 
-  /// Observers are retained and told in the order in which they were added.
+  /// Observers are retained and called in the order in which they were added. They may remove
+  /// themselves or destroy the search.
   void addKSDeviceObserver(std::shared_ptr<KSDeviceObserver> observer);
   void removeKSDeviceObserver(const KSDeviceObserver* observer);
 
+  // Each calls the operation of that name on every observer.
   void notifyAddToKSDeviceObserver(const Dictionary& device) const;
   void notifyUpdateToKSDeviceObserver(const Dictionary& device) const;
   void notifyRemoveToKSDeviceObserver(const Dictionary& device) const;
 
-  /// Searches for the service type that the medium names, anew if it runs already.
+  /// Searches for the service type that the medium names, after stopping if it runs.
   void startBrowsing();
 
-  /// Ends the search; observers are not told of anything.
+  /// Ends the search without calling observers.
   void stopBrowsing();
 
   /// The types under which the browsers know that instance, in the browsers' order.

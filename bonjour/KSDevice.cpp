@@ -9,7 +9,8 @@ namespace onramp {
 
 namespace {
 
-// Without a service the texts are known to be empty; with one they may be unknown.
+// An empty text without a service, but nothing for what a service does not say: only the first
+// counts as part of a model name.
 std::optional<std::string> textOf(const NetServiceRef& service,
                                   std::optional<std::string> (*read)(const NetServiceRef&)) {
   return service ? read(service) : "";

@@ -8,13 +8,13 @@
 
 namespace onramp {
 
-/// What the wizard knows of a device on the network: a flat record made of one service. Unknown
-/// texts are empty, unknown lists too; nothing is ever absent.
+/// What the wizard knows about a device on the network: a flat record made of one service. Unknown
+/// texts and lists are empty.
 class KSDevice {
  public:
   KSDevice() = delete;
 
-  // Keys of the record; all eight are always present.
+  // Keys of the record. All eight are always present.
   static constexpr std::string_view kDisplayName = "display name";  ///< string
   static constexpr std::string_view kModelName = "model name";      ///< string
   static constexpr std::string_view kBonjourServiceType =
@@ -25,7 +25,8 @@ class KSDevice {
   static constexpr std::string_view kDeviceURI = "device URI";           ///< string
   static constexpr std::string_view kIPAddressList = "IP address list";  ///< array of strings
 
-  /// The record of `service`, which is known under the service types `types`; either may be null.
+  /// Makes the record of `service`, which is known under the service types `types`. Either may be
+  /// null.
   [[nodiscard]] static Dictionary initWithService(const NetServiceRef& service,
                                                   const std::optional<Array>& types);
 };

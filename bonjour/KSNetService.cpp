@@ -9,7 +9,7 @@ namespace onramp {
 
 namespace {
 
-// Where a socket address of the BSD layout has its family and an IPv4 one its address.
+// The place of the family in a socket address of the BSD layout, and that of an IPv4 address.
 constexpr std::size_t kFamilyOffset = 1;
 constexpr std::size_t kIPv4Offset = 4;
 constexpr std::size_t kIPv4Size = 4;

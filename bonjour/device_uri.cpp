@@ -11,7 +11,8 @@ namespace {
 
 constexpr std::string_view kAuthorityStart = "://";
 constexpr std::string_view kLocalDomain = "local.";
-constexpr std::size_t kProtocolLabelLength = 5;
+constexpr std::size_t kProtocolLabelLength = std::string_view("_tcp.").size();
+constexpr std::size_t kDotAndLetter = 2;  // what comes before the protocol label at least
 
 bool staysInName(char c) {
   return isASCIILetterOrDigit(c) || std::string_view("-_.!~*'$").find(c) != std::string_view::npos;
@@ -63,12 +64,12 @@ std::optional<std::string> percentUnescaped(std::string_view text) {
 std::optional<ServiceInstance> serviceInstanceOf(std::string_view uri) {
   std::size_t protocol = uri.find("_tcp.");
   if (protocol == std::string_view::npos) protocol = uri.find("_udp.");
-  if (protocol == std::string_view::npos || protocol < 2) return std::nullopt;
+  if (protocol == std::string_view::npos || protocol < kDotAndLetter) return std::nullopt;
 
   const std::size_t typeEnd = protocol + kProtocolLabelLength;
   if (uri.substr(typeEnd).rfind(kLocalDomain) == std::string_view::npos) return std::nullopt;
 
-  const std::size_t dot = uri.substr(0, protocol - 2).rfind('.');
+  const std::size_t dot = uri.substr(0, protocol - kDotAndLetter).rfind('.');
   const std::size_t scheme = uri.find(kAuthorityStart);
   if (dot == std::string_view::npos || scheme == std::string_view::npos) return std::nullopt;
   const std::size_t nameStart = scheme + kAuthorityStart.size();
@@ -91,8 +92,12 @@ std::optional<std::string> hostOfURL(std::string_view url) {
   if (const auto at = authority.rfind('@'); at != std::string_view::npos) {
     authority.remove_prefix(at + 1);
   }
-  std::string_view host = authority.substr(0, authority.find(':'));
-  if (authority.starts_with('[')) host = authority.substr(1, authority.find(']') - 1);
+  char end = ':';
+  if (authority.starts_with('[')) {
+    authority.remove_prefix(1);
+    end = ']';
+  }
+  const std::string_view host = authority.substr(0, authority.find(end));
   if (host.empty()) return std::nullopt;
   return std::string(host);
 }

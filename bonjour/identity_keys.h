@@ -6,11 +6,11 @@
 
 namespace onramp {
 
-/// The service types whose announcements say which maker's and which model a device is.
+/// The service types whose announcements name the device's maker and model.
 inline constexpr std::array<std::string_view, 4> kIdentifyingTypes{
     "_pdl-datastream._tcp.", "_printer._tcp.", "_ipp._tcp.", "_scanner._tcp."};
 
-/// The keys under which a service's TXT record says it.
+/// The keys in a service's TXT record that name them.
 struct IdentityKeys {
   std::string_view manufacturer;
   std::string_view model;

@@ -18,6 +18,8 @@ function(onramp_resource file)
 endfunction()
 
 onramp_resource(${PROJECT_SOURCE_DIR}/resources/Background.png)
+onramp_resource(${PROJECT_SOURCE_DIR}/resources/Background@2x.png)
+onramp_resource(${PROJECT_SOURCE_DIR}/resources/Onramp.icns)
 onramp_resource(${PROJECT_SOURCE_DIR}/resources/SupportedKOL.plist)
 file(GLOB tables CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.lproj/*.strings)
 foreach(table IN LISTS tables)

@@ -9,6 +9,7 @@ set_target_properties(onramp PROPERTIES
   RUNTIME_OUTPUT_DIRECTORY "${onramp_contents}/Linux")
 configure_file(${PROJECT_SOURCE_DIR}/resources/Info.plist.in ${PROJECT_BINARY_DIR}/Info.plist @ONLY)
 file(GLOB onramp_languages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.lproj)
+file(GLOB onramp_pictures CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.png)
 file(GLOB onramp_interfaces CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/${ONRAMP_UI}/*.*)
 
 set(copy_languages)
@@ -26,7 +27,7 @@ add_custom_target(medium ALL
   COMMAND ${CMAKE_COMMAND} -E make_directory ${onramp_contents}/Resources
   COMMAND ${CMAKE_COMMAND} -E copy ${PROJECT_BINARY_DIR}/Info.plist ${onramp_contents}/Info.plist
   COMMAND ${CMAKE_COMMAND} -E copy ${onramp_interfaces}
-    ${PROJECT_SOURCE_DIR}/resources/Background.png
+    ${onramp_pictures}
     ${PROJECT_SOURCE_DIR}/resources/SupportedKOL.plist ${onramp_contents}/Resources
   ${copy_languages}
   DEPENDS onramp

@@ -1,17 +1,20 @@
 #!/usr/bin/python3
-"""Discovery beside avahi-browse on the same network in the same run, as ratios.
+"""Compares discovery with avahi-browse on the same network in the same run, as ratios.
 
 Usage: discovery_bench.py [BUILD], the folder of a release build (default build/release).
 
-Each time is from the start of the program to its line about the last service that it has resolved.
-Warm: one host, all in its daemon's cache. Cold: two hosts with a cable between them, and a daemon
-without any cache for each single search. Then the processor time of a search that idles.
+Measures 1, 20 and 200 services on dual-stack networks of one and of two interfaces. Each time is
+from the start of the program to its line about the last service that it has resolved. Warm: one
+host, all services in its daemon's cache. Cold: two hosts joined by cables, and a daemon with an
+empty cache for each single search. At the end of the warm part: the processor time of a search that
+idles.
 """
 
 import pathlib
 import statistics
 import subprocess
 import sys
+import tempfile
 import time
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
@@ -23,6 +26,7 @@ from practice_network.control import PracticeNetwork  # noqa: E402
 TYPE = "_ipp._tcp"
 COUNTS = (1, 20, 200)
 ROUNDS = {"warm": 15, "cold": 5}
+HOSTS = {"warm": 1, "cold": 2}
 IDLE_SECONDS = 30
 
 
@@ -66,7 +70,7 @@ def empty_cache():
     time.sleep(3)
 
 
-def compare(state, probe):
+def compare(state, interfaces, probe):
     network = PracticeNetwork()
     for count in COUNTS:
         grow_to(network, count)
@@ -80,26 +84,38 @@ def compare(state, probe):
                     samples[program].append(seconds)
         ratios = [one / other for one, other in zip(samples[ours], samples[peer])]
         low, middle, high = statistics.quantiles(ratios)
-        print(f"{state} {count:4} services: {statistics.median(samples[ours]):.3f} s, avahi-browse "
+        print(f"{state}, {interfaces} interface(s), {count:3} services: "
+              f"{statistics.median(samples[ours]):.3f} s, avahi-browse "
               f"{statistics.median(samples[peer]):.3f} s, ratio {middle:.2f} "
               f"(quartiles {low:.2f} to {high:.2f})", flush=True)
 
 
-def idle(probe):
+def idle(interfaces, probe):
     with discovery.Search(probe, TYPE) as search:
         search.wait_for("update", "Kestrel 1")
         time.sleep(IDLE_SECONDS)
         search.end()
-        print(f"idle for {IDLE_SECONDS} s with {COUNTS[-1]} services found: "
-              f"{search.processor_seconds():.3f} s of processor time, start included")
+        print(f"idle for {IDLE_SECONDS} s, {interfaces} interface(s), {COUNTS[-1]} services found: "
+              f"{search.processor_seconds():.3f} s of processor time, start included", flush=True)
+
+
+def run_inside(state, interfaces, probe):
+    """Starts this program over on a practice network; returns its exit status."""
+    with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:
+        description.write(f"[network]\ninterfaces = {interfaces}\n")
+        description.flush()
+        return subprocess.run([sys.executable, "-B", discovery.PRACTICE_NETWORK,
+                               "--hosts", str(HOSTS[state]), description.name,
+                               sys.executable, "-B", __file__, "--inside", state, str(interfaces),
+                               probe], check=False).returncode
 
 
 def main():
     match sys.argv[1:]:
-        case ["--inside", state, probe]:
-            compare(state, probe)
+        case ["--inside", state, interfaces, probe]:
+            compare(state, interfaces, probe)
             if state == "warm":
-                idle(probe)
+                idle(interfaces, probe)
             return 0
     build = pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/release").resolve()
     probe = build / "tests/bonjour/bonjour_probe"
@@ -107,12 +123,10 @@ def main():
         print(f"{probe} is missing; build it: cmake --preset release && "
               "cmake --build --preset release --target bonjour_probe", file=sys.stderr)
         return 2
-    for state, hosts in (("warm", "1"), ("cold", "2")):
-        status = subprocess.run([sys.executable, "-B", discovery.PRACTICE_NETWORK, "--hosts", hosts,
-                                 ROOT / "tests/bonjour/network.toml", sys.executable, "-B",
-                                 __file__, "--inside", state, probe], check=False).returncode
-        if status:
-            return status
+    for state in HOSTS:
+        for interfaces in (1, 2):
+            if status := run_inside(state, interfaces, probe):
+                return status
     return 0
 
 

@@ -22,7 +22,7 @@ constexpr const char* kOwnerChanges =
 // What fails at once is not tried again at once, or it would keep the processor busy.
 constexpr std::chrono::milliseconds kRetryPause{1000};
 
-// A daemon that hangs answers when it goes on, and for one that goes the bus answers.
+// A daemon that hangs answers when it goes on. When the daemon dies, the bus answers for it.
 constexpr std::uint64_t kForever = std::numeric_limits<std::uint64_t>::max();
 
 }  // namespace
@@ -95,7 +95,7 @@ bool Daemon::watchDaemon() {
          });
 }
 
-// Systems that start the daemon on demand do it now. The bus tells when it has come.
+// Systems that start the daemon on demand do it now. The bus reports its arrival.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");
   if (request && sd_bus_message_append(request.get(), "su", kAvahi, 0U) >= 0) {
@@ -136,7 +136,7 @@ void Daemon::arrived() {
   }
 }
 
-// A query that is told may remove others.
+// A query's handler may remove other queries.
 void Daemon::lost() {
   isPresent_ = false;
   ++losses_;
@@ -159,7 +159,7 @@ Message Daemon::newCall(const char* method) const {
   return Message(message);
 }
 
-// The bus owns `reply`, and destroys it after the answer or together with itself.
+// The bus owns `reply` and destroys it after the answer, or when it is destroyed itself.
 bool Daemon::call(sd_bus_message* message, Reply reply) {
   const auto answered = [](sd_bus_message* answer, void* receiver, sd_bus_error*) {
     (*static_cast<Reply*>(receiver))(answer);

@@ -16,26 +16,27 @@ namespace onramp::avahi {
 
 class Query;
 
-/// The way to the Avahi daemon over the system's message bus. Bus and daemon may be absent, come
-/// and go at any time; queries last, and are put again to each new daemon. No call ever waits for
-/// the daemon. Main thread only. README.md tells the whole story.
+/// The connection to the Avahi daemon over the system's message bus. Bus and daemon may be absent,
+/// come and go at any time. Queries stay, and are sent again to each new daemon. No call waits for
+/// the daemon. Main thread only. README.md explains the whole.
 class Daemon {
  public:
-  /// The one that the main thread's loop runs, alive for as long as somebody holds it. Null when a
-  /// descriptor or thread cannot be had.
+  /// The connection that the main thread's loop runs. It lives as long as somebody holds it. Null
+  /// when the system has no descriptor or thread for it.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 
-  /// One that runs only inside runUntil(); null when a descriptor cannot be had.
+  /// Creates a connection that runs only inside runUntil(). Null when the system has no descriptor
+  /// for it.
   [[nodiscard]] static std::unique_ptr<Daemon> create();
 
   Daemon(const Daemon&) = delete;
   Daemon& operator=(const Daemon&) = delete;
   ~Daemon() = default;
 
-  /// Blocks until `done`; false when the loop fails before.
+  /// Runs the loop until `done` returns true. Returns false when the loop fails before.
   bool runUntil(const std::function<bool()>& done);
 
-  /// How often the daemon has gone so far.
+  /// How often the daemon has gone away so far.
   [[nodiscard]] unsigned losses() const { return losses_; }
 
   [[nodiscard]] sd_event* loop() const { return loop_.get(); }
@@ -46,7 +47,7 @@ class Daemon {
 
   explicit Daemon(EventLoop loop);
 
-  // For queries.
+  // What queries use.
   void add(Query* query);
   void remove(Query* query);
   void listen(const std::string& path, Query* query) { listeners_[path] = query; }
@@ -66,8 +67,8 @@ class Daemon {
   static int onMessage(sd_bus_message* message, void* self, sd_bus_error* error);
   static int onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error* error);
 
-  // Destroyed from the last to the first: the thread polls the loop, and the bus and the timer
-  // belong to it.
+  // The members are destroyed from the last to the first: the thread polls the loop, and bus and
+  // timer are part of it.
   EventLoop loop_;
   Timer retry_;
   std::vector<Query*> queries_;

@@ -53,7 +53,7 @@ void LoopThread::runSoon() {
   });
 }
 
-// On the thread. While the main thread has not answered yet, only its answer is waited for.
+// Runs on the thread. After asking the main thread, waits for its answer alone.
 void LoopThread::wait() {
   bool isAsking = false;
   while (!isEnding_) {
@@ -81,7 +81,7 @@ void LoopThread::askMainThread() {
   });
 }
 
-// The last round, which finds nothing to do, also arms what the loop waits for next.
+// The last round finds nothing to do, and prepares what the loop waits for next.
 void LoopThread::runLoop() {
   int done = 0;
   do {

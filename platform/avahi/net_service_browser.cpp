@@ -37,7 +37,7 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   void stopSearch() override;
 
  private:
-  /// What is seen in one domain.
+  /// The search in one domain.
   struct Browse {
     Sightings<Instance> sightings;
     std::unique_ptr<Query> query;
@@ -63,7 +63,7 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   std::unique_ptr<Query> domainQuery_;
 };
 
-// The domain browser names the domains that computer or network are configured for; it leaves out
+// The domain query reports the domains that the computer or the network is configured for, without
 // the local one.
 bool Browser::searchForServices(const std::string& domain, const std::string& type) {
   if (!client_ || daemon_) return false;

@@ -26,8 +26,8 @@ void Query::ask() {
     isRefused_ = true;  // Only a text that is not UTF-8 cannot be appended.
     return;
   }
-  // The answer may come when this query is gone or has been asked again. It then names an object
-  // that nobody wants.
+  // The answer may come when this query is gone or has been sent again. It then names an object
+  // that nobody uses.
   asked_ = std::make_shared<char>();
   const auto answer = [this, &daemon = daemon_, interface = interface(),
                        asked = std::weak_ptr(asked_)](sd_bus_message* reply) {

@@ -13,20 +13,20 @@ namespace onramp::avahi {
 inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
-/// A standing question to the daemon, for as long as this object lives: a browser object of
-/// Avahi's D-Bus interface, version 0.8. (That version's *Prepare methods are used because the
-/// daemon delays what the older ones start by 10 ms.)
+/// A question to the daemon that stays open as long as this object lives: a browser object of
+/// Avahi's D-Bus interface, version 0.8. (The daemon delays by 10 ms what the methods of earlier
+/// versions start; the *Prepare methods of 0.8 avoid that.)
 class Query {
  public:
   enum class Event {
     kFound,           ///< the message is at the arguments of ItemNew
     kGone,            ///< the message is at the arguments of ItemRemove
-    kCacheExhausted,  ///< all that the daemon knew already has been told
-    kLost,            ///< the daemon went or failed: nothing told so far holds any more
+    kCacheExhausted,  ///< the daemon has reported all that it knew already
+    kLost,            ///< the daemon went away or failed: what was found so far is void
   };
   /// Called from within the daemon's loop. It must not destroy the query.
   using Handler = std::function<void(Event event, sd_bus_message* message)>;
-  /// Appends the arguments of the *Prepare method; returns a negative number when it cannot.
+  /// Appends the arguments of the *Prepare method. Returns a negative number on failure.
   using Arguments = std::function<int(sd_bus_message* call)>;
 
   /// `kind` names the objects, such as "RecordBrowser", and is not copied. The daemon must outlive
@@ -36,7 +36,7 @@ class Query {
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Whether the daemon finds the question itself invalid, so that it is not put again.
+  /// Whether the daemon calls the question invalid. Such a question is not repeated.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:
@@ -53,7 +53,7 @@ class Query {
   const char* kind_;
   Arguments arguments_;
   Handler handler_;
-  std::shared_ptr<char> asked_;  ///< set while an answer or an object of the daemon is ours
+  std::shared_ptr<char> asked_;  ///< set while an answer or an object is expected or held
   std::string path_;             ///< the daemon's name for the object; empty before it has one
   bool isRefused_ = false;
 };

@@ -30,7 +30,7 @@ std::optional<Records::Record> recordIn(sd_bus_message* message) {
   return record;
 }
 
-// Every other character stands for itself to the daemon.
+// The daemon takes every other character as it stands.
 void appendLabel(std::string& name, std::string_view label) {
   for (const char c : label) {
     if (c == '.' || c == '\\') name += '\\';

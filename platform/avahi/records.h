@@ -12,7 +12,7 @@
 
 namespace onramp::avahi {
 
-/// A service's name in its three parts, as the daemon has them: without escapes in the name,
+/// The three parts of a service's name as the daemon writes them: without escapes in the name, and
 /// without closing dots.
 struct Instance {
   std::string name;
@@ -23,10 +23,10 @@ struct Instance {
   }
 };
 
-/// The types of DNS records that are asked for (RFC 1035 section 3.2.2, RFC 3596, RFC 2782).
+/// The DNS record types that are used here (RFC 1035 section 3.2.2, RFC 3596, RFC 2782).
 enum class RecordType : std::uint16_t { kIPv4 = 1, kTXT = 16, kIPv6 = 28, kServer = 33 };
 
-/// All records of one name and type on any interface and protocol, for as long as this lives.
+/// The records of one name and type on any interface and protocol, kept up to date.
 class Records {
  public:
   struct Record {
@@ -40,10 +40,10 @@ class Records {
   /// daemon's loop and must not destroy this object.
   Records(Daemon& daemon, const std::string& name, RecordType type, std::function<void()> changed);
 
-  /// In the order in which the daemon told of them.
+  /// The present records, in the order in which the daemon reported them.
   [[nodiscard]] const std::vector<Record>& all() const { return records_; }
 
-  /// Whether the daemon has told all that it knew already.
+  /// Whether the daemon has reported all that it knew already.
   [[nodiscard]] bool isCacheExhausted() const { return isCacheExhausted_; }
 
   [[nodiscard]] bool isRefused() const { return query_.isRefused(); }
@@ -60,17 +60,17 @@ class Records {
 /// The instance's full domain name, with escapes (RFC 6763 section 4.3).
 [[nodiscard]] std::string fullName(const Instance& instance);
 
-/// Where an SRV record says that a service is to be had.
+/// What an SRV record says: where a service is offered.
 struct Server {
   std::string host;  ///< a domain name with escapes, without closing dot
   std::uint16_t port = 0;
 };
 
-/// What an SRV record's data says (RFC 2782); nothing when it is malformed.
+/// Reads an SRV record's data (RFC 2782). Nothing when it is malformed.
 [[nodiscard]] std::optional<Server> serverIn(const Data& data);
 
-/// An address record's address as the seam's socket address; nothing when the data has the size of
-/// neither an IPv4 nor an IPv6 address.
+/// Makes the socket address that NetService::addressing() describes from an address record. Nothing
+/// when the data has the size of neither an IPv4 nor an IPv6 address.
 [[nodiscard]] std::optional<Data> socketAddress(const Records::Record& record, std::uint16_t port);
 
 }  // namespace onramp::avahi

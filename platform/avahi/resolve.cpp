@@ -64,7 +64,7 @@ void Resolve::check() {
   for (const Records::Record& record : addresses->all()) {
     const auto address = socketAddress(record, port_);
     auto& list = resolution.addressing;
-    // Each interface and protocol tells of it again.
+    // The daemon reports it again for each interface and protocol.
     if (address && std::find(list.begin(), list.end(), *address) == list.end()) {
       list.push_back(*address);
     }
@@ -72,8 +72,8 @@ void Resolve::check() {
   end(std::move(resolution));
 }
 
-// IPv4 addresses, or IPv6 ones where there has been time enough for an IPv4 one. Null as long as
-// neither is known.
+// The IPv4 addresses, or the IPv6 ones when no IPv4 address has come in time. Null while neither is
+// known.
 const Records* Resolve::knownAddresses() {
   if (!ipv4_ || !ipv4_->isCacheExhausted()) return nullptr;
   if (!ipv4_->all().empty()) return &*ipv4_;

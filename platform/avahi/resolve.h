@@ -14,18 +14,18 @@
 
 namespace onramp::avahi {
 
-/// What a resolve has found, in the form in which the seam gives it.
+/// The result of a resolve, in the form of NetService::addressing() and txtData().
 struct Resolution {
   std::vector<Data> addressing;
   Data txt;
 };
 
-/// Looks for the server, the TXT record and the addresses of one service, on whatever interface
-/// and protocol they are to be had. It goes on until all are there or its time is up, however often
-/// the daemon goes and comes back.
+/// Looks for the server, the TXT record and the addresses of one service, on any interface and
+/// protocol. It goes on until it has all of them or its time is up. When the daemon goes away, it
+/// begins again with the next one.
 class Resolve {
  public:
-  /// Called once, from within the daemon's loop; with nothing when the time was up. It must not
+  /// Called once, from within the daemon's loop, and with nothing when the time is up. It must not
   /// destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
@@ -46,7 +46,7 @@ class Resolve {
   Daemon& daemon_;
   std::string name_;
   Report report_;
-  Timer check_;  ///< due when something has changed and all messages are read
+  Timer check_;  ///< due after a change, when all messages are read
   Timer timeUp_;
   Timer graceForIPv4_;
   bool isGraceOver_ = false;

@@ -8,7 +8,7 @@
 
 namespace onramp::avahi {
 
-/// The interface and the protocol on which something is seen, by the daemon's numbers.
+/// An interface and a protocol on which something is seen, by the daemon's numbers.
 using Place = std::pair<std::int32_t, std::int32_t>;
 
 /// Folds the sightings of things on several interfaces and protocols into one presence of each.

@@ -8,12 +8,12 @@
 
 namespace onramp::avahi {
 
-/// Calls back once after a while, from within an event loop that it belongs to. It does nothing
-/// when the system has no memory or descriptor for it; isUsable() then returns false.
+/// Calls back once after a while, from within an event loop. When the system has no memory or
+/// descriptor for it, it does nothing and isUsable() returns false.
 class Timer {
  public:
-  /// Timers of a loop that are due together are called in the order of their priorities, after all
-  /// messages when it is SD_EVENT_PRIORITY_IDLE. The action may destroy everything but the timer.
+  /// What is due in a loop at the same time happens in the order of the priorities. Timers of
+  /// SD_EVENT_PRIORITY_IDLE come after all messages. The action must not destroy the timer.
   Timer(sd_event* loop, std::function<void()> action,
         std::int64_t priority = SD_EVENT_PRIORITY_NORMAL);
   Timer(const Timer&) = delete;

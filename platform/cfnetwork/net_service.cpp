@@ -16,7 +16,7 @@ using corefoundation::toString;
 
 class CFService;
 
-// The live handles by what they stand for.
+// The living handles, by their services.
 std::map<CFNetServiceRef, std::weak_ptr<CFService>>& liveServices() {
   static std::map<CFNetServiceRef, std::weak_ptr<CFService>> services;
   return services;

@@ -6,7 +6,7 @@
 
 namespace onramp::cfnetwork {
 
-/// The service that `service` stands for. Not created anew while a handle to it lives.
+/// The handle of `service`: the same one for as long as it lives. Null for null.
 [[nodiscard]] NetServiceRef handleOf(CFNetServiceRef service);
 
 }  // namespace onramp::cfnetwork

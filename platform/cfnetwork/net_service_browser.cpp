@@ -1,13 +1,19 @@
 #include <CoreServices/CoreServices.h>
 
 #include <memory>
+#include <utility>
+#include <vector>
 
 #include "platform/cfnetwork/net_service.h"
 #include "platform/corefoundation/convert.h"
+#include "platform/run_loop.h"
 
 namespace onramp {
 
 namespace {
+
+// An error that comes at once must not keep the processor busy.
+constexpr double kRetryPause = 1;  // seconds
 
 using corefoundation::Reference;
 using corefoundation::toCFString;
@@ -37,33 +43,85 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   }
 
   bool searchForServices(const std::string& domain, const std::string& type) override {
-    const Reference<CFStringRef> domainString = toCFString(domain);
-    const Reference<CFStringRef> typeString = toCFString(type);
-    return domainString && typeString &&
-           CFNetServiceBrowserSearchForServices(browser_.get(), domainString.get(),
-                                                typeString.get(), nullptr);
+    domain_ = toCFString(domain);
+    type_ = toCFString(type);
+    isFailed_ = false;
+    ++search_;
+    return domain_ && type_ && start();
   }
 
-  void invalidate() override { CFNetServiceBrowserInvalidate(browser_.get()); }
+  void invalidate() override {
+    forgetSearch();
+    CFNetServiceBrowserInvalidate(browser_.get());
+  }
 
-  void stopSearch() override { CFNetServiceBrowserStopSearch(browser_.get(), nullptr); }
+  void stopSearch() override {
+    forgetSearch();
+    CFNetServiceBrowserStopSearch(browser_.get(), nullptr);
+  }
 
  private:
-  // The client may let go of the last handle. What was found is a service: domains are not asked
-  // for.
+  bool start() {
+    return CFNetServiceBrowserSearchForServices(browser_.get(), domain_.get(), type_.get(),
+                                                nullptr);
+  }
+
+  void forgetSearch() {
+    domain_ = Reference<CFStringRef>();
+    found_.clear();
+    isFailed_ = false;
+    ++search_;
+  }
+
+  // The client may let go of the last handle.
   static void browsed(CFNetServiceBrowserRef, CFOptionFlags flags, CFTypeRef found,
                       CFStreamError* error, void* info) {
     const auto self = static_cast<CFBrowser*>(info)->shared_from_this();
-    const NetServiceError problem = {error ? error->error : 0};
-    // CFNetServiceRef is not const, where what is found comes as a constant object.
-    auto* const service = static_cast<CFNetServiceRef>(const_cast<void*>(found));
-    self->client_(self, flags, problem.code == 0 ? cfnetwork::handleOf(service) : nullptr, problem,
-                  self->info_);
+    if (error && error->error != 0) {
+      self->failed({error->error});
+      return;
+    }
+    // CFNetServiceRef is not const, but `found` is. It is a service, since no domains are searched.
+    const NetServiceRef service =
+        cfnetwork::handleOf(static_cast<CFNetServiceRef>(const_cast<void*>(found)));
+    if (!service) return;
+    std::erase(self->found_, service);
+    if ((flags & kNetServiceFlagRemove) == 0) self->found_.push_back(service);
+    self->client_(self, flags, service, {}, self->info_);
+  }
+
+  // The responder may have gone away, for instance. The next search finds all services again, so
+  // they are reported as gone. Stopping a search may cause another error, which is ignored.
+  void failed(NetServiceError error) {
+    if (isFailed_ || !domain_) return;
+    isFailed_ = true;
+    CFNetServiceBrowserStopSearch(browser_.get(), nullptr);
+    retryLater();
+    const unsigned long search = search_;
+    const auto self = shared_from_this();
+    for (const NetServiceRef& service : std::exchange(found_, {})) {
+      if (search == search_) client_(self, kNetServiceFlagRemove, service, {}, info_);
+    }
+    if (search == search_) client_(self, 0, nullptr, error, info_);
+  }
+
+  void retryLater() {
+    scheduleTimer(kRetryPause, [weak = weak_from_this(), search = search_] {
+      const auto self = weak.lock();
+      if (!self || search != self->search_) return;
+      self->isFailed_ = false;
+      if (!self->start()) self->retryLater();
+    });
   }
 
   Client client_;
   void* info_;
   Reference<CFNetServiceBrowserRef> browser_;
+  Reference<CFStringRef> domain_;  ///< of the running search; null without one
+  Reference<CFStringRef> type_;
+  std::vector<NetServiceRef> found_;
+  unsigned long search_ = 0;  ///< tells this search's retry from a late one of an earlier one
+  bool isFailed_ = false;     ///< the next try is pending
 };
 
 }  // namespace

@@ -69,9 +69,13 @@ void runModalForWindow(const Window& window) {
   if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
   NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
+  // The controller refuses to close the window meanwhile, and the button shows it.
+  NSButton* const closeButton = [modal standardWindowButton:NSWindowCloseButton];
+  [closeButton setEnabled:NO];
   isModalAborted = !modal;
   while (!isModalAborted)
     [NSApp runModalForWindow:modal];
+  [closeButton setEnabled:YES];
 }
 
 void abortModal() {

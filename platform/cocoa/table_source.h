@@ -6,7 +6,8 @@ namespace onramp {
 class ArrayController;
 }
 
-/// Shows an array controller's entries in a table and keeps the two selections equal.
+/// Shows an array controller's entries in a table and keeps the two selections equal. A
+/// double-click on a row does what the window's default button does.
 @interface OnrampTableSource : NSObject <NSTableViewDataSource, NSTableViewDelegate> {
   NSTableView* _table;
   onramp::ArrayController* _controller;

@@ -1,7 +1,34 @@
 #import "platform/cocoa/table_source.h"
 
+#include <algorithm>
+#include <cmath>
+
 #include "base/array_controller.h"
 #import "platform/cocoa/text.h"
+
+namespace {
+
+constexpr CGFloat kCellPadding = 6;  // points
+
+// The enabled button that Return presses, if the view has one.
+NSButton* defaultButton(NSView* view) {
+  if ([view isKindOfClass:[NSButton class]] && ![view isHidden]) {
+    NSButton* const button = static_cast<NSButton*>(view);
+    if ([[button keyEquivalent] isEqualToString:@"\r"] && [button isEnabled]) return button;
+  }
+  for (NSView* subview in [view subviews]) {
+    if (NSButton* const found = defaultButton(subview)) return found;
+  }
+  return nil;
+}
+
+CGFloat textWidth(NSCell* cell, NSString* text) {
+  NSDictionary* const attributes = [NSDictionary dictionaryWithObject:[cell font]
+                                                               forKey:NSFontAttributeName];
+  return std::ceil([text sizeWithAttributes:attributes].width) + kCellPadding;
+}
+
+}  // namespace
 
 @implementation OnrampTableSource
 
@@ -12,11 +39,15 @@
     _controller = &controller;
     [table setDataSource:self];
     [table setDelegate:self];
+    [table setTarget:self];
+    [table setAction:@selector(chooseRow:)];
+    [table setDoubleAction:@selector(goOn:)];
   }
   return self;
 }
 
 - (void)dealloc {
+  [_table setTarget:nil];
   [_table setDelegate:nil];
   [_table setDataSource:nil];
   [_table release];
@@ -26,7 +57,38 @@
 - (void)reload {
   _isShowingSelection = YES;
   [_table reloadData];
+  [self fitColumns];
   [self showSelection];
+}
+
+// Widens the columns to their texts. Where that takes more room than there is, the first column,
+// which holds the names, gives way.
+- (void)fitColumns {
+  NSArray* const columns = [_table tableColumns];
+  if ([columns count] < 2) return;
+  NSTableColumn* const first = [columns objectAtIndex:0];
+  CGFloat room = [[_table enclosingScrollView] contentSize].width - [_table intercellSpacing].width;
+  for (NSTableColumn* column in columns) {
+    if (column == first) continue;
+    CGFloat width = textWidth([column headerCell], [[column headerCell] stringValue]);
+    for (NSInteger row = 0; row < [self numberOfRowsInTableView:_table]; ++row) {
+      NSString* const text = [self tableView:_table objectValueForTableColumn:column row:row];
+      width = std::max(width, textWidth([column dataCell], text));
+    }
+    if (width > [column width]) [column setWidth:width];
+    room -= [column width] + [_table intercellSpacing].width;
+  }
+  if (room < [first width]) [first setWidth:std::max(room, [first minWidth])];
+}
+
+// A click on the row that is selected already is a choice, too.
+- (void)chooseRow:(id)sender {
+  const NSInteger row = [_table clickedRow];
+  if (row >= 0) _controller->choose(static_cast<std::size_t>(row));
+}
+
+- (void)goOn:(id)sender {
+  if ([_table clickedRow] >= 0) [defaultButton([[_table window] contentView]) performClick:nil];
 }
 
 - (void)showSelection {

@@ -7,11 +7,11 @@ using cocoa::nativeOf;
 
 namespace {
 
-// The first control inside the view, in subview order, that accepts the keyboard focus.
-NSView* firstKeyView(NSView* view) {
-  if ([view isKindOfClass:[NSControl class]] && [view canBecomeKeyView]) return view;
+// The first view of `kind` inside the view, in subview order, that accepts the keyboard focus.
+NSView* firstKeyView(NSView* view, Class kind) {
+  if ([view isKindOfClass:kind] && [view canBecomeKeyView]) return view;
   for (NSView* subview in [view subviews]) {
-    if (NSView* const found = firstKeyView(subview)) return found;
+    if (NSView* const found = firstKeyView(subview, kind)) return found;
   }
   return nil;
 }
@@ -34,7 +34,8 @@ void View::addSubview(const View& inner) const {
   [added setFrame:[view bounds]];
   [added setAutoresizingMask:NSViewWidthSizable | NSViewHeightSizable];
   [view addSubview:added];
-  [[view window] makeFirstResponder:firstKeyView(added)];
+  NSView* const list = firstKeyView(added, [NSTableView class]);
+  [[view window] makeFirstResponder:list ? list : firstKeyView(added, [NSControl class])];
 }
 
 void View::removeFromSuperview() const {

@@ -25,6 +25,7 @@ void beginAlertSheet(const AlertSheet& sheet, const Window& window,
   auto* const box = qt::makeChild<QMessageBox>(qt::nativeOf<QWidget>(window));
   box->setAttribute(Qt::WA_DeleteOnClose);
   box->setWindowModality(Qt::WindowModal);
+  box->setWindowTitle(box->parentWidget()->windowTitle());
   box->setIcon(QMessageBox::Warning);
   box->setTextFormat(Qt::PlainText);
   box->setText(QString::fromStdString(sheet.title));

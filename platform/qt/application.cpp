@@ -3,17 +3,23 @@
 #include <QAction>
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QIcon>
 #include <QMenuBar>
 #include <QPointer>
 #include <QRegularExpression>
-#include <QStyle>
+#include <algorithm>
 #include <cstdio>
+#include <cstdlib>
+#include <string_view>
 #include <vector>
 
 #include "platform/bundle.h"
+#include "platform/qt/accessibility.h"
 #include "platform/qt/loops.h"
-#include "platform/qt/main_window.h"
+#include "platform/qt/menus.h"
 #include "platform/qt/native.h"
+#include "platform/qt/style.h"
+#include "platform/qt/window_events.h"
 #include "platform/run_loop.h"
 #include "platform/standin/stand_in_system.h"
 #include "platform/termination.h"
@@ -34,8 +40,8 @@ std::vector<QPointer<QWidget>>& hiddenWindows() {
   return windows;
 }
 
-// Exits with a message when an option makes no sense.
-void readCommandLine(const QApplication& application) {
+// Exits after --help and --version, and with a message when an option makes no sense.
+void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
   parser.setApplicationDescription(
       QStringLiteral("Sets up a new device from the medium that this application lies on."));
@@ -44,9 +50,14 @@ void readCommandLine(const QApplication& application) {
       QStringLiteral("The system version that the wizard takes to be running."),
       QStringLiteral("X.Y.Z"));
   parser.addOption(version);
-  parser.addHelpOption();
-  parser.addVersionOption();
-  parser.process(application);
+  const QCommandLineOption help = parser.addHelpOption();
+  const QCommandLineOption ownVersion = parser.addVersionOption();
+  if (!parser.parse(arguments)) {
+    std::fprintf(stderr, "%s\n", qPrintable(parser.errorText()));
+    std::exit(kUsageError);
+  }
+  if (parser.isSet(help)) parser.showHelp();
+  if (parser.isSet(ownVersion)) parser.showVersion();
   if (!parser.isSet(version)) return;
   static const QRegularExpression form(QStringLiteral("^\\d+(\\.\\d+){0,2}$"));
   if (!form.match(parser.value(version)).hasMatch()) {
@@ -57,36 +68,71 @@ void readCommandLine(const QApplication& application) {
   setSystemVersion(parser.value(version).toStdString());
 }
 
-// The pages lie on the medium's light picture, so the desktop's dark colours would not be read.
-void setAppearance() {
-  QApplication::setStyle(QStringLiteral("Fusion"));
-  QApplication::setPalette(QApplication::style()->standardPalette());
+bool asksForInformation(int argc, char** argv) {
+  static constexpr std::string_view kOptions[] = {"-h", "--help", "--help-all", "-v", "--version"};
+  return std::any_of(argv + std::min(argc, 1), argv + argc, [](std::string_view argument) {
+    return std::find(std::begin(kOptions), std::end(kOptions), argument) != std::end(kOptions);
+  });
+}
+
+// Qt aborts the process when it finds no display.
+void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
+  if (type == QtFatalMsg) {
+    std::fprintf(stderr,
+                 "Onramp OSX: there is no display to show the wizard on; set DISPLAY or "
+                 "WAYLAND_DISPLAY\n");
+    std::_Exit(kUsageError);
+  }
+  static const bool isVerbose = qEnvironmentVariableIsSet("QT_DEBUG_PLUGINS");
+  if (isVerbose) std::fprintf(stderr, "%s\n", qPrintable(message));
+}
+
+// Makes the application object, which needs a display.
+std::unique_ptr<QApplication> makeApplication(int& argc, char** argv) {
+  const QtMessageHandler usual = qInstallMessageHandler(exitWithoutDisplay);
+  auto application = std::make_unique<QApplication>(argc, argv);
+  qInstallMessageHandler(usual);
+  return application;
+}
+
+void setIcon() {
+  const std::string name = Bundle::main().infoString("CFBundleIconFile").value_or("");
+  if (const auto path = Bundle::main().pathForResource(name, "png")) {
+    QApplication::setWindowIcon(QIcon(QString::fromStdString(*path)));
+  }
 }
 
 }  // namespace
 
 int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate) {
-  QApplication application(argc, argv);
-  setAppearance();
-  QApplication::setQuitOnLastWindowClosed(false);
-  QApplication::setApplicationVersion(
+  QCoreApplication::setApplicationVersion(
       QString::fromStdString(Bundle::main().infoString("CFBundleShortVersionString").value_or("")));
-  readCommandLine(application);
+  if (asksForInformation(argc, argv)) {
+    const QCoreApplication withoutDisplay(argc, argv);
+    readCommandLine(QCoreApplication::arguments());
+  }
+  const std::unique_ptr<QApplication> application = makeApplication(argc, argv);
+  readCommandLine(QCoreApplication::arguments());
+  QApplication::setStyle(std::make_unique<qt::Style>().release());
+  QApplication::setQuitOnLastWindowClosed(false);
+  qt::describeControls();
+  setIcon();
 
   const std::unique_ptr<ApplicationDelegate> delegate = makeDelegate();
   const std::unique_ptr<Interface> mainInterface = Interface::load(mainInterfaceName, *delegate);
   if (!mainInterface) {
-    std::fprintf(stderr, "%s: no interface file %s; copy the application anew\n",
+    std::fprintf(stderr, "%s: no interface file %s; copy the application again\n",
                  Bundle::main().path().c_str(), mainInterfaceName.c_str());
     return 1;
   }
   auto* const window = qt::nativeOf<QWidget>(mainInterface->view());
   menuBar() = window->findChild<QMenuBar*>();
-  qt::makeChild<qt::MainWindow>(window, *delegate);
+  qt::makeChild<qt::WindowEvents>(window, *delegate);
   qt::connectStandardMenuItems(window);
   delegate->setOutlets(*mainInterface);
   delegate->awakeFromNib();
+  if (menuBar()) qt::nameMenuAfterProduct(*menuBar());
 
   performOnMainThread([&delegate] {
     delegate->applicationWillFinishLaunching();

@@ -37,7 +37,16 @@ QRectF ImageViewWidget::target() const {
   return target;
 }
 
+bool ImageViewWidget::isOutOfPlace() const {
+  const auto lightness = [this](QPalette::ColorRole role) {
+    return palette().color(role).lightness();
+  };
+  return scaling_ == ImageScaling::kAxesIndependently &&
+         lightness(QPalette::Window) < lightness(QPalette::WindowText);
+}
+
 void ImageViewWidget::paintEvent(QPaintEvent*) {
+  if (isOutOfPlace()) return;
   if (!pixmap_) pixmap_ = QPixmap(path_);
   if (pixmap_->isNull()) return;
   QPainter painter(this);

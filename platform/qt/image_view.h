@@ -22,6 +22,9 @@ class ImageViewWidget final : public QWidget {
   void paintEvent(QPaintEvent* event) override;
 
  private:
+  /// A stretched picture lies behind light text, which could not be read on it.
+  [[nodiscard]] bool isOutOfPlace() const;
+
   /// Where in this view the image goes.
   [[nodiscard]] QRectF target() const;
 

@@ -3,7 +3,7 @@
 #include <QAbstractButton>
 #include <QAbstractItemView>
 #include <QAction>
-#include <QCoreApplication>
+#include <QApplication>
 #include <QFile>
 #include <QLabel>
 #include <QMenu>
@@ -16,6 +16,7 @@
 
 #include "platform/bundle.h"
 #include "platform/qt/image_view.h"
+#include "platform/qt/list_views.h"
 #include "platform/qt/native.h"
 #include "platform/qt/radio_matrix.h"
 #include "platform/qt/spinner.h"
@@ -24,24 +25,22 @@ namespace onramp {
 
 namespace {
 
-constexpr const char* kViewClass = "viewClass";
+constexpr double kHeadingScale = 1.5;
+constexpr double kGearScale = 1.5;
 
 QString textOf(std::string_view text) {
   return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-// Makes this front end's own widgets, and a plain widget for every class that it does not know,
-// which is how an interface file names a page's class.
+// Makes this front end's own widgets. For a class that it does not know, it makes a plain widget
+// and keeps the name: this is how an interface file names a page's class.
 class Loader final : public QUiLoader {
  public:
-  explicit Loader(QObject* parent) : QUiLoader(parent) {
-    // Nothing here comes from a plug-in; looking for some costs time at every start.
-    clearPluginPaths();
-  }
+  using QUiLoader::QUiLoader;
 
-  /// The application's one loader, since making one takes as long as loading a file.
+  /// The application's only loader. Making one takes as long as loading a file.
   static Loader& shared() {
-    static Loader* const loader = qt::makeChild<Loader>(qApp);
+    static Loader* const loader = makeWithoutPlugIns();
     return *loader;
   }
 
@@ -53,18 +52,46 @@ class Loader final : public QUiLoader {
       widget = qt::makeChild<qt::RadioMatrixWidget>(parent);
     } else if (className == QLatin1String("Spinner")) {
       widget = qt::makeChild<qt::Spinner>(parent);
+    } else if (className == QLatin1String("QListView")) {
+      widget = qt::makeChild<qt::ListWidget>(parent);
+    } else if (className == QLatin1String("QTreeView")) {
+      widget = qt::makeChild<qt::ColumnsWidget>(parent);
     } else if (availableWidgets().contains(className)) {
       widget = QUiLoader::createWidget(className, parent, name);
     } else {
       widget = qt::makeChild<QWidget>(parent);
-      widget->setProperty(kViewClass, className);
+      widget->setProperty(qt::kViewClass, className);
     }
     if (widget) widget->setObjectName(name);
     return widget;
   }
+
+ private:
+  // The constructor loads every Designer plug-in that it finds, and with them half of Qt.
+  static Loader* makeWithoutPlugIns() {
+    const QStringList paths = QCoreApplication::libraryPaths();
+    QCoreApplication::setLibraryPaths({});
+    auto* const loader = qt::makeChild<Loader>(qApp);
+    QCoreApplication::setLibraryPaths(paths);
+    return loader;
+  }
 };
 
-// The texts that stand in the interface file itself, in the user's language.
+void enlargeFont(QWidget& widget, double scale) {
+  QFont font = widget.font();
+  font.setPointSizeF(QApplication::font().pointSizeF() * scale);
+  widget.setFont(font);
+}
+
+// Sizes follow the user's text size.
+void enlargeFonts(QWidget& root) {
+  for (QWidget* const widget : root.findChildren<QWidget*>()) {
+    if (widget->property(qt::kHeading).toBool()) enlargeFont(*widget, kHeadingScale);
+    if (qobject_cast<QToolButton*>(widget)) enlargeFont(*widget, kGearScale);
+  }
+}
+
+// Translates the texts that the interface file itself contains into the user's language.
 void localize(QWidget& root, const std::string& interfaceName) {
   const auto translated = [&](const QString& text) {
     const std::string key = text.toStdString();
@@ -78,7 +105,7 @@ void localize(QWidget& root, const std::string& interfaceName) {
   }
 }
 
-// "titleBinding" names the owner's text that a button or window shows.
+// The property "titleBinding" names the owner's text that a button or window shows.
 void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   const QString key = widget->property("titleBinding").toString();
   if (key.isEmpty()) return;
@@ -91,7 +118,7 @@ void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   });
 }
 
-// "action" names what a click asks the owner for.
+// The property "action" names the owner's action that a click performs.
 void connectAction(QWidget* widget, InterfaceOwner& owner) {
   auto* const button = qobject_cast<QAbstractButton*>(widget);
   const std::string action = widget->property("action").toString().toStdString();
@@ -130,8 +157,7 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// A page's root is a child of the window while it is shown, and goes with it if the window goes
-// first.
+// While a page is shown, its root is a child of the window, which may be destroyed first.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;
@@ -153,6 +179,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
   if (!tree->root) return nullptr;
 
   localize(*tree->root, name);
+  enlargeFonts(*tree->root);
   QList<QWidget*> widgets = tree->root->findChildren<QWidget*>();
   widgets.prepend(tree->root);
   for (QWidget* const widget : widgets) {
@@ -167,7 +194,7 @@ View Interface::view() const {
 }
 
 std::string Interface::viewClass() const {
-  return tree_->root ? tree_->root->property(kViewClass).toString().toStdString() : "";
+  return tree_->root ? tree_->root->property(qt::kViewClass).toString().toStdString() : "";
 }
 
 NativeObject* Interface::find(std::string_view name, OutletKind kind) const {

@@ -9,18 +9,16 @@
 
 namespace onramp::qt {
 
-namespace {
+ListModel::ListModel(QStringList columns, QStringList spokenColumns, QObject* parent)
+    : QAbstractTableModel(parent),
+      columns_(std::move(columns)),
+      spokenColumns_(std::move(spokenColumns)),
+      headers_(columns_) {}
 
-// Rows a little higher than their text are easier to read and to hit.
-QSize rowSize() {
+int ListModel::rowHeight() {
   constexpr int kRoom = 8;
-  return {0, QFontMetrics(QApplication::font()).height() + kRoom};
+  return QFontMetrics(QApplication::font()).height() + kRoom;
 }
-
-}  // namespace
-
-ListModel::ListModel(QStringList columns, QObject* parent)
-    : QAbstractTableModel(parent), columns_(std::move(columns)), headers_(columns_) {}
 
 void ListModel::setController(const ArrayController& controller) {
   controller_ = &controller;
@@ -49,14 +47,31 @@ int ListModel::columnCount(const QModelIndex& parent) const {
 }
 
 QVariant ListModel::data(const QModelIndex& index, int role) const {
-  if (role == Qt::SizeHintRole) return rowSize();
-  // A text too long for its column can be read in full as a tool tip.
-  if (role != Qt::DisplayRole && role != Qt::ToolTipRole) return {};
-  const auto row = static_cast<std::size_t>(index.row());
-  if (!controller_ || row >= controller_->arrangedObjects().size()) return {};
-  const Dictionary& entry = controller_->arrangedObjects()[row];
+  switch (role) {
+    case Qt::DisplayRole:
+    case Qt::ToolTipRole:  // a text too long for its column can be read in full
+      return text(index.row(), columns_.at(index.column()));
+    case Qt::AccessibleTextRole:
+      return index.column() == 0 ? spokenName(index.row()) : QVariant();
+    case Qt::SizeHintRole:  // a single column is as wide as its view, and elides longer texts
+      return columns_.size() == 1 ? QSize(0, rowHeight()) : QVariant();
+    default:
+      return {};
+  }
+}
+
+QString ListModel::spokenName(int row) const {
+  QStringList texts;
+  for (const QString& column : spokenColumns_)
+    texts.append(text(row, column));
+  return texts.join(QStringLiteral(", "));
+}
+
+QString ListModel::text(int row, const QString& column) const {
+  const auto entry = static_cast<std::size_t>(row);
+  if (!controller_ || entry >= controller_->arrangedObjects().size()) return {};
   return QString::fromStdString(
-      entry.string(columns_.at(index.column()).toStdString()).value_or(""));
+      controller_->arrangedObjects()[entry].string(column.toStdString()).value_or(""));
 }
 
 QVariant ListModel::headerData(int section, Qt::Orientation orientation, int role) const {

@@ -14,7 +14,11 @@ class ListModel final : public QAbstractTableModel {
   Q_OBJECT
 
  public:
-  ListModel(QStringList columns, QObject* parent);
+  /// `spokenColumns` are those that together name a row to assistive programs.
+  ListModel(QStringList columns, QStringList spokenColumns, QObject* parent);
+
+  /// The height of a row, with some room around its text.
+  [[nodiscard]] static int rowHeight();
 
   /// Shows the entries of `controller` from now on.
   void setController(const ArrayController& controller);
@@ -31,7 +35,13 @@ class ListModel final : public QAbstractTableModel {
                                     int role) const override;
 
  private:
+  /// Empty where the controller has no such entry or the entry no such text.
+  [[nodiscard]] QString text(int row, const QString& column) const;
+
+  [[nodiscard]] QString spokenName(int row) const;
+
   const QStringList columns_;
+  const QStringList spokenColumns_;
   QStringList headers_;
   const ArrayController* controller_ = nullptr;
   int rows_ = 0;  ///< as the views know it

@@ -1,15 +1,81 @@
+#include "platform/qt/menus.h"
+
 #include <QAction>
+#include <QApplication>
 #include <QMenu>
 #include <QMenuBar>
+#include <QMessageBox>
 
+#include "platform/application.h"
+#include "platform/bundle.h"
 #include "platform/outlets.h"
+#include "platform/qt/loops.h"
 #include "platform/qt/native.h"
 
 namespace onramp {
 
+namespace {
+
+constexpr int kIconSize = 64;
+
+std::string information(const std::string& key) {
+  return Bundle::main().infoString(key).value_or("");
+}
+
+// The panel runs no event loop of its own, so a search wait goes on and ends behind it.
+void showAboutPanel(QWidget* window, const QString& title) {
+  const std::string version = Bundle::main().localizedString("Version %@", "Version %@", "About");
+  auto* const panel = qt::makeChild<QMessageBox>(window);
+  panel->setAttribute(Qt::WA_DeleteOnClose);
+  panel->setWindowModality(Qt::NonModal);
+  panel->setWindowTitle(title);
+  panel->setTextFormat(Qt::PlainText);
+  panel->setIconPixmap(QApplication::windowIcon().pixmap(kIconSize));
+  panel->setText(QString::fromStdString(information("CFBundleName")));
+  panel->setInformativeText(QString::fromStdString(version).replace(
+                                QStringLiteral("%@"), QApplication::applicationVersion()) +
+                            QLatin1Char('\n') +
+                            QString::fromStdString(information("NSHumanReadableCopyright")));
+  panel->addButton(qt::titleText(Bundle::main().localizedString("Close", "Close", "About")),
+                   QMessageBox::AcceptRole);
+  panel->show();
+}
+
+}  // namespace
+
+namespace qt {
+
+void nameMenuAfterProduct(const QMenuBar& bar) {
+  if (bar.actions().isEmpty()) return;
+  bar.actions().first()->setText(QLatin1Char('&') + titleText(information("CFBundleName")));
+}
+
+void connectStandardMenuItems(QWidget* window) {
+  for (QAction* const item : window->findChildren<QAction*>()) {
+    const QString action = item->property("action").toString();
+    if (action == QLatin1String("orderFrontStandardAboutPanel:")) {
+      QObject::connect(item, &QAction::triggered, window,
+                       [window, item] { showAboutPanel(window, item->text()); });
+    } else if (action == QLatin1String("hide:")) {
+      // Desktops cannot bring a hidden program back, but they can a minimised window.
+      QObject::connect(item, &QAction::triggered, window, [window] { window->showMinimized(); });
+    } else if (action == QLatin1String("unhideAllApplications:")) {
+      QObject::connect(item, &QAction::triggered, window, [window] { window->showNormal(); });
+    } else if (action == QLatin1String("hideOtherApplications:")) {
+      item->setEnabled(false);  // only the desktop can hide other programs' windows
+    } else if (action == QLatin1String("terminate:")) {
+      QObject::connect(item, &QAction::triggered, window, [] {
+        if (!isModal()) terminateApplication();
+      });
+    }
+  }
+}
+
+}  // namespace qt
+
 using qt::nativeOf;
 
-// A menu is a QMenuBar or a QMenu, an item one of its actions.
+// A Menu stands for a QMenuBar or a QMenu, a MenuItem for one of its actions.
 
 MenuItem Menu::itemWithTitle(const std::string& title) const {
   const auto* const menu = nativeOf<QWidget>(*this);

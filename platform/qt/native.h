@@ -10,6 +10,11 @@
 
 namespace onramp::qt {
 
+// Properties by which interface files say more than Qt's own ones can.
+inline constexpr const char* kViewClass = "viewClass";          ///< text, set on a page's root
+inline constexpr const char* kHeading = "heading";              ///< of a label: it is a title
+inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: what names a list's row
+
 /// The object that `outlet` stands for, if it is there and of that class; else null.
 template <typename Class>
 [[nodiscard]] Class* nativeOf(const Outlet& outlet) {

@@ -3,13 +3,16 @@
 #include <QCoreApplication>
 #include <QEventLoop>
 #include <QTimer>
+#include <QWidget>
 #include <atomic>
 #include <chrono>
 #include <cmath>
 #include <utility>
 #include <vector>
 
+#include "platform/qt/focus.h"
 #include "platform/qt/loops.h"
+#include "platform/qt/native.h"
 #include "platform/termination.h"
 
 namespace onramp {
@@ -22,8 +25,8 @@ std::vector<QEventLoop*>& modalLoops() {
   return loops;
 }
 
-// Set from the request for the end of a modal loop until it has ended. What else waits for the main
-// thread may keep it for seconds each, so it waits until then.
+// True from abortModal() until the modal loop has returned. Each posted action may occupy the main
+// thread for seconds, so posted actions are held back meanwhile.
 std::atomic<bool> isAborting = false;
 
 }  // namespace
@@ -68,10 +71,12 @@ void runModalForWindow(const Window& window) {
   QEventLoop loop;
   modalLoops().push_back(&loop);
   loop.exec();
-  // Clicks and keys that waited while the main thread was busy were meant for what was shown then.
+  // Handles the clicks and keys that came in while the main thread was busy: they were meant for
+  // the page that was shown then.
   if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;
+  if (const auto* const waited = qt::nativeOf<QWidget>(window)) qt::focusPage(*waited);
 }
 
 void abortModal() {

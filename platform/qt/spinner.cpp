@@ -26,6 +26,12 @@ void Spinner::start() {
 void Spinner::stop() {
   timer_.stop();
   setRange(0, 1);
+  Q_EMIT stopped();
+}
+
+void Spinner::showEvent(QShowEvent* event) {
+  QProgressBar::showEvent(event);
+  if (timer_.isActive()) setFocus(Qt::OtherFocusReason);
 }
 
 void Spinner::timerEvent(QTimerEvent* event) {

@@ -5,8 +5,9 @@
 
 namespace onramp::qt {
 
-/// A wheel of spokes that turns while it is animated. To assistive programs it is what it is for: a
-/// progress bar without a measure.
+/// A wheel of spokes that turns while it is animated. To assistive programs it is a progress bar
+/// that does not show how much is done. It takes the keyboard focus when it appears, so that they
+/// read out what the user is waiting for.
 class Spinner final : public QProgressBar {
   Q_OBJECT
 
@@ -16,7 +17,10 @@ class Spinner final : public QProgressBar {
   void start();
   void stop();
 
+  Q_SIGNAL void stopped();
+
  protected:
+  void showEvent(QShowEvent* event) override;
   void paintEvent(QPaintEvent* event) override;
   void timerEvent(QTimerEvent* event) override;
 

@@ -1,11 +1,13 @@
 #include <QAbstractItemView>
 #include <QHeaderView>
 #include <QItemSelectionModel>
+#include <QPushButton>
 #include <QTreeView>
 
 #include "base/array_controller.h"
 #include "platform/outlets.h"
 #include "platform/qt/list_model.h"
+#include "platform/qt/list_views.h"
 #include "platform/qt/native.h"
 
 namespace onramp {
@@ -15,12 +17,12 @@ namespace {
 using qt::ListModel;
 using qt::nativeOf;
 
-// A view has its model from the start: an interface file names the columns, and headers may be set
-// before there is anything to show.
+// Returns the view's model, which is made on first use: headers may be set before bind().
 ListModel* modelOf(QAbstractItemView* view) {
   if (!view) return nullptr;
   if (auto* const model = qobject_cast<ListModel*>(view->model())) return model;
-  auto* const model = qt::makeChild<ListModel>(view, view->property("columns").toStringList());
+  auto* const model = qt::makeChild<ListModel>(view, view->property("columns").toStringList(),
+                                               view->property(qt::kSpokenColumns).toStringList());
   view->setModel(model);
   return model;
 }
@@ -34,15 +36,8 @@ QHeaderView* headerOf(const TableView& table) {
   return view ? view->header() : nullptr;
 }
 
-// The first column takes what room the others leave.
-void layOutColumns(QAbstractItemView* view) {
-  auto* const tree = qobject_cast<QTreeView*>(view);
-  if (!tree) return;
-  tree->header()->setStretchLastSection(false);
-  for (int column = 0; column < tree->header()->count(); ++column) {
-    tree->header()->setSectionResizeMode(
-        column, column == 0 ? QHeaderView::Stretch : QHeaderView::ResizeToContents);
-  }
+void fitColumns(QAbstractItemView* view) {
+  if (auto* const columns = qobject_cast<qt::ColumnsWidget*>(view)) columns->fitColumns();
 }
 
 void showSelection(QAbstractItemView* view, const ArrayController& controller) {
@@ -58,7 +53,7 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// Takes over the row that the user has selected; a selection that they took away comes back.
+// Passes the row that the user selected to the controller. Selects it again after a deselection.
 void takeSelection(QAbstractItemView* view, ArrayController& controller) {
   const QModelIndexList rows = view->selectionModel()->selectedRows();
   if (rows.isEmpty()) {
@@ -69,6 +64,14 @@ void takeSelection(QAbstractItemView* view, ArrayController& controller) {
   if (row != controller.selectionIndex()) controller.choose(row);
 }
 
+void clickDefaultButton(const QWidget& window) {
+  for (QPushButton* const button : window.findChildren<QPushButton*>()) {
+    if (!button->isDefault() || !button->isVisible()) continue;
+    button->click();
+    return;
+  }
+}
+
 }  // namespace
 
 void TableView::bind(ArrayController& controller) const {
@@ -76,10 +79,10 @@ void TableView::bind(ArrayController& controller) const {
   if (!view) return;
   ListModel* const model = modelOf(view);
   model->setController(controller);
-  layOutColumns(view);
   controller.bind(
       [view, model, &controller] {
         model->reload();
+        fitColumns(view);
         showSelection(view, controller);
       },
       [view, &controller] { showSelection(view, controller); });
@@ -89,6 +92,10 @@ void TableView::bind(ArrayController& controller) const {
                    [&controller](const QModelIndex& index) {
                      controller.choose(static_cast<std::size_t>(index.row()));
                    });
+  // The button may take the list away, so it waits until the list is done with the click.
+  QObject::connect(
+      view, &QAbstractItemView::doubleClicked, view,
+      [view] { clickDefaultButton(*view->window()); }, Qt::QueuedConnection);
 }
 
 void TableView::setAllowsColumnReordering(bool allows) const {
@@ -104,6 +111,7 @@ void TableView::setColumnHeader(std::string_view identifier, const std::string& 
     model->setHeader(
         QString::fromUtf8(identifier.data(), static_cast<qsizetype>(identifier.size())),
         QString::fromStdString(title));
+    fitColumns(nativeOf<QAbstractItemView>(*this));
   }
 }
 

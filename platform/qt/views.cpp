@@ -3,6 +3,7 @@
 #include <QWidget>
 
 #include "platform/outlets.h"
+#include "platform/qt/focus.h"
 #include "platform/qt/native.h"
 
 namespace onramp {
@@ -10,17 +11,6 @@ namespace onramp {
 namespace {
 
 using qt::nativeOf;
-
-// A page that comes up is ready for the keyboard.
-void focusFirstControl(const QWidget& page) {
-  for (QWidget* const widget : page.findChildren<QWidget*>()) {
-    if ((widget->focusPolicy() & Qt::TabFocus) && widget->isVisibleTo(&page) &&
-        widget->isEnabled()) {
-      widget->setFocus();
-      return;
-    }
-  }
-}
 
 }  // namespace
 
@@ -41,7 +31,7 @@ void View::addSubview(const View& inner) const {
   if (!view->layout()) qt::makeChild<QVBoxLayout>(view)->setContentsMargins(0, 0, 0, 0);
   view->layout()->addWidget(added);
   added->show();
-  focusFirstControl(*added);
+  qt::focusFirstControl(*added);
 }
 
 void View::removeFromSuperview() const {
@@ -56,6 +46,8 @@ void TextField::setStringValue(const std::string& text) const {
   if (auto* const label = nativeOf<QLabel>(*this)) {
     label->setTextFormat(Qt::PlainText);
     label->setText(QString::fromStdString(text));
+    // Qt gives only some kinds of control the name of the label that belongs to them.
+    if (label->buddy()) label->buddy()->setAccessibleName(label->text());
   }
 }
 

@@ -1,7 +1,9 @@
+#include <QMainWindow>
 #include <QScreen>
 #include <QWidget>
 
 #include "platform/outlets.h"
+#include "platform/qt/content_size.h"
 #include "platform/qt/native.h"
 
 namespace onramp {
@@ -10,8 +12,8 @@ using qt::nativeOf;
 
 // A window without the indicator cannot be resized.
 void Window::setShowsResizeIndicator(bool shows) const {
-  auto* const window = nativeOf<QWidget>(*this);
-  if (window && !shows) window->setFixedSize(window->size());
+  auto* const window = nativeOf<QMainWindow>(*this);
+  if (window && !shows) qt::makeChild<qt::ContentSize>(window);
 }
 
 void Window::center() const {

@@ -71,6 +71,7 @@ TEST_F(BrowserTest, AServiceIsForwardedResolvedAndForgotten) {
 
   network.resolves(onOne, {});
   EXPECT_TRUE(recorder->events.back().resolvedByThen);
+  EXPECT_THAT(network.log, testing::Contains("browser search \"\" _ipp._tcp."));
   network.gone(onOne);
   EXPECT_FALSE(contains());
   EXPECT_THAT(recorder->events,
@@ -86,7 +87,7 @@ TEST_F(BrowserTest, ADuplicateIsCountedAndTheNewestObjectIsKept) {
   network.resolves(onTwo, {});
 
   network.gone(onOne);
-  EXPECT_TRUE(contains());
+  EXPECT_TRUE(browser->didServiceResolved("Kestrel", "_ipp._tcp.", "local."));
   EXPECT_TRUE(Network::isResolving(onTwo));
   network.gone(onTwo);
   EXPECT_FALSE(contains());

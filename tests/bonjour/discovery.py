@@ -114,7 +114,7 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts it anew with other `settings`, by their names with "_" for "-"."""
+        """Starts it with changed `settings`, which are named with "_" for "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

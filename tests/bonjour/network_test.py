@@ -1,5 +1,6 @@
-"""Discovery against real parts: network_test.py PROBE, started on two hosts with a
-cable between them. The devices are Avahi's on the other host, and another implementation's here."""
+"""Discovery against real daemons: network_test.py PROBE. It runs on two hosts joined by two cables,
+with IPv4 and IPv6. The devices are those of Avahi on the other host, and of another implementation
+on this one."""
 
 import os
 import pathlib
@@ -36,8 +37,8 @@ class NetworkTest(unittest.TestCase):
         self.addCleanup(publisher.terminate)
         return publisher
 
-    def search_anew_for(self, name, field, text):
-        """A record is that of its resolve: only who searches anew has what came after."""
+    def search_again_for(self, name, field, text):
+        """Searches until the record says `text`: a running search does not see a change."""
         deadline = time.monotonic() + discovery.PATIENCE
         found = None
         while found != text and time.monotonic() < deadline:
@@ -74,7 +75,7 @@ class NetworkTest(unittest.TestCase):
             self.add("Merlin", note="Attic")
             self.assertEqual(search.wait_for("update", "Merlin")[4], "Attic")
             self.network.set("Merlin", note="Cellar")
-            self.search_anew_for("Merlin", 4, "Cellar")
+            self.search_again_for("Merlin", 4, "Cellar")
             self.network.remove("Merlin")
             search.wait_for("gone", "Merlin")
             search.wait_for("remove", "Merlin")
@@ -89,7 +90,7 @@ class NetworkTest(unittest.TestCase):
                 self.assertEqual(event[6], "192.0.2.1")
                 responder.tell("usb_MFG=Harrier\tusb_MDL=Jet 8")
                 responder.wait(lambda lines: "updated" in lines)
-                self.search_anew_for("Harrier (2)", 3, "Harrier Jet 8")
+                self.search_again_for("Harrier (2)", 3, "Harrier Jet 8")
             search.wait_for("gone", "Harrier (2)")
             search.wait_for("remove", "Harrier (2)")
 
@@ -164,7 +165,7 @@ class NetworkTest(unittest.TestCase):
             search.wait(lambda _: names <= {event[2] for event in search.events("update")})
 
     def test_a_daemon_that_refuses_is_asked_again(self):
-        names = {f"Flock {number}" for number in range(12)}
+        names = {f"Flock {number}" for number in range(6)}
         for name in names:
             self.add(name)
         self.avahi.restart(objects_per_client_max="5")

@@ -1,6 +1,6 @@
-// Runs a search or a look-up on the real network and prints what comes of it, one line an event:
-// seconds since the start, what happened, whom it concerns. For tests and benchmarks, which start
-// it on a network of their own. It ends when its standard input does.
+// Runs a search or a look-up on the real network and prints its events, one a line: seconds since
+// the start, the event, and what it concerns. Tests and benchmarks run it on a practice network. It
+// ends when its standard input does.
 //
 //   bonjour_probe search TYPE       a KSBonjourSearch for TYPE
 //   bonjour_probe addresses URI SECONDS
@@ -124,7 +124,7 @@ int run(const std::vector<std::string>& arguments) {
 
 }  // namespace
 
-// All that a search asks of medium and system.
+// What a search asks of the medium and the system.
 
 Bundle Bundle::main() {
   return Bundle("/medium/Onramp OSX.app");

@@ -91,6 +91,8 @@ TEST_F(SearchTest, StoppedBrowsersStayAndAnswerNothing) {
 
   browseFor("_pdl-datastream._tcp.");
   search->startBrowsing();
+  search->startBrowsing();
+  EXPECT_EQ(network.browsers.size(), 1u);
   const NetServiceRef raw = Network::service("Kestrel", "_pdl-datastream._tcp.");
   network.found(raw);
   network.resolves(raw, {});

@@ -2,7 +2,6 @@
 
 #include <gtest/gtest.h>
 
-#include "base/text.h"
 #include "tests/recording/network.h"
 
 namespace onramp {
@@ -39,18 +38,6 @@ TEST(TxtRecord, DataThatEndsWithinAStringIsNone) {
   for (std::size_t size = 0; size <= whole.size(); ++size) {
     const bool betweenStrings = size == 0 || size == 4 || size == whole.size();
     EXPECT_EQ(TxtRecord::parse(std::span(whole).first(size)).has_value(), betweenStrings) << size;
-  }
-}
-
-TEST(Utf8, TellsWellFormedTextFromOtherBytes) {
-  for (const char* text : {"", "plain", "\x7f", "\u0080\u07ff", "\u0800\ud7ff\ue000\uffff",
-                           "\U00010000\U0010ffff", "\ufeffmark"}) {
-    EXPECT_TRUE(isUTF8(text)) << text;
-  }
-  for (const char* text :
-       {"\x80", "\xc1\xbf", "\xc3", "\xc3(", "\xe0\x9f\xbf", "\xed\xa0\x80", "\xe2\x82",
-        "\xe2\x82(", "\xf0\x8f\xbf\xbf", "\xf4\x90\x80\x80", "\xf5\x80\x80\x80", "\xff"}) {
-    EXPECT_FALSE(isUTF8(text)) << text;
   }
 }
 

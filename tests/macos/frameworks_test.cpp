@@ -7,6 +7,7 @@
 #include "platform/corefoundation/convert.h"
 #include "platform/dynamic_store.h"
 #include "platform/net_service.h"
+#include "tests/recording/front_end.h"
 
 namespace onramp {
 namespace {
@@ -83,6 +84,30 @@ TEST(CFNetworkBrowser, HandsOnWhatIsFoundAndWhatWentWrong) {
   deliver(kNetServiceFlagRemove, service.get(), 0);
   EXPECT_EQ(seen.service, first);
   EXPECT_EQ(seen.flags, kNetServiceFlagRemove);
+}
+
+TEST(CFNetworkBrowser, LosesWhatItFoundWithAnErrorAndSearchesAgainAfterASecond) {
+  recording::FrontEnd& frontEnd = recording::FrontEnd::instance();
+  Seen seen;
+  seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
+  seen.browser->schedule();
+  EXPECT_TRUE(seen.browser->searchForServices("local.", "_ipp._tcp."));
+  standin::Browser& native = *standin::Browser::last;
+  const auto service = makeService();
+  for (int round = 1; round <= 2; ++round) {
+    deliver(0, service.get(), 0);
+    deliver(0, nullptr, -72000);
+    deliver(0, nullptr, -72005);        // what stopping a search brings
+    EXPECT_EQ(seen.events, 3 * round);  // found, gone, the first error
+    EXPECT_EQ(seen.code, -72000);
+    EXPECT_FALSE(native.isRunning);
+    frontEnd.runTimers();
+    EXPECT_TRUE(native.isRunning);
+  }
+  deliver(0, nullptr, -72000);
+  seen.browser->stopSearch();
+  frontEnd.runTimers();
+  EXPECT_FALSE(native.isRunning);
 }
 
 TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndIsSilentWhenUnscheduled) {

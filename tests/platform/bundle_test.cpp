@@ -60,7 +60,7 @@ TEST(Language, FallsBackToTheDevelopmentLanguageThenEnglishThenAny) {
                         {{"en", "zh"}, {"zh-Hans-CN"}, "en", {"zh", "en"}},
                         {{"sr", "sr-Latn"}, {"sr_RS"}, "en", {"sr", "sr-Latn"}},
                         {{"ja"}, {"fr"}, "en", {"ja"}},
-                        {{"ja", "en_GB"}, {"fr"}, "it", {"en_GB"}},
+                        {{"de", "en_GB"}, {"fr"}, "it", {"en_GB"}},
                         {{"Base", "zh", "ko", "ja"}, {"zh_TW"}, "it", {"ja"}},
                         {{"en", "zh_CN", "zh_TW"}, {"zh_MO"}, "en", {"zh_TW", "en"}},
                         {{"Base"}, {"fr"}, "en", {}},

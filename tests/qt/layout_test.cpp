@@ -5,28 +5,37 @@
 #include <QApplication>
 #include <QHeaderView>
 #include <QLabel>
+#include <QScreen>
 #include <QTreeView>
 #include <cstdlib>
 
 #include "app/OnrampOSXAppDelegate.h"
+#include "bonjour/KSDevice.h"
 #include "pages/ChooseDeviceView.h"
 #include "pages/ConnectionTypeView.h"
 #include "platform/freedesktop/main_bundle.h"
 #include "platform/qt/native.h"
+#include "platform/qt/style.h"
 
 namespace onramp {
 namespace {
+
+constexpr int kTitleBarHeight = 32;
 
 std::string nameOf(const QWidget& widget) {
   return widget.objectName().toStdString();
 }
 
-/// The wizard's window with the example medium's texts in one language.
-class Layout : public testing::TestWithParam<const char*> {
+/// The wizard's window with the texts of one language, in one size.
+class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
  protected:
   void SetUp() override {
-    setenv("LANG", GetParam(), 1);
-    setMainBundlePath(ONRAMP_MEDIUM "/Onramp OSX.app");
+    const auto [language, points] = GetParam();
+    setenv("LANG", language, 1);
+    QFont font = QApplication::font();
+    font.setPointSize(points);
+    QApplication::setFont(font);
+    setMainBundlePath(ONRAMP_CROWDED_MEDIUM "/Onramp OSX.app");
     delegate = std::make_unique<OnrampOSXAppDelegate>();
     mainInterface = Interface::load("MainMenu", *delegate);
     ASSERT_TRUE(mainInterface);
@@ -57,7 +66,21 @@ class Layout : public testing::TestWithParam<const char*> {
     return {widget.mapTo(window, QPoint()), widget.size()};
   }
 
-  static void expectTextFits(const QWidget& widget) {
+  // All but the device's name is readable in full, and nothing lies beyond the edge.
+  static void expectColumnsFit(QTreeView& tree) {
+    int width = 0;
+    for (int column = 0; column < tree.header()->count(); ++column) {
+      const int own = tree.header()->sectionSize(column);
+      width += own;
+      EXPECT_GE(own, tree.header()->sectionSizeHint(column));
+      if (column == 0) continue;  // the name may be elided
+      const QAbstractItemView& view = tree;
+      EXPECT_GE(own, view.sizeHintForColumn(column)) << column;
+    }
+    EXPECT_LE(width, tree.viewport()->width());
+  }
+
+  static void expectTextFits(QWidget& widget) {
     SCOPED_TRACE(nameOf(widget));
     if (const auto* const label = qobject_cast<const QLabel*>(&widget)) {
       EXPECT_GE(label->height(), label->hasHeightForWidth() ? label->heightForWidth(label->width())
@@ -67,15 +90,21 @@ class Layout : public testing::TestWithParam<const char*> {
     } else if (qobject_cast<const QAbstractButton*>(&widget)) {
       EXPECT_GE(widget.width(), widget.sizeHint().width());
       EXPECT_GE(widget.height(), widget.sizeHint().height());
-    } else if (const auto* const tree = qobject_cast<const QTreeView*>(&widget)) {
-      for (int column = 0; column < tree->header()->count(); ++column) {
-        EXPECT_GE(tree->header()->sectionSize(column), tree->header()->sectionSizeHint(column));
-      }
+    } else if (auto* const tree = qobject_cast<QTreeView*>(&widget)) {
+      expectColumnsFit(*tree);
+    }
+    if (const auto* const list = qobject_cast<const QAbstractItemView*>(&widget)) {
+      EXPECT_TRUE(
+          list->viewport()->rect().contains(list->visualRect(list->currentIndex()).center()));
     }
   }
 
   void expectEverythingFits() const {
-    QApplication::processEvents();
+    // Sizes settle in a few rounds: a wider text makes the window wider, which moves the rest.
+    for (int round = 0; round < 5; ++round)
+      QApplication::processEvents();
+    const QSize screen = window->screen()->availableSize() - QSize(0, kTitleBarHeight);
+    EXPECT_EQ(window->size(), window->size().boundedTo(screen));
     const std::vector<QWidget*> controls = shownControls();
     EXPECT_GT(controls.size(), 3U);
     for (std::size_t i = 0; i < controls.size(); ++i) {
@@ -85,6 +114,16 @@ class Layout : public testing::TestWithParam<const char*> {
         EXPECT_FALSE(inWindow(*controls[i]).intersects(inWindow(*controls[j])))
             << nameOf(*controls[i]) << " and " << nameOf(*controls[j]);
       }
+    }
+  }
+
+  static void listDevices(ChooseDeviceView& page) {
+    const std::string names[] = {"Kestrel Photo Printer beside the Window on the Second Floor 001",
+                                 "会議室の複合機二階の窓際にある大型", "Büro 🖨️ links"};
+    for (int i = 40; i > 0; --i) {
+      page.setServiceToList(
+          Dictionary{{KSDevice::kDisplayName, names[i % 3] + std::to_string(i)},
+                     {KSDevice::kIPAddressList, Array{"192.168.100." + std::to_string(200 + i)}}});
     }
   }
 
@@ -111,14 +150,18 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   const auto devices =
       std::static_pointer_cast<ChooseDeviceView>(delegate->loadView("ChooseDeviceView"));
   ASSERT_TRUE(devices);
+  listDevices(*devices);
   delegate->replaceMainView("", devices);
+  EXPECT_EQ(nameOf(*window->focusWidget()), "deviceListView");
   devices->progressON(true);
   expectEverythingFits();
 }
 
 INSTANTIATE_TEST_SUITE_P(Languages, Layout,
-                         testing::Values("en_US.UTF-8", "de_DE.UTF-8", "ja_JP.UTF-8", "ko_KR.UTF-8",
-                                         "zh_CN.UTF-8"));
+                         testing::Combine(testing::Values("en_US.UTF-8", "de_DE.UTF-8",
+                                                          "ja_JP.UTF-8", "ko_KR.UTF-8",
+                                                          "zh_CN.UTF-8", "art.UTF-8"),
+                                          testing::Values(10, 18)));
 
 }  // namespace
 }  // namespace onramp
@@ -128,5 +171,6 @@ int main(int argc, char** argv) {
   for (const char* variable : {"LANGUAGE", "LC_ALL", "LC_MESSAGES"})
     unsetenv(variable);
   const QApplication application(argc, argv);
+  QApplication::setStyle(std::make_unique<onramp::qt::Style>().release());
   return RUN_ALL_TESTS();
 }

@@ -252,7 +252,9 @@ class OnrampCheck(unittest.TestCase):
         result = run("--strict", str(self.medium))
         self.assertEqual((0, ""), (result.returncode, result.stderr), result.stdout)
         for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the list of models",
-                     f": {PACKAGE}", "zh_CN (31 texts)", "0 errors, 0 warnings, 17 models"):
+                     f": {PACKAGE}", "Languages: " + " ".join(
+                         f"{language} (31 texts)" for language in "de en ja ko zh_CN".split()),
+                     "0 errors, 0 warnings, 17 models"):
             self.assertIn(line, result.stdout)
 
     def test_tells_each_mistake_once_and_nothing_else(self):
@@ -279,6 +281,13 @@ class OnrampCheck(unittest.TestCase):
         line = result.stdout.splitlines()[0]
         self.assertTrue(line.startswith(f'{ENGLISH}:9: error: ";" expected'), line)
         self.assertIn("Users get: ", line)
+
+    def test_lists_every_text_that_the_sources_ask_for_and_no_other(self):
+        sources = "".join(path.read_text() for room in ("app", "pages")
+                          for path in (ROOT / room).glob("*.[ch]*"))
+        asked = set(re.findall(r'"((?:INST|BTN|APP_MENU)_\w+)"', sources))
+        listed = [line.split()[0] for line in run("--texts").stdout.splitlines()]
+        self.assertEqual(sorted(asked), sorted(listed))
 
     def test_warnings_count_only_when_it_is_strict(self):
         medium = self.broken(put(COMMON, "Comment", "x"))

@@ -101,6 +101,7 @@ class FromInside(unittest.TestCase):
         for message, request in (
                 ("is not known", lambda: self.network.set("Nobody", port=1)),
                 ("port must be", lambda: self.network.set("Odd", port="x")),
+                ("known are lo", lambda: self.network.unplug("eth7")),
                 ("is there already", lambda: self.network.rename("Odd", "Scanner")),
                 ("another device's", lambda: self.network.add("Twin", addresses=["127.0.1.2"]))):
             with self.subTest(message), self.assertRaisesRegex(ControlError, message):
@@ -167,6 +168,8 @@ class FromOutside(unittest.TestCase):
         for text, message in (
                 ("[[device]]\nname = x\n", "not valid TOML.*line 2"),
                 ('[[devices]]\nname = "A"', r'unknown entry "devices".*\[\[device\]\]'),
+                ('[network]\nipv4 = true', 'network: unknown entry.*did you mean "ipv6"'),
+                ('[network]\ninterfaces = 3', "network: interfaces must be 1 or 2, not 3"),
                 ('[device]\nname = "A"', "double brackets"),
                 ("[[device]]\nport = 1", "device number 1: name is missing"),
                 ('[[device]]\nname = "A"\nmodle = "x"', 'device "A".*did you mean "model"'),

@@ -21,8 +21,7 @@ import time
 
 import media
 from media import model
-from way import BUILT, TEXT
-from wireless_test import GEAR, GEAR_REFRESH, PRACTICE_NETWORK, WIRED, WIRELESS
+from way import BUILT, GEAR, GEAR_REFRESH, PRACTICE_NETWORK, TEXT, WIRED, WIRELESS
 from onscreen.desktop import Desktop
 from onscreen.person import Person
 from practice_network import PracticeNetwork
@@ -98,7 +97,7 @@ def judge(person, crowd, waits, sizes):
     time.sleep(3)
     search_again(person)
     time.sleep(3)
-    listed = [name for role, name, _ in person.everything() if role == "table cell"][::3]
+    listed = [name for name, _, _ in person.rows()]
     fifth = max(1, len(sizes) // 5)
     first, last = statistics.median(sizes[:fifth]), statistics.median(sizes[-fifth:])
     print(f"{crowd.events} events, {len(waits)} searches; longest wait {max(waits):.1f} s; memory "

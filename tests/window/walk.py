@@ -22,12 +22,11 @@ import time
 
 import media
 from media import model
-from way import BUILT
+from way import BUILT, PRACTICE_NETWORK
 from onscreen.desktop import Desktop
 from onscreen.person import Person
 from practice_network import PracticeNetwork
 
-PRACTICE_NETWORK = pathlib.Path(__file__).resolve().parents[2] / "tools/practice-network"
 AT_A_TIME = 4
 STEPS = 14
 PATIENCE = 60
@@ -93,7 +92,7 @@ class Walk:
 
     def click(self, person):
         shown = person.everything()
-        self.seen |= {name for role, name, _ in shown if role == "label"}
+        self.seen |= {name for role, name, _ in shown if role in ("label", "heading")}
         controls = [one for one in shown if one[0] in CLICKABLE and one[1]]
         if not controls:
             return

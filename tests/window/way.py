@@ -10,7 +10,8 @@ import tempfile
 import unittest
 
 sys.dont_write_bytecode = True
-sys.path.insert(0, str(pathlib.Path(__file__).resolve().parents[2] / "tools"))
+TOOLS = pathlib.Path(__file__).resolve().parents[2] / "tools"
+sys.path.insert(0, str(TOOLS))
 
 import media  # noqa: E402
 from onscreen import messages  # noqa: E402
@@ -19,6 +20,9 @@ from onscreen.person import Person  # noqa: E402
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TEXT = messages.read(BUILT, "en")
+PRACTICE_NETWORK = TOOLS / "practice-network"
+WIRELESS, WIRED = 2, 1  # what a device answers about its interface
+GEAR, GEAR_REFRESH = "Actions", 2
 OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": False,
            "PKG_LabelTool": False, "PKG_FontSet": False}
 
@@ -33,10 +37,10 @@ class WayTest(unittest.TestCase):
 
     def setUp(self):
         self.desktop.forget()
-        self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
 
     def start(self, models, arguments=(), env=None, **details):
-        self.medium = media.make(self.folder / "medium", BUILT, models, **details)
+        folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+        self.medium = media.make(folder / "medium", BUILT, models, **details)
         program = self.medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
         return self.enterContext(Person(self.desktop, program, arguments, env))
 

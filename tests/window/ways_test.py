@@ -3,8 +3,6 @@
 Usage: ways_test.py [unittest options] MEDIUM, a medium's folder with the application on it.
 """
 
-import pathlib
-import tempfile
 import unittest
 
 from media import model
@@ -12,7 +10,6 @@ from way import BUILT, TEXT, WayTest, messages
 
 TWO_MODELS = {"Kestrel 1": model(usb=True, wired=True, wireless=True),
               "Kestrel 2": model(usb=True)}
-
 
 
 class Ways(WayTest):
@@ -63,8 +60,7 @@ class Ways(WayTest):
     def test_escape_and_the_close_button_quit(self):
         for leave in (lambda p: p.press("Escape"), lambda p: p.close_window(),
                       lambda p: p.click("push button", TEXT["BTN_CANCEL"])):
-            with self.subTest(leave=leave), tempfile.TemporaryDirectory() as self.folder:
-                self.folder = pathlib.Path(self.folder)
+            with self.subTest(leave=leave):
                 person = self.start(TWO_MODELS)
                 person.see("list item", "Kestrel 1")
                 leave(person)
@@ -74,8 +70,7 @@ class Ways(WayTest):
         cases = (("10.5.8", TEXT["INST_TXT_ALERT_OSMIN"].replace("%@", "10.6")),
                  ("11.0.0", TEXT["INST_TXT_ALERT_OSMAX"]))
         for version, reason in cases:
-            with self.subTest(version), tempfile.TemporaryDirectory() as self.folder:
-                self.folder = pathlib.Path(self.folder)
+            with self.subTest(version):
                 person = self.start(TWO_MODELS, ["--system-version", version],
                                     SystemMin={"Major": "10", "Minor": "6", "BugFix": "0"},
                                     SystemMax={"Major": "10", "Minor": "15", "BugFix": "x"})

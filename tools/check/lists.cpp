@@ -104,7 +104,7 @@ constexpr std::array kInterfaceRules{
             "the model counts as one without wireless"},
 };
 
-bool isNumber(const std::string& key) {
+bool isPackageVersion(const std::string& key) {
   return !key.empty() && std::all_of(key.begin(), key.end(), isASCIIDigit);
 }
 
@@ -114,7 +114,7 @@ Dictionary withoutOtherVersions(const Dictionary& package) {
   for (const auto& pair : package) {
     const bool known = std::any_of(kPackageRules.begin(), kPackageRules.end(),
                                    [&](const KeyRule& rule) { return rule.key == pair.key; });
-    if (known || !isNumber(pair.key)) pairs.push_back(pair);
+    if (known || !isPackageVersion(pair.key)) pairs.push_back(pair);
   }
   return Dictionary(std::move(pairs));
 }

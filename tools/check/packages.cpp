@@ -31,7 +31,7 @@ SystemVersion systemOf(const Version& version) {
   return {version[0], version[1], version[2]};
 }
 
-bool isNumber(const std::string& text) {
+bool isVersionNumber(const std::string& text) {
   return !text.empty() && std::all_of(text.begin(), text.end(), isASCIIDigit);
 }
 
@@ -123,7 +123,7 @@ class PackageCheck {
       if (!text) continue;
       const bool every = which == medium::kSystemMax && key == std::string_view("BugFix") &&
                          asciiLowercased(*text) == "x";
-      if (isNumber(*text) || every) continue;
+      if (isVersionNumber(*text) || every) continue;
       report_.findings.push_back(
           {.id = "version-number",
            .place = placeOf(which, key),
@@ -151,7 +151,7 @@ class PackageCheck {
   void checkNamedMaximum() {
     const Dictionary& maximum = info_.supportSystemMax();
     const auto text = maximum.string("BugFix");
-    const bool written = text ? isNumber(*text) : maximum.find("BugFix") != nullptr;
+    const bool written = text ? isVersionNumber(*text) : maximum.find("BugFix") != nullptr;
     if (!isBound(maximum) || !written || takesAllBugFixes(maximum)) return;
     const Version named = boundOf(maximum);
     if ((named[1] == 0 && named[2] == 0) || !isSupported(begin())) return;
@@ -246,7 +246,7 @@ class PackageCheck {
     const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
     std::string shadowed;
     for (const auto& [key, value] : package) {
-      if (!isNumber(key)) continue;
+      if (!isVersionNumber(key)) continue;
       if (!knownKeys_.contains(key)) {
         neverUsed(key);
       } else if (package.find("PkgName")) {

@@ -51,7 +51,7 @@ void writeModels(std::ostream& out, const Report& report) {
   const auto cell = [](bool has, const char* word) {
     return has ? std::string(word) : std::string(std::string_view(word).size(), '-');
   };
-  out << "\nModels:\n";
+  out << "\nModels (their devices have to announce exactly these names):\n";
   for (const ModelRow& model : report.models) {
     const std::string blanks(width - model.name.size(), ' ');
     out << "  " << printable(model.name) << blanks << "  " << cell(model.usb, "USB") << "  "

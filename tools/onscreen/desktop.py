@@ -9,7 +9,7 @@ import tempfile
 
 from .processes import Missing, start, stop, wait_for
 
-_SIZE = "1600x1200"
+_SIZE = "2732x1536"  # the smallest screen that the wizard has to fit on, at twice the density
 
 
 def _free_display():

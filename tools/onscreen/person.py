@@ -11,6 +11,17 @@ _LOOK_SECONDS = 20
 # only when one is wanted.
 _TABLES = ("list", "table", "tree", "tree table")
 _IN_TABLES = ("list item", "table cell", "table column header")
+_COLUMNS = 3
+
+
+def _is(control, role, name):
+    """A heading is a label, too, and a row's first cell may be called "name, address"."""
+    own_role = control.get_role_name()
+    if own_role != role and (own_role, role) != ("heading", "label"):
+        return False
+    own_name = control.get_name()
+    return name in (None, own_name) or (
+        role == "table cell" and own_name.startswith(f"{name}, "))
 
 
 class Person:
@@ -57,6 +68,12 @@ class Person:
             (c.get_role_name(), c.get_name(), c)))
         return found
 
+    def rows(self):
+        """The texts of the table on the screen, row by row."""
+        cells = [name for role, name, _ in self.everything() if role == "table cell"]
+        rows = zip(*(cells[column::_COLUMNS] for column in range(_COLUMNS)))
+        return [(row[0].removesuffix(f", {row[-1]}"), *row[1:]) for row in rows]
+
     def has_state(self, control, state):
         """Whether the control has a state, such as "enabled", "focused" or "selected"."""
         return control.get_state_set().contains(getattr(self._atspi.StateType, state.upper()))
@@ -79,6 +96,10 @@ class Person:
         box = self._resting_place(control)
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
+
+    def double_click(self, role, name):
+        self.click(role, name)
+        self.desktop.run(["xdotool", "click", "1"])
 
     def open_menu(self, button):
         """Opens a button's menu, which Qt keeps from the accessibility bus: use it with keys."""
@@ -173,7 +194,7 @@ class Person:
         match = []
 
         def visit(control):
-            if control.get_role_name() == role and name in (None, control.get_name()):
+            if _is(control, role, name):
                 match.append(control)
             return not match
 

@@ -1,4 +1,4 @@
-"""A network of made-up printers and scanners, inside a namespace of its own.
+"""A network of made-up printers and scanners, inside namespaces.
 
 PracticeNetwork is what a test inside the network steers it with.
 """

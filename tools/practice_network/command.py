@@ -22,7 +22,7 @@ PACKAGES = {"unshare": "util-linux", "setpriv": "util-linux", "nsenter": "util-l
 
 HELP = """
 Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns its exit
-status. Real Avahi and net-snmp daemons play the devices, inside namespaces of their own: no packet
+status. Real Avahi and net-snmp daemons play the devices, inside separate namespaces: no packet
 leaves this machine, no hardware is needed, and when COMMAND or this tool ends, however it ends,
 everything is gone.
 

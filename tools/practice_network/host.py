@@ -171,7 +171,7 @@ def log(program):
 
 
 def _start(program, *arguments):
-    # In a session of its own, so that Ctrl-C at the command does not reach it.
+    # In another session, so that Ctrl-C at the command does not reach it.
     with open(RUN / f"{program}.log", "ab") as output:
         return subprocess.Popen([program, *arguments], stdin=subprocess.DEVNULL, stdout=output,
                                 stderr=output, start_new_session=True)

@@ -90,7 +90,7 @@ def inside(options):
 
 
 def devices(options):
-    """The process that has the devices: on the command's host, or on a host of their own."""
+    """The process that runs the devices, on the command's host or on a second one."""
     try:
         settings, described = description.load(options["description"])
         if options["hosts"] == 2:

@@ -45,7 +45,7 @@ def connect(bus_address, seconds=10):
 
 @dataclasses.dataclass(frozen=True)
 class _Entry:
-    """What is published of a device: two groups, so that its addresses can change by themselves."""
+    """What is published of a device, in two groups, so that its addresses can change alone."""
 
     host: str
     addresses: dbus.Interface
@@ -105,7 +105,7 @@ class Publisher:
             time.sleep(0.01)
 
     def state(self, device):
-        """"established" when everything of the device is; else the state of what is not."""
+        """"established" when everything of the device is; otherwise the state of what is not."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"

@@ -1,0 +1,135 @@
+#include "platform/qt/style.h"
+
+#include <QAbstractItemView>
+#include <QPainter>
+
+#include "platform/qt/list_model.h"
+
+namespace onramp::qt {
+
+namespace {
+
+constexpr int kRingWidth = 2;
+constexpr qreal kCornerRadius = 3;
+constexpr int kRoomBesideTitle = 10;
+constexpr int kRoomAboveTitle = 3;
+constexpr int kLeastGrayDistance = 150;  ///< of 255, between a title and the button behind it
+
+void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
+  painter.save();
+  painter.setRenderHint(QPainter::Antialiasing);
+  painter.setPen(QPen(color, kRingWidth));
+  painter.setBrush(Qt::NoBrush);
+  constexpr qreal kInset = kRingWidth / 2.0;
+  painter.drawRoundedRect(QRectF(around).adjusted(kInset, kInset, -kInset, -kInset), kCornerRadius,
+                          kCornerRadius);
+  painter.restore();
+}
+
+// The selection's colour, dark enough for the title on it where that is light.
+QColor defaultButtonColor(const QPalette& palette) {
+  QColor color = palette.color(QPalette::Highlight);
+  const int title = qGray(palette.color(QPalette::HighlightedText).rgb());
+  if (title < qGray(color.rgb())) return color;
+  while (qGray(color.rgb()) > 0 && title - qGray(color.rgb()) < kLeastGrayDistance) {
+    color = color.darker(110);
+  }
+  return color;
+}
+
+void drawDefaultFace(QPainter& painter, const QStyleOptionButton& button) {
+  QColor color = defaultButtonColor(button.palette);
+  if (button.state & QStyle::State_Sunken) color = color.darker(125);
+  painter.save();
+  painter.setRenderHint(QPainter::Antialiasing);
+  painter.setPen(color.darker(120));
+  painter.setBrush(color);
+  painter.drawRoundedRect(QRectF(button.rect).adjusted(0.5, 0.5, -0.5, -0.5), kCornerRadius,
+                          kCornerRadius);
+  painter.restore();
+}
+
+// Fusion's own outline of a radio button cannot be seen on dark colours.
+void drawOutline(QPainter& painter, const QStyleOption& radioButton) {
+  painter.save();
+  painter.setRenderHint(QPainter::Antialiasing);
+  QColor color = radioButton.palette.color(QPalette::WindowText);
+  color.setAlphaF(0.6F);
+  painter.setPen(color);
+  painter.setBrush(Qt::NoBrush);
+  painter.drawEllipse(QRectF(radioButton.rect).adjusted(1, 1, -1, -1));
+  painter.restore();
+}
+
+bool isList(const QWidget* widget) {
+  return qobject_cast<const QAbstractItemView*>(widget) != nullptr;
+}
+
+}  // namespace
+
+Style::Style() : QProxyStyle(QStringLiteral("Fusion")) {}
+
+void Style::drawControl(ControlElement element, const QStyleOption* option, QPainter* painter,
+                        const QWidget* widget) const {
+  const auto* const button = qstyleoption_cast<const QStyleOptionButton*>(option);
+  if (element == CE_PushButton && button) {
+    drawPushButton(*button, *painter, widget);
+    return;
+  }
+  QProxyStyle::drawControl(element, option, painter, widget);
+  if (element == CE_ShapedFrame && isList(widget) && (option->state & State_HasFocus)) {
+    drawRing(*painter, option->rect, option->palette.color(QPalette::Highlight));
+  }
+}
+
+void Style::drawPushButton(const QStyleOptionButton& button, QPainter& painter,
+                           const QWidget* widget) const {
+  QStyleOptionButton face(button);
+  const bool isDefault =
+      (button.features & QStyleOptionButton::DefaultButton) && (button.state & State_Enabled);
+  face.features.setFlag(QStyleOptionButton::DefaultButton, false);
+  face.state.setFlag(State_HasFocus, false);
+  if (isDefault) {
+    drawDefaultFace(painter, face);
+    face.palette.setBrush(QPalette::ButtonText, button.palette.highlightedText());
+    face.rect = subElementRect(SE_PushButtonContents, &button, widget);
+    QProxyStyle::drawControl(CE_PushButtonLabel, &face, &painter, widget);
+  } else {
+    QProxyStyle::drawControl(CE_PushButton, &face, &painter, widget);
+  }
+  if (!(button.state & State_HasFocus)) return;
+  if (isDefault) {
+    constexpr int kInset = kRingWidth + 1;
+    drawRing(painter, button.rect.adjusted(kInset, kInset, -kInset, -kInset),
+             button.palette.color(QPalette::HighlightedText));
+  } else {
+    drawRing(painter, button.rect, button.palette.color(QPalette::Highlight));
+  }
+}
+
+void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
+                          const QWidget* widget) const {
+  if (element != PE_FrameFocusRect) {
+    QProxyStyle::drawPrimitive(element, option, painter, widget);
+    if (element == PE_IndicatorRadioButton) drawOutline(*painter, *option);
+  } else if (!isList(widget)) {  // a list has its ring around all rows
+    drawRing(*painter, option->rect, option->palette.color(QPalette::Highlight));
+  }
+}
+
+int Style::pixelMetric(PixelMetric metric, const QStyleOption* option,
+                       const QWidget* widget) const {
+  if (metric == PM_DefaultFrameWidth && isList(widget)) return kRingWidth;
+  return QProxyStyle::pixelMetric(metric, option, widget);
+}
+
+QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,
+                              const QWidget* widget) const {
+  const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
+  // Rows a little higher than their text are easier to read and to hit.
+  if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
+  if (type != CT_PushButton) return normal;
+  return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);
+}
+
+}  // namespace onramp::qt

@@ -1,0 +1,30 @@
+#pragma once
+
+#include <QProxyStyle>
+#include <QStyleOption>
+
+namespace onramp::qt {
+
+/// Fusion, except that the default button is filled and the focused control has a ring. Fusion
+/// outlines both alike.
+class Style final : public QProxyStyle {
+  Q_OBJECT
+
+ public:
+  Style();
+
+  void drawControl(ControlElement element, const QStyleOption* option, QPainter* painter,
+                   const QWidget* widget) const override;
+  void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
+                     const QWidget* widget) const override;
+  int pixelMetric(PixelMetric metric, const QStyleOption* option,
+                  const QWidget* widget) const override;
+  QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,
+                         const QWidget* widget) const override;
+
+ private:
+  void drawPushButton(const QStyleOptionButton& button, QPainter& painter,
+                      const QWidget* widget) const;
+};
+
+}  // namespace onramp::qt

@@ -1,0 +1,31 @@
+#!/usr/bin/python3
+"""Packs PNG pictures of an icon into an .icns file.
+
+Usage: icns.py ICON.icns 16.png 32.png …, each a square picture
+"""
+
+import pathlib
+import struct
+import sys
+
+# The types that hold PNG data, by the picture's size in pixels. Some sizes have two: one for that
+# many points, one for half as many on a display of twice the density.
+TYPES = {16: ["icp4"], 32: ["icp5", "ic11"], 64: ["ic12"], 128: ["ic07"], 256: ["ic08", "ic13"],
+         512: ["ic09", "ic14"], 1024: ["ic10"]}
+
+
+def main(icon, *pictures):
+    entries = b""
+    for picture in pictures:
+        data = pathlib.Path(picture).read_bytes()
+        width, height = struct.unpack(">II", data[16:24])
+        if data[:8] != b"\x89PNG\r\n\x1a\n" or width != height or width not in TYPES:
+            sys.exit(f"icns.py: {picture}: not a square PNG of {', '.join(map(str, TYPES))} pixels")
+        for kind in TYPES[width]:
+            entries += kind.encode("ascii") + struct.pack(">I", 8 + len(data)) + data
+    pathlib.Path(icon).write_bytes(b"icns" + struct.pack(">I", 8 + len(entries)) + entries)
+
+
+if len(sys.argv) < 3:
+    sys.exit(__doc__)
+main(*sys.argv[1:])

@@ -1,0 +1,112 @@
+"""Pictures of every page in every language, size and colour scheme that users may have."""
+
+import pathlib
+import tempfile
+
+from onscreen import messages
+from onscreen.person import Person
+
+from . import crowded
+
+LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
+DEVICES = 40
+_PATIENCE = 120
+_LARGE, _USUAL = 18, 10  # points
+
+_DARK = {"Window": ("35,38,41", "252,252,252"), "View": ("27,30,32", "252,252,252"),
+         "Button": ("49,54,59", "252,252,252"), "Selection": ("61,174,233", "252,252,252"),
+         "Tooltip": ("49,54,59", "252,252,252")}
+_CONTRAST = {"Window": ("0,0,0", "255,255,0"), "View": ("0,0,0", "255,255,0"),
+             "Button": ("0,0,0", "255,255,0"), "Selection": ("255,255,0", "0,0,0"),
+             "Tooltip": ("0,0,0", "255,255,0")}
+_SCHEMES = {"light": {}, "dark": _DARK, "contrast": _CONTRAST}
+
+
+def settings(scheme, points):
+    """A desktop's settings file for these colours and this size of text."""
+    lines = ["[General]", f"font=Sans Serif,{points},-1,5,50,0,0,0,0,0"]
+    for group, (background, text) in _SCHEMES[scheme].items():
+        lines += [f"[Colors:{group}]", f"BackgroundNormal={background}",
+                  f"BackgroundAlternate={background}", f"ForegroundNormal={text}",
+                  f"ForegroundInactive={text}", f"ForegroundLink={text}",
+                  f"ForegroundVisited={text}", f"DecorationFocus={text}",
+                  f"DecorationHover={text}"]
+    return "\n".join(lines) + "\n"
+
+
+def all_looks():
+    """(language, scale in per cent, scheme, points) of every set of pictures."""
+    looks = [(language, scale, scheme, _USUAL) for language in LANGUAGES for scale in (100, 200)
+             for scheme in ("light", "dark")]
+    looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
+    looks += [(crowded.LANGUAGE, 100, "light", points) for points in (_USUAL, _LARGE)]
+    return looks + [("en_US", 100, "contrast", _USUAL)]
+
+
+class Gallery:
+    """`medium` is a crowded copy, `network` a practice network without devices."""
+
+    def __init__(self, desktop, medium, pictures, network):
+        self._desktop = desktop
+        self._medium = medium
+        self._pictures = pictures
+        self._network = network
+
+    def take(self, model, service_type, version):
+        """All pictures: the search finds devices of `model`, and `version` is not supported."""
+        self._add_devices(model, service_type)
+        with tempfile.TemporaryDirectory() as folder:
+            for look in all_looks():
+                language, scale, scheme, points = look
+                (pathlib.Path(folder) / "kdeglobals").write_text(settings(scheme, points))
+                self._look = f"{language}-{scale}-{scheme}-{points}pt"
+                self._env = {"LANG": f"{language}.UTF-8", "QT_SCALE_FACTOR": str(scale / 100),
+                             "XDG_CONFIG_HOME": folder, "XDG_CURRENT_DESKTOP": "KDE",
+                             "KDE_FULL_SESSION": "true", "KDE_SESSION_VERSION": "5"}
+                table = language if language == "zh_CN" else language.partition("_")[0]
+                self._text = messages.read(self._medium.folder, table)
+                print(self._look, flush=True)
+                self._pages(model)
+                if version:
+                    self._alert(version)
+
+    def _add_devices(self, model, service_type):
+        maker, kind = model.split(" ", 1)
+        for number in range(DEVICES):
+            name = crowded.LONG_NAMES[number % len(crowded.LONG_NAMES)]
+            ending = f" {number:02}"
+            while len((name + ending).encode()) > 63:
+                name = name[:-1]
+            self._network.add(name + ending, maker=maker, model=kind, type=service_type)
+        self._network.settle()
+
+    def _start(self, *arguments):
+        self._desktop.forget()
+        return Person(self._desktop, self._medium.program, arguments, env=self._env)
+
+    def _pages(self, model):
+        with self._start() as person:
+            person.see("label", self._text["INST_TXT_MODEL"], _PATIENCE)
+            self._take(person, "1-models")
+            # The list finds a model by the start of any word of its name.
+            words = model.split(" ", 1)[1]
+            person.press(*("space" if letter == " " else letter for letter in words))
+            person.press("Return")
+            person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
+            self._take(person, "2-connection")
+            person.press("Return")
+            person.see("label", self._text["INST_WAIT"], _PATIENCE)
+            self._take(person, "3-search")
+            person.see("label", self._text["INST_TXT_DEVLIST"], _PATIENCE)
+            self._take(person, "4-devices")
+            person.press("Tab", "space")
+            self._take(person, "5-gear")
+            person.press("Escape")
+
+    def _alert(self, version):
+        with self._start("--system-version", version) as person:
+            person.see("push button", self._text["BTN_CLOSE"], _PATIENCE)
+            self._take(person, "6-alert")
+
+    def _take(self, person, page):
+        person.picture(self._pictures / f"{self._look}-{page}.png")
