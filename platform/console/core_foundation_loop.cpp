@@ -1,5 +1,6 @@
 #include <CoreFoundation/CoreFoundation.h>
 
+#include <chrono>
 #include <memory>
 #include <utility>
 
@@ -44,8 +45,8 @@ void endMainLoop() {
   hasEnded = true;
 }
 
-void scheduleTimer(double seconds, std::function<void()> action) {
-  addTimer(seconds, std::move(action));
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
+  addTimer(std::chrono::duration<double>(delay).count(), std::move(action));
 }
 
 void performOnMainThread(std::function<void()> action) {

@@ -63,9 +63,7 @@ void endMainLoop() {
   mainLoop().ended = true;
 }
 
-void scheduleTimer(double seconds, std::function<void()> action) {
-  const auto delay =
-      std::chrono::duration_cast<Clock::duration>(std::chrono::duration<double>(seconds));
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
   mainLoop().timers.emplace(Clock::now() + delay, std::move(action));
 }
 

@@ -21,7 +21,8 @@ std::string findApplication(const std::string& root) {
   }
   std::sort(names.begin(), names.end());
   for (const std::string& name : names) {
-    const auto information = loadDictionary(root + "/" + name + "/Contents/Info.plist");
+    const auto information =
+        loadDictionary((fs::path(root) / name / "Contents/Info.plist").string());
     if (name == kUsualName || (information && information->find("CommonResourcePath"))) return name;
   }
   return names.empty() ? "" : names.front();

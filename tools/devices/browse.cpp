@@ -1,5 +1,8 @@
 #include <algorithm>
-#include <iostream>
+#include <array>
+#include <chrono>
+#include <cstdint>
+#include <map>
 #include <memory>
 #include <set>
 
@@ -23,6 +26,7 @@ namespace onramp::devices {
 namespace {
 
 constexpr double kWizardSearchSeconds = 10;
+constexpr std::chrono::milliseconds kProgressPause{250};
 
 // Types that printers and scanners announce besides those that carry names.
 constexpr std::array<std::string_view, 5> kNamelessTypes{
@@ -114,7 +118,7 @@ void Session::showProgress() {
   progress_.show(std::to_string(static_cast<int>(finder_->now())) +
                  " s: " + std::to_string(devices.size()) + " found, " + std::to_string(resolved) +
                  " resolved, " + std::to_string(questions_.pending()) + " being asked");
-  scheduleTimer(0.25, [this] { showProgress(); });
+  scheduleTimer(kProgressPause, [this] { showProgress(); });
 }
 
 void Session::stopListening() {
@@ -146,7 +150,8 @@ int Session::run() {
   AddNetworkInterfaceListChangeCallbackSCF();
   if (!options_.json) progress_.print(tableHead(style_));
   finder_->start(typesToBrowse(medium_, options_.allTypes));
-  scheduleTimer(options_.seconds, [this] { stopListening(); });
+  scheduleTimer(std::chrono::milliseconds(static_cast<std::int64_t>(options_.seconds * 1000)),
+                [this] { stopListening(); });
   if (Progress::isShown()) showProgress();
   runMainLoop();
   isListening_ = false;
