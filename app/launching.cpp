@@ -70,8 +70,7 @@ void OnrampOSXAppDelegate::handOverAndQuit(const std::optional<Dictionary>& mode
 }
 
 void OnrampOSXAppDelegate::quitMe() {
-  scheduleTimer(std::chrono::duration<double>(kQuitDelay).count(),
-                [this] { performTimerQuitMe(); });
+  scheduleTimer(kQuitDelay, [this] { performTimerQuitMe(); });
 }
 
 void OnrampOSXAppDelegate::performTimerQuitMe() {
@@ -88,8 +87,7 @@ void OnrampOSXAppDelegate::launchWLANToolManually() {
 
 void OnrampOSXAppDelegate::launchWLANTool(ToolStart start) {
   hideApplication();
-  scheduleTimer(std::chrono::duration<double>(kHideBeforeToolDelay).count(),
-                [this, start] { performLaunchWLANTool(start); });
+  scheduleTimer(kHideBeforeToolDelay, [this, start] { performLaunchWLANTool(start); });
 }
 
 void OnrampOSXAppDelegate::performLaunchWLANTool(ToolStart start) {

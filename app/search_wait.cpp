@@ -53,15 +53,14 @@ void OnrampOSXAppDelegate::setWaiting(Page* page, bool waiting) {
 
 void OnrampOSXAppDelegate::waitDeviceSearchTask(std::chrono::seconds pause) const {
   for (int pauses = 0; pauses < kMostPauses; ++pauses) {
-    if (!sleepOffMainThread(static_cast<std::uint32_t>(pause.count())) || listedDevices() > 0)
-      break;
+    if (!sleepOffMainThread(pause) || listedDevices() > 0) break;
   }
   abortModal();
 }
 
 // The same pauses for a system that has no thread left: the modal loop runs them as timers.
 void OnrampOSXAppDelegate::waitOnMainLoop(std::chrono::seconds pause, int pausesLeft) {
-  scheduleTimer(static_cast<double>(pause.count()), [this, pause, pausesLeft] {
+  scheduleTimer(pause, [this, pause, pausesLeft] {
     if (pausesLeft > 1 && listedDevices() == 0) {
       waitOnMainLoop(pause, pausesLeft - 1);
     } else {

@@ -59,7 +59,7 @@ function(onramp_namespace_test name)
   if(TARGET ${name})
     set_target_properties(${name} PROPERTIES
       CROSSCOMPILING_EMULATOR ${PROJECT_SOURCE_DIR}/tests/in_namespace)
-    set_tests_properties(${name} PROPERTIES SKIP_RETURN_CODE 77)
+    set_tests_properties(${name} PROPERTIES SKIP_RETURN_CODE 77 LABELS network)
     target_compile_definitions(${name} PRIVATE SOURCE_FOLDER="${CMAKE_CURRENT_SOURCE_DIR}")
   endif()
 endfunction()

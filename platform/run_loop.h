@@ -1,28 +1,33 @@
 #pragma once
 
-#include <cstdint>
+#include <chrono>
 #include <functional>
 
 #include "platform/outlets.h"
 
 namespace onramp {
 
-/// Runs `action` on the main thread, once, `seconds` from now. Main thread only.
-void scheduleTimer(double seconds, std::function<void()> action);
+/// Runs `action` once on the main thread, `delay` from now, in every mode of the main loop, the
+/// modal one included. Timers run in the order of their due times. Must be called on the main
+/// thread.
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action);
 
-/// Runs `action` on the main thread as soon as its loop comes to it, in every mode of the loop, the
-/// modal one included. Callable from any thread.
+/// Runs `action` once on the main thread, in every mode of the main loop. Actions run in the order
+/// of the calls, never inside this function. Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 
-/// Shows `window`, makes it key and runs the main loop with it as the modal window; returns after
-/// abortModal() or when the application is asked to terminate. Main thread only.
+/// Shows `window`, makes it key and runs the main loop with it as the modal window, until
+/// abortModal() is called or the application is asked to terminate. Must be called on the main
+/// thread.
 void runModalForWindow(const Window& window);
 
-/// Ends the running modal loop; without one, nothing. Callable from any thread.
+/// Ends the running modal loop, if there is one, before any action that performOnMainThread() still
+/// holds. Callable from any thread.
 void abortModal();
 
-/// Blocks the calling thread, never the main one, for `seconds`. False when the application was
-/// asked to terminate meanwhile: the caller then ends what it is doing.
-bool sleepOffMainThread(std::uint32_t seconds);
+/// Blocks the calling thread, which must not be the main thread, for `duration`. Returns false,
+/// without waiting any longer, once the application terminates; the caller must then end its
+/// thread.
+bool sleepOffMainThread(std::chrono::milliseconds duration);
 
 }  // namespace onramp

@@ -1,6 +1,5 @@
 #include "platform/termination.h"
 
-#include <chrono>
 #include <condition_variable>
 #include <memory>
 #include <mutex>
@@ -38,10 +37,9 @@ void beginTermination() {
   termination().changed.notify_all();
 }
 
-bool sleepOffMainThread(std::uint32_t seconds) {
+bool sleepOffMainThread(std::chrono::milliseconds duration) {
   std::unique_lock lock(termination().mutex);
-  return !termination().changed.wait_for(lock, std::chrono::seconds(seconds),
-                                         [] { return termination().begun; });
+  return !termination().changed.wait_for(lock, duration, [] { return termination().begun; });
 }
 
 }  // namespace onramp

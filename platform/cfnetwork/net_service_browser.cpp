@@ -1,5 +1,6 @@
 #include <CoreServices/CoreServices.h>
 
+#include <chrono>
 #include <memory>
 #include <utility>
 #include <vector>
@@ -13,7 +14,7 @@ namespace onramp {
 namespace {
 
 // An error that comes at once must not keep the processor busy.
-constexpr double kRetryPause = 1;  // seconds
+constexpr std::chrono::seconds kRetryPause{1};
 
 using corefoundation::Reference;
 using corefoundation::toCFString;

@@ -44,7 +44,8 @@ void wakeEventLoop() {
 
 }  // namespace
 
-void scheduleTimer(double seconds, std::function<void()> action) {
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
+  const NSTimeInterval seconds = std::chrono::duration<double>(delay).count();
   NSTimer* const timer = [NSTimer timerWithTimeInterval:seconds
                                                  target:once(std::move(action))
                                                selector:@selector(perform:)

@@ -5,8 +5,6 @@
 #include <QTimer>
 #include <QWidget>
 #include <atomic>
-#include <chrono>
-#include <cmath>
 #include <utility>
 #include <vector>
 
@@ -44,8 +42,7 @@ void endAllLoops() {
 
 }  // namespace qt
 
-void scheduleTimer(double seconds, std::function<void()> action) {
-  const std::chrono::milliseconds delay(std::llround(seconds * 1000));
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
   QTimer::singleShot(delay, Qt::PreciseTimer, qApp, [action = std::move(action)] {
     if (!isTerminating()) action();
   });

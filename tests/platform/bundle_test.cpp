@@ -112,34 +112,5 @@ TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAndReadsTheDiskEachTime) {
   EXPECT_EQ(Bundle::open(medium.path("Some.bundle"))->localizedString("k", "v", "Other"), "v");
 }
 
-TEST_F(BundleOnMedium, PrefersResourcesThatAreNotLocalized) {
-  resource("Picture.png", "");
-  resource("de.lproj/Picture.png", "");
-  resource("de.lproj/Own.png", "");
-  resource("noextension", "");
-  medium.setEnvironment("LANG", "de_DE.UTF-8");
-  const std::string resources = medium.path("Some.bundle/Contents/Resources/");
-  const auto bundle = Bundle::open(medium.path("Some.bundle/"));
-  ASSERT_TRUE(bundle);
-  EXPECT_EQ(bundle->path(), medium.path("Some.bundle"));
-  EXPECT_EQ(bundle->pathForResource("Picture", "png"), resources + "Picture.png");
-  EXPECT_EQ(bundle->pathForResource("Own", "png"), resources + "de.lproj/Own.png");
-  EXPECT_EQ(bundle->pathForResource("noextension", ""), resources + "noextension");
-  EXPECT_EQ(bundle->pathForResource("de", "lproj"), std::nullopt) << "a folder";
-}
-
-TEST_F(BundleOnMedium, NamesItsProgramInEitherSystemsFolder) {
-  medium.write("Some.bundle/Contents/Info.plist", Dictionary{{"CFBundleExecutable", "tool"}});
-  const std::string contents = medium.path("Some.bundle/Contents/");
-  const auto bundle = Bundle::open(medium.path("Some.bundle"));
-  EXPECT_EQ(bundle->executablePath(), contents + "Linux/tool");
-  medium.write("Some.bundle/Contents/MacOS/tool", std::string("#!/bin/sh\n"));
-  EXPECT_EQ(bundle->executablePath(), contents + "MacOS/tool");
-  medium.write("Some.bundle/Contents/Linux/tool", std::string("#!/bin/sh\n"));
-  EXPECT_EQ(bundle->executablePath(), contents + "Linux/tool");
-  medium.write("Some.bundle/Contents/Info.plist", Dictionary{{"CFBundleExecutable", 5}});
-  EXPECT_EQ(bundle->executablePath(), std::nullopt);
-}
-
 }  // namespace
 }  // namespace onramp

@@ -106,8 +106,8 @@ namespace onramp {
 
 using recording::FrontEnd;
 
-void scheduleTimer(double seconds, std::function<void()> action) {
-  FrontEnd::instance().schedule(seconds, std::move(action));
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
+  FrontEnd::instance().schedule(std::chrono::duration<double>(delay).count(), std::move(action));
 }
 
 void terminateApplication() {

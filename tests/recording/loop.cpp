@@ -90,12 +90,12 @@ void abortModal() {
   loop().changed.notify_all();
 }
 
-bool sleepOffMainThread(std::uint32_t seconds) {
+bool sleepOffMainThread(std::chrono::milliseconds duration) {
   // The pause lasts until the main thread has done what the test does in it.
   const auto passed = std::make_shared<bool>(false);
-  performOnMainThread([seconds, passed] {
+  performOnMainThread([duration, passed] {
     recording::FrontEnd& frontEnd = recording::FrontEnd::instance();
-    frontEnd.pauses.push_back(seconds);
+    frontEnd.pauses.push_back(static_cast<unsigned>(duration / std::chrono::seconds(1)));
     if (frontEnd.duringPause) frontEnd.duringPause(static_cast<int>(frontEnd.pauses.size()));
     const std::lock_guard lock(loop().mutex);
     *passed = true;
