@@ -16,7 +16,8 @@ from onscreen.processes import start, wait_for
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
 _LOOK_SECONDS = 60  # GNUstep is slow where much else runs
 _ANSWER_SECONDS = 60
-_PRESS_SECONDS = 3
+_PRESS_SECONDS = 20
+_MENU_PRESS_SECONDS = 3
 _MENU_BAR_ITEM = "Onramp OSX"
 
 
@@ -57,7 +58,8 @@ class GNUstepPerson(Person):
         self.desktop.run(["xdotool", "mousedown", "1"])
         # Released before GNUstep has noticed the press, the button looks released first. Presses
         # inside an open menu, which grabs the mouse, are never counted.
-        deadline = time.monotonic() + _PRESS_SECONDS
+        patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
+        deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:
             pass
         self.desktop.run(["xdotool", "mouseup", "1"])

@@ -28,6 +28,7 @@ VIEWS = ("customView", "textField", "button", "imageView", "matrix", "popUpButto
 INFORMATION = {
     "CFBundleAllowMixedLocalizations": True,
     "CFBundleExecutable": "Onramp OSX",
+    "CFBundleIconFile": "Onramp",
     "CFBundleInfoDictionaryVersion": "6.0",
     "CFBundlePackageType": "APPL",
     "NSHighResolutionCapable": True,

@@ -107,10 +107,10 @@ class TextCheck {
     report_.languages.push_back(row);
     Spelling spelling(absent);
     std::set<std::string> meant;
-    for (const auto& [key, unused] : table) {
+    for (const Dictionary::Pair& pair : table) {
       const bool known = std::any_of(shownTexts().begin(), shownTexts().end(),
-                                     [&](const ShownText& shown) { return shown.key == key; });
-      if (!known) unknown(language, key, spelling.nearest(key), meant);
+                                     [&](const ShownText& shown) { return shown.key == pair.key; });
+      if (!known) unknown(language, pair.key, spelling.nearest(pair.key), meant);
     }
     for (const std::string& key : absent) {
       if (!meant.contains(key)) missing(language, key);

@@ -63,7 +63,7 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
   if (maker.empty() || !names(name)) return;
   const std::string resources = relative + "/Contents/Resources";
   for (const std::string& folder : files.names(resources)) {
-    const std::string table = resources + "/" + folder + "/InfoPlist.strings";
+    const std::string table = (fs::path(resources) / folder / "InfoPlist.strings").string();
     std::error_code ignored;
     if (!folder.ends_with(".lproj") || !fs::exists(files.fullPath(table), ignored)) continue;
     const auto texts = files.strings(
