@@ -6,6 +6,7 @@
 #include "platform/avahi/net_service.h"
 #include "platform/avahi/query.h"
 #include "platform/avahi/records.h"
+#include "platform/avahi/sighting_watch.h"
 #include "platform/avahi/sightings.h"
 #include "platform/net_service.h"
 #include "platform/run_loop.h"
@@ -143,6 +144,7 @@ void Browser::serviceEvent(Browse& browse, Query::Event event, sd_bus_message* m
     return;
   }
   const Instance instance{name, type, domain};
+  tellSighting(instance, place, event == Query::Event::kGone);
   if (event == Query::Event::kFound && browse.sightings.add(instance, place)) found(instance);
   if (event == Query::Event::kGone && browse.sightings.remove(instance, place)) gone(instance);
 }

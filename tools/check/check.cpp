@@ -1,41 +1,15 @@
 #include "tools/check/check.h"
 
-#include <algorithm>
 #include <filesystem>
 #include <system_error>
-#include <vector>
 
 #include "platform/freedesktop/main_bundle.h"
-#include "platform/property_list.h"
+#include "tools/check/application.h"
 #include "tools/check/checks.h"
 
 namespace onramp::check {
 
-namespace {
-
 namespace fs = std::filesystem;
-
-constexpr const char* kUsualName = "Onramp OSX.app";
-
-// The applications at the medium's top, those that look like the wizard first.
-std::string findApplication(const std::string& root) {
-  std::vector<std::string> names;
-  std::error_code error;
-  fs::directory_iterator entry(root, error);
-  for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
-    const std::string name = entry->path().filename().string();
-    if (name.ends_with(".app") && fs::is_directory(entry->path())) names.push_back(name);
-  }
-  std::sort(names.begin(), names.end());
-  for (const std::string& name : names) {
-    const auto information =
-        loadDictionary((fs::path(root) / name / "Contents/Info.plist").string());
-    if (name == kUsualName || (information && information->find("CommonResourcePath"))) return name;
-  }
-  return names.empty() ? "" : names.front();
-}
-
-}  // namespace
 
 Report checkMedium(const std::string& root) {
   std::error_code ignored;

@@ -5,6 +5,7 @@ import pathlib
 import signal
 import socket
 import subprocess
+import threading
 import time
 
 from practice_network.description import CLOSED, MISSING, SILENT, TEXT
@@ -54,9 +55,36 @@ class Agents:
                                  f"\n{awaited[0].log()}")
             time.sleep(0.005)
 
+    def relay_broadcasts(self, address):
+        """Passes requests to a broadcast address on to all agents, which listen at their own."""
+        listener = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
+        listener.bind((address, PORT))
+
+        def relay():
+            while True:
+                request, sender = listener.recvfrom(1500)
+                for handles in list(self._by_device.values()):
+                    for agent in handles:
+                        if isinstance(agent, _Agent):
+                            threading.Thread(target=_relay, daemon=True,
+                                             args=(agent.address, request, sender)).start()
+        threading.Thread(target=relay, daemon=True).start()
+
     def stop(self, device):
         for handle in self._by_device.pop(device.name, []):
             handle.close()
+
+
+def _relay(address, request, sender, seconds=5):
+    """Asks the agent at `address` and answers in its place, from its address."""
+    with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as own:
+        own.settimeout(seconds)
+        try:
+            own.bind((address, 0))
+            own.sendto(request, (address, PORT))
+            own.sendto(own.recv(1500), sender)
+        except OSError:
+            pass  # No answer, or the address has gone.
 
 
 class _SilentAgent:

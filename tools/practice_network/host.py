@@ -101,7 +101,7 @@ def _configure(name, address=None, metric=0, enter=()):
     # free.
     _set_kernel(f"ipv6/conf/{name}/accept_dad", 0, enter)
     if address:
-        run(*enter, "ip", "address", "add", address, "dev", name, "metric", str(metric))
+        run(*enter, "ip", "address", "add", address, "brd", "+", "dev", name, "metric", str(metric))
     _bring_up(name, metric, enter)
 
 

@@ -34,6 +34,8 @@ class Network:
             self._devices[device.name] = self._with_addresses(device)
         present = [device for device in self._devices.values() if device.present]
         self._agents.start(present)
+        if not self._subnet.is_loopback:
+            self._agents.relay_broadcasts(str(self._subnet.broadcast_address))
         self.start_daemon()
 
     def start_daemon(self):

@@ -1,0 +1,30 @@
+#include "bonjour/ipv6_addresses.h"
+
+#include <cstddef>
+#include <span>
+
+#include "platform/ipv6.h"
+
+namespace onramp {
+
+namespace {
+
+// Where a socket address of the BSD layout has its family and an IPv6 one its address.
+constexpr std::size_t kFamilyPlace = 1;
+constexpr std::size_t kIPv6Place = 8;
+constexpr std::size_t kIPv6Length = 16;
+constexpr std::byte kIPv6Family{30};
+
+}  // namespace
+
+std::vector<std::string> ipv6AddressesOf(const NetServiceRef& service) {
+  std::vector<std::string> texts;
+  if (!service) return texts;
+  for (const Data& address : service->addressing()) {
+    if (address.size() < kIPv6Place + kIPv6Length || address[kFamilyPlace] != kIPv6Family) continue;
+    texts.push_back(ipv6Text(std::span(address).subspan<kIPv6Place, kIPv6Length>()));
+  }
+  return texts;
+}
+
+}  // namespace onramp

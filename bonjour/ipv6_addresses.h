@@ -1,0 +1,14 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "platform/net_service.h"
+
+namespace onramp {
+
+/// Returns the resolved service's IPv6 addresses as texts, in the order of its addressing; none for
+/// a null service. The wizard uses IPv4 addresses only.
+[[nodiscard]] std::vector<std::string> ipv6AddressesOf(const NetServiceRef& service);
+
+}  // namespace onramp

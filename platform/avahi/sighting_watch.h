@@ -1,0 +1,11 @@
+#pragma once
+
+#include "platform/avahi/records.h"
+#include "platform/avahi/sightings.h"
+
+namespace onramp::avahi {
+
+/// Tells the watch that watchSightings() has set, if there is one.
+void tellSighting(const Instance& instance, Place place, bool isGone);
+
+}  // namespace onramp::avahi

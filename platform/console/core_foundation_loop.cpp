@@ -1,0 +1,57 @@
+#include <CoreFoundation/CoreFoundation.h>
+
+#include <chrono>
+#include <memory>
+#include <utility>
+
+#include "platform/corefoundation/reference.h"
+#include "platform/main_loop.h"
+#include "platform/run_loop.h"
+
+namespace onramp {
+
+namespace {
+
+using corefoundation::Reference;
+using Action = std::function<void()>;
+
+// A timer of the main run loop that runs an action once and then frees it.
+void addTimer(double seconds, Action action) {
+  const auto release = [](const void* info) {
+    std::unique_ptr<const Action>(static_cast<const Action*>(info));
+  };
+  const auto fired = [](CFRunLoopTimerRef, void* info) { (*static_cast<Action*>(info))(); };
+  auto owned = std::make_unique<Action>(std::move(action));
+  CFRunLoopTimerContext context = {0, owned.get(), nullptr, release, nullptr};
+  const Reference<CFRunLoopTimerRef> timer(CFRunLoopTimerCreate(
+      kCFAllocatorDefault, CFAbsoluteTimeGetCurrent() + seconds, 0, 0, 0, fired, &context));
+  if (!timer) return;
+  owned.release();
+  CFRunLoopAddTimer(CFRunLoopGetMain(), timer.get(), kCFRunLoopCommonModes);
+}
+
+bool hasEnded = false;  // main thread only
+
+}  // namespace
+
+void runMainLoop() {
+  hasEnded = false;
+  // A loop without sources returns at once, and stays so until another thread adds one.
+  while (!hasEnded)
+    CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);
+}
+
+void endMainLoop() {
+  hasEnded = true;
+}
+
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
+  addTimer(std::chrono::duration<double>(delay).count(), std::move(action));
+}
+
+void performOnMainThread(std::function<void()> action) {
+  addTimer(0, std::move(action));
+  CFRunLoopWakeUp(CFRunLoopGetMain());
+}
+
+}  // namespace onramp

@@ -1,0 +1,76 @@
+#include "platform/main_loop.h"
+
+#include <chrono>
+#include <condition_variable>
+#include <deque>
+#include <map>
+#include <memory>
+#include <mutex>
+#include <utility>
+
+#include "platform/run_loop.h"
+
+namespace onramp {
+
+namespace {
+
+using Clock = std::chrono::steady_clock;
+
+struct MainLoop {
+  std::mutex mutex;
+  std::condition_variable posted;
+  std::deque<std::function<void()>> actions;
+  // Main thread only.
+  std::multimap<Clock::time_point, std::function<void()>> timers;
+  bool ended = false;
+};
+
+// Never destroyed, because other threads may still post while the process exits.
+MainLoop& mainLoop() {
+  static MainLoop* const instance = std::make_unique<MainLoop>().release();
+  return *instance;
+}
+
+// Returns the action that is due next, after waiting until there is one.
+std::function<void()> nextAction() {
+  MainLoop& loop = mainLoop();
+  std::unique_lock lock(loop.mutex);
+  const auto hasAction = [&loop] { return !loop.actions.empty(); };
+  if (loop.timers.empty()) {
+    loop.posted.wait(lock, hasAction);
+  } else {
+    loop.posted.wait_until(lock, loop.timers.begin()->first, hasAction);
+  }
+  if (!hasAction()) return std::move(loop.timers.extract(loop.timers.begin()).mapped());
+  std::function<void()> action = std::move(loop.actions.front());
+  loop.actions.pop_front();
+  // Timers that are due must not wait for ever behind actions that keep coming.
+  if (!loop.timers.empty() && loop.timers.begin()->first <= Clock::now()) {
+    loop.actions.push_back(std::move(loop.timers.extract(loop.timers.begin()).mapped()));
+  }
+  return action;
+}
+
+}  // namespace
+
+void runMainLoop() {
+  mainLoop().ended = false;
+  while (!mainLoop().ended)
+    nextAction()();
+}
+
+void endMainLoop() {
+  mainLoop().ended = true;
+}
+
+void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
+  mainLoop().timers.emplace(Clock::now() + delay, std::move(action));
+}
+
+void performOnMainThread(std::function<void()> action) {
+  const std::lock_guard lock(mainLoop().mutex);
+  mainLoop().actions.push_back(std::move(action));
+  mainLoop().posted.notify_one();
+}
+
+}  // namespace onramp

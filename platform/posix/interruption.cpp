@@ -1,0 +1,36 @@
+#include "platform/interruption.h"
+
+#include <pthread.h>
+#include <signal.h>
+#include <unistd.h>
+
+#include <thread>
+#include <utility>
+
+#include "platform/run_loop.h"
+
+namespace onramp {
+
+namespace {
+
+constexpr int kExitOfSignals = 128;  // as a shell tells them
+
+}  // namespace
+
+void onInterruption(std::function<void()> action) {
+  sigset_t signals;
+  sigemptyset(&signals);
+  sigaddset(&signals, SIGINT);
+  sigaddset(&signals, SIGTERM);
+  // Threads inherit the mask, so that only the one that waits gets the signals.
+  pthread_sigmask(SIG_BLOCK, &signals, nullptr);
+  std::thread([signals, action = std::move(action)]() mutable {
+    int number = 0;
+    sigwait(&signals, &number);
+    performOnMainThread(std::move(action));
+    sigwait(&signals, &number);
+    _exit(kExitOfSignals + number);
+  }).detach();
+}
+
+}  // namespace onramp

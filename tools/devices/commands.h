@@ -1,0 +1,43 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+namespace onramp::devices {
+
+/// The exit status of a command that was called wrongly or could not do its work.
+inline constexpr int kTrouble = 2;
+
+struct BrowseOptions {
+  std::string medium;
+  std::vector<std::string> models;
+  double seconds = 10;  // as long as the wizard's first search lasts
+  bool allTypes = false;
+  bool json = false;
+  bool verbose = false;
+};
+
+struct AskOptions {
+  std::string address;
+  bool json = false;
+  bool verbose = false;
+};
+
+struct URIOptions {
+  std::string uri;
+  double seconds = 5;
+};
+
+struct HostsOptions {
+  bool search = true;
+  bool json = false;
+};
+
+// The commands. Each prints its result and returns the exit status.
+
+int browse(const BrowseOptions& options);
+int ask(const AskOptions& options);
+int showURI(const URIOptions& options);
+int showHosts(const HostsOptions& options);
+
+}  // namespace onramp::devices

@@ -1,0 +1,118 @@
+// onramp-devices: explains what the wizard finds on the network, and why it does not list the rest.
+
+#include <CLI/CLI.hpp>
+#include <clocale>
+#include <exception>
+#include <iostream>
+
+#include "platform/failed_writes.h"
+#include "tools/devices/commands.h"
+
+namespace {
+
+using namespace onramp::devices;
+
+constexpr const char* kExamples = R"(Examples:
+  onramp-devices browse --medium build/medium
+      every device that is announced, and why the wizard lists it or not
+  onramp-devices browse --medium /media/setup --model "Kestrel Model 100" -v
+      the same for a user who chose that model, with all that is known
+  onramp-devices ask 192.0.2.17
+      what the device says of its interface, byte for byte
+  onramp-devices uri "dnssd://Office%20Printer._ipp._tcp.local."
+      the addresses behind a printer's URI
+  onramp-devices hosts
+      this computer's addresses, and who answers a broadcast
+
+"onramp-devices COMMAND --help" shows a command's options.)";
+
+void addBrowse(CLI::App& app, BrowseOptions& options) {
+  CLI::App* const command = app.add_subcommand(
+      "browse", "Show the devices that are announced, live, and why each is listed or not");
+  command->add_option("-m,--medium", options.medium, "The folder that the application lies in")
+      ->required()
+      ->type_name("DIR");
+  command
+      ->add_option("--model", options.models,
+                   "Search for this model only, as after choosing it; may be given again")
+      ->type_name("NAME")
+      ->allow_extra_args(false);
+  command->add_option("-s,--seconds", options.seconds, "How long to listen")
+      ->capture_default_str()
+      ->type_name("N")
+      ->check(CLI::Range(0.1, 86400.0));
+  command->add_flag("-a,--all-types", options.allTypes,
+                    "Look for service types, too, that carry no names");
+  command->add_flag("--json", options.json, "Print JSON, at the end");
+  command->add_flag("-v,--verbose", options.verbose,
+                    "Show records, TXT data and what was exchanged by SNMP");
+}
+
+void addAsk(CLI::App& app, AskOptions& options) {
+  CLI::App* const command =
+      app.add_subcommand("ask", "Ask one device by SNMP which interface it uses");
+  command->add_option("ADDRESS", options.address, "The device's IPv4 address, or its host name")
+      ->required();
+  command->add_flag("--json", options.json, "Print JSON");
+  command->add_flag("-v,--verbose", options.verbose, "Show the bytes of every attempt");
+  command->footer("Exit status: 0 wireless, 1 not wireless, 2 no usable answer.");
+}
+
+void addURI(CLI::App& app, URIOptions& options) {
+  CLI::App* const command = app.add_subcommand("uri", "Show the addresses behind a device URI");
+  command->add_option("URI", options.uri, "Such as \"dnssd://Office%20Printer._ipp._tcp.local.\"")
+      ->required();
+  command->add_option("-s,--seconds", options.seconds, "How long to wait for them")
+      ->capture_default_str()
+      ->type_name("N")
+      ->check(CLI::Range(0.1, 86400.0));
+}
+
+void addHosts(CLI::App& app, HostsOptions& options) {
+  CLI::App* const command = app.add_subcommand(
+      "hosts", "Show this computer's IPv4 addresses and the devices that answer a broadcast");
+  command->add_flag_callback(
+      "-n,--no-search", [&options] { options.search = false; }, "Send nothing");
+  command->add_flag("--json", options.json, "Print JSON");
+}
+
+int run(int count, char* arguments[]) {
+  CLI::App app("Explains what the wizard finds on the network, and why it does not list the rest.");
+  app.name("onramp-devices");
+  app.footer(kExamples);
+  app.set_version_flag("-V,--version", "onramp-devices " ONRAMP_VERSION);
+  app.require_subcommand(1);
+  BrowseOptions browseOptions;
+  AskOptions askOptions;
+  URIOptions uriOptions;
+  HostsOptions hostsOptions;
+  addBrowse(app, browseOptions);
+  addAsk(app, askOptions);
+  addURI(app, uriOptions);
+  addHosts(app, hostsOptions);
+  try {
+    app.parse(count, arguments);
+  } catch (const CLI::ParseError& error) {
+    return app.exit(error) == 0 ? 0 : kTrouble;
+  }
+  if (app.got_subcommand("browse")) return browse(browseOptions);
+  if (app.got_subcommand("ask")) return ask(askOptions);
+  if (app.got_subcommand("uri")) return showURI(uriOptions);
+  return showHosts(hostsOptions);
+}
+
+}  // namespace
+
+int main(int count, char* arguments[]) {
+  // For the width of characters only; texts and numbers stay as they are in "C".
+  std::setlocale(LC_CTYPE, "");
+  onramp::surviveFailedWrites();
+  try {
+    const int status = run(count, arguments);
+    if (std::cout.flush()) return status;
+    std::cerr << "onramp-devices: the output could not be written; is its disk full?\n";
+  } catch (const std::exception& error) {
+    std::cerr << "onramp-devices: " << error.what() << '\n';
+  }
+  return kTrouble;
+}

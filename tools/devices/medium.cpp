@@ -1,0 +1,57 @@
+#include "tools/devices/medium.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <iostream>
+#include <system_error>
+
+#include "media/KSOROSXCD.h"
+#include "platform/freedesktop/main_bundle.h"
+#include "tools/check/application.h"
+#include "tools/devices/text.h"
+
+namespace onramp::devices {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+std::nullopt_t fail(const std::string& path, const std::string& problem) {
+  std::cerr << "onramp-devices: " << inQuotes(path) << ' ' << problem << '\n';
+  return std::nullopt;
+}
+
+}  // namespace
+
+std::optional<Medium> readMedium(const std::string& path, const std::vector<std::string>& wanted) {
+  std::error_code error;
+  const std::string folder = fs::canonical(path, error).string();
+  if (error || !fs::is_directory(folder, error)) {
+    return fail(path, "is no folder; give the folder that holds the application");
+  }
+  const std::string application = check::findApplication(folder);
+  if (application.empty()) {
+    return fail(path, "holds no application; give the folder that holds it");
+  }
+  setMainBundlePath(folder + '/' + application);
+  const Dictionary description = KSOROSXCD::initWithCDInfo();
+  Medium medium{.path = path,
+                .type = description.string(KSOROSXCD::kBonjourServiceType).value_or(""),
+                .models = containedModels(description),
+                .wanted = wanted};
+  if (medium.type.empty()) {
+    return fail(path,
+                "names no service type to look for; its resource dictionary needs "
+                "BonjourNetwork, and CDInfo.plist has to be readable; try onramp-check");
+  }
+  if (medium.models.empty()) return fail(path, "has no models in CDInfo.plist; try onramp-check");
+  for (const std::string& model : wanted) {
+    if (std::find(medium.models.begin(), medium.models.end(), model) == medium.models.end()) {
+      return fail(path, "has no model " + inQuotes(model) + "; its models are in CDInfo.plist");
+    }
+  }
+  if (medium.wanted.empty()) medium.wanted = medium.models;
+  return medium;
+}
+
+}  // namespace onramp::devices

@@ -1,0 +1,136 @@
+#include "tools/devices/name_verdict.h"
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+
+#include "base/ascii.h"
+#include "bonjour/KSDevice.h"
+#include "bonjour/identity_keys.h"
+#include "bonjour/model_match.h"
+#include "bonjour/txt_record.h"
+#include "tools/check/spelling.h"
+#include "tools/devices/text.h"
+
+namespace onramp::devices {
+
+namespace {
+
+// Keys under which devices are known to announce a name that belongs elsewhere.
+constexpr std::array<std::string_view, 9> kMakerKeys{
+    "usb_MFG", "mfg", "usb_MANUFACTURER", "manufacturer", "mfr", "vendor", "make", "ty", "product"};
+constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
+                                                     "modelName", "ty",  "product"};
+
+// Returns the text with its blanks at the edges dropped and rows of blanks made one.
+std::string withSingleBlanks(std::string_view text) {
+  std::string out;
+  for (const char c : text) {
+    if (c != ' ' || (!out.empty() && out.back() != ' ')) out += c;
+  }
+  if (!out.empty() && out.back() == ' ') out.pop_back();
+  return out;
+}
+
+std::optional<TxtRecord> parsedText(const Device& device) {
+  return device.txt ? TxtRecord::parse(*device.txt) : std::nullopt;
+}
+
+std::string textUnder(const Device& device, std::string_view key) {
+  const auto text = parsedText(device);
+  return text ? text->value(key).value_or("") : "";
+}
+
+// The first of `keys` other than `wanted` that the device announces a text under.
+std::optional<std::string_view> otherKey(const Device& device, std::string_view wanted,
+                                         std::span<const std::string_view> keys) {
+  for (const std::string_view key : keys) {
+    if (asciiLowercased(std::string(key)) == asciiLowercased(std::string(wanted))) continue;
+    if (!textUnder(device, key).empty()) return key;
+  }
+  return std::nullopt;
+}
+
+// What the wizard reads under `wanted`, maker or model, is not there.
+Verdict missingKey(const Device& device, std::string_view wanted,
+                   std::span<const std::string_view> keys) {
+  const std::string key(wanted);
+  if (const auto other = otherKey(device, wanted, keys)) {
+    return {.id = "other-key",
+            .why = "announces no " + key + "; the name comes under another key, " +
+                   std::string(*other) + " = " + inQuotes(textUnder(device, *other)),
+            .remedy = "the firmware has to announce it as " + key + " too"};
+  }
+  const bool isModel = keys.data() == kModelKeys.data();
+  return {.id = isModel ? "no-model" : "no-maker",
+          .why = "announces no " + key,
+          .remedy = "the firmware has to announce the " + std::string(isModel ? "model" : "maker") +
+                    " as " + key + "; an update of it may do so"};
+}
+
+Verdict differs(const char* id, const std::string& how, const std::string& announced,
+                const std::string& model) {
+  return {.id = id,
+          .why = inQuotes(announced) + ' ' + how + " the medium's " + inQuotes(model),
+          .remedy =
+              "write the model in CDInfo.plist and ModelInfo.plist exactly as the device "
+              "announces it, or correct the firmware"};
+}
+
+std::string edgeBlanks(const std::string& announced) {
+  return announced.find("  ") != std::string::npos ? "has two blanks, unlike"
+                                                   : "differs in blanks at its edges from";
+}
+
+std::string nearestOf(const std::string& announced, const Medium& medium) {
+  const auto nearest = check::Spelling(medium.models).nearest(announced);
+  return nearest ? ", the nearest is " + inQuotes(*nearest) : "";
+}
+
+}  // namespace
+
+std::vector<std::string> ipv4AddressesOf(const Dictionary& record) {
+  std::vector<std::string> texts;
+  if (const Array* const addresses = record.array(KSDevice::kIPAddressList)) {
+    for (const Value& address : *addresses) {
+      if (const auto* text = address.as<std::string>()) texts.push_back(*text);
+    }
+  }
+  return texts;
+}
+
+std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
+  if (isOneOf(medium.models, device.record)) return std::nullopt;
+  const std::string maker = device.record.string(KSDevice::kUSBManufacturer).value_or("");
+  const std::string model = device.record.string(KSDevice::kUSBModel).value_or("");
+  const auto keys = identityKeysOf(device.type);
+  if (!keys) {
+    return Verdict{.id = "other-type",
+                   .why = "announced as " + device.type + " only, which carries no names",
+                   .remedy = "switch on the device's " + medium.type + " service"};
+  }
+  if (model.empty()) return missingKey(device, keys->model, kModelKeys);
+  if (maker.empty()) return missingKey(device, keys->manufacturer, kMakerKeys);
+
+  const std::string announced = modelTextOf(device.record);
+  const std::string plain = withSingleBlanks(announced);
+  for (const std::string& known : medium.models) {
+    const std::string plainKnown = withSingleBlanks(known);
+    if (plain == plainKnown) return differs("blanks", edgeBlanks(announced), announced, known);
+    if (asciiLowercased(announced) == asciiLowercased(known)) {
+      return differs("capitals", "differs in capitals only from", announced, known);
+    }
+    if (asciiLowercased(plain) == asciiLowercased(plainKnown)) {
+      return differs("capitals", "differs in capitals and blanks from", announced, known);
+    }
+    if (asciiLowercased(withSingleBlanks(model)) == asciiLowercased(plainKnown)) {
+      return differs("maker-twice", "repeats the maker, unlike", announced, known);
+    }
+  }
+  return Verdict{
+      .id = "not-on-medium",
+      .why = inQuotes(announced) + " is no model of this medium" + nearestOf(announced, medium),
+      .remedy = "take the medium that is made for this model, or add the model"};
+}
+
+}  // namespace onramp::devices

@@ -1,0 +1,30 @@
+#include "tools/devices/progress.h"
+
+#include <iostream>
+
+#include "platform/terminal.h"
+#include "tools/devices/text.h"
+
+namespace onramp::devices {
+
+bool Progress::isShown() {
+  return isErrorTerminal();
+}
+
+void Progress::show(const std::string& text) {
+  if (!isShown()) return;
+  std::cerr << '\r' << fitted(text, terminalWidth() - 1) << std::flush;
+  isThere_ = true;
+}
+
+void Progress::clear() {
+  if (isThere_) std::cerr << "\r\033[K" << std::flush;
+  isThere_ = false;
+}
+
+void Progress::print(const std::string& text) {
+  clear();
+  std::cout << text << std::flush;
+}
+
+}  // namespace onramp::devices

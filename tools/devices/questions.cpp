@@ -1,0 +1,27 @@
+#include "tools/devices/questions.h"
+
+#include <utility>
+
+#include "platform/run_loop.h"
+
+namespace onramp::devices {
+
+Questions::~Questions() {
+  stop();
+}
+
+void Questions::ask(const Array& addresses, Answered answered) {
+  ++*pending_;
+  const auto operation = [addresses, answered = std::move(answered), stopped = stopped_,
+                          pending = pending_] {
+    Answer answer = askDevice(addresses, *stopped);
+    performOnMainThread([answer = std::move(answer), answered, pending] {
+      --*pending;
+      answered(answer);
+    });
+  };
+  // A system that has no thread left is asked from here, which takes longer.
+  if (!queue_.addOperation(operation)) operation();
+}
+
+}  // namespace onramp::devices

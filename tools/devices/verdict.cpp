@@ -1,0 +1,151 @@
+#include "tools/devices/verdict.h"
+
+#include <algorithm>
+
+#include "bonjour/KSDevice.h"
+#include "bonjour/model_match.h"
+#include "snmp/protocol.h"
+#include "snmp/records.h"
+#include "tools/devices/name_verdict.h"
+#include "tools/devices/text.h"
+
+namespace onramp::devices {
+
+namespace {
+
+using Outcome = Exchange::Outcome;
+
+std::string joined(const std::vector<std::string>& texts) {
+  std::string all;
+  for (const std::string& text : texts)
+    all += (all.empty() ? "" : ", ") + text;
+  return all;
+}
+
+Verdict judgeValue(std::int64_t value) {
+  const bool isCable = value == 1;
+  return {.id = isCable ? "on-cable" : "other-interface",
+          .why = (isCable ? "on cable: answers " : "answers ") + std::to_string(value) +
+                 ", wireless is " + std::to_string(kActiveIFWireless),
+          .remedy = "connect the device to the wireless network; the wizard's list has no others"};
+}
+
+Verdict judgeSilence(const Device& device, const Answer& answer,
+                     const std::function<bool(const std::string&)>& isLocal) {
+  const auto addresses = ipv4AddressesOf(device.record);
+  const std::string cost = "no SNMP answer from " + joined(addresses) +
+                           ", which costs the wizard " + durationText(answer.seconds);
+  if (std::none_of(addresses.begin(), addresses.end(), isLocal)) {
+    return {.id = "other-subnet",
+            .why = "address in no local subnet: " + cost,
+            .remedy =
+                "bring the device and this computer into one subnet; "
+                "\"onramp-devices hosts\" shows this computer's"};
+  }
+  return {.id = "no-answer",
+          .why = cost,
+          .remedy =
+              "switch on SNMP v1 for reading in the device, set its community to the one that "
+              "\"onramp-devices ask -v\" shows, and let UDP port 161 through firewalls"};
+}
+
+Verdict judgeAnswer(const Device& device, const Answer& answer,
+                    const std::function<bool(const std::string&)>& isLocal) {
+  const Exchange* const told = answer.telling();
+  switch (told ? told->outcome : Outcome::kNone) {
+    case Outcome::kValue:
+      return judgeValue(told->value.value_or(0));
+    case Outcome::kError:
+      return {.id = "no-such-object",
+              .why = "answers " + errorStatusName(told->errorStatus) +
+                     " to the question for its interface",
+              .remedy = "update the firmware; this one does not know the question"};
+    case Outcome::kOtherType:
+      return {
+          .id = "wrong-type",
+          .why = "answers with " +
+                 std::string(told->type == kTagOctetString ? "a text" : "a value of another type") +
+                 " where a number is asked for",
+          .remedy = "update the firmware; this one gives the object another type"};
+    case Outcome::kUnreadable:
+    case Outcome::kOtherRequest:
+      return {.id = "unreadable-reply",
+              .why = told->outcome == Outcome::kUnreadable
+                         ? "answers with bytes that are no proper reply"
+                         : "answers another request than the one asked",
+              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware has to be mended"};
+    case Outcome::kLate:
+      return {.id = "late",
+              .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
+                     "; the wizard waits 2 s for each of its questions, " +
+                     durationText(answer.seconds) + " in all",
+              .remedy = "wake the device up, for instance by a key on its panel, and search again"};
+    case Outcome::kRefused:
+      return {.id = "refused",
+              .why = "refuses SNMP: nothing uses UDP port 161 there",
+              .remedy = "switch on SNMP v1 in the device"};
+    case Outcome::kNone:
+    case Outcome::kUnsent:
+      break;
+  }
+  return judgeSilence(device, answer, isLocal);
+}
+
+}  // namespace
+
+bool isAsked(const Device& device, const Medium& medium) {
+  return device.resolved && device.type == medium.type && isOneOf(medium.wanted, device.record) &&
+         !ipv4AddressesOf(device.record).empty();
+}
+
+Verdict judge(const Device& device, const Medium& medium,
+              const std::function<bool(const std::string&)>& isLocal) {
+  if (!device.resolved) {
+    return {.id = "unresolved",
+            .why = "announced as " + joined(device.types) +
+                   ", never resolved: nobody tells its host's address",
+            .remedy = "switch the device off and on; see that no other device uses its host name"};
+  }
+  if (auto verdict = judgeName(device, medium)) return *verdict;
+  if (device.type != medium.type) {
+    return {.id = "other-type",
+            .why = "announced as " + joined(device.types) + "; the medium looks for " + medium.type,
+            .remedy = "switch on the device's " + medium.type +
+                      " service, or name its type in the medium's BonjourNetwork"};
+  }
+  if (!isOneOf(medium.wanted, device.record)) {
+    return {.id = "other-model",
+            .why = "is a " + inQuotes(modelTextOf(device.record)) + "; the search is for " +
+                   (medium.wanted.size() == 1 ? inQuotes(medium.wanted.front()) : "other models"),
+            .remedy = "choose that model in the wizard"};
+  }
+  if (ipv4AddressesOf(device.record).empty()) {
+    return {.id = device.ipv6.empty() ? "no-address" : "ipv6-only",
+            .why = device.ipv6.empty() ? "has no address"
+                                       : "has IPv6 addresses only: " + joined(device.ipv6),
+            .remedy = "switch on IPv4 in the device; the wizard asks IPv4 addresses only"};
+  }
+  if (!device.answer || !device.answer->isComplete) {
+    return {.id = "not-asked-yet", .why = "the search ended before the device had been asked"};
+  }
+  if (device.answer->isWireless) {
+    return {.id = "listed", .isListed = true, .why = "answers that it is on wireless"};
+  }
+  return judgeAnswer(device, *device.answer, isLocal);
+}
+
+std::vector<Verdict> notesOn(const Device& device, const Medium&) {
+  std::vector<Verdict> notes;
+  if (!device.answer) return notes;
+  const auto& exchanges = device.answer->exchanges;
+  if (std::any_of(exchanges.begin(), exchanges.end(),
+                  [](const Exchange& e) { return e.changedQuestion; })) {
+    notes.push_back({.id = "changed-question",
+                     .why = "its reply changed the question that all later devices are asked",
+                     .remedy = "switch the device off while others are set up; its firmware has to "
+                               "repeat the name that it was asked for"});
+  }
+  return notes;
+}
+
+}  // namespace onramp::devices
