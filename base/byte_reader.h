@@ -58,14 +58,6 @@ class ByteReader {
   /// Moves past the next `count` bytes. Returns false, without moving, when fewer are left.
   [[nodiscard]] bool skip(std::uint64_t count) { return take(count).has_value(); }
 
-  /// Makes the input end after the next `count` bytes. Returns false, without a change, when fewer
-  /// are left.
-  [[nodiscard]] bool narrow(std::uint64_t count) {
-    if (count > rest_.size()) return false;
-    rest_ = rest_.first(static_cast<std::size_t>(count));
-    return true;
-  }
-
  private:
   std::span<const std::byte> rest_;
 };

@@ -4,6 +4,7 @@
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
 
+#include <algorithm>
 #include <array>
 #include <cstdio>
 #include <cstdlib>
@@ -48,7 +49,7 @@ void check(bool fine, const char* what) {
 
 struct Ours : onramp::Message {
   Ours() : Message(1) {
-    set(names[0], onramp::kActiveIFObject);
+    std::copy(onramp::kActiveIFObject.begin(), onramp::kActiveIFObject.end(), names[0].arcs);
     message.request_id = 1234;
   }
 

@@ -23,7 +23,8 @@ class Reference {
 
   Reference(const Reference& other) : Reference(retaining(other.object_)) {}
   Reference(Reference&& other) noexcept : object_(std::exchange(other.object_, nullptr)) {}
-  Reference& operator=(Reference other) noexcept {
+  Reference& operator=(const Reference& other) { return *this = Reference(other); }
+  Reference& operator=(Reference&& other) noexcept {
     std::swap(object_, other.object_);
     return *this;
   }

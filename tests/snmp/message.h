@@ -86,11 +86,6 @@ struct Message {
     return bytes;
   }
 
-  static void set(snmp_oid& oid, std::span<const std::uint16_t> value) {
-    std::copy(value.begin(), value.end(), oid.arcs);
-    oid.count = static_cast<std::uint16_t>(value.size());
-  }
-
   [[nodiscard]] bool guardsIntact() const {
     return std::count(arcs.end() - room, arcs.end(), kGuard) == room &&
            std::count(strings.end() - 16, strings.end(), kByteGuard) == 16;

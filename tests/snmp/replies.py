@@ -21,9 +21,9 @@ def binding(value):
     return element(0x30, element(6, NAME) + value)
 
 
-def reply(identifier, bindings, status=0, community=COMMUNITY):
+def reply(identifier, bindings, status=0):
     pdu = element(0xA2, identifier + integer(status) + integer(0) + element(0x30, bindings))
-    return element(0x30, integer(0) + element(4, community) + pdu)
+    return element(0x30, integer(0) + element(4, COMMUNITY) + pdu)
 
 
 def identifier_of(request):

@@ -27,7 +27,7 @@ std::string holding(const TemporaryFolder& folder, const std::string& name,
 
 std::string program(const TemporaryFolder& folder, const std::string& name,
                     const std::string& commands) {
-  const std::string path = holding(folder, name, "#!/bin/sh\n" + commands + "\n");
+  std::string path = holding(folder, name, "#!/bin/sh\n" + commands + "\n");
   fs::permissions(path, fs::perms::owner_all);
   return path;
 }
