@@ -211,7 +211,7 @@ MISTAKES = [
     # Pictures.
     (remove(PICTURE), "path-missing", "no picture beside USB"),
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
-     "picture-size", "340 × 240", "192 × 192"),
+     "picture-size", "680 × 480", "192 × 192"),
     (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "no whole PNG"),
     # Names in the network and in files.
     (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", '"_pdl-datastream._tcp."'),

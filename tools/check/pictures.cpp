@@ -25,7 +25,7 @@ constexpr std::array kConnectionPictures{
     Picture{"usb.png", 192, 192, "no picture beside USB"},
     Picture{"wiredLan.png", 192, 192, "no picture beside USB and the wired network"},
 };
-constexpr Picture kBackground{"Background.png", 340, 240, "a window without a background picture"};
+constexpr Picture kBackground{"Background.png", 680, 480, "a window without a background picture"};
 
 // What a picture file holds.
 struct Decoded {
