@@ -65,12 +65,12 @@ TEST(Lengths, HaveThreeFormsAndNoOther) {
                                                          {128, "81 80"},    {255, "81 FF"},
                                                          {256, "82 01 00"}, {65535, "82 FF FF"}};
   std::uint16_t read = 1;
-  for (const auto& [length, form] : forms) {
-    const auto bytes = hex(form);
-    EXPECT_EQ(written([&](ber_writer& out) { return ber_put_length(out, length); }), bytes);
+  for (const auto& form : forms) {
+    const auto bytes = hex(form.second);
+    EXPECT_EQ(written([&](ber_writer& out) { return ber_put_length(out, form.first); }), bytes);
     ByteReader in(bytes);
     EXPECT_EQ(ber_get_length(in, read), SNMP_OK);
-    EXPECT_EQ(read, length);
+    EXPECT_EQ(read, form.first);
   }
   for (const char* const refused : {"", "80", "81", "82 01", "83 00 00 01", "84 DE AD BA BE"}) {
     const auto bytes = hex(refused);
