@@ -53,14 +53,10 @@ class Process:
                 raise AssertionError("it never happened; the output was:\n" + "\n".join(self.lines))
             return condition(self.lines)
 
-    def tell(self, line):
-        self._process.stdin.write(line + "\n")
-        self._process.stdin.flush()
-
-    def end(self):
+    def end(self, patience=PATIENCE):
         if not self._process.stdin.closed:
             self._process.stdin.close()
-        status = self._process.wait(PATIENCE)
+        status = self._process.wait(patience)
         self._reader.join()
         self._process.stdout.close()
         return status
@@ -81,11 +77,6 @@ class Search(Process):
         """The last of at least `count` events of that kind, as its fields."""
         return self.wait(lambda _: len(self.events(word, name)) >= count
                          and self.events(word, name)[-1])
-
-    def comes_to(self, word, name, patience):
-        """Whether there is such an event within `patience` seconds."""
-        with self._news:
-            return self._news.wait_for(lambda: bool(self.events(word, name)), patience)
 
     def processor_seconds(self):
         return float(self.events("cpu")[0][2])

@@ -9,10 +9,12 @@ namespace {
 
 using Action = void(id, SEL, id);
 using Question = BOOL(id, SEL);
+using PlainAction = void(id, SEL);
 
 Action* originalHide = nullptr;
 Action* originalUnhide = nullptr;
 Action* originalMakeKeyAndOrderFront = nullptr;
+PlainAction* originalOrderFrontRegardless = nullptr;
 Question* originalIsHidden = nullptr;
 bool isHiddenByItself = false;
 
@@ -58,6 +60,10 @@ void makeKeyAndOrderFront(id self, SEL selector, id sender) {
   if (!isHiddenByItself) originalMakeKeyAndOrderFront(self, selector, sender);
 }
 
+void orderFrontRegardless(id self, SEL selector) {
+  if (!isHiddenByItself) originalOrderFrontRegardless(self, selector);
+}
+
 }  // namespace
 
 @interface OnrampHiding : NSObject
@@ -72,6 +78,8 @@ void makeKeyAndOrderFront(id self, SEL selector, id sender) {
   originalIsHidden = replaceMethod([NSApplication class], @selector(isHidden), isHidden);
   originalMakeKeyAndOrderFront =
       replaceMethod([NSWindow class], @selector(makeKeyAndOrderFront:), makeKeyAndOrderFront);
+  originalOrderFrontRegardless =
+      replaceMethod([NSWindow class], @selector(orderFrontRegardless), orderFrontRegardless);
 }
 
 @end
