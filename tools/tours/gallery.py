@@ -84,6 +84,7 @@ class Gallery:
     def _let_devices_answer(self, interface):
         for device in self._network.list():
             self._network.set(device["name"], activeif=interface)
+        self._network.settle()
 
     def _start(self, *arguments):
         self._desktop.forget()
