@@ -11,8 +11,8 @@
 
 /// The system's dynamic configuration store: the computer's present network, as dictionaries under
 /// keys such as "State:/Network/Interface/en0/IPv4". Every operation stands for one of the
-/// SystemConfiguration framework, which is one backend; the other fills the same keys from the Linux
-/// kernel.
+/// SystemConfiguration framework, which is one backend; the other fills the same keys from the
+/// Linux kernel.
 ///
 /// Of the store's contents two kinds of entry are promised, both in the state domain:
 /// - an interface's IPv4 entity, for every interface that is up, can pass traffic (has its carrier,

@@ -106,8 +106,7 @@ class snmp_table_request {
 
 /// Makes one request to the device at an address, which is null for an entry that is no text.
 /// Returns what snmp_query_table does, and sets `no_reply` in the same case.
-using snmp_ask =
-    std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
+using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
 /// The same decision with requests made by `ask`, for callers that keep what is exchanged.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);

@@ -148,16 +148,6 @@ TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   expected.pop_back();
   follows();
   EXPECT_EQ(local_address_for_destination("192.0.2.77"), std::nullopt);
-  ip("link set far up");
-  ip("addr del 192.0.2.1/24 dev near");
-  std::string addresses, masks;
-  for (int i = 1; i <= 250; ++i) {
-    addresses += "10.7.7." + std::to_string(i) + ",";
-    masks += "255.255.255.255,";
-  }
-  expected.push_back(addresses + "|" + masks + "||");
-  ip("-V; for i in $(seq 250); do echo addr add 10.7.7.$i dev near; done | ip -batch -");
-  follows();
 }
 
 TEST_F(Kernel, CallbackHearsWhereTheDefaultRouteMoves) {
@@ -166,34 +156,19 @@ TEST_F(Kernel, CallbackHearsWhereTheDefaultRouteMoves) {
   const std::string global = "State:/Network/Global/IPv4";
   ASSERT_TRUE(setNotificationKeys(store, {global}, {}));
   addSourceToMainLoop(createRunLoopSource(store, 0));
-  const auto nextIs = [&](const std::vector<std::string>& keys) {
+  const auto hears = [&] {
     heard.clear();
     recording::runPosted([&] { return !heard.empty(); },
                          std::chrono::duration<double>(kMostSeconds));
-    EXPECT_EQ(heard, keys);
+    EXPECT_EQ(heard, std::vector{global});
   };
 
   ip("addr add 192.0.2.1/24 dev near");
   ip("addr add 198.51.100.1/24 dev left");
   ip("route add default via 192.0.2.254 metric 20");
-  nextIs({global});
+  hears();
   ip("route add default via 198.51.100.254 metric 10");
-  nextIs({global});
-
-  ASSERT_TRUE(setNotificationKeys(store, {}, {"State:/Network/Interface/[^/]+/IPv4"}));
-  ip("route del default");
-  ip("addr add 192.0.2.2/24 dev near");
-  nextIs({"State:/Network/Interface/near/IPv4"});
-}
-
-TEST_F(Kernel, StoreRefusesWhatItCannotRead) {
-  EXPECT_EQ(copyMultiple(nullptr, {}, {}), std::nullopt);
-  EXPECT_EQ(lastDynamicStoreError(), kSCStatusNoStoreSession);
-  const DynamicStoreRef store = createDynamicStore("test");
-  EXPECT_EQ(copyMultiple(store, {}, {"State:/Network/Interface/(/IPv4"}), std::nullopt);
-  EXPECT_EQ(lastDynamicStoreError(), kSCStatusInvalidArgument);
-  EXPECT_FALSE(setNotificationKeys(store, {}, {"["}));
-  EXPECT_EQ(copyMultiple(store, {}, {"State:", "IPv4"}), Dictionary{}) << "whole keys match";
+  hears();
 }
 
 }  // namespace

@@ -95,6 +95,7 @@ bool DatagramSocket::send(std::span<const std::uint8_t> bytes) {
 
 std::optional<DatagramSocket::Received> DatagramSocket::receive(std::span<std::uint8_t> buffer) {
   native_->refused = false;
+  Agents::instance().room = buffer.size();
   const auto reply = std::exchange(native_->reply, std::nullopt);
   if (!reply) return std::nullopt;
   const std::size_t length = std::min(buffer.size(), reply->size());

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <chrono>
+#include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <map>
@@ -36,6 +37,7 @@ class Agents {
   bool socketsOpen = true;
   std::vector<std::string> asked;               ///< the address of every request so far
   std::uint16_t port = 0;                       ///< of the latest request
+  std::size_t room = 0;                         ///< for the latest reply, in bytes
   std::vector<std::chrono::nanoseconds> waits;  ///< the longest that each wait might have taken
 
   [[nodiscard]] int nextAnswer(const std::string& address);

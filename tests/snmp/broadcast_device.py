@@ -5,21 +5,17 @@ import socket
 import sys
 import time
 
-from replies import binding, element, integer, reply
+from replies import reply
 
-IDENTIFIER = integer(99)
-
-
-def proper(number, **details):
-    return reply(IDENTIFIER, binding(integer(number)), **details)
-
+SEVEN = reply(99, 7)
+TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
+NO_BINDINGS = SEVEN[:27] + b"\0"
 
 # What it sends, and after how many seconds. A search listens for 5 to 8 seconds.
 REPLIES = {
-    "stutter": [(0, b""), (0, b"no message"), (0, proper(7)[:-1]), (0, proper(7, status=2)),
-                (0, reply(IDENTIFIER, binding(element(4, b"\7")))), (0, proper(7)),
-                (0, reply(IDENTIFIER, b"")), (0, proper(7)), (4.5, proper(7)), (9, proper(9))],
-    "flood": [(0, proper(number)) for number in range(300)],
+    "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(99, 7, status=2)), (0, TEXT),
+                (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN), (9, reply(99, 9))],
+    "flood": [(0, reply(99, number)) for number in range(300)],
 }
 
 device = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
@@ -27,6 +23,6 @@ device.bind(("", 161))
 _, asker = device.recvfrom(1500)
 asked = time.monotonic()
 kind = sys.argv[1]
-for seconds, datagram in REPLIES.get(kind) or [(0, proper(int(kind)))]:
+for seconds, datagram in REPLIES.get(kind) or [(0, reply(99, int(kind)))]:
     time.sleep(max(0, asked + seconds - time.monotonic()))
     device.sendto(datagram, asker)

@@ -1,6 +1,5 @@
 #pragma once
 
-#include <algorithm>
 #include <cstdint>
 #include <span>
 #include <string_view>
@@ -42,7 +41,7 @@ inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8
   return reply;
 }
 
-/// A request of `bindings` NULL bindings, named 1.3.1.1…, whose storage is followed by guards.
+/// A request of `bindings` NULL bindings, named 1.3.1.1…, whose storage ends where the heap's does.
 struct Message {
   explicit Message(std::size_t bindings, std::uint16_t arcsEach = 14,
                    std::uint16_t stringBytes = 1500)
@@ -50,8 +49,7 @@ struct Message {
     arcs.assign(2 * bindings * room, 1);
     for (std::size_t name = 1; name < arcs.size(); name += room)
       arcs[name] = 3;
-    arcs.insert(arcs.end(), room, kGuard);
-    strings.assign(stringRoom + 16U, kByteGuard);
+    strings.assign(stringRoom, 0);
     varbinds.resize(bindings);
     message.varbinds = varbinds;
     snmp_message_init(message, bindings);
@@ -85,14 +83,6 @@ struct Message {
     bytes.resize(length);
     return bytes;
   }
-
-  [[nodiscard]] bool guardsIntact() const {
-    return std::count(arcs.end() - room, arcs.end(), kGuard) == room &&
-           std::count(strings.end() - 16, strings.end(), kByteGuard) == 16;
-  }
-
-  static constexpr std::uint16_t kGuard = 0xBEEF;
-  static constexpr std::uint8_t kByteGuard = 0xA5;
 
   std::uint16_t room;
   std::uint16_t stringRoom;

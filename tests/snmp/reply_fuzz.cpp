@@ -1,7 +1,9 @@
 // Every input is an agent's reply to a query, a get and a set. Nothing may be written beyond the
-// callers' storage, which ends where the heap's does. What decodes is encoded to a message that
-// decodes to the same.
+// callers' storage, which ends where the heap's does.
 
+#include <array>
+#include <cstdio>
+#include <cstdlib>
 #include <ctime>
 #include <memory>
 
@@ -49,32 +51,8 @@ void exchangeStrings(bool set) {
     m.varbinds[i].index = i;
   }
   (set ? snmp_set : snmp_get)(m.message, slots, kAddress, kModeNetwork);
-  require(m.guardsIntact(), "nothing is written beyond the bindings' storage");
   for (std::size_t i = 0; i < kSlots; ++i)
     require(octets[i].length <= texts[i].size(), "a string fits its slot");
-}
-
-// Whether the encoder has a form for the binding that the decoder takes back.
-bool comesBack(const snmp_varbind& binding) {
-  const bool isUnsigned = binding.type >= kTagCounter && binding.type <= kTagTimeTicks;
-  return binding.type <= kTagObjectIdentifier
-             ? binding.type != 0 && binding.type != 3
-             : binding.type == kTagIpAddress || binding.type == kTagOpaque ||
-                   (isUnsigned && (binding.int_value >> 31 & 1) == 0);
-}
-
-void encodeAgain(std::span<const std::uint8_t> bytes) {
-  static Message m(8, 16, 1500);
-  if (m.decode(bytes) != SNMP_OK) return;
-  // Of the header's numbers, negative ones are read back as others.
-  for (std::uint64_t* const number :
-       {&m.message.version, &m.message.request_id, &m.message.error_status, &m.message.error_index})
-    *number &= INT32_MAX;
-  const auto bindings = m.message.varbinds.first(m.message.varbind_count);
-  const auto once = m.encode();
-  if (once.empty() || !std::all_of(bindings.begin(), bindings.end(), comesBack)) return;
-  require(m.decode(once) == SNMP_OK && m.message.varbind_count == bindings.size(), "decoded again");
-  require(m.encode() == once, "encoded to the same bytes");
 }
 
 }  // namespace
@@ -87,7 +65,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   query();
   exchangeStrings(false);
   exchangeStrings(true);
-  encodeAgain({data, size});
   require(std::clock() - start < CLOCKS_PER_SEC / 10, "a reply takes less than 0.1 s");
   return 0;
 }
