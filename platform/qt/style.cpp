@@ -2,6 +2,7 @@
 
 #include <QAbstractItemView>
 #include <QPainter>
+#include <cstdlib>
 
 #include "platform/qt/list_model.h"
 
@@ -14,6 +15,7 @@ constexpr qreal kCornerRadius = 3;
 constexpr int kRoomBesideTitle = 10;
 constexpr int kRoomAboveTitle = 3;
 constexpr int kLeastGrayDistance = 150;  ///< of 255, between a title and the button behind it
+constexpr int kLeastDisabledDistance = 40;
 
 void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.save();
@@ -115,6 +117,21 @@ void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, 
   } else if (!isList(widget)) {  // a list has its ring around all rows
     drawRing(*painter, option->rect, option->palette.color(QPalette::Highlight));
   }
+}
+
+// Some high-contrast palettes have disabled text in the colour of the window.
+void Style::drawItemText(QPainter* painter, const QRect& rectangle, int flags,
+                         const QPalette& palette, bool isEnabled, const QString& text,
+                         QPalette::ColorRole role) const {
+  QPalette readable(palette);
+  const int window = qGray(palette.color(QPalette::Window).rgb());
+  if (!isEnabled && role != QPalette::NoRole &&
+      std::abs(qGray(palette.color(role).rgb()) - window) < kLeastDisabledDistance) {
+    QColor color = palette.color(QPalette::Active, role);
+    color.setAlphaF(0.6F);
+    readable.setColor(palette.currentColorGroup(), role, color);
+  }
+  QProxyStyle::drawItemText(painter, rectangle, flags, readable, isEnabled, text, role);
 }
 
 int Style::pixelMetric(PixelMetric metric, const QStyleOption* option,

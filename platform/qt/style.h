@@ -17,6 +17,8 @@ class Style final : public QProxyStyle {
                    const QWidget* widget) const override;
   void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
                      const QWidget* widget) const override;
+  void drawItemText(QPainter* painter, const QRect& rectangle, int flags, const QPalette& palette,
+                    bool isEnabled, const QString& text, QPalette::ColorRole role) const override;
   int pixelMetric(PixelMetric metric, const QStyleOption* option,
                   const QWidget* widget) const override;
   QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,

@@ -10,12 +10,11 @@ hand-off file that is not whole.
 """
 
 import argparse
-import concurrent.futures
+import multiprocessing
 import os
 import pathlib
 import plistlib
 import random
-import subprocess
 import sys
 import tempfile
 import time
@@ -186,21 +185,17 @@ def main():
     parser = argparse.ArgumentParser()
     parser.add_argument("--seed", type=int, default=1)
     parser.add_argument("--count", type=int, default=4)
-    parser.add_argument("--step", type=int, default=0, help=argparse.SUPPRESS)
     parser.add_argument("--silence", type=float, default=0.5)
     options = parser.parse_args()
-    seeds = range(options.seed, options.seed + options.count, options.step or 1)
-    if options.step:
-        return take_walks(seeds, options.silence)
     if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
         os.execv(sys.executable, [sys.executable, PRACTICE_NETWORK, "/dev/null", sys.executable,
                                   *sys.argv, BUILT])
-    with concurrent.futures.ThreadPoolExecutor(AT_A_TIME) as pool:
-        runs = pool.map(lambda first: subprocess.run(
-            [sys.executable, "-W", "ignore", __file__, "--seed", str(options.seed + first),
-             "--count", str(options.count - first), "--step", str(AT_A_TIME),
-             "--silence", str(options.silence), BUILT]).returncode, range(AT_A_TIME))
-        return not any(runs)
+    shares = [range(options.seed + first, options.seed + options.count, AT_A_TIME)
+              for first in range(AT_A_TIME)]
+    sys.argv.append(str(BUILT))  # which each process takes from there
+    with multiprocessing.get_context("spawn").Pool(AT_A_TIME) as pool:
+        return all(pool.starmap(take_walks, [(share, options.silence) for share in shares]))
 
 
-sys.exit(not main())
+if __name__ == "__main__":
+    sys.exit(not main())

@@ -3,24 +3,18 @@
 Usage: ways_test.py [unittest options] MEDIUM, a medium's folder with the application on it.
 """
 
+import subprocess
 import unittest
 
 from media import model
 from way import BUILT, TEXT, WayTest, messages
+from onscreen.processes import wait_for
 
 TWO_MODELS = {"Kestrel 1": model(usb=True, wired=True, wireless=True),
               "Kestrel 2": model(usb=True)}
 
 
 class Ways(WayTest):
-    def test_mouse_by_the_list_and_the_cable(self):
-        person = self.start(TWO_MODELS)
-        person.click("list item", "Kestrel 1")
-        person.click("push button", TEXT["BTN_NEXT"])
-        person.click("radio button", TEXT["INST_TXT_USB"] + "\n" + TEXT["INST_TXT_ETHERNET"])
-        person.click("push button", TEXT["BTN_NEXT"])
-        self.assert_installer_opened(person, {"Model": "Kestrel 1", "Interface": "Default"})
-
     def test_keyboard_by_a_model_without_wireless(self):
         person = self.start(TWO_MODELS)
         person.see("list item", "Kestrel 2")
@@ -83,11 +77,36 @@ class Ways(WayTest):
     def test_the_application_menu_speaks_the_users_language(self):
         german = messages.read(BUILT, "de")
         person = self.start(TWO_MODELS, env={"LANG": "de_DE.UTF-8"})
-        person.click("menu item", "Onramp OSX")
+        person.see("list item", "Kestrel 1")
+        person.press("F10")
         for key in ("ABOUT", "HIDE", "HIDEOHTERS", "SHOWALL"):
             person.see("menu item", german["APP_MENU_" + key])
         person.click("menu item", german["APP_MENU_QUIT"])
         self.assert_quit_without_a_trace(person)
+
+    def test_lists_are_named_searched_by_any_word_and_take_a_double_click(self):
+        person = self.start({"Kestrel Photo 1": model(usb=True, wireless=True),
+                             "Kestrel Scan 2": model(usb=True, wired=True, wireless=True)})
+        person.see("list", TEXT["INST_TXT_MODEL"])
+        person.press("s", "c")
+        wait_for(lambda: person.has_state(person.see("list item", "Kestrel Scan 2"), "selected"),
+                 20, "the model found by its second word")
+        person.double_click("list item", "Kestrel Photo 1")
+        person.see("heading", TEXT["INST_TXT_CONNECTIONTYPE"])
+        person.see("panel", TEXT["INST_TXT_CONNECTIONTYPE"])
+        person.click("radio button", TEXT["INST_TXT_USB"])
+        person.click("push button", TEXT["BTN_NEXT"])
+        self.assert_installer_opened(person, {"Model": "Kestrel Photo 1", "Interface": "Default"})
+
+    def test_without_a_display_only_information_is_given(self):
+        program = BUILT / "Onramp OSX.app/Contents/Linux/Onramp OSX"
+        for arguments, status, start in ((["--help"], 0, "Usage: "), (["-v"], 0, "Onramp OSX "),
+                                         ([], 2, "Onramp OSX: there is no display")):
+            run = subprocess.run([program, *arguments], capture_output=True, text=True,
+                                 env={"PATH": "/usr/bin"})
+            output = run.stdout + run.stderr
+            self.assertEqual((run.returncode, output[:len(start)]), (status, start))
+            self.assertTrue(arguments == ["--help"] or output.count("\n") == 1, output)
 
 
 if __name__ == "__main__":

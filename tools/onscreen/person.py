@@ -101,11 +101,18 @@ class Person:
         self.click(role, name)
         self.desktop.run(["xdotool", "click", "1"])
 
-    def open_menu(self, button):
-        """Opens a button's menu, which Qt keeps from the accessibility bus: use it with keys."""
+    def open_menu(self, button=None):
+        """Opens the menu of that button, or else of the button with the focus.
+
+        Qt keeps the menu from the accessibility bus: use it with keys.
+        """
         windows = self._window_count()
-        self.click("push button", button)
-        wait_for(lambda: self._window_count() > windows, _LOOK_SECONDS, f"the menu of {button!r}")
+        if button:
+            self.click("push button", button)
+        else:
+            self.press("space")
+        wait_for(lambda: self._window_count() > windows, _LOOK_SECONDS,
+                 f"the menu of {button or 'the focused button'!r}")
 
     def choose_from_menu(self, button, item):
         """Opens a button's menu and takes its `item`th entry."""

@@ -12,6 +12,7 @@ LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
 DEVICES = 40
 _PATIENCE = 120
 _LARGE, _USUAL = 18, 10  # points
+_WIRELESS, _WIRED = 2, 1  # what a device answers about its interface
 
 _DARK = {"Window": ("35,38,41", "252,252,252"), "View": ("27,30,32", "252,252,252"),
          "Button": ("49,54,59", "252,252,252"), "Selection": ("61,174,233", "252,252,252"),
@@ -80,6 +81,10 @@ class Gallery:
             self._network.add(name + ending, maker=maker, model=kind, type=service_type)
         self._network.settle()
 
+    def _let_devices_answer(self, interface):
+        for device in self._network.list():
+            self._network.set(device["name"], activeif=interface)
+
     def _start(self, *arguments):
         self._desktop.forget()
         return Person(self._desktop, self._medium.program, arguments, env=self._env)
@@ -98,15 +103,22 @@ class Gallery:
             person.see("label", self._text["INST_WAIT"], _PATIENCE)
             self._take(person, "3-search")
             person.see("label", self._text["INST_TXT_DEVLIST"], _PATIENCE)
+            # The devices are listed while the wait goes on.
+            person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
             self._take(person, "4-devices")
-            person.press("Tab", "space")
+            person.press("Tab")
+            person.open_menu()
             self._take(person, "5-gear")
-            person.press("Escape")
+            self._let_devices_answer(_WIRED)
+            person.press("Down", "Down", "Return")
+            person.see("label", self._text["INST_TXT_ALERT_DEVICENOTFOUND"], _PATIENCE)
+            self._take(person, "6-not-found")
+            self._let_devices_answer(_WIRELESS)
 
     def _alert(self, version):
         with self._start("--system-version", version) as person:
             person.see("push button", self._text["BTN_CLOSE"], _PATIENCE)
-            self._take(person, "6-alert")
+            self._take(person, "7-alert")
 
     def _take(self, person, page):
         person.picture(self._pictures / f"{self._look}-{page}.png")
