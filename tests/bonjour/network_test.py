@@ -1,12 +1,14 @@
-"""Discovery against real daemons: network_test.py PROBE. It runs on two hosts joined by two cables,
+"""Discovery against real daemons: network_test.py PROBE CHOOSER_PROBE INFO_PLIST. It runs on two hosts joined by two cables,
 with IPv4 and IPv6. The devices are those of Avahi on the other host, and of another implementation
 on this one."""
 
 import os
 import pathlib
+import shutil
 import socket
 import subprocess
 import sys
+import tempfile
 import time
 import unittest
 
@@ -18,8 +20,27 @@ from practice_network.control import PracticeNetwork
 from discovery import Avahi, Search
 from zeroconf import ServiceInfo, Zeroconf
 
-PROBE = os.path.abspath(sys.argv[1])
+PROBE, CHOOSER, INFORMATION = map(os.path.abspath, sys.argv[1:4])
 TYPE = "_ipp._tcp"
+WIZARDS_TYPE = "_pdl-datastream._tcp"
+ETH_P_ALL = 3
+
+
+def packets():
+    """A socket that sees what comes and goes on any interface."""
+    opened = socket.socket(socket.AF_PACKET, socket.SOCK_DGRAM, socket.htons(ETH_P_ALL))
+    opened.settimeout(discovery.PATIENCE)
+    return opened
+
+
+def asked(seen, last):
+    """The addresses to which SNMP questions go, until one goes to `last`."""
+    addresses = []
+    while last not in addresses:
+        packet = seen.recv(100)
+        if packet[0] == 0x45 and packet[9] == socket.IPPROTO_UDP and packet[22:24] == b"\0\xa1":
+            addresses.append(socket.inet_ntoa(packet[16:20]))
+    return addresses
 
 
 class NetworkTest(unittest.TestCase):
@@ -119,6 +140,28 @@ class NetworkTest(unittest.TestCase):
             search.wait_for("update", "Kestrel", 2)
             self.assertEqual(len(search.events("found", "Kestrel")), 2)
 
+    def test_the_wizard_asks_a_device_that_leaves_nothing(self):
+        medium = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+        shutil.copytree(discovery.ROOT / "examples" / "medium", medium, dirs_exist_ok=True)
+        contents = medium / "Onramp OSX.app" / "Contents"
+        contents.mkdir(parents=True)
+        shutil.copy(INFORMATION, contents)
+        self.network.add("Leaving", maker="Kestrel", model="Model 100", addresses=["192.0.2.91"])
+        self.network.settle()
+        self.avahi.wait_for_interfaces(WIZARDS_TYPE, {"practice0", "practice1"})
+        with packets() as seen:
+            chooser = subprocess.Popen([CHOOSER, contents.parent, "600", "Kestrel Model 100"])
+            self.addCleanup(chooser.wait)
+            self.addCleanup(chooser.kill)
+            asked(seen, "192.0.2.91")
+        with Search(PROBE, WIZARDS_TYPE) as search:
+            search.wait_for("update", "Leaving")
+            with packets() as seen:
+                self.network.remove("Leaving")
+                search.wait_for("remove", "Leaving")
+                self.add("Next", type=WIZARDS_TYPE, activeif=2, addresses=["192.0.2.92"])
+                self.assertEqual(asked(seen, "192.0.2.92"), ["192.0.2.92"])
+
     def test_all_domains_that_the_computer_browses_are_searched(self):
         self.add("Far", domain="annex.local")
         with Search(PROBE, TYPE) as search:
@@ -191,4 +234,4 @@ class NetworkTest(unittest.TestCase):
 
 if __name__ == "__main__":
     discovery.enclose(HERE / "network.toml")
-    unittest.main(argv=sys.argv[:1] + sys.argv[2:], verbosity=2)
+    unittest.main(argv=sys.argv[:1] + sys.argv[4:], verbosity=2)
