@@ -143,7 +143,8 @@ void describe(Bytes bytes, Where where, std::string& out) {
       line += ' ' + contentText(tag, content);
     }
     const std::string name = fieldName(where, tag, content);
-    out += line + (name.empty() ? "" : "  (" + name + ")") + '\n';
+    if (!name.empty()) line.append("  (").append(name).append(")");
+    out.append(line).append("\n");
     if (hasElements) describe(content, {where.depth + 1, 0, (tag & kContextClass) != 0}, out);
   }
 }
