@@ -48,8 +48,13 @@ std::unique_ptr<Daemon> Daemon::create() {
 }
 
 Daemon::Daemon(EventLoop loop)
-    : loop_(std::move(loop)),
-      retry_(loop_.get(), [this] { isConnected_ ? arrived() : connect(); }) {}
+    : loop_(std::move(loop)), retry_(loop_.get(), [this] {
+        if (!isConnected_) {
+          connect();
+        } else if (isPresent_) {
+          arrived();
+        }
+      }) {}
 
 bool Daemon::runUntil(const std::function<bool()>& done) {
   while (!done()) {
@@ -69,6 +74,7 @@ void Daemon::retryLater() {
 void Daemon::add(Query* query) {
   queries_.push_back(query);
   if (isPresent_) query->ask();
+  runSoon();  // arms the timers that the query started
 }
 
 void Daemon::remove(Query* query) {

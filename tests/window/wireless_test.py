@@ -9,7 +9,6 @@ import concurrent.futures
 import os
 import subprocess
 import sys
-import time
 import unittest
 
 import media
@@ -87,9 +86,9 @@ class WirelessWays(WayTest):
     def names(person):
         return [name for name, _, _ in person.rows()]
 
-    def assert_handed_on(self, person, name, address, own_model=None):
+    def assert_handed_on(self, person, name, address):
         self.assert_installer_opened(person, {
-            "Model": own_model or self.model, "Interface": "WiFi", "Network": {
+            "Model": self.model, "Interface": "WiFi", "Network": {
                 "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
                 "IP address": address}})
 
@@ -213,46 +212,6 @@ class WirelessWays(WayTest):
         person.press("Return")
         self.assertEqual(person.wait_for_end(), 0)
         self.assertEqual(self.files()["instmodel"]["Network"]["Bonjour"]["name"], names[-1])
-
-    def test_the_first_address_that_answers_decides(self):
-        addresses = {f"{name} {self.kind}": [f"127.0.{net}.{host}" for host in (1, 2, 3)]
-                     for name, net in (("Silent", 91), ("Wired", 92))}
-        for name, own in addresses.items():
-            self.add(name, addresses=own)
-        self.network.settle()
-        person = self.search()
-        self.see_chooser(person)
-        # Which one is the first, Avahi decides.
-        first = {name: address for name, _, address in person.rows()}
-        silent, wired = addresses
-        for name, behaviour in ((silent, "silent"), (wired, WIRED)):
-            self.network.set(name, activeif=[behaviour if address == first[name] else WIRELESS
-                                             for address in addresses[name]])
-        began = time.monotonic()
-        person.choose_from_menu(GEAR, GEAR_REFRESH)
-        person.see("table cell", silent, PATIENCE)
-        self.see_chooser(person)
-        self.assertGreater(time.monotonic() - began, 3 * 2 * 2.0, "asked less often")
-        self.assertEqual(self.names(person), [silent])
-        person.press("Return")
-        self.assert_handed_on(person, silent, first[silent])
-
-    def test_without_a_model_list_all_models_are_searched_for(self):
-        kinds = {f"{letter} {self.kind}": letter for letter in "ABC"}
-        for kind, letter in kinds.items():
-            self.add(f"{letter} {self.kind}", model=kind)
-        self.network.settle()
-        person = self.start({f"Kestrel {kind}": model(usb=True, wireless=True)
-                             for kind, letter in kinds.items() if letter != "C"})
-        person.see("radio button", TEXT["INST_TXT_WIFI"])
-        person.press("Return")
-        self.see_chooser(person)
-        first, second = f"A {self.kind}", f"B {self.kind}"
-        self.assertEqual(self.names(person), [first, second])
-        person.click("table cell", second)
-        address = person.rows()[1][2]
-        person.press("Return")
-        self.assert_handed_on(person, second, address, own_model=f"Kestrel B {self.kind}")
 
     def test_the_tool_started_by_hand_leads_where_it_says(self):
         name, = self.add_devices("One")
