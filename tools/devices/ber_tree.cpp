@@ -171,7 +171,7 @@ std::string hexDump(Bytes bytes) {
   std::string out;
   for (std::size_t at = 0; at < bytes.size(); at += kBytesPerLine) {
     const Bytes line = bytes.subspan(at, std::min(kBytesPerLine, bytes.size() - at));
-    std::array<char, 16> offset{};
+    std::array<char, 20> offset{};
     std::snprintf(offset.data(), offset.size(), "%04zx ", at);
     out += offset.data();
     for (std::size_t i = 0; i < kBytesPerLine; ++i)
