@@ -18,10 +18,10 @@ class KSDeviceObserver {
   KSDeviceObserver& operator=(const KSDeviceObserver&) = delete;
   virtual ~KSDeviceObserver() = default;
 
-  /// Called when a device is resolved that no browser's table has.
+  /// Called when a device that is in no browser's table is resolved.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is resolved, or is gone once but still counted. This is the usual way in
-  /// which a new device is announced: observers add one that they do not know.
+  /// Called when a device is resolved, or is reported gone while a browser still counts it. A new
+  /// device is usually announced this way, so observers add a device that they do not know.
   virtual void updateKSDevice(const Dictionary& device) = 0;
   /// Called when a device is gone.
   virtual void removeKSDevice(const Dictionary& device) = 0;
@@ -43,18 +43,19 @@ class KSBonjourSearch final : public KSBonjourObserver,
   void addKSDeviceObserver(std::shared_ptr<KSDeviceObserver> observer);
   void removeKSDeviceObserver(const KSDeviceObserver* observer);
 
-  // Each calls the operation of that name on every observer.
+  // Each calls the function that it is named after on every observer.
   void notifyAddToKSDeviceObserver(const Dictionary& device) const;
   void notifyUpdateToKSDeviceObserver(const Dictionary& device) const;
   void notifyRemoveToKSDeviceObserver(const Dictionary& device) const;
 
-  /// Searches for the service type that the medium names, after stopping if it runs.
+  /// Stops a search that is running, then searches for the service type that the medium names.
   void startBrowsing();
 
   /// Ends the search without calling observers.
   void stopBrowsing();
 
-  /// The types under which the browsers know that instance, in the browsers' order.
+  /// The types under which the browsers know the instance with that name and domain, in the
+  /// browsers' order.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

@@ -9,18 +9,18 @@
 
 namespace onramp {
 
-/// A file by its absolute path.
+/// A file, given by its absolute path.
 struct FileURL {
   std::string path;
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
 
-/// Returns the key in "PkgInfo" of the package for a system version in binary-coded decimal, or
-/// nothing when versions like it have no key. "PkgName" takes precedence over these keys.
+/// Returns the "PkgInfo" key of the package for a system version, which is given in binary-coded
+/// decimal, or nothing when no key covers that version. "PkgName" takes precedence over these keys.
 [[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
-/// The places of the installer package and the wireless set-up tool on the medium, and the systems
-/// that the medium supports. The constructor reads the medium; nothing is read afterwards.
+/// Where the installer package and the wireless set-up tool are on the medium, and which systems
+/// the medium supports. The constructor reads the medium; nothing is read afterwards.
 class KSInstallerInfo {
  public:
   /// Reads the medium that the application lies on.
@@ -29,7 +29,7 @@ class KSInstallerInfo {
   /// Sets everything from a medium resource dictionary, or to the defaults when there is none.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
-  // Each sets its own part.
+  // Each of these sets the part that it is named after.
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);

@@ -28,8 +28,8 @@ inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< b
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
 /// The record of the model `name` according to `modelInfoPlist`. A model that is not listed there
-/// connects by USB only. The record ends at its first missing value: a listed model without an
-/// identifier has a name and nothing else, so it offers no connection, and without a name the
+/// connects by USB only. The record ends at the first value that is missing: the record of a listed
+/// model without an identifier has only a name and so offers no connection, and without a name the
 /// record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);

@@ -15,10 +15,11 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-/// The version with these components. One that is missing, as in 10.9, or no number counts as 0.
+/// The version with these components. A component that is missing, as in 10.9, or is not a number
+/// counts as 0.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
-/// How a system stands to the range that the medium supports.
+/// How a system compares with the range that the medium supports.
 enum class SystemSupport : std::uint32_t {
   kSupported = 0,
   kOlderThanMinimum = 1,
@@ -27,17 +28,18 @@ enum class SystemSupport : std::uint32_t {
 
 // The bounds are version dictionaries of KSInstallerInfo.
 
-/// Whether `bound` bounds anything: one whose "Major" is 0 does not.
+/// Whether `bound` sets a limit: one whose "Major" is 0 does not.
 [[nodiscard]] bool isBound(const Dictionary& bound);
 
-/// Whether `version` lies above `maximum`. Its "BugFix" is the first release that does, unlike its
-/// other two components; "x" means that none of that minor version does.
+/// Whether `version` lies above `maximum`. The maximum's "BugFix" is the first release above it,
+/// whereas its "Major" and "Minor" are still within it; "x" means that no release of that minor
+/// version is above it.
 [[nodiscard]] bool isNewerThan(const Dictionary& maximum, const SystemVersion& version);
 
 /// Whether `version` lies below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
-/// Where `version` lies by both bounds, the maximum first.
+/// How `version` compares with both bounds. The maximum is checked first.
 [[nodiscard]] SystemSupport systemSupport(const SystemVersion& version, const Dictionary& minimum,
                                           const Dictionary& maximum);
 

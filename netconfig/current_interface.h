@@ -10,7 +10,7 @@ namespace onramp {
 [[nodiscard]] std::optional<std::string> KSSCcurrentAddressWithInterfaceName(
     const std::string& interface_name);
 
-/// Returns the name of the primary interface, which the preferred default route leads through, or
+/// Returns the name of the primary interface, the one that the preferred default route uses, or
 /// nothing when there is none.
 [[nodiscard]] std::optional<std::string> KSSCCopyCurrentInterfaceName();
 

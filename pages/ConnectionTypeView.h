@@ -30,7 +30,7 @@ class ConnectionTypeView final : public Page {
   /// Shows or hides the waiting state, in which the choice cannot be changed.
   void progressON(bool on);
 
-  /// Full path of the medium's folder of images.
+  /// The full path of the medium's image folder.
   [[nodiscard]] static std::string commonImagesFolderPath();
 
  private:

@@ -65,13 +65,13 @@ namespace onramp {
 }
 
 /// Reads an object identifier of `length` content bytes into `target`. On entry `target->count` is
-/// the number of arcs that fit; on return it is the number of arcs read. Refused without a target,
-/// when the arcs do not fit, when an arc does not fit 16 bits and when the content ends inside an
-/// arc. The arcs read before a refusal are stored, but `count` is unchanged then.
+/// the number of arcs that fit; on return it is the number of arcs read. Refuses a null target,
+/// arcs that do not fit there, an arc that does not fit in 16 bits and content that ends inside an
+/// arc. The arcs read before a refusal are stored, but `count` then stays unchanged.
 [[nodiscard]] snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length);
 
-/// Copies a string of `length` bytes to `target`. Refused when the string is longer than
-/// `target->capacity`, and when there is no target for a string that is not empty.
+/// Copies a string of `length` bytes to `target`. Refuses a string longer than `target->capacity`,
+/// and any string but the empty one when there is no target.
 [[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
 // The next function completes the primitives; no part of the program uses it.

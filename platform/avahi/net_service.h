@@ -9,7 +9,7 @@ namespace onramp::avahi {
 
 [[nodiscard]] NetServiceRef makeService(Instance instance);
 
-/// The daemon has types and domains without the closing dot that the seam's have.
+/// Removes the closing dot: the seam's types and domains have one, the daemon's do not.
 [[nodiscard]] inline std::string withoutClosingDot(std::string name) {
   if (name.ends_with('.')) name.pop_back();
   return name;

@@ -61,8 +61,8 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   [self showSelection];
 }
 
-// Widens the columns to their texts. Where that takes more room than there is, the first column,
-// which holds the names, gives way.
+// Widens the columns to fit their texts. When they need more room than there is, the first column,
+// which holds the names, is narrowed.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -81,7 +81,7 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   if (room < [first width]) [first setWidth:std::max(room, [first minWidth])];
 }
 
-// A click on the row that is selected already is a choice, too.
+// A click on the row that is already selected also counts as a choice.
 - (void)chooseRow:(id)sender {
   const NSInteger row = [_table clickedRow];
   if (row >= 0) _controller->choose(static_cast<std::size_t>(row));

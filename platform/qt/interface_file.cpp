@@ -67,7 +67,8 @@ class Loader final : public QUiLoader {
   }
 
  private:
-  // The constructor loads every Designer plug-in that it finds, and with them half of Qt.
+  // QUiLoader's constructor would load every Designer plug-in that it finds, and half of Qt with
+  // them, so it is given no paths to search.
   static Loader* makeWithoutPlugIns() {
     const QStringList paths = QCoreApplication::libraryPaths();
     QCoreApplication::setLibraryPaths({});
@@ -157,7 +158,8 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// While a page is shown, its root is a child of the window, which may be destroyed first.
+// While a page is shown, its root is a child of the window, and the window may be destroyed before
+// the page.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

@@ -53,7 +53,8 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// Passes the row that the user selected to the controller. Selects it again after a deselection.
+// Passes the row that the user selected to the controller, or selects the controller's row again
+// when the user deselected it.
 void takeSelection(QAbstractItemView* view, ArrayController& controller) {
   const QModelIndexList rows = view->selectionModel()->selectedRows();
   if (rows.isEmpty()) {
@@ -92,7 +93,7 @@ void TableView::bind(ArrayController& controller) const {
                    [&controller](const QModelIndex& index) {
                      controller.choose(static_cast<std::size_t>(index.row()));
                    });
-  // The button may take the list away, so it waits until the list is done with the click.
+  // The button's action may remove the list, so it waits until the list has handled the click.
   QObject::connect(
       view, &QAbstractItemView::doubleClicked, view,
       [view] { clickDefaultButton(*view->window()); }, Qt::QueuedConnection);

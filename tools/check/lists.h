@@ -9,9 +9,10 @@
 
 namespace onramp::check {
 
-/// The property lists that the wizard reads from a medium; nothing for one that it cannot read.
+/// The property lists that the wizard reads from a medium. A list is nothing when the wizard cannot
+/// read it.
 struct Lists {
-  std::string informationPath;            ///< relative to the medium, like the others
+  std::string informationPath;            ///< relative to the medium, like the other paths
   std::optional<Dictionary> information;  ///< the application's
   std::string resourcesPath;
   std::optional<Dictionary> resources;
@@ -23,7 +24,7 @@ struct Lists {
   /// The models of the medium in the wizard's order.
   [[nodiscard]] std::vector<std::string> modelNames() const;
 
-  /// Whether a model supports wireless.
+  /// Whether any model supports wireless.
   [[nodiscard]] bool anyWireless() const;
 };
 
