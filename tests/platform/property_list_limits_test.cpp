@@ -23,9 +23,9 @@ std::string plistWith(const std::string& inside) {
 }
 
 std::string bigEndian(std::size_t number, int bytes) {
-  std::string text;
-  for (int shift = 8 * (bytes - 1); shift >= 0; shift -= 8)
-    text += static_cast<char>(number >> shift & 0xFF);
+  std::string text(static_cast<std::size_t>(bytes), '\0');
+  for (auto byte = text.rbegin(); byte != text.rend(); ++byte, number >>= 8U)
+    *byte = static_cast<char>(number & 0xFF);
   return text;
 }
 
