@@ -23,6 +23,8 @@ TEXT = messages.read(BUILT, "en")
 PRACTICE_NETWORK = TOOLS / "practice-network"
 WIRELESS, WIRED = 2, 1  # what a device answers about its interface
 GEAR, GEAR_REFRESH = "Actions", 2
+# The Cocoa front end under GNUstep lacks keys for menus and names for lists, and always has a display.
+ON_GNUSTEP = "gnustep_person" in sys.modules
 OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": False,
            "PKG_LabelTool": False, "PKG_FontSet": False}
 
