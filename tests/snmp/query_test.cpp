@@ -262,8 +262,9 @@ TEST_F(GetSet, SendTheSlotsThatTheIndexesNameWithinTheStorage) {
     Message request(2);
     ASSERT_EQ(request.decode(sent), SNMP_OK);
     EXPECT_EQ(request.message.pdu_type, kPduSet);
-    EXPECT_EQ(std::string(request.strings.begin(), request.strings.begin() + 2 * length),
-              std::string(length, 'y') + std::string(length, 'x'));
+    EXPECT_EQ(
+        std::string(request.strings.begin(), request.strings.begin() + std::ptrdiff_t{2} * length),
+        std::string(length, 'y') + std::string(length, 'x'));
     EXPECT_EQ(texts[0].front(), 'y') << "the reply's first value, for the first slot";
   }
   agents.asked.clear();
