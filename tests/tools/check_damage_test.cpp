@@ -140,7 +140,7 @@ std::string startIn(const check::Report& report, const std::string& start) {
 // More of them by hand: ONRAMP_DAMAGES=2000.
 TEST(OnrampCheck, ExplainsEveryOtherStartThatADamageCauses) {
   const char* const wanted = std::getenv("ONRAMP_DAMAGES");
-  const unsigned count = wanted ? static_cast<unsigned>(std::atoi(wanted)) : 100;
+  const unsigned long count = wanted ? std::strtoul(wanted, nullptr, 10) : 100;
   const TemporaryFolder support;
   setenv("XDG_DATA_HOME", (support / "user").c_str(), 1);
   setenv("XDG_DATA_DIRS", (support / "local").c_str(), 1);
