@@ -12,7 +12,7 @@ namespace onramp {
 
 namespace {
 
-// The XDG base directory specification says to ignore relative paths.
+// By the XDG base directories, relative paths are ignored.
 std::string absolutePath(std::string_view path) {
   while (path.size() > 1 && path.ends_with('/'))
     path.remove_suffix(1);
