@@ -9,9 +9,8 @@
 namespace onramp {
 
 /// Reads bytes that come from the network or the medium, from front to back and never past their
-/// end. A read that does not fit returns nothing and does not move the reader. A copy has a
-/// position of its own, which allows looking ahead. The bytes must outlive the reader and all
-/// copies.
+/// end. A read that does not fit returns nothing and does not move the reader. A copy
+/// moves separately, which allows looking ahead. The bytes must outlive the reader and all copies.
 class ByteReader {
  public:
   explicit ByteReader(std::span<const std::byte> bytes) : rest_(bytes) {}

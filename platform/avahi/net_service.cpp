@@ -89,7 +89,7 @@ bool Service::startResolve(TimeLimit timeLimit) {
   return true;
 }
 
-// Uses a connection of its own, so that no other client is called meanwhile.
+// Uses a separate connection, so that no other client is called meanwhile.
 bool Service::resolveNow(TimeLimit timeLimit) {
   const auto daemon = Daemon::create();
   if (!daemon) return false;

@@ -22,7 +22,7 @@ std::string information(const std::string& key) {
   return Bundle::main().infoString(key).value_or("");
 }
 
-// The panel runs no event loop of its own, so a search wait goes on and ends behind it.
+// The panel runs no nested event loop, so a search wait goes on and ends behind it.
 void showAboutPanel(QWidget* window, const QString& title) {
   const std::string version = Bundle::main().localizedString("Version %@", "Version %@", "About");
   auto* const panel = qt::makeChild<QMessageBox>(window);

@@ -1,4 +1,4 @@
-"""Runs "onramp-devices hosts" in a network namespace of its own; see tests/in_namespace.
+"""Runs "onramp-devices hosts" in a separate network namespace; see tests/in_namespace.
 Arguments: the program, and the script that makes a network to search."""
 
 import socket

@@ -61,7 +61,7 @@ Answer askedAt(const std::string& address, Progress& progress) {
   });
   progress.show("waiting for " + address);
   runMainLoop();
-  // After an interruption the question ends at once and is told of here.
+  // After an interruption the question ends at once, and this reports its answer.
   questions.stop();
   if (questions.pending() != 0) runMainLoop();
   progress.clear();

@@ -10,7 +10,8 @@
 
 namespace onramp::devices {
 
-/// Asks many devices at once, each on a thread of its own, as the wizard asks one after the other.
+/// Asks many devices at once, one thread for each. Each is asked exactly as the wizard asks it,
+/// which asks one device after the other.
 class Questions {
  public:
   using Answered = std::function<void(Answer answer)>;
