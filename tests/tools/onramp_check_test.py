@@ -212,7 +212,7 @@ MISTAKES = [
     (remove(PICTURE), "path-missing", "no picture beside USB"),
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
      "picture-size", "680 × 480", "192 × 192"),
-    (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "no whole PNG"),
+    (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
     # Names in the network and in files.
     (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", '"_pdl-datastream._tcp."'),
     (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
@@ -220,7 +220,7 @@ MISTAKES = [
     (take(COMMON, "BonjourNetwork"), "service-none", "no device is ever found"),
     (put(f"{APPLICATION}/Info.plist", "NSBonjourServices", ["_ipp._tcp"]), "service-undeclared",
      "_pdl-datastream._tcp"),
-    (put(COMMON, "VenderName", "Kestrel/Imaging"), "vendor-folder", "names no folder"),
+    (put(COMMON, "VenderName", "Kestrel/Imaging"), "vendor-folder", "the name of a folder"),
     (put(COMMON, "VenderName", "Kestrel " * 40), "vendor-long", "at most"),
     (put(COMMON, "VenderName", "Kestrél"), "vendor-letters", "outside ASCII"),
     (put(COMMON, "VenderName", " "), "vendor-empty", "an empty name"),

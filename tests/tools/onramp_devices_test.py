@@ -198,7 +198,7 @@ class CommandLine(unittest.TestCase):
             for arguments, message in ((["browse"], "--medium is required"),
                                        (["browse", "-m", empty], "holds no application"),
                                        (["ask"], "ADDRESS is required"),
-                                       (["ask", "no such host"], "no IPv4 address"),
+                                       (["ask", "no such host"], "neither an IPv4 address"),
                                        (["serch"], "--help")):
                 with self.subTest(arguments):
                     result = run(PROGRAM, *arguments)
