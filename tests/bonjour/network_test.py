@@ -1,7 +1,7 @@
 """Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE INFO_PLIST.
 
 The tests run on two hosts that are joined by two cables, with IPv4 and IPv6. Avahi announces the
-devices of the other host. A second mDNS implementation, zeroconf, announces one of this host."""
+other host's devices. Another mDNS implementation, zeroconf, announces one device of this host."""
 
 import os
 import pathlib

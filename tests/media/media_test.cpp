@@ -94,8 +94,8 @@ TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
                         {"10.8.5", byVersion, std::nullopt},  // the medium has no package for 10.8
                         {"10.9.0", byVersion, "Packages/9"},
                         {"11.0.0", byVersion, "Packages/9"},
-                        {"100.9.9", byVersion, "Packages/9"},  // 0x10099
-                        {"101.0.0", byVersion, std::nullopt},  // above 0x100FF
+                        {"100.9.9", byVersion, "Packages/9"},  // version code 0x10099
+                        {"101.0.0", byVersion, std::nullopt},  // version code above 0x100FF
                         {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
                         {"10.6.8", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
                         {"10.6.8", byVersion.with("PkgName", Array{}), std::nullopt},

@@ -32,7 +32,7 @@ struct Object {
   ImageScaling scaling = ImageScaling::kProportionallyDown;
   ArrayController* content = nullptr;
   std::map<std::string, std::string> headers;  ///< of a table's columns, by their identifiers
-  std::set<std::string> fixedColumns;          ///< those that the user cannot edit
+  std::set<std::string> fixedColumns;          ///< the columns that the user cannot edit
   bool columnsCanMove = true;
   bool columnsCanBeSelected = true;
   std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button

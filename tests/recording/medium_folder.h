@@ -21,7 +21,7 @@ class MediumFolder {
   MediumFolder& operator=(const MediumFolder&) = delete;
   ~MediumFolder();
 
-  /// The full path of a file on the medium.
+  /// Returns the full path of a file on the medium.
   [[nodiscard]] std::string path(const std::string& relative) const;
 
   /// Write a file on the medium, and create its folder if it is missing.

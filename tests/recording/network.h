@@ -26,7 +26,7 @@ class Network {
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// End the service's running resolve; nothing happens when there is none.
+  /// End the service's running resolve. They do nothing when there is none.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);
 

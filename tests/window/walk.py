@@ -33,7 +33,7 @@ CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu ite
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
 PRINTER = "_pdl-datastream._tcp"
-# With equal weights, most walks would end early. Hide is never clicked, because no task bar could
+# With equal weights, most walks would end early. Hide is never clicked, because no task bar can
 # bring a hidden window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
