@@ -15,7 +15,7 @@ struct RetitledItem {
   const char* key;
 };
 
-// The message tables on the media misspell the third key in the same way.
+// The third key is misspelt because it is misspelt in the message tables on the media.
 constexpr RetitledItem kApplicationMenuItems[] = {{"About", "APP_MENU_ABOUT"},
                                                   {"Hide", "APP_MENU_HIDE"},
                                                   {"Hide Others", "APP_MENU_HIDEOHTERS"},
