@@ -63,7 +63,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Whether any of `models` supports wireless.
   [[nodiscard]] static bool isSupportWiFi(const std::vector<std::string>& models);
 
-  /// Returns the type of a model that supports USB or not, and wired Ethernet or not.
+  /// Returns the type of a model that supports USB if `usb` is set, and wired Ethernet if
+  /// `ethernet` is set.
   [[nodiscard]] static ConnectionType isIFType(bool usb, bool ethernet);
 
   /// Returns the type of the model called `model`; kNeither without a name.
@@ -158,8 +159,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static Dictionary instmodelPlistNotWiFi(const std::string& model);
 
   /// Returns the model file's contents for a wireless device with the KSDevice record `property`.
-  /// Returns those for a wired `model` instead when there is no record, when it lacks a name or an
-  /// address, or when the medium names no service type.
+  /// Returns the contents for a wired `model` instead when there is no record, when the record
+  /// lacks a name or an address, or when the medium names no service type.
   [[nodiscard]] static Dictionary instmodelPlistWiFi(const std::optional<std::string>& model,
                                                      const std::optional<Dictionary>& property);
 
@@ -254,7 +255,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   ImageView mBackGroundView;
   KSInstallerInfo mKSInstallerInfo;
   Dictionary mKSCD;
-  std::optional<std::string> mChoosedModel;  ///< nothing until a choice, and without a model list
+  std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses from the model list
   std::uint32_t mContainedModelCount = 0;
   bool mIsWLANTool = false;  ///< whether the wizard itself started the set-up tool
   std::shared_ptr<Page> mChooseDeviceViewController;

@@ -34,9 +34,9 @@ class KSBonjourObserver {
 
   /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service is gone, after the browser's table has been updated. An entry that was
-  /// added more than once may still be in the table. `service` is the table's object, or null when
-  /// the service was not in the table.
+  /// Called when a service is gone, after the browser's table has been updated. A service that was
+  /// added more than once may still be in it. `service` is the table's object, or null when the
+  /// table did not contain the service.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
   /// Called when a service's addresses and TXT record are known, after the browser's table has been
   /// updated.
@@ -44,8 +44,8 @@ class KSBonjourObserver {
 };
 
 /// Browses for services of one type, resolves each service found and keeps a table of them. A
-/// service that is reported several times has one entry, which counts the reports. Main thread
-/// only.
+/// service that is reported several times has one entry, which counts the reports. All functions
+/// must be called on the main thread.
 class KSBonjour {
  public:
   /// Creates an idle browser for `type`. A browser without a type never starts.
@@ -62,7 +62,7 @@ class KSBonjour {
   void addKSBonjourObserver(std::shared_ptr<KSBonjourObserver> observer);
   void removeKSBonjourObserver(const KSBonjourObserver* observer);
 
-  // Each calls the function of that event on every observer.
+  // Each calls the corresponding function of every observer.
   void notifyAddToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyRemoveToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyResolvedToKSBonjourObserver(const NetServiceRef& service) const;

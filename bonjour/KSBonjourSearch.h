@@ -30,7 +30,7 @@ class KSDeviceObserver {
 
 /// Searches the network for devices of the medium's service type and reports each device when it is
 /// resolved. A running search and its browsers keep each other alive, so stopBrowsing() must be
-/// called before the search can be destroyed. Main thread only.
+/// called before the search can be destroyed. All functions must be called on the main thread.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:
@@ -45,7 +45,7 @@ class KSBonjourSearch final : public KSBonjourObserver,
   void addKSDeviceObserver(std::shared_ptr<KSDeviceObserver> observer);
   void removeKSDeviceObserver(const KSDeviceObserver* observer);
 
-  // Each calls the function of that event on every observer.
+  // Each calls the corresponding function of every observer.
   void notifyAddToKSDeviceObserver(const Dictionary& device) const;
   void notifyUpdateToKSDeviceObserver(const Dictionary& device) const;
   void notifyRemoveToKSDeviceObserver(const Dictionary& device) const;

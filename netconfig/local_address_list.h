@@ -11,8 +11,8 @@ namespace onramp {
 
 /// The computer's IPv4 addresses at the time the list was made: one dictionary for every interface
 /// that has IPv4 state, in no particular order. Each dictionary has arrays of dotted texts under
-/// kSCPropNetIPv4Addresses, kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks, or some
-/// of them. Null when there is no list.
+/// kSCPropNetIPv4Addresses, kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks; an
+/// array may be missing. Null when there is no list.
 using local_address_list = std::shared_ptr<const Array>;
 
 /// The error code for an invalid argument.

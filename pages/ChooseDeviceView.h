@@ -35,11 +35,10 @@ class ChooseDeviceView final : public Page,
                                public std::enable_shared_from_this<ChooseDeviceView> {
  public:
   // Keys of a list entry.
-  static constexpr std::string_view kDevice = "device";  ///< string, the device's name
-  static constexpr std::string_view kInterface =
-      "interface";  ///< string, how the device is connected
-  static constexpr std::string_view kLocation = "location";  ///< string, the device's first address
-  static constexpr std::string_view kKSDevice = "ksdevice";  ///< dictionary, the device record
+  static constexpr std::string_view kDevice = "device";        ///< string, the device's name
+  static constexpr std::string_view kInterface = "interface";  ///< string, kind of connection
+  static constexpr std::string_view kLocation = "location";    ///< string, the first address
+  static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
 
   /// The length of a pause in the wait that refreshBrowsing() requests.
   static constexpr std::chrono::seconds kRefreshPause{3};

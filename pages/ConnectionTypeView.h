@@ -9,7 +9,8 @@
 
 namespace onramp {
 
-/// The page that asks how the device is connected. A new page is created each time.
+/// The page that asks how the device is connected. A new page object is created each time the page
+/// is shown.
 class ConnectionTypeView final : public Page {
  public:
   // Rows of the radio buttons.

@@ -10,7 +10,8 @@
 
 namespace onramp {
 
-/// The page that lists the medium's models. A new page is created each time.
+/// The page that lists the medium's models. A new page object is created each time the page is
+/// shown.
 class ModelListView final : public Page {
  public:
   explicit ModelListView(std::unique_ptr<Interface> interface);

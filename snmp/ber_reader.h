@@ -13,7 +13,7 @@ namespace onramp {
 // moves the reader past that part and returns SNMP_OK, or returns SNMP_ERR_CODEC for malformed or
 // missing bytes.
 
-/// Reads a tag of one byte. Refuses a longer tag and then does not move the reader.
+/// Reads a tag of one byte. Refuses a longer tag without moving the reader.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
   constexpr std::uint8_t kHighTagNumber = 0x1F;
   ByteReader ahead = in;

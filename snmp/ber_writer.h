@@ -72,8 +72,8 @@ class ber_writer {
 /// that of an INTEGER, so it must not look negative (RFC 1155 section 6, X.690 section 8.3).
 [[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
-/// Puts an object identifier. Refuses fewer than two arcs, two first arcs that do not fit in one
-/// byte, and content of more than 255 bytes.
+/// Puts an object identifier. Refuses fewer than two arcs, first two arcs that do not fit together
+/// in one byte, and content of more than 255 bytes.
 [[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
 [[nodiscard]] snmp_status ber_put_null(ber_writer& out);

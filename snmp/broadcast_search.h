@@ -13,8 +13,8 @@ namespace onramp {
 /// program calls this function.
 ///
 /// Blocks for up to 2 seconds per subnet to send, then for 5 to 8 seconds to receive, or until 256
-/// replies have arrived. Returns the empty array at once on a computer whose only interface is the
-/// loopback.
+/// datagrams have arrived. Returns the empty array at once on a computer whose only interface is
+/// the loopback.
 [[nodiscard]] Array snmp_broadcast_search(mib_table& table);
 
 }  // namespace onramp

@@ -42,7 +42,7 @@ struct snmp_octets {
 struct snmp_varbind {
   std::uint64_t type = kTagNull;
   snmp_oid* name = nullptr;             ///< a reply's name is decoded into this same record
-  std::int64_t int_value = 0;           ///< for types 1, 2, 65, 66, 67; only the low 32 bits
+  std::int64_t int_value = 0;           ///< for types 1, 2 and 65 to 67; the low 32 bits are used
   snmp_octets* octets_value = nullptr;  ///< for types 4, 64 and 68
   snmp_oid* oid_value = nullptr;        ///< for type 6
   std::uint16_t encoded_length = 0;     ///< set by the encoder: size of name and value together

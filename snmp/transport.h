@@ -22,7 +22,7 @@ using snmp_packet = std::array<std::uint8_t, 1536>;
 constexpr std::chrono::seconds kSendWait{2};
 constexpr std::chrono::seconds kReceiveWait{2};
 
-/// Modes of snmp_exchange. Every other mode works like kModeNetwork.
+/// Modes of snmp_exchange. Every mode other than kModeNoNetwork works like kModeNetwork.
 constexpr std::uint32_t kModeNetwork = 4;
 constexpr std::uint32_t kModeNoNetwork = 6;
 

@@ -103,7 +103,7 @@ class NetSnmp {
     snmp_free_pdu(pdu);
   }
 
-  /// Returns the encoded request. net-snmp also encodes from the buffer's end.
+  /// net-snmp encodes towards the buffer's start, so the request is at the buffer's end.
   [[nodiscard]] std::span<const std::uint8_t> request() const {
     return std::span(buffer_).last(offset_);
   }
