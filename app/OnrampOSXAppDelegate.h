@@ -128,7 +128,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
   /// Compare the running system's version with the medium's maximum and minimum, by the rules of
-  /// isNewerThan() and isOlderThan(). A bound whose "Major" is 0 is not skipped.
+  /// isNewerThan() and isOlderThan(). Unlike installationCheck(), they do not skip a bound whose
+  /// "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 

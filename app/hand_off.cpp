@@ -26,8 +26,7 @@ std::string fileName(const std::string& vendor, const std::string& kind) {
 }
 
 // Other users' runs and the installer must be able to replace the files in the folder. A folder
-// keeps its permissions if its path does not fit in the path buffer, which has the size of PATH_MAX
-// on macOS.
+// keeps its permissions if its path is longer than PATH_MAX allows on macOS.
 void openToEveryone(const std::string& folder) {
   constexpr std::size_t kPathBufferSize = 1024;  // bytes, including the terminating zero
   if (folder.size() >= kPathBufferSize) return;

@@ -15,13 +15,13 @@ namespace onramp {
 /// them. All functions except arrangedCount() must be called on the main thread.
 class ArrayController {
  public:
-  /// Sets the key that rearrange() sorts by. It compares the entries' texts under `key` byte by
-  /// byte, in ascending order. An entry without such a text sorts as if the text were empty.
-  /// Without a sort key, entries stay in the order in which they were added.
+  /// Sets the key that rearrange() sorts by. rearrange() compares the entries' texts under `key`
+  /// byte by byte, in ascending order. An entry without such a text sorts as if the text were
+  /// empty. Without a sort key, entries stay in the order in which they were added.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
-  /// Appends `entries`. They stay at the end of the list until the next rearrange(). If the list
-  /// was empty, the first new entry becomes selected.
+  /// Appends `entries`. The new entries stay at the end of the list until the next rearrange(). If
+  /// the list was empty, the first new entry becomes selected.
   void addObjects(std::vector<Dictionary> entries);
 
   /// Removes every entry equal to `entry`. If the selected entry is removed, the next remaining

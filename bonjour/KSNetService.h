@@ -11,8 +11,8 @@ namespace onramp {
 // The operations on network services that the browser classes use. A function that returns an int
 // returns 0 on success and 1 on failure. All functions must be called on the main thread.
 
-/// The functions that receive the results of browse and resolve operations. A pointer may be null.
-/// The structure must outlive every browse and resolve that is started with it.
+/// The functions that receive the results of browse and resolve operations. A function pointer may
+/// be null. The structure must outlive every browse and resolve that is started with it.
 struct ServiceClientCallbacks {
   void (*add)(const NetServiceRef& service, unsigned long flags) = nullptr;
   void (*remove)(const NetServiceRef& service, unsigned long flags) = nullptr;

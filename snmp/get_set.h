@@ -35,9 +35,9 @@ struct snmp_result_slot {
 /// string; otherwise it keeps its own value. Copies the reply's values to the slots and returns the
 /// status as snmp_get does.
 ///
-/// Returns SNMP_ERR_CODEC and sends nothing when the strings do not fit in kReplySize bytes, in
-/// which each starts at a multiple of 16. The `octets_value` of a binding that sent a string is
-/// null afterwards.
+/// Returns SNMP_ERR_CODEC and sends nothing when a binding has no slot, when a string has no value,
+/// and when the strings do not fit in a buffer of kReplySize bytes, where every string starts at a
+/// multiple of 16. The `octets_value` of a binding that sent a string is null afterwards.
 [[nodiscard]] snmp_status snmp_set(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 
