@@ -132,7 +132,8 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {
-    // The wizard may quit while a sheet or a modal loop runs on the window.
+    // AppKit asks the delegate whether the application may quit during a modal loop or a sheet, and
+    // does not refuse by itself.
     [window setPreventsApplicationTerminationWhenModal:NO];
     localize([window contentView], name);
     connectActions([window contentView], owner, tree -> actions);

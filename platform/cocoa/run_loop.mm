@@ -2,6 +2,7 @@
 
 #import <AppKit/AppKit.h>
 
+#include <atomic>
 #include <utility>
 
 #include "platform/application.h"
@@ -17,8 +18,14 @@ NSArray* allModes() {
                                    NSEventTrackingRunLoopMode, nil];
 }
 
-// Whether the running modal loop was asked to end. Main thread only.
+// The number of modal loops that run now, and whether the innermost one was asked to end. Main
+// thread only.
+int modalLoops = 0;
 bool isModalAborted = false;
+
+// True from abortModal() until the modal loop has returned. Each posted action may occupy the main
+// thread for seconds, so posted actions are held back meanwhile.
+std::atomic<bool> isAborting = false;
 
 // Runs `action` once only, even if its timer fires again inside a loop that the action runs.
 // Destroys it on the thread that ran it, although another thread may release the object last.
@@ -26,6 +33,27 @@ OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
   }];
+}
+
+void post(std::function<void()> action) {
+  @autoreleasepool {
+    [once(std::move(action)) performSelectorOnMainThread:@selector(perform:)
+                                              withObject:nil
+                                           waitUntilDone:NO
+                                                   modes:allModes()];
+  }
+}
+
+// Drops the clicks and keys that came in while the main thread was busy: they were meant for the
+// page that was shown then. Neither timers nor actions run in the mode in which they are fetched.
+void dropWaitingInput() {
+  const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
+                           NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;
+  while ([NSApp nextEventMatchingMask:input
+                            untilDate:[NSDate distantPast]
+                               inMode:@"OnrampDropInput"
+                              dequeue:YES]) {
+  }
 }
 
 // A modal loop checks whether it was stopped only after it has handled an event.
@@ -56,16 +84,20 @@ void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action
 }
 
 void performOnMainThread(std::function<void()> action) {
-  @autoreleasepool {
-    [once(std::move(action)) performSelectorOnMainThread:@selector(perform:)
-                                              withObject:nil
-                                           waitUntilDone:NO
-                                                   modes:allModes()];
-  }
+  post([action = std::move(action)]() mutable {
+    if (isAborting && modalLoops > 0) {
+      performOnMainThread(std::move(action));
+    } else {
+      action();
+    }
+  });
 }
 
 // AppKit may end a modal loop unasked, for example for a key that cancels; it is then run again.
 void runModalForWindow(const Window& window) {
+  // Showing the window may already run an action that ends the loop.
+  isModalAborted = false;
+  ++modalLoops;
   // AppKit shows no window of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
@@ -73,15 +105,23 @@ void runModalForWindow(const Window& window) {
   // The controller refuses to close the window meanwhile, and the button shows it.
   NSButton* const closeButton = [modal standardWindowButton:NSWindowCloseButton];
   [closeButton setEnabled:NO];
-  isModalAborted = !modal;
-  while (!isModalAborted)
+  while (modal && !isModalAborted)
     [NSApp runModalForWindow:modal];
+  --modalLoops;
+  isAborting = false;
+  dropWaitingInput();
   [closeButton setEnabled:YES];
 }
 
 void abortModal() {
-  performOnMainThread([] {
+  isAborting = true;
+  post([] {
+    if (modalLoops == 0) {
+      isAborting = false;
+      return;
+    }
     isModalAborted = true;
+    if (![NSApp modalWindow]) return;  // the window is not shown yet
     [NSApp stopModalWithCode:NSModalResponseAbort];
     wakeEventLoop();
   });

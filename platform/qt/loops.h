@@ -2,9 +2,6 @@
 
 namespace onramp::qt {
 
-/// Whether a modal loop runs. Main thread only.
-[[nodiscard]] bool isModal();
-
 /// Ends the main loop, every modal one and every sleep off the main thread, for good. Main thread
 /// only.
 void endAllLoops();

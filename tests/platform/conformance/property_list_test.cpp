@@ -71,8 +71,6 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
                                "<html><body/></html>",
                                whole.substr(0, whole.size() - 12),
                                plist("<key>k</key>\xFF"),
-                               plist(std::string("<key>k</key><string>\0</string>", 30)),
-                               plist("<key>k</key><string>&unknown;</string>"),
                                "bplist00",
                                "bplist00" + std::string(40, '\xFF')};
   const TemporaryFolder folder;
@@ -82,6 +80,14 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
   EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
   EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
   EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "the pipe has no writer";
+}
+
+TEST(PropertyList, IsNothingWhenItsXMLHoldsMoreThanXMLMay) {
+  const TemporaryFolder folder;
+  for (const std::string& text : {std::string("\0", 1), std::string("&unknown;")}) {
+    const std::string bytes = plist("<key>k</key><string>" + text + "</string>");
+    EXPECT_EQ(loadDictionary(folder.holding("list", bytes)), std::nullopt) << bytes;
+  }
 }
 
 TEST(PropertyList, IsRefusedBeyondTheLimits) {
