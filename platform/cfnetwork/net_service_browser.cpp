@@ -96,8 +96,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   // another object. Returns the service when it is found or gone, and null in between.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
-      return found.service->name() == service->name() &&
-             found.service->type() == service->type() &&
+      return found.service->name() == service->name() && found.service->type() == service->type() &&
              found.service->domain() == service->domain();
     });
     if (known == found_.end()) {

@@ -120,12 +120,15 @@ class WirelessWays(WayTest):
                   "of another maker": {"maker": "Heron"}, "in small letters": {"maker": "kestrel"},
                   "in capital letters": {"model": self.kind.upper()},
                   "with two blanks": {"model": f" {self.kind}"},
-                  "of another type": {"type": "_ipp._tcp"}}
+                  "of another type": {"type": "_ipp._tcp"},
+                  # These would use up the first wait if a refusal were not noticed at once.
+                  **{f"closed {number}": {"activeif": "closed"} for number in (1, 2, 3)}}
         for name, entries in others.items():
             self.add(f"{name} {self.kind}", **entries)
         wanted, = self.add_devices("Wanted")
         person = self.search()
         self.see_chooser(person)
+        self.assertTrue(person.sees("push button", TEXT["BTN_BACK"]), "found in the first wait")
         self.assertEqual(self.names(person), [wanted])
         # The first search may have ended before it saw all devices, so a second one repeats it.
         person.choose_from_menu(GEAR, GEAR_REFRESH)
@@ -178,6 +181,8 @@ class WirelessWays(WayTest):
         self.see_waiting(person)
         person.close_window()
         person.press("Escape")
+        self.open_application_menu(person)
+        person.click("menu item", TEXT["APP_MENU_QUIT"])
         self.add_devices("One")
         self.see_chooser(person)
         person.close_window()
