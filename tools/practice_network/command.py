@@ -136,7 +136,7 @@ def _enclose(options):
     from practice_network import namespace
     reason = namespace.why_not_enclosed()
     if reason:
-        return _complain(f"this machine gives no namespaces: {reason}", NO_NAMESPACE)
+        return _complain(f"this machine cannot create namespaces: {reason}", NO_NAMESPACE)
     user, group, path = json.loads(options.invoker) if options.invoker else (0, 0, "")
     command = options.command[1:] if options.command[:1] == ["--"] else options.command
     return namespace.enclose({
@@ -147,11 +147,11 @@ def _enclose(options):
 
 def _become_root(program, arguments):
     if not shutil.which("sudo"):
-        return _complain("this machine gives no namespaces: not root, and there is no sudo",
+        return _complain("namespaces need root: you are not root, and there is no sudo",
                          NO_NAMESPACE)
     ask = [] if sys.stdin.isatty() else ["-n"]
     if os.spawnvp(os.P_WAIT, "sudo", ["sudo", *ask, "-v"]):
-        return _complain("this machine gives no namespaces: not root, and sudo refuses",
+        return _complain("namespaces need root: you are not root, and sudo refuses",
                          NO_NAMESPACE)
     invoker = json.dumps([os.getuid(), os.getgid(), os.environ.get("PATH", "")])
     os.execvp("sudo", ["sudo", "-E", *ask, "--", "setpriv", "--pdeathsig", "KILL", sys.executable,
