@@ -7,7 +7,7 @@
 
 namespace onramp {
 
-/// The answers that a sheet gives for its buttons.
+/// The codes that a sheet returns for its default button and its other button.
 inline constexpr int kAlertDefaultReturn = 1;
 inline constexpr int kAlertOtherReturn = -1;
 
@@ -22,8 +22,9 @@ struct AlertSheet {
   std::string otherButton;
 };
 
-/// Shows a sheet on `window` and returns at once. `didEnd` gets the answer when the user dismisses
-/// it.
+/// Shows a sheet on `window` and returns at once. When the sheet has ended, calls `didEnd` with
+/// kAlertOtherReturn if the user clicked the other button, and with kAlertDefaultReturn in all
+/// other cases.
 void beginAlertSheet(const AlertSheet& sheet, const Window& window,
                      std::function<void(int returnCode)> didEnd);
 
