@@ -11,7 +11,7 @@ namespace onramp {
 inline constexpr int kAlertDefaultReturn = 1;
 inline constexpr int kAlertOtherReturn = -1;
 
-/// Shows an alert of the critical style with one button and returns when the user has dismissed it.
+/// Shows a critical alert with one button. Returns when the user has dismissed the alert.
 void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
                       const std::string& buttonTitle);
 

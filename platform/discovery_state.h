@@ -14,7 +14,7 @@ namespace onramp {
 /// discovery works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
-/// Tells that a browse sees a service on one network interface and protocol, or no longer sees it
+/// Reports that a browse sees a service on one network interface and protocol, or no longer sees it
 /// there. NetServiceBrowser merges all sightings of a service.
 struct ServiceSighting {
   std::string name;       ///< as NetService::name()

@@ -15,11 +15,12 @@
 /// that framework, and the other fills the same keys from the Linux kernel.
 ///
 /// Callers can rely on two kinds of entries, both in the state domain:
-/// - the IPv4 entity of an interface. Every interface has one that is up, can pass traffic (it has
-///   a carrier and has passed authentication) and has an IPv4 address, including the loopback
-///   interface. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold one dotted
-///   text for each address, in the system's order. The array kSCPropNetIPv4BroadcastAddresses holds
-///   the broadcast addresses that are set, and is absent when none is set;
+/// - the IPv4 entity of an interface. It exists for every interface, including the loopback
+///   interface, that is up, can pass traffic (has a carrier and has passed authentication) and has
+///   an IPv4 address. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold one
+///   dotted text for each address, in the system's order. The array
+///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
+///   when none is set;
 /// - the global IPv4 entity, which exists while there is a default route. Its text
 ///   kSCDynamicStorePropNetPrimaryInterface names the interface of the preferred default route.
 namespace onramp {
@@ -78,7 +79,7 @@ using DynamicStoreCallback = std::function<void(const std::vector<std::string>& 
 
 /// Makes the session call its callback when the value of one of these keys changes. The keys are
 /// selected as in copyMultiple(). Replaces any earlier request. A value that appears or disappears
-/// has changed, too. Returns false on failure.
+/// also counts as changed. Returns false on failure.
 bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::string>& keys,
                          const std::vector<std::string>& patterns);
 
@@ -86,8 +87,8 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
 /// several of them, those with a lower `order` are handled first. Returns null on failure.
 [[nodiscard]] DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int order);
 
-/// Adds `source` to the main run loop in the common modes (every mode, the modal one included). The
-/// loop keeps the source until the process ends. Does nothing when `source` is null.
+/// Adds `source` to the main run loop in every mode, including the modal one. The loop keeps the
+/// source until the process ends. Does nothing when `source` is null.
 void addSourceToMainLoop(const DynamicStoreSourceRef& source);
 
 /// Returns the error code of the calling thread's last store operation that failed, or kSCStatusOK

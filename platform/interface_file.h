@@ -43,8 +43,8 @@ class Interface {
   /// is none.
   [[nodiscard]] View view() const;
 
-  /// Returns the class that the file gives the view of view(), such as "ModelListView", or an empty
-  /// text when there is no view.
+  /// Returns the class that the file gives to the result of view(), such as "ModelListView", or an
+  /// empty text when there is no view.
   [[nodiscard]] std::string viewClass() const;
 
   /// Returns the object that the file calls `name`, or an empty handle when no object of the

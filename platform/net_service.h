@@ -27,7 +27,8 @@ inline constexpr std::int32_t kNetServiceErrorTimeout = -72007;
 
 // Flags of a browse event.
 inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
-inline constexpr unsigned long kNetServiceFlagRemove = 8;  ///< set: a service is gone; else: found
+/// When this is set, the service is gone. Otherwise it has been found.
+inline constexpr unsigned long kNetServiceFlagRemove = 8;
 
 /// Looks for services by DNS Service Discovery. Main thread only. The client is called on the main
 /// thread, in every mode of the main loop. Destroying a browser ends it like invalidate().
@@ -50,7 +51,7 @@ class NetServiceBrowser {
   NetServiceBrowser& operator=(const NetServiceBrowser&) = delete;
   virtual ~NetServiceBrowser() = default;
 
-  /// Allows calls to the client, which are none before schedule() and after unschedule().
+  /// The client is called only between schedule() and unschedule().
   virtual void schedule() = 0;
   virtual void unschedule() = 0;
 
@@ -110,7 +111,7 @@ class NetService {
   /// Sets the client that resolves report to. Without a client, a resolve blocks the caller.
   virtual void setClient(Client client, void* info) = 0;
 
-  /// Allows calls to the client, which are none before schedule() and after unschedule().
+  /// The client is called only between schedule() and unschedule().
   virtual void schedule() = 0;
   virtual void unschedule() = 0;
 

@@ -29,8 +29,8 @@ enum class OutletKind {
 
 /// A handle to an object of the user interface. The front end owns the object. Copies refer to the
 /// same object. An empty handle accepts every request and does nothing. The handle of an object
-/// that is missing from the interface file is empty, so a page works with whatever its file has.
-/// Main thread only.
+/// that is missing from the interface file is empty, so a page also works when its file lacks some
+/// objects. Main thread only.
 class Outlet {
  public:
   Outlet() = default;
@@ -151,8 +151,8 @@ class TableView : public Control {
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 is not a command. It is what the button itself
-/// shows.
+/// A button that opens a menu of commands. Item 0 is what the button itself shows; it is not a
+/// command.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;

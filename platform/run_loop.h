@@ -21,8 +21,8 @@ void performOnMainThread(std::function<void()> action);
 /// thread.
 void runModalForWindow(const Window& window);
 
-/// Ends the running modal loop, if there is one, before any action runs that performOnMainThread()
-/// has not run yet. Callable from any thread.
+/// Ends the running modal loop, if there is one. Actions of performOnMainThread() that have not run
+/// yet run only after the loop has ended. Callable from any thread.
 void abortModal();
 
 /// Blocks the calling thread, which must not be the main thread, for `duration`. When the

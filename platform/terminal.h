@@ -4,7 +4,7 @@
 
 namespace onramp {
 
-/// Return whether standard output and standard error, respectively, are a terminal that understands
+/// Return whether standard output or standard error, respectively, is a terminal that understands
 /// escape sequences.
 [[nodiscard]] bool isOutputTerminal();
 [[nodiscard]] bool isErrorTerminal();

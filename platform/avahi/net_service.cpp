@@ -75,8 +75,9 @@ bool Service::resolveWithTimeout(double seconds) {
   return client_ ? startResolve(timeLimitOf(seconds)) : resolveNow(timeLimitOf(seconds));
 }
 
-// The main loop calls the client, not the daemon's loop. The client may therefore destroy any
-// object, and a slow client runs only after the daemon's loop has read all waiting messages.
+// The client is called from the main loop, not from inside the daemon's loop. It may therefore
+// destroy any object, and a slow client does not keep the daemon's loop from reading the messages
+// that are already waiting.
 bool Service::startResolve(TimeLimit timeLimit) {
   daemon_ = Daemon::shared();
   if (!daemon_) return false;

@@ -64,7 +64,8 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
 };
 
 // For an empty domain, a DomainBrowser query reports the domains that the computer or the network
-// is configured to browse. It never reports the local domain, so that one is browsed in any case.
+// is configured to browse. The query never reports the local domain, which is therefore always
+// browsed.
 bool Browser::searchForServices(const std::string& domain, const std::string& type) {
   if (!client_ || daemon_) return false;
   daemon_ = Daemon::shared();
@@ -159,8 +160,9 @@ void Browser::gone(const Instance& instance) {
   if (const auto node = services_.extract(instance)) tell(kNetServiceFlagRemove, node.mapped());
 }
 
-// The main loop calls the client, not the daemon's loop. The client may therefore destroy any
-// object, and a slow client runs only after the daemon's loop has read all waiting messages.
+// The client is called from the main loop, not from inside the daemon's loop. It may therefore
+// destroy any object, and a slow client does not keep the daemon's loop from reading the messages
+// that are already waiting.
 void Browser::tell(unsigned long flags, const NetServiceRef& service) {
   performOnMainThread([weak = weak_from_this(), search = search_, flags, service] {
     const auto browser = weak.lock();

@@ -7,7 +7,7 @@ std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }
 
-// The parameter is passed by value, because the other backend stores it.
+// The parameter is passed by value, because a backend that receives sightings stores it.
 // NOLINTNEXTLINE(performance-unnecessary-value-param)
 void watchSightings(std::function<void(const ServiceSighting&)>) {}
 

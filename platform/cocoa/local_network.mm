@@ -26,8 +26,8 @@ constexpr NSTimeInterval kBrowseDuration = 1;  // seconds
 
 + (void)ask:(NSNotification*)notification {
   [[NSNotificationCenter defaultCenter] removeObserver:self];
-  // macOS does not ask the user when the type is not listed in the information dictionary. It then
-  // refuses to browse.
+  // For a type that is not listed in the information dictionary, macOS refuses to browse and does
+  // not ask the user.
   NSArray* const types = [[NSBundle mainBundle] objectForInfoDictionaryKey:@"NSBonjourServices"];
   if ([types count] == 0) return;
   NSNetServiceBrowser* const browser = [[[NSNetServiceBrowser alloc] init] autorelease];

@@ -61,8 +61,8 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   [self showSelection];
 }
 
-// Widens the other columns to fit their texts. If the table is too narrow for all columns, narrows
-// the first one, which holds the names.
+// Widens all columns but the first one to fit their texts. If the table is too narrow for all
+// columns, narrows the first one, which holds the names.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;

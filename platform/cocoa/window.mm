@@ -23,8 +23,8 @@ void Window::orderFront() const {
 void Window::makeKeyAndOrderFront() const {
   NSWindow* const window = nativeOf<NSWindow>(*this);
   [window makeKeyAndOrderFront:nil];
-  // Since macOS 14 the system may refuse to activate the application. This brings the window in
-  // front of the active application's windows all the same.
+  // Since macOS 14 the system may refuse to activate the application. The window must appear in
+  // front of the active application's windows even then.
   if (![NSApp isActive]) [window orderFrontRegardless];
 }
 

@@ -36,8 +36,8 @@ bool hasEnded = false;  // main thread only
 
 void runMainLoop() {
   hasEnded = false;
-  // CFRunLoopRunInMode() returns at once while the loop has no sources or timers. It is called
-  // again until another thread has added one.
+  // CFRunLoopRunInMode() returns at once while the loop has no sources or timers. The function is
+  // therefore called again until another thread has added one.
   while (!hasEnded)
     CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);
 }

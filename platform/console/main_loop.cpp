@@ -25,8 +25,8 @@ struct MainLoop {
   bool ended = false;
 };
 
-// Returns the only main loop. It is never destroyed, because other threads may still post actions
-// while the process exits.
+// Returns the program's only main loop. It is never destroyed, because other threads may still post
+// actions while the process exits.
 MainLoop& mainLoop() {
   static MainLoop* const instance = std::make_unique<MainLoop>().release();
   return *instance;

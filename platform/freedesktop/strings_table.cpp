@@ -197,7 +197,7 @@ class Parser {
   std::string_view text_;
   std::string_view rest_;
   ParseProblem& problem_;
-  std::size_t lastEnd_ = 0;  ///< end of the last key or text; what is missing is reported there
+  std::size_t lastEnd_ = 0;  ///< end of the last key or text, where a missing mark is reported
 };
 
 }  // namespace

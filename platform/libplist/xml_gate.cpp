@@ -14,9 +14,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// The limit on the steps of libplist that take quadratic time. These are the steps for the keys of
-// a dictionary, because libplist hashes keys into a fixed number of chains, and for the entities in
-// a text, because libplist moves the rest of the text at each entity.
+// The limit on libplist's steps where their number grows quadratically. It does so with the keys of
+// a dictionary, because libplist hashes keys into a fixed number of chains, and with the entities
+// in a text, because libplist moves the rest of the text at each entity.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {

@@ -14,8 +14,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// Reads and discards all messages that wait on the socket. The error ENOBUFS tells that messages
-// did not fit into the socket's buffer, which also means that something has changed. Returns false
+// Reads and discards all messages that wait on the socket. The error ENOBUFS means that messages
+// did not fit into the socket's buffer, so something has changed in this case, too. Returns false
 // when the socket is unusable.
 bool drain(int socket) {
   for (;;) {

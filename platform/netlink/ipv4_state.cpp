@@ -26,7 +26,7 @@ namespace onramp::netlink {
 namespace {
 
 // The maximum number of times that a dump is requested. The kernel marks a dump as invalid when the
-// table changes meanwhile.
+// table changes during the dump.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;

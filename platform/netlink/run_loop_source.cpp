@@ -17,8 +17,8 @@ void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
   static std::vector<DynamicStoreSourceRef> sourcesOnLoop;
   sourcesOnLoop.push_back(source);
 
-  // Makes the main thread look for changes. The kernel may report several changes before the main
-  // thread gets to it; the main thread then looks only once.
+  // Makes the main thread look for changes. If the kernel reports more changes before the main
+  // thread has looked, the main thread still looks only once.
   const auto posted = std::make_shared<std::atomic<bool>>(false);
   store->changesArrived = [posted, weak = std::weak_ptr(store)] {
     if (posted->exchange(true)) return;

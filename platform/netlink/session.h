@@ -58,7 +58,7 @@ struct DynamicStore {
   netlink::Socket socket;
   DynamicStoreCallback callback;
   netlink::Selection notified;
-  Dictionary known;                      ///< the entries of `notified` when they were last read
+  Dictionary known;                      ///< the entries that `notified` selects, as last read
   std::function<void()> changesArrived;  ///< empty until the session's source is on the loop
   std::unique_ptr<netlink::ChangeWatch> watch;  ///< null until setNotificationKeys()
 

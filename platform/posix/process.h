@@ -9,8 +9,8 @@
 namespace onramp {
 
 enum class Session {
-  kOwn,     ///< a new one: the program survives the end of this program's terminal
-  kShared,  ///< this program's: the new program ends with the terminal
+  kOwn,     ///< a new session: the program survives the end of this one's terminal
+  kShared,  ///< this program's session: the program ends with the terminal
 };
 
 /// Starts the program at `executable` with all signals in their default state. Returns the ID of

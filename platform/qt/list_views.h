@@ -7,8 +7,8 @@
 
 namespace onramp::qt {
 
-/// Returns the minimum height of a list, which is enough for several rows, without its frame and
-/// header.
+/// Returns the minimum height of a list without its frame and header. It is enough for several
+/// rows.
 [[nodiscard]] int leastListHeight();
 
 /// Returns the minimum width of a column of names.

@@ -11,10 +11,9 @@
 namespace onramp::qt {
 
 // The properties of widgets that this front end adds to those of Qt.
-inline constexpr const char* kViewClass = "viewClass";  ///< text: the class of a page, on its root
+inline constexpr const char* kViewClass = "viewClass";  ///< text: a page's class, set on its root
 inline constexpr const char* kHeading = "heading";      ///< true for a label that is a title
-inline constexpr const char* kSpokenColumns =
-    "spokenColumns";  ///< texts: the columns that name a row
+inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: columns that name a row
 
 /// Returns the object behind `outlet` if it is of class `Class`, or null otherwise.
 template <typename Class>

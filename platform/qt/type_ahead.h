@@ -8,7 +8,7 @@ class QAbstractItemView;
 namespace onramp::qt {
 
 /// Finds a row of a list by what the user types. A row matches if any word of its text starts with
-/// that, ignoring case.
+/// the typed text, ignoring case.
 class TypeAhead {
  public:
   /// Call this when the user has typed `text`. Selects the first matching row, starting at the

@@ -5,8 +5,8 @@
 namespace onramp {
 
 /// Sets the version of macOS, such as "10.9.5", that is reported as the running system's. If
-/// `version` is empty or was never set, the version is that in the environment variable
-/// ONRAMP_SYSTEM_VERSION. Without this variable it is 10.15.7.
+/// `version` is empty or was never set, the environment variable ONRAMP_SYSTEM_VERSION gives the
+/// version. Without this variable the version is 10.15.7.
 void setSystemVersion(std::string version);
 
 }  // namespace onramp

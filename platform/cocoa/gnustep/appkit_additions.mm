@@ -17,8 +17,8 @@ BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
   return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
 }
 
-// Stands in for two setters that GNUstep lacks. They need do nothing, because GNUstep shows no
-// resize indicator on a window of fixed size and lets no window prevent termination.
+// Stands in for two setters that GNUstep lacks. They do nothing, because GNUstep shows no resize
+// indicator on a window of fixed size and lets no window prevent termination.
 void ignore(id, SEL, BOOL) {}
 
 }  // namespace
@@ -69,7 +69,7 @@ id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows all programs.
+// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows every program.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
