@@ -22,12 +22,13 @@ namespace onramp {
 class ChooseDeviceView;
 class ModelListView;
 
-/// Who started the wireless set-up tool: the wizard itself, after an empty search, or the user.
+/// Who started the wireless set-up tool: the wizard itself, after a search that found no device, or
+/// the user.
 enum class ToolStart { kAutomatic, kManual };
 
-/// The wizard's only controller. It owns the state, decides which page is shown and hands the
-/// user's choices to the installer package. Each group of operations has its own source file. Main
-/// thread only, except for waitDeviceSearchTask().
+/// The wizard's only controller. It owns the state, decides which page is shown and passes the
+/// user's choices to the installer package. Each group of functions has its own source file. All
+/// functions except waitDeviceSearchTask() must be called on the main thread.
 class OnrampOSXAppDelegate final : public ApplicationDelegate {
  public:
   OnrampOSXAppDelegate();
@@ -42,65 +43,70 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Sets up the window, its background picture and the application menu.
   void awakeFromNib() override;
 
-  /// Checks the system's version. A supported system loses the hand-off files of earlier runs; any
-  /// other gets an alert, and the application terminates.
+  /// Checks the system's version. On a supported system, deletes the hand-off files of earlier
+  /// runs. On any other, shows an alert and terminates the application.
   void applicationWillFinishLaunching() override;
 
-  /// Shows the first page, or opens the package and quits when no model on the medium is wireless.
+  /// Shows the first page, or opens the package and quits when no model on the medium supports
+  /// wireless.
   void applicationDidFinishLaunching() override;
   [[nodiscard]] bool applicationShouldTerminateAfterLastWindowClosed() override { return true; }
 
-  /// False while a search wait runs.
+  /// Returns false, which keeps the window open, while the wizard waits for a device search.
   [[nodiscard]] bool windowShouldClose(const Window& closing) override;
 
   /// Asks the application to terminate.
   void close();
 
-  // connection_types.cpp: what the medium's models have in common.
+  // connection_types.cpp: the connections that the medium's models support.
 
-  /// Whether any of the models connects by wireless network.
+  /// Whether any of `models` supports wireless.
   [[nodiscard]] static bool isSupportWiFi(const std::vector<std::string>& models);
 
-  /// The type for these two connections.
+  /// Returns the type of a model that supports USB if `usb` is set, and wired Ethernet if
+  /// `ethernet` is set.
   [[nodiscard]] static ConnectionType isIFType(bool usb, bool ethernet);
 
-  /// The type of the model with that name; kNeither without a name.
+  /// Returns the type of the model called `model`; kNeither without a name.
   [[nodiscard]] static ConnectionType isIFType(const std::optional<std::string>& model);
 
-  /// The type that all of the models share; kNeither when any two differ, or when there are none.
+  /// Returns the type that all of `models` share; kNeither when any two differ, or when there are
+  /// none.
   [[nodiscard]] static ConnectionType checkIF(const std::vector<std::string>& models);
 
   // navigation.cpp: pages and buttons.
 
-  /// Loads the page from the interface file `name`. Null when the file is missing or holds no view.
+  /// Loads the page from the interface file `name`. Returns null when the file is missing or holds
+  /// no view.
   [[nodiscard]] std::shared_ptr<Page> loadView(const std::string& name);
 
-  /// Removes the page shown, then shows `page`, or, when that is null, a new page loaded from the
-  /// interface file `name`. The window stays empty when that page cannot be loaded.
+  /// Removes the page that is shown, then shows `page`. When `page` is null, loads a new page from
+  /// the interface file `name` instead. The window stays empty when that page cannot be loaded.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
-  /// Shows a new model list, or a new connection page for `type`. The latter also tells the chooser
-  /// which models to look for: the chosen one, or all of the medium's.
+  /// Show a new model list, and a new connection page for `type`. showConnectionTypeView() also
+  /// tells the chooser, a ChooseDeviceView, which models to look for: the model that the user
+  /// chose, or else all models on the medium.
   void showModelListView();
   void showConnectionTypeView(ConnectionType type);
 
-  /// What it does depends on the page shown. Chooser: searches again. Connection page, unless the
-  /// wizard has started the set-up tool: shows the chooser with what the search listed, or starts
-  /// the tool when nothing was listed. Otherwise: shows the chooser and searches.
+  /// On the chooser, searches again. On the connection page, shows the chooser if it lists a
+  /// device, and otherwise starts the wireless set-up tool. On any other page, or once the wizard
+  /// has started the tool, shows the chooser and searches.
   void showChooseDeviceView();
 
-  /// Stretches the image over the window's background. Nothing changes without an image.
+  /// Shows `image` stretched over the window's background. Does nothing without an image.
   void setBackGroundView(const std::optional<Image>& image);
 
-  /// Set up the buttons for a page: which are visible, and their titles. Next is always visible. A
-  /// page with a way back has Cancel and Back beside it, any other has Cancel. The model list has
-  /// no way back, the connection page has one when a model was chosen, and the chooser unless the
-  /// wizard has started the set-up tool. Whether a button is enabled does not change.
+  /// Set the titles of a page's buttons and show or hide each button. Every page has Next and
+  /// Cancel. The connection page also has Back if the user chose a model, and the chooser has Back
+  /// unless the wizard has started the set-up tool. These functions neither enable nor disable a
+  /// button.
   void setModelListViewButton();
   void setConnentionTypeViewButton();
   void setChooseDeviceViewButton();
 
-  /// Each sets the text that a button's title is bound to, `titleKey`, to the localized "Cancel",
+  /// Each sets the title of the button that is bound to `titleKey` to the localized "Cancel",
   /// "Back" or "Next".
   void setCancelButton(std::string_view titleKey);
   void setBackButton(std::string_view titleKey);
@@ -108,8 +114,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   void performAction(std::string_view action) override;
 
-  // The buttons' actions. Next is the rightmost button, Back or Cancel the one to its left; the
-  // other two always quit, and so does every button while no page is shown.
+  // The buttons' actions. The rightmost button is Next. The button to its left is Back, or Cancel
+  // on a page without Back. The other two buttons always quit. Every button quits while no page is
+  // shown.
   void rightMostButtonClicked();
   void rightButtonClicked();
   void leftButtonClicked();
@@ -117,19 +124,19 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // system_check.cpp: does the medium support the running system?
 
-  /// The components of the running system's version; empty when it is unknown.
+  /// The components of the running system's version; empty when the version is unknown.
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
-  /// Compare the running system with the medium's maximum and minimum. Components that the system's
-  /// version lacks count as 0. All bounds are inclusive except the maximum's bug-fix release, which
-  /// is the first one that is not supported; an "x" there admits every bug-fix release.
+  /// Compare the running system's version with the medium's maximum and minimum, by the rules of
+  /// isNewerThan() and isOlderThan(). Unlike installationCheck(), they do not skip a bound whose
+  /// "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
-  /// Checks the maximum first, then the minimum, and skips a bound whose "Major" is 0.
+  /// Checks the maximum first, then the minimum. Skips a bound whose "Major" is 0.
   [[nodiscard]] SystemSupport installationCheck() const;
 
-  /// The minimum as text, such as "10.6.0".
+  /// The minimum version as text, such as "10.6.0".
   [[nodiscard]] std::string supportSystemMinString() const;
 
   /// Shows an alert that says why the system is not supported, and returns when the user has
@@ -138,70 +145,72 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // hand_off.cpp: the files that hand the choices to the installer package.
 
-  /// The medium's vendor name without its blanks; empty when the medium names none.
+  /// The medium's vendor name without its spaces; empty when the medium names no vendor.
   [[nodiscard]] static std::string setVenderName();
 
-  /// Paths of the package-options file and of the model file. Both functions create the file's
-  /// folder if it is missing; a new folder for the package options is open to everyone.
+  /// Return the paths of the package-options file and of the model file. Each creates the file's
+  /// folder if it is missing. Every user can write to a new folder for the package options.
   [[nodiscard]] static std::string InstallPKGInfoURL();
   [[nodiscard]] static std::string instmodelPlistURL();
 
   /// Builds and writes the package-options file.
   static void copyCDInfo();
 
-  /// The model file's wired form, which also serves USB.
+  /// Returns the model file's contents for a device that is connected by cable: USB or Ethernet.
   [[nodiscard]] static Dictionary instmodelPlistNotWiFi(const std::string& model);
 
-  /// The model file's wireless form for the device record `property`. The wired form for `model`
-  /// when the record is null or lacks a name or an address, or when the medium names no service
-  /// type.
+  /// Returns the model file's contents for a wireless device with the KSDevice record `property`.
+  /// Returns the contents for a wired `model` instead when there is no record, when the record
+  /// lacks a name or an address, or when the medium names no service type.
   [[nodiscard]] static Dictionary instmodelPlistWiFi(const std::optional<std::string>& model,
                                                      const std::optional<Dictionary>& property);
 
-  // launching.cpp: the package, the set-up tool, the support page.
+  // launching.cpp: starting the package, the set-up tool and the support page.
 
-  /// Writes the package-options file and opens the package; false when it could not be opened.
+  /// Writes the package-options file and opens the package. Returns false when the package could
+  /// not be opened.
   bool launchPackage();
 
-  /// Terminates the application after one second, which leaves the package time to open.
+  /// Terminates the application after one second, which gives the package time to open.
   void quitMe();
 
-  /// Hide the application, run the wireless set-up tool and act on its exit status. They return
-  /// before the tool starts. The first is for a search that found nothing: only then may the tool
-  /// lead back to the connection page.
+  /// Hide the application, run the wireless set-up tool and act on its exit status. Both functions
+  /// return before the tool starts. launchWLANToolAutomatically() is for a search that found no
+  /// device. Only then can the tool send the user back to the connection page.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 
-  /// The address of the support page for this medium and the user's language and country; nothing
-  /// when the medium's series code makes the address invalid.
+  /// Returns the URL of the support page for this medium and the user's language and country;
+  /// nothing when the medium's series code makes the URL invalid.
   [[nodiscard]] static std::optional<std::string> FAQ_URL();
 
-  /// Opens `url` in the user's browser; does nothing without one.
+  /// Opens `url` in the user's browser. Does nothing without a URL.
   static void openURL(const std::optional<std::string>& url);
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop until the chooser lists a device, for at most kMostPauses pauses, and
-  /// then ends the search. Meanwhile `page` shows its waiting state, and the user can neither click
-  /// a button nor close the window.
+  /// Waits in a modal loop until the chooser lists a device, for at most kMostPauses pauses of
+  /// length `pause`, and then ends the search. Meanwhile `page` shows its waiting state, and the
+  /// user can neither click a button nor close the window.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Makes the wait's pauses off the main thread: stops early once a device is listed, then ends
-  /// the modal loop.
+  /// Sleeps for up to kMostPauses pauses, stops early once a device is listed, then ends the modal
+  /// loop. Must not be called on the main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 
-  /// Waits as showProgress() does, with the chooser as the page. When no device is listed, says so
-  /// in a sheet and disables Next.
+  /// Waits as showProgress() does, with the chooser as the page. Afterwards enables Next if a
+  /// device is listed; otherwise disables Next and says in a sheet that no device was found.
   void showProgressAtChooseDeviceView(std::chrono::seconds pause);
 
-  /// The same with the pause that the notification carries under kWaitTime; without one, a wait of
-  /// no length.
+  /// Does the same with the pause that the notification carries under kWaitTime. Without that
+  /// value, the pauses have no length.
   void showProgressAtChooseDeviceViewByRefresh(const Notification& notification);
 
   /// Tells the user in a sheet that no device was found.
   void showListAlertSheet();
 
-  /// Opens the support page when the sheet's second button ended it (kAlertOtherReturn).
+  /// Opens the support page if the user dismissed the sheet with its second button,
+  /// kAlertOtherReturn.
   void didEndCloseSheet(int returnCode);
 
  private:
@@ -213,7 +222,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// The number of devices that the chooser lists. Callable from any thread.
   [[nodiscard]] std::size_t listedDevices() const;
 
-  /// The page shown if it is of that class, otherwise null.
+  /// Returns the page shown if it is a PageClass, otherwise null.
   template <typename PageClass>
   [[nodiscard]] PageClass* shownPage() const {
     return dynamic_cast<PageClass*>(mShownPage.get());
@@ -247,11 +256,11 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   ImageView mBackGroundView;
   KSInstallerInfo mKSInstallerInfo;
   Dictionary mKSCD;
-  std::optional<std::string> mChoosedModel;  ///< nothing as well when the model list was skipped
+  std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses from the model list
   std::uint32_t mContainedModelCount = 0;
-  bool mIsWLANTool = false;  ///< the wizard itself has started the set-up tool
+  bool mIsWLANTool = false;  ///< whether the wizard itself started the set-up tool
   std::shared_ptr<Page> mChooseDeviceViewController;
-  std::shared_ptr<Page> mShownPage;  ///< whose view is the one in `mainView`
+  std::shared_ptr<Page> mShownPage;  ///< the page whose view is in `mainView`
 };
 
 }  // namespace onramp

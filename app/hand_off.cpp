@@ -20,15 +20,15 @@ namespace fs = std::filesystem;
 constexpr const char* kModel = "Model";
 constexpr const char* kInterface = "Interface";
 
-// Such as "com.vendor.kind.plist".
+// Returns a name such as "com.vendor.kind.plist".
 std::string fileName(const std::string& vendor, const std::string& kind) {
   return "com." + lowercaseString(vendor) + "." + kind + ".plist";
 }
 
-// Other users' runs and the installer must be able to replace what lies in the folder. A path that
-// does not fit the buffer for it, which is as long as the longest path on macOS, is left alone.
+// Other users' runs and the installer must be able to replace the files in the folder. A folder
+// keeps its permissions if its path is longer than PATH_MAX allows on macOS.
 void openToEveryone(const std::string& folder) {
-  constexpr std::size_t kPathBufferSize = 1024;  // bytes, a closing zero included
+  constexpr std::size_t kPathBufferSize = 1024;  // bytes, including the terminating zero
   if (folder.size() >= kPathBufferSize) return;
   std::error_code ignored;
   fs::permissions(folder, fs::perms::all, ignored);
@@ -38,7 +38,8 @@ void setDefault(Dictionary& options, const char* key) {
   if (!options.find(key)) options = options.with(key, false);
 }
 
-// The application's entry for the user's country, if the medium offers the online service.
+// Returns the entry for the user's country in the application's SupportedKOL.plist. Returns false
+// when there is none, or when the medium does not offer the online service.
 Value onlineServiceOption(const Dictionary& options) {
   const Value* const offered = options.find("PKG_KestrelOnline");
   if (!offered || offered->boolean() == false) return false;

@@ -17,21 +17,21 @@ namespace onramp {
 
 namespace {
 
-// The maker's support site.
 constexpr std::string_view kSupportSite = "http://support.kestrel.example";
 
-// The package has this long to open before the application ends.
+// How long the package has to open before the application terminates.
 constexpr std::chrono::milliseconds kQuitDelay{1000};
 
-// The window has this long to disappear before the tool blocks the main thread.
+// How long the window has to disappear before the tool blocks the main thread.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
-// Exit statuses of the set-up tool. Any other status asks for a new search.
+// Exit statuses of the set-up tool. Any other status, or a tool that cannot be run, leads to a new
+// search.
 constexpr int kToolAsksToGoBack = 1;
 constexpr int kToolAsksToQuit = 2;
 
-// Whether `text` may stand in the path, query and fragment of an address (RFC 3986): it has only
-// characters that are allowed there, at most one "#", and a "%" only before two hexadecimal digits.
+// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). It may have only the
+// characters allowed there, at most one "#", and "%" only before two hexadecimal digits.
 bool isURLText(std::string_view text) {
   constexpr std::string_view kPunctuation = "-._~:/?#@!$&'()*+,;=";
   for (std::size_t at = 0; at < text.size(); ++at) {

@@ -14,7 +14,8 @@ namespace onramp {
 
 namespace {
 
-// The message texts are format strings, with "%%" for a percent sign. The sheet takes plain text.
+// The message texts are format strings, in which "%%" stands for a percent sign. The sheet shows
+// plain text, so "%%" is replaced by "%".
 std::string textOfFormat(std::string format) {
   for (std::size_t at = format.find("%%"); at != std::string::npos; at = format.find("%%", at)) {
     format.erase(at++, 1);
@@ -58,7 +59,8 @@ void OnrampOSXAppDelegate::waitDeviceSearchTask(std::chrono::seconds pause) cons
   abortModal();
 }
 
-// The same pauses for a system that has no thread left: the modal loop runs them as timers.
+// Makes the same pauses when the system cannot start another thread: each pause is a timer that
+// runs in the modal loop.
 void OnrampOSXAppDelegate::waitOnMainLoop(std::chrono::seconds pause, int pausesLeft) {
   scheduleTimer(pause, [this, pause, pausesLeft] {
     if (pausesLeft > 1 && listedDevices() == 0) {

@@ -15,7 +15,7 @@ struct RetitledItem {
   const char* key;
 };
 
-// The message tables on the media misspell the third key in the same way.
+// "APP_MENU_HIDEOHTERS" is misspelt here because the message tables on the media misspell it.
 constexpr RetitledItem kApplicationMenuItems[] = {{"About", "APP_MENU_ABOUT"},
                                                   {"Hide", "APP_MENU_HIDE"},
                                                   {"Hide Others", "APP_MENU_HIDEOHTERS"},

@@ -15,17 +15,17 @@ namespace onramp {
 /// them. All functions except arrangedCount() must be called on the main thread.
 class ArrayController {
  public:
-  /// Makes rearrange() sort the entries by their text under `key`, ascending, compared byte by
-  /// byte. An entry without such a text sorts as if the text were empty. Without a sort key entries
-  /// stay in the order in which they were added.
+  /// Sets the key that rearrange() sorts by. rearrange() compares the entries' texts under `key`
+  /// byte by byte, in ascending order. An entry without such a text sorts as if the text were
+  /// empty. Without a sort key, entries stay in the order in which they were added.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
-  /// Appends `entries`. The next rearrange() sorts them in. If the list was empty, the first of
-  /// them becomes the selected entry.
+  /// Appends `entries`. The new entries stay at the end of the list until the next rearrange(). If
+  /// the list was empty, the first new entry becomes selected.
   void addObjects(std::vector<Dictionary> entries);
 
-  /// Removes every entry equal to `entry`. If the selected entry is among them, the next entry that
-  /// stays becomes selected, or the last one when no entry follows.
+  /// Removes every entry equal to `entry`. If the selected entry is removed, the next remaining
+  /// entry becomes selected, or the last entry when no entry follows.
   void removeObject(const Dictionary& entry);
 
   void removeAllObjects();
@@ -42,22 +42,23 @@ class ArrayController {
   /// Selects the entry at `index`. An index past the end clears the selection.
   void setSelectionIndex(std::size_t index);
 
-  /// Selects the first entry equal to `entry`. Clears the selection when there is none.
+  /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
   void setSelectedObject(const Dictionary& entry);
 
-  /// Selects the entry at `index` because the user wants it. The table that is bound calls this.
+  /// Selects the entry at `index` on behalf of the user. The bound table calls this function.
   void choose(std::size_t index);
 
   /// Whether the user has chosen an entry since the last removeAllObjects().
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
-  /// The selected entry; nothing when the list is empty or the selection was cleared.
+  /// Return the index of the selected entry, and the entry itself. Both return nothing when no
+  /// entry is selected.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 
-  /// Sets what a table does about changes: `onChange` is called now and after every change of the
-  /// entries, `onSelect` after a change of the selection alone. They replace those of an earlier
-  /// call; empty functions unbind the table.
+  /// Binds a table to the list. `onChange` is called now and after every change of the entries.
+  /// `onSelect` is called when the selection is set without a change of the entries. A later call
+  /// replaces both functions. Empty functions unbind the table.
   void bind(std::function<void()> onChange, std::function<void()> onSelect);
 
  private:

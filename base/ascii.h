@@ -6,8 +6,9 @@
 
 namespace onramp {
 
-// ASCII characters as protocols and file formats define them, independent of the user's locale. The
-// functions of <cctype> depend on the locale and are undefined for negative characters.
+// These functions classify and convert ASCII characters independently of the user's locale, as
+// protocols and file formats require. The functions of <cctype> depend on the locale, and their
+// behaviour is undefined for negative characters.
 
 [[nodiscard]] constexpr bool isASCIIDigit(char c) {
   return c >= '0' && c <= '9';

@@ -8,9 +8,10 @@
 
 namespace onramp {
 
-/// Reads bytes that come from the network or the medium, from front to back and never past their
-/// end. A read that does not fit returns nothing and does not move the reader. A copy
-/// moves separately, which allows looking ahead. The bytes must outlive the reader and all copies.
+/// Reads untrusted bytes, such as those from the network or the medium, from front to back and
+/// never past their end. A read of more bytes than remain returns nothing and does not move the
+/// reader. A copy of a reader moves independently, so it can be used to look ahead. The bytes must
+/// outlive the reader and all its copies.
 class ByteReader {
  public:
   explicit ByteReader(std::span<const std::byte> bytes) : rest_(bytes) {}
@@ -28,7 +29,7 @@ class ByteReader {
     return value;
   }
 
-  /// Reads `count` bytes.
+  /// Reads `count` bytes. The result is a view of the input.
   [[nodiscard]] std::optional<std::span<const std::byte>> take(std::uint64_t count) {
     if (count > rest_.size()) return std::nullopt;
     const auto taken = rest_.first(static_cast<std::size_t>(count));
@@ -36,14 +37,15 @@ class ByteReader {
     return taken;
   }
 
-  /// Reads `count` bytes as characters.
+  /// Reads `count` bytes as a text. The result is a view of the input.
   [[nodiscard]] std::optional<std::string_view> text(std::uint64_t count) {
     const auto taken = take(count);
     if (!taken) return std::nullopt;
     return std::string_view(reinterpret_cast<const char*>(taken->data()), taken->size());
   }
 
-  /// Reads an unsigned big-endian number of `size` bytes; nothing also when `size` is above 8.
+  /// Reads an unsigned big-endian number of `size` bytes. Also returns nothing when `size` is above
+  /// 8.
   [[nodiscard]] std::optional<std::uint64_t> number(std::size_t size) {
     if (size > sizeof(std::uint64_t)) return std::nullopt;
     const auto bytes = take(size);

@@ -20,7 +20,7 @@ struct Notification {
 };
 
 /// Delivers every posted notification to the observers of its name, synchronously and in the order
-/// in which they were added. All functions must be called on the main thread.
+/// in which the observers were added. All functions must be called on the main thread.
 class NotificationCenter {
  public:
   using Handler = std::function<void(const Notification&)>;
@@ -28,12 +28,12 @@ class NotificationCenter {
   /// The centre that the whole process shares.
   [[nodiscard]] static NotificationCenter& defaultCenter();
 
-  /// Calls `handler` for every notification `name` from any poster, until `observer` is removed.
-  /// `observer` only identifies the observation and is never dereferenced.
+  /// Calls `handler` for every notification called `name`, whoever posts it, until `observer` is
+  /// removed. `observer` only identifies the observation and is never dereferenced.
   void addObserver(const void* observer, std::string_view name, Handler handler);
 
-  /// Removes all observations of `observer`. An observer removed during a delivery that has not
-  /// reached it yet is not called.
+  /// Removes all observations of `observer`. An observer that is removed before a delivery reaches
+  /// it is not called.
   void removeObserver(const void* observer);
 
   /// Calls the observers of the notification's name. Handlers may add and remove observers and post

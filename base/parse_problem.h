@@ -6,10 +6,11 @@
 
 namespace onramp {
 
-/// Why bytes cannot be read, and where. A reader notes the first one that it meets.
+/// The reason why a file or a text cannot be parsed, and the place of the error. Only the first
+/// problem that is noted is kept.
 struct ParseProblem {
   std::string reason;      ///< a phrase such as "\";\" expected"; empty when nothing is wrong
-  std::size_t offset = 0;  ///< in bytes of the file, or for a text of its UTF-8 form
+  std::size_t offset = 0;  ///< in bytes from the start of the file, or of the text in UTF-8
 
   void note(std::string why, std::size_t where) {
     if (reason.empty()) *this = {std::move(why), where};

@@ -7,7 +7,7 @@
 
 namespace onramp {
 
-/// Replaces a character that cannot be decoded (U+FFFD).
+/// The replacement character, U+FFFD. It stands for a character that cannot be decoded.
 inline constexpr char32_t kReplacementCharacter = 0xFFFD;
 
 /// Appends `character` to `text` in UTF-8. Appends the replacement character for a surrogate or a
@@ -37,9 +37,10 @@ std::optional<char32_t> takeUTF8(std::string_view& text);
   return 0x10000 + ((lead - 0xD800) << 10) + (trail - 0xDC00);
 }
 
-/// Converts the contents of a text file in UTF-8 or UTF-16 to UTF-8 without a byte-order mark.
-/// Files without a mark are taken for UTF-16 when one of the first two bytes is zero: the files
-/// read here begin with an ASCII character. Returns nothing when the bytes are malformed.
+/// Converts the contents of a text file in UTF-8 or UTF-16 to UTF-8 without a byte-order mark. A
+/// file without a byte-order mark is read as UTF-16 when one of its first two bytes is zero. This
+/// is safe because all files that the program reads begin with an ASCII character. Returns nothing
+/// when the bytes are malformed.
 [[nodiscard]] std::optional<std::string> decodedText(std::string_view bytes);
 
 }  // namespace onramp

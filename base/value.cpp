@@ -9,7 +9,7 @@ namespace onramp {
 namespace {
 
 std::int64_t saturated(double number) {
-  constexpr double kLimit = 9223372036854775808.0;  // 2^63, the first value past the range
+  constexpr double kLimit = 9223372036854775808.0;  // 2^63, the first value above the range
   if (std::isnan(number)) return 0;
   if (number >= kLimit) return std::numeric_limits<std::int64_t>::max();
   if (number < -kLimit) return std::numeric_limits<std::int64_t>::min();

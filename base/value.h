@@ -27,17 +27,15 @@ struct Date {
 
 using Array = std::vector<Value>;
 
-/// An immutable table of values by text key. Copies share their contents, so passing one by value
-/// is cheap.
+/// An immutable table of values, each under a text key. Copies share their contents, so passing a
+/// dictionary by value is cheap.
 class Dictionary {
  public:
-  /// A key and its value.
   struct Pair;
 
-  /// The empty dictionary.
   Dictionary() = default;
 
-  /// If several pairs have the same key, the first one counts.
+  /// If several pairs have the same key, only the first pair is kept.
   Dictionary(std::initializer_list<Pair> pairs);
   explicit Dictionary(std::vector<Pair> pairs);
 
@@ -45,20 +43,21 @@ class Dictionary {
   /// dictionary or a copy of it exists.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
-  /// Return the value under `key` if it is of the function's kind, otherwise nothing or null. The
-  /// array pointer is valid while this dictionary or a copy of it exists.
+  /// Return the value under `key` if it is of the type that the function is named after. Otherwise
+  /// array() returns null and the other two return nothing. The array pointer is valid while this
+  /// dictionary or a copy of it exists.
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;
 
-  /// Whether the number or boolean under `key` is other than zero; nothing when the value is absent
-  /// or of another kind.
+  /// Whether the number or boolean under `key` is not zero; nothing when the value is absent or of
+  /// another type.
   [[nodiscard]] std::optional<bool> boolean(std::string_view key) const;
 
   /// Returns the value under `key` converted by Value::integerValue(); 0 when it is absent.
   [[nodiscard]] std::int64_t integerValue(std::string_view key) const;
 
-  /// Returns a copy that has `value` under `key`, in place of an earlier value if there was one.
+  /// Returns a copy that has `value` under `key`, replacing the earlier value if there was one.
   [[nodiscard]] Dictionary with(std::string_view key, Value value) const;
 
   [[nodiscard]] std::size_t size() const;
@@ -77,7 +76,8 @@ class Dictionary {
 /// One property-list value.
 class Value {
  public:
-  /// An integer is stored as signed if it fits. The unsigned kind holds only integers from 2^63 on.
+  /// An integer is stored as signed if it fits. The unsigned type holds only integers of 2^63 and
+  /// above.
   using Storage = std::variant<bool, std::int64_t, std::uint64_t, double, std::string, Data, Date,
                                Array, Dictionary>;
 
@@ -95,20 +95,20 @@ class Value {
 
   [[nodiscard]] const Storage& storage() const { return storage_; }
 
-  /// Returns the content if it is of type `Kind`, otherwise null. The pointer is valid as long as
-  /// the value.
+  /// Returns the content if it is of type `Kind`, otherwise null. The pointer is valid until the
+  /// value is assigned to or destroyed.
   template <typename Kind>
   [[nodiscard]] const Kind* as() const {
     return std::get_if<Kind>(&storage_);
   }
 
-  /// Whether a number or boolean is other than zero; nothing for all other kinds.
+  /// Whether a number or boolean is not zero; nothing for all other types.
   [[nodiscard]] std::optional<bool> boolean() const;
 
-  /// Converts the value to an integer. A real number is cut towards zero; NaN gives 0. A string
-  /// gives the decimal integer that it begins with, after white space and one sign; 0 without one.
-  /// A result outside the signed 64-bit range gives the nearest end of the range. All other kinds
-  /// give 0.
+  /// Converts the value to an integer. A boolean gives 0 or 1. A real number is truncated towards
+  /// zero; NaN gives 0. A string gives the decimal integer that it begins with, or 0 when it does
+  /// not begin with one. White space and one sign may precede the digits. A number outside the
+  /// signed 64-bit range gives the nearest end of the range. All other types give 0.
   [[nodiscard]] std::int64_t integerValue() const;
 
   friend bool operator==(const Value& a, const Value& b) { return a.storage_ == b.storage_; }

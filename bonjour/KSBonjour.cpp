@@ -27,7 +27,8 @@ void postResolved(const NetServiceRef& service) {
   post(kResolvedNotification, {{std::string(kServiceInfo), service}});
 }
 
-// The one table that all browses and resolves of the process share. Each new browser fills it.
+// Returns the callbacks of all browses and resolves of the process. Every new browser sets them to
+// the same functions.
 ServiceClientCallbacks& clientCallbacks() {
   static ServiceClientCallbacks callbacks;
   return callbacks;
@@ -62,7 +63,7 @@ void KSBonjour::removeKSBonjourObserver(const KSBonjourObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// Observers may remove themselves meanwhile, so each round uses a copy of the array.
+// An observer may remove itself when it is called, so each loop uses a copy of the array.
 
 void KSBonjour::notifyAddToKSBonjourObserver(const NetServiceRef& service) const {
   for (const auto& observer : std::vector(_aryObserver))
@@ -124,13 +125,13 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   }
   const auto stored = _services->find(*key);
   Entry& entry = stored->second;
-  // A newer duplicate may have replaced the notification's own service.
+  // The table may hold a newer object for the same service than the notification does.
   const NetServiceRef storedService = entry.service;
   const bool wasValid = std::exchange(entry.isValid, false);
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
-    // Only the first removal since the last resolve counts, so an entry that was reported three
-    // times or more survives removals in quick succession. This is meant.
+    // Only the first removal since the last resolve lowers the count. So an entry that was added
+    // three times or more survives removals in quick succession. This is intended.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {
@@ -153,7 +154,8 @@ std::string KSBonjour::keyForService(const std::string& name, const std::string&
   return name + '.' + type + domain;
 }
 
-// The key of a service that belongs into this browser's table. Nothing for any other.
+// Returns the key under which `service` belongs in this browser's table. Returns nothing when the
+// service is of another type, or when the browser is stopped.
 std::optional<std::string> KSBonjour::ownKeyOf(const NetServiceRef& service) const {
   if (!service || !_services) return std::nullopt;
   const auto name = service->name();

@@ -13,8 +13,9 @@
 namespace onramp {
 
 // The notifications that browsers exchange on the default notification centre. They are posted
-// without a sender. All carry a NetServiceRef under kServiceInfo. Add and remove carry the browse
-// flags, an unsigned long, under kAddFlagInfo and kRemoveFlagsInfo.
+// without an object. All carry a NetServiceRef under kServiceInfo. kAddNotification and
+// kRemoveNotification also carry the browse flags, an unsigned long: the first under kAddFlagInfo,
+// the second under kRemoveFlagsInfo.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
 inline constexpr std::string_view kRemoveNotification = "removeNotificationInternal";
 inline constexpr std::string_view kResolvedNotification = "resolveNotificationInternal";
@@ -22,8 +23,8 @@ inline constexpr std::string_view kServiceInfo = "service";
 inline constexpr std::string_view kAddFlagInfo = "flag";
 inline constexpr std::string_view kRemoveFlagsInfo = "flags";
 
-/// Receives what browsers find, whatever its type, because every started browser forwards the
-/// events of all of them.
+/// Receives the events of a browser. A running browser also forwards the events of all other
+/// browsers, so the services may be of any type.
 class KSBonjourObserver {
  public:
   KSBonjourObserver() = default;
@@ -33,19 +34,21 @@ class KSBonjourObserver {
 
   /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service is gone, after the table has been updated. An entry that is still
-  /// counted stays there. `service` is the table's object, or null when the browser's table has
-  /// none.
+  /// Called when a service is gone, after the browser's table has been updated. A service that was
+  /// added more than once may still be in it. `service` is the table's object, or null when the
+  /// table did not contain the service.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service's addresses and texts are known, after the table has been updated.
+  /// Called when a service's addresses and TXT record are known, after the browser's table has been
+  /// updated.
   virtual void resolvedBonjourService(const NetServiceRef& service) = 0;
 };
 
-/// Browses for services of one type, resolves each one found and keeps a table of them. A service
-/// that is reported several times is one entry, which counts how often. Main thread only.
+/// Browses for services of one type, resolves each service found and keeps a table of them. A
+/// service that is reported several times has one entry, which counts the reports. All functions
+/// must be called on the main thread.
 class KSBonjour {
  public:
-  /// Creates an idle browser for `type`. One without a type never starts.
+  /// Creates an idle browser for `type`. A browser without a type never starts.
   [[nodiscard]] static std::shared_ptr<KSBonjour> initWithType(std::optional<std::string> type);
 
   KSBonjour(const KSBonjour&) = delete;
@@ -59,13 +62,14 @@ class KSBonjour {
   void addKSBonjourObserver(std::shared_ptr<KSBonjourObserver> observer);
   void removeKSBonjourObserver(const KSBonjourObserver* observer);
 
-  // Each calls the operation of that name on every observer.
+  // Each calls the corresponding function of every observer.
   void notifyAddToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyRemoveToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyResolvedToKSBonjourObserver(const NetServiceRef& service) const;
 
-  /// Starts with an empty table, after stopping if it runs. A browse that cannot start leaves the
-  /// browser idle.
+  /// Starts browsing with an empty table. Stops first if the browser is running. When the browse
+  /// cannot start, the browser finds nothing itself but still forwards the events of other
+  /// browsers.
   void startBrowsing();
 
   /// Ends the browse and forgets the table without calling observers.
@@ -80,7 +84,8 @@ class KSBonjour {
   [[nodiscard]] static std::string keyForService(const std::string& name, const std::string& type,
                                                  const std::string& domain);
 
-  // What the table says: false or null for what is not in it, and for a null text.
+  // Look up a service in the table. They return false or null when the service is not in the table
+  // or when an argument is nothing.
   [[nodiscard]] bool isServiceContained(const std::optional<std::string>& name,
                                         const std::optional<std::string>& type,
                                         const std::optional<std::string>& domain) const;
@@ -92,9 +97,9 @@ class KSBonjour {
  private:
   struct Entry {
     NetServiceRef service;
-    int referenceCount = 0;    ///< adds outstanding for the key
-    bool didResolved = false;  ///< a resolve has completed
-    bool isValid = true;       ///< false from a removal until the next resolve has completed
+    int referenceCount = 0;    ///< additions, less the removals that counted
+    bool didResolved = false;  ///< whether the service is resolved
+    bool isValid = true;       ///< false from a removal until the next addition or resolve
   };
   using Table = std::map<std::string, Entry>;
 

@@ -43,7 +43,7 @@ void KSBonjourSearch::removeKSDeviceObserver(const KSDeviceObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// Observers may remove themselves meanwhile, so each round uses a copy of the array.
+// An observer may remove itself when it is called, so each loop uses a copy of the array.
 
 void KSBonjourSearch::notifyAddToKSDeviceObserver(const Dictionary& device) const {
   for (const auto& observer : std::vector(_aryObserver))
@@ -69,10 +69,10 @@ void KSBonjourSearch::startBrowsing() {
   _aryKSBonjour.push_back(browser);
 }
 
-// Stopped browsers stay in the array and answer every question with false.
+// Stopped browsers stay in the array. They have no table, so no service is found in them.
 void KSBonjourSearch::stopBrowsing() {
   NotificationCenter::defaultCenter().removeObserver(this);
-  // The browsers may be this object's last owners.
+  // The browsers may hold the last references to this object.
   const auto self = weak_from_this().lock();
   for (const auto& browser : _aryKSBonjour) {
     browser->stopBrowsing();
@@ -101,7 +101,7 @@ void KSBonjourSearch::resolvedBonjourService(const NetServiceRef& service) {
     return b->isServiceContained(id.name, id.type, id.domain) &&
            b->didServiceResolved(id.name, id.type, id.domain);
   });
-  // The browser that reports has stored the entry before, so this is usually an update.
+  // The reporting browser has already stored the entry, so this is usually an update.
   if (known) {
     notifyUpdateToKSDeviceObserver(record);
   } else {

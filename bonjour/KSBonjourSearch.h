@@ -18,17 +18,19 @@ class KSDeviceObserver {
   KSDeviceObserver& operator=(const KSDeviceObserver&) = delete;
   virtual ~KSDeviceObserver() = default;
 
-  /// Called when a device that is in no browser's table is resolved.
+  /// Called when a device is resolved that is in no browser's table.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is resolved, or is reported gone while a browser still counts it. A new
-  /// device is usually announced this way, so observers add a device that they do not know.
+  /// Called when a device is resolved, or when it is reported gone but is still in a browser's
+  /// table. A new device is usually announced by this function, so an observer must add a device
+  /// that it does not know.
   virtual void updateKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is gone.
+  /// Called when a device is gone from the tables of all browsers.
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
-/// Searches the network for the medium's devices and reports each one when it is resolved. While it
-/// runs, it and its browsers own each other; stopBrowsing() ends that. Main thread only.
+/// Searches the network for devices of the medium's service type and reports each device when it is
+/// resolved. A running search and its browsers keep each other alive, so stopBrowsing() must be
+/// called before the search can be destroyed. All functions must be called on the main thread.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:
@@ -43,19 +45,20 @@ class KSBonjourSearch final : public KSBonjourObserver,
   void addKSDeviceObserver(std::shared_ptr<KSDeviceObserver> observer);
   void removeKSDeviceObserver(const KSDeviceObserver* observer);
 
-  // Each calls the function that it is named after on every observer.
+  // Each calls the corresponding function of every observer.
   void notifyAddToKSDeviceObserver(const Dictionary& device) const;
   void notifyUpdateToKSDeviceObserver(const Dictionary& device) const;
   void notifyRemoveToKSDeviceObserver(const Dictionary& device) const;
 
-  /// Stops a search that is running, then searches for the service type that the medium names.
+  /// Stops the running search, if there is one, then searches for the service type that the medium
+  /// names.
   void startBrowsing();
 
   /// Ends the search without calling observers.
   void stopBrowsing();
 
-  /// The types under which the browsers know the instance with that name and domain, in the
-  /// browsers' order.
+  /// Returns the service types for which a browser's table has the instance with that name and
+  /// domain, in the order of the browsers.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

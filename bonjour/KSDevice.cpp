@@ -9,8 +9,8 @@ namespace onramp {
 
 namespace {
 
-// An empty text without a service, but nothing for what a service does not say: only the first
-// counts as part of a model name.
+// Returns an empty text for a null service, but nothing when a service lacks the text. So the model
+// name of a null service is one space, but it is empty when a service lacks a part of it.
 std::optional<std::string> textOf(const NetServiceRef& service,
                                   std::optional<std::string> (*read)(const NetServiceRef&)) {
   return service ? read(service) : "";

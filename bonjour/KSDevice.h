@@ -8,8 +8,8 @@
 
 namespace onramp {
 
-/// What the wizard knows about a device on the network: a flat record made from one service.
-/// Unknown texts and lists are empty.
+/// Makes device records. A record is a dictionary that holds what one network service says about
+/// its device. Unknown texts and lists are empty.
 class KSDevice {
  public:
   KSDevice() = delete;
@@ -25,8 +25,8 @@ class KSDevice {
   static constexpr std::string_view kDeviceURI = "device URI";           ///< string
   static constexpr std::string_view kIPAddressList = "IP address list";  ///< array of strings
 
-  /// Makes the record of `service`, which is known under the service types `types`. `service` may
-  /// be null, and `types` may be nothing.
+  /// Makes the record of `service`, whose instance was found under the service types `types`.
+  /// `service` may be null, and `types` may be nothing.
   [[nodiscard]] static Dictionary initWithService(const NetServiceRef& service,
                                                   const std::optional<Array>& types);
 };

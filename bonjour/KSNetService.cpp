@@ -9,7 +9,8 @@ namespace onramp {
 
 namespace {
 
-// The place of the family in a socket address of the BSD layout, and that of an IPv4 address.
+// The offsets of the address family and of an IPv4 address in the socket addresses that
+// NetService::addressing() returns.
 constexpr std::size_t kFamilyOffset = 1;
 constexpr std::size_t kIPv4Offset = 4;
 constexpr std::size_t kIPv4Size = 4;

@@ -6,17 +6,17 @@
 
 namespace onramp {
 
-/// The service types whose announcements name the device's maker and model.
+/// The service types whose TXT records name the device's maker and model.
 inline constexpr std::array<std::string_view, 4> kIdentifyingTypes{
     "_pdl-datastream._tcp.", "_printer._tcp.", "_ipp._tcp.", "_scanner._tcp."};
 
-/// The keys in a service's TXT record that name them.
+/// The keys of the maker and of the model in a service's TXT record.
 struct IdentityKeys {
   std::string_view manufacturer;
   std::string_view model;
 };
 
-/// The keys of a service type; nothing for a type that is not one of kIdentifyingTypes.
+/// Returns the keys for a service type, or nothing for a type that is not one of kIdentifyingTypes.
 [[nodiscard]] constexpr std::optional<IdentityKeys> identityKeysOf(std::string_view type) {
   for (const std::string_view known : kIdentifyingTypes) {
     if (type != known) continue;

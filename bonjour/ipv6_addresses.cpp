@@ -9,7 +9,8 @@ namespace onramp {
 
 namespace {
 
-// Where a socket address of the BSD layout has its family and an IPv6 one its address.
+// The offsets of the address family and of an IPv6 address in the socket addresses that
+// NetService::addressing() returns.
 constexpr std::size_t kFamilyPlace = 1;
 constexpr std::size_t kIPv6Place = 8;
 constexpr std::size_t kIPv6Length = 16;

@@ -7,8 +7,9 @@
 
 namespace onramp {
 
-/// Returns the resolved service's IPv6 addresses as texts, in the order of its addressing; none for
-/// a null service. The wizard uses IPv4 addresses only.
+/// Returns the resolved service's IPv6 addresses as texts, in the order of
+/// NetService::addressing(). Returns no addresses for a null service. The wizard itself uses IPv4
+/// addresses only.
 [[nodiscard]] std::vector<std::string> ipv6AddressesOf(const NetServiceRef& service);
 
 }  // namespace onramp

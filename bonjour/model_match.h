@@ -7,11 +7,11 @@
 
 namespace onramp {
 
-/// Returns the text that stands for the device's model on the medium: the record's USB manufacturer
-/// and USB model with one blank between them, whether or not they are empty.
+/// Returns the name that the medium uses for the model of a device record: the USB manufacturer and
+/// the USB model, joined by one space even if they are empty.
 [[nodiscard]] std::string modelTextOf(const Dictionary& device);
 
-/// Whether the device is one of `models`. Capitals and blanks count.
+/// Whether the device's model is one of `models`. Case and spaces must match.
 [[nodiscard]] bool isOneOf(const std::vector<std::string>& models, const Dictionary& device);
 
 }  // namespace onramp

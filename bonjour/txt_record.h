@@ -12,12 +12,13 @@ namespace onramp {
 /// The attributes of a DNS-SD TXT record (RFC 6763 section 6).
 class TxtRecord {
  public:
-  /// Reads the record's data as on the wire: strings, each after its length byte. Returns nothing
-  /// when a string runs past the end of the data. Skips a string without a key.
+  /// Parses the record's data in wire format: a sequence of strings, each preceded by a length
+  /// byte. Returns nothing when a string runs past the end of the data. Skips strings without a
+  /// key.
   [[nodiscard]] static std::optional<TxtRecord> parse(std::span<const std::byte> data);
 
-  /// The value of the first attribute called `key`, ignoring case. It is complete even if it
-  /// contains zero bytes. Nothing when there is no such attribute, or when it has no "=".
+  /// Returns the value of the first attribute called `key`, ignoring case. The value may contain
+  /// zero bytes. Returns nothing when there is no such attribute, or when the attribute has no "=".
   [[nodiscard]] std::optional<std::string> value(std::string_view key) const;
 
  private:

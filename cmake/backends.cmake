@@ -1,4 +1,5 @@
-# ONRAMP_BACKENDS: the backends that the program is linked with, one for each part of the seam.
+# Sets ONRAMP_BACKENDS to the backends that the wizard is linked with, one for each part of the seam (the
+# headers in platform/).
 
 if(APPLE)
   set(ONRAMP_UI cocoa)
@@ -9,7 +10,7 @@ if(APPLE)
   set(ONRAMP_BACKENDS onramp_cocoa onramp_cfnetwork onramp_coreservices onramp_systemconfiguration
     onramp_posix onramp_sockets)
 else()
-  set(ONRAMP_UI qt CACHE STRING "The front end: qt, or cocoa to try the one of macOS on GNUstep")
+  set(ONRAMP_UI qt CACHE STRING "The front end: qt, or cocoa to try the front end for macOS on GNUstep")
   set_property(CACHE ONRAMP_UI PROPERTY STRINGS qt cocoa)
   if(ONRAMP_UI STREQUAL "qt")
     set(ONRAMP_BACKENDS onramp_qt onramp_avahi onramp_freedesktop onramp_xdg_open onramp_libplist onramp_standin

@@ -1,4 +1,4 @@
-# Common options, and a function for each kind of target.
+# Common compiler options, and a function for each kind of target.
 
 add_library(onramp_options INTERFACE)
 target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})
@@ -6,7 +6,7 @@ target_compile_options(onramp_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
   # GCC 12 mistakes string concatenation in the standard library for an overlapping copy.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
-  # The C functions for network services and the system's version are deprecated without successors.
+  # macOS deprecates the C functions for network services and for its version without C successors.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
 # These options are global, so that every object file is instrumented, including code from
@@ -30,9 +30,9 @@ function(onramp_library name)
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 
-# onramp_backend(NAME SOURCES… [LINK libraries…]): an implementation of the seam or a part of it. It is
-# an object library, because the rooms' libraries refer to it and come after it on the linker's
-# command line, where the linker would ignore a static library.
+# onramp_backend(NAME SOURCES… [LINK libraries…]): an implementation of the seam or of a part of it. It
+# is an object library: the rooms' libraries need its symbols but follow it on the linker's command
+# line, and the linker would take nothing from a static library that precedes them.
 function(onramp_backend name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})
@@ -52,8 +52,8 @@ function(onramp_test name)
 endfunction()
 
 # onramp_namespace_test(NAME …): as onramp_test, but the test runs as root in a new network namespace
-# and is skipped where none can be made. CMake calls the program that ctest runs a test through an
-# emulator. SOURCE_FOLDER is defined as the folder of the test's scripts.
+# and is skipped where none can be created. ctest runs it through tests/in_namespace, by CMake's
+# setting for an emulator. SOURCE_FOLDER is defined as the folder of the test's sources.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})
@@ -65,8 +65,8 @@ function(onramp_namespace_test name)
 endfunction()
 
 # onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]): a libFuzzer program. ctest runs it
-# briefly on the seeds in the folder corpus/NAME, or corpus/CORPUS, beside its source. Inputs that it
-# finds go to the build folder.
+# briefly on the seeds in the folder corpus/NAME, or corpus/CORPUS, beside its source. New inputs go to
+# the build folder.
 function(onramp_fuzz name)
   if(NOT ONRAMP_FUZZ)
     return()

@@ -5,24 +5,25 @@
 
 namespace onramp {
 
-/// The texts that the user sees, from the message bundle on the medium.
+/// The texts that the user sees. They come from the message bundle on the medium.
 namespace CommonMessage {
 
+/// Returns medium::fullPath(relativePath).
 [[nodiscard]] std::string convertRelativePathToFullPath(
     const std::optional<std::string>& relativePath);
 
-/// The text of `key` in the user's language, or `value` when the medium has no message bundle or
-/// the table lacks the key. Without a `table` the default one is used. Every call opens the bundle
-/// again.
+/// Returns the text of `key` in the user's language, or `value` when the medium has no message
+/// bundle or the table lacks the key. Without a `table`, the bundle's default table is used. Every
+/// call opens the bundle again.
 [[nodiscard]] std::string localizedStringForKey(const std::string& key, const std::string& value,
                                                 const std::optional<std::string>& table);
 
 }  // namespace CommonMessage
 
-/// The text of `key`, or the key itself when the medium has no text for it.
+/// Returns the text of `key`, or the key itself when the medium has no text for it.
 [[nodiscard]] std::string localized(const std::string& key);
 
-/// The text of `key`, or `fallback` when the medium has no text for it.
+/// Returns the text of `key`, or `fallback` when the medium has no text for it.
 [[nodiscard]] std::string localized(const std::string& key, const std::string& fallback);
 
 }  // namespace onramp

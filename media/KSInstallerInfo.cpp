@@ -10,7 +10,8 @@ namespace onramp {
 namespace {
 
 std::optional<std::string> packageName(const Dictionary& pkg) {
-  // An entry of another type names no package either, but it still takes precedence.
+  // A "PkgName" that is not a string names no package, but it still takes precedence over the
+  // version keys.
   if (pkg.find("PkgName")) return pkg.string("PkgName");
   const auto key = packageKey(gestaltSystemVersion().value_or(0));
   return key ? pkg.string(*key) : std::nullopt;

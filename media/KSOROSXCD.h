@@ -9,9 +9,8 @@
 
 namespace onramp {
 
-/// The medium description: the models that the medium serves, the packages that it holds, and the
-/// service type that its devices are found by. Every call reads the medium again and returns an
-/// equal record.
+/// Makes a record of the medium: the models that it serves, the packages that it holds, and the
+/// service type by which its devices are found.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.
@@ -22,20 +21,22 @@ inline constexpr std::string_view kKSCSeriesCode = "KSC Series Code";           
 inline constexpr std::string_view kBonjourServiceType =
     "bonjour service type for browsing";  ///< string
 
-/// The record of the medium that the application lies on.
+/// Returns the record of the medium that the application is on. Every call reads the medium again.
 [[nodiscard]] Dictionary initWithCDInfo();
 
-/// The record for a medium description and a medium resource dictionary. Whatever is absent or of
-/// the wrong type takes its default. Without a description the resource dictionary is not read.
+/// Returns the record for the medium description `info` and the medium resource dictionary
+/// `CDCommonInfo`. A value that is absent or of the wrong type gets its default: no models, true or
+/// an empty text. Without a description, all values get their defaults.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
+/// Returns medium::fullPath(relativePath).
 [[nodiscard]] std::string convertRelativePathToFullPath(
     const std::optional<std::string>& relativePath);
 
 }  // namespace KSOROSXCD
 
-/// The record's "contained models" as texts, in the record's order.
+/// Returns the record's "contained models" as texts, in the record's order.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

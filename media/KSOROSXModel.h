@@ -9,8 +9,8 @@
 namespace onramp {
 
 /// What the medium says about one model: its connections and its support-centre identifier. To
-/// query many models, load modelInfo() once and pass it in; otherwise every call reads the medium
-/// again.
+/// query many models, load modelInfo() once and pass it to initWithName(), which otherwise reads
+/// the medium on every call.
 namespace KSOROSXModel {
 
 // Keys of the record.
@@ -20,20 +20,21 @@ inline constexpr std::string_view kSupportUSB = "support USB";            ///< b
 inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< boolean
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
-/// The model information of the medium that the application lies on; nothing when it
-/// cannot be read.
+/// Returns the model information of the medium that the application is on; nothing when it cannot
+/// be read.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 
-/// The record of the model `name`.
+/// Returns the record of the model `name` according to the medium's model information.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
-/// The record of the model `name` according to `modelInfoPlist`. A model that is not listed there
-/// connects by USB only. The record ends at the first value that is missing: the record of a listed
-/// model without an identifier has only a name and so offers no connection, and without a name the
-/// record is empty.
+/// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
+/// there supports USB only and has an empty identifier. A listed model supports USB, but no
+/// network, unless its entry says otherwise. The record of a listed model without an identifier
+/// ("KSCID") holds nothing but the name. Without a name, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);
 
+/// Returns medium::fullPath(relativePath).
 [[nodiscard]] std::string convertRelativePathToFullPath(
     const std::optional<std::string>& relativePath);
 

@@ -8,7 +8,7 @@
 
 namespace onramp {
 
-/// The interfaces that a model, or all models of the medium, support besides wireless.
+/// The interfaces other than wireless that a model supports, or that several models have in common.
 enum class ConnectionType : unsigned char {
   kNeither = 0,  ///< neither USB nor wired Ethernet, or the models disagree
   kEthernet = 2,
@@ -18,20 +18,22 @@ enum class ConnectionType : unsigned char {
 
 [[nodiscard]] ConnectionType connectionType(bool usb, bool ethernet);
 
-/// The type of a KSOROSXModel record. A flag that is missing from the record counts as false.
+/// Returns the type of the model with the KSOROSXModel record `model`. A flag that is missing from
+/// the record counts as false.
 [[nodiscard]] ConnectionType connectionType(const Dictionary& model);
 
-/// The type that all of the models share by the model information; kNeither when any two differ.
+/// Returns the type that all of `models` share according to `modelInfo`; kNeither when any two
+/// differ or there are none.
 [[nodiscard]] ConnectionType sharedConnectionType(const std::vector<std::string>& models,
                                                   const std::optional<Dictionary>& modelInfo);
 
-/// Whether at least one of the models supports wireless by the model information.
+/// Whether at least one of `models` supports wireless according to `modelInfo`.
 [[nodiscard]] bool anySupportsWiFi(const std::vector<std::string>& models,
                                    const std::optional<Dictionary>& modelInfo);
 
-/// What the wizard begins with.
+/// The page that the wizard begins with.
 enum class FirstPage {
-  kNone,  ///< no model supports wireless: the package opens at once
+  kNone,  ///< none: no model supports wireless, so the package opens at once
   kConnectionType,
   kModelList,
 };

@@ -15,8 +15,8 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-/// The version with these components. A component that is missing, as in 10.9, or is not a number
-/// counts as 0.
+/// Returns the version with these components. A component that is missing, such as the third of
+/// 10.9, counts as 0, and so does one that does not begin with a number.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
 /// How a system compares with the range that the medium supports.
@@ -26,17 +26,17 @@ enum class SystemSupport : std::uint32_t {
   kNewerThanMaximum = 2,
 };
 
-// The bounds are version dictionaries of KSInstallerInfo.
+// The bounds below are version dictionaries from KSInstallerInfo.
 
-/// Whether `bound` sets a limit: one whose "Major" is 0 does not.
+/// Whether `bound` sets a limit. A bound whose "Major" is 0 sets none.
 [[nodiscard]] bool isBound(const Dictionary& bound);
 
-/// Whether `version` lies above `maximum`. The maximum's "BugFix" is the first release above it,
-/// whereas its "Major" and "Minor" are still within it; "x" means that no release of that minor
-/// version is above it.
+/// Whether `version` is above `maximum`. The maximum's "Major" and "Minor" are inclusive, but its
+/// "BugFix" is exclusive: it is the first bug-fix release above the maximum. A "BugFix" of "x"
+/// allows every bug-fix release of that minor version.
 [[nodiscard]] bool isNewerThan(const Dictionary& maximum, const SystemVersion& version);
 
-/// Whether `version` lies below `minimum`.
+/// Whether `version` is below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
 /// How `version` compares with both bounds. The maximum is checked first.

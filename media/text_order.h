@@ -5,8 +5,8 @@
 
 namespace onramp {
 
-/// Sorts texts in ascending order with the case of the letters A to Z ignored; other characters
-/// compare by code point. Texts that differ in case only keep their order.
+/// Sorts `texts` in ascending order of their code points, ignoring the case of the letters A to Z.
+/// Texts that differ only in case keep their order.
 void sortIgnoringCase(std::vector<std::string>& texts);
 
 }  // namespace onramp

@@ -6,7 +6,7 @@ namespace onramp {
 
 namespace {
 
-// Returns the store's entry under `key`, which is passed to the store as a pattern.
+// Returns the store's entry under `key`. The store receives the key as a pattern.
 std::optional<Dictionary> stateUnder(const std::string& storeName,
                                      const std::optional<std::string>& key) {
   if (!key) return std::nullopt;

@@ -33,7 +33,7 @@ void AddNetworkInterfaceListChangeCallbackSCF() {
                                                            kSCCompAnyRegex, kSCEntNetIPv4)) {
     setNotificationKeys(store, {}, {*pattern});
   }
-  // Unconditionally: a null source is accepted.
+  // A null source is accepted and adds nothing.
   addSourceToMainLoop(createRunLoopSource(store, 0));
 }
 

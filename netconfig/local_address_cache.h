@@ -5,14 +5,15 @@
 
 #include "netconfig/local_address_list.h"
 
-/// The process's cached list of local addresses. Main thread only.
+/// The process's cached list of local addresses. All functions must be called on the main thread.
 namespace onramp {
 
 /// Fills the cache and then, until the process ends, replaces it whenever an interface's IPv4 state
 /// changes. A failure leaves the cache empty or out of date and is not reported.
 void AddNetworkInterfaceListChangeCallbackSCF();
 
-/// Returns the cached list, or null. The list never changes: a refresh replaces it.
+/// Returns the cached list, or null when there is none. A list never changes; a refresh replaces it
+/// by a new one.
 [[nodiscard]] local_address_list local_address_cache_copy();
 
 /// Returns the first address of the first cached interface whose subnet contains the IPv4 address

@@ -15,7 +15,8 @@ namespace onramp {
 
 namespace {
 
-// The tool's display name in the user's language, or its file's name when it has none.
+// Returns the set-up tool's display name in the user's language. Without one, returns the name of
+// the tool's file without its extension.
 std::string setupToolName() {
   const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
   if (!tool) return "";
@@ -99,7 +100,7 @@ void ChooseDeviceView::stopBrowsing() {
   if (!mBonjourSearch) return;
   mBonjourSearch->stopBrowsing();
   mBonjourSearch->removeKSDeviceObserver(this);
-  // The search may be the caller, so it exists until the current event is over.
+  // The search may be the caller, so it is destroyed only after the current event.
   performOnMainThread([search = std::exchange(mBonjourSearch, nullptr)] {});
 }
 
@@ -155,7 +156,8 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // Until the user chooses, the first row is selected; their choice survives later reports.
+  // The first row is selected until the user makes a choice. Later reports do not change that
+  // choice.
   if (!deviceArrayController.hasChoice()) {
     deviceArrayController.setSelectionIndex(0);
   } else if (isSelected) {

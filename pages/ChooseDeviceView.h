@@ -16,29 +16,31 @@
 
 namespace onramp {
 
-// Notifications with which the page asks the application for something.
+// The notifications by which the page makes requests to the application.
 
-/// Launch the wireless set-up tool. Carries nothing.
+/// Requests that the wireless set-up tool be launched. Has no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Wait for the device search. Carries the seconds per pause, an int, under kWaitTime.
+/// Requests a wait for the device search. Carries the length of a pause in seconds, an int, under
+/// kWaitTime.
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
-/// The page that lists the devices found on the network that are of a model being looked for and
-/// that themselves report being on wireless. The page is made once; its list and its search survive
-/// page changes. The search owns the page while it runs; stopBrowsing() ends that.
+/// The page that lists the devices found on the network. A device is listed if its model is one of
+/// those being looked for and the device reports that it is on wireless. The page is created once;
+/// its list and its search continue while another page is shown. A running search shares ownership
+/// of the page until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
  public:
   // Keys of a list entry.
   static constexpr std::string_view kDevice = "device";        ///< string, the device's name
-  static constexpr std::string_view kInterface = "interface";  ///< string, how it is connected
-  static constexpr std::string_view kLocation = "location";    ///< string, its first address
+  static constexpr std::string_view kInterface = "interface";  ///< string, kind of connection
+  static constexpr std::string_view kLocation = "location";    ///< string, the first address
   static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
 
-  /// The length of a pause in the wait that a refresh asks for.
+  /// The length of a pause in the wait that refreshBrowsing() requests.
   static constexpr std::chrono::seconds kRefreshPause{3};
 
   explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
@@ -46,10 +48,10 @@ class ChooseDeviceView final : public Page,
   ChooseDeviceView& operator=(const ChooseDeviceView&) = delete;
   ~ChooseDeviceView() override;
 
-  /// The models to look for, as "manufacturer model" texts.
+  /// Sets the models to look for, as texts of the form "manufacturer model".
   void setSearchModelList(std::vector<std::string> models);
 
-  /// Starts a new search, ending the one that runs. The list keeps its entries.
+  /// Ends the running search, if there is one, and starts a new one. The list keeps its entries.
   void startBrowsing();
 
   /// Ends the search. The list keeps its entries. Does nothing when no search is running.
@@ -73,8 +75,8 @@ class ChooseDeviceView final : public Page,
   /// Shows or hides the waiting state.
   void progressON(bool on);
 
-  /// Called by the search. The first two ask the device whether it is on wireless, which may block
-  /// for seconds.
+  /// Called by the search. addKSDevice() and updateKSDevice() ask the device whether it is on
+  /// wireless, which may block for seconds.
   void addKSDevice(const Dictionary& device) override;
   void updateKSDevice(const Dictionary& device) override;
   void removeKSDevice(const Dictionary& device) override;
@@ -98,7 +100,8 @@ class ChooseDeviceView final : public Page,
   std::shared_ptr<KSBonjourSearch> mBonjourSearch;  ///< null when not browsing
   std::vector<std::string> searchModelList;
 
-  // The table is bound to the controller, which is therefore destroyed after it.
+  // The table view is bound to the controller, so the controller is declared first and destroyed
+  // last.
   ArrayController deviceArrayController;
   TableView deviceListView;
   TextField deviceListTitle;

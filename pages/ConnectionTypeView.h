@@ -9,7 +9,8 @@
 
 namespace onramp {
 
-/// The page that asks how the device is connected. A new one is made each time it is shown.
+/// The page that asks how the device is connected. A new page object is created each time the page
+/// is shown.
 class ConnectionTypeView final : public Page {
  public:
   // Rows of the radio buttons.
@@ -18,13 +19,13 @@ class ConnectionTypeView final : public Page {
 
   explicit ConnectionTypeView(std::unique_ptr<Interface> interface);
 
-  /// Sets the titles and images of both choices. The selection does not change.
+  /// Sets the titles and images of both choices to suit `type`. The selection does not change.
   void setConnectionType(ConnectionType type);
 
   /// The selected row: kWirelessRow or kWiredRow.
   [[nodiscard]] int chooseDeviceType() const;
 
-  /// Selects a choice.
+  /// Selects the choice in that row and column; the only column is 0.
   void setChooseButton(int row, int column);
 
   /// Shows or hides the waiting state, in which the choice cannot be changed.

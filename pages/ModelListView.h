@@ -10,22 +10,24 @@
 
 namespace onramp {
 
-/// The page that lists the medium's models. A new one is made each time it is shown.
+/// The page that lists the medium's models. A new page object is created each time the page is
+/// shown.
 class ModelListView final : public Page {
  public:
   explicit ModelListView(std::unique_ptr<Interface> interface);
 
-  /// Name of the selected model; nothing when no model is selected.
+  /// The name of the selected model; nothing when no model is selected.
   [[nodiscard]] std::optional<std::string> choosedModelName() const;
 
-  /// Selects the model with that name; nothing is selected when the list has none.
+  /// Selects the model called `name`, or clears the selection when the list has no such model.
   void setChoosedModel(const std::string& name);
 
  private:
   void awakeFromNib();
   void addModelToList();
 
-  // The table is bound to the controller, which is therefore destroyed after it.
+  // The table view is bound to the controller, so the controller is declared first and destroyed
+  // last.
   ArrayController modelArrayController;
   TableView modelListView;
   TextField modelListTitle;

@@ -10,8 +10,8 @@
 
 namespace onramp {
 
-/// One page of the wizard: a view and everything loaded with it. Its class tells which page it is;
-/// a view whose class this program does not know becomes a plain Page.
+/// One page of the wizard: a view and everything loaded from the same interface file. Each kind of
+/// page is a subclass; a view of an unknown class becomes a plain Page.
 class Page {
  public:
   explicit Page(std::unique_ptr<Interface> interface) : interface_(std::move(interface)) {}
@@ -31,8 +31,8 @@ class Page {
   std::unique_ptr<Interface> interface_;
 };
 
-/// Makes the page in the interface file `name`. Returns null when the file is missing or holds no
-/// view.
+/// Loads the page in the interface file `name` and binds its controls to `owner`. Returns null when
+/// the file is missing or holds no view.
 [[nodiscard]] std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner);
 
 /// Shows or hides a page's waiting state: a turning spinner and the text beside it.

@@ -8,8 +8,9 @@ namespace onramp {
 
 namespace {
 
-// Reads one arc: seven bits a byte, the highest first; all bytes but the last have the top bit set.
-// Nothing when the arc does not fit 16 bits or has no end.
+// Reads one arc. Each byte holds seven bits, the most significant first; all bytes but the last
+// have the top bit set. Returns nothing when the arc does not fit in 16 bits or its last byte is
+// missing.
 std::optional<std::uint16_t> next_arc(ByteReader& content) {
   std::uint32_t arc = 0;
   while (const auto byte = content.byte()) {

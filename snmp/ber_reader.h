@@ -9,10 +9,11 @@
 
 namespace onramp {
 
-// The reading primitives (X.690 section 8, as RFC 1157 restricts it). Each moves the reader past
-// what it read and returns SNMP_OK, or returns SNMP_ERR_CODEC for malformed or missing bytes.
+// Functions that read one part of a BER encoding (X.690 section 8, as restricted by RFC 1157). Each
+// moves the reader past that part and returns SNMP_OK, or returns SNMP_ERR_CODEC for malformed or
+// missing bytes.
 
-/// Reads one tag byte. A tag of more than one byte is refused, and the reader stays where it was.
+/// Reads a tag of one byte. Refuses a longer tag without moving the reader.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
   constexpr std::uint8_t kHighTagNumber = 0x1F;
   ByteReader ahead = in;
@@ -66,18 +67,19 @@ namespace onramp {
 
 /// Reads an object identifier of `length` content bytes into `target`. On entry `target->count` is
 /// the number of arcs that fit; on return it is the number of arcs read. Refuses a null target,
-/// arcs that do not fit there, an arc that does not fit in 16 bits and content that ends inside an
-/// arc. The arcs read before a refusal are stored, but `count` then stays unchanged.
+/// more arcs than fit, an arc above 65,535, and content that ends inside an arc. A refusal leaves
+/// `count` unchanged, but some arcs may have been stored.
 [[nodiscard]] snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length);
 
 /// Copies a string of `length` bytes to `target`. Refuses a string longer than `target->capacity`,
-/// and any string but the empty one when there is no target.
+/// and a string that is not empty when `target` is null.
 [[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
-// The next function completes the primitives; no part of the program uses it.
+// No part of the program uses the next function. It completes this set of functions.
 
-/// Like ber_get_octets, but makes `target->bytes` point into the input. `capacity` becomes 0,
-/// because the input must not be written to.
+/// Like ber_get_octets, but makes `target->bytes` point into the input instead of copying.
+/// `capacity` becomes 0, because the input must not be written to. An empty string changes nothing
+/// but `length`.
 [[nodiscard]] snmp_status ber_get_octets_ref(ByteReader& in, snmp_octets* target,
                                              std::uint16_t length);
 

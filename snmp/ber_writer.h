@@ -9,8 +9,8 @@
 
 namespace onramp {
 
-/// Writes from a buffer's end towards its start and never beyond either. So an element's content is
-/// written before its header, and its length is known by then.
+/// Writes from a buffer's end towards its start and never outside the buffer. An element's content
+/// is written before its header, so the content's length is known when the header is written.
 class ber_writer {
  public:
   explicit ber_writer(std::span<std::uint8_t> room) : room_(room), left_(room.size()) {}
@@ -18,14 +18,14 @@ class ber_writer {
   /// Bytes written so far.
   [[nodiscard]] std::size_t size() const { return room_.size() - left_; }
 
-  /// Puts one byte before those written so far.
+  /// Puts one byte in front of those written so far.
   [[nodiscard]] snmp_status put(std::uint8_t byte) {
     if (left_ == 0) return SNMP_ERR_CODEC;
     room_[--left_] = byte;
     return SNMP_OK;
   }
 
-  /// Puts `bytes` before those written so far.
+  /// Puts `bytes` in front of those written so far.
   [[nodiscard]] snmp_status put(std::span<const std::uint8_t> bytes);
 
  private:
@@ -33,12 +33,12 @@ class ber_writer {
   std::size_t left_;
 };
 
-// The writing primitives (X.690 section 8). Each puts one thing before what is written so far and
-// returns SNMP_OK. It returns SNMP_ERR_CODEC when the room is used up or the value has no form;
-// then part of the value may have been written.
+// Functions that write one part of a BER encoding (X.690 section 8). Each puts that part in front
+// of the bytes written so far and returns SNMP_OK. Each returns SNMP_ERR_CODEC when the buffer is
+// full or the value cannot be encoded; some of its bytes may then have been written.
 
-/// Puts a length field of one, two or three bytes (short form, 0x81, 0x82). A length above 65,535
-/// is refused.
+/// Puts a length field of one, two or three bytes (short form, 0x81, 0x82). Refuses a length above
+/// 65,535.
 [[nodiscard]] inline snmp_status ber_put_length(ber_writer& out, std::size_t length) {
   if (length > UINT16_MAX || out.put(static_cast<std::uint8_t>(length))) return SNMP_ERR_CODEC;
   if (length < 0x80) return SNMP_OK;
@@ -47,7 +47,7 @@ class ber_writer {
   return out.put(high) || out.put(0x82) ? SNMP_ERR_CODEC : SNMP_OK;
 }
 
-/// Puts the tag and the length field of an element whose content is what has been written since
+/// Puts the tag and the length field of an element. Its content is everything written since
 /// out.size() was `end`.
 [[nodiscard]] inline snmp_status ber_put_header(ber_writer& out, std::uint8_t tag,
                                                 std::size_t end) {
@@ -62,19 +62,18 @@ class ber_writer {
   return ber_put_octets(out, std::span<const std::uint8_t>(octets.bytes, octets.length), tag);
 }
 
-/// Puts the low 32 bits of `value` as a signed number, in the fewest bytes that hold it: 1 to 4.
-/// Replaces a negative value by the bytes written, read as an unsigned number; that is what
-/// ber_get_uint makes of them.
+/// Puts the low 32 bits of `value` as a signed number in as few bytes as possible, 1 to 4. Replaces
+/// a negative `value` by the number that ber_get_uint reads from those bytes: -1 becomes 255.
 [[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag);
 [[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::int64_t& value, std::uint8_t tag);
 
-/// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks. From
-/// 2^31 on it takes 5 bytes, the first of them zero: the content is an INTEGER's, so it must not
-/// look negative (RFC 1155 section 6, X.690 section 8.3).
+/// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks. A
+/// number of 2^31 or more takes 5 bytes, of which the first is zero. The content is encoded like
+/// that of an INTEGER, so it must not look negative (RFC 1155 section 6, X.690 section 8.3).
 [[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
-/// Puts an object identifier. Refused are fewer than two arcs, first two arcs that do not fit one
-/// byte, and more than 255 bytes of content.
+/// Puts an object identifier. Refuses fewer than two arcs, first two arcs that do not fit together
+/// in one byte, and content of more than 255 bytes.
 [[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
 [[nodiscard]] snmp_status ber_put_null(ber_writer& out);

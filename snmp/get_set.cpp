@@ -12,8 +12,8 @@ namespace {
 
 constexpr std::size_t kStringStride = 16;
 
-// Holds the strings of one request and then those of its reply, each up to kReplySize together. The
-// destructor takes it from the bindings again.
+// Holds the strings of a request, and later those of its reply: up to kReplySize bytes in each
+// case. The destructor clears the bindings' pointers to this storage.
 class string_storage {
  public:
   explicit string_storage(std::span<snmp_varbind> bindings)
@@ -26,8 +26,8 @@ class string_storage {
     }
   }
 
-  /// Gives binding `i` the kReplySize bytes from `offset` on, which is at most kReplySize. So a
-  /// reply's strings fit wherever those of the request began.
+  /// Gives binding `i` kReplySize bytes from `offset` on. `offset` must be at most kReplySize. A
+  /// reply's strings fit wherever the strings of the request began.
   snmp_octets& give(std::size_t i, std::size_t offset) {
     octets_[i] = {kReplySize, kReplySize, bytes_.data() + offset};
     bindings_[i].octets_value = &octets_[i];
@@ -75,8 +75,8 @@ snmp_status exchange(snmp_message& message, std::span<snmp_result_slot> results,
   return copy_results(message, results);
 }
 
-// Gives every binding its type, and a string a place in `strings`: one place every 16 bytes,
-// further on when the strings before it are longer.
+// Sets the type of every binding from its slot and copies every string to `strings`. The string of
+// binding i starts at offset 16 * i, or at a higher multiple of 16 when earlier strings are longer.
 snmp_status take_slots(std::span<snmp_varbind> bindings, std::span<const snmp_result_slot> results,
                        string_storage& strings) {
   std::size_t used = 0;

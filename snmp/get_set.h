@@ -8,7 +8,7 @@
 
 namespace onramp {
 
-// snmp_get and snmp_set complete the room; no part of the program calls them.
+// No part of the program calls snmp_get and snmp_set. They complete the SNMP library.
 
 /// The type that the caller expects of one binding, and the place for its value.
 struct snmp_result_slot {
@@ -18,24 +18,26 @@ struct snmp_result_slot {
   snmp_octets* octets = nullptr;  ///< for type 4; holds at most `capacity` bytes
 };
 
-/// Asks `address` for the bindings of `message`, one for each slot, and copies the reply's values
-/// to the slots. See snmp_exchange for `address` and `mode`. Sends a get-next request when
-/// `pdu_type` says so, otherwise a get request. A string is followed by a zero byte when the slot
-/// has room for one. The bindings' `octets_value` is null afterwards.
+/// Asks the device at `address` for the bindings of `message` and copies the reply's values to the
+/// slots in `results`. There must be one slot for each binding. See snmp_exchange for `address` and
+/// `mode`. Sends a get-next request when `pdu_type` is kPduGetNext, otherwise a get request. A
+/// string is followed by a zero byte when the slot has room for one. The bindings' `octets_value`
+/// is null afterwards.
 ///
 /// Returns the status of snmp_exchange or, when that is SNMP_OK, the reply's error status. Returns
-/// SNMP_ERR_CODEC when a value's type differs from its slot's, when the value does not fit there,
-/// or when there is no slot for it.
+/// SNMP_ERR_CODEC when there are more slots than bindings, when a value has another type than its
+/// slot, when a value does not fit in its slot, and when a value has no slot.
 [[nodiscard]] snmp_status snmp_get(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 
-/// Sets the bindings of `message` at `address`. A binding takes its type from the slot that its
-/// `index` names. When that type is a string (type 4), it takes its value from there too; otherwise
-/// it keeps its own value. Copies the reply's values to the slots and returns the status as
-/// snmp_get does.
+/// Sends the bindings of `message` to the device at `address` in a set request. A binding takes its
+/// type from the slot at its `index`. It takes its value from that slot as well if the type is 4, a
+/// string; otherwise it keeps its own value. Copies the reply's values to the slots and returns the
+/// status as snmp_get does.
 ///
-/// Returns SNMP_ERR_CODEC and sends nothing when the strings, each rounded up to 16 bytes, exceed
-/// kReplySize in total. A binding's `octets_value` is null afterwards when it held a string.
+/// Returns SNMP_ERR_CODEC and sends nothing when a binding has no slot, when a string has no value,
+/// and when the strings do not fit in a buffer of kReplySize bytes, where every string starts at a
+/// multiple of 16. The `octets_value` of a binding that sent a string is null afterwards.
 [[nodiscard]] snmp_status snmp_set(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 

@@ -21,8 +21,9 @@ std::array<mib_entry, 1> active_if_entries = {
 
 constexpr std::array<mib_value_handler, 1> kActiveIFHandlers = {{{kActiveIFKey, decode_active_if}}};
 
-// Compares as many bytes as the entry has arcs, which is the first half of its name. A reply is
-// decoded into the table's own names, so for those this always holds.
+// Compares as many bytes as the entry has arcs. An arc takes two bytes, so only the first half of
+// the name is compared. A reply is decoded into the table's own names, so the result is always true
+// for a reply.
 bool names_match(const snmp_oid& entry, const snmp_oid& name) {
   return name.capacity >= entry.capacity && std::memcmp(entry.arcs, name.arcs, entry.capacity) == 0;
 }
@@ -31,7 +32,7 @@ void store(std::int32_t* out, std::uint64_t value) {
   if (out) *out = static_cast<std::int32_t>(value);
 }
 
-// Asks a second time when the first request gives nothing.
+// Asks a second time when the first request gives no result.
 template <typename Ask>
 std::optional<Dictionary> ask_twice(const Ask& ask) {
   std::optional<Dictionary> result;

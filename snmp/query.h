@@ -25,9 +25,9 @@ struct mib_entry {
 using mib_decode = snmp_status (*)(Dictionary& result, const char* name,
                                    const snmp_varbind& binding, std::uint64_t reserved);
 
-/// Handler for the entry at the same index.
+/// Tells how to store the value of the mib_entry with the same index.
 struct mib_value_handler {
-  const char* name = nullptr;  ///< the result's key
+  const char* name = nullptr;  ///< the value's key in the result
   mib_decode decode = nullptr;
 };
 
@@ -44,8 +44,9 @@ constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's 
 
 constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
-/// Asks for kActiveIFObject. The name in each reply replaces the one here and is what later
-/// requests ask for. After a shorter one, only names of at most that length fit.
+/// The table that asks for kActiveIFObject. The name in each reply overwrites the name in this
+/// table, and later requests ask for the new name. After a reply with a shorter name, only names of
+/// at most that length fit.
 extern mib_table active_interface_table;
 
 /// Stores an INTEGER as a 32-bit number. Returns 1 for a value of any other type.
@@ -66,49 +67,51 @@ class snmp_table_request {
   /// Forgets the previous reply's values, so that another reply can be decoded into the message.
   void clear_values();
 
-  /// Returns what the handlers make of the reply in the message, plus `address` as the device's
-  /// address. A refused value drops everything stored before it, so nothing is returned when the
-  /// last entry's value is refused.
+  /// Returns the values that the handlers store from the reply in the message, plus kConnectionKey
+  /// and, under kIPAddressKey, `address`. A refused value drops everything stored before it, so
+  /// nothing is returned when the last entry's value is refused.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
  private:
   mib_table& table_;
   std::vector<snmp_varbind> bindings_;
   std::vector<snmp_octets> octets_;
-  std::array<std::uint8_t, kReplySize> strings_{};  // of all bindings, end to end
+  std::array<std::uint8_t, kReplySize> strings_{};  // those of all bindings, end to end
   snmp_message message_;
 };
 
 /// Asks the device at `address`, dotted IPv4 text, for the objects of `table`. Returns nothing when
-/// `table` or `address` is null, when the device refuses, when its values are unsuitable, and when
-/// no proper reply comes. `out_no_reply` is set in the last case only and is never cleared. A
-/// reply's error status and index are stored in the last two arguments, which may be null. Blocks
-/// as snmp_exchange does.
+/// `table` or `address` is null, when the reply has an error status, when its values are
+/// unsuitable, and when no valid reply comes. `out_no_reply` is set in the last case only and is
+/// never cleared. A reply's error status and index are stored in the last two arguments, which may
+/// be null. Blocks as snmp_exchange does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
                                                          std::int32_t* out_error_index);
 
-/// The same, asking a second time when the first request gives nothing.
+/// Does the same, but asks a second time when the first request gives no result.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table_retry(mib_table* table,
                                                                const char* address,
                                                                bool& out_no_reply,
                                                                std::int32_t* out_error_status,
                                                                std::int32_t* out_error_index);
 
-/// Returns whether the device with these addresses (strings) says that its active interface is the
-/// wireless one. Tries the addresses in order; the first that answers every request decides. One
-/// that leaves a request unanswered is tried three times, 20 ms apart, with up to two requests
-/// each. When no address decides, the result of the very last try does.
+/// Returns whether the device with these addresses, which are strings, reports that it is using its
+/// wireless interface. Tries the addresses in order. The first address that answers every request
+/// decides the result. An address that leaves a request unanswered is tried three times, 20 ms
+/// apart, with up to two requests per try. If no address decides, the last try of the last address
+/// does.
 ///
-/// Blocks: an address that swallows all six requests takes 12 seconds.
+/// Blocks for about 12 seconds for an address that answers none of its six requests.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
-/// Makes one request to the device at an address, which is null for an entry that is no text.
-/// Returns what snmp_query_table does, and sets `no_reply` in the same case.
+/// Makes one request to the device at `address`, which is null when the entry in the array of
+/// addresses is not a string. Returns what snmp_query_table returns, and sets `no_reply` in the
+/// same case.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
-/// The same decision with requests made by `ask`, for callers that keep what is exchanged.
+/// Makes the same decision, but makes its requests through `ask`, so that a caller can record them.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);
 
 }  // namespace onramp

@@ -18,7 +18,7 @@ constexpr std::uint8_t kTagGauge = 0x42;
 constexpr std::uint8_t kTagTimeTicks = 0x43;
 constexpr std::uint8_t kTagOpaque = 0x44;
 
-/// Kinds of PDU: the low five bits of its tag (RFC 1157 section 4.1).
+/// PDU types: the low five bits of a PDU's tag (RFC 1157 section 4.1).
 constexpr std::uint64_t kPduGet = 0;
 constexpr std::uint64_t kPduGetNext = 1;
 constexpr std::uint64_t kPduResponse = 2;
@@ -31,7 +31,7 @@ struct snmp_oid {
   std::uint16_t* arcs = nullptr;
 };
 
-/// A byte string in the caller's storage, `capacity` bytes from `bytes` on.
+/// A byte string in the caller's storage, which starts at `bytes` and has `capacity` bytes.
 struct snmp_octets {
   std::uint16_t length = 0;
   std::uint16_t capacity = 0;
@@ -42,9 +42,9 @@ struct snmp_octets {
 struct snmp_varbind {
   std::uint64_t type = kTagNull;
   snmp_oid* name = nullptr;             ///< a reply's name is decoded into this same record
-  std::int64_t int_value = 0;           ///< of types 1, 2, 65, 66 and 67; the low 32 bits count
-  snmp_octets* octets_value = nullptr;  ///< of types 4, 64 and 68
-  snmp_oid* oid_value = nullptr;        ///< of type 6
+  std::int64_t int_value = 0;           ///< for types 1, 2 and 65 to 67; the low 32 bits are used
+  snmp_octets* octets_value = nullptr;  ///< for types 4, 64 and 68
+  snmp_oid* oid_value = nullptr;        ///< for type 6
   std::uint16_t encoded_length = 0;     ///< set by the encoder: size of name and value together
   std::uint32_t index = 0;              ///< set by the decoder: position in the reply, from 0
 };
@@ -53,13 +53,13 @@ struct snmp_varbind {
 struct snmp_message {
   std::uint64_t version = 0;
   std::uint16_t community_length = 0;
-  const char* community = nullptr;  ///< after decoding it points into the reply
+  const char* community = nullptr;  ///< points into the reply after decoding
   std::uint64_t pdu_type = kPduGet;
   std::uint64_t request_id = 0;
   std::uint64_t error_status = 0;
   std::uint64_t error_index = 0;
   std::uint64_t varbind_count = 0;
-  std::span<snmp_varbind> varbinds;  ///< the whole array, not only those in use
+  std::span<snmp_varbind> varbinds;  ///< the whole array, including unused bindings
 };
 
 /// Makes `message` an SNMPv1 request with the community kCommunity. Sets `varbind_count` and makes
@@ -67,9 +67,10 @@ struct snmp_message {
 /// unchanged.
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
-/// Compares arc by arc. Returns -1 when `first` is less at the first difference or ends first, 1
-/// when it is greater there, and 0 otherwise: also when `second` ends first. No part of the program
-/// uses it.
+/// Compares two object identifiers arc by arc. At the first difference, returns -1 when the arc of
+/// `first` is less, and 1 when it is greater. Without a difference, returns -1 when `first` is
+/// shorter, and 0 otherwise, even when `second` is shorter. No part of the program uses this
+/// function.
 [[nodiscard]] int snmp_oid_compare(const snmp_oid& first, const snmp_oid& second);
 
 }  // namespace onramp

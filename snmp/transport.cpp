@@ -14,10 +14,10 @@ std::int64_t snmp_request_counter_ext = 200;
 
 namespace {
 
-constexpr std::size_t kAddressTextSize = 32;  // its closing zero included
+constexpr std::size_t kAddressTextSize = 32;  // including the terminating zero
 constexpr IPv4Address kAllOnes{0xFFFFFFFF};
 
-// Returns the size of the agent's reply, 0 when there is none.
+// Returns the size of the agent's reply, or 0 when there is none.
 std::size_t ask(DatagramSocket& socket, const DatagramEndpoint& agent,
                 std::span<const std::uint8_t> request, snmp_packet& reply) {
   if (!socket.connect(agent)) return 0;
@@ -27,7 +27,7 @@ std::size_t ask(DatagramSocket& socket, const DatagramEndpoint& agent,
   return received ? received->length : 0;
 }
 
-// As snmp_exchange; `sent` becomes the identifier that a reply to the request carries.
+// Does what snmp_exchange does, and sets `sent` to the identifier that a reply must carry.
 snmp_status exchange(snmp_message& message, const char* address, std::uint32_t mode,
                      std::uint64_t& sent) {
   snmp_packet request{};

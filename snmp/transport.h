@@ -15,14 +15,14 @@ namespace onramp {
 /// The maximum size of a reply datagram, and of all strings in one reply together.
 constexpr std::uint16_t kReplySize = 1500;
 
-/// Room for one encoded message, a little more than is ever received.
+/// A buffer for one encoded message, slightly larger than kReplySize.
 using snmp_packet = std::array<std::uint8_t, 1536>;
 
 /// The longest wait until a request can be sent, and until its reply arrives.
 constexpr std::chrono::seconds kSendWait{2};
 constexpr std::chrono::seconds kReceiveWait{2};
 
-/// How snmp_exchange uses the network. Any mode but kModeNoNetwork sends.
+/// Modes of snmp_exchange. Every mode other than kModeNoNetwork works like kModeNetwork.
 constexpr std::uint32_t kModeNetwork = 4;
 constexpr std::uint32_t kModeNoNetwork = 6;
 
@@ -31,30 +31,32 @@ constexpr std::uint32_t kModeNoNetwork = 6;
 extern std::int32_t snmp_request_counter;
 extern std::int64_t snmp_request_counter_ext;
 
-/// Takes the next identifier of snmp_request_counter, as a message's `request_id`.
+/// Returns the next identifier of snmp_request_counter, for use as a message's `request_id`.
 [[nodiscard]] std::uint64_t snmp_next_request_id();
 
 /// Replaces each dot-separated part of `text` by the decimal number that the part starts with, or
-/// by 0. This removes leading zeros, which would make a part octal. Returns nothing for a null or
-/// empty text, and when the result is longer than 31 characters.
+/// by 0. This removes leading zeros, which would mark a part as octal. Returns nothing for a null
+/// or empty text, and when the result is longer than 31 characters.
 [[nodiscard]] std::optional<std::string> snmp_normalize_ipv4(const char* text);
 
-/// Returns the SNMP port of `address`, dotted IPv4 text. Any other text gives 255.255.255.255.
+/// Returns the endpoint of the SNMP agent at `address`, a dotted IPv4 text. Any other text gives
+/// the address 255.255.255.255.
 [[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
 
 /// Sends `message` to the SNMP port of `address`, dotted IPv4 text, and decodes the reply into
-/// `message`. Nothing is sent to any other text. Blocks for at most kSendWait and kReceiveWait; an
-/// agent's host that refuses the request ends the wait at once. `community` stays the one sent,
-/// because the reply's does not outlive the call.
+/// `message`. Sends nothing if `address` is any other text. Blocks for at most kSendWait plus
+/// kReceiveWait; the wait ends at once when the host refuses the request. `message.community` keeps
+/// its value, because the reply's community does not outlive the call.
 ///
-/// Returns SNMP_ERR_CODEC when the message cannot be encoded and when no proper reply came in time,
-/// SNMP_ERR_TRANSPORT when there is no socket. With kModeNoNetwork nothing is sent or received.
+/// Returns SNMP_ERR_CODEC when the message cannot be encoded and when no valid reply came in time,
+/// and SNMP_ERR_TRANSPORT when no socket can be opened. With kModeNoNetwork, sends nothing and
+/// returns SNMP_ERR_CODEC.
 [[nodiscard]] snmp_status snmp_exchange(snmp_message& message, const char* address,
                                         std::uint32_t mode);
 
-/// Normalizes `address` and makes one exchange under the next identifier of snmp_request_counter.
-/// Returns SNMP_ERR_TRANSPORT also for a null message, an address that cannot be normalized and a
-/// reply to another request; otherwise what snmp_exchange returns.
+/// Normalizes `address` by snmp_normalize_ipv4() and makes one exchange with the next identifier of
+/// snmp_request_counter. Returns SNMP_ERR_TRANSPORT for a null message, for an address that cannot
+/// be normalized, and for a reply to another request. Otherwise returns what snmp_exchange returns.
 [[nodiscard]] snmp_status snmp_request_to_address(snmp_message* message, const char* address);
 
 }  // namespace onramp

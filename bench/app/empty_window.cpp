@@ -1,4 +1,4 @@
-// The least that a program with a window of the wizard's size can do.
+// Shows an empty window of the wizard's size, which is the least that such a program can do.
 
 #include <QApplication>
 #include <QMainWindow>

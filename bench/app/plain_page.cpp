@@ -1,4 +1,4 @@
-// The first page of the wizard written directly against Qt: title, text, list, menu and buttons.
+// Shows the wizard's first page, written directly with Qt: title, text, list, menu and buttons.
 
 #include <QApplication>
 #include <QLabel>
@@ -15,7 +15,7 @@ namespace {
 
 constexpr int kModels = 100;
 
-// Qt deletes children with their parents.
+// The result has no owner here, because Qt deletes a child together with its parent.
 template <typename Child, typename... Arguments>
 Child* make(Arguments&&... arguments) {
   return std::make_unique<Child>(std::forward<Arguments>(arguments)...).release();

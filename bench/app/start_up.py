@@ -1,7 +1,9 @@
 #!/usr/bin/python3
-"""Start-up of the wizard beside an empty window and beside the same page written directly against Qt.
+"""Compares the wizard's start-up with that of an empty window and of the same page in plain Qt.
 
-Usage: start_up.py [BUILD], the folder of a release build (default build/release).
+Usage: start_up.py [BUILD]
+
+BUILD is the folder of a release build (default: build/release).
 """
 
 import pathlib
@@ -27,7 +29,7 @@ def measure(build, env, program):
 
 
 def medium_with(folder, count):
-    """A medium on which the last model differs, so that every model has to be looked at."""
+    """Returns the wizard on a medium whose last model differs, so that the wizard must read all."""
     models = {f"Kestrel Model {i:05}": media.model(usb=True, wired=i + 1 < count, wireless=True)
               for i in range(count)}
     medium = media.make(pathlib.Path(folder) / str(count), ROOT / "build/medium", models)
@@ -48,7 +50,7 @@ def main():
         for round_ in range(ROUNDS + 1):
             for name, program in programs.items():
                 result = measure(build, env, program)
-                if round_ > 0:  # the first one fills the file cache
+                if round_ > 0:  # the first round fills the file cache
                     runs[name].append(result)
     empty_time = statistics.median(r[0] for r in runs["empty window"])
     plain_time, plain_memory = (statistics.median(r[i] for r in runs["plain page"])

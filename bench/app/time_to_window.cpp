@@ -1,5 +1,5 @@
-// Starts a program on an empty display and prints how long it takes until something is drawn in the
-// middle of the screen, in milliseconds, and the program's peak resident memory by then, in KiB.
+// Starts a program on an empty display. Prints the time in milliseconds until something is drawn in
+// the middle of the screen, and the program's peak resident memory shortly afterwards, in KiB.
 
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>

@@ -1,13 +1,15 @@
 #!/usr/bin/python3
-"""Compares discovery with avahi-browse on the same network in the same run, as ratios.
+"""Compares the wizard's discovery with avahi-browse on the same network in the same run.
 
-Usage: discovery_bench.py [BUILD], the folder of a release build (default build/release).
+Usage: discovery_bench.py [BUILD]
 
-Measures 1, 20 and 200 services on dual-stack networks of one and of two interfaces. Each time is
-from the start of the program to its line about the last service that it has resolved. Warm: one
-host, all services in its daemon's cache. Cold: two hosts joined by cables, and a daemon with an
-empty cache for each single search. At the end of the warm part: the processor time of a search that
-idles.
+BUILD is the folder of a release build (default: build/release).
+
+Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each time
+runs from the start of a program to its output line about the last service that it resolves. The
+warm part has one host, whose Avahi daemon has all services in its cache. The cold part has two
+hosts joined by virtual cables, and the daemon starts every search with an empty cache. The warm
+part ends with the processor time of an idle search.
 """
 
 import pathlib
@@ -31,7 +33,7 @@ IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """From the start of `command` until it has named `count` services."""
+    """Returns the time from the start of `command` until it has named `count` services."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:
@@ -60,7 +62,7 @@ def grow_to(network, count):
         network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
                     model="Model 100")
     network.settle()
-    # Announcements are repeated for a while, and would warm a cold cache.
+    # Announcements are repeated for a while and would fill an empty cache.
     time.sleep(14 + 0.1 * count)
 
 
@@ -80,7 +82,7 @@ def compare(state, interfaces, probe):
                 if state == "cold":
                     empty_cache()
                 seconds = program(*arguments)
-                if round_number:  # The first round warms everything else up.
+                if round_number:  # The first round is a warm-up.
                     samples[program].append(seconds)
         ratios = [one / other for one, other in zip(samples[ours], samples[peer])]
         low, middle, high = statistics.quantiles(ratios)
@@ -100,7 +102,7 @@ def idle(interfaces, probe):
 
 
 def run_inside(state, interfaces, probe):
-    """Starts this program over on a practice network; returns its exit status."""
+    """Starts this program again on a practice network and returns its exit status."""
     with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:
         description.write(f"[network]\ninterfaces = {interfaces}\n")
         description.flush()

@@ -1,5 +1,6 @@
-// Encodes the request for ActiveIF and decodes its reply, in turns with this codec and net-snmp's
-// library. Prints the time for one message, the ratio and the allocations.
+// Encodes the request for ActiveIF and decodes its reply, alternating between this codec and the
+// net-snmp library. Prints the time per message, the ratio of the times, and the allocations per
+// message.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -20,9 +21,9 @@ long allocations = 0;
 
 }  // namespace
 
-// Counts every allocation of the process, including those inside the library.
+// Count the calls of malloc and calloc in this process, including those inside net-snmp.
 extern "C" {
-// The C library's names.
+// The C library's own names for its allocation functions.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
 void* __libc_calloc(std::size_t count, std::size_t size);  // NOLINT(bugprone-reserved-identifier)
 
@@ -102,7 +103,7 @@ class NetSnmp {
     snmp_free_pdu(pdu);
   }
 
-  /// net-snmp, too, builds from the buffer's end.
+  /// net-snmp encodes towards the buffer's start, so the request is at the buffer's end.
   [[nodiscard]] std::span<const std::uint8_t> request() const {
     return std::span(buffer_).last(offset_);
   }

@@ -7,7 +7,7 @@
 /// Repeated measurements of one thing, in nanoseconds.
 class Samples {
  public:
-  /// Runs `work` `times` times and keeps the mean as one sample.
+  /// Runs `work` `times` times and keeps the mean time as one sample.
   template <typename Work>
   void measure(int times, Work work) {
     const auto start = std::chrono::steady_clock::now();
@@ -19,7 +19,7 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the value below which the given part of the samples lies; `part` is from 0 to 1.
+  /// Returns the value below which the fraction `part` of the samples lies. `part` is from 0 to 1.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());

@@ -1,5 +1,5 @@
-// Compares a whole query, from the request to the result, with the bare exchange of the same bytes
-// with the same agent, in turns.
+// Compares a whole query, from the request to the result, with a bare exchange of the same bytes
+// with the same agent. The two alternate.
 
 #include <array>
 #include <cstdio>
@@ -18,7 +18,7 @@ constexpr int kQueries = 2000;
 constexpr int kWarmUp = 100;
 
 [[noreturn]] void giveUp(const char* what) {
-  std::fprintf(stderr, "snmp_query_bench: %s; run it as agents.py's command\n", what);
+  std::fprintf(stderr, "snmp_query_bench: %s; run it through tests/snmp/agents.py\n", what);
   std::exit(1);
 }
 
@@ -31,7 +31,7 @@ int main(int argc, char** argv) {
   onramp::snmp_packet packet{};
   std::uint16_t length = 0;
   if (!agent || onramp::snmp_encode_message(request.message(), packet, length)) {
-    giveUp("the argument is no IPv4 address");
+    giveUp("the argument is not an IPv4 address");
   }
 
   Samples query;

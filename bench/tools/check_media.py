@@ -1,7 +1,9 @@
 #!/usr/bin/python3
-"""Time that onramp-check takes for media of many models, beside one of a thousand.
+"""Compares the time that onramp-check takes for media of 1,000 and of more models.
 
-Usage: check_media.py [BUILD], the folder of a release build (default build/release).
+Usage: check_media.py [BUILD]
+
+BUILD is the folder of a release build (default: build/release).
 """
 
 import pathlib

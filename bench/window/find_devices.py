@@ -1,11 +1,13 @@
 #!/usr/bin/python3
-"""The wizard's search beside the ordinary tools, on the same practice network in the same run.
+"""Compares the wizard's search with avahi-browse and snmpget on the same practice network.
 
-Usage: find_devices.py [MEDIUM] (default build/medium of this source tree)
+Usage: find_devices.py [MEDIUM]
 
-Measured is the time from the key press that starts a search until 1 and 50 matching wireless
-devices are in the list; and the time that avahi-browse needs to its last resolved line, followed by
-one snmpget for each device. The pauses of the wizard's wait are no part of either.
+MEDIUM is a built medium (default: build/medium of this source tree).
+
+Measures the time from the key press that starts a search until the list has 1 or 50 wireless
+devices. Compares it with the time that avahi-browse takes to resolve the same devices plus the time
+of one snmpget for each device. Neither time includes the pauses of the wizard's wait.
 """
 
 import os
@@ -34,7 +36,7 @@ GEAR, GEAR_REFRESH = "Actions", 2
 
 
 def time_of_tools(count):
-    """avahi-browse up to the last device that it resolves, then one question to each."""
+    """Returns the time until avahi-browse has resolved the devices and snmpget has asked each."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
                     stderr=subprocess.DEVNULL, text=True)
@@ -53,7 +55,7 @@ def time_of_tools(count):
 
 
 def time_of_wizard(person, text, count):
-    """A refresh empties the list at once; then it fills."""
+    """Returns the time from a refresh, which empties the list, until it has `count` rows."""
     person.see_gone("label", text["INST_WAIT"], 60)
     table = person.see("tree").get_table_iface()
     person.open_menu(GEAR)

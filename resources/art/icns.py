@@ -8,8 +8,9 @@ import pathlib
 import struct
 import sys
 
-# The types that hold PNG data, by the picture's size in pixels. Some sizes have two: one for that
-# many points, one for half as many on a display of twice the density.
+# The types that hold PNG data, by the picture's size in pixels. Some sizes have two types: one for
+# an icon of that many points, and one for an icon of half as many points on a display of twice the
+# density.
 TYPES = {16: ["icp4"], 32: ["icp5", "ic11"], 64: ["ic12"], 128: ["ic07"], 256: ["ic08", "ic13"],
          512: ["ic09", "ic14"], 1024: ["ic10"]}
 

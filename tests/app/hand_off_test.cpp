@@ -11,7 +11,7 @@ namespace fs = std::filesystem;
 
 using HandOff = Wizard;
 
-TEST_F(HandOff, TheOptionsAreTheMediumsPlusFiveThatAreAlwaysThere) {
+TEST_F(HandOff, OptionsFileHoldsTheMediumsOptionsAndFiveStandardOnes) {
   medium.write("Onramp OSX.app/Contents/Resources/SupportedKOL.plist",
                Dictionary{{"Country", Dictionary{{"JP", Dictionary{{"Site", 3}}}, {"DE", true}}}});
   const Dictionary none{{"PKG_WebLink", false},
@@ -49,7 +49,7 @@ TEST_F(HandOff, TheOptionsAreTheMediumsPlusFiveThatAreAlwaysThere) {
   }
 }
 
-TEST_F(HandOff, ADeviceWithoutUsableDataIsHandedOverAsIfByCable) {
+TEST_F(HandOff, ADeviceWithoutUsableDataIsHandedOverLikeACableConnection) {
   describeTwoModels();
   const Value addresses = Array{"192.0.2.7", "192.0.2.8"};
   const Dictionary whole{{"display name", "Office Printer"},
@@ -76,7 +76,7 @@ TEST_F(HandOff, ADeviceWithoutUsableDataIsHandedOverAsIfByCable) {
   EXPECT_EQ(form("All", whole), fallback) << "the medium names no service type";
 }
 
-TEST_F(HandOff, TheSharedFolderIsOpenToEveryoneAndTheUsersOwnIsNot) {
+TEST_F(HandOff, TheSharedFolderIsWritableByEveryoneAndTheUsersIsNot) {
   describeTwoModels();
   const auto permissions = [](const std::string& path) { return fs::status(path).permissions(); };
   const std::string shared = fs::path(medium.optionsFilePath()).parent_path();
@@ -91,10 +91,10 @@ TEST_F(HandOff, TheSharedFolderIsOpenToEveryoneAndTheUsersOwnIsNot) {
 
   fs::permissions(shared, fs::perms::owner_all);
   (void)OnrampOSXAppDelegate::InstallPKGInfoURL();
-  EXPECT_EQ(permissions(shared), fs::perms::owner_all) << "an existing folder keeps them";
+  EXPECT_EQ(permissions(shared), fs::perms::owner_all) << "the folder existed before";
 }
 
-TEST_F(HandOff, TheVendorNameLosesItsBlanksAndInFileNamesItsCapitals) {
+TEST_F(HandOff, TheVendorNameHasNoSpacesAndIsLowerCaseInFileNames) {
   const struct {
     Dictionary resources;
     std::string folder;
@@ -126,7 +126,7 @@ TEST_F(HandOff, ThePackageIsOpenedEvenWhenNothingCanBeWritten) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(HandOff, ASeriesCodeThatMakesNoAddressHasNoSupportPage) {
+TEST_F(HandOff, ASeriesCodeThatMakesNoValidAddressHasNoSupportPage) {
   const std::pair<const char*, const char*> cases[] = {
       {"KS7", "KS7"},         {"a%20b", "a%20b"}, {"a#b", "a#b"},
       {"two words", nullptr}, {"50%", nullptr},   {"50%2", nullptr},

@@ -20,8 +20,8 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// From a list of `models`, which must differ in their cables, to the first one's connection
-  /// page.
+  /// Launches the wizard with a list of `models` and goes to the connection page of the first one.
+  /// The models must differ in their cables, because the wizard otherwise skips the list.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
                               {"Cable", model(true, false, false)}}) {
@@ -32,7 +32,8 @@ class Navigation : public Wizard {
     ASSERT_EQ(page(), "ConnectionTypeView");
   }
 
-  /// From the connection page, by a search that finds nothing, to the end of the set-up tool.
+  /// Starts a search on the connection page that finds nothing. The set-up tool then runs and exits
+  /// with `exitStatus`.
   void searchInVainWithTool(int exitStatus) {
     medium.addSetUpTool(exitStatus);
     screen.click("rightMostButton");
@@ -103,8 +104,8 @@ TEST_F(Navigation, CancelQuitsFromEveryPageAndWritesNothing) {
   }
 }
 
-// The device is switched on while the set-up tool runs, so only the search after it can find it.
-TEST_F(Navigation, TheToolBringsTheChosenModelsDeviceIntoTheNetwork) {
+// The device joins the network after the set-up tool has run, so only the second search finds it.
+TEST_F(Navigation, TheSearchAfterTheToolFindsTheChosenModelsDevice) {
   goToConnectionPage(
       {{"Kestrel Model 100", model(true, true, true)}, {"Kestrel Scan", model(true, false, true)}});
   screen.duringPause = [&](int pause) {
@@ -137,7 +138,7 @@ TEST_F(Navigation, TheToolBringsTheChosenModelsDeviceIntoTheNetwork) {
   };
   screen.log.clear();
   screen.runTimers();
-  EXPECT_EQ(screen.pauses, (Pauses{3, 3})) << "the wait ends with the pause that finds the device";
+  EXPECT_EQ(screen.pauses, (Pauses{3, 3})) << "the wait ends once the device is found";
   EXPECT_EQ(screen.log, (Strings{"key and front", "unhide", "activate", "key and front"}));
   EXPECT_THAT(deviceRows(), ElementsAre("Office 192.0.2.8"));
   EXPECT_THAT(screen.sheets, IsEmpty());
@@ -152,7 +153,7 @@ TEST_F(Navigation, TheToolBringsTheChosenModelsDeviceIntoTheNetwork) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
+TEST_F(Navigation, WithoutAModelListTheChooserLeadsBackToTheConnectionPage) {
   describe({{"Kestrel Model 100", model(true, true, true)}});
   launch();
   const std::string shared = expectedConnectionPage("wiredLan.png", kUSBAndWired);
@@ -162,11 +163,11 @@ TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
     if (pause == 1) appear("Office", "Model 100", 8);
   };
   screen.click("rightMostButton");
-  EXPECT_EQ(screen.pauses, (Pauses{2})) << "the chooser shows what this search has found";
+  EXPECT_EQ(screen.pauses, (Pauses{2})) << "the wait ends once a device is found";
   EXPECT_EQ(page(), "ChooseDeviceView");
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
 
-  // A refresh that finds nothing disables Next, and going back enables it.
+  // A refresh that finds nothing disables Next. Going back enables it again.
   screen.duringPause = nullptr;
   screen.pauses.clear();
   chooseMenuItem(2);
@@ -185,7 +186,7 @@ TEST_F(Navigation, WithoutAListTheChooserLeadsBackToTheSharedConnectionPage) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(Navigation, AToolThatAsksToGoBackShowsTheConnectionPageWithWirelessChosen) {
+TEST_F(Navigation, AToolThatAsksToGoBackLeadsToTheConnectionPageWithWirelessSelected) {
   goToConnectionPage();
   searchInVainWithTool(1);
   EXPECT_EQ(connectionPage(), expectedConnectionPage("wiredLan.png", kUSBAndWired));
@@ -201,7 +202,7 @@ TEST_F(Navigation, AToolThatAsksToGoBackShowsTheConnectionPageWithWirelessChosen
   EXPECT_EQ(screen.log.back(), "hide");
 }
 
-TEST_F(Navigation, AToolThatAsksToQuitEndsTheWizardUnseen) {
+TEST_F(Navigation, AToolThatAsksToQuitEndsTheHiddenWizard) {
   goToConnectionPage();
   searchInVainWithTool(2);
   EXPECT_EQ(screen.log, Strings{"terminate"});
@@ -209,7 +210,7 @@ TEST_F(Navigation, AToolThatAsksToQuitEndsTheWizardUnseen) {
   EXPECT_THAT(screen.opened, IsEmpty());
 }
 
-TEST_F(Navigation, ASheetThatFoundNothingOffersTheSupportPage) {
+TEST_F(Navigation, TheSheetAfterAnEmptySearchOffersTheSupportPage) {
   goToConnectionPage();
   searchInVainWithTool(0);
   ASSERT_EQ(screen.sheets.size(), 1U);
@@ -225,7 +226,7 @@ TEST_F(Navigation, ASheetThatFoundNothingOffersTheSupportPage) {
   EXPECT_THAT(screen.opened, ElementsAre("http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"));
   EXPECT_EQ(buttons(), "[BTN_CANCEL](BTN_NEXT)");
 
-  // The message is a format, in which a percent sign is written twice.
+  // The text is written as a format string, in which "%%" stands for a percent sign.
   medium.setEnvironment("LANG", "en_US.UTF-8");
   medium.write(kEnglishTexts,
                std::string("INST_TXT_ALERT_WIFI_DEVICENOTFOUND = \"100%% of 5%%\";"));
@@ -233,7 +234,7 @@ TEST_F(Navigation, ASheetThatFoundNothingOffersTheSupportPage) {
   EXPECT_EQ(screen.sheets[1].sheet.message, "100% of 5%\n\nPush the gear button");
 }
 
-TEST_F(Navigation, AToolThatCannotBeStartedCountsAsAnyOther) {
+TEST_F(Navigation, AToolThatCannotBeStartedLeadsToTheChooser) {
   goToConnectionPage();
   screen.click("rightMostButton");
   screen.runTimers();
@@ -241,7 +242,7 @@ TEST_F(Navigation, AToolThatCannotBeStartedCountsAsAnyOther) {
   EXPECT_EQ(screen.log.back(), "key and front");
 }
 
-TEST_F(Navigation, AToolStartedFromTheMenuChangesNoPageWhenItAsksToGoBack) {
+TEST_F(Navigation, AToolStartedFromTheMenuKeepsTheChooserWhenItAsksToGoBack) {
   goToConnectionPage();
   searchInVainWithTool(0);
   medium.addSetUpTool(1);
@@ -252,14 +253,14 @@ TEST_F(Navigation, AToolStartedFromTheMenuChangesNoPageWhenItAsksToGoBack) {
   EXPECT_EQ(screen.log, (Strings{"hide", "unhide", "activate", "key and front"}));
 }
 
-TEST_F(Navigation, AWaitTakesItsPausesFromTheOneWhoAsksForIt) {
+TEST_F(Navigation, TheNotificationSetsTheLengthOfTheWaitsPauses) {
   goToConnectionPage();
   delegate->showProgressAtChooseDeviceViewByRefresh(
       {.name = {}, .object = nullptr, .userInfo = {{std::string(kWaitTime), 7}}});
   EXPECT_EQ(screen.pauses, (Pauses{7, 7, 7, 7, 7}));
 }
 
-TEST_F(Navigation, QuittingDuringTheWaitEndsItAtOnce) {
+TEST_F(Navigation, QuittingDuringTheWaitEndsTheWaitAtOnce) {
   goToConnectionPage();
   screen.duringPause = [](int) { terminateApplication(); };
   screen.click("rightMostButton");
@@ -268,7 +269,8 @@ TEST_F(Navigation, QuittingDuringTheWaitEndsItAtOnce) {
   EXPECT_EQ(medium.setUpToolArguments(), "");
 }
 
-// A thread's stack that no system has room for: no thread can be started while this exists.
+// While this object exists, no thread can be started, because the default stack size is larger than
+// any address space.
 class NoThreads {
  public:
   NoThreads() {
@@ -290,7 +292,7 @@ class NoThreads {
   pthread_attr_t before_{};
 };
 
-TEST_F(Navigation, WithoutAThreadTheMainLoopMakesThePauses) {
+TEST_F(Navigation, WhenNoThreadCanStartTheMainLoopMakesThePauses) {
   goToConnectionPage();
   const NoThreads noThreads;
   performOnMainThread([&] { screen.runTimers(); });

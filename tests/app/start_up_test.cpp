@@ -15,7 +15,7 @@ namespace {
 using recording::model;
 using StartUp = Wizard;
 
-TEST_F(StartUp, ListsTheModelsByTheirExactSpellingWhenTheirCablesDiffer) {
+TEST_F(StartUp, ListsTheModelsInByteOrderWhenTheirCablesDiffer) {
   describe({{"abc", model(true, true, true)}, {"ABD", model(true, false, true)}});
   launch();
   EXPECT_EQ(page(), "ModelListView");
@@ -34,7 +34,7 @@ TEST_F(StartUp, SkipsTheListWhenAllModelsShareTheirCables) {
   const std::string usb = expectedConnectionPage("usb.png", "INST_TXT_USB");
   const struct {
     std::vector<Dictionary::Pair> models;
-    std::string connectionPage;  // empty when the list is shown
+    std::string connectionPage;  // empty when the model list is shown
   } cases[] = {{{{"A", model(true, false, true)}}, usb},
                {{{"A", model(true, true, false)}, {"B", model(true, true, true)}}, wired},
                {{{"A", model(false, true, true)}, {"B", model(false, true, true)}}, usb},
@@ -93,7 +93,7 @@ TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
   EXPECT_EQ(buttons(), "[BTN_CANCEL][次へ]");
 }
 
-// Every file below `folder`, with its contents.
+// Returns the contents of every file below `folder`, by path.
 std::map<std::string, std::string> filesBelow(const std::string& folder) {
   std::map<std::string, std::string> files;
   for (const auto& entry : std::filesystem::recursive_directory_iterator(folder)) {
@@ -109,9 +109,9 @@ void leaveFile(const std::string& file) {
   std::ofstream(file) << "left over";
 }
 
-TEST_F(StartUp, RemovesWhatEarlierRunsLeft) {
+TEST_F(StartUp, RemovesTheFilesThatEarlierRunsLeft) {
   describeTwoModels();
-  const pid_t ended = fork();  // a process number that nobody has any more
+  const pid_t ended = fork();  // the identifier of a process that has ended
   if (ended == 0) _exit(0);
   waitpid(ended, nullptr, 0);
   std::vector<std::string> kept;
@@ -122,7 +122,7 @@ TEST_F(StartUp, RemovesWhatEarlierRunsLeft) {
     leaveFile(temporary + std::to_string(ended) + "-0");
     leaveFile(temporary + std::to_string(getpid()) + "-12");
     for (const std::string& other : {temporary + "1-0", temporary + "x-0", file + ".other"}) {
-      leaveFile(other);  // of a running writer, or of somebody else
+      leaveFile(other);  // belongs to a running writer or to another program
       kept.push_back(other);
     }
   }
@@ -137,7 +137,7 @@ TEST_F(StartUp, RemovesWhatEarlierRunsLeft) {
   EXPECT_THAT(found, testing::UnorderedElementsAreArray(kept));
 }
 
-TEST_F(StartUp, ComesUpWhateverTheMediumLacks) {
+TEST_F(StartUp, StartsWhateverTheMediumLacks) {
   const std::string information = "Onramp OSX.app/Contents/Info.plist";
   const std::string missing = "missing";
   const std::string head = "<plist version=\"1.0\"><dict><key>";
@@ -162,10 +162,10 @@ TEST_F(StartUp, ComesUpWhateverTheMediumLacks) {
       const auto before = filesBelow(medium.path(""));
       launch();
       if (file == kEnglishTexts) {
-        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "keys are their own texts";
+        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "missing texts show their keys";
         screen.click("rightButton");
       } else {
-        // A medium without its description has no wireless model, so the wizard is not needed.
+        // No wireless model can be read from such a medium, so the wizard shows no page and ends.
         EXPECT_EQ(page(), "");
         screen.runTimers();
       }
@@ -175,13 +175,13 @@ TEST_F(StartUp, ComesUpWhateverTheMediumLacks) {
   }
 }
 
-TEST_F(StartUp, GoesOnWithoutPagesWhoseInterfaceFilesAreMissing) {
+TEST_F(StartUp, RunsWithoutThePagesWhoseInterfaceFilesAreMissing) {
   describeTwoModels();
   screen.missingInterfaces = {"ModelListView", "ChooseDeviceView"};
   launch();
   EXPECT_EQ(page(), "");
   screen.click("rightMostButton");
-  EXPECT_TRUE(screen.terminated) << "with no page, every button quits";
+  EXPECT_TRUE(screen.terminated) << "without a page, every button quits";
 }
 
 Dictionary version(Value major, Value minor, Value bugFix) {
@@ -209,7 +209,7 @@ TEST_F(StartUp, ChecksTheSystemFirst) {
                {"10.9", none, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
                {"99.9.9", none, none, ""},
                {"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
-               // Outside both bounds: the maximum is checked first.
+               // The system is outside both bounds. The maximum is checked first.
                {"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}};
   for (const auto& c : cases) {
     SCOPED_TRACE(std::string(c.system) + ' ' + c.alert);
@@ -219,7 +219,7 @@ TEST_F(StartUp, ChecksTheSystemFirst) {
     leaveFile(medium.modelFilePath());
     launch();
     EXPECT_EQ(std::filesystem::exists(medium.modelFilePath()), !c.alert.empty())
-        << "no hand-off file is touched before the check";
+        << "only a supported system loses old hand-off files";
     EXPECT_EQ(page(), c.alert.empty() ? "ModelListView" : "");
     ASSERT_EQ(screen.alerts.size(), c.alert.empty() ? 0U : 1U);
     if (c.alert.empty()) continue;
@@ -231,7 +231,7 @@ TEST_F(StartUp, ChecksTheSystemFirst) {
   }
 }
 
-TEST_F(StartUp, FillsTheMinimumIntoOneOrTwoPlaces) {
+TEST_F(StartUp, FillsTheMinimumVersionIntoOneOrTwoPlaceholders) {
   describeTwoModels(Dictionary{{"SystemMin", version(10, 11, 0)}});
   const std::pair<std::string, std::string> texts[] = {{"%@ to %@.", "10.11 to 10.11."},
                                                        {"%@", "10.11"},

@@ -18,7 +18,8 @@ namespace onramp {
 inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
-/// The wizard on a temporary medium and a scripted network, seen and used as a person does.
+/// Runs the wizard from a temporary medium on a scripted network, and sees and uses it as a person
+/// does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {
@@ -28,8 +29,8 @@ class Wizard : public testing::Test {
   }
   void TearDown() override { screen.reset(); }
 
-  /// A medium with a package and the two models "All" (USB, wired, wireless) and "Cable" (USB
-  /// only).
+  /// Writes a medium with a package and two models: "All" (USB, wired, wireless) and "Cable" (USB
+  /// only). `more` holds further entries of Common.plist.
   void describeTwoModels(const Dictionary& more = {}) const {
     describe({{"All", recording::model(true, true, true)},
               {"Cable", recording::model(true, false, false)}},
@@ -56,7 +57,7 @@ class Wizard : public testing::Test {
     screen.launch(*delegate);
   }
 
-  /// The class of the page shown; empty for none, or when there is more than one.
+  /// Returns the class of the page shown. Returns an empty text unless exactly one page is shown.
   [[nodiscard]] std::string page() const {
     const auto& shown = screen.object("mainView").subviews;
     return shown.size() == 1 ? shown.front()->name : "";
@@ -72,12 +73,12 @@ class Wizard : public testing::Test {
 
   void chooseRow(int row) const { screen.object("connectionTypeRadioButton").selectedRow = row; }
 
-  /// Runs a command of the chooser's menu, counted from the top.
+  /// Runs the command at `index` of the chooser's menu, counted from 0.
   void chooseMenuItem(std::size_t index) const {
     screen.object("deviceListPopupButton").items.at(index).second();
   }
 
-  /// A wireless device of the maker Kestrel comes to the network, at 192.0.2.`host`.
+  /// Lets a wireless device of the maker Kestrel appear on the network at 192.0.2.`host`.
   void appear(const std::string& name, const std::string& model, unsigned char host) const {
     const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
     agents.answers["192.0.2." + std::to_string(host)] = {2};
@@ -86,7 +87,7 @@ class Wizard : public testing::Test {
                      recording::txtData({"usb_MFG=Kestrel", "usb_MDL=" + model}));
   }
 
-  /// "name address" of every row of the device list from the top.
+  /// Returns "name address" for every row of the device list, from the top.
   [[nodiscard]] std::vector<std::string> deviceRows() const {
     std::vector<std::string> rows;
     for (const Dictionary& entry : screen.object("deviceListView").content->arrangedObjects()) {
@@ -96,7 +97,8 @@ class Wizard : public testing::Test {
     return rows;
   }
 
-  /// "[title]" of every visible button from left to right, disabled ones as "(title)".
+  /// Returns the visible buttons from left to right: "[title]" for an enabled one, "(title)" for a
+  /// disabled one.
   [[nodiscard]] std::string buttons() const {
     std::string shown;
     for (const char* name : {"leftMostButton", "leftButton", "rightButton", "rightMostButton"}) {
@@ -107,7 +109,7 @@ class Wizard : public testing::Test {
     return shown;
   }
 
-  /// The connection page's heading, explanation, pictures and choices, a line each.
+  /// Returns the connection page's heading, explanation, pictures and choices, one on each line.
   [[nodiscard]] std::string connectionPage() const {
     auto& choices = screen.object("connectionTypeRadioButton").cells;
     std::string shown;
@@ -121,7 +123,7 @@ class Wizard : public testing::Test {
     return shown;
   }
 
-  /// What connectionPage() should be for a model with that picture and those words for a cable.
+  /// Returns the expected connectionPage() of a model whose cable row has `picture` and `choice`.
   [[nodiscard]] std::string expectedConnectionPage(const std::string& picture,
                                                    const std::string& choice) const {
     const std::string images = medium.path("MacResources/Images/");
@@ -129,8 +131,8 @@ class Wizard : public testing::Test {
            "wirelessLan.png\nINST_TXT_WIFI\n" + images + picture + '\n' + choice + '\n';
   }
 
-  /// The desktop was asked to open the package and nothing else; a second later the application
-  /// ends.
+  /// Expects that the desktop was asked to open the package and nothing else, and that the
+  /// application ends a second later.
   void expectPackageOpenedAndQuit() {
     EXPECT_EQ(screen.opened, std::vector{medium.path("Pkg/Kestrel.pkg")});
     EXPECT_FALSE(screen.terminated);

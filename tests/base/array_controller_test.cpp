@@ -14,7 +14,7 @@ Dictionary entry(const std::string& name, const std::string& number = "") {
   return Dictionary{{"name", name}, {"number", number}};
 }
 
-// The names of all entries, the selected one in brackets.
+// Returns the names of all entries, with the selected one in brackets.
 std::string shown(const ArrayController& list) {
   std::string text;
   for (std::size_t i = 0; i < list.arrangedObjects().size(); ++i) {
@@ -25,7 +25,7 @@ std::string shown(const ArrayController& list) {
   return text;
 }
 
-TEST(ArrayController, SelectsTheFirstEntryAddedToAnEmptyListAndTellsTheTable) {
+TEST(ArrayController, SelectsTheFirstEntryAddedToAnEmptyListAndNotifiesTheTable) {
   ArrayController list;
   std::string calls;
   list.bind([&] { calls += shown(list) + "; "; },

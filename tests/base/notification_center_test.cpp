@@ -5,7 +5,7 @@
 namespace onramp {
 namespace {
 
-TEST(NotificationCenter, CallsTheObserversOfANameInOrderWhateverTheHandlersDo) {
+TEST(NotificationCenter, CallsObserversInOrderEvenWhenHandlersAddAndRemoveThem) {
   NotificationCenter center;
   std::string log;
   const char a = 'a', b = 'b', c = 'c';  // observers, identified by their addresses
@@ -29,7 +29,7 @@ TEST(NotificationCenter, CallsTheObserversOfANameInOrderWhateverTheHandlersDo) {
   center.post({"x", nullptr, {{"text", std::string("first")}}});
   EXPECT_EQ(log, "first( cy ) cx ");
   center.post({"x", nullptr, {}});
-  EXPECT_EQ(log, "first( cy ) cx cx cx ") << "the observer added meanwhile is called from now on";
+  EXPECT_EQ(log, "first( cy ) cx cx cx ") << "the observer added by a handler is called";
 }
 
 }  // namespace

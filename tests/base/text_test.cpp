@@ -11,7 +11,8 @@ namespace {
 
 using namespace std::literals;
 
-// The characters of `bytes`, each byte that begins none as "?", written again.
+// Reads the characters of `bytes` and writes them again. A byte that starts no valid character
+// becomes "?".
 std::string readAndWritten(std::string_view bytes) {
   std::string text;
   while (!bytes.empty()) {
@@ -25,7 +26,7 @@ std::string readAndWritten(std::string_view bytes) {
   return text;
 }
 
-TEST(UTF8, IsReadByTheCharacterAndRefusedByTheByte) {
+TEST(UTF8, IsReadByCharacterAndRefusedByteByByte) {
   for (const char* const whole :
        {"", "a\x7F", "\u0080\u07FF", "\u0800\uD7FF\uE000\uFFFF", "\U00010000\U0010FFFF"}) {
     EXPECT_EQ(readAndWritten(whole), whole);
@@ -41,14 +42,14 @@ TEST(UTF8, IsReadByTheCharacterAndRefusedByTheByte) {
   }
 }
 
-TEST(UTF8, HoldsNoSurrogates) {
+TEST(UTF8, ReplacesInvalidCodePointsWhenTheyAreAppended) {
   std::string text;
   for (const char32_t unit : {0xD800U, 0xDFFFU, 0x110000U})
     appendUTF8(text, unit);
   EXPECT_EQ(text, "\uFFFD\uFFFD\uFFFD");
 }
 
-TEST(DecodedText, ComesFromBothEncodingsWithAndWithoutAMark) {
+TEST(DecodedText, IsReadFromUTF8AndUTF16WithAndWithoutAByteOrderMark) {
   const std::string little = "k\0\x21\x6B\x3D\xD8\xA8\xDD"s;
   const std::string big = "\0k\x6B\x21\xD8\x3D\xDD\xA8"s;
   for (const std::string& bytes :
@@ -62,7 +63,7 @@ TEST(DecodedText, ComesFromBothEncodingsWithAndWithoutAMark) {
   }
 }
 
-TEST(ASCII, KnowsLettersAndDigitsOnly) {
+TEST(ASCII, ConvertsLettersAndHexDigitsOnly) {
   EXPECT_EQ(asciiLowercased("AZaz@[`{09\xC4"s), "azaz@[`{09\xC4");
   EXPECT_EQ(asciiUppercased("AZaz@[`{09\xE4"s), "AZAZ@[`{09\xE4");
   std::string digits;

@@ -39,14 +39,14 @@ TEST(Value, IsTrueWhenItIsANumberOtherThanZero) {
   }
 }
 
-TEST(Value, IsSignedWhereverItFits) {
+TEST(Value, HoldsAnIntegerAsSignedWhenItFits) {
   EXPECT_EQ(Value(std::uint64_t{5}), Value(5));
   EXPECT_EQ(Value(std::uint64_t{1} << 63).as<std::int64_t>(), nullptr);
   EXPECT_FALSE(Value(1) == Value(true));
   EXPECT_FALSE(Value(1) == Value(1.0));
 }
 
-TEST(Dictionary, KeepsTheFirstOfEqualKeysInTheOrderOfTheKeys) {
+TEST(Dictionary, KeepsTheFirstOfEqualKeysAndSortsTheKeys) {
   std::vector<Dictionary::Pair> many;
   for (int i = 1; i <= 100; ++i)
     many.emplace_back(std::string(1, "bBa"[i % 3]), i);
@@ -60,7 +60,7 @@ TEST(Dictionary, KeepsTheFirstOfEqualKeysInTheOrderOfTheKeys) {
   EXPECT_EQ(Dictionary().with("k", 1), (Dictionary{{"k", 1}}));
 }
 
-TEST(Dictionary, GivesAValueOfTheRightKindOnly) {
+TEST(Dictionary, ReturnsOnlyValuesOfTheRequestedType) {
   const Dictionary inner{{"k", "v"}};
   const Dictionary record{{"text", "5"}, {"flag", true}, {"inner", inner}, {"list", Array{1}}};
   EXPECT_EQ(record.string("text"), "5");

@@ -96,7 +96,8 @@ TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // The first of them counted, so two are left, and the next resolve makes removals count again.
+  // Only the first removal counted, so the service is still counted twice. After the next resolve,
+  // removals count again.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());
@@ -134,7 +135,7 @@ TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
   EXPECT_EQ(recorder->events.back(), (Event{"resolved", nullptr}));
 }
 
-TEST_F(BrowserTest, StoppingDropsAllSilentlyAndARestartBeginsClean) {
+TEST_F(BrowserTest, StoppingForgetsEverythingWithoutEventsAndARestartBeginsEmpty) {
   network.found(onOne);
   browser->stopBrowsing();
   EXPECT_FALSE(Network::isResolving(onOne));
@@ -163,7 +164,7 @@ TEST_F(BrowserTest, ABrowseThatCannotStartLeavesAnIdleBrowser) {
   EXPECT_THAT(network.log, IsEmpty());
 }
 
-TEST_F(BrowserTest, AnObserverMayEndTheBrowserFromWithin) {
+TEST_F(BrowserTest, AnObserverMayDestroyTheBrowser) {
   recorder->also = [this] { browser.reset(); };
   network.found(onOne);
   EXPECT_EQ(browser, nullptr);

@@ -1,4 +1,4 @@
-"""What the tests and benchmarks of discovery share."""
+"""Helpers that the tests and benchmarks of discovery share."""
 
 import os
 import pathlib
@@ -12,11 +12,11 @@ import time
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
 PRACTICE_NETWORK = ROOT / "tools" / "practice-network"
-PATIENCE = 30  # Seconds until something counts as not happening at all.
+PATIENCE = 30  # Seconds after which a missing event counts as a failure.
 
 
 def enclose(description):
-    """Starts this program over on a practice network of two hosts, unless it runs on one."""
+    """Restarts this program on a practice network of two hosts, unless it already runs on one."""
     if "ONRAMP_PRACTICE_SOCKET" in os.environ:
         return
     os.execv(sys.executable, [sys.executable, "-B", str(PRACTICE_NETWORK), "--hosts", "2",
@@ -24,7 +24,7 @@ def enclose(description):
 
 
 class Process:
-    """A running program whose lines of output can be waited for; ends with its input."""
+    """A running program whose output lines can be waited for. It ends when its input is closed."""
 
     def __init__(self, *command, **options):
         self._process = subprocess.Popen([str(word) for word in command], text=True,
@@ -47,10 +47,10 @@ class Process:
                 self._news.notify_all()
 
     def wait(self, condition, patience=PATIENCE):
-        """Waits until `condition` of the lines so far holds and returns it; raises if it never does."""
+        """Returns `condition(lines)` once it is true. Raises after `patience` seconds."""
         with self._news:
             if not self._news.wait_for(lambda: condition(self.lines), patience):
-                raise AssertionError("it never happened; the output was:\n" + "\n".join(self.lines))
+                raise AssertionError("no expected line in this output:\n" + "\n".join(self.lines))
             return condition(self.lines)
 
     def end(self, patience=PATIENCE):
@@ -63,7 +63,7 @@ class Process:
 
 
 class Search(Process):
-    """A running `bonjour_probe search`; its lines are events of time, word, name and more."""
+    """A running `bonjour_probe search`. Each line is an event: time, word, name and details."""
 
     def __init__(self, probe, service_type, **options):
         super().__init__(probe, "search", service_type + ".", **options)
@@ -74,7 +74,7 @@ class Search(Process):
                 if word in (None, event[1]) and name in (None, event[2])]
 
     def wait_for(self, word, name, count=1):
-        """The last of at least `count` events of that kind, as its fields."""
+        """Waits for `count` events of that kind and returns the fields of the latest one."""
         return self.wait(lambda _: len(self.events(word, name)) >= count
                          and self.events(word, name)[-1])
 
@@ -83,7 +83,7 @@ class Search(Process):
 
 
 class Avahi:
-    """This host's Avahi daemon, to be killed, frozen and started again."""
+    """This host's Avahi daemon, which tests kill, freeze and restart."""
 
     configuration = pathlib.Path("/run/practice-network/avahi-daemon.conf")
     pid_file = pathlib.Path("/run/avahi-daemon/pid")
@@ -91,7 +91,7 @@ class Avahi:
     def kill(self):
         process = pathlib.Path("/proc", str(self._pid()))
         os.kill(self._pid(), signal.SIGKILL)
-        # A new one does not start while there is any trace of the old one.
+        # A new daemon does not start until the old process is gone.
         deadline = time.monotonic() + PATIENCE
         while process.exists():
             if time.monotonic() > deadline:
@@ -105,7 +105,7 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts it with changed `settings`, which are named with "_" for "-"."""
+        """Starts the daemon with changed `settings`, whose names have "_" in place of "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="
@@ -121,7 +121,7 @@ class Avahi:
         self.start(**settings)
 
     def wait_for_interfaces(self, service_type, names):
-        """Waits until services of that type are seen on exactly those interfaces."""
+        """Waits until services of that type are seen on exactly the interfaces `names`."""
         deadline = time.monotonic() + PATIENCE
         seen = None
         while seen != names:
@@ -136,8 +136,8 @@ class Avahi:
 
 
 def announce_pointer(service_type, target_labels):
-    """Announces (RFC 6762 section 8.3) that `service_type` has an instance of those labels, and
-    nothing else of it."""
+    """Announces (RFC 6762 section 8.3) that `service_type` has an instance with those labels.
+    Announces no other record of the instance."""
     name = _labels(*service_type.encode().split(b"."), b"local")
     target = _labels(*target_labels)
     packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name

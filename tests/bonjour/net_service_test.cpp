@@ -52,7 +52,7 @@ TEST_F(NetServiceTest, ABrowseThatCannotStartLeavesNoBrowser) {
   EXPECT_EQ(KSNetServiceBrowserStop(nullptr), 1);
 }
 
-TEST_F(NetServiceTest, BrowseEventsReachTheirSlotWithFlagsUnchanged) {
+TEST_F(NetServiceTest, BrowseEventsReachTheirCallbackWithFlagsUnchanged) {
   auto& all = recordingCallbacks();
   ServiceClientCallbacks none;
   for (auto* const callbacks : std::vector<ServiceClientCallbacks*>{&all, &none, nullptr}) {
@@ -63,7 +63,7 @@ TEST_F(NetServiceTest, BrowseEventsReachTheirSlotWithFlagsUnchanged) {
   EXPECT_THAT(events, ElementsAre("add 3", "remove 9"));
 }
 
-TEST_F(NetServiceTest, AResolveHasNoTimeLimitAndIsRetriedUntilItSucceedsOnce) {
+TEST_F(NetServiceTest, AResolveHasNoTimeLimitAndIsRetriedUntilItSucceeds) {
   KSNetServiceResolveAsync(service, nullptr);
   EXPECT_EQ(KSNetServiceResolveAsync(service, &recordingCallbacks()), 0);
   EXPECT_THAT(network.timeouts, ElementsAre(0.0, 0.0));
@@ -82,7 +82,7 @@ TEST_F(NetServiceTest, AResolveHasNoTimeLimitAndIsRetriedUntilItSucceedsOnce) {
   EXPECT_EQ(KSNetServiceCancelResolve(nullptr), 1);
 }
 
-TEST_F(NetServiceTest, OnlyIPv4AddressesAreListedInOrderWithDuplicates) {
+TEST_F(NetServiceTest, OnlyIPv4AddressesAreListedInTheirOrderWithDuplicates) {
   EXPECT_EQ(KSNetServiceCopyIPv4Addresses(nullptr), std::nullopt);
   Network::fill(service, {ipv6Address()}, {});
   EXPECT_EQ(KSNetServiceCopyIPv4Addresses(service), std::nullopt);
@@ -93,7 +93,7 @@ TEST_F(NetServiceTest, OnlyIPv4AddressesAreListedInOrderWithDuplicates) {
               Optional(ElementsAre("192.0.2.255", "10.0.0.1", "192.0.2.255")));
 }
 
-TEST_F(NetServiceTest, IdentityComesFromTheKeysOfTheServiceType) {
+TEST_F(NetServiceTest, ManufacturerAndModelComeFromTheKeysOfTheServiceType) {
   const Data txt = txtData({"usb_MFG=Kestrel", "usb_MDL=Model 100", "mfg=Harrier", "mdl=Model 7",
                             "note=2nd floor", "pdl=application/pdf,Image/URF"});
   for (const auto& [type, identity] : {std::pair{"_ipp._tcp.", "Kestrel Model 100"},
@@ -113,7 +113,7 @@ TEST_F(NetServiceTest, IdentityComesFromTheKeysOfTheServiceType) {
   }
 }
 
-TEST_F(NetServiceTest, UnusableTxtDataGivesNoTexts) {
+TEST_F(NetServiceTest, UnusableTxtDataGivesNoValues) {
   Data cutShort = txtData({"usb_MDL=Model 100", "note=here"});
   cutShort.pop_back();
   const Data notTexts = txtData({"usb_MDL=\xff", "note=\xc0\x80", "pdl"});
@@ -131,7 +131,7 @@ TEST_F(NetServiceTest, UnusableTxtDataGivesNoTexts) {
   }
 }
 
-TEST_F(NetServiceTest, TheSystemVersionChoosesTheURIScheme) {
+TEST_F(NetServiceTest, TheSystemVersionDeterminesTheURIScheme) {
   MediumFolder medium;
   for (const auto& [version, scheme] :
        {std::pair{"10.9.5", "dnssd"}, {"10.6.0", "dnssd"}, {"10.5.8", "mdns"}, {"none", "mdns"}}) {

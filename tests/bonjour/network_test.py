@@ -1,6 +1,7 @@
-"""Discovery against real daemons: network_test.py PROBE CHOOSER_PROBE INFO_PLIST. It runs on two hosts joined by two cables,
-with IPv4 and IPv6. The devices are those of Avahi on the other host, and of another implementation
-on this one."""
+"""Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE INFO_PLIST.
+
+The tests run on two hosts that are joined by two cables, with IPv4 and IPv6. Avahi announces the
+other host's devices. Another mDNS implementation, zeroconf, announces one device of this host."""
 
 import os
 import pathlib
@@ -27,14 +28,14 @@ ETH_P_ALL = 3
 
 
 def packets():
-    """A socket that sees what comes and goes on any interface."""
+    """Returns a socket that receives every packet on every interface."""
     opened = socket.socket(socket.AF_PACKET, socket.SOCK_DGRAM, socket.htons(ETH_P_ALL))
     opened.settimeout(discovery.PATIENCE)
     return opened
 
 
 def asked(seen, last):
-    """The addresses to which SNMP questions go, until one goes to `last`."""
+    """Returns the destinations of SNMP requests, up to the first request to `last`."""
     addresses = []
     while last not in addresses:
         packet = seen.recv(100)
@@ -62,13 +63,13 @@ class NetworkTest(unittest.TestCase):
             for name in names:
                 _, _, _, model, _, uri, address = search.wait_for("update", name)
                 self.assertEqual(model, "Kestrel Model 100")
-                if "." in name:  # Dots are not escaped, so such a URI need not lead back.
+                if "." in name:  # A URI does not escape dots, so the name may be misread.
                     continue
                 answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True,
                                         stdout=subprocess.PIPE, check=True).stdout
                 self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
 
-    def test_a_device_has_all_its_ipv4_addresses_and_no_other(self):
+    def test_a_device_has_all_its_ipv4_addresses_and_no_others(self):
         self.add("Three", addresses=3)
         self.add("Mixed", addresses=["fd00::7", "192.0.2.77"])
         self.add("Six", addresses=["fd00::8"])
@@ -77,7 +78,7 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Mixed")[6], "192.0.2.77")
             self.assertEqual(search.wait_for("update", "Six")[6], "")
 
-    def test_a_second_implementation_is_understood(self):
+    def test_a_second_mdns_implementation_is_understood(self):
         def service(**texts):
             return ServiceInfo(f"{TYPE}.local.", f"Harrier (2).{TYPE}.local.", port=631,
                                addresses=[socket.inet_aton("192.0.2.1")], server="second.local.",
@@ -90,7 +91,7 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Harrier (2)")[3:7:3],
                              ["Harrier Jet 7", "192.0.2.1"])
             responder.update_service(service(usb_MDL="Jet 8"))
-            # A running search does not see the change, and Avahi does not at once.
+            # A running search does not notice the change. Avahi needs some time to notice it.
             model = None
             deadline = time.monotonic() + discovery.PATIENCE
             while model != "Harrier Jet 8" and time.monotonic() < deadline:
@@ -111,13 +112,14 @@ class NetworkTest(unittest.TestCase):
                         self.assertEqual(search.wait_for("update", "Dual")[6], "192.0.2.66")
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
-                        # All sightings have ended before another device has found its name free.
+                        # A new device is announced only after its name has been checked. By then,
+                        # all sightings of the old one have ended.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],
                                          ["found", "update", "gone", "remove"])
 
-    def test_a_device_on_two_interfaces_leaves_with_the_second(self):
+    def test_a_device_on_two_interfaces_leaves_with_the_last_one(self):
         for interface in ("practice0", "practice1"):
             self.addCleanup(self.network.plug, interface)
         uri = "dnssd://Kestrel._ipp._tcp.local."
@@ -125,7 +127,7 @@ class NetworkTest(unittest.TestCase):
             address = search.wait_for("update", "Kestrel")[6]
             for lost, left in (("practice0", "practice1"), ("practice1", "practice0")):
                 self.network.unplug(lost)
-                # Until this daemon has seen it, too.
+                # This host's daemon notices the loss a little later.
                 self.avahi.wait_for_interfaces(TYPE, {left})
                 answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True, check=True,
                                         stdout=subprocess.PIPE).stdout
@@ -140,7 +142,7 @@ class NetworkTest(unittest.TestCase):
             search.wait_for("update", "Kestrel", 2)
             self.assertEqual(len(search.events("found", "Kestrel")), 2)
 
-    def test_the_wizard_asks_a_device_that_leaves_nothing(self):
+    def test_the_wizard_does_not_ask_a_device_that_leaves(self):
         medium = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
         shutil.copytree(discovery.ROOT / "examples" / "medium", medium, dirs_exist_ok=True)
         contents = medium / "Onramp OSX.app" / "Contents"
@@ -171,7 +173,7 @@ class NetworkTest(unittest.TestCase):
             self.network.remove("Far")
             search.wait_for("remove", "Far")
 
-    def test_many_devices_are_found_also_by_a_daemon_that_refuses(self):
+    def test_many_devices_are_found_even_by_a_daemon_with_a_low_limit(self):
         self.addCleanup(self.avahi.restart)
         for limit, count in (("5", 6), ("1024", 200)):
             names = {f"Flock {number} of {count}" for number in range(count)}
@@ -193,7 +195,7 @@ class NetworkTest(unittest.TestCase):
             self.avahi.start()
             self.assertEqual(search.end(), 0)
 
-    def test_the_message_bus_may_come_late(self):
+    def test_the_message_bus_may_start_late(self):
         late = pathlib.Path("/run/late_bus")
         self.addCleanup(late.unlink)
         with socket.socket(socket.AF_UNIX) as refusing:
@@ -208,18 +210,18 @@ class NetworkTest(unittest.TestCase):
         with search:
             search.wait_for("update", "Kestrel")
 
-    def test_a_daemon_that_hangs_holds_no_one_up(self):
+    def test_a_daemon_that_hangs_does_not_block_the_program(self):
         with Search(PROBE, TYPE) as search:
             search.wait_for("update", "Kestrel")
             self.avahi.freeze()
             self.addCleanup(self.avahi.thaw)
-            # Avahi's own calls and the bus's give up after 25 seconds.
+            # Calls to Avahi and to the bus time out after 25 seconds. The probe must end sooner.
             self.assertEqual(subprocess.run(
                 [PROBE, "addresses", "dnssd://Kestrel._ipp._tcp.local.", "1"], check=False,
                 stdout=subprocess.DEVNULL, timeout=20).returncode, 1)
             self.assertEqual(search.end(20), 0)
 
-    def test_odd_neighbours_disturb_no_one(self):
+    def test_odd_announcements_do_no_harm(self):
         instance = [b"Ghost", *TYPE.encode().split(b"."), b"local"]
         with Search(PROBE, TYPE) as search:
             for labels in (instance, [b"Odd", b"_no type", b"tcp", b"local"], [b"\xff\x00\x1b"],

@@ -1,9 +1,9 @@
-// Runs a search or a look-up on the real network and prints its events, one a line: seconds since
-// the start, the event, and what it concerns. Tests and benchmarks run it on a practice network. It
-// ends when its standard input does.
+// Runs a search or a look-up on the real network and prints its events, one on each line: the
+// seconds since the start, the event and its details. Tests and benchmarks run this program on a
+// practice network. A search ends when the standard input is closed.
 //
-//   bonjour_probe search TYPE       a KSBonjourSearch for TYPE
-//   bonjour_probe addresses URI SECONDS
+//   bonjour_probe search TYPE            searches for services of TYPE with KSBonjourSearch
+//   bonjour_probe addresses URI SECONDS  looks up the addresses of the device that URI names
 
 #include <sys/resource.h>
 #include <unistd.h>
@@ -124,7 +124,7 @@ int run(const std::vector<std::string>& arguments) {
 
 }  // namespace
 
-// What a search asks of the medium and the system.
+// Stand-ins for the medium and the system version, which a search reads.
 
 Bundle Bundle::main() {
   return Bundle("/medium/Onramp OSX.app");

@@ -78,13 +78,13 @@ TEST_F(SearchTest, ADeviceLeavesWithItsLastInterface) {
   EXPECT_EQ(*recorder->last.array(KSDevice::kBonjourServiceType), Array());
 }
 
-TEST_F(SearchTest, AResolutionThatNoBrowserHoldsIsAnAddition) {
+TEST_F(SearchTest, AResolvedServiceThatNoBrowserHasFoundIsAnAddition) {
   search->resolvedBonjourService(Network::service("Kestrel", "_scanner._tcp."));
   search->resolvedBonjourService(nullptr);
   EXPECT_THAT(recorder->events, ElementsAre("add Kestrel"));
 }
 
-TEST_F(SearchTest, StoppedBrowsersStayAndAnswerNothing) {
+TEST_F(SearchTest, ARestartedSearchUsesTheNewTypeAndForgetsOldServices) {
   network.found(onOne);
   EXPECT_EQ(search->supportTypes("Kestrel", "local."), Array{"_ipp._tcp."});
   EXPECT_EQ(search->supportTypes(std::nullopt, "local."), Array());
@@ -102,7 +102,7 @@ TEST_F(SearchTest, StoppedBrowsersStayAndAnswerNothing) {
   EXPECT_EQ(*recorder->last.array(KSDevice::kBonjourServiceType), Array{"_pdl-datastream._tcp."});
 }
 
-TEST_F(SearchTest, AnObserverMayDropTheSearchFromWithin) {
+TEST_F(SearchTest, AnObserverMayDestroyTheSearch) {
   const std::weak_ptr<KSBonjourSearch> first = search;
   recorder->also = [this] {
     search->stopBrowsing();

@@ -1,5 +1,5 @@
-// Any bytes as a TXT record: read within their bounds, and every attribute that is written out with
-// its length is found again.
+// Reads every input as a TXT record. Then writes up to 250 bytes of the input as an attribute's
+// value and expects to read the same value back.
 
 #include <cstdint>
 #include <cstdlib>

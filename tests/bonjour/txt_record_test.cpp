@@ -26,7 +26,7 @@ TEST(TxtRecord, ReadsAttributesAsTheyAreOnTheWire) {
   EXPECT_EQ(record->value("absent"), std::nullopt);
 }
 
-TEST(TxtRecord, DataThatEndsWithinAStringIsNone) {
+TEST(TxtRecord, DataThatEndsWithinAStringIsRefused) {
   const Data whole = txtData({"a=1", "b=22"});
   for (std::size_t size = 0; size <= whole.size(); ++size) {
     const bool betweenStrings = size == 0 || size == 4 || size == whole.size();

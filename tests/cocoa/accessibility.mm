@@ -1,11 +1,13 @@
-// Tells a program outside what is on the screen, since GNUstep has no accessibility. The tests'
-// build links it into the application; gnustep_person.py is the other half of the protocol.
+// Tells another program which controls are on the screen, because GNUstep has no accessibility
+// interface. The test build links this file into the application. gnustep_person.py is the other
+// half of the protocol.
 //
-// ONRAMP_ACCESSIBILITY_FILE names the answer's file. To ask, create the file of that name with
-// ".question" appended. The application's loop removes the question and writes the answer: a JSON
-// array of all visible controls, each an object with role, name, states and frame (x, y, width and
-// height in pixels from the screen's upper left corner). Roles and states are named as in AT-SPI.
-// The first object has the role "application" and the number of mouse presses handled so far.
+// ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the other program creates a question
+// file, which has the same name with ".question" appended. The application's loop removes the
+// question file and writes the answer: a JSON array of all visible controls. Each is an object with
+// role, name, states and frame (x, y, width and height in pixels from the screen's upper left
+// corner). Roles and states have their AT-SPI names. The first object has the role "application"
+// and the number of mouse presses handled so far.
 
 #include <unistd.h>
 
@@ -82,7 +84,7 @@ class Reader {
     }
   }
 
-  // A row is one item in a list, and one cell per column in a table with headers.
+  // Reports each row as one list item or, in a table with headers, as one cell per column.
   void readTable(NSTableView* table) {
     NSString* const role = [table headerView] ? @"table cell" : @"list item";
     const NSRange rows = [table rowsInRect:[table visibleRect]];

@@ -1,7 +1,7 @@
 """A person at the screen of the Cocoa front end under GNUstep.
 
-GNUstep has no AT-SPI. Instead the program, asked through a file, writes down the controls that are
-visible, by the same roles (accessibility.mm).
+GNUstep has no AT-SPI. Instead, this module asks the program through a file, and the program writes
+down its visible controls with their AT-SPI roles. See accessibility.mm for the protocol.
 """
 
 import itertools
@@ -14,7 +14,7 @@ from onscreen.person import Person
 from onscreen.processes import start, wait_for
 
 _SYSTEM_CONFIGURATION = pathlib.Path("/etc/GNUstep/GNUstep.conf")
-_LOOK_SECONDS = 60  # GNUstep is slow where much else runs
+_LOOK_SECONDS = 60  # GNUstep is slow on a busy machine
 _ANSWER_SECONDS = 60
 _PRESS_SECONDS = 20
 _MENU_PRESS_SECONDS = 3
@@ -24,7 +24,7 @@ _MENU_BAR_ITEM = "Onramp OSX"
 class GNUstepPerson(Person):
     """Starts a program on a desktop and uses it. Use it in a `with` statement."""
 
-    errors = ()  # raised by the use of a control that is gone
+    errors = ()  # using a control that has vanished raises nothing
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
@@ -56,8 +56,9 @@ class GNUstepPerson(Person):
         self._point_at(control)
         before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
-        # Released before GNUstep has noticed the press, the button looks released first. Presses
-        # inside an open menu, which grabs the mouse, are never counted.
+        # The button stays down until GNUstep has noticed the press. Otherwise, GNUstep sees it
+        # released from the start. Presses inside an open menu are never counted, because the menu
+        # grabs the mouse.
         patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
         deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:
@@ -68,25 +69,26 @@ class GNUstepPerson(Person):
         return self._read()[0]["presses"] if self.is_running() else 0
 
     def choose_from_menu(self, button, item):
-        """Chooses a button's `item`th menu entry. The menu is open while the mouse button is held."""
+        """Chooses entry number `item` of a button's menu, which a held mouse button keeps open."""
         self._point_at(self.see("button menu", button))
         self.desktop.run(["xdotool", "mousedown", "1"])
         nudge = itertools.cycle((0, 1))
 
         def noticed():
-            # The menu's window moves into place late, so the entries are looked up at every try. A
-            # pointer that has not moved since before the menu was ready is never noticed.
+            # The menu's window moves after it has opened, so every try looks up the entries again.
+            # The pointer moves at every try, because GNUstep ignores a pointer that has not moved
+            # since the menu became ready.
             entries = self._menu_entries()
             if not entries:
                 return False
             self._point_at(entries[item - 1], next(nudge))
             return self.has_state((self._menu_entries() or entries)[item - 1], "selected")
 
-        wait_for(noticed, _LOOK_SECONDS, f"entry {item} of {button!r} to be noticed")
+        wait_for(noticed, _LOOK_SECONDS, f"entry {item} of {button!r} to be selected")
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):
-        """The entries of the open menu, without the menu bar's."""
+        """Returns the entries of the open menu, or None. Leaves out the menu bar's own entry."""
         items = [control for control in self._read() if control["role"] == "menu item"]
         return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
 
@@ -99,7 +101,7 @@ class GNUstepPerson(Person):
         return self._at_rest(role, name)
 
     def _at_rest(self, role, name):
-        """The control once it has stopped moving: the window manager moves a new window."""
+        """Returns the control once it stands still. The window manager moves a new window."""
         seen = None
         while True:
             now = self._look(role, name)
@@ -116,7 +118,7 @@ class GNUstepPerson(Person):
         self._read()
 
     def _read(self):
-        """The visible controls; blocks while the program's loop is blocked."""
+        """Returns the visible controls. Blocks while the program's loop is blocked."""
         self._answer.unlink(missing_ok=True)
         self._question.touch()
         wait_for(lambda: self._answer.exists() or not self.is_running(), _ANSWER_SECONDS,
@@ -127,7 +129,7 @@ class GNUstepPerson(Person):
             return [{"role": "application", "name": "", "states": [], "presses": 0}]
 
     def _configure(self, folder):
-        """Writes the system's GNUstep configuration with this desktop's folders."""
+        """Writes a GNUstep configuration with this desktop's folders and returns its path."""
         own = {"GNUSTEP_USER_DIR_LIBRARY": os.path.relpath(self.desktop.user_folder, folder),
                "GNUSTEP_LOCAL_LIBRARY": str(self.desktop.local_folder)}
         lines = [line for line in _SYSTEM_CONFIGURATION.read_text(encoding="utf-8").splitlines()
@@ -140,7 +142,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """The environment that stands for the options: the Cocoa front end has none."""
+        """Returns variables that replace the options, which the Cocoa front end does not have."""
         if not arguments:
             return {}
         option, value = arguments

@@ -1,6 +1,6 @@
 """With this folder in PYTHONPATH, every test of tests/window uses the Cocoa front end under GNUstep.
 
-Python imports it as it starts, in the processes that a test starts as well.
+Python imports this module when it starts, also in the processes that a test starts.
 """
 
 import pathlib

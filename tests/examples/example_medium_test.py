@@ -1,4 +1,4 @@
-"""Holds the example medium against what the sources read, beyond what onramp-check sees."""
+"""Checks the example medium against the sources, in ways that onramp-check does not."""
 
 import ast
 import itertools
@@ -21,7 +21,7 @@ TEXT = r'"(?:[^"\\]|\\.)*"'
 
 
 def strings_table(path):
-    """The key/text pairs of a text strings table; anything else in it is an error."""
+    """Returns the key/text pairs of a strings table. Raises ValueError for anything else in it."""
     rest = re.sub(r"/\*.*?\*/", "", path.read_text(encoding="utf-8"), flags=re.DOTALL)
     table = {}
     entry = re.compile(rf'\s*({TEXT}|\w+)\s*=\s*({TEXT})\s*;\s*')
@@ -32,7 +32,7 @@ def strings_table(path):
             raise ValueError(f"{path}: not an entry: {rest[at:at + 60]!r}")
         key, text = match[1].strip('"'), ast.literal_eval(match[2])
         if key in table:
-            raise ValueError(f"{path}: {key} stands there twice")
+            raise ValueError(f"{path}: {key} occurs twice")
         table[key] = text
         at = match.end()
     return table
@@ -48,7 +48,7 @@ def sources():
 
 
 class Messages(unittest.TestCase):
-    def test_the_fallbacks_in_the_sources_are_filled_like_the_texts(self):
+    def test_fallbacks_in_the_sources_have_the_placeholders_of_the_texts(self):
         calls = re.findall(rf"localized\(\s*{KEY},\s*((?:{TEXT}\s*)+)\)", sources())
         fallbacks = {key: ast.literal_eval(f"({text})") for key, text in calls}
         self.assertIn("INST_TXT_ALERT_OSMIN", fallbacks)
@@ -56,7 +56,7 @@ class Messages(unittest.TestCase):
         self.assertEqual({key: english[key].count("%@") for key in fallbacks},
                          {key: text.count("%@") for key, text in fallbacks.items()})
 
-    def test_descriptions_name_the_next_button_as_it_is_titled(self):
+    def test_descriptions_call_the_next_button_by_its_title(self):
         for language in LANGUAGES:
             table = messages(language)
             for key in ("INST_TXT_MODEL_DESC", "INST_TXT_CONNECTIONTYPE_DESC"):
@@ -83,7 +83,7 @@ class Medium(unittest.TestCase):
 
 
 class ApplicationResources(unittest.TestCase):
-    def test_countries_are_keyed_by_codes_in_capitals(self):
+    def test_country_keys_are_codes_in_capitals(self):
         countries = plistlib.loads((RESOURCES / "SupportedKOL.plist").read_bytes())["Country"]
         self.assertEqual([], [code for code in countries if not re.fullmatch("[A-Z]{2}", code)])
 

@@ -1,4 +1,4 @@
-// What the macOS backends do with the frameworks' objects, on frameworks that stand in for them.
+// Tests how the macOS backends use the frameworks' objects, with stand-ins for the frameworks.
 
 #include <CoreServices/CoreServices.h>
 #include <SystemConfiguration/SystemConfiguration.h>
@@ -57,7 +57,7 @@ struct Seen {
   }
 };
 
-// Hands the browser's client an event, as the framework does while the browser is scheduled.
+// Passes an event to the browser's client, as the framework does while the browser is scheduled.
 void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
   standin::Browser& browser = *standin::Browser::last;
   ASSERT_TRUE(browser.isScheduled && browser.client);
@@ -65,7 +65,7 @@ void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
   browser.client(&browser, flags, found, &error, browser.info);
 }
 
-TEST(CFNetworkBrowser, HandsOnWhatIsFoundAndWhatWentWrong) {
+TEST(CFNetworkBrowser, ReportsFoundAndRemovedServices) {
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
   seen.browser->schedule();
@@ -86,7 +86,7 @@ TEST(CFNetworkBrowser, HandsOnWhatIsFoundAndWhatWentWrong) {
   EXPECT_EQ(seen.flags, kNetServiceFlagRemove);
 }
 
-TEST(CFNetworkBrowser, LosesWhatItFoundWithAnErrorAndSearchesAgainAfterASecond) {
+TEST(CFNetworkBrowser, ReportsItsServicesGoneAfterAnErrorAndSearchesAgain) {
   recording::FrontEnd& frontEnd = recording::FrontEnd::instance();
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
@@ -97,7 +97,7 @@ TEST(CFNetworkBrowser, LosesWhatItFoundWithAnErrorAndSearchesAgainAfterASecond) 
   for (int round = 1; round <= 2; ++round) {
     deliver(0, service.get(), 0);
     deliver(0, nullptr, -72000);
-    deliver(0, nullptr, -72005);        // what stopping a search brings
+    deliver(0, nullptr, -72005);        // the error that stopping causes
     EXPECT_EQ(seen.events, 3 * round);  // found, gone, the first error
     EXPECT_EQ(seen.code, -72000);
     EXPECT_FALSE(native.isRunning);
@@ -110,7 +110,7 @@ TEST(CFNetworkBrowser, LosesWhatItFoundWithAnErrorAndSearchesAgainAfterASecond) 
   EXPECT_FALSE(native.isRunning);
 }
 
-TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndIsSilentWhenUnscheduled) {
+TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndCanBeUnscheduled) {
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::endBrowser, &seen);
   seen.browser->schedule();
@@ -125,7 +125,7 @@ TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndIsSilentWhenUnscheduled) {
   EXPECT_FALSE(standin::Browser::last->isScheduled);
 }
 
-TEST(CFNetworkService, ResolvesIntoAddressesAndTextAndMayBeDroppedByItsClient) {
+TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient) {
   Seen seen;
   seen.service = NetService::create("local.", "_ipp._tcp.", "Büro", 0);
   auto* native = standin::Service::last;
@@ -153,12 +153,12 @@ TEST(CFNetworkService, ResolvesIntoAddressesAndTextAndMayBeDroppedByItsClient) {
   EXPECT_FALSE(native->isScheduled || native->isRunning || native->client);
 }
 
-TEST(CFNetworkService, IsNotMadeOfTextsThatAreNotUTF8) {
+TEST(CFNetworkService, IsNotCreatedFromTextsThatAreNotUTF8) {
   EXPECT_EQ(NetService::create("local.", "_ipp._tcp.", "B\xFCro", 0), nullptr);
   EXPECT_EQ(corefoundation::toCFArray({"a", "\xFF", "b"}).get()->members.size(), 2U);
 }
 
-TEST(SystemConfigurationStore, AsksByKeysAndByPatternsAndLeavesOutWhatIsNoText) {
+TEST(SystemConfigurationStore, AsksByKeysAndByPatternsAndOmitsValuesOfUnknownTypes) {
   const DynamicStoreRef store = createDynamicStore("test");
   const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
   EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");

@@ -29,7 +29,7 @@ TEST(FullPath, IsRelativeToTheFolderThatHoldsTheBundle) {
   }
 }
 
-TEST(MediumDescription, HasADefaultForWhateverIsMissingOrOfAnotherType) {
+TEST(MediumDescription, HasADefaultForEveryMissingOrMistypedEntry) {
   const Dictionary info{
       {"ContainedModel", Dictionary{{"ABD", 1}, {"abc", 1}, {"a_", 1}, {"abE", 1}}},
       {"Type", Dictionary{{"Printer", "NO"}, {"TWAIN", 0}}},
@@ -52,7 +52,7 @@ TEST(MediumDescription, HasADefaultForWhateverIsMissingOrOfAnotherType) {
   EXPECT_EQ(KSOROSXCD::initWithCDInfoPlist(Dictionary(), std::nullopt), defaults);
 }
 
-TEST(ModelRecord, FollowsTheModelInformation) {
+TEST(ModelRecord, IsReadFromTheModelInformation) {
   const Dictionary interfaces{{"USB", "no"}, {"WiredLAN", 1.0}, {"WirelessLAN", "yes"}};
   const Dictionary info{
       {"Model", Dictionary{{"Plain", Dictionary{{"KSCID", "p"}}},
@@ -86,21 +86,20 @@ TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
     Dictionary package;
     std::optional<std::string> expected;
   };
-  const Case cases[] = {
-      {"10.3.9", byVersion, std::nullopt},
-      {"10.4.0", byVersion, "Packages/4"},
-      {"10.5.9", byVersion, "Packages/5"},
-      {"10.6.0", byVersion, "Packages/6"},
-      {"10.7.5", byVersion, "Packages/7"},
-      {"10.8.5", byVersion, std::nullopt},  // has a key, but the medium has no package under it
-      {"10.9.0", byVersion, "Packages/9"},
-      {"11.0.0", byVersion, "Packages/9"},
-      {"100.9.9", byVersion, "Packages/9"},  // 0x10099
-      {"101.0.0", byVersion, std::nullopt},  // above 0x100FF
-      {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
-      {"10.6.8", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
-      {"10.6.8", byVersion.with("PkgName", Array{}), std::nullopt},
-      {"10.6.8", Dictionary{{"PkgName", "all.pkg"}}, std::nullopt}};
+  const Case cases[] = {{"10.3.9", byVersion, std::nullopt},
+                        {"10.4.0", byVersion, "Packages/4"},
+                        {"10.5.9", byVersion, "Packages/5"},
+                        {"10.6.0", byVersion, "Packages/6"},
+                        {"10.7.5", byVersion, "Packages/7"},
+                        {"10.8.5", byVersion, std::nullopt},  // the medium has no package for 10.8
+                        {"10.9.0", byVersion, "Packages/9"},
+                        {"11.0.0", byVersion, "Packages/9"},
+                        {"100.9.9", byVersion, "Packages/9"},  // version code 0x10099
+                        {"101.0.0", byVersion, std::nullopt},  // version code above 0x100FF
+                        {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+                        {"10.6.8", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+                        {"10.6.8", byVersion.with("PkgName", Array{}), std::nullopt},
+                        {"10.6.8", Dictionary{{"PkgName", "all.pkg"}}, std::nullopt}};
   for (const Case& c : cases) {
     MediumFolder medium;
     medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
@@ -124,7 +123,7 @@ TEST(InstallerInformation, HasADefaultForEveryMissingPart) {
   EXPECT_EQ(sparse.supportSystemMax(), unbounded);
   EXPECT_EQ(sparse.supportSystemMin(), minimum);
   EXPECT_EQ(sparse.WLANtoolURL(), FileURL{medium.path("").substr(0, medium.path("").size() - 1)})
-      << "without a tool, the folder that holds the application";
+      << "without a tool, the folder of the application";
 }
 
 }  // namespace

@@ -1,4 +1,4 @@
-// Runs as root of a network namespace of its own: see in_namespace.
+// Runs as root in a new network namespace; see tests/in_namespace.
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -42,7 +42,7 @@ std::vector<std::string> entriesOf(const local_address_list& list) {
 
 class Kernel : public ::testing::Test {
  protected:
-  // Two pairs of interfaces whose ends are all here, up but for the first pair's far end.
+  // Makes two pairs of connected interfaces. All four ends are up and in this namespace.
   void SetUp() override {
     recording::resetLoop();
     ip("link set lo up");
@@ -65,7 +65,7 @@ const char* const kLoopback = "127.0.0.1,|255.0.0.0,||";
 struct Scenario {
   const char* name;
   std::vector<const char*> commands;
-  std::vector<std::string> entries;  // beside the loopback interface's
+  std::vector<std::string> entries;  // in addition to the loopback interface's
   const char* primary;
 };
 
@@ -128,7 +128,7 @@ TEST_F(Kernel, ListsTheAddressesAndThePrimaryInterface) {
   EXPECT_THAT(none, ::testing::Pointee(Array{}));
 }
 
-// In one test only: the callback stays for the process.
+// Only one test may add the callback, because it stays until the process ends.
 TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   AddNetworkInterfaceListChangeCallbackSCF();
   std::vector<std::string> expected = {kLoopback};
@@ -150,7 +150,7 @@ TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   EXPECT_EQ(local_address_for_destination("192.0.2.77"), std::nullopt);
 }
 
-TEST_F(Kernel, CallbackHearsWhereTheDefaultRouteMoves) {
+TEST_F(Kernel, CallbackIsCalledWhenTheDefaultRouteChanges) {
   std::vector<std::string> heard;
   const DynamicStoreRef store = createDynamicStore("test", [&](const auto& keys) { heard = keys; });
   const std::string global = "State:/Network/Global/IPv4";

@@ -1,4 +1,4 @@
-// The rules that no real network shows: see kernel_test.cpp for the others.
+// Tests the rules that no real network shows. kernel_test.cpp tests the others.
 
 #include <gtest/gtest.h>
 
@@ -15,13 +15,13 @@
 namespace onramp {
 namespace {
 
-/// A store that holds and does what a test says.
+/// A dynamic store whose contents and failures a test sets.
 struct Store {
   Dictionary contents;
   std::string failing;  ///< "create", "key" or "copy"
   int error = 0;
-  std::string log;                ///< the sessions and what they asked for, whatever the outcome
-  DynamicStoreCallback callback;  ///< of the last session that has one
+  std::string log;                ///< the sessions and their requests, even failed ones
+  DynamicStoreCallback callback;  ///< of the latest session that has one
 
   void change(Dictionary newContents) {
     contents = std::move(newContents);
@@ -95,7 +95,7 @@ class Netconfig : public ::testing::Test {
  protected:
   void SetUp() override {
     store = Store{};
-    AddNetworkInterfaceListChangeCallbackSCF();  // stays installed for the process
+    AddNetworkInterfaceListChangeCallbackSCF();  // stays until the process ends
     store.log = "";
   }
 
@@ -127,7 +127,7 @@ TEST_F(Netconfig, ListHoldsTheAddressArraysOfEveryInterface) {
   EXPECT_EQ(list, before);
 }
 
-TEST_F(Netconfig, AFailureIsReportedByTheListAloneAndEmptiesTheCache) {
+TEST_F(Netconfig, OnlyTheListReportsFailuresAndTheCacheBecomesEmpty) {
   store.contents = {{"State:global/IPv4", Dictionary{{"PrimaryInterface", "en0"}}}};
   EXPECT_EQ(KSSCCopyCurrentInterfaceName(), "en0");
   for (const char* const step : {"copy", "key", "create"}) {
@@ -181,7 +181,7 @@ TEST_F(Netconfig, DestinationIsReachedFromTheFirstInterfaceInItsSubnet) {
   }
 }
 
-TEST_F(Netconfig, InterfacesWithoutATextAreNotReturned) {
+TEST_F(Netconfig, MissingAddressesAndInterfaceNamesAreNotReturned) {
   store.contents = {{"State:en1/IPv4", Dictionary{{"Addresses", Array{}}}},
                     {"State:en2/IPv4", "no dictionary"}};
   for (const char* name : {"en1", "en2"})

@@ -43,7 +43,7 @@ class Chooser : public Wizard {
     Wizard::TearDown();
   }
 
-  /// The rows from the top, the selected one with a star.
+  /// Returns the rows from the top. The selected one ends with a star.
   [[nodiscard]] std::vector<std::string> rows() const {
     std::vector<std::string> rows = deviceRows();
     const auto selected = screen.object("deviceListView").content->selectionIndex();
@@ -54,7 +54,7 @@ class Chooser : public Wizard {
   std::shared_ptr<ChooseDeviceView> page;
 };
 
-TEST_F(Chooser, ComesUpWithItsTextsAndItsMenu) {
+TEST_F(Chooser, ShowsItsTextsAndItsMenu) {
   medium.write(kEnglishTexts, std::string("INST_TXT_DEVICE = name; INST_TXT_CONNECTION = way;"
                                           "INST_TXT_IPADDRESS = place; INST_TXT_REFRESH = again;"));
   load();
@@ -84,7 +84,7 @@ TEST_F(Chooser, ComesUpWithItsTextsAndItsMenu) {
   EXPECT_THAT(commands(), ElementsAre("Gear", "Einrichtung...", "again"));
 }
 
-TEST_F(Chooser, ListsOnlyTheModelsLookedFor) {
+TEST_F(Chooser, ListsOnlyDevicesOfTheModelsLookedFor) {
   const struct {
     const char* maker;
     const char* model;
@@ -128,7 +128,7 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWireless}, {kWired}}, {6, 1, 0}, true},
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
-      // After one unanswered request an address gets all its attempts, and then the next is asked.
+      // An address that leaves a request unanswered gets all its attempts before the next is asked.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},
@@ -160,13 +160,13 @@ TEST_F(Chooser, SortsByNameAndSelectsTheFirstRowUntilTheUserChoosesOne) {
   EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
 }
 
-TEST_F(Chooser, AnUpdateWithAnotherAddressLeavesTheOldEntry) {
+TEST_F(Chooser, AnUpdateWithAnotherAddressKeepsTheOldEntry) {
   page->updateKSDevice(device("D", {"192.0.2.1", "192.0.2.2"}));
   page->updateKSDevice(device("D", {"192.0.2.2"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*", "D 192.0.2.2"));
   page->removeKSDevice(device("D", {"192.0.2.2"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
-  // The record holds the other addresses too, so this one is not equal to the listed one.
+  // The listed entry's record has two addresses, so the entry of a record with one is not equal.
   page->removeKSDevice(device("D", {"192.0.2.1"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
 }

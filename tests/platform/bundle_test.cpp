@@ -86,7 +86,7 @@ class BundleOnMedium : public testing::Test {
   recording::MediumFolder medium;
 };
 
-TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAndReadsTheDiskEachTime) {
+TEST_F(BundleOnMedium, UsesTheUsersLanguageAndReadsTheFilesEachTime) {
   EXPECT_EQ(text("k"), "no bundle");
   resource("English.lproj/Localizable.strings", "k = english; only = english;");
   resource("zh_CN.lproj/Localizable.strings", "\"k\" = \"简体\";");
@@ -98,7 +98,7 @@ TEST_F(BundleOnMedium, SpeaksTheUsersLanguageAndReadsTheDiskEachTime) {
   medium.setEnvironment("LANGUAGE", "pt:zh_CN");
   EXPECT_EQ(text("k"), "简体");
   medium.setEnvironment("LC_ALL", "C");
-  EXPECT_EQ(text("k"), "english") << "the C locale ignores the list";
+  EXPECT_EQ(text("k"), "english") << "the C locale ignores LANGUAGE";
 
   medium.setEnvironment("LC_ALL", "ko_KR.UTF-8");
   medium.setEnvironment("LANGUAGE", std::nullopt);

@@ -74,8 +74,8 @@ TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   recording::MediumFolder medium;
   const std::string gate = medium.path("gate");
   const std::string opened = medium.path("opened");
-  // The opener waits at the gate, then says how many words it got, the first one, and whether it
-  // leads a session.
+  // The opener waits for input from the pipe `gate`. Then it writes the number of its arguments,
+  // the first argument, and whether it leads a session, to the file `opened`.
   medium.write("bin/xdg-open", "#!/bin/sh\ntimeout 60 cat '" + gate +
                                    "' > /dev/null\nwords=\"$#:$1\"\n" +
                                    "read -r line < /proc/$$/stat\nset -- $line\n" +
@@ -86,7 +86,7 @@ TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   medium.setEnvironment("PATH", medium.path("bin") + ":" + std::getenv("PATH"));
   ASSERT_EQ(mkfifo(gate.c_str(), 0600), 0);
   const auto throughTheGate = [&] {
-    EXPECT_FALSE(std::filesystem::exists(opened)) << "it waited for the opener";
+    EXPECT_FALSE(std::filesystem::exists(opened)) << "the call waited for the opener";
     std::ofstream(gate) << "go";
     for (int i = 0; i < 1000 && !std::filesystem::exists(opened); ++i)
       std::this_thread::sleep_for(std::chrono::milliseconds(10));
@@ -122,12 +122,12 @@ TEST(Desktop, OpensNothingWithoutAnOpener) {
   }
 }
 
-TEST(Desktop, StartsProgramsThatNoSignalIsIgnoredIn) {
+TEST(Desktop, StartsProgramsWithoutIgnoredSignals) {
   surviveFailedWrites();
   EXPECT_EQ(runAndWait("/usr/bin/grep", {"-q", "^SigIgn:.*0000000$", "/proc/self/status"}), 0);
 }
 
-TEST(Desktop, ReportsTheSystemVersionThatItIsGiven) {
+TEST(Desktop, ReportsTheSystemVersionThatIsSet) {
   recording::MediumFolder medium;
   const std::pair<const char*, std::int32_t> cases[] = {
       {"10.6.8", 0x1068},  {"10.3.9", 0x1039},  {"10.15.7", 0x1097}, {"10.9", 0x1090},

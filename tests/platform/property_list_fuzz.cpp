@@ -4,8 +4,8 @@
 
 #include "platform/libplist/parse.h"
 
-// What was written once is read, and written again, as it stands. (The first writing replaces what
-// XML cannot hold.)
+// Reads the input, writes it and reads it back. From then on, writing and reading must change
+// nothing. The first writing may change texts, because it replaces characters that XML cannot hold.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
   using namespace onramp;
   const auto value =

@@ -33,7 +33,7 @@ std::string reference(std::size_t index) {
   return bigEndian(index, 4);
 }
 
-// A binary list of these objects, with the first one as its root.
+// Returns a binary list of `objects` whose root is the first one.
 std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
                    int referenceSize = 4) {
   std::string bytes = "bplist00";
@@ -48,7 +48,8 @@ std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
          bigEndian(0, 8) + bigEndian(table, 8);
 }
 
-// A dictionary whose one value is object 2, and then objects 2, 3, … as `object` makes them.
+// Returns a binary list whose root is a dictionary with one value, object 2. `object` returns the
+// bytes of object 2 and of the objects after it, `count` in all.
 std::string dictionaryOver(std::size_t count,
                            const std::function<std::string(std::size_t)>& object) {
   std::vector<std::string> objects{"\xD1" + reference(1) + reference(2), "\x51k"};
@@ -57,7 +58,8 @@ std::string dictionaryOver(std::size_t count,
   return binary(objects);
 }
 
-// Each array contains the next one `times` times; the last object is a text.
+// Returns a binary list of `depth` nested arrays. Each contains the next one `times` times. The
+// last contains a text `times` times.
 std::string arrays(std::size_t depth, std::size_t times) {
   return dictionaryOver(depth + 1, [&](std::size_t i) {
     return i == depth + 2 ? std::string("\x51t")
@@ -70,7 +72,7 @@ struct Outcome {
   long peakKilobytes;
 };
 
-// Loads the file in a separate process, to measure that one's memory.
+// Loads the file in a separate process, so that the memory that loading takes can be measured.
 Outcome load(const std::string& path) {
   const pid_t loader = fork();
   if (loader == 0) _exit(loadDictionary(path) ? 0 : 1);
@@ -81,7 +83,7 @@ Outcome load(const std::string& path) {
   return {status == 0, usage.ru_maxrss};
 }
 
-TEST(Limits, AHostileFileIsUnreadableAndCostsLittle) {
+TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
   const TemporaryFolder folder;
   const std::pair<const char*, std::string> cases[] = {
       {"XML nested 200,000 deep",
@@ -118,7 +120,7 @@ TEST(Limits, AHostileFileIsUnreadableAndCostsLittle) {
   }
 }
 
-TEST(Limits, LeaveRoomForWhatMediaHold) {
+TEST(Limits, LeaveRoomForTheListsOfRealMedia) {
   const TemporaryFolder folder;
   std::string models;
   for (int i = 0; i < 20000; ++i) {
@@ -150,7 +152,7 @@ TEST(Limits, OffsetsAndReferencesTakeOneToEightBytes) {
   }
 }
 
-TEST(Limits, EveryObjectOfABinaryListMustBeWhole) {
+TEST(Limits, EveryObjectOfABinaryListMustBeValidAndWhole) {
   const TemporaryFolder folder;
   const std::string whole = dictionaryOver(1, [](std::size_t) { return "\x51t"; });
   ASSERT_TRUE(loadDictionary(folder.holding("list", whole)));

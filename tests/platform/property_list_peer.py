@@ -1,5 +1,5 @@
-"""Another reader and writer of property lists: write XML BINARY writes a list of every kind of value in
-both forms, and check FILE holds a list against that one."""
+"""Another implementation of property lists. "write XML BINARY" writes a list with every kind of value
+to both files. "check FILE" compares the list in FILE with that list."""
 
 import datetime
 import math

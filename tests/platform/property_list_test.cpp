@@ -31,7 +31,7 @@ std::string utf16(const std::string& ascii, bool bigEndian) {
   return bytes;
 }
 
-TEST(PropertyList, ReadsXMLAsPeopleWriteIt) {
+TEST(PropertyList, ReadsXMLInTheFormsThatPeopleWrite) {
   const Dictionary expected{{"k", "a<b"}};
   const std::pair<std::string, Dictionary> cases[] = {
       {plist("<key>k</key><string>a&lt;b</string>"), expected},
@@ -50,7 +50,7 @@ TEST(PropertyList, ReadsXMLAsPeopleWriteIt) {
     EXPECT_EQ(loadDictionary(folder.holding("list", text)), dictionary) << text;
 }
 
-TEST(PropertyList, ReadsTheSameNumbersWithADecimalComma) {
+TEST(PropertyList, ReadsTheSameNumbersInALocaleWithADecimalComma) {
   const TemporaryFolder folder;
   (void)runAndWait("/usr/bin/localedef", {"-i", "de_DE", "-f", "UTF-8", folder / "de_DE.UTF-8"});
   setenv("LOCPATH", (folder / "").c_str(), 1);
@@ -61,7 +61,8 @@ TEST(PropertyList, ReadsTheSameNumbersWithADecimalComma) {
   unsetenv("LOCPATH");
 }
 
-// Writes 5,000 bytes in a process that may write 1,024 to a file, and returns how it ended.
+// Starts a process whose files may hold at most 1,024 bytes. The process calls `prepare` and writes
+// a list of 5,000 bytes. Returns the process's wait status.
 int statusOfWriterPastItsLimit(const std::string& path, const std::function<void()>& prepare) {
   const pid_t writer = fork();
   if (writer == 0) {
@@ -86,26 +87,26 @@ TEST(AtomicWriting, AFailureLeavesTheOldFileAndNothingElse) {
   EXPECT_FALSE(writeDictionaryAtomically(before, folder / "no folder/list"));
 
   EXPECT_EQ(statusOfWriterPastItsLimit(folder / "list", surviveFailedWrites), 0)
-      << "it ended, or took the failed write for a success";
+      << "the process was killed, or reported success";
   EXPECT_EQ(loadDictionary(folder / "list"), before);
   EXPECT_THAT(folder.names(), testing::UnorderedElementsAre("list", "taken", longest));
 }
 
-TEST(AtomicWriting, AWriterThatIsKilledLeavesTheOldFileAndWhatRemovingItRemovesToo) {
+TEST(AtomicWriting, AKilledWriterKeepsTheOldFileAndRemovalDeletesItsLeftovers) {
   const TemporaryFolder folder;
   const Dictionary before{{"k", "before"}};
   const std::string longest(255, 'n');
   for (const std::string& name : {std::string("list"), longest}) {
     ASSERT_TRUE(writeDictionaryAtomically(before, folder / name));
     EXPECT_TRUE(WIFSIGNALED(statusOfWriterPastItsLimit(folder / name, [] {})));
-    EXPECT_EQ(folder.names().size(), 2U) << "the list and a part of the next one";
+    EXPECT_EQ(folder.names().size(), 2U) << "the list and the unfinished new one";
     EXPECT_EQ(loadDictionary(folder / name), before);
     removeDictionary(folder / name);
     EXPECT_THAT(folder.names(), testing::IsEmpty());
   }
 }
 
-TEST(FailedWrites, ABrokenPipeEndsNothing) {
+TEST(FailedWrites, ABrokenPipeDoesNotEndTheProcess) {
   const pid_t writer = fork();
   if (writer == 0) {
     surviveFailedWrites();

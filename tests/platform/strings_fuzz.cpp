@@ -5,7 +5,7 @@
 #include "base/text.h"
 #include "platform/freedesktop/strings_table.h"
 
-// Whatever is read are texts in well-formed UTF-8.
+// Every value that parseStrings() returns must be well-formed UTF-8.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
   using namespace onramp;
   const auto text = decodedText({reinterpret_cast<const char*>(bytes), size});

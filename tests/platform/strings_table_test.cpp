@@ -8,7 +8,7 @@
 namespace onramp {
 namespace {
 
-TEST(StringsTable, FollowsTheGrammarOfOldStyleLists) {
+TEST(StringsTable, FollowsTheGrammarOfOldStylePropertyLists) {
   const std::pair<const char*, Dictionary> cases[] = {
       {"", {}},
       {" \n// nothing\n/* at ** all */", {}},
@@ -45,7 +45,7 @@ TEST(StringsTable, IsNothingWhenItBreaksTheGrammarAnywhere) {
   }
 }
 
-TEST(StringsTable, IsReadInEveryFormThatMediaHold) {
+TEST(StringsTable, IsReadInEveryFormThatMediaUse) {
   const Dictionary expected{{"k", "次"}};
   const TemporaryFolder folder;
   ASSERT_TRUE(writeDictionaryAtomically(expected, folder / "xml"));

@@ -26,7 +26,7 @@ std::string nameOf(const QWidget& widget) {
   return widget.objectName().toStdString();
 }
 
-/// The wizard's window with the texts of one language, in one size.
+/// The wizard's window with the texts of one language, in one font size.
 class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
  protected:
   void SetUp() override {
@@ -66,7 +66,7 @@ class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
     return {widget.mapTo(window, QPoint()), widget.size()};
   }
 
-  // All but the device's name is readable in full, and nothing lies beyond the edge.
+  // Expects that no text is cut off, except the device's name, and that all columns are visible.
   static void expectColumnsFit(QTreeView& tree) {
     int width = 0;
     for (int column = 0; column < tree.header()->count(); ++column) {
@@ -100,7 +100,8 @@ class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
   }
 
   void expectEverythingFits() const {
-    // Sizes settle in a few rounds: a wider text makes the window wider, which moves the rest.
+    // Sizes need a few rounds to settle, because a wider text makes the window wider, which moves
+    // the other controls.
     for (int round = 0; round < 5; ++round)
       QApplication::processEvents();
     const QSize screen = window->screen()->availableSize() - QSize(0, kTitleBarHeight);
@@ -143,7 +144,7 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   delegate->replaceMainView("", connections);
   connections->setConnectionType(ConnectionType::kUSBAndEthernet);
   connections->progressON(true);
-  // All the buttons that a page can show.
+  // The chooser has every button that a page can show.
   delegate->setChooseDeviceViewButton();
   expectEverythingFits();
 

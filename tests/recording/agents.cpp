@@ -13,14 +13,14 @@ using recording::Agents;
 struct DatagramSocket::Native {
   DatagramEndpoint peer;
   std::optional<Agents::Bytes> reply;  ///< to the request under way
-  bool refused = false;                ///< what the peer's host did with it
+  bool refused = false;                ///< the peer's host refused the request
 };
 
 namespace recording {
 
 namespace {
 
-// Turns a request for one object into the answer to it.
+// Returns the reply that answers a request for one object with `value`.
 Agents::Bytes answerTo(const Agents::Bytes& request, int value) {
   Message message(1);
   if (message.decode(request)) std::abort();

@@ -32,14 +32,14 @@ struct Object {
   ImageScaling scaling = ImageScaling::kProportionallyDown;
   ArrayController* content = nullptr;
   std::map<std::string, std::string> headers;  ///< of a table's columns, by their identifiers
-  std::set<std::string> fixedColumns;          ///< those that the user cannot edit
+  std::set<std::string> fixedColumns;          ///< the columns that the user cannot edit
   bool columnsCanMove = true;
   bool columnsCanBeSelected = true;
   std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
   Object* superview = nullptr;
   std::vector<Object*> subviews;
   std::string action;
-  InterfaceOwner* owner = nullptr;  ///< whom its interface file was loaded for
+  InterfaceOwner* owner = nullptr;  ///< the owner that its interface file was loaded for
 
   [[nodiscard]] NativeObject* native() { return reinterpret_cast<NativeObject*>(this); }
 };
@@ -56,8 +56,8 @@ struct ShownSheet {
 };
 
 /// A front end without a screen, and a desktop that opens nothing. It records what the program
-/// shows and asks for, and plays the user and the clock. Time passes only when a test says so, and
-/// in a search wait, whose pauses take no time.
+/// shows and asks for, and plays the user and the clock. Time passes only in runTimers(). The
+/// pauses of a search wait take no time.
 class FrontEnd {
  public:
   static FrontEnd& instance();
@@ -79,7 +79,7 @@ class FrontEnd {
   /// terminated.
   void runTimers();
 
-  // What the seam's functions ask for.
+  // Used by this front end's implementation of platform/.
   void schedule(double seconds, std::function<void()> action);
   void open(const std::string& target);
   std::vector<Object*> loaded;  ///< the objects of all loaded interface files, the latest last
@@ -90,13 +90,13 @@ class FrontEnd {
   std::vector<ShownAlert> alerts;
   std::vector<ShownSheet> sheets;
   std::vector<unsigned> pauses;     ///< seconds of every pause off the main thread
-  std::vector<double> delays;       ///< seconds of every timer, from its scheduling to its action
-  std::vector<std::string> opened;  ///< every path and address that the desktop was to open
+  std::vector<double> delays;       ///< the delay of every timer, in seconds
+  std::vector<std::string> opened;  ///< every path and address that was to be opened
   bool terminated = false;
 
   // What a test sets up.
   std::set<std::string> missingInterfaces;
-  std::function<void(int pause)> duringPause;  ///< called on the main thread, counted from 1
+  std::function<void(int pause)> duringPause;  ///< called on the main thread; pauses count from 1
   std::function<void()> duringOpening;         ///< called while the desktop is asked to open
 
  private:

@@ -44,7 +44,7 @@ struct Part {
   const char* name;
 };
 
-// The outlets in the interface files. A test holds them against the files and the program.
+// The outlets in the interface files. tests/resources compares them with the files and the program.
 const std::vector<Part>& partsOf(const std::string& interfaceName) {
   using enum OutletKind;
   static std::map<std::string, std::vector<Part>> parts = {

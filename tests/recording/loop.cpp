@@ -25,7 +25,7 @@ Loop& loop() {
   return instance;
 }
 
-// Longer than any test may take: a wait that would never end fails instead of hanging.
+// Longer than any test may take. A wait that would never end stops after this time.
 constexpr std::chrono::seconds kForever{120};
 
 }  // namespace
@@ -91,7 +91,7 @@ void abortModal() {
 }
 
 bool sleepOffMainThread(std::chrono::milliseconds duration) {
-  // The pause lasts until the main thread has done what the test does in it.
+  // The pause ends when the main thread has called the test's `duringPause`.
   const auto passed = std::make_shared<bool>(false);
   performOnMainThread([duration, passed] {
     recording::FrontEnd& frontEnd = recording::FrontEnd::instance();

@@ -10,9 +10,9 @@
 
 namespace onramp::recording {
 
-/// A medium in a temporary folder, which holds the application's main bundle, with its own
-/// application-support folders. The destructor removes it and restores the environment variables
-/// that it set.
+/// A temporary folder with a medium, which holds the application's main bundle, and with
+/// application-support folders. The destructor removes the folder and restores the environment
+/// variables that this object has set.
 class MediumFolder {
  public:
   /// Makes a medium with an application bundle and nothing else.
@@ -21,26 +21,27 @@ class MediumFolder {
   MediumFolder& operator=(const MediumFolder&) = delete;
   ~MediumFolder();
 
-  /// The full path of a file on the medium.
+  /// Returns the full path of a file on the medium.
   [[nodiscard]] std::string path(const std::string& relative) const;
 
-  /// Write a file on the medium, and its folder if that is missing.
+  /// Write a file on the medium, and create its folder if it is missing.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   void makeExecutable(const std::string& relative) const;
 
-  /// Writes the three property lists. `resources` gets the entries "CDInfo", "ModelInfo" and
-  /// "VenderName" ("Kestrel Imaging").
+  /// Writes the medium's three property lists. Adds the entries "CDInfo", "ModelInfo" and
+  /// "VenderName" ("Kestrel Imaging") to `resources`.
   void describe(const Dictionary& resources, const Dictionary& cdInfo,
                 const Dictionary& modelInfo) const;
 
   /// Puts a set-up tool on the medium that records its arguments and exits with `status`.
   void addSetUpTool(int status) const;
 
-  /// The arguments of the tool's last run; empty when it has not run.
+  /// Returns the arguments of the tool's last run, or an empty text when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// The hand-off files for the vendor name "Kestrel Imaging"; nothing when a file is absent.
+  /// Return the contents of the two hand-off files, or nothing when a file is absent, and the paths
+  /// of these files.
   [[nodiscard]] std::optional<Dictionary> optionsFile() const;
   [[nodiscard]] std::optional<Dictionary> modelFile() const;
   [[nodiscard]] std::string optionsFilePath() const;
@@ -54,10 +55,10 @@ class MediumFolder {
   std::map<std::string, std::optional<std::string>> before_;
 };
 
-/// A model's entry in the model information, with the identifier "k1".
+/// Returns a model's entry in the model information, with the identifier "k1".
 [[nodiscard]] Dictionary model(bool usb, bool wired, bool wireless);
 
-/// A medium description that contains the models with these names.
+/// Returns a medium description that contains the models with these names.
 [[nodiscard]] Dictionary containing(const std::vector<std::string>& models);
 
 }  // namespace onramp::recording

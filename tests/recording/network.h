@@ -9,8 +9,8 @@
 
 namespace onramp::recording {
 
-/// A scripted network: a test says what is found, what resolves and what is gone, and sees what the
-/// program asked for. Events reach the program at once, as from the main loop.
+/// A scripted network. A test says which services are found, resolved and gone, and sees what the
+/// program asked for. Events reach the program at once, as if they came from the main loop.
 class Network {
  public:
   static Network& instance();
@@ -26,7 +26,7 @@ class Network {
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// End the service's running resolve; nothing happens when there is none.
+  /// End the service's running resolve. They do nothing when there is none.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);
 
@@ -36,13 +36,14 @@ class Network {
   static void fill(const NetServiceRef& service, std::vector<Data> addresses,
                    std::optional<Data> txt);
 
-  /// What a blocking resolve of "name.typedomain" finds. It fails for every other service.
+  /// The addresses that a blocking resolve finds, by "name.typedomain". A blocking resolve of any
+  /// other service fails.
   std::map<std::string, std::vector<Data>> answers;
 
   bool searchesStart = true;
-  std::vector<std::string> log;  ///< every call of the seam, in order, such as "browser schedule"
-  std::vector<double> timeouts;  ///< of every resolve
-  std::vector<NetServiceBrowser*> browsers;  ///< those that are searching
+  std::vector<std::string> log;              ///< every call, in order, such as "browser schedule"
+  std::vector<double> timeouts;              ///< of every resolve
+  std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 
 /// Socket addresses in the BSD layout.

@@ -12,7 +12,7 @@ namespace {
 using recording::FrontEnd;
 using recording::Object;
 
-// The object of a handle. For an empty one a spare, which nobody looks at.
+// Returns the object of a handle. For an empty handle, returns a spare object, which nobody reads.
 Object& object(const Outlet& outlet) {
   static Object spare;
   if (outlet) return *reinterpret_cast<Object*>(outlet.native());

@@ -1,5 +1,5 @@
-"""Holds every outlet, action, bound title, column and menu item that the sources ask for against the
-interface files of both front ends and the tests' own front end. At run time a missing one is ignored."""
+"""Checks that both front ends' interface files have every outlet, action, bound title, column and menu
+item that the sources look up. At run time, the program ignores a missing one."""
 
 import re
 import unittest
@@ -9,7 +9,7 @@ from pathlib import Path
 ROOT = Path(__file__).resolve().parents[2]
 PAGES = ("ModelListView", "ConnectionTypeView", "ChooseDeviceView")
 
-# What each kind of outlet is in the interface files of Qt and of Cocoa.
+# The kinds of outlets by the class names of Qt's interface files and the tags of Cocoa's.
 QT = {"QLabel": "TextField", "QPushButton": "Button", "QToolButton": "PopUpButton",
       "QListView": "TableView", "QTreeView": "TableView", "QMainWindow": "Window",
       "QWidget": "View", "ImageView": "ImageView", "Spinner": "ProgressIndicator",
@@ -41,7 +41,7 @@ def wanted_columns(page):
 
 
 def recorded_outlets(interface):
-    """What the tests' own front end has in place of the file."""
+    """Returns the outlets that the tests' own front end has in place of the file's."""
     text = text_of("tests/recording/interfaces.cpp")
     parts = re.search(rf'\{{"{interface}",\s*\{{(.*?)\}}\}}[,}}]', text, re.DOTALL)[1]
     return {name: kind for kind, name in re.findall(r'\{k(\w+), "(\w+)"', parts)}
@@ -88,7 +88,7 @@ class CocoaFile:
 
 
 class InterfaceFiles(unittest.TestCase):
-    def test_every_outlet_is_there_and_of_the_right_kind(self):
+    def test_every_outlet_exists_and_has_the_right_kind(self):
         for interface in ("MainMenu", *PAGES):
             wanted = wanted_outlets(interface)
             self.assertGreater(len(wanted), 2)
@@ -118,7 +118,7 @@ class InterfaceFiles(unittest.TestCase):
             file = made("MainMenu")
             self.assertEqual((actions, titles), (file.actions, file.titles), made.__name__)
 
-    def test_every_menu_item_that_gets_another_title_is_found_by_its_own(self):
+    def test_every_menu_item_that_is_renamed_has_the_title_looked_for(self):
         wanted = set(re.findall(r'\{"([\w ]+)", "APP_MENU_\w+"\}', START_UP)
                      + re.findall(r'itemWithTitle\("([^"]+)"\)', START_UP))
         self.assertEqual(6, len(wanted))

@@ -1,6 +1,6 @@
-"""Holds the files of the macOS application against what Xcode writes and what current systems ask.
+"""Checks that the macOS application's files have what Xcode writes and what current systems need.
 
-No tool of Apple's reads them on Linux, and most of what is missing would fail in silence on a Mac.
+No tool of Apple's reads the files on Linux, and a Mac would ignore most mistakes without a message.
 """
 
 import plistlib
@@ -24,7 +24,7 @@ WITHOUT_AN_ID = ("tableHeaderCell", "rect", "size", "font", "color", "autoresizi
 VIEWS = ("customView", "textField", "button", "imageView", "matrix", "popUpButton",
          "progressIndicator", "scrollView", "clipView", "scroller", "tableView", "tableHeaderView")
 
-# Why each key is there stands in ARCHITECTURE or beside the key.
+# ARCHITECTURE.md or a comment beside the key gives the reason for each key that needs one.
 INFORMATION = {
     "CFBundleAllowMixedLocalizations": True,
     "CFBundleExecutable": "Onramp OSX",
@@ -35,7 +35,7 @@ INFORMATION = {
     "NSPrincipalClass": "NSApplication",
     "NSRequiresAquaSystemAppearance": True,
 }
-# What the system shows when it asks the user for leave.
+# The texts that the system shows when it asks the user for permission.
 REASONS = {"NSLocalNetworkUsageDescription", "NSRemovableVolumesUsageDescription"}
 
 
@@ -76,10 +76,10 @@ class InterfaceFiles(unittest.TestCase):
                     self.assertIsNotNone(element.find("autoresizingMask"), name)
                 if element.tag in ("textField", "button", "imageView", "popUpButton"):
                     self.assertIsNotNone(element.find("*[@key='cell']"), name)
-                if element.tag == "font":  # without a size, GNUstep's is its own
+                if element.tag == "font":  # GNUstep uses its own size for a missing one
                     self.assertTrue(element.get("metaFont") and element.get("size"), name)
 
-    def test_scroll_views_have_both_scrollers_and_tables_a_style_and_a_free_selection(self):
+    def test_scroll_views_and_tables_have_scrollers_a_style_and_an_optional_selection(self):
         for root in self.files:
             for scroll in root.iter("scrollView"):
                 self.assertEqual(["horizontalScroller", "verticalScroller"],
@@ -100,7 +100,7 @@ class Information(unittest.TestCase):
         target = re.search(r"CMAKE_OSX_DEPLOYMENT_TARGET ([\d.]+)", text_of("CMakeLists.txt"))[1]
         self.assertEqual(target, self.information["LSMinimumSystemVersion"])
 
-    def test_gives_a_reason_for_all_that_the_user_is_asked_in_every_language(self):
+    def test_gives_a_reason_for_every_permission_in_every_language(self):
         asked = {key for key in self.information if key.endswith("UsageDescription")}
         self.assertEqual(REASONS, asked)
         for language in LANGUAGES:
@@ -114,7 +114,7 @@ class Information(unittest.TestCase):
         self.assertEqual(4, len(understood))
         self.assertEqual(understood, set(self.information["NSBonjourServices"]))
 
-    def test_is_released_hardened_and_without_exceptions(self):
+    def test_is_released_with_the_hardened_runtime_and_no_entitlements(self):
         self.assertRegex(text_of("tools/release-macos"), r"codesign .*--timestamp --options runtime")
         self.assertEqual([], [*RESOURCES.rglob("*.entitlements")])
 

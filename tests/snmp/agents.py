@@ -1,9 +1,9 @@
 #!/usr/bin/python3
-"""Runs a command where SNMP agents answer on loopback: agents.py COMMAND [ARGUMENT ...].
+"""Runs a command on a loopback network with SNMP agents: agents.py COMMAND [ARGUMENT ...].
 
-127.0.1.x are net-snmp's agents; at 127.0.2.1, strangers answer before the agent does. All of it
-lives in new namespaces (see tests/in_namespace) and ends with the command. Exit status: the
-command's, or 77 where there are no such namespaces."""
+The agents at 127.0.1.x are net-snmp's. At 127.0.2.1, other senders answer before the agent does.
+All of them run in new namespaces (see tests/in_namespace) and end with the command. The exit status
+is the command's, or 77 when no such namespaces can be created."""
 
 import os
 import pathlib
@@ -20,7 +20,7 @@ sys.path.insert(0, str(HERE.parent.parent / "tools"))
 from practice_network.agents import PORT, Agents
 from replies import identifier_of, reply
 
-# What they answer, and after how many seconds.
+# net-snmp's agents by address: the value that each answers, and its delay in seconds.
 REAL = {"127.0.1.1": (2, 0), "127.0.1.2": (1, 0), "127.0.1.7": (2, 1), "127.0.1.8": (2, 2.5)}
 OUTSHOUTED = "127.0.2.1"
 

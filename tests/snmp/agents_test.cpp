@@ -1,4 +1,4 @@
-// Exchanges with the agents of agents.py, which runs this program, over real sockets.
+// Queries the agents of agents.py over real sockets. agents.py runs this program.
 
 #include <gtest/gtest.h>
 
@@ -14,15 +14,15 @@ namespace {
 using std::chrono::milliseconds;
 using std::chrono::steady_clock;
 
-// The device's ActiveIF; nothing when it did not answer.
+// Returns the device's ActiveIF, or nothing when the device did not answer.
 std::optional<std::int64_t> ask(const char* address) {
   bool noReply = false;
   const auto result = snmp_query_table(&active_interface_table, address, noReply, nullptr, nullptr);
   return result ? std::optional(result->integerValue(kActiveIFKey)) : std::nullopt;
 }
 
-TEST(Agents, AreHeardAndNobodyElseForTwoSeconds) {
-  EXPECT_EQ(ask("127.0.2.1"), 2) << "strangers answer first, and otherwise";
+TEST(Agents, AreHeardForTwoSecondsAndOtherSendersAreIgnored) {
+  EXPECT_EQ(ask("127.0.2.1"), 2) << "other senders answer 1 before";
   EXPECT_EQ(ask("127.0.1.7"), 2) << "after 1 s";
   const auto start = steady_clock::now();
   EXPECT_EQ(ask("127.0.1.8"), std::nullopt) << "after 2.5 s";
@@ -30,8 +30,8 @@ TEST(Agents, AreHeardAndNobodyElseForTwoSeconds) {
   EXPECT_EQ(ask("127.0.1.2"), 1) << "the late answer does no harm";
 }
 
-// A closed port costs three pauses of 20 ms, and no wait of two seconds.
-TEST(Agents, ThatAreNotThereAreKnownAtOnceAndLeaveNoDescriptorOpen) {
+// A closed port takes three pauses of 20 ms, and no wait of two seconds for an answer.
+TEST(Agents, OnClosedPortsAreNoticedAtOnceAndLeaveNoDescriptorOpen) {
   using std::filesystem::directory_iterator;
   const auto open = [] {
     return std::distance(directory_iterator("/proc/self/fd"), directory_iterator());

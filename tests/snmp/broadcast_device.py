@@ -1,5 +1,5 @@
-"""broadcast_device.py KIND: a device that answers the first request on port 161 once with the number
-KIND, or as no decent agent does."""
+"""broadcast_device.py KIND: a device that answers the first request on port 161. KIND is the number
+to answer, or "stutter" or "flood", which send replies that no proper agent sends."""
 
 import socket
 import sys
@@ -11,7 +11,7 @@ SEVEN = reply(99, 7)
 TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
 NO_BINDINGS = SEVEN[:27] + b"\0"
 
-# What it sends, and after how many seconds. A search listens for 5 to 8 seconds.
+# Each kind's datagrams, with the seconds since the request. A search listens for 5 to 8 seconds.
 REPLIES = {
     "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(99, 7, status=2)), (0, TEXT),
                 (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN), (9, reply(99, 9))],

@@ -29,7 +29,7 @@ TEST(Integers, TakeTheFewestBytesAndAreSignExtendedByTheirSize) {
     std::int64_t value;
     const char* bytes;
     std::int64_t read;
-    std::uint64_t asUnsigned;  // also what replaces the value
+    std::uint64_t asUnsigned;  // also the value after ber_put_int()
   } cases[] = {
       {127, "02 01 7F", 127, 127},
       {128, "02 02 00 80", 128, 128},
@@ -79,13 +79,13 @@ TEST(Lengths, HaveThreeFormsAndNoOther) {
   }
 }
 
-TEST(ObjectIdentifiers, HaveTwoArcsInOneByteAndAtMost255Bytes) {
+TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255Bytes) {
   const auto put = [](std::vector<std::uint16_t> arcs) {
     const auto count = static_cast<std::uint16_t>(arcs.size());
     return written([&](ber_writer& out) { return ber_put_oid(out, {count, count, arcs.data()}); });
   };
   EXPECT_EQ(put({6, 15}), hex("06 01 FF"));
-  EXPECT_TRUE(put({6, 16}).empty()) << "6 x 40 + 16 is no byte";
+  EXPECT_TRUE(put({6, 16}).empty()) << "6 x 40 + 16 exceeds a byte";
   EXPECT_TRUE(put({1}).empty());
   EXPECT_EQ(put(std::vector<std::uint16_t>(256, 1)).size(), 258U);
   EXPECT_TRUE(put(std::vector<std::uint16_t>(257, 1)).empty());
@@ -96,11 +96,11 @@ TEST(ObjectIdentifiers, HaveTwoArcsInOneByteAndAtMost255Bytes) {
     snmp_oid target{room, room, arcs};
     ByteReader in(bytes);
     EXPECT_EQ(ber_get_oid(in, &target, 2), SNMP_ERR_CODEC);
-    EXPECT_EQ(arcs[room], 9) << "nothing is written behind it";
+    EXPECT_EQ(arcs[room], 9) << "nothing is written past the room";
   }
 }
 
-TEST(Primitives, ThatTheProgramDoesNotUseKeepTheirContracts) {
+TEST(Primitives, UnusedByTheProgramKeepTheirContracts) {
   std::uint16_t a[] = {1, 3, 6};
   std::uint16_t b[] = {1, 3, 7};
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {3, 3, b}), -1);
@@ -117,7 +117,7 @@ TEST(Primitives, ThatTheProgramDoesNotUseKeepTheirContracts) {
   EXPECT_EQ(target.capacity, 0) << "nothing may be written to the input";
 }
 
-TEST(Decoding, ReadsARealReplyInPlaceAndNoTruncatedOne) {
+TEST(Decoding, ReadsARealReplyInPlaceAndRefusesATruncatedOne) {
   const auto reply = realReply();
   Message m(1);
   for (std::size_t length = 0; length < reply.size(); ++length)
@@ -135,12 +135,12 @@ TEST(Decoding, ReadsARealReplyInPlaceAndNoTruncatedOne) {
   EXPECT_EQ(m.message.error_status, 2U);
   EXPECT_EQ(m.message.error_index, 1U);
   EXPECT_EQ(m.names[0].count, 6);
-  EXPECT_EQ(snmp_decode_message(m.message, reply), SNMP_ERR_CODEC) << "14 arcs into 6";
+  EXPECT_EQ(snmp_decode_message(m.message, reply), SNMP_ERR_CODEC) << "6 arcs fit, not 14";
 }
 
-TEST(Decoding, TakesEveryFormOfValue) {
+TEST(Decoding, AcceptsEveryFormOfValue) {
   const std::pair<const char*, const char*> cases[] = {
-      // the type, the number, the arcs and the string afterwards
+      // the resulting type, number, count of arcs, and string
       {"01 01 FF", "1 -1 4 cleared"},
       {"02 02 80 00", "2 -32768 4 cleared"},
       {"41 03 80 00 01", "65 4286578689 4 cleared"},
@@ -168,7 +168,7 @@ TEST(Decoding, TakesEveryFormOfValue) {
   }
 }
 
-TEST(Decoding, LaysStringsEndToEndAndKeepsWithinTheirPlaces) {
+TEST(Decoding, LaysStringsEndToEndWithinTheirRoom) {
   const auto reply = replyWith(
       "30 00 06 01 2B 04 03 61 62 63  30 00 06 01 2B 02 01 05  30 00 06 01 2B 40 04 64 65 66 67"
       "30 00 06 01 2B 44 02 78 79");
@@ -180,14 +180,14 @@ TEST(Decoding, LaysStringsEndToEndAndKeepsWithinTheirPlaces) {
     EXPECT_EQ(m.octets[3].bytes, m.strings.data() + 7);
     EXPECT_EQ(m.octets[3].capacity, room - 7);
     EXPECT_EQ(m.varbinds[3].index, 3U);
-    const auto last = static_cast<std::uint16_t>(room - 9);  // a place that the others do not share
+    const auto last = static_cast<std::uint16_t>(room - 9);  // the last string's own place
     m.reset();
     m.octets[3] = {last, last, m.strings.data() + 9};
     EXPECT_EQ(snmp_decode_message(m.message, reply), SNMP_ERR_CODEC) << room;
   }
 }
 
-TEST(Decoding, HoldsTheListToItsLengthAndBindingsToTheirRoomAndForm) {
+TEST(Decoding, ChecksTheListsLengthAndEveryBindingsRoomAndForm) {
   const std::string head = "02 01 00 04 00", pdu = "02 01 07 02 01 00 02 01 00",
                     bindings = "30 00 06 01 2B 05 00 30 00 06 01 2B 02 01 02",
                     list = head + "a2 1A" + pdu + "30";
@@ -230,7 +230,7 @@ TEST(Decoding, HoldsTheListToItsLengthAndBindingsToTheirRoomAndForm) {
   }
 }
 
-TEST(Encoding, RefusesWhatDoesNotFitTheBufferOr16Bits) {
+TEST(Encoding, RefusesMessagesThatExceedTheBufferOr16BitLengths) {
   Message m(1, 2, 65535);
   m.varbinds[0].type = kTagOctetString;
   const std::size_t size = m.encode().size();
@@ -251,7 +251,8 @@ TEST(Encoding, RefusesWhatDoesNotFitTheBufferOr16Bits) {
   EXPECT_TRUE(m.encode().empty());
 }
 
-// What net-snmp reads in a message: its kind, its number, and the type and value of its bindings.
+// Returns what net-snmp reads in a message: the PDU's type, the request identifier, and every
+// binding's type and value.
 std::string readByNetSnmp(std::vector<std::uint8_t> bytes) {
   netsnmp_session session{};
   snmp_sess_init(&session);
@@ -273,7 +274,7 @@ std::string readByNetSnmp(std::vector<std::uint8_t> bytes) {
   return text;
 }
 
-TEST(NetSnmpReads, TheRequestOfTheProgram) {
+TEST(NetSnmpReads, TheProgramsRequest) {
   Message m(1);
   ASSERT_EQ(m.decode(realReply()), SNMP_OK);
   snmp_message_init(m.message, 1);

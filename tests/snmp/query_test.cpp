@@ -1,4 +1,4 @@
-// Exchanges with agents that a test scripts: see tests/recording/agents.h.
+// Queries agents that the tests script; see tests/recording/agents.h.
 
 #include "snmp/query.h"
 
@@ -27,7 +27,7 @@ class Query : public testing::Test {
  protected:
   void SetUp() override {
     agents.reset();
-    snmp_request_counter = 7;  // replyWith's
+    snmp_request_counter = 7;  // the identifier in replyWith()'s replies
   }
   void TearDown() override {
     snmp_oid& name = active_interface_table.entries[0].oid;
@@ -42,7 +42,7 @@ class Query : public testing::Test {
   Agents& agents = Agents::instance();
 };
 
-// What a query leaves, as a text: the result's numbers, the flag, the error status and index.
+// Returns a query's results as text: the numbers, the no-reply flag, the error status and index.
 std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
   bool noReply = false;
   std::int32_t status = -1;
@@ -57,12 +57,12 @@ std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
          " " + std::to_string(index);
 }
 
-// A binding of 1.3 to a value, in hexadecimal.
+// Returns a binding of the name 1.3 to `value`. Both texts are hexadecimal.
 std::string binding(const std::string& value) {
   return "30 00 06 01 2B " + value;
 }
 
-TEST_F(Query, MakesAResultOfTheRepliesThatATableAsksFor) {
+TEST_F(Query, BuildsTheResultFromTheValuesThatATableAsksFor) {
   const auto one = binding("02 01 05");
   const auto two = binding("02 04 80 00 00 00");
   const auto text = binding("04 01 05");
@@ -80,7 +80,7 @@ TEST_F(Query, MakesAResultOfTheRepliesThatATableAsksFor) {
       {"a missing value", replyWith(one), "nothing 0 0"},
       {"no values", replyWith(""), "nothing 0 0"},
       {"a refusal", replyWith(one + two, 2, 3), "nothing 2 3"},
-      {"a value more than asked for", replyWith(one + two + one), kNoReply},
+      {"one value too many", replyWith(one + two + one), kNoReply},
       {"another request's identifier", stale, kNoReply},
       {"malformed", hex("30 07 02 84 DE AD BA BE 00"), kNoReply},
       {"empty", {}, kNoReply},
@@ -104,7 +104,7 @@ TEST_F(Query, MakesAResultOfTheRepliesThatATableAsksFor) {
   EXPECT_EQ(ask(replyWith("")), "nothing 0 0");
 }
 
-TEST_F(Query, AsksTheAddressUnderTheNextIdentifierForTwoSecondsEach) {
+TEST_F(Query, SendsTheNextIdentifierAndWaitsTwoSecondsAtMost) {
   EXPECT_EQ(kFirstIdentifier, 0);
   agents.answers["127.0.1.2"] = {2};
   bool noReply = false;
@@ -118,7 +118,7 @@ TEST_F(Query, AsksTheAddressUnderTheNextIdentifierForTwoSecondsEach) {
   EXPECT_THAT(agents.waits, ElementsAre(std::chrono::seconds(2), std::chrono::seconds(2)));
 }
 
-TEST_F(Query, TellsSilenceFromAQuestionThatCannotBeAsked) {
+TEST_F(Query, DistinguishesSilenceFromAnImpossibleRequest) {
   EXPECT_EQ(outcome(&active_interface_table), kNoReply);
   agents.answers["192.0.2.1"] = {Agents::kRefused};
   EXPECT_EQ(outcome(&active_interface_table), kNoReply);
@@ -136,7 +136,7 @@ TEST_F(Query, AsksForTheNameOfTheLatestReply) {
   EXPECT_EQ(active_interface_table.entries[0].oid.count, 6);
   snmp_request_counter = 7;
   reply(realReply());
-  EXPECT_EQ(outcome(&active_interface_table), kNoReply) << "14 arcs into 6";
+  EXPECT_EQ(outcome(&active_interface_table), kNoReply) << "6 arcs fit, not 14";
 }
 
 TEST_F(Query, ReturnsTheStatusOfTheExchange) {
@@ -145,10 +145,10 @@ TEST_F(Query, ReturnsTheStatusOfTheExchange) {
   EXPECT_THAT(agents.asked, IsEmpty());
 
   reply(replyWith(binding("05 00")));
-  EXPECT_EQ(snmp_exchange(m.message, "somewhere", 0), SNMP_OK) << "any other mode sends";
+  EXPECT_EQ(snmp_exchange(m.message, "somewhere", 0), SNMP_OK) << "all other modes send";
   EXPECT_THAT(agents.asked, ElementsAre("255.255.255.255"));
   EXPECT_EQ(std::string(m.message.community, m.message.community_length), "corridor")
-      << "the reply's is gone";
+      << "not the reply's community";
 
   snmp_request_counter = 6;
   EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT) << "stale";
@@ -176,10 +176,10 @@ TEST(Addresses, AreNormalizedPartByPart) {
     EXPECT_EQ(snmp_normalize_ipv4(text), normalized) << (text ? text : "null");
 }
 
-constexpr std::size_t kPduTagAt = 15;  // in a short message, behind the community
+constexpr std::size_t kPduTagAt = 15;  // the offset of the PDU's tag in a short message
 const std::int64_t kFirstExtendedIdentifier = snmp_request_counter_ext;
 
-// Two slots for strings, each with "##" behind its room, and one for a number.
+// Has two slots for strings, each followed by "##", and one slot for a number.
 class GetSet : public testing::Test {
  protected:
   void SetUp() override {
@@ -204,7 +204,7 @@ class GetSet : public testing::Test {
     m.message.pdu_type = kind;
     return snmp_get(m.message, std::span(slots).first(count), "192.0.2.1", kModeNetwork);
   }
-  // Binding i takes the slot that `indexes` has at i.
+  // Binding i uses slot number indexes[i].
   snmp_status set(const std::vector<std::uint32_t>& indexes) {
     snmp_message_init(m.message, indexes.size());
     for (std::size_t i = 0; i < indexes.size(); ++i)
@@ -229,14 +229,14 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
     const char* what;
     std::string reply;
     std::uint16_t capacity;  // of the second slot
-    std::string second;      // what is in it afterwards; the reply is refused when it is unchanged
+    std::string second;      // its contents afterwards; unchanged by a refused reply
   } cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},
       {"no room for the string", abc + abc + five, 2, "yy##"},
       {"a number for a string", abc + five + five, 4, "yyyy##"},
       {"another kind of string", abc + "30 00 06 01 2B 44 01 61", 4, "yyyy##"},
-      {"a value more than asked for", abc + abc + five + five, 4, "yyyy##"},
+      {"one value too many", abc + abc + five + five, 4, "yyyy##"},
   };
   for (const auto& c : cases) {
     for (const bool setting : {false, true}) {
@@ -254,7 +254,7 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   }
 }
 
-TEST_F(GetSet, SendTheSlotsThatTheIndexesNameWithinTheStorage) {
+TEST_F(GetSet, SendTheSlotsThatTheIndexesNameIfTheyFitTheStorage) {
   for (const std::uint16_t length : std::vector<std::uint16_t>{1, 16, 17, 500, 700}) {
     give(0, 700, length);
     give(1, 700, length);
@@ -265,7 +265,7 @@ TEST_F(GetSet, SendTheSlotsThatTheIndexesNameWithinTheStorage) {
     EXPECT_EQ(
         std::string(request.strings.begin(), request.strings.begin() + std::ptrdiff_t{2} * length),
         std::string(length, 'y') + std::string(length, 'x'));
-    EXPECT_EQ(texts[0].front(), 'y') << "the reply's first value, for the first slot";
+    EXPECT_EQ(texts[0].front(), 'y') << "the reply's first value goes to the first slot";
   }
   agents.asked.clear();
   give(0, 1500, 1485);
@@ -283,7 +283,7 @@ TEST_F(GetSet, SendTheSlotsThatTheIndexesNameWithinTheStorage) {
   EXPECT_EQ(slots[2].int_value, 70000);
 }
 
-TEST_F(GetSet, HandOnTheErrorStatusAndCountFromTwoHundred) {
+TEST_F(GetSet, ReturnTheErrorStatusAndCountRequestsFromTwoHundred) {
   EXPECT_EQ(kFirstExtendedIdentifier, 200);
   const std::int64_t next = snmp_request_counter_ext;
   reply = replyWith("", 2);
@@ -298,7 +298,7 @@ TEST_F(GetSet, HandOnTheErrorStatusAndCountFromTwoHundred) {
   slots[0].type = kTagNull;
   slots[0].int_value = m.varbinds[0].int_value = 9;
   EXPECT_EQ(get(1), SNMP_OK);
-  EXPECT_EQ(slots[0].int_value, 0) << "no earlier value";
+  EXPECT_EQ(slots[0].int_value, 0) << "the old value is gone";
 }
 
 }  // namespace

@@ -1,5 +1,5 @@
-// Every input is an agent's reply to a query, a get and a set. Nothing may be written beyond the
-// callers' storage, which ends where the heap's does.
+// Uses every input as an agent's reply to a query, a get and a set. Nothing may be written past the
+// callers' storage. The storage has no spare room, so the sanitizers report such a write.
 
 #include <array>
 #include <cstdio>
@@ -19,7 +19,7 @@ using namespace onramp;  // NOLINT(google-build-using-namespace)
 
 constexpr const char* kAddress = "192.0.2.1";
 
-// Ends the fuzz run, which keeps the input, when `holds` is false.
+// Aborts when `holds` is false. The fuzzer then keeps the input.
 void require(bool holds, const char* what) {
   if (holds) return;
   std::fprintf(stderr, "not so: %s\n", what);
@@ -33,7 +33,7 @@ void query() {
   snmp_request_counter = 7;
   bool noReply = false;
   const auto result = snmp_query_table(&table, kAddress, noReply, nullptr, nullptr);
-  require(!result || (result->find(kActiveIFKey) && !noReply), "a result has its value");
+  require(!result || (result->find(kActiveIFKey) && !noReply), "a result contains ActiveIF");
 }
 
 void exchangeStrings(bool set) {
@@ -61,7 +61,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   recording::Agents& agents = recording::Agents::instance();
   agents.reset();
   agents.reply = [=](const auto&) { return recording::Agents::Bytes(data, data + size); };
-  const std::clock_t start = std::clock();  // the process's own time, whatever else runs
+  const std::clock_t start = std::clock();  // processor time, whatever else runs
   query();
   exchangeStrings(false);
   exchangeStrings(true);

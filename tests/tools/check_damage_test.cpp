@@ -20,7 +20,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// A copy of the example medium that one random damage at a time is done to.
+/// A copy of the example medium, to which a test does one random damage at a time.
 class DamagedMedium {
  public:
   DamagedMedium() {
@@ -41,7 +41,8 @@ class DamagedMedium {
 
   [[nodiscard]] std::string path() const { return root_.string(); }
 
-  /// Does the damage of that number, and says what it was.
+  /// Damages one file, with `number` as the seed of all random choices, and returns a description.
+  /// mend() restores the file.
   std::string damage(unsigned number) {
     random_.seed(number);
     const fs::path file = files_[below(files_.size())];
@@ -89,7 +90,8 @@ class DamagedMedium {
     return what;
   }
 
-  // A random key below `dictionary` is removed, renamed or given another kind of value.
+  // Returns a copy in which one random key below `dictionary` is removed, renamed or given another
+  // kind of value. Appends a description to `what`.
   Dictionary damagedCopy(const Dictionary& dictionary, std::string& what) {
     std::vector<Dictionary::Pair> pairs(dictionary.begin(), dictionary.end());
     if (pairs.empty()) return dictionary;
@@ -116,7 +118,7 @@ class DamagedMedium {
   std::minstd_rand random_;
 };
 
-// What the wizard does until it waits for the user.
+// Returns what the wizard shows and opens before it waits for the user.
 std::string startOfTheWizard() {
   recording::FrontEnd& screen = recording::FrontEnd::instance();
   screen.reset();
@@ -131,14 +133,17 @@ std::string startOfTheWizard() {
   return start;
 }
 
+// Returns the start that `report` predicts, in the words of startOfTheWizard(). Returns `start`
+// itself when the wizard refused the system, and when the report predicts no page and the wizard
+// does not show the model list.
 std::string startIn(const check::Report& report, const std::string& start) {
   if (start == "refused") return start;
   if (report.start == FirstPage::kNone) return start.starts_with("ModelListView") ? "" : start;
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";
 }
 
-// More of them by hand: ONRAMP_DAMAGES=2000.
-TEST(OnrampCheck, ExplainsEveryOtherStartThatADamageCauses) {
+// For a longer run, set ONRAMP_DAMAGES to the number of damages.
+TEST(OnrampCheck, ReportsEveryDamageThatChangesTheStart) {
   const char* const wanted = std::getenv("ONRAMP_DAMAGES");
   const unsigned long count = wanted ? std::strtoul(wanted, nullptr, 10) : 100;
   const TemporaryFolder support;

@@ -1,4 +1,5 @@
-// Lists what the wizard's device chooser lists on the real network, one name a line.
+// Searches the real network for SECONDS with the wizard's device chooser. Then prints the names of
+// the listed devices, one on each line.
 //
 //   chooser_probe APPLICATION SECONDS MODEL…
 

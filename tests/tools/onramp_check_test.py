@@ -1,5 +1,5 @@
-"""Breaks a copy of the example medium in one way at a time and reads what onramp-check says.
-Arguments: the program, the application's information dictionary."""
+"""Makes one mistake at a time on a copy of the example medium and reads what onramp-check reports.
+Arguments: the program and the application's Info.plist."""
 
 import json
 import os
@@ -46,7 +46,7 @@ def run(*arguments, **options):
                           check=False, **options)
 
 
-# Each of these returns what breaks a medium's folder.
+# Most of these functions return a breaker: a function that makes one mistake in a medium's folder.
 
 def edit(path, change, form=plistlib.FMT_XML):
     def breaker(folder):
@@ -125,7 +125,7 @@ def maximum(major, minor, bug_fix):
     return put(COMMON, "SystemMax", {"Major": major, "Minor": minor, "BugFix": bug_fix})
 
 
-# What is done to the medium, the one finding's identifier, and parts of its text.
+# For each mistake: its breaker, the identifier of the only finding, and parts of the report on it.
 MISTAKES = [
     # The lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
@@ -212,7 +212,7 @@ MISTAKES = [
     (remove(PICTURE), "path-missing", "no picture beside USB"),
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
      "picture-size", "680 × 480", "192 × 192"),
-    (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "no whole PNG"),
+    (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
     # Names in the network and in files.
     (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", '"_pdl-datastream._tcp."'),
     (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
@@ -220,7 +220,7 @@ MISTAKES = [
     (take(COMMON, "BonjourNetwork"), "service-none", "no device is ever found"),
     (put(f"{APPLICATION}/Info.plist", "NSBonjourServices", ["_ipp._tcp"]), "service-undeclared",
      "_pdl-datastream._tcp"),
-    (put(COMMON, "VenderName", "Kestrel/Imaging"), "vendor-folder", "names no folder"),
+    (put(COMMON, "VenderName", "Kestrel/Imaging"), "vendor-folder", "the name of a folder"),
     (put(COMMON, "VenderName", "Kestrel " * 40), "vendor-long", "at most"),
     (put(COMMON, "VenderName", "Kestrél"), "vendor-letters", "outside ASCII"),
     (put(COMMON, "VenderName", " "), "vendor-empty", "an empty name"),
@@ -257,7 +257,7 @@ class OnrampCheck(unittest.TestCase):
                      "0 errors, 0 warnings, 17 models"):
             self.assertIn(line, result.stdout)
 
-    def test_tells_each_mistake_once_and_nothing_else(self):
+    def test_reports_each_mistake_once_and_nothing_else(self):
         for breaker, identifier, *parts in MISTAKES:
             with self.subTest(identifier, parts=parts):
                 result = run("--json", "--strict", self.broken(breaker))
@@ -275,7 +275,7 @@ class OnrampCheck(unittest.TestCase):
         self.assertGreater(len(rules), 40)
         self.assertEqual(set(), rules - {identifier for _, identifier, *_ in MISTAKES})
 
-    def test_a_line_has_the_place_the_cause_and_the_remedy(self):
+    def test_a_line_has_the_place_the_cause_and_the_effect(self):
         result = run(self.broken(replace(ENGLISH, '"Next";', '"Next"')))
         self.assertEqual(1, result.returncode)
         line = result.stdout.splitlines()[0]
@@ -289,11 +289,11 @@ class OnrampCheck(unittest.TestCase):
         listed = [line.split()[0] for line in run("--texts").stdout.splitlines()]
         self.assertEqual(sorted(asked), sorted(listed))
 
-    def test_warnings_count_only_when_it_is_strict(self):
+    def test_warnings_count_only_with_the_option_strict(self):
         medium = self.broken(put(COMMON, "Comment", "x"))
         self.assertEqual([0, 1], [run(medium).returncode, run("--strict", medium).returncode])
 
-    def test_tells_what_it_cannot_read(self):
+    def test_bad_arguments_fail_with_a_message(self):
         for arguments in (["/nowhere"], [], ["--jsn", "."], [__file__]):
             result = run(*arguments)
             self.assertEqual((2, ""), (result.returncode, result.stdout))

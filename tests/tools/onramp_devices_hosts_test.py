@@ -1,5 +1,5 @@
-"""Runs "onramp-devices hosts" in a separate network namespace; see tests/in_namespace.
-Arguments: the program, and the script that makes a network to search."""
+"""Runs "onramp-devices hosts" in a new network namespace; see tests/in_namespace.
+Arguments: the program, and the script that sets up a network to search."""
 
 import socket
 import subprocess
@@ -31,7 +31,7 @@ def answer(address, number):
 
 
 class Hosts(unittest.TestCase):
-    def test_shows_what_there_is_and_who_answers(self):
+    def test_shows_the_addresses_and_the_devices_that_answer(self):
         self.assertEqual(run("-n").stdout, NO_NETWORK)
         self.assertEqual(run().stdout, NO_NETWORK + "devices that answer: none\n")
 
@@ -54,7 +54,7 @@ class Hosts(unittest.TestCase):
         self.assertEqual(sorted(devices[256:]),
                          [answer("192.0.2.11", 1), answer("192.0.2.12", 2)] + [answer("192.0.2.13", 7)] * 3)
 
-    def test_tells_when_its_output_is_lost(self):
+    def test_tells_when_its_output_cannot_be_written(self):
         with open("/dev/full", "w", encoding="utf-8") as full:
             result = run("-n", stdout=full)
         self.assertEqual(result.returncode, 2)

@@ -1,5 +1,5 @@
-"""onramp-devices on a practice network with one device of every verdict, beside the wizard's own
-chooser and net-snmp. Arguments: the program, chooser_probe, an application's Info.plist."""
+"""Compares onramp-devices with the wizard's own chooser and net-snmp, on a practice network with one
+device per verdict. Arguments: the program, chooser_probe, an application's Info.plist."""
 
 import json
 import os
@@ -22,7 +22,7 @@ PROGRAM, PROBE, INFORMATION = map(os.path.abspath, sys.argv[1:4])
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
 MAKER_AND_MODEL = 'maker = "Kestrel"\nmodel = "Model 100"\n'
 
-# Verdict → the entries of the device that deserves it, which is called the same.
+# Verdict → the entries of a device that gets it. The device's name is the verdict.
 DEVICES = {
     "listed": MAKER_AND_MODEL,
     "on-cable": MAKER_AND_MODEL + "activeif = 1",
@@ -31,7 +31,7 @@ DEVICES = {
     "wrong-type": MAKER_AND_MODEL + 'activeif = "text"',
     "refused": MAKER_AND_MODEL + 'activeif = "closed"',
     "no-answer": MAKER_AND_MODEL + 'activeif = "silent"',
-    # test code answers at this address
+    # serve() answers at this address
     "late": MAKER_AND_MODEL + 'activeif = "closed"\naddresses = ["127.0.9.3"]',
     "other-subnet": MAKER_AND_MODEL + 'activeif = "silent"\naddresses = ["203.0.113.9"]',
     "ipv6-only": MAKER_AND_MODEL + 'addresses = ["fd00::9"]',
@@ -72,7 +72,7 @@ class Everybody(unittest.TestCase):
     def setUpClass(cls):
         serve("127.0.9.3", shortened, seconds=2.5)
 
-    def test_every_device_gets_its_reason(self):
+    def test_every_device_gets_its_verdict(self):
         ghost = start("avahi-publish-service", "-H", "nowhere.local", "unresolved",
                       "_pdl-datastream._tcp", "9100")
         self.addCleanup(ghost.communicate)
@@ -88,7 +88,7 @@ class Everybody(unittest.TestCase):
         self.assertGreater(devices["no-answer"]["delay"]["seconds"], 11)
         self.assertGreater(devices["late"]["answer"]["exchanges"][0]["seconds"], 2.4)
 
-    def test_the_list_is_the_wizards_for_every_model(self):
+    def test_the_list_equals_the_wizards_for_every_model(self):
         with open(pathlib.Path(os.environ["MEDIUM"], "MacResources", "CDInfo.plist"), "rb") as file:
             models = list(plistlib.load(file)["ContainedModel"])
         searches = [[model] for model in models] + [models]
@@ -125,7 +125,7 @@ class Everybody(unittest.TestCase):
                         re.search("noSuchName|STRING|Timeout", text)[0]])
                     self.assertEqual(answer["status"], 2)
 
-    def test_shows_what_a_strange_reply_does(self):
+    def test_shows_what_a_malformed_reply_does(self):
         answers = {"127.0.9.1": lambda request: request[:-6].replace(b"\xa0", b"\xa2") + b"?",
                    "127.0.9.2": shortened}
         for address, reply in answers.items():
@@ -153,7 +153,7 @@ class Everybody(unittest.TestCase):
 
 
 class Nobody(unittest.TestCase):
-    """A network without devices."""
+    """Tests on a network without devices."""
 
     def problems(self):
         result = run(*browse("-s", "1"))
@@ -174,7 +174,7 @@ class Nobody(unittest.TestCase):
 
 
 def shortened(request):
-    """A reply of 2 under the name asked for without its last arc, which takes as many bytes."""
+    """Returns a reply of the same length: 2, under the requested name without its last arc."""
     reply = request.replace(b"\xa0", b"\xa2", 1)
     name = reply.index(b"\x06\x0f")
     return reply[:name] + b"\x06\x0e" + reply[name + 2:name + 16] + b"\x02\x01\x02"
@@ -193,12 +193,12 @@ def serve(address, reply, seconds=0):
 
 
 class CommandLine(unittest.TestCase):
-    def test_refuses_with_a_remedy(self):
+    def test_refuses_bad_arguments_with_a_remedy(self):
         with tempfile.TemporaryDirectory() as empty:
             for arguments, message in ((["browse"], "--medium is required"),
                                        (["browse", "-m", empty], "holds no application"),
                                        (["ask"], "ADDRESS is required"),
-                                       (["ask", "no such host"], "no IPv4 address"),
+                                       (["ask", "no such host"], "neither an IPv4 address"),
                                        (["serch"], "--help")):
                 with self.subTest(arguments):
                     result = run(PROGRAM, *arguments)

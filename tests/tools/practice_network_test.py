@@ -1,4 +1,4 @@
-"""The practice network, seen with the ordinary tools of mDNS and SNMP."""
+"""Tests the practice network with the usual tools for mDNS and SNMP."""
 
 import os
 import pathlib
@@ -42,7 +42,7 @@ def run(*command, **options):
 
 
 def browse(service_type):
-    """Name → (address, port, TXT entries) of all devices that are there."""
+    """Returns name → (address, port, TXT entries) for all announced devices."""
     output = run("avahi-browse", "-rptk", service_type).stdout
     rows = [line.split(";", 9) for line in output.splitlines() if line.startswith("=")]
     unescape = lambda text: re.sub(rb"\\(\d{3})", lambda match: bytes([int(match[1])]),
@@ -52,7 +52,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Runs as the command of a network of DEVICES."""
+    """Runs inside a practice network of DEVICES, as its command."""
 
     def setUp(self):
         self.network = PracticeNetwork()
@@ -67,7 +67,7 @@ class FromInside(unittest.TestCase):
         self.assertEqual(browse("_ipp._tcp")["Scanner"][1:],
                          ("4000", {"usb_MFG=Kestrel", "usb_MDL=Scan 50"}))
 
-    def test_a_new_device_can_be_made_up_and_gets_another_name(self):
+    def test_a_new_device_can_be_added_and_renamed(self):
         run(TOOL, "ctl", "add", "New one", "maker=Kestrel", "model=Model 300",
             'addresses=["10.1.2.3"]', "activeif=7", check=True)
         self.addCleanup(self.network.remove, "Newer")
@@ -86,7 +86,7 @@ class FromInside(unittest.TestCase):
         self.network.settle()
         self.assertEqual(browse("_pdl-datastream._tcp")["Newer"], expected)
 
-    def test_devices_are_back_after_the_daemon_was_away(self):
+    def test_devices_are_back_after_the_daemon_was_stopped(self):
         self.network.stop_daemon()
         self.assertNotEqual(run("avahi-browse", "-at").returncode, 0)
         self.network.start_daemon()
@@ -124,7 +124,7 @@ class FromOutside(unittest.TestCase):
         result = self.run_tool(self.describe(DEVICES), sys.executable, "-B", __file__, "FromInside")
         self.assertEqual(result.returncode, 0, result.stderr)
 
-    def test_the_example_comes_up_whole(self):
+    def test_the_example_starts_completely(self):
         result = self.run_tool(str(EXAMPLE), "--", TOOL, "ctl", "list")
         self.assertEqual((result.stdout.count('"established"'), result.stdout.count('"withdrawn"')),
                          (19, 1), result.stderr)
@@ -161,7 +161,7 @@ class FromOutside(unittest.TestCase):
                     time.sleep(0.05)
                 self.assertEqual(processes_in(namespace), [])
 
-    def test_a_bad_description_is_named_with_its_remedy(self):
+    def test_a_bad_description_is_reported_with_its_remedy(self):
         for text, message in (
                 ("[[device]]\nname = x\n", "not valid TOML.*line 2"),
                 ('[[devices]]\nname = "A"', r'unknown entry "devices".*\[\[device\]\]'),
@@ -185,7 +185,7 @@ class FromOutside(unittest.TestCase):
                 self.assertRegex(result.stderr, message)
                 self.assertIn(path, result.stderr)
 
-    def test_a_missing_program_is_named_with_its_package(self):
+    def test_a_missing_program_is_reported_with_its_package(self):
         for program in ("unshare", "setpriv", "mount", "ip"):
             (self.folder / program).symlink_to("/bin/true")
         result = self.run_tool(self.describe(""), "true", env={"PATH": str(self.folder)})
@@ -200,7 +200,7 @@ def processes_in(namespace):
             if os.readlink(path) == namespace:
                 found.append(path)
         except OSError:
-            pass  # Ended meanwhile, or somebody else's.
+            pass  # The process has ended, or belongs to another user.
     return found
 
 

@@ -1,4 +1,4 @@
-"""Media for tests, each in a folder of its own."""
+"""Makes media for tests, each in its own folder."""
 
 import pathlib
 import plistlib
@@ -17,9 +17,9 @@ def model(usb=False, wired=False, wireless=False):
 
 
 def make(folder, built, models, tool_status=0, **resources):
-    """A medium with the application and the messages of the one in `built`.
+    """Makes a medium with the application, messages and pictures of the one in `built`.
 
-    Its set-up tool writes what it is called with to the file "tool" and exits with `tool_status`.
+    The set-up tool writes its arguments to the file "tool" and exits with `tool_status`.
     """
     folder, built = pathlib.Path(folder), pathlib.Path(built)
     shutil.copytree(built / "Onramp OSX.app", folder / "Onramp OSX.app")
@@ -49,7 +49,7 @@ def make(folder, built, models, tool_status=0, **resources):
 
 
 def make_tool(folder, status):
-    """A set-up tool in place of the one that is there."""
+    """Writes a set-up tool that exits with `status`, in place of an earlier one."""
     tool = folder / "Setup.app/Contents/Linux/setup"
     tool.parent.mkdir(exist_ok=True)
     tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {status}\n")

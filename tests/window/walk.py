@@ -3,10 +3,10 @@
 
 Usage: walk.py [--seed N] [--count N] [--silence SECONDS] MEDIUM
 
-Walk number i begins with seed N + i, so that a walk can be taken again: its seed and steps are
-printed when something is wrong with it. Wrong is: an end other than of its own accord, a main loop
-that is silent for longer than that (default 0.5), a window that cannot be closed in the end, and a
-hand-off file that is not whole.
+Walk number i, counted from 0, uses seed N + i, so that it can be repeated. A walk fails when the
+program exits with an error, when the main loop is silent for longer than SECONDS (default 0.5),
+when the window cannot be closed at the end, or when a hand-off file is incomplete. A failed walk
+prints its seed and its steps.
 """
 
 import argparse
@@ -33,11 +33,11 @@ CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu ite
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
 PRINTER = "_pdl-datastream._tcp"
-# Left to chance alone, most walks would end early and few would get far. There is no task bar that
-# could bring a hidden window back.
+# With equal weights, most walks would end early. Hide is never clicked, because no task bar can
+# bring a hidden window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
-# None of these leaves a question unanswered, for which the wizard would have to wait.
+# With any of these values a device answers at once, so that the wizard never waits for an answer.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
 
 
@@ -83,7 +83,7 @@ class Walk:
             try:
                 step(person)
             except (TimeoutError, *person.errors):
-                pass  # What was to be clicked has gone meanwhile.
+                pass  # The control has vanished meanwhile.
             self.listen(person, self.dice.choice((0, 0.1, 1)))
             self.check_files()
             if not person.is_running():
@@ -117,15 +117,15 @@ class Walk:
                              activeif=self.dice.choice(ANSWERS))
             self.devices[name] = True
         elif self.dice.random() < 0.5:
-            # It comes and goes as a service of the type that is browsed for; it goes on answering,
-            # since the wizard may be about to ask it.
+            # The device leaves the service type that the wizard browses for, or returns to it. It
+            # keeps answering, because the wizard may be about to ask it.
             self.devices[name] = not self.devices[name]
             self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
         else:
             self.network.set(name, note=f"after step {len(self.steps)}")
 
     def listen(self, person, seconds):
-        """Lets time pass in which the wizard has to answer all the time."""
+        """Waits for `seconds`, during which the wizard must keep answering."""
         until = time.monotonic() + seconds
         while True:
             silent = person.round_trip()
@@ -139,7 +139,7 @@ class Walk:
             time.sleep(0.05)
 
     def leave(self, person):
-        """It can be closed in the end: a search ends, and sheets and menus close with Escape."""
+        """Closes the window, which works once the search has ended. Escape closes sheets and menus."""
         until = time.monotonic() + PATIENCE
         while person.is_running():
             if time.monotonic() > until:
@@ -148,7 +148,7 @@ class Walk:
             person.close_window()
             time.sleep(0.3)
         if person.wait_for_end() != 0:
-            raise Wrong(f"it ended with status {person.wait_for_end()}")
+            raise Wrong(f"the program ended with status {person.wait_for_end()}")
 
     def check_files(self):
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
@@ -158,13 +158,13 @@ class Walk:
                 except FileNotFoundError:
                     continue
                 except Exception as error:
-                    raise Wrong(f"{file.name} is not whole: {error}") from error
+                    raise Wrong(f"{file.name} is incomplete: {error}") from error
                 if not {"Model", "Interface"} <= content.keys() and "PKG_FontSet" not in content:
-                    raise Wrong(f"{file.name} is not whole: {content}")
+                    raise Wrong(f"{file.name} is incomplete: {content}")
 
 
 def take_walks(seeds, silence):
-    """Whether nothing was wrong with these walks, which are taken one after the other."""
+    """Takes the walks one after the other and returns whether all of them passed."""
     network = PracticeNetwork()
     passed = True
     with Desktop() as desktop:
@@ -192,7 +192,7 @@ def main():
                                   *sys.argv, BUILT])
     shares = [range(options.seed + first, options.seed + options.count, AT_A_TIME)
               for first in range(AT_A_TIME)]
-    sys.argv.append(str(BUILT))  # which each process takes from there
+    sys.argv.append(str(BUILT))  # way.py takes it from there in each process
     with multiprocessing.get_context("spawn").Pool(AT_A_TIME) as pool:
         return all(pool.starmap(take_walks, [(share, options.silence) for share in shares]))
 

@@ -1,6 +1,6 @@
-"""What tests of whole ways through the wizard have in common.
+"""The common part of the tests that go through the wizard from start to end.
 
-The last argument of their program is a medium's folder with the application on it.
+The last argument of each test program is a medium's folder with the application on it.
 """
 
 import pathlib
@@ -21,16 +21,16 @@ from onscreen.person import Person  # noqa: E402
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TEXT = messages.read(BUILT, "en")
 PRACTICE_NETWORK = TOOLS / "practice-network"
-WIRELESS, WIRED = 2, 1  # what a device answers about its interface
+WIRELESS, WIRED = 2, 1  # a device's answers for ActiveIF
 GEAR, GEAR_REFRESH = "Actions", 2
-# The Cocoa front end under GNUstep lacks keys for menus and names for lists, and always has a display.
+# The Cocoa front end under GNUstep has no keys for menus, no names for lists and no options.
 ON_GNUSTEP = "gnustep_person" in sys.modules
 OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": False,
            "PKG_LabelTool": False, "PKG_FontSet": False}
 
 
 class WayTest(unittest.TestCase):
-    """A person on a desktop, and a medium of the test's own."""
+    """Gives each test a person on a desktop and its own medium."""
 
     @classmethod
     def setUpClass(cls):
@@ -47,7 +47,7 @@ class WayTest(unittest.TestCase):
         return self.enterContext(Person(self.desktop, program, arguments, env))
 
     def files(self):
-        """The hand-off files' contents by the last words of their names."""
+        """Returns the contents of the hand-off files by their short names, such as "instmodel"."""
         found = {}
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
             for path in folder.rglob("com.kestrelimaging.*"):

@@ -1,4 +1,4 @@
-"""Whole ways through the wizard in its real window.
+"""Tests that go through the wizard in its real window from start to end.
 
 Usage: ways_test.py [unittest options] MEDIUM, a medium's folder with the application on it.
 """
@@ -15,14 +15,14 @@ TWO_MODELS = {"Kestrel 1": model(usb=True, wired=True, wireless=True),
 
 
 class Ways(WayTest):
-    def test_keyboard_by_a_model_without_wireless(self):
+    def test_keyboard_for_a_model_without_wireless(self):
         person = self.start(TWO_MODELS)
         person.see("list item", "Kestrel 2")
         person.press("Down")
         person.press("Return")
         self.assert_installer_opened(person, {"Model": "Kestrel 2", "Interface": "Default"})
 
-    def test_keyboard_forth_and_back_and_forth(self):
+    def test_keyboard_forward_back_and_forward_again(self):
         person = self.start({name: model(usb=True, wired=wired, wireless=True)
                              for name, wired in (("A", True), ("B", False), ("C", True))})
         person.see("list item", "B")
@@ -60,7 +60,7 @@ class Ways(WayTest):
                 leave(person)
                 self.assert_quit_without_a_trace(person)
 
-    def test_systems_outside_the_range_are_told_why(self):
+    def test_systems_outside_the_range_get_an_explanation(self):
         cases = (("10.5.8", TEXT["INST_TXT_ALERT_OSMIN"].replace("%@", "10.6")),
                  ("11.0.0", TEXT["INST_TXT_ALERT_OSMAX"]))
         for version, reason in cases:
@@ -74,7 +74,7 @@ class Ways(WayTest):
                 person.click("push button", TEXT["BTN_CLOSE"])
                 self.assert_quit_without_a_trace(person)
 
-    def test_the_application_menu_speaks_the_users_language(self):
+    def test_the_application_menu_is_in_the_users_language(self):
         german = messages.read(BUILT, "de")
         person = self.start(TWO_MODELS, env={"LANG": "de_DE.UTF-8"})
         person.see("list item", "Kestrel 1")
@@ -87,7 +87,7 @@ class Ways(WayTest):
         person.click("menu item", german["APP_MENU_QUIT"])
         self.assert_quit_without_a_trace(person)
 
-    @unittest.skipIf(ON_GNUSTEP, "its lists have no names there")
+    @unittest.skipIf(ON_GNUSTEP, "lists have no names there")
     def test_lists_are_named_searched_by_any_word_and_take_a_double_click(self):
         person = self.start({"Kestrel Photo 1": model(usb=True, wireless=True),
                              "Kestrel Scan 2": model(usb=True, wired=True, wireless=True)})
@@ -102,7 +102,7 @@ class Ways(WayTest):
         person.click("push button", TEXT["BTN_NEXT"])
         self.assert_installer_opened(person, {"Model": "Kestrel Photo 1", "Interface": "Default"})
 
-    @unittest.skipIf(ON_GNUSTEP, "Cocoa has no such options")
+    @unittest.skipIf(ON_GNUSTEP, "the Cocoa front end has no options")
     def test_without_a_display_only_information_is_given(self):
         program = BUILT / "Onramp OSX.app/Contents/Linux/Onramp OSX"
         for arguments, status, start in ((["--help"], 0, "Usage: "), (["-v"], 0, "Onramp OSX "),

@@ -1,8 +1,8 @@
-"""Whole ways by the wireless row, in the wizard's real window on a practice network.
+"""Tests that choose wireless in the wizard's real window, on a practice network.
 
 Usage: wireless_test.py [TEST] MEDIUM, a medium's folder with the application on it.
-Every test has a process, a desktop and devices of its own, so several run at a time: most of a
-search is waiting.
+Every test has its own process, desktop and devices. Several tests run at a time, because a search
+is mostly waiting.
 """
 
 import concurrent.futures
@@ -19,7 +19,7 @@ from onscreen.processes import wait_for
 from practice_network import PracticeNetwork
 
 AT_A_TIME = 4
-PATIENCE = 60  # seconds, for what takes up to 15 where nothing else runs
+PATIENCE = 60  # seconds; on an idle machine, 15 are enough
 GEAR_TOOL = 1
 SUPPORT_PAGE = "http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"
 
@@ -37,7 +37,7 @@ class WirelessWays(WayTest):
         self.addCleanup(self.network.remove, name)
 
     def add_devices(self, *names):
-        """The whole names of devices that answer "wireless", once they are established."""
+        """Adds devices that answer "wireless", waits for them and returns their full names."""
         whole = [f"{name} of {self.kind}" for name in names]
         for name in whole:
             self.add(name)
@@ -45,7 +45,7 @@ class WirelessWays(WayTest):
         return whole
 
     def search(self, env=None, **details):
-        """From the start to the search's beginning, with the mouse."""
+        """Starts the wizard and clicks through it until a search begins."""
         person = self.start({self.model: model(usb=True, wired=True, wireless=True),
                              "Kestrel Cable": model(usb=True)}, env=env, **details)
         person.click("list item", self.model)
@@ -64,7 +64,7 @@ class WirelessWays(WayTest):
         person.see_gone("label", self.text["INST_WAIT"], PATIENCE)
 
     def search_in_vain(self, tool_status, env=None):
-        """To the return from a set-up tool that ended with `tool_status`."""
+        """Searches without success. The set-up tool then runs and exits with `tool_status`."""
         person = self.search(env, tool_status=tool_status)
         self.see_tool_run()
         return person
@@ -93,7 +93,7 @@ class WirelessWays(WayTest):
                 "IP address": address}})
 
     def hand_on(self, person, name):
-        """Chooses the device and goes on, which writes what the list has shown."""
+        """Chooses the device, clicks Next and expects the listed address in the hand-off file."""
         person.click("table cell", name)
         address = dict((row[0], row[2]) for row in person.rows())[name]
         person.click("push button", self.text["BTN_NEXT"])
@@ -109,7 +109,7 @@ class WirelessWays(WayTest):
                          [(name, TEXT["INST_TXT_CONNECTION_NETWORK"], "127.0.90.1")])
         if not ON_GNUSTEP:
             person.press("Tab")
-            person.open_menu()  # that of the gear, which comes after the list
+            person.open_menu()  # Tab leads from the list to the gear button
             person.press("Escape", "shift+Tab")
         person.press("Return")
         self.assert_handed_on(person, name, "127.0.90.1")
@@ -127,7 +127,7 @@ class WirelessWays(WayTest):
         person = self.search()
         self.see_chooser(person)
         self.assertEqual(self.names(person), [wanted])
-        # A second search takes in what the first did not wait for.
+        # The first search may have ended before it saw all devices, so a second one repeats it.
         person.choose_from_menu(GEAR, GEAR_REFRESH)
         self.see_waiting(person)
         self.see_chooser(person)
@@ -144,7 +144,7 @@ class WirelessWays(WayTest):
         self.see_chooser(person)
         self.hand_on(person, name)
 
-    def test_other_exit_searches_again_and_so_does_the_person(self):
+    def test_other_exit_status_searches_again_and_so_does_the_person(self):
         person = self.search_in_vain(tool_status=3)
         person.see("label", TEXT["INST_TXT_DEVLIST"])
         self.see_waiting(person)
@@ -187,7 +187,7 @@ class WirelessWays(WayTest):
         leaving, = self.add_devices("Leaving")
         person = self.search()
         self.see_chooser(person)
-        # Browsing is over: the list stays as it is.
+        # Browsing has ended, so the list does not change.
         self.network.remove(leaving)
         self.network.settle()
         self.assertEqual(self.names(person), [leaving])
@@ -215,7 +215,7 @@ class WirelessWays(WayTest):
         self.assertEqual(person.wait_for_end(), 0)
         self.assertEqual(self.files()["instmodel"]["Network"]["Bonjour"]["name"], names[-1])
 
-    def test_the_tool_started_by_hand_leads_where_it_says(self):
+    def test_the_tool_from_the_menu_decides_which_page_follows(self):
         name, = self.add_devices("One")
         person = self.search(tool_status=1)
         self.see_chooser(person)
@@ -235,7 +235,7 @@ class WirelessWays(WayTest):
 
 
 def run_all():
-    """Runs every test in a process of its own; whether all passed."""
+    """Runs every test in its own process and returns whether all passed."""
     names = unittest.defaultTestLoader.getTestCaseNames(WirelessWays)
     with concurrent.futures.ThreadPoolExecutor(AT_A_TIME) as pool:
         runs = pool.map(lambda name: subprocess.run(

@@ -4,11 +4,12 @@
 
 namespace onramp::check {
 
-/// What the application is called where a medium does not show it.
+/// The application's usual name, assumed for a medium without an application.
 inline constexpr const char* kUsualName = "Onramp OSX.app";
 
-/// Returns the name of the application at the top of the medium in the folder `root`: of several
-/// the first one that looks like the wizard. Empty when there is none.
+/// Returns the name of the application at the top of the medium in the folder `root`. If there are
+/// several, the first one in alphabetical order that looks like the wizard is preferred. Returns an
+/// empty string when there is none.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
 }  // namespace onramp::check

@@ -26,7 +26,7 @@ Report checkMedium(const std::string& root) {
          .found = "no application at the medium's top",
          .expected = "the wizard, beside \"MacResources\"",
          .effect = "there is nothing to double-click",
-         .remedy = "copy the application there; its usual settings are taken until then"});
+         .remedy = "copy the application there; until then, its usual settings are assumed"});
   }
   const MediumFiles files(folder, application, report);
   const Lists lists = readLists(files);

@@ -6,8 +6,8 @@
 
 namespace onramp::check {
 
-/// Checks the medium in the folder `root`, which exists. Makes the application that lies on it the
-/// running one, so that the wizard's own code reads this medium from then on.
+/// Checks the medium in the folder `root`, which must exist. Sets the main bundle to the
+/// application on that medium, so that the wizard's own code reads this medium from then on.
 [[nodiscard]] Report checkMedium(const std::string& root);
 
 }  // namespace onramp::check

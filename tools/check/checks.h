@@ -6,31 +6,33 @@
 
 namespace onramp::check {
 
-// Each checks one subject and adds to the report what is wrong, or what users will see.
+// Each function covers one subject. It adds to the report what is wrong, or what users will see.
 
-/// The names of the models, in and between the two lists.
+/// Checks the models' names in the medium description and compares them with those in the model
+/// information.
 void checkModelNames(const Lists& lists, Report& report);
 
-/// The models' connections and the page that the wizard begins with.
+/// Reports the models' connections and the page that the wizard begins with.
 void describeModels(const Lists& lists, Report& report);
 
-/// The supported range of systems and the package that each of them gets.
+/// Checks and reports the supported range of systems and the package that each system gets.
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
-/// The wireless set-up tool.
+/// Checks the wireless set-up tool.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
-/// The application beside the lists: its program, its resources.
+/// Checks the application apart from its Info.plist: its program and the list of countries with the
+/// online service.
 void checkApplication(const MediumFiles& files, const Lists& lists);
 
-/// What goes out into the network and to other programs: the service type, the vendor name, the
-/// series code.
+/// Checks what leaves the wizard for the network and for other programs: the service type, the
+/// vendor's name and the series code.
 void checkIdentity(const Lists& lists, Report& report);
 
-/// The texts of every language.
+/// Checks the texts of every language.
 void checkTexts(const MediumFiles& files, const Lists& lists);
 
-/// The pictures of the connections, and the application's background.
+/// Checks the pictures of the connections and the application's background picture.
 void checkPictures(const MediumFiles& files);
 
 }  // namespace onramp::check

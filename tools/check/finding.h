@@ -10,10 +10,10 @@ namespace onramp::check {
 
 enum class Severity {
   kError,    ///< users will see something wrong
-  kWarning,  ///< it may be meant, but it often is not
+  kWarning,  ///< this may be intended, but often is not
 };
 
-/// Where something was found.
+/// Where a mistake was found.
 struct Place {
   std::string file{};                 ///< relative to the medium
   std::vector<std::string> key{};     ///< the path of keys in a property list or strings table
@@ -21,8 +21,8 @@ struct Place {
   std::optional<std::size_t> byte{};  ///< from 0, in a binary file
 };
 
-/// One thing that is wrong with a medium. The texts are phrases without a full stop; an empty one
-/// is left out.
+/// One mistake on a medium. The texts are phrases without a full stop. An empty text is left out of
+/// the output.
 struct Finding {
   std::string id{};  ///< names the rule; stable, for programs
   Severity severity = Severity::kError;
@@ -34,7 +34,7 @@ struct Finding {
   std::string remedy{};
 };
 
-/// `text` in quotation marks.
+/// Returns `text` in quotation marks.
 [[nodiscard]] inline std::string quoted(std::string text) {
   return '"' + std::move(text) + '"';
 }

@@ -18,7 +18,8 @@ Place inResources(const Lists& lists, std::string_view key) {
   return {.file = lists.resourcesPath, .key = {std::string(key)}};
 }
 
-// "_name._tcp." or "_name._udp.", the name by RFC 6335 section 5.1.
+// Returns whether `type` is "_name._tcp." or "_name._udp." with a name that RFC 6335 section 5.1
+// allows.
 bool isServiceType(std::string_view type) {
   constexpr std::size_t kLongestName = 15;
   if (!type.starts_with('_') || !(type.ends_with("._tcp.") || type.ends_with("._udp.")))
@@ -51,7 +52,7 @@ void checkServiceType(const Lists& lists, Report& report) {
   const Place place = inResources(lists, medium::kBonjourNetwork);
   const auto type = lists.resources->string(medium::kBonjourNetwork);
   if (!type || type->empty()) {
-    if (lists.resources->find(medium::kBonjourNetwork) && !type) return;  // reported by its kind
+    if (lists.resources->find(medium::kBonjourNetwork) && !type) return;  // readLists() reported it
     if (!lists.anyWireless()) return;
     report.findings.push_back({.id = "service-none",
                                .place = {.file = lists.resourcesPath},
@@ -72,8 +73,8 @@ void checkServiceType(const Lists& lists, Report& report) {
     finding.expected = quoted(*type + ".");
   } else if (!isServiceType(*type)) {
     finding.id = "service-malformed";
-    finding.found += ", which nothing can be looked for by";
-    finding.expected = "\"_name._tcp.\", the name of at most 15 letters, digits and hyphens";
+    finding.found += ", which is malformed";
+    finding.expected = "\"_name._tcp.\", with a name of at most 15 letters, digits and hyphens";
   } else if (!identityKeysOf(*type)) {
     finding.id = "service-unknown";
     finding.found += ", whose devices do not say which model they are";
@@ -105,7 +106,7 @@ void checkVendor(const Lists& lists, Report& report) {
   } else if (name.find('/') != std::string::npos || name == "." || name == ".." ||
              std::any_of(name.begin(), name.end(), isControl)) {
     finding.id = "vendor-folder";
-    finding.found = quoted(*written) + ", which names no folder";
+    finding.found = quoted(*written) + ", which cannot be the name of a folder";
     finding.expected = "a name without \"/\" that is not \".\" or \"..\"";
   } else if (file.size() > kLongestFileName) {
     finding.id = "vendor-long";
@@ -117,7 +118,7 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.severity = Severity::kWarning;
     finding.found = quoted(*written) + ", with letters outside ASCII";
     finding.expected = "letters from A to Z, digits, blanks";
-    finding.effect = "names of a folder and of files that not every program writes in the same way";
+    finding.effect = "a folder and files with names that not every program spells in the same way";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }
@@ -132,8 +133,8 @@ void checkSeries(const Lists& lists, Report& report) {
                              .place = {.file = lists.descriptionPath, .key = {"KSCSeriesCode"}},
                              .found = "the series code " + quoted(series),
                              .expected = "letters, digits, \"-\", \".\", \"_\" and \"~\"",
-                             .effect = "the support page's button opens nothing, or a wrong page",
-                             .remedy = "write the code as the support site has it"});
+                             .effect = "the support page's button opens nothing, or the wrong page",
+                             .remedy = "write the code as the support site does"});
 }
 
 }  // namespace

@@ -50,7 +50,7 @@ const char* expectationOf(Kind kind) {
     case Kind::kText:
       return "a string";
     case Kind::kPath:
-      return "a string, a path from the medium's top";
+      return "a string: a path from the medium's top folder";
     case Kind::kBoolean:
       return "a boolean, <true/> or <false/>";
     case Kind::kNumberOrText:
@@ -116,7 +116,7 @@ class KeyCheck {
                                   .found = described(*value),
                                   .expected = expectationOf(rule.kind),
                                   .effect = rule.otherwise,
-                                  .remedy = "write it as that"});
+                                  .remedy = "write a value of the expected type"});
     }
   }
 

@@ -18,10 +18,10 @@ struct KeyRule {
   std::string_view key;
   Kind kind;
   Need need;
-  const char* otherwise;  ///< what users see when it is absent or of another kind
+  const char* otherwise;  ///< what users see when the key is absent or its value of another kind
 };
 
-/// Where a dictionary stands.
+/// The location of a dictionary: its file and the path of keys that leads to it.
 struct DictionaryPlace {
   std::string file;
   std::vector<std::string> path;
@@ -32,13 +32,13 @@ struct DictionaryPlace {
 /// What to do with a key that no rule names.
 enum class OtherKeys { kReported, kAllowed };
 
-/// Reports keys of `dictionary` that are unknown, misspelt, missing or of the wrong kind. A key
-/// that is nearly one of the absent known keys is reported as that one's misspelling, even where
-/// other keys are allowed.
+/// Reports keys of `dictionary` that are unknown, misspelt or missing, and values of the wrong
+/// kind. An unknown key that is spelled almost like an absent known key is reported as a
+/// misspelling of it, even where other keys are allowed.
 void checkKeys(const Dictionary& dictionary, const DictionaryPlace& place,
                std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report);
 
-/// The value in words: its kind, and for a text or a number itself.
+/// Returns the value's kind in words, followed by the value itself if it is a text or a number.
 [[nodiscard]] std::string described(const Value& value);
 
 }  // namespace onramp::check

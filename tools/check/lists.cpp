@@ -34,7 +34,7 @@ constexpr std::array kResourceRules{
     KeyRule{medium::kSystemMin, Kind::kDictionary, Need::kOptional, "no system is too old"},
     KeyRule{medium::kSystemMax, Kind::kDictionary, Need::kOptional, "no system is too new"},
     KeyRule{medium::kVenderName, Kind::kText, Need::kRequired,
-            "the package does not find the wizard's files: their names lack the maker"},
+            "the package does not find the wizard's files: their names lack the maker's name"},
     KeyRule{medium::kWLANtool, Kind::kPath, Need::kOptional,
             "no set-up tool runs when no wireless device is found"},
 };
@@ -79,10 +79,12 @@ constexpr std::array kTypeRules{
 };
 
 constexpr std::array kOptionRules{
-    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets it as it is"},
+    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets the value as it is"},
     KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "it counts as true"},
-    KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional, "the package gets it as it is"},
-    KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional, "the package gets it as it is"},
+    KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional,
+            "the package gets the value as it is"},
+    KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional,
+            "the package gets the value as it is"},
     KeyRule{"PKG_FontSet", Kind::kAny, Need::kOptional, "the fonts are not installed"},
 };
 
@@ -99,7 +101,7 @@ constexpr std::array kModelRules{
 constexpr std::array kInterfaceRules{
     KeyRule{"USB", Kind::kBoolean, Need::kAdvised, "the model counts as one with USB"},
     KeyRule{"WiredLAN", Kind::kBoolean, Need::kAdvised,
-            "the model counts as one without a cable network"},
+            "the model counts as one without a wired network"},
     KeyRule{"WirelessLAN", Kind::kBoolean, Need::kAdvised,
             "the model counts as one without wireless"},
 };
@@ -108,7 +110,7 @@ bool isPackageVersion(const std::string& key) {
   return !key.empty() && std::all_of(key.begin(), key.end(), isASCIIDigit);
 }
 
-// Package keys of other versions have a report of their own.
+// checkPackages() reports package keys of unknown versions, so this removes them.
 Dictionary withoutOtherVersions(const Dictionary& package) {
   std::vector<Dictionary::Pair> pairs;
   for (const auto& pair : package) {
@@ -119,7 +121,7 @@ Dictionary withoutOtherVersions(const Dictionary& package) {
   return Dictionary(std::move(pairs));
 }
 
-// The rules for the dictionary under `key`, if there is one.
+// Applies the rules to the dictionary under `key`, if there is one.
 void checkInner(const Dictionary& outer, DictionaryPlace place, std::string_view key,
                 std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report) {
   const auto inner = outer.dictionary(key);
@@ -157,7 +159,7 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
                                  .found = described(value),
                                  .expected = "a dictionary",
                                  .effect = "the model has USB only",
-                                 .remedy = "write it as that"});
+                                 .remedy = "write a value of the expected type"});
       continue;
     }
     checkKeys(*entry, place, kModelRules, OtherKeys::kReported, report);
@@ -165,7 +167,8 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
   }
 }
 
-// The list whose path `resources` has under `key`, and that path.
+// Reads the property list whose path stands in the resource dictionary under `key`. Sets `path` to
+// that path.
 std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists,
                                     std::string_view key, const char* what, const char* effect,
                                     std::string& path) {
@@ -193,7 +196,7 @@ Lists readLists(const MediumFiles& files) {
     lists.informationPath = report.application + "/Contents/Info.plist";
     lists.information =
         files.list(lists.informationPath,
-                   {{.file = lists.informationPath}, "the application's list", kNoModels});
+                   {{.file = lists.informationPath}, "the application's Info.plist", kNoModels});
     if (!lists.information) return lists;
     checkKeys(*lists.information, {lists.informationPath, {}}, kInformationRules,
               OtherKeys::kAllowed, report);

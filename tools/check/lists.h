@@ -9,11 +9,11 @@
 
 namespace onramp::check {
 
-/// The property lists that the wizard reads from a medium. A list is nothing when the wizard cannot
-/// read it.
+/// The property lists that the wizard reads from a medium. A list that the wizard cannot read is
+/// nothing.
 struct Lists {
   std::string informationPath;            ///< relative to the medium, like the other paths
-  std::optional<Dictionary> information;  ///< the application's
+  std::optional<Dictionary> information;  ///< the application's Info.plist
   std::string resourcesPath;
   std::optional<Dictionary> resources;
   std::string descriptionPath;
@@ -21,14 +21,14 @@ struct Lists {
   std::string modelsPath;
   std::optional<Dictionary> models;
 
-  /// The models of the medium in the wizard's order.
+  /// Returns the medium's models in the order in which the wizard shows them.
   [[nodiscard]] std::vector<std::string> modelNames() const;
 
-  /// Whether any model supports wireless.
+  /// Returns whether any model supports wireless.
   [[nodiscard]] bool anyWireless() const;
 };
 
-/// Reads the lists and reports what is wrong with their keys and the kinds of their values.
+/// Reads the lists. Reports mistakes in their keys and in the kinds of their values.
 [[nodiscard]] Lists readLists(const MediumFiles& files);
 
 }  // namespace onramp::check

@@ -1,4 +1,4 @@
-// onramp-check: reads a finished medium as the wizard does and says what is wrong with it.
+// onramp-check: reads a finished medium as the wizard does and reports what is wrong with it.
 
 #include <CLI/CLI.hpp>
 #include <cstdlib>
@@ -19,13 +19,14 @@ constexpr int kFindings = 1;
 constexpr int kUnreadable = 2;
 
 constexpr const char* kFooter = R"(Examples:
-  onramp-check /Volumes/Setup          what is wrong with the medium there
-  onramp-check --json build/medium     the same for a program
+  onramp-check /Volumes/Setup          print what is wrong with that medium
+  onramp-check --json build/medium     print it as JSON, for a program
 
-Exit status: 0 when the medium is clean, 1 when something was found, 2 when the
-medium could not be read or the command line is wrong.)";
+Exit status: 0 when there is no error (with --strict: and no warning), 1 when
+there is one, 2 when the medium could not be read, the output could not be
+written or the command line is wrong.)";
 
-// `status`, unless what was written did not arrive.
+// Returns `status`, or kUnreadable after a message when standard output could not be written.
 int finish(int status) {
   if (std::cout.flush()) return status;
   std::cerr << "onramp-check: the output could not be written; is its disk full?\n";
@@ -43,8 +44,9 @@ int run(int count, char* arguments[]) {
   bool texts = false;
   app.add_option("MEDIUM", medium, "The folder that the application lies in");
   app.add_flag("--json", json, "Print JSON");
-  app.add_flag("--strict", strict, "Exit with 1 for warnings, too");
-  app.add_flag("--texts", texts, "Print the texts that the wizard shows, and how wide they may be");
+  app.add_flag("--strict", strict, "Exit with status 1 for warnings, too");
+  app.add_flag("--texts", texts,
+               "Print the keys of the texts that the wizard shows, and the room for each");
   try {
     app.parse(count, arguments);
   } catch (const CLI::ParseError& error) {
@@ -57,7 +59,7 @@ int run(int count, char* arguments[]) {
   std::error_code ignored;
   if (!std::filesystem::is_directory(medium, ignored)) {
     std::cerr << "onramp-check: "
-              << (medium.empty() ? "no MEDIUM is named" : check::quoted(medium) + " is no folder")
+              << (medium.empty() ? "MEDIUM is missing" : check::quoted(medium) + " is not a folder")
               << "; give the folder that holds the application\n";
     return kUnreadable;
   }

@@ -35,7 +35,8 @@ std::vector<std::string> namesIn(const std::string& folder) {
   return names;
 }
 
-// The components of a path without "." and with ".." taken away; nothing when it leads out.
+// Returns the components of a relative path with "." and ".." resolved; nothing when the path leads
+// out of its starting folder.
 std::optional<std::vector<std::string>> components(const std::string& path) {
   std::vector<std::string> parts;
   for (const fs::path& part : fs::path(path)) {
@@ -52,7 +53,7 @@ std::optional<std::vector<std::string>> components(const std::string& path) {
 bool isInside(const std::string& path, const std::string& root) {
   std::error_code error;
   const fs::path real = fs::canonical(path, error);
-  if (error) return true;  // nothing lies there
+  if (error) return true;  // there is no such file; exists() reports that
   const fs::path realRoot = fs::canonical(root, error);
   return error || std::mismatch(realRoot.begin(), realRoot.end(), real.begin(), real.end()).first ==
                       realRoot.end();
@@ -63,7 +64,7 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
-// Why the wizard cannot read a file's bytes, with the place.
+// Adds to `finding` why the wizard cannot read the bytes of a file, and the place.
 void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   ParseProblem problem;
   const auto text = bytes.starts_with("bplist") ? std::nullopt : decodedText(bytes);
@@ -72,7 +73,7 @@ void explain(const std::string& bytes, bool isStrings, Finding& finding) {
                          : libplist::parsePropertyList(bytes, problem);
   if (isStrings && text && !isXML(*text)) static_cast<void>(parseStrings(*text, problem));
   if (value) {
-    finding.found = "a property list whose outermost value is no dictionary";
+    finding.found = "a property list whose outermost value is not a dictionary";
     finding.expected = "a dictionary";
     return;
   }
@@ -84,7 +85,7 @@ void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   }
   if (!finding.found.empty()) return;
   const XMLLines lines = text ? xmlLines(*text) : XMLLines();
-  finding.found = lines.problem.empty() ? "no property list" : lines.problem;
+  finding.found = lines.problem.empty() ? "not a property list" : lines.problem;
   if (lines.problemLine > 0) finding.place.line = lines.problemLine;
 }
 
@@ -108,7 +109,7 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
     finding.found = use.what + " at " + quoted(relative) + ", which leads out of the medium";
     finding.expected = "a path inside the medium";
     finding.remedy = "put the file on the medium and write its path from the medium's top";
-    finding.effect = "it works only where such a file happens to lie; elsewhere " + use.effect;
+    finding.effect = "it works only where such a file happens to exist; elsewhere, " + use.effect;
     report_.findings.push_back(std::move(finding));
     return false;
   }
@@ -120,12 +121,12 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
       const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
       finding.id = capitals ? "path-capitals" : "path-missing";
       finding.found = use.what + " at " + quoted(relative) +
-                      (capitals ? ", which differs in capitals from the name on the medium"
-                                : ", where nothing lies");
+                      (capitals ? ", which differs from the name on the medium in capitals only"
+                                : ", which does not exist");
       finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
                                         : quoted(part) + " in " + quoted(folder);
       if (nearest) finding.nearest = *nearest;
-      finding.remedy = nearest ? "spell both alike" : "put it there, or correct the path";
+      finding.remedy = nearest ? "use one spelling for both" : "put it there, or correct the path";
       report_.findings.push_back(std::move(finding));
       return false;
     }
@@ -150,7 +151,7 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
     finding.expected = "at most " + std::to_string(kMostPropertyListBytes) + " bytes";
     finding.remedy = "spread the models over several media";
   } else if (const auto bytes = posix::readFile(path, kMostPropertyListBytes); !bytes) {
-    finding.found = "a file that may not be read";
+    finding.found = "a file that cannot be read";
     finding.remedy = "let everyone read it (chmod a+r)";
   } else if (bytes->empty()) {
     finding.found = "an empty file";
@@ -177,9 +178,9 @@ std::optional<Dictionary> MediumFiles::list(const std::string& relative, const P
   for (const auto& [key, line] : linesOf(relative).twice) {
     report_.findings.push_back({.id = "key-twice",
                                 .place = {.file = relative, .key = key, .line = line},
-                                .found = "a key that its dictionary has already",
+                                .found = "a key that its dictionary already has",
                                 .expected = "every key once",
-                                .effect = "one of the two values, which one depends on the system",
+                                .effect = "one of the two values; which one depends on the system",
                                 .remedy = "remove one of them"});
   }
   return list;

@@ -11,44 +11,47 @@
 
 namespace onramp::check {
 
-/// Who names a path, and what users see when nothing usable lies there.
+/// Where a path is named, what it is for, and what users see when it leads to nothing usable.
 struct PathUse {
-  Place place{};         ///< of the text that is the path
+  Place place{};         ///< where the path is written
   std::string what{};    ///< such as "the medium description"
   std::string effect{};  ///< a phrase
 };
 
-/// The files of one medium, by paths relative to it. Whatever is wrong with a file goes into the
-/// report once.
+/// The files of one medium. Relative paths start at the medium's top folder. The functions add what
+/// is wrong with a file to the report.
 class MediumFiles {
  public:
-  /// `root` is the medium's folder; `application` is the application's bundle in it, which paths
-  /// count from, whether or not it is there.
+  /// `root` is the medium's folder. `application` is the path of the application's bundle in it,
+  /// which need not exist.
   MediumFiles(std::string root, std::string application, Report& report);
 
   [[nodiscard]] const std::string& root() const { return root_; }
   [[nodiscard]] const std::string& application() const { return application_; }
   [[nodiscard]] Report& report() const { return report_; }
 
-  /// Where the wizard looks for `relative`.
+  /// Returns the path at which the wizard looks for `relative`.
   [[nodiscard]] std::string fullPath(const std::string& relative) const;
 
-  /// Whether something lies at `relative` as it is spelled there, inside the medium. What is wrong
-  /// is reported.
+  /// Returns whether `relative` leads to a file or folder inside the medium whose name is spelled
+  /// exactly so. Reports the mistake if not.
   bool exists(const std::string& relative, const PathUse& use) const;
 
-  /// The property list at `relative`; nothing, after a report, when the wizard cannot read it.
+  /// Returns the property list at `relative`. When the wizard cannot read it, reports why and
+  /// returns nothing.
   [[nodiscard]] std::optional<Dictionary> list(const std::string& relative,
                                                const PathUse& use) const;
 
-  /// The strings table at `relative`, likewise.
+  /// Returns the strings table at `relative`. When the wizard cannot read it, reports why and
+  /// returns nothing.
   [[nodiscard]] std::optional<Dictionary> strings(const std::string& relative,
                                                   const PathUse& use) const;
 
-  /// The names in the folder at `relative`, sorted; none when there is no such folder.
+  /// Returns the sorted names of the entries in the folder at `relative`; none when there is no
+  /// such folder.
   [[nodiscard]] std::vector<std::string> names(const std::string& relative) const;
 
-  /// Gives the findings that name a key of an XML property list the line of that key.
+  /// Adds the line number to each finding about a key of an XML property list.
   void addLines() const;
 
  private:
@@ -59,7 +62,7 @@ class MediumFiles {
   std::string root_;
   std::string application_;
   Report& report_;
-  mutable std::map<std::string, XMLLines> lines_;  ///< of the lists looked at so far
+  mutable std::map<std::string, XMLLines> lines_;  ///< of the property lists read so far
 };
 
 }  // namespace onramp::check

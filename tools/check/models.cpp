@@ -38,7 +38,8 @@ class ModelCheck {
  public:
   ModelCheck(const Lists& lists, Report& report) : lists_(lists), report_(report) {}
 
-  // A name of one list that is nearly one of the other is reported once, as a pair.
+  // Reports names that only one of the two lists has. Two almost equal names, one from each list,
+  // are one finding.
   void compareLists() {
     const auto contained = lists_.description->dictionary(kContained);
     const auto described = lists_.models->dictionary("Model");
@@ -98,7 +99,7 @@ class ModelCheck {
                .expected = "the same name under \"Model\" there",
                .nearest = nearest.value_or(""),
                .effect = "the model has USB only: the package opens as soon as it is chosen",
-               .remedy = nearest ? "spell both alike" : "describe the model there"});
+               .remedy = nearest ? "use one spelling for both" : "describe the model there"});
   }
 
   void unoffered(const std::string& name) {
@@ -111,8 +112,9 @@ class ModelCheck {
          .remedy = "add it there, or remove it here"});
   }
 
-  // A device's name is the two texts of its announcement with a blank between them. A text is
-  // announced together with its key ("usb_MFG=") in at most 255 bytes.
+  // Reports a model's name that no device can announce. Devices announce maker and model as two
+  // texts, which the wizard joins with a blank. Each text has at most 255 bytes, its key
+  // ("usb_MFG=") included.
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
     const std::size_t blank = name.find(' ');
@@ -129,12 +131,13 @@ class ModelCheck {
       impossible("a name without a blank", "the USB manufacturer, a blank, the USB model",
                  "write both as the devices announce them");
     } else if (name.size() > kMostBytes) {
-      impossible("a name of " + std::to_string(name.size()) + " bytes",
-                 "at most " + std::to_string(kMostBytes) + ", which is what a device can announce",
-                 "write it as the devices announce it");
+      impossible(
+          "a name of " + std::to_string(name.size()) + " bytes",
+          "at most " + std::to_string(kMostBytes) + " bytes, the most that a device can announce",
+          "write it as the devices announce it");
     } else if (control || !isUTF8(name)) {
       impossible("a name with a line break, a tab or another control character",
-                 "printable characters", "take it out");
+                 "printable characters", "remove that character");
     } else if (name.front() == ' ' || name.back() == ' ' || name.find("  ") != std::string::npos) {
       const bool edge = name.front() == ' ' || name.back() == ' ';
       add(name, {.id = "model-blanks",

@@ -6,14 +6,15 @@
 
 namespace onramp::check {
 
-/// Writes a line for every finding, then what users will see, then a summary.
+/// Writes a line for every finding, then a description of what users will see, then a summary.
 void writeText(std::ostream& out, const Report& report);
 
 /// Writes the report as JSON, in the form that onramp-check(1) describes. Bytes that are not UTF-8
 /// become replacement characters.
 void writeJSON(std::ostream& out, const Report& report);
 
-/// Writes the keys of all texts that the wizard shows, a line each, with the room that they have.
+/// Writes a line for every text that the wizard shows: its key, the room that it has and where it
+/// is shown.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check

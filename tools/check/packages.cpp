@@ -18,7 +18,8 @@ namespace {
 
 using Version = std::array<std::int64_t, 3>;
 
-// Every system that may get another package than the one before it, down to the first.
+// Returns every version that may get another package than the version before it, and the first
+// version.
 std::set<Version> differentSystems() {
   constexpr std::int64_t kLastMinor = 16;
   std::set<Version> systems{{11, 0, 0}};
@@ -44,7 +45,7 @@ Version boundOf(const Dictionary& bound) {
   return {bound.integerValue("Major"), bound.integerValue("Minor"), bound.integerValue("BugFix")};
 }
 
-// The package's key by the wizard's own rule; empty for none.
+// Returns the package's key for a version by the wizard's own rule; empty when there is none.
 std::string versionKey(const Version& version) {
   setSystemVersion(std::to_string(version[0]) + "." + std::to_string(version[1]) + "." +
                    std::to_string(version[2]));
@@ -88,7 +89,7 @@ class PackageCheck {
            SystemSupport::kSupported;
   }
 
-  // The first system above the range; nothing when there is none.
+  // Returns the first version above the range; nothing when the range has no upper end.
   [[nodiscard]] std::optional<Version> end() const {
     const Dictionary& maximum = info_.supportSystemMax();
     if (!isBound(maximum)) return std::nullopt;
@@ -102,7 +103,8 @@ class PackageCheck {
     return isBound(minimum) ? boundOf(minimum) : Version{};
   }
 
-  // "10.13.0 up to, but not including, 13.0", or to the range's end.
+  // Returns a range in words, such as "10.13.0 up to, but not including, 13.0". Without `to`, the
+  // range has no upper end.
   [[nodiscard]] std::string words(const Version& from, const std::optional<Version>& to) const {
     const std::string first = from == Version{} ? "" : dotted(from);
     if (!to) return first.empty() ? "every system" : first + " and later";
@@ -141,13 +143,15 @@ class PackageCheck {
     if (isSupported(begin())) return;
     report_.findings.push_back({.id = "range-empty",
                                 .place = placeOf(medium::kSystemMax),
-                                .found = "a range that no system lies in: " + report_.systems,
+                                .found = "a range that contains no system: " + report_.systems,
                                 .expected = "a newest system that is newer than the oldest",
                                 .effect = "every system is refused",
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }
 
-  // A maximum with a number for its bug-fix release is fine where it begins a major version.
+  // Warns of a maximum whose "BugFix" is a number, because that release itself is refused. Does not
+  // warn of the first release of a major version, which is the usual way to exclude all of that
+  // version.
   void checkNamedMaximum() {
     const Dictionary& maximum = info_.supportSystemMax();
     const auto text = maximum.string("BugFix");
@@ -161,7 +165,7 @@ class PackageCheck {
          .severity = Severity::kWarning,
          .place = placeOf(medium::kSystemMax, "BugFix"),
          .found = "a range of " + report_.systems,
-         .expected = "\"x\" for \"BugFix\" to take all of " + std::to_string(named[0]) + "." +
+         .expected = "\"x\" for \"BugFix\" to accept all of " + std::to_string(named[0]) + "." +
                      std::to_string(named[1]) + ", or the first release that is refused",
          .effect = name + " itself is refused as too new",
          .remedy = "leave it only if " + name + " is meant to be refused"});
@@ -184,7 +188,8 @@ class PackageCheck {
                                 .remedy = "widen the range with \"SystemMax\""});
   }
 
-  // The package of one system by the wizard's own rule, as a path from the medium's top.
+  // Returns the package for one version by the wizard's own rule, as a path from the medium's top
+  // folder; empty when there is none.
   [[nodiscard]] std::string packageFor(const Version& version) {
     usedKeys_.insert(versionKey(version));
     info_.loadPkgURL(lists_.resources);
@@ -231,7 +236,7 @@ class PackageCheck {
       if (checked_.insert(row.package).second) static_cast<void>(files_.exists(row.package, use));
       return;
     }
-    // Another kind of value under the key, or no folder, has been reported.
+    // readLists() has reported a value of the wrong type and a missing "PkgLocation".
     if (package.find(key) || !package.string("PkgLocation")) return;
     report_.findings.push_back(
         {.id = "package-none",
@@ -262,7 +267,7 @@ class PackageCheck {
          .found = "\"PkgName\" beside " + shadowed,
          .expected = "either \"PkgName\" or packages by version",
          .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
-         .remedy = "remove \"PkgName\", or the keys that it goes before"});
+         .remedy = "remove \"PkgName\", or the keys that it takes precedence over"});
   }
 
   void neverUsed(const std::string& key) {
@@ -290,7 +295,7 @@ class PackageCheck {
   KSInstallerInfo info_;
   std::vector<Row> rows_;
   std::set<std::string> knownKeys_;
-  std::set<std::string> usedKeys_;  ///< by supported systems
+  std::set<std::string> usedKeys_;  ///< keys that supported systems use
   std::set<std::string> checked_;
 };
 

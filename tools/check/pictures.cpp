@@ -27,14 +27,14 @@ constexpr std::array kConnectionPictures{
 };
 constexpr Picture kBackground{"Background.png", 680, 480, "a window without a background picture"};
 
-// What a picture file holds.
+// The size of a picture, and why it cannot be shown.
 struct Decoded {
   std::uint32_t width = 0;
   std::uint32_t height = 0;
-  std::string problem{};  ///< empty for a whole picture
+  std::string problem{};  ///< empty for an intact picture
 };
 
-// Owns what libpng keeps for a picture.
+// Owns libpng's state for a picture.
 class Image {
  public:
   explicit Image(const std::string& bytes) {
@@ -73,10 +73,10 @@ void checkPicture(const MediumFiles& files, const std::string& folder, const Pic
       std::to_string(picture.width) + " × " + std::to_string(picture.height) + " pixels";
   const auto bytes = posix::readFile(files.fullPath(path), kMostBytes);
   const Decoded decoded =
-      bytes ? Image(*bytes).decode() : Decoded{.problem = "no file that can be read"};
+      bytes ? Image(*bytes).decode() : Decoded{.problem = "the file cannot be read"};
   if (!decoded.problem.empty()) {
     finding.id = "picture-unreadable";
-    finding.found = "no whole PNG picture (" + decoded.problem + ")";
+    finding.found = "not an intact PNG picture (" + decoded.problem + ")";
     finding.expected = "a PNG picture of " + size;
     finding.remedy = "save the picture again as PNG";
   } else if (decoded.width != picture.width || decoded.height != picture.height) {
@@ -86,7 +86,7 @@ void checkPicture(const MediumFiles& files, const std::string& folder, const Pic
                     std::to_string(decoded.height) + " pixels";
     finding.expected = size;
     finding.effect = "a picture that is scaled, and looks blurred or distorted";
-    finding.remedy = "save it in that size";
+    finding.remedy = "save it at that size";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }

@@ -18,7 +18,7 @@ struct ModelRow {
   bool wireless = false;
 };
 
-/// What the systems of a range are given.
+/// The package that a range of systems gets.
 struct PackageRow {
   std::string systems{};  ///< in words
   std::string package{};  ///< relative to the medium; empty for none
@@ -27,16 +27,16 @@ struct PackageRow {
 /// A language of the message bundle.
 struct LanguageRow {
   std::string name{};
-  std::size_t texts = 0;  ///< of those that the wizard shows
+  std::size_t texts = 0;  ///< how many of the wizard's texts the language has
 };
 
-/// What is known of a medium once it is checked.
+/// The result of checking a medium.
 struct Report {
   std::string medium{};
-  std::string application{};           ///< its folder's name; empty when there is none
-  std::vector<Finding> findings{};     ///< in the order in which the wizard comes across them
+  std::string application{};           ///< the bundle's name; empty when there is none
+  std::vector<Finding> findings{};     ///< in the order in which the checks made them
   std::vector<ModelRow> models{};      ///< in the order of the wizard's list
-  FirstPage start = FirstPage::kNone;  ///< what the wizard begins with
+  FirstPage start = FirstPage::kNone;  ///< the page that the wizard begins with
   std::string systems{};               ///< the supported range, in words
   std::vector<PackageRow> packages{};
   std::vector<LanguageRow> languages{};

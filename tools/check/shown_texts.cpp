@@ -83,13 +83,13 @@ struct Range {
   char32_t last;
 };
 
-// Blocks whose characters fill a square.
+// Unicode blocks whose characters are as wide as they are high.
 constexpr std::array kSquare{
     Range{0x1100, 0x115F}, Range{0x2E80, 0xA4CF},   Range{0xAC00, 0xD7A3},
     Range{0xF900, 0xFAFF}, Range{0xFE30, 0xFE4F},   Range{0xFF00, 0xFF60},
     Range{0xFFE0, 0xFFE6}, Range{0x1F300, 0x1FAFF}, Range{0x20000, 0x3FFFD}};
 
-// Of the letters' size.
+// Returns the estimated width of a character, as a fraction of the letters' size.
 double relativeWidth(char32_t character) {
   constexpr std::string_view kNarrow = " !'(),.:;I[]fijlrt|";
   constexpr std::string_view kWide = "%@MWmw";
@@ -99,7 +99,7 @@ double relativeWidth(char32_t character) {
     if (kWide.find(c) != std::string_view::npos) return 0.85;
     return c >= 'A' && c <= 'Z' ? 0.66 : 0.55;
   }
-  if (character >= 0x300 && character <= 0x36F) return 0;  // accents on the letter before
+  if (character >= 0x300 && character <= 0x36F) return 0;  // an accent on the preceding letter
   const bool square = std::any_of(kSquare.begin(), kSquare.end(), [&](const Range& range) {
     return character >= range.first && character <= range.last;
   });

@@ -12,21 +12,22 @@ namespace onramp::check {
 struct ShownText {
   std::string_view key{};
   std::string_view where{};
-  double width = 0;  ///< of a line, in points; 0 where the text has room enough
+  double width = 0;  ///< of a line, in points; 0 where there is room enough for any text
   double size = 13;  ///< of the letters, in points
   int lines = 1;
-  std::size_t mostPlaceholders = 0;  ///< "%@" is filled in once or up to this often
-  bool hasFallback = false;          ///< an English text stands in for a missing one, not the key
+  std::size_t mostPlaceholders = 0;  ///< how often "%@" may occur, at least once; 0: never
+  bool hasFallback = false;          ///< a missing text is shown in English, not as its key
 };
 
-/// Every text, in the order of their keys.
+/// Returns all texts that the wizard shows, in the order of their keys.
 [[nodiscard]] std::span<const ShownText> shownTexts();
 
-/// About how wide `text` (UTF-8) is in letters of `size` points: an estimate by classes of
-/// characters, which no font has exactly. In points.
+/// Returns the approximate width in points of `text` (UTF-8) in letters of `size` points. The
+/// estimate uses an average width for each class of characters and no font.
 [[nodiscard]] double estimatedWidth(std::string_view text, double size);
 
-/// About how many lines of `width` points `text` takes; it breaks anywhere.
+/// Returns the approximate number of lines of `width` points that `text` takes. The estimate
+/// assumes that a line can break anywhere.
 [[nodiscard]] int estimatedLines(std::string_view text, double size, double width);
 
 }  // namespace onramp::check

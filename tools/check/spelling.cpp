@@ -8,7 +8,7 @@ namespace onramp::check {
 
 namespace {
 
-// Comparisons of two letters.
+// How many pairs of letters are compared at most.
 constexpr std::size_t kMostWork = 20'000'000;
 
 std::string lettersOf(std::string_view word) {

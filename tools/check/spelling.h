@@ -9,14 +9,16 @@
 
 namespace onramp::check {
 
-/// Finds the known word that a misspelt one was meant to be. Words that differ in capitals, blanks
-/// and punctuation only are found at once; others are compared one by one, and as that takes time
-/// with the square of their number, only up to a fixed amount of work.
+/// Finds the known word that a misspelt word was probably meant to be. A hash table finds a word
+/// that differs only in capitals, blanks and punctuation. Any other word is compared with every
+/// known word. The work for all these comparisons together is limited, because it grows with the
+/// product of the two lists' lengths.
 class Spelling {
  public:
   explicit Spelling(const std::vector<std::string>& known);
 
-  /// The nearest known word, if one is near enough; of equally near ones the first.
+  /// Returns the most similar known word, or nothing if none is similar enough. If several are
+  /// equally similar, returns the first of them.
   [[nodiscard]] std::optional<std::string> nearest(std::string_view word);
 
  private:
@@ -25,8 +27,8 @@ class Spelling {
   std::size_t work_ = 0;
 };
 
-/// How many letters have to be inserted, removed, replaced or swapped with their neighbour to turn
-/// `a` into `b`, capitals ignored; `most` + 1 when more than `most`.
+/// Returns how many insertions, removals, replacements and swaps of neighbouring letters turn `a`
+/// into `b`. Ignores case. Returns `most` + 1 when there are more than `most`.
 [[nodiscard]] std::size_t editDistance(std::string_view a, std::string_view b, std::size_t most);
 
 }  // namespace onramp::check

@@ -11,7 +11,8 @@ namespace onramp::check {
 
 namespace {
 
-// A name on one line, with what a terminal would obey made visible.
+// Returns `text` with control characters replaced, so that it stays on one line and cannot control
+// the terminal.
 std::string printable(std::string_view text) {
   std::string result;
   while (!text.empty()) {

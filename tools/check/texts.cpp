@@ -40,8 +40,8 @@ std::string joined(const std::vector<std::string>& words) {
   return text;
 }
 
-// Whether one of the `offered` languages serves users of `wanted`, and not only for want of a
-// better one.
+// Returns whether one of the `offered` languages is the language `wanted`. A language that is only
+// a substitute for it does not count.
 bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
   const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
   if (found.empty()) return false;
@@ -81,7 +81,7 @@ class TextCheck {
                                   .severity = Severity::kWarning,
                                   .place = {.file = kBundle + "/Contents/Resources/" + language +
                                                     std::string(kLanguageFolder)},
-                                  .found = "a folder that names no language",
+                                  .found = "a folder whose name is not a language",
                                   .expected = "a code such as \"de\" or \"zh_TW\"",
                                   .effect = "nobody sees its texts",
                                   .remedy = "rename the folder"});
@@ -174,17 +174,16 @@ class TextCheck {
       finding.id = "text-placeholders";
       finding.found = "\"%@\" " + std::to_string(count) + " times";
       finding.expected = filled ? "once or twice" : "none";
-      finding.effect = filled && count == 0
-                           ? "an alert that does not say which version is needed"
-                           : "\"%@\" as it stands (" + std::string(shown.where) + ")";
+      finding.effect = filled && count == 0 ? "an alert that does not say which version is needed"
+                                            : "a literal \"%@\" (" + std::string(shown.where) + ")";
       finding.remedy = filled ? "leave it where the version belongs" : "remove it";
     } else if (shown.where == "sheet when no device is found" &&
                text.find('%') != std::string::npos) {
       finding.id = "text-percent";
       finding.found = "a \"%\", which macOS takes for the beginning of a placeholder";
       finding.expected = "a text without \"%\"";
-      finding.effect = "a damaged text, or the end of the program, on macOS";
-      finding.remedy = "write it in words";
+      finding.effect = "a damaged text, or a crash, on macOS";
+      finding.remedy = "write it as a word";
     } else {
       tooWide(shown, text, finding);
     }
@@ -209,33 +208,35 @@ class TextCheck {
   void checkDevelopmentRegion() {
     constexpr const char* kKey = "CFBundleDevelopmentRegion";
     const std::string path = kBundle + "/Contents/Info.plist";
-    const auto information =
-        files_.list(path, {{.file = path},
-                           "the message bundle's list",
-                           "which language users of all others see is left to the system"});
+    const auto information = files_.list(
+        path, {{.file = path},
+               "the message bundle's Info.plist",
+               "the language that users of all other languages see is left to the system"});
     if (!information) return;
     const auto region = information->string(kKey);
-    Finding finding{.id = "region-missing",
-                    .place = {.file = path},
-                    .found = "no \"CFBundleDevelopmentRegion\"",
-                    .expected = "the language for users of all others, such as \"en\"",
-                    .effect = "which language users of all others see is left to the system",
-                    .remedy = "add it"};
+    Finding finding{
+        .id = "region-missing",
+        .place = {.file = path},
+        .found = "no \"CFBundleDevelopmentRegion\"",
+        .expected = "the language for users of all other languages, such as \"en\"",
+        .effect = "the language that users of all other languages see is left to the system",
+        .remedy = "add it"};
     if (region) {
       if (serves(languages_, *region)) return;
       finding.id = "region-without-texts";
       finding.place.key = {kKey};
       finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
       finding.expected = "one of " + joined(languages_);
-      finding.remedy = "name one of these, or add its texts";
+      finding.remedy = "name one of these, or add the texts of that language";
     } else if (information->find(kKey)) {
       finding.place.key = {kKey};
-      finding.found = "another value than a string";
+      finding.found = "a value that is not a string";
     }
     report_.findings.push_back(std::move(finding));
   }
 
-  // What the medium cannot bring: the application's own texts.
+  // Reports languages of the medium in which the application's own texts are missing. A medium
+  // cannot supply those.
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";
@@ -248,11 +249,11 @@ class TextCheck {
            .severity = Severity::kWarning,
            .place = {.file = resources},
            .found = "no " + quoted(language + std::string(kLanguageFolder)),
-           .expected = "the languages of the message bundle; there are " + joined(own),
-           .effect =
-               "users of " + quoted(language) +
-               " read in English why the network is used, and hear the gear's name in English",
-           .remedy = "have the application built with these texts"});
+           .expected = "the languages of the message bundle; the application has " + joined(own),
+           .effect = "users of " + quoted(language) +
+                     " read in English why the network is used, and hear the gear button's name in "
+                     "English",
+           .remedy = "have the application built with texts in that language"});
     }
   }
 

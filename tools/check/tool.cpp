@@ -24,7 +24,7 @@ bool isExecutable(const std::string& path) {
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
 }
 
-// Reports a bundle's program that is not there or cannot be started.
+// Reports a bundle whose program is missing or cannot be started.
 void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::string& relative,
                   const char* effect) {
   const std::string list = relative + "/Contents/Info.plist";
@@ -40,20 +40,21 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
   } else if (!fs::is_regular_file(*program, ignored)) {
     const std::string name = bundle.infoString("CFBundleExecutable").value_or("");
     finding.id = "program-missing";
-    finding.found = "a program " + quoted(name) + " that is not there";
+    finding.found = "the program " + quoted(name) + ", which does not exist";
     finding.expected = quoted(relative + "/Contents/MacOS/" + name);
     finding.remedy = "put the program there";
   } else if (!isExecutable(*program)) {
     finding.id = "program-not-executable";
-    finding.found = "a program that may not be executed: " +
+    finding.found = "a program without execute permission: " +
                     quoted(program->substr(files.fullPath("").size() + 1));
     finding.expected = "a file that everyone may execute";
-    finding.remedy = "chmod a+x, and master the medium on a file system that keeps it";
+    finding.remedy = "chmod a+x, and master the medium on a file system that keeps the permission";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// A translation that keeps the name of the maker whose medium was copied.
+// Reports translations of the tool's name that lack the maker's name. They were probably copied
+// with another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor) {
   const std::string maker = firstWord(vendor);
@@ -67,7 +68,8 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
     std::error_code ignored;
     if (!folder.ends_with(".lproj") || !fs::exists(files.fullPath(table), ignored)) continue;
     const auto texts = files.strings(
-        table, {{.file = table}, "the tool's names", "the tool's untranslated name on macOS"});
+        table,
+        {{.file = table}, "the tool's translated names", "the tool's untranslated name on macOS"});
     const auto translated = texts ? texts->string(kDisplayName) : std::nullopt;
     if (!translated || names(*translated)) continue;
     files.report().findings.push_back(
@@ -76,8 +78,8 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
          .place = {.file = table, .key = {kDisplayName}},
          .found = "the name " + quoted(*translated) + ", without " + quoted(maker),
          .expected = "a translation of " + quoted(name),
-         .effect = "on macOS, users of that language read that name",
-         .remedy = "translate the name that the tool has now"});
+         .effect = "on macOS, users of that language see that name",
+         .remedy = "translate the tool's present name"});
   }
 }
 
@@ -106,13 +108,14 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
     files.report().findings.push_back({.id = "tool-no-bundle",
                                        .place = place,
                                        .found = "a file at " + quoted(*relative),
-                                       .expected = "an application's folder",
+                                       .expected = "an application bundle, which is a folder",
                                        .effect = kEffect,
                                        .remedy = "name the folder that ends in \".app\""});
     return;
   }
   const std::string list = *relative + "/Contents/Info.plist";
-  const auto information = files.list(list, {{.file = list}, "the set-up tool's list", kEffect});
+  const auto information =
+      files.list(list, {{.file = list}, "the set-up tool's Info.plist", kEffect});
   if (!information) return;
   checkProgram(files, *bundle, *relative, kEffect);
   const auto name = information->string(kDisplayName);

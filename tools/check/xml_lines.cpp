@@ -28,8 +28,8 @@ class Walk {
  private:
   struct Element {
     std::string name;
-    bool named = false;      ///< a dictionary's value, whose key ends the path
-    bool keyBefore = false;  ///< a dictionary whose last child was a key
+    bool named = false;      ///< this is the value of the key at the end of `path_`
+    bool keyBefore = false;  ///< the last child so far was a key
   };
 
   static void begin(void* self, const XML_Char* name, const XML_Char**) {
@@ -61,7 +61,7 @@ class Walk {
     open_.push_back({std::string(name), named});
   }
 
-  // Whether the element is the value of a key.
+  // Handles the beginning of a dictionary's child. Returns whether the child is the value of a key.
   bool inDictionary(std::string_view name) {
     Element& dictionary = open_.back();
     const bool isValue = name != "key" && dictionary.keyBefore;
@@ -84,7 +84,7 @@ class Walk {
     const bool isKey = closed.name == "key" && !open_.empty() && open_.back().name == "dict";
     if (!isKey) return;
     path_.back() = text_;
-    // What lies in an array is not told apart by its keys.
+    // Paths have no array indexes, so dictionaries in an array would seem to repeat their keys.
     if (arrays_ == 0 && !lines_.keys.emplace(path_, keyLine_).second) {
       lines_.twice.emplace_back(path_, keyLine_);
     }
@@ -104,7 +104,7 @@ class Walk {
   std::vector<std::string> path_;
   std::string text_;
   std::size_t keyLine_ = 0;
-  std::size_t arrays_ = 0;  ///< open ones
+  std::size_t arrays_ = 0;  ///< how many arrays are open
 };
 
 }  // namespace

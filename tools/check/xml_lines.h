@@ -8,16 +8,17 @@
 
 namespace onramp::check {
 
-/// What a closer look at an XML property list tells. It reads it with another parser than the
-/// wizard, which knows no lines, and so never decides whether the wizard can read it.
+/// The line numbers of keys and of mistakes in an XML property list. They come from another parser
+/// than the wizard's, which keeps no line numbers. They never decide whether the wizard can read
+/// the list.
 struct XMLLines {
   std::map<std::vector<std::string>, std::size_t> keys;  ///< the line of every path of keys
-  std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;  ///< paths met again
-  std::string problem;          ///< empty when nothing is wrong
+  std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;  ///< repeated paths
+  std::string problem;          ///< the first mistake; empty when there is none
   std::size_t problemLine = 0;  ///< from 1
 };
 
-/// `xml` is UTF-8.
+/// Parses `xml`, which must be UTF-8.
 [[nodiscard]] XMLLines xmlLines(const std::string& xml);
 
 }  // namespace onramp::check

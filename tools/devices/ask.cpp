@@ -61,7 +61,7 @@ Answer askedAt(const std::string& address, Progress& progress) {
   });
   progress.show("waiting for " + address);
   runMainLoop();
-  // After an interruption the question ends at once, and this reports its answer.
+  // After an interruption the asking ends at once, and the answer so far is reported.
   questions.stop();
   if (questions.pending() != 0) runMainLoop();
   progress.clear();
@@ -74,7 +74,7 @@ int ask(const AskOptions& options) {
   const auto address = lookUpIPv4Address(options.address);
   if (!address) {
     std::cerr << "onramp-devices: " << inQuotes(options.address)
-              << " is no IPv4 address and no name of a host that has one\n";
+              << " is neither an IPv4 address nor the name of a host that has one\n";
     return kTrouble;
   }
   Progress progress;

@@ -25,8 +25,7 @@ constexpr std::size_t kDeepest = 16;
 constexpr std::size_t kMostArcs = 128;
 constexpr std::size_t kBytesPerLine = 16;
 
-// What the elements of a message (RFC 1157 section 4) mean, by their places: of the message, and of
-// the PDU in it.
+// The names of an SNMP message's elements and of its PDU's elements, in order (RFC 1157 section 4).
 constexpr std::array<std::string_view, 3> kMessageFields{"version", "community", ""};
 constexpr std::array<std::string_view, 4> kPduFields{"request", "error status", "error index",
                                                      "bindings"};
@@ -104,7 +103,7 @@ std::string contentText(std::uint8_t tag, Bytes content) {
   }
 }
 
-// Where an element is: its depth, and its place among its parent's elements.
+// An element's position: its depth, and its index among its parent's elements.
 struct Where {
   std::size_t depth = 0;
   std::size_t place = 0;

@@ -6,14 +6,16 @@
 
 namespace onramp::devices {
 
-/// The elements of an SNMP message, one a line, indented by their depth. Bytes that are no elements
-/// are shown as such; whatever the bytes are, the result describes all of them.
+/// Returns the elements of an SNMP message as text, one element a line, indented by its depth.
+/// Bytes that form no element are shown in hexadecimal, so the text describes all bytes of any
+/// input.
 [[nodiscard]] std::string berTree(std::span<const std::uint8_t> bytes);
 
-/// The bytes in hexadecimal, sixteen a line, after their offset and before their characters.
+/// Returns the bytes in hexadecimal, sixteen a line. Each line starts with the offset and ends with
+/// the characters.
 [[nodiscard]] std::string hexDump(std::span<const std::uint8_t> bytes);
 
-/// The bytes as hexadecimal digits without blanks.
+/// Returns the bytes as hexadecimal digits without blanks.
 [[nodiscard]] std::string hexText(std::span<const std::uint8_t> bytes);
 
 }  // namespace onramp::devices

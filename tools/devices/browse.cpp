@@ -28,7 +28,7 @@ namespace {
 constexpr double kWizardSearchSeconds = 10;
 constexpr std::chrono::milliseconds kProgressPause{250};
 
-// Types that printers and scanners announce besides those that carry names.
+// Types that printers and scanners announce, but under which the wizard reads no maker and model.
 constexpr std::array<std::string_view, 5> kNamelessTypes{
     "_ipps._tcp.", "_uscan._tcp.", "_uscans._tcp.", "_printer-admin._tcp.", "_http._tcp."};
 
@@ -92,7 +92,7 @@ void Session::changed(Device& device) {
   }
 }
 
-// A device is asked again when it announces something new, as the wizard does.
+// Asks a device again when its announcement has changed, as the wizard does.
 void Session::ask(Device& device) {
   Dictionary& asked = asked_[&device];
   if (asked == device.record) return;
@@ -163,7 +163,7 @@ int Session::run() {
     progress_.print(jsonOf(all));
     return 0;
   }
-  // Verdicts that only the end of the search settles.
+  // Shows the devices whose verdict was open until the end of the search.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));

@@ -7,11 +7,12 @@
 
 namespace onramp::devices {
 
-/// What one device that keeps the wizard waiting does to those that are asked after it.
+/// The effect of a device that answers slowly or not at all on the devices that the wizard asks
+/// after it.
 struct Delay {
-  double seconds = 0;       ///< that the wizard's window stands still
-  std::size_t delayed = 0;  ///< devices of the list that come later because of it
-  std::size_t hidden = 0;   ///< those of them that come too late for the wizard's search
+  double seconds = 0;       ///< how long the wizard's window stands still
+  std::size_t delayed = 0;  ///< how many listed devices appear later
+  std::size_t hidden = 0;   ///< how many of those the wizard's search misses
 };
 
 struct JudgedDevice {
@@ -26,14 +27,14 @@ struct BrowseResult {
   double seconds = 0;
   bool isInterrupted = false;
   std::vector<JudgedDevice> devices{};  ///< in the order in which they were found
-  std::vector<Verdict> network{};       ///< what is wrong with the whole
+  std::vector<Verdict> network{};       ///< what is wrong with the network as a whole
 };
 
-/// Fills in the delays: the wizard asks in the order in which devices are resolved, one after the
-/// other, and ends its search after `searchSeconds`.
+/// Fills in the delays. They assume that the wizard asks one device after another, in the order in
+/// which the devices were resolved, and ends its search after `searchSeconds`.
 void computeDelays(std::vector<JudgedDevice>& devices, double searchSeconds);
 
-/// The result as JSON, in the form that the manual page describes.
+/// Returns the result as JSON, in the form that the manual page describes.
 [[nodiscard]] std::string jsonOf(const BrowseResult& result);
 
 }  // namespace onramp::devices

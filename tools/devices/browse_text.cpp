@@ -32,14 +32,14 @@ struct Columns {
   std::size_t model;
 };
 
-// Name and model share what mark and address leave.
+// The columns for name and model share the width that is left beside mark and address.
 Columns columnsFor(const TextStyle& style) {
   const std::size_t width = style.width == 0 ? 100 : std::max(style.width, kNarrowest);
   const std::size_t rest = width - kMarkColumns - kAddressColumns - 3;
   return {rest - rest / 2, rest / 2};
 }
 
-// Nothing is cut where the output goes into a file or to a program.
+// Does not cut the text when the output is not a terminal.
 std::string cell(std::string_view text, std::size_t columns, const TextStyle& style) {
   if (style.width == 0 && columnsOf(text) > columns) return std::string(text);
   return fitted(text, columns);
@@ -59,7 +59,7 @@ std::string paragraph(const std::string& text, const TextStyle& style) {
   return wrapped(text, style.width == 0 ? kUnlimited : style.width, 2);
 }
 
-// A service type ends in a dot already.
+// Adds a full stop, unless the text ends in a service type with its closing dot.
 std::string sentence(const std::string& text) {
   return text.ends_with('.') ? text : text + '.';
 }
@@ -72,7 +72,7 @@ std::string explanation(const Verdict& verdict) {
 std::string delayText(const Delay& delay) {
   if (delay.delayed == 0) return "";
   return "The wizard's window stands still for " + durationText(delay.seconds) +
-         " meanwhile, which delays " + std::to_string(delay.delayed) + " of the listed" +
+         " meanwhile, which delays " + std::to_string(delay.delayed) + " of the listed devices" +
          (delay.hidden == 0 ? "" : " and hides " + std::to_string(delay.hidden) + " of them") + '.';
 }
 

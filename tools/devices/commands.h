@@ -5,13 +5,13 @@
 
 namespace onramp::devices {
 
-/// The exit status of a command that was called wrongly or could not do its work.
+/// The exit status of a command that was called incorrectly or could not do its work.
 inline constexpr int kTrouble = 2;
 
 struct BrowseOptions {
   std::string medium;
   std::vector<std::string> models;
-  double seconds = 10;  // as long as the wizard's first search lasts
+  double seconds = 10;  // the length of the wizard's first search
   bool allTypes = false;
   bool json = false;
   bool verbose = false;

@@ -10,29 +10,29 @@
 
 namespace onramp::devices {
 
-/// Everything known of one announced device: what all service types announce under one name in one
-/// domain. Times are in seconds since the search began.
+/// Everything known about one announced device. Announcements of different service types belong to
+/// one device if they have the same name and domain. Times are in seconds since the search began.
 struct Device {
   std::string name;
   std::string domain;
-  std::string type;                ///< what the fields below come from
-  std::vector<std::string> types;  ///< all types that it is announced under
+  std::string type;                ///< the type whose announcement the other fields come from
+  std::vector<std::string> types;  ///< all types under which the device is announced
   double found = 0;
   std::optional<double> resolved;
   std::optional<double> gone;
   Dictionary record;                ///< a KSDevice record, once resolved
-  std::optional<Data> txt;          ///< the TXT record as on the wire
-  std::vector<std::string> ipv6;    ///< addresses that the wizard does not use
-  std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"
-  std::optional<Answer> answer;     ///< absent when it was not asked
+  std::optional<Data> txt;          ///< the TXT record as it was received
+  std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
+  std::set<std::string> sightings;  ///< interfaces and protocols, such as "eth0 IPv4"
+  std::optional<Answer> answer;     ///< nothing when the device was not asked
 };
 
 /// What the wizard reads from the medium for its search.
 struct Medium {
   std::string path;                 ///< as the user gave it
-  std::string type;                 ///< the one service type that it browses
+  std::string type;                 ///< the one service type that the wizard looks for
   std::vector<std::string> models;  ///< all models of the medium
-  std::vector<std::string> wanted;  ///< those that it searches for
+  std::vector<std::string> wanted;  ///< the models that the wizard searches for
 };
 
 }  // namespace onramp::devices

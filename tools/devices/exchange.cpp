@@ -24,7 +24,7 @@ double secondsSince(Clock::time_point start) {
   return std::chrono::duration<double>(Clock::now() - start).count();
 }
 
-// A copy of the wizard's table, so that a reply changes the copy only.
+// A copy of the wizard's table of objects. Decoding a reply changes only the copy.
 class OwnTable {
  public:
   OwnTable() {
@@ -42,7 +42,7 @@ class OwnTable {
 
   [[nodiscard]] mib_table& get() { return table_; }
 
-  /// The names as they are now.
+  /// Returns the objects' present names.
   [[nodiscard]] std::vector<std::vector<std::uint16_t>> names() const {
     std::vector<std::vector<std::uint16_t>> names;
     for (const mib_entry& entry : entries_)
@@ -61,8 +61,8 @@ std::uint64_t nextRequestId() {
   return next++ & 0x7FFFFFFFU;
 }
 
-// A request that has been sent, on its own socket, which outlives the wait so that a late reply is
-// seen.
+// A request that has been sent. Its socket stays open after the wait, so that a late reply is
+// noticed.
 struct Sent {
   DatagramSocket socket;
   Clock::time_point at;
@@ -105,8 +105,8 @@ bool Questioning::send(snmp_table_request& request, Exchange& exchange) {
   return true;
 }
 
-// Waits as long as the wizard does. Returns the reply's size, 0 when the device's host refused the
-// request, and nothing when no reply came meanwhile.
+// Waits for the reply as long as the wizard does. Returns the reply's size, 0 when the device's
+// host refused the request, and nothing when no reply came in time.
 std::optional<std::size_t> Questioning::await(Sent& sent, snmp_packet& reply) {
   const auto deadline = sent.at + kReceiveWait;
   while (!stopped_ && Clock::now() < deadline) {
@@ -122,7 +122,7 @@ std::optional<std::size_t> Questioning::await(Sent& sent, snmp_packet& reply) {
 
 void Questioning::collectLateReplies() {
   for (Sent& sent : sent_) {
-    if (sent.exchange >= exchanges_.size()) continue;  // still awaited
+    if (sent.exchange >= exchanges_.size()) continue;  // await() still waits for it
     Exchange& exchange = exchanges_[sent.exchange];
     if (exchange.outcome != Outcome::kNone || !sent.socket.waitReadable({})) continue;
     snmp_packet reply{};
@@ -134,7 +134,7 @@ void Questioning::collectLateReplies() {
   }
 }
 
-// What the wizard makes of the reply.
+// Interprets the reply as the wizard does, and sets the exchange's outcome.
 std::optional<Dictionary> Questioning::read(snmp_table_request& request, std::uint64_t id,
                                             Exchange& exchange) {
   const auto before = table_.names();
@@ -185,7 +185,7 @@ std::optional<Dictionary> Questioning::once(const char* address, bool& noReply) 
   return result;
 }
 
-// How much an outcome tells, the most first.
+// The outcomes in the order of how much they explain.
 constexpr std::array kTellingOrder{
     Outcome::kError, Outcome::kOtherType, Outcome::kUnreadable, Outcome::kOtherRequest,
     Outcome::kLate,  Outcome::kRefused,   Outcome::kNone,       Outcome::kUnsent};
@@ -193,7 +193,7 @@ constexpr std::array kTellingOrder{
 }  // namespace
 
 const Exchange* Answer::telling() const {
-  // The last address to give a value decides.
+  // The last address that gives a value decides.
   const auto last = std::find_if(exchanges.rbegin(), exchanges.rend(),
                                  [](const Exchange& e) { return e.outcome == Outcome::kValue; });
   if (last != exchanges.rend()) return &*last;

@@ -10,18 +10,18 @@
 
 namespace onramp::devices {
 
-/// One request for a device's active interface and what came back.
+/// One request for a device's active interface, and its reply.
 struct Exchange {
   enum class Outcome {
     kValue,         ///< an integer
     kError,         ///< an error status
     kOtherType,     ///< a value of another type
-    kUnreadable,    ///< bytes that are no proper reply
+    kUnreadable,    ///< bytes that are not a proper reply
     kOtherRequest,  ///< a reply to another request
-    kRefused,       ///< the device's host said that nothing uses the port
-    kLate,          ///< a reply, but after the wizard stopped waiting
+    kRefused,       ///< the host reported that no program uses the port
+    kLate,          ///< a reply that came after the wizard would have stopped waiting
     kNone,          ///< no reply
-    kUnsent,        ///< no address, no socket, or no way there
+    kUnsent,        ///< no valid address, no socket or no route
   };
 
   std::string address{};
@@ -32,26 +32,26 @@ struct Exchange {
   std::uint64_t errorStatus = 0;        ///< of kError (RFC 1157 section 4.1.1)
   std::optional<std::int64_t> value{};  ///< of kValue
   unsigned type = 0;                    ///< of kOtherType: the value's tag
-  bool changedQuestion = false;         ///< the reply's name replaced the one asked for
+  bool changedQuestion = false;         ///< the reply's name replaced the one in the table
 };
 
-/// What asking one device gave.
+/// The result of asking one device.
 struct Answer {
   bool isWireless = false;  ///< as the wizard decides
-  bool isComplete = false;  ///< false when asking was stopped
-  double seconds = 0;       ///< that the wizard's window would stand still
+  bool isComplete = false;  ///< false when the asking was stopped
+  double seconds = 0;       ///< how long the wizard's window would stand still
   std::vector<Exchange> exchanges;
 
-  /// The exchange that says most of why the answer is as it is; null when there is none.
+  /// Returns the exchange that best explains the answer; null when there is no exchange.
   [[nodiscard]] const Exchange* telling() const;
 };
 
-/// Asks the device at `addresses` (strings) as the wizard does, with all its repetitions, and keeps
-/// what is exchanged. Blocks for up to 12 seconds an address, or until `stopped` is set. The
-/// wizard's own table of objects is not changed. Callable from any thread.
+/// Asks the device at `addresses` (strings) exactly as the wizard does, repetitions included. The
+/// answer holds all exchanges. Blocks for up to 12 seconds per address, or until `stopped` is set.
+/// Does not change the wizard's own table of objects. Callable from any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 
-/// The name of an error status, such as "noSuchName".
+/// Returns the name of an error status, such as "noSuchName".
 [[nodiscard]] std::string errorStatusName(std::uint64_t status);
 
 }  // namespace onramp::devices

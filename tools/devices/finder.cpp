@@ -14,7 +14,7 @@ void Finder::start(const std::vector<std::string>& types) {
   start_ = std::chrono::steady_clock::now();
   for (const std::string& type : types)
     browsers_.push_back(KSBonjour::initWithType(type));
-  // Every browser tells its observers what all of them see, so one is observed.
+  // Every browser's observers learn what all browsers see, so observing one browser is enough.
   if (!browsers_.empty()) browsers_.front()->addKSBonjourObserver(shared_from_this());
   watchSightings([this](const ServiceSighting& sighting) { sighted(sighting); });
   for (const auto& browser : browsers_)

@@ -15,26 +15,27 @@
 
 namespace onramp::devices {
 
-/// Browses several service types at once and joins what they announce to devices. Main thread only.
+/// Browses several service types at once and combines their announcements into devices. Main thread
+/// only.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Told of every device of which something new is known.
+  /// Called with a device each time something about it changes.
   using Changed = std::function<void(Device& device)>;
 
-  /// `preferred` is the type whose announcement counts for a device that has several.
+  /// If a device has several types, its announcement under the type `preferred` is used.
   Finder(std::string preferred, Changed changed);
   Finder(const Finder&) = delete;
   Finder& operator=(const Finder&) = delete;
   ~Finder() override = default;
 
-  /// Starts to browse `types`. Until stop(), the finder and its browsers hold each other.
+  /// Starts browsing `types`. Until stop(), the finder and its browsers keep each other alive.
   void start(const std::vector<std::string>& types);
   void stop();
 
-  /// All devices seen so far, by their names.
+  /// Returns all devices seen so far, in the order of their names.
   [[nodiscard]] std::vector<Device*> devices();
 
-  /// Seconds since start().
+  /// Returns the seconds since start().
   [[nodiscard]] double now() const;
 
   void addBonjourService(const NetServiceRef& service) override;
@@ -50,7 +51,7 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   std::chrono::steady_clock::time_point start_;
   std::vector<std::shared_ptr<KSBonjour>> browsers_;
   std::map<std::pair<std::string, std::string>, Device> devices_;
-  // Sightings come before the services that they are folded to.
+  // Kept apart, because a service is seen before the device that it belongs to is known.
   std::map<std::pair<std::string, std::string>, std::set<std::string>> sightings_;
 };
 

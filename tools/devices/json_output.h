@@ -9,16 +9,17 @@
 
 namespace onramp::devices {
 
-/// An answer and all its exchanges, in the form that the manual page describes.
+/// Returns an answer and all its exchanges in the form that the manual page describes.
 [[nodiscard]] nlohmann::ordered_json jsonOfAnswer(const Answer& answer);
 
-/// The name of an outcome in JSON.
+/// Returns an outcome's name in JSON.
 [[nodiscard]] std::string outcomeName(Exchange::Outcome outcome);
 
-/// The strings of a TXT record, such as "note=Attic", in their order, up to one that is cut off.
+/// Returns the strings of a TXT record, such as "note=Attic", in order. Stops at a string that is
+/// cut off.
 [[nodiscard]] std::vector<std::string> txtStrings(const std::optional<Data>& txt);
 
-/// JSON as it is printed. Bytes that are no UTF-8 become U+FFFD.
+/// Returns the text of `json`. Bytes that are not UTF-8 become U+FFFD.
 [[nodiscard]] std::string printed(const nlohmann::ordered_json& json);
 
 }  // namespace onramp::devices

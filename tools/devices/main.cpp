@@ -1,4 +1,4 @@
-// onramp-devices: explains what the wizard finds on the network, and why it does not list the rest.
+// onramp-devices: explains which devices the wizard lists, and why it leaves out the others.
 
 #include <CLI/CLI.hpp>
 #include <clocale>
@@ -14,15 +14,15 @@ using namespace onramp::devices;
 
 constexpr const char* kExamples = R"(Examples:
   onramp-devices browse --medium build/medium
-      every device that is announced, and why the wizard lists it or not
+      shows every announced device, and why the wizard lists it or not
   onramp-devices browse --medium /media/setup --model "Kestrel Model 100" -v
-      the same for a user who chose that model, with all that is known
+      does so for a user who chose that model, and shows all that is known
   onramp-devices ask 192.0.2.17
-      what the device says of its interface, byte for byte
+      shows what the device answers about its interface, byte for byte
   onramp-devices uri "dnssd://Office%20Printer._ipp._tcp.local."
-      the addresses behind a printer's URI
+      shows the addresses behind a printer's URI
   onramp-devices hosts
-      this computer's addresses, and who answers a broadcast
+      shows this computer's addresses, and which devices answer a broadcast
 
 "onramp-devices COMMAND --help" shows a command's options.)";
 
@@ -34,7 +34,7 @@ void addBrowse(CLI::App& app, BrowseOptions& options) {
       ->type_name("DIR");
   command
       ->add_option("--model", options.models,
-                   "Search for this model only, as after choosing it; may be given again")
+                   "Search for this model only, as for a user who chose it; may be repeated")
       ->type_name("NAME")
       ->allow_extra_args(false);
   command->add_option("-s,--seconds", options.seconds, "How long to listen")
@@ -42,10 +42,10 @@ void addBrowse(CLI::App& app, BrowseOptions& options) {
       ->type_name("N")
       ->check(CLI::Range(0.1, 86400.0));
   command->add_flag("-a,--all-types", options.allTypes,
-                    "Look for service types, too, that carry no names");
-  command->add_flag("--json", options.json, "Print JSON, at the end");
+                    "Also look for service types that do not name maker and model");
+  command->add_flag("--json", options.json, "Print JSON when the search has ended");
   command->add_flag("-v,--verbose", options.verbose,
-                    "Show records, TXT data and what was exchanged by SNMP");
+                    "Show records, TXT data and the SNMP exchanges");
 }
 
 void addAsk(CLI::App& app, AskOptions& options) {
@@ -62,7 +62,7 @@ void addURI(CLI::App& app, URIOptions& options) {
   CLI::App* const command = app.add_subcommand("uri", "Show the addresses behind a device URI");
   command->add_option("URI", options.uri, "Such as \"dnssd://Office%20Printer._ipp._tcp.local.\"")
       ->required();
-  command->add_option("-s,--seconds", options.seconds, "How long to wait for them")
+  command->add_option("-s,--seconds", options.seconds, "How long to wait for the addresses")
       ->capture_default_str()
       ->type_name("N")
       ->check(CLI::Range(0.1, 86400.0));
@@ -77,7 +77,7 @@ void addHosts(CLI::App& app, HostsOptions& options) {
 }
 
 int run(int count, char* arguments[]) {
-  CLI::App app("Explains what the wizard finds on the network, and why it does not list the rest.");
+  CLI::App app("Explains which devices the wizard lists, and why it leaves out the others.");
   app.name("onramp-devices");
   app.footer(kExamples);
   app.set_version_flag("-V,--version", "onramp-devices " ONRAMP_VERSION);
@@ -104,7 +104,7 @@ int run(int count, char* arguments[]) {
 }  // namespace
 
 int main(int count, char* arguments[]) {
-  // For the width of characters only; texts and numbers stay as they are in "C".
+  // Only for the width of characters; messages and numbers keep the form of the "C" locale.
   std::setlocale(LC_CTYPE, "");
   onramp::surviveFailedWrites();
   try {

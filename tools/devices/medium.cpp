@@ -27,7 +27,7 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
   std::error_code error;
   const std::string folder = fs::canonical(path, error).string();
   if (error || !fs::is_directory(folder, error)) {
-    return fail(path, "is no folder; give the folder that holds the application");
+    return fail(path, "is not a folder; give the folder that holds the application");
   }
   const std::string application = check::findApplication(folder);
   if (application.empty()) {

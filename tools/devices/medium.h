@@ -8,9 +8,10 @@
 
 namespace onramp::devices {
 
-/// Makes the application on the medium in the folder `path` the running one and reads what its
-/// search needs, with the wizard's own code. `wanted` names models to search for; empty for all of
-/// them. Returns nothing, after a message on standard error, when the search could find nothing.
+/// Sets the main bundle to the application on the medium in the folder `path`, then reads what the
+/// wizard's search needs, with the wizard's own code. `wanted` names the models to search for; when
+/// it is empty, the search is for all models. Returns nothing, after a message on standard error,
+/// when a search with this medium cannot find any device.
 [[nodiscard]] std::optional<Medium> readMedium(const std::string& path,
                                                const std::vector<std::string>& wanted);
 

@@ -16,13 +16,14 @@ namespace onramp::devices {
 
 namespace {
 
-// Keys under which devices are known to announce a name that belongs elsewhere.
+// Keys under which some devices announce the maker or the model, although the wizard does not read
+// it there.
 constexpr std::array<std::string_view, 9> kMakerKeys{
     "usb_MFG", "mfg", "usb_MANUFACTURER", "manufacturer", "mfr", "vendor", "make", "ty", "product"};
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
                                                      "modelName", "ty",  "product"};
 
-// Returns the text with its blanks at the edges dropped and rows of blanks made one.
+// Removes blanks at both ends of the text, and replaces several blanks in a row by one.
 std::string withSingleBlanks(std::string_view text) {
   std::string out;
   for (const char c : text) {
@@ -41,7 +42,7 @@ std::string textUnder(const Device& device, std::string_view key) {
   return text ? text->value(key).value_or("") : "";
 }
 
-// The first of `keys` other than `wanted` that the device announces a text under.
+// Returns the first of `keys` other than `wanted` under which the device announces a text.
 std::optional<std::string_view> otherKey(const Device& device, std::string_view wanted,
                                          std::span<const std::string_view> keys) {
   for (const std::string_view key : keys) {
@@ -51,7 +52,8 @@ std::optional<std::string_view> otherKey(const Device& device, std::string_view 
   return std::nullopt;
 }
 
-// What the wizard reads under `wanted`, maker or model, is not there.
+// Returns the verdict on a device that announces nothing under `wanted`, the key for maker or
+// model.
 Verdict missingKey(const Device& device, std::string_view wanted,
                    std::span<const std::string_view> keys) {
   const std::string key(wanted);
@@ -65,7 +67,7 @@ Verdict missingKey(const Device& device, std::string_view wanted,
   return {.id = isModel ? "no-model" : "no-maker",
           .why = "announces no " + key,
           .remedy = "the firmware has to announce the " + std::string(isModel ? "model" : "maker") +
-                    " as " + key + "; an update of it may do so"};
+                    " as " + key + "; a firmware update may do so"};
 }
 
 Verdict differs(const char* id, const std::string& how, const std::string& announced,
@@ -129,8 +131,8 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
   }
   return Verdict{
       .id = "not-on-medium",
-      .why = inQuotes(announced) + " is no model of this medium" + nearestOf(announced, medium),
-      .remedy = "take the medium that is made for this model, or add the model"};
+      .why = inQuotes(announced) + " is not a model of this medium" + nearestOf(announced, medium),
+      .remedy = "use the medium that is made for this model, or add the model to this one"};
 }
 
 }  // namespace onramp::devices

@@ -56,17 +56,17 @@ std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds) {
   if (!canSendMulticast()) {
     if (!hasNetwork()) {
       return {{.id = "no-network",
-               .why = "no network: this computer has no IPv4 address but its own",
+               .why = "no network: this computer has only loopback addresses",
                .remedy = "connect it to the devices' network"}};
     }
     return {{.id = "multicast-blocked",
              .why = "multicast is blocked: the system does not send to 224.0.0.251, UDP port 5353",
-             .remedy = "let that through the firewall, or add the route for 224.0.0.0/4"}};
+             .remedy = "let it through the firewall, or add a route for 224.0.0.0/4"}};
   }
   return {{.id = "nothing-announced",
-           .why = "nothing is announced at all, in " + durationText(seconds),
-           .remedy = "see that a device is on and in this subnet, that the access point does not "
-                     "keep its clients apart, and that UDP port 5353 comes through firewalls"}};
+           .why = "nothing was announced within " + durationText(seconds),
+           .remedy = "check that a device is on and in this subnet, that the access point does not "
+                     "keep its clients apart, and that firewalls let UDP port 5353 through"}};
 }
 
 }  // namespace onramp::devices

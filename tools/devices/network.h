@@ -6,11 +6,11 @@
 
 namespace onramp::devices {
 
-/// Returns why no device at all was found: no discovery daemon, no network, multicast blocked, or
-/// nothing announced. Of a network on which devices were found, only a daemon that has gone.
+/// Returns why no device was found: no discovery daemon, no network, multicast blocked, or nothing
+/// announced in the `seconds` of the search. If devices were found, reports only a missing daemon.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
-/// Whether an IPv4 address is in a subnet of this computer, as the wizard's network layer sees it.
+/// Returns whether an IPv4 address is in a subnet of this computer. Uses the wizard's own code.
 [[nodiscard]] bool isInLocalSubnet(const std::string& address);
 
 }  // namespace onramp::devices

@@ -4,7 +4,7 @@
 
 namespace onramp::devices {
 
-/// A line on the terminal that says how far things are, below what has been printed.
+/// A progress line on the terminal, below the output.
 class Progress {
  public:
   Progress() = default;
@@ -12,16 +12,16 @@ class Progress {
   Progress& operator=(const Progress&) = delete;
   ~Progress() { clear(); }
 
-  /// Whether there is a terminal to show it on.
+  /// Returns whether standard error is a terminal, where the line is shown.
   [[nodiscard]] static bool isShown();
 
-  /// Replaces the line. Without a terminal, nothing.
+  /// Replaces the line's text. Does nothing without a terminal.
   void show(const std::string& text);
 
-  /// Takes the line away.
+  /// Removes the line.
   void clear();
 
-  /// Prints `text` on standard output in the line's place.
+  /// Removes the line and prints `text` on standard output.
   void print(const std::string& text);
 
  private:

@@ -20,7 +20,7 @@ void Questions::ask(const Array& addresses, Answered answered) {
       answered(answer);
     });
   };
-  // A system that has no thread left is asked from here, which takes longer.
+  // If the system gives no further thread, asks the device on this one. That blocks the caller.
   if (!queue_.addOperation(operation)) operation();
 }
 

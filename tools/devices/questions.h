@@ -10,8 +10,8 @@
 
 namespace onramp::devices {
 
-/// Asks many devices at once, one thread for each. Each is asked exactly as the wizard asks it,
-/// which asks one device after the other.
+/// Asks many devices at once, each on its own thread. The questions to each device are those of the
+/// wizard, but the wizard asks one device after another.
 class Questions {
  public:
   using Answered = std::function<void(Answer answer)>;
@@ -19,16 +19,16 @@ class Questions {
   Questions() = default;
   Questions(const Questions&) = delete;
   Questions& operator=(const Questions&) = delete;
-  /// Waits for the threads, which stop() makes end soon.
+  /// Calls stop() and waits for the threads, which then end soon.
   ~Questions();
 
-  /// Asks the device at `addresses` (strings); `answered` gets the answer on the main thread.
+  /// Asks the device at `addresses` (strings). Calls `answered` with the answer on the main thread.
   void ask(const Array& addresses, Answered answered);
 
-  /// Ends all asking; answers that are under way come incomplete.
+  /// Stops asking. Devices that are being asked give incomplete answers.
   void stop() { *stopped_ = true; }
 
-  /// How many devices are being asked.
+  /// Returns how many devices are being asked.
   [[nodiscard]] std::size_t pending() const { return *pending_; }
 
  private:

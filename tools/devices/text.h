@@ -6,21 +6,21 @@
 
 namespace onramp::devices {
 
-/// A name in quotation marks as it can be shown anywhere: blanks at its edges and all but the first
-/// of a row are "␣", and bytes that are no printable text are "\xNN".
+/// Returns `name` in quotation marks, safe to show on any terminal. A blank at either end or after
+/// another blank becomes "␣". Bytes that are not printable text become "\xNN".
 [[nodiscard]] std::string inQuotes(std::string_view name);
 
-/// The columns that a text in UTF-8 takes on a terminal.
+/// Returns how many columns a UTF-8 text takes on a terminal.
 [[nodiscard]] std::size_t columnsOf(std::string_view text);
 
-/// `text` in exactly `columns` columns: filled up with blanks, or cut with "…" at its end.
+/// Returns `text` in exactly `columns` columns: padded with blanks, or cut and ended with "…".
 [[nodiscard]] std::string fitted(std::string_view text, std::size_t columns);
 
-/// `text` broken at blanks into lines of at most `width` columns, each after `indent` blanks and
-/// with a line feed at its end. A longer word has a line for itself.
+/// Returns `text` broken at blanks into lines of at most `width` columns. Each line starts with
+/// `indent` blanks and ends with a line feed. A longer word gets its own line.
 [[nodiscard]] std::string wrapped(std::string_view text, std::size_t width, std::size_t indent);
 
-/// A duration in seconds, such as "0.4 ms" or "12.1 s".
+/// Returns a duration, given in seconds, as text such as "0.4 ms" or "12.1 s".
 [[nodiscard]] std::string durationText(double seconds);
 
 }  // namespace onramp::devices

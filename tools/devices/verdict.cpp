@@ -37,10 +37,10 @@ Verdict judgeSilence(const Device& device, const Answer& answer,
                            ", which costs the wizard " + durationText(answer.seconds);
   if (std::none_of(addresses.begin(), addresses.end(), isLocal)) {
     return {.id = "other-subnet",
-            .why = "address in no local subnet: " + cost,
+            .why = "its address is in no local subnet: " + cost,
             .remedy =
-                "bring the device and this computer into one subnet; "
-                "\"onramp-devices hosts\" shows this computer's"};
+                "put the device and this computer into the same subnet; "
+                "\"onramp-devices hosts\" shows this computer's addresses"};
   }
   return {.id = "no-answer",
           .why = cost,
@@ -71,9 +71,9 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
     case Outcome::kOtherRequest:
       return {.id = "unreadable-reply",
               .why = told->outcome == Outcome::kUnreadable
-                         ? "answers with bytes that are no proper reply"
+                         ? "answers with bytes that are not a proper reply"
                          : "answers another request than the one asked",
-              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware has to be mended"};
+              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware has to be corrected"};
     case Outcome::kLate:
       return {.id = "late",
               .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
@@ -101,10 +101,11 @@ bool isAsked(const Device& device, const Medium& medium) {
 Verdict judge(const Device& device, const Medium& medium,
               const std::function<bool(const std::string&)>& isLocal) {
   if (!device.resolved) {
-    return {.id = "unresolved",
-            .why = "announced as " + joined(device.types) +
-                   ", never resolved: nobody tells its host's address",
-            .remedy = "switch the device off and on; see that no other device uses its host name"};
+    return {
+        .id = "unresolved",
+        .why = "announced as " + joined(device.types) +
+               ", but never resolved: no host announces its address",
+        .remedy = "switch the device off and on; check that no other device uses its host name"};
   }
   if (auto verdict = judgeName(device, medium)) return *verdict;
   if (device.type != medium.type) {
@@ -126,7 +127,7 @@ Verdict judge(const Device& device, const Medium& medium,
             .remedy = "switch on IPv4 in the device; the wizard asks IPv4 addresses only"};
   }
   if (!device.answer || !device.answer->isComplete) {
-    return {.id = "not-asked-yet", .why = "the search ended before the device had been asked"};
+    return {.id = "not-asked-yet", .why = "the search ended before the device had answered"};
   }
   if (device.answer->isWireless) {
     return {.id = "listed", .isListed = true, .why = "answers that it is on wireless"};

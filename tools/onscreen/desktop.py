@@ -1,4 +1,4 @@
-"""A virtual desktop: a display, a window manager, a session bus and a home of its own."""
+"""A virtual desktop: a display, a window manager, a session bus and a separate home folder."""
 
 import os
 import pathlib
@@ -13,10 +13,10 @@ _SIZE = "2732x1536"  # the smallest screen that the wizard has to fit on, at twi
 
 
 def _free_display():
-    """A display's number that nobody uses.
+    """Returns a display number that no X server uses.
 
-    In a network namespace of its own a server does not see that another one has the same number,
-    and takes away its socket.
+    In another network namespace, an X server does not notice that its number is in use and removes
+    the other server's socket.
     """
     while True:
         number = random.randrange(100, 50000)
@@ -25,10 +25,10 @@ def _free_display():
 
 
 class Desktop:
-    """Use it in a `with` statement; everything that it started ends with it.
+    """A context manager that starts the desktop and, at its end, ends everything that it started.
 
-    What programs open with xdg-open is written down instead, one a line. A process can look at one
-    desktop only in its life: the accessibility library keeps the first one's bus.
+    Files and addresses that programs open with xdg-open are recorded instead of opened. A process
+    can use only one desktop, because the accessibility library keeps the first desktop's bus.
     """
 
     def __init__(self, window_manager=True):
@@ -55,33 +55,33 @@ class Desktop:
 
     @property
     def user_folder(self):
-        """Where the user's own application-support files go."""
+        """The folder of the user's own application-support files."""
         return self._folder / "user"
 
     @property
     def local_folder(self):
-        """Where application-support files for all users go."""
+        """The folder of the application-support files for all users."""
         return self._folder / "local"
 
     def opened(self):
-        """What was opened so far, as a list of paths and addresses."""
+        """Returns the paths and addresses that were opened so far."""
         record = self._folder / "opened"
         return record.read_text().splitlines() if record.exists() else []
 
     def forget(self):
-        """Removes what programs have left: application-support files and what was opened."""
+        """Removes the application-support files and the record of what was opened."""
         for folder in (self.user_folder, self.local_folder):
             shutil.rmtree(folder, ignore_errors=True)
         (self._folder / "opened").unlink(missing_ok=True)
 
     def run(self, arguments, **options):
-        """Runs a program to its end and gives its output."""
+        """Runs a program to its end and returns its output."""
         done = subprocess.run(arguments, env=self.env, check=True, stdout=subprocess.PIPE,
                               text=True, **options)
         return done.stdout
 
     def picture(self, path):
-        """Saves what is on the screen, without the empty desktop around it."""
+        """Saves a picture of the screen, without the empty desktop around the windows."""
         path.parent.mkdir(parents=True, exist_ok=True)
         self.run(["import", "-silent", "-window", "root", str(path)])
         self.run(["mogrify", "-bordercolor", "black", "-border", "1", "-trim", "+repage",

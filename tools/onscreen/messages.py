@@ -1,4 +1,4 @@
-"""The texts that a medium has for the user."""
+"""Reads the texts that a medium has for the user."""
 
 import pathlib
 import re
@@ -8,21 +8,21 @@ _RESOURCES = "MacResources/CDCommonMessage.bundle/Contents/Resources"
 
 
 class _Texts(dict):
-    """Texts by their keys. One that the medium lacks is its key, as the wizard shows it."""
+    """Texts by their keys. A missing text is replaced by its key, as in the wizard."""
 
     def __missing__(self, key):
         return key
 
 
 def language(medium, wanted):
-    """The language wanted if the medium has it, else the first one that it has."""
+    """Returns `wanted` if the medium has that language, else the first language that it has."""
     folders = (pathlib.Path(medium) / _RESOURCES).glob("*.lproj")
     languages = sorted(folder.stem for folder in folders)
     return languages[0] if languages and wanted not in languages else wanted
 
 
 def read(medium, language):
-    """The texts of one language, from a table in UTF-8 or UTF-16."""
+    """Returns the texts of one language. The table may be UTF-8 or UTF-16."""
     table = pathlib.Path(medium) / _RESOURCES / f"{language}.lproj/Localizable.strings"
     data = table.read_bytes() if table.exists() else b""
     wide = data[:2] in (b"\xff\xfe", b"\xfe\xff")

@@ -1,4 +1,4 @@
-"""A person at the screen: sees the controls by their roles and names, has a mouse and a keyboard."""
+"""A person at the screen, who finds controls by role and name and uses mouse and keyboard."""
 
 import os
 import pathlib
@@ -7,15 +7,18 @@ import time
 from .processes import start, stop, wait_for
 
 _LOOK_SECONDS = 20
-# Qt keeps an object for each look at each cell of a table and never frees it, so cells are looked at
-# only when one is wanted.
+# Each look at a table's cell makes Qt create an object that it never frees. So tables are searched
+# only when a cell is wanted.
 _TABLES = ("list", "table", "tree", "tree table")
 _IN_TABLES = ("list item", "table cell", "table column header")
 _COLUMNS = 3
 
 
 def _is(control, role, name):
-    """A heading is a label, too, and a row's first cell may be called "name, address"."""
+    """Returns whether the control matches.
+
+    A heading counts as a label, too. A row's first cell may be called "name, address".
+    """
     own_role = control.get_role_name()
     if own_role != role and (own_role, role) != ("heading", "label"):
         return False
@@ -25,18 +28,21 @@ def _is(control, role, name):
 
 
 class Person:
-    """Starts a program on a desktop and uses it. Use it in a `with` statement."""
+    """A context manager that starts a program on a desktop and ends it again.
+
+    Its methods use the program.
+    """
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
-        # The library takes the bus from the environment of this process, once.
+        # The accessibility library reads the bus's address once, from this process's environment.
         os.environ.update({name: desktop.env[name]
                            for name in ("DBUS_SESSION_BUS_ADDRESS", "DISPLAY", "XDG_RUNTIME_DIR")})
         import gi
         gi.require_version("Atspi", "2.0")
         from gi.repository import Atspi, GLib
         self._atspi = Atspi
-        self.errors = GLib.Error, AttributeError  # what the use of a control raises that is gone
+        self.errors = GLib.Error, AttributeError  # raised by the use of a control that is gone
         self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 
@@ -46,15 +52,15 @@ class Person:
     def __exit__(self, *_):
         stop(self.process)
 
-    # Eyes.
+    # Looking at the screen.
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
-        """The control of that role and name, once it is on the screen."""
+        """Waits for a control of that role and name and returns it."""
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
                         f"a {role} named {name!r}")
 
     def sees(self, role, name=None):
-        """Whether such a control is on the screen now."""
+        """Returns whether such a control is on the screen now."""
         return self._look(role, name) is not None
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
@@ -62,37 +68,37 @@ class Person:
         wait_for(lambda: self._certainly_gone(role, name), seconds, f"the end of {role} {name!r}")
 
     def everything(self):
-        """(role, name, control) of all that is on the screen."""
+        """Returns a list of (role, name, control) for everything on the screen."""
         found = []
         self._visit(self._application(), lambda c: found.append(
             (c.get_role_name(), c.get_name(), c)))
         return found
 
     def rows(self):
-        """The texts of the table on the screen, row by row."""
+        """Returns the texts of the table on the screen, row by row."""
         cells = [name for role, name, _ in self.everything() if role == "table cell"]
         rows = zip(*(cells[column::_COLUMNS] for column in range(_COLUMNS)))
         return [(row[0].removesuffix(f", {row[-1]}"), *row[1:]) for row in rows]
 
     def has_state(self, control, state):
-        """Whether the control has a state, such as "enabled", "focused" or "selected"."""
+        """Returns whether the control has a state such as "enabled", "focused" or "selected"."""
         return control.get_state_set().contains(getattr(self._atspi.StateType, state.upper()))
 
     def picture(self, path):
-        """Saves the screen as it is when it has come to rest."""
+        """Saves a picture of the screen, after a moment for it to settle."""
         time.sleep(0.3)
         self.desktop.picture(path)
 
-    # Hands.
+    # Using the mouse and the keyboard.
 
     def click(self, role, name=None):
-        """Clicks the middle of a control once it can be clicked."""
+        """Clicks the middle of a control once the control is enabled."""
         control = self.see(role, name)
         wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} enabled")
         self.click_control(control)
 
     def click_control(self, control):
-        """Clicks the middle of a control, whatever it is and whether or not that does anything."""
+        """Clicks the middle of a control, even if it is disabled."""
         box = self._resting_place(control)
         self.desktop.run(["xdotool", "mousemove", str(box.x + box.width // 2),
                           str(box.y + box.height // 2), "click", "1"])
@@ -102,9 +108,9 @@ class Person:
         self.desktop.run(["xdotool", "click", "1"])
 
     def open_menu(self, button=None):
-        """Opens the menu of that button, or else of the button with the focus.
+        """Opens the menu of that button, or of the button with the focus.
 
-        Qt keeps the menu from the accessibility bus: use it with keys.
+        The accessibility bus does not show the menu, so it has to be used with the keyboard.
         """
         windows = self._window_count()
         if button:
@@ -115,7 +121,7 @@ class Person:
                  f"the menu of {button or 'the focused button'!r}")
 
     def choose_from_menu(self, button, item):
-        """Opens a button's menu and takes its `item`th entry."""
+        """Opens a button's menu and chooses its `item`th entry."""
         self.open_menu(button)
         self.press(*["Down"] * item, "Return")
 
@@ -124,17 +130,17 @@ class Person:
         self.desktop.run(["xdotool", "key", "--clearmodifiers", *keys])
 
     def close_window(self):
-        """Asks the window manager to close the window in use."""
+        """Asks the window manager to close the active window."""
         self.press("alt+F4")
 
     def wait_for_end(self, seconds=_LOOK_SECONDS):
-        """The program's exit status once it has ended."""
+        """Waits for the program to end and returns its exit status."""
         return self.process.wait(seconds)
 
     def is_running(self):
         return self.process.poll() is None
 
-    # How it looks.
+    # How the person looks at the screen.
 
     def _alive(self):
         if self.process.poll() is not None:
@@ -142,7 +148,10 @@ class Person:
         return True
 
     def _resting_place(self, control):
-        """Where a control is when it no longer moves: a new window is put in its place late."""
+        """Returns the place of a control once it no longer moves.
+
+        The window manager moves a new window some time after it appears.
+        """
         place = None
 
         def rests():
@@ -155,9 +164,9 @@ class Person:
         return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
 
     def round_trip(self):
-        """The seconds in which the program answers; those of waiting for a processor are taken off.
+        """Returns the seconds that the program takes to answer, without its waits for a processor.
 
-        None when it does not answer, having ended.
+        Returns None when the program has ended and does not answer.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -172,7 +181,7 @@ class Person:
             return time.monotonic() - began if self.is_running() else None
 
     def _ask(self):
-        """Asks the program something small and waits for the answer."""
+        """Sends the program a small request and waits for the answer."""
         frame = self._application().get_child_at_index(0)
         frame.get_component_iface().get_extents(self._atspi.CoordType.SCREEN)
 
@@ -192,7 +201,10 @@ class Person:
         return None
 
     def _certainly_gone(self, role, name):
-        """A program that is busy answers nothing, which must not pass for nothing there."""
+        """Returns whether such a control is surely gone.
+
+        A busy program does not answer, which does not mean that the control is gone.
+        """
         self._overlooked = False
         found = self.sees(role, name)
         return not found and (not self._overlooked or not self.is_running())
@@ -209,7 +221,7 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Shows `visit` what is on the screen, depth first; objects that vanish are passed over."""
+        """Calls `visit` with everything on the screen, depth first. Skips objects that vanish."""
         if control is None:
             self._overlooked = True
             return True

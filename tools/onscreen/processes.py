@@ -1,4 +1,4 @@
-"""Child processes that end when their starter does."""
+"""Child processes that end when this process does."""
 
 import ctypes
 import signal
@@ -10,7 +10,7 @@ _libc = ctypes.CDLL(None, use_errno=True)
 
 
 class Missing(Exception):
-    """A program is not installed. The text says which and how to get it."""
+    """A program is not installed. The text says which one and how to get it."""
 
 
 def _die_with_parent():
@@ -18,7 +18,7 @@ def _die_with_parent():
 
 
 def start(arguments, package=None, **options):
-    """Starts a program; `package` is the Debian package that brings it."""
+    """Starts a program; `package` is the Debian package that contains it."""
     try:
         return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)
     except FileNotFoundError as error:
@@ -27,7 +27,7 @@ def start(arguments, package=None, **options):
 
 
 def stop(process):
-    """Ends a program that start() gave, for certain."""
+    """Ends a program that start() returned, by force if it does not end within five seconds."""
     if process.poll() is None:
         process.terminate()
         try:
@@ -38,7 +38,10 @@ def stop(process):
 
 
 def wait_for(condition, seconds, what):
-    """The first true value of condition(), asked until the time is up."""
+    """Calls condition() until it returns a true value, and returns that.
+
+    Raises TimeoutError when there is none within `seconds`.
+    """
     deadline = time.monotonic() + seconds
     while True:
         value = condition()

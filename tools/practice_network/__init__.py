@@ -1,6 +1,6 @@
 """A network of made-up printers and scanners, inside namespaces.
 
-PracticeNetwork is what a test inside the network steers it with.
+A test inside the network controls it with PracticeNetwork.
 """
 
 from practice_network.control import ControlError, PracticeNetwork

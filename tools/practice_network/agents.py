@@ -13,22 +13,22 @@ from practice_network.description import CLOSED, MISSING, SILENT, TEXT
 COMMUNITY = "corridor"
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
 PORT = 161
-# Without the other modules an agent is up in some 15 ms and does not listen for sub-agents.
+# With these modules only, an agent starts in some 15 ms and does not listen for sub-agents.
 MODULES = "override,pass,vacm_conf,vacm_context"
 
 
 class AgentError(Exception):
-    """An agent did not come up; says why."""
+    """An agent did not start. The text says why."""
 
 
 def listens(address):
-    """Whether something on this host takes requests at that address."""
+    """Returns whether a program on this host listens for SNMP requests at that address."""
     number = socket.inet_aton(address)[::-1].hex().upper()
     return f" {number}:{PORT:04X} " in pathlib.Path("/proc/net/udp").read_text()
 
 
 class Agents:
-    """The agents of all devices that are present."""
+    """The SNMP agents of all devices that are present."""
 
     def __init__(self, folder):
         self._folder = pathlib.Path(folder)
@@ -36,7 +36,7 @@ class Agents:
         self._by_device = {}
 
     def start(self, devices):
-        """Starts the agents of `devices`, all at once, and returns when they listen."""
+        """Starts the agents of all `devices` in parallel and returns when they listen."""
         awaited = []
         for device in devices:
             handles = self._by_device[device.name] = []
@@ -56,7 +56,7 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """Passes requests to a broadcast address on to all agents, which listen at their own."""
+        """Forwards requests to a broadcast address to all agents, which listen only at their own."""
         listener = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
         listener.bind((address, PORT))
 
@@ -76,7 +76,7 @@ class Agents:
 
 
 def _relay(address, request, sender, seconds=5):
-    """Asks the agent at `address` and answers in its place, from its address."""
+    """Asks the agent at `address` and sends its answer on, from the same address."""
     with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as own:
         own.settimeout(seconds)
         try:
@@ -84,11 +84,11 @@ def _relay(address, request, sender, seconds=5):
             own.sendto(request, (address, PORT))
             own.sendto(own.recv(1500), sender)
         except OSError:
-            pass  # No answer, or the address has gone.
+            pass  # The agent did not answer, or its address was removed.
 
 
 class _SilentAgent:
-    """Takes requests and leaves them unread, so that the sender sees neither answer nor refusal."""
+    """Receives requests and never reads them, so that the sender gets neither answer nor refusal."""
 
     def __init__(self, address):
         self._socket = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
@@ -128,7 +128,7 @@ class _Agent:
         return self._log.read_text(errors="replace") if self._log.exists() else ""
 
     def close(self):
-        # The whole session, since a slow answer's script holds the agent's socket open.
+        # Ends the whole session, because the script of a slow answer keeps the agent's socket open.
         if self._process.poll() is None:
             os.killpg(self._process.pid, signal.SIGKILL)
             self._process.wait()
@@ -139,7 +139,7 @@ def _override(activeif):
 
 
 def _slow_script(activeif, delay):
-    """A program that net-snmp asks for the object; it prints the object's name, type and value."""
+    """Returns a script that net-snmp runs to get the object's name, type and value."""
     answer = {MISSING: "", TEXT: f".{OBJECT}\nstring\ntwo"}.get(
         activeif, f".{OBJECT}\ninteger\n{activeif}")
     return f"#!/bin/sh\nsleep {delay}\n[ \"$1\" = -g ] && [ \"$2\" = .{OBJECT} ] || exit 0\n" \

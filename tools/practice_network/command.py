@@ -1,4 +1,4 @@
-"""The command line: the network itself, and `ctl` that steers it from the inside."""
+"""The command line: starts the network, or controls it from the inside with `ctl`."""
 
 import argparse
 import importlib.util
@@ -21,10 +21,10 @@ PACKAGES = {"unshare": "util-linux", "setpriv": "util-linux", "nsenter": "util-l
             "avahi-daemon": "avahi-daemon", "snmpd": "snmpd"}
 
 HELP = """
-Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns its exit
-status. Real Avahi and net-snmp daemons play the devices, inside separate namespaces: no packet
-leaves this machine, no hardware is needed, and when COMMAND or this tool ends, however it ends,
-everything is gone.
+Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns the exit
+status of COMMAND. Real Avahi and net-snmp daemons play the devices, inside separate namespaces. No
+packet leaves this machine, and no hardware is needed. When COMMAND or this tool ends, in whatever
+way, the network is gone.
 
 The wizard against twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
@@ -37,52 +37,52 @@ Needs root or sudo; COMMAND runs as you in either case.
 """
 
 DETAILS = """
-the description is a TOML file with one table for the network, which may be left out:
+the description is a TOML file. It has one table for the network, which may be left out:
     [network]
-    ipv6 = true                    false: IPv4 alone; default true
+    ipv6 = true                    false: IPv4 only; default true
     interfaces = 2                 1 or 2; default 1. Both see all devices, as Ethernet and Wi-Fi do
-                                   in one network. They are practice0 and practice1, without
-                                   --hosts 2 lo and practice1.
-    domains = ["annex.local"]      to be browsed besides "local"; default none
+                                   in one network. With --hosts 2 they are practice0 and practice1,
+                                   otherwise lo and practice1.
+    domains = ["annex.local"]      domains to browse besides "local"; default none
 and one table for each device:
     [[device]]
-    name = "Kestrel Model 100"     the name in the wizard's list; all else may be left out
+    name = "Kestrel Model 100"     the name in the wizard's list; all other entries are optional
     maker = "Kestrel"              as in the medium's model names: maker, blank, model
     model = "Model 100"
     note = "2nd floor"             where it stands
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
     domain = "annex.local"         default "local"; other domains have to end in ".local"
     port = 631                     default: the type's usual port
-    addresses = ["127.0.1.9"]      or how many to choose for it; default 1
-    activeif = 2                   what SNMP says: 2 is wireless, the default. "silent": takes the
-                                   question and never answers. "closed": has no agent. "missing":
-                                   has an agent without the object. "text": answers with a text.
-                                   A list gives each address its own.
+    addresses = ["127.0.1.9"]      or a number of addresses to choose for it; default 1
+    activeif = 2                   the number that SNMP answers; default 2, which is wireless.
+                                   "silent": receives the request and never answers. "closed": has
+                                   no agent. "missing": has an agent without the object. "text":
+                                   answers with a text. A list gives each address its own value.
     delay = 1.5                    seconds before each SNMP answer; default 0
     present = false                begins switched off; default true
-    txt = {rp = "auto"}            further TXT entries
+    txt = {rp = "auto"}            more TXT entries
 
-devices come, go and change while COMMAND runs, from the inside (a new device or a new value takes
-the entries of the file, as KEY=VALUE):
+these commands, run inside the network, add, remove and change devices while COMMAND runs. KEY=VALUE
+is an entry as in the file:
     practice-network ctl list
-    practice-network ctl add NAME [KEY=VALUE ...]     a known device, or a new one
+    practice-network ctl add NAME [KEY=VALUE ...]     switches on a known device, or adds a new one
     practice-network ctl set NAME KEY=VALUE ...       such as activeif=silent, delay=3, note=Attic
     practice-network ctl rename NAME NEW-NAME
     practice-network ctl remove NAME
-    practice-network ctl unplug INTERFACE             takes an interface away, as with its cable
-    practice-network ctl plug INTERFACE               brings it back
-    practice-network ctl stop-daemon | start-daemon | restart-daemon      Avahi's
-    practice-network ctl settle                       waits until all devices are established
-Python tests import PracticeNetwork from tools/practice_network for the same. Both find the network
-by the variable ONRAMP_PRACTICE_SOCKET.
+    practice-network ctl unplug INTERFACE             pulls an interface's cable
+    practice-network ctl plug INTERFACE               brings the interface back
+    practice-network ctl stop-daemon | start-daemon | restart-daemon      controls Avahi
+    practice-network ctl settle                       waits until all devices are published
+Python tests do the same with PracticeNetwork from tools/practice_network. Both find the network by
+the variable ONRAMP_PRACTICE_SOCKET.
 
-programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as all do by
-default; abstract sockets and TCP do not cross into the namespace. XDG_RUNTIME_DIR is a new, empty
-folder. Session bus, Wayland and accessibility bus of your desktop are out of reach: start what is
-needed inside, for instance with "dbus-run-session -- COMMAND".
+programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
+do by default. Abstract sockets and TCP connections do not cross into the namespace. XDG_RUNTIME_DIR
+is a new, empty folder. The session bus, Wayland and the accessibility bus of your desktop cannot be
+reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
-exit status: that of COMMAND, 128 + n if signal n ended it; 2 for a bad description, 77 if this
-machine gives no namespaces, 125 if the network did not come up, 126 or 127 if COMMAND did not.
+exit status: that of COMMAND, or 128 + n if signal n ended it; 2 for a bad description, 77 if
+namespaces cannot be created here, 125 if the network did not start, 126 or 127 if COMMAND did not.
 """
 
 
@@ -108,7 +108,7 @@ def _run(program, arguments):
         description=textwrap.dedent(HELP), epilog=DETAILS)
     parser.add_argument("--hosts", type=int, choices=(1, 2), default=1,
                         help="2: devices and COMMAND are on two hosts joined by a cable, "
-                             "192.0.2.0/24, each with its own Avahi; ctl has the devices' one")
+                             "192.0.2.0/24, each with its own Avahi; ctl controls the devices' one")
     parser.add_argument("--invoker", help=argparse.SUPPRESS)
     parser.add_argument("description", metavar="DESCRIPTION")
     parser.add_argument("command", metavar="COMMAND", nargs=argparse.REMAINDER)
@@ -182,7 +182,7 @@ def _steer(request):
 
 
 def _entry(text):
-    """KEY=VALUE as the description file would have it; a text needs no quotes."""
+    """Reads KEY=VALUE as in a description file, except that a text needs no quotes."""
     key, equals, value = text.partition("=")
     if not equals:
         raise ControlError(f'"{text}": write an entry as KEY=VALUE')

@@ -1,4 +1,4 @@
-"""How a running network is steered: one JSON line a request over a Unix socket, one back."""
+"""Controls a running network over a Unix socket, with one line of JSON per request and answer."""
 
 import json
 import os
@@ -11,16 +11,16 @@ SOCKET_VARIABLE = "ONRAMP_PRACTICE_SOCKET"
 
 
 class ControlError(Exception):
-    """The network refused a request, or there is none; says why."""
+    """The network refused a request, or there is no network. The text says why."""
 
 
 class PracticeNetwork:
     """The network that this process runs in, for tests and for `practice-network ctl`.
 
-    Devices are named by their name. Entries are those of the description file: `maker`, `model`,
-    `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation returns when
-    the network has carried it out; Avahi takes another second to establish what is new, for which
-    settle() waits. A refused operation raises ControlError and changes nothing.
+    A device is identified by its name. Entries are those of the description file: `maker`, `model`,
+    `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation
+    returns when the network has carried it out. Avahi then takes another second to publish a
+    change; settle() waits for that. A refused operation raises ControlError and changes nothing.
     """
 
     def __init__(self, path=None):
@@ -30,13 +30,13 @@ class PracticeNetwork:
                                "start one with: practice-network DESCRIPTION")
 
     def add(self, name, **entries):
-        """Lets a device appear: a known one, or a new one made from `entries`."""
+        """Switches on a known device, or adds a new one made from `entries`."""
         self._ask("add", name, entries)
 
     def remove(self, name):
-        """Switches a device off: it says goodbye, and its agents are gone.
+        """Switches a device off: Avahi announces its departure, and its agents end.
 
-        Browsers see it leave up to a second later, since mDNS caches keep it that long.
+        Browsers see the device leave up to a second later, because mDNS caches keep it that long.
         """
         self._ask("remove", name)
 
@@ -44,15 +44,15 @@ class PracticeNetwork:
         self._ask("rename", name, new_name)
 
     def set(self, name, **entries):
-        """Changes a device; a new text or address is published as a change, not a new device."""
+        """Changes a device. A new text or address is published as a change, not as a new device."""
         self._ask("set", name, entries)
 
     def list(self):
-        """One dictionary a device: its entries, and its "state": "established" and others."""
+        """Returns a dictionary per device: its entries and its "state", such as "established"."""
         return self._ask("list")
 
     def unplug(self, interface):
-        """Takes an interface away from devices and command; plug() brings it back."""
+        """Takes an interface down for the devices and the command; plug() brings it back."""
         self._ask("unplug", interface)
 
     def plug(self, interface):
@@ -69,7 +69,7 @@ class PracticeNetwork:
         self.start_daemon()
 
     def settle(self, seconds=30):
-        """Waits until Avahi has established every device that is present."""
+        """Waits until Avahi has published every device that is present."""
         deadline = time.monotonic() + seconds
         while waiting := [one for one in self.list()
                           if one["present"] and one["state"] != "established"]:
@@ -97,7 +97,7 @@ OPERATIONS = ("add", "remove", "rename", "set", "list", "unplug", "plug", "stop_
 
 
 def serve(network, listener):
-    """Carries out requests, one after the other, until the process is ended."""
+    """Carries out requests, one after another, until the process is ended."""
     while True:
         connection, _ = listener.accept()
         connection.settimeout(5)
@@ -107,7 +107,7 @@ def serve(network, listener):
                 stream.write(json.dumps(answer).encode() + b"\n")
                 stream.flush()
             except OSError:
-                pass  # The asker is gone.
+                pass  # The client is gone.
 
 
 def _answer(network, line):

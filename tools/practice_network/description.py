@@ -1,4 +1,4 @@
-"""The description of the network and its devices: what may stand in it, and what is wrong with it."""
+"""Reads the description of the network and its devices, and reports what is wrong with it."""
 
 import dataclasses
 import difflib
@@ -6,27 +6,27 @@ import ipaddress
 import re
 import tomllib
 
-# What an address does with an SNMP request, besides answering an integer.
-SILENT = "silent"    # takes the request and never answers
-CLOSED = "closed"    # no agent: the host refuses the packet
-MISSING = "missing"  # an agent that lacks the object
-TEXT = "text"        # the object is a text instead of an integer
+# What an address can do with an SNMP request instead of answering an integer.
+SILENT = "silent"    # receives the request and never answers
+CLOSED = "closed"    # has no agent, so the host refuses the packet
+MISSING = "missing"  # has an agent that lacks the object
+TEXT = "text"        # answers with a text instead of an integer
 WORDS = (SILENT, CLOSED, MISSING, TEXT)
 
 DEFAULT_TYPE = "_pdl-datastream._tcp"
 DEFAULT_PORTS = {DEFAULT_TYPE: 9100, "_printer._tcp": 515, "_ipp._tcp": 631, "_scanner._tcp": 9500}
-# The keys under which each service type carries the maker's and the model's name (Bonjour Printing).
+# The TXT keys of maker and model: for scanners, and for printers (Bonjour Printing Specification).
 SCANNER_KEYS = ("mfg", "mdl")
 PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
 
 class DescriptionError(Exception):
-    """Says which file and device is wrong, and what would be right."""
+    """A bad description. The text names the file and the device, and says what would be right."""
 
 
 @dataclasses.dataclass(frozen=True)
 class Settings:
-    """What the description says of the network itself."""
+    """The description's settings for the network itself."""
 
     ipv6: bool = True
     interfaces: int = 1
@@ -35,7 +35,7 @@ class Settings:
 
 @dataclasses.dataclass(frozen=True)
 class Device:
-    """One made-up device. `addresses` may be a number: that many are then chosen by the network."""
+    """One made-up device. If `addresses` is a number, the network chooses that many addresses."""
 
     name: str
     maker: str | None = None
@@ -51,19 +51,19 @@ class Device:
     txt: tuple[tuple[str, str], ...] = ()
 
     def behaviour(self):
-        """What each address does with a request, in the order of the addresses."""
+        """Returns what each address does with a request, in the order of the addresses."""
         count = address_count(self.addresses)
         return self.activeif * count if len(self.activeif) == 1 else self.activeif
 
     def is_closed(self):
-        """Whether nobody answers at any address, so that they can be other closed devices' too."""
+        """Returns whether no address has an agent; closed devices can share their addresses."""
         return set(self.activeif) == {CLOSED}
 
     def port_of(self, service_type):
         return self.port or DEFAULT_PORTS.get(service_type, 9100)
 
     def txt_of(self, service_type):
-        """The TXT record's pairs for one of the device's service types."""
+        """Returns the pairs of the TXT record for one of the device's service types."""
         keys = SCANNER_KEYS if service_type == "_scanner._tcp" else PRINTER_KEYS
         named = ((keys[0], self.maker), (keys[1], self.model), ("note", self.note))
         return tuple((key, value) for key, value in named if value is not None) + self.txt
@@ -74,7 +74,7 @@ def address_count(addresses):
 
 
 def load(path):
-    """The settings and the devices of a description file, these in its order."""
+    """Returns the settings and the list of devices of a description file."""
     try:
         with open(path, "rb") as file:
             content = tomllib.load(file)
@@ -106,12 +106,12 @@ def load(path):
 
 
 def device(table, place):
-    """The device that `table` describes. `place` starts the message when something is wrong."""
+    """Returns the device that `table` describes. `place` begins any error message."""
     return change(None, table, place)
 
 
 def change(before, table, place):
-    """The device `before` with the entries of `table` put in; a new one when `before` is None."""
+    """Returns `before` changed by the entries of `table`, or a new device when `before` is None."""
     values = _read(table, READERS, place)
     if before is None and "name" not in values:
         raise DescriptionError(f"{place}: name is missing; give {READERS['name'][1]}")
@@ -125,12 +125,12 @@ def change(before, table, place):
         for key, value in result.txt_of(service_type):
             if len(f"{key}={value}".encode()) > 255:
                 raise DescriptionError(f"{place}: the text of {key} is too long; "
-                                       "key and text may have 254 bytes together")
+                                       "key and text together may have at most 254 bytes")
     return result
 
 
 def _read(table, readers, place):
-    """The table's values, each checked by the reader of its key."""
+    """Returns the table's values, each checked and converted by the reader of its key."""
     values = {}
     for key, value in table.items():
         if key not in readers:

@@ -52,7 +52,7 @@ publish-workstation=no
 
 
 class HostError(Exception):
-    """A part of the host did not come up; says which and why."""
+    """A part of the host did not start. The text says which part and why."""
 
 
 def run(*command):
@@ -62,8 +62,8 @@ def run(*command):
 
 
 def take_over_run():
-    """Puts an empty /run into this process's mount namespace."""
-    # A machine's own static services must not show up among the made-up devices.
+    """Mounts an empty /run in this process's mount namespace."""
+    # This machine's own static Avahi services must not appear among the made-up devices.
     if pathlib.Path("/etc/avahi/services").is_dir():
         run("mount", "-t", "tmpfs", "none", "/etc/avahi/services")
     run("mount", "-t", "tmpfs", "-o", "mode=755", "none", "/run")
@@ -71,8 +71,10 @@ def take_over_run():
 
 
 def loop_back(second):
-    """Makes loopback this network namespace's network; `second` names another interface, or is
-    None."""
+    """Makes loopback the network of this network namespace.
+
+    `second` is the name of a second interface to create, or None.
+    """
     _configure("lo")
     if second:
         run("ip", "link", "add", second, "type", "veth", "peer", "name", "far-end")
@@ -81,10 +83,10 @@ def loop_back(second):
 
 
 def plug_in_cables(names):
-    """Joins this network namespace and that of the first process by virtual cables.
+    """Connects this network namespace to that of the first process by virtual cables.
 
-    All are in one network, as those of a computer on Ethernet and Wi-Fi are: what a cable carries,
-    the next one carries when it is unplugged.
+    All cables are in one network, like the Ethernet and Wi-Fi of a computer. When one is unplugged,
+    the next one carries its traffic.
     """
     for number, name in enumerate(names):
         run("ip", "link", "add", name, "type", "veth", "peer", "name", name, "netns", "1")
@@ -97,8 +99,7 @@ def plug_in_cables(names):
 
 
 def _configure(name, address=None, metric=0, enter=()):
-    # Addresses are this network's own, so that nobody need be asked for a second whether they are
-    # free.
+    # No other host can use these addresses, so duplicate detection would only cost a second.
     _set_kernel(f"ipv6/conf/{name}/accept_dad", 0, enter)
     if address:
         run(*enter, "ip", "address", "add", address, "brd", "+", "dev", name, "metric", str(metric))
@@ -115,7 +116,7 @@ def _set_kernel(key, value, enter):
 
 
 class Host:
-    """The host that this process's namespaces are, with its system bus, and Avahi once started."""
+    """The host made of this process's namespaces. It has a system bus and can start Avahi."""
 
     def __init__(self, name, interfaces, settings):
         self._name = name
@@ -128,7 +129,7 @@ class Host:
         run("ip", "address", "replace", address, "dev", self.interfaces[0])
 
     def plug(self, interface, plugged):
-        """Brings an interface up, or down when not `plugged`, at both ends of a cable."""
+        """Brings both ends of an interface's cable up, or down when `plugged` is false."""
         for enter in ((), IN_FIRST_HOST):
             if plugged:
                 _bring_up(interface, self.interfaces.index(interface), enter)
@@ -147,7 +148,7 @@ class Host:
                              "--no-rlimits")
 
     def stop_avahi(self):
-        """Ends the daemon as a system does: it says goodbye for all its services."""
+        """Ends the daemon normally, so that it announces the departure of all its services."""
         if self._avahi:
             self._avahi.terminate()
             self._avahi.wait()
@@ -171,7 +172,7 @@ def log(program):
 
 
 def _start(program, *arguments):
-    # In another session, so that Ctrl-C at the command does not reach it.
+    # A new session keeps Ctrl-C, which is meant for the command, from reaching the daemon.
     with open(RUN / f"{program}.log", "ab") as output:
         return subprocess.Popen([program, *arguments], stdin=subprocess.DEVNULL, stdout=output,
                                 stderr=output, start_new_session=True)

@@ -1,4 +1,4 @@
-"""Encloses the network: namespaces from which nothing leaks and which end with the tool."""
+"""Encloses the network in namespaces, from which nothing leaks and which end with the tool."""
 
 import json
 import os
@@ -26,7 +26,7 @@ NETWORK_FAILED = 125
 
 
 def why_not_enclosed():
-    """None where this process can have such namespaces; else the reason."""
+    """Returns None if this process can create such namespaces, else the reason why not."""
     probe = subprocess.run([*ENCLOSE, "mount", "-t", "tmpfs", "none", "/run"],
                            capture_output=True, text=True)
     if probe.returncode:
@@ -41,7 +41,8 @@ def why_not_enclosed():
 
 def enclose(options):
     """Runs the network and its command in namespaces; returns the command's exit status."""
-    # Ctrl-C is meant for the command, which has it from the terminal. The other two end all.
+    # Ctrl-C is meant for the command, which gets it from the terminal. SIGTERM and SIGHUP end
+    # everything.
     signal.signal(signal.SIGINT, lambda *_: None)
     process = subprocess.Popen(
         ["setpriv", "--pdeathsig", "KILL", *ENCLOSE,
@@ -61,7 +62,7 @@ def enclose(options):
 
 def inside(options):
     """The first process of the namespaces: starts the network, then the command."""
-    # Handlers, because a signal that is ignored would stay so in the command.
+    # A handler instead of SIG_IGN, because the command would inherit an ignored signal.
     signal.signal(signal.SIGINT, lambda *_: None)
     try:
         environment = _own_run(options["user"])
@@ -80,7 +81,7 @@ def inside(options):
     except OSError as error:
         print(f"practice-network: {options['command'][0]}: {error.strerror}", file=sys.stderr)
         return 127 if isinstance(error, FileNotFoundError) else 126
-    # As the first process this one inherits all orphans, and takes every one that ends.
+    # This is the first process of the namespace, so it has to reap all orphans.
     while True:
         pid, status = os.wait()
         if pid == command.pid:
@@ -90,7 +91,7 @@ def inside(options):
 
 
 def devices(options):
-    """The process that runs the devices, on the command's host or on a second one."""
+    """Runs the devices, in a process on the command's host or on a second host."""
     try:
         settings, described = description.load(options["description"])
         if options["hosts"] == 2:
@@ -116,7 +117,7 @@ def devices(options):
 
 
 def _own_run(user):
-    """Takes over /run and gives back what a desktop program needs of it, as environment."""
+    """Takes over /run. Returns an environment with what desktop programs need from /run."""
     variables = {SOCKET_VARIABLE: str(RUN / "socket"), "DBUS_SYSTEM_BUS_ADDRESS": BUS_ADDRESS,
                  "XDG_RUNTIME_DIR": str(RUN / "user")}
     authority = pathlib.Path(os.environ.get("XAUTHORITY", "/nowhere"))
@@ -125,13 +126,13 @@ def _own_run(user):
     folder = pathlib.Path(variables["XDG_RUNTIME_DIR"])
     folder.mkdir(mode=0o700)
     os.chown(folder, *user)
-    if cookies and not authority.exists():  # It lay in /run.
+    if cookies and not authority.exists():  # The file was in /run.
         copy = folder / "Xauthority"
         copy.touch(mode=0o600)
         copy.write_bytes(cookies)
         os.chown(copy, *user)
         variables["XAUTHORITY"] = str(copy)
-    # The sockets of these two were in /run.
+    # The sockets that these two name were in /run.
     gone = ("DBUS_SESSION_BUS_ADDRESS", "WAYLAND_DISPLAY")
     return {key: value for key, value in os.environ.items() if key not in gone} | variables
 
@@ -164,7 +165,7 @@ def _start_command(options, environment):
 
 
 def _status(code):
-    """A child's exit status as a shell tells it."""
+    """Returns a child's exit status as a shell reports it."""
     return code if code >= 0 else 128 - code
 
 

@@ -1,4 +1,4 @@
-"""The devices of a running network: who is there, and how that changes."""
+"""The devices of a running network, and the changes to them."""
 
 import collections
 import dataclasses
@@ -14,7 +14,7 @@ from practice_network.publisher import Publisher, PublishError
 
 
 class Network:
-    """All devices, present or not, published and answering as they are described."""
+    """All described devices. Those that are present are published and answer SNMP requests."""
 
     def __init__(self, host, subnet):
         self._host = host
@@ -22,14 +22,14 @@ class Network:
         self._agents = Agents(RUN / "agents")
         self._publisher = None
         self._devices = {}
-        # A device keeps its host name, so that it publishes the same each time that it comes.
+        # A device keeps its host name, so that it publishes the same name each time it appears.
         numbers = itertools.count(1)
         self._host_names = collections.defaultdict(lambda: f"device-{next(numbers)}.local")
 
     def load(self, devices):
-        """Takes in all devices of a description and lets those appear that are present."""
+        """Takes over all devices of a description and publishes those that are present."""
         self._devices = {device.name: device for device in devices}
-        # Those that name their addresses come first, so that nobody else is given them.
+        # Devices with fixed addresses come first, so that no other device is given these addresses.
         for device in sorted(devices, key=lambda one: isinstance(one.addresses, int)):
             self._devices[device.name] = self._with_addresses(device)
         present = [device for device in self._devices.values() if device.present]
@@ -47,7 +47,7 @@ class Network:
                     self._publish(device)
 
     def unplug(self, interface):
-        """Takes an interface away from both hosts; plug() brings it back."""
+        """Takes an interface down on both hosts; plug() brings it back."""
         self._plug(interface, False)
 
     def plug(self, interface):
@@ -60,7 +60,7 @@ class Network:
         self._host.plug(interface, plugged)
 
     def settle(self, seconds=30):
-        """Waits until everything is established that is published."""
+        """Waits until Avahi has established every device that is present."""
         deadline = time.monotonic() + seconds
         for device in self._devices.values():
             while device.present and (state := self._state(device)) != "established":
@@ -75,7 +75,7 @@ class Network:
         self._host.stop_avahi()
 
     def add(self, name, entries):
-        """Lets a known device appear, changed by `entries`, or a new one."""
+        """Switches on a known device, changed by `entries`, or adds a new one."""
         if name in self._devices:
             self.set(name, entries | {"present": True})
             return
@@ -91,13 +91,13 @@ class Network:
         self.set(name, {"name": new_name})
 
     def set(self, name, entries):
-        """Changes a device; what it publishes changes only where the entries differ."""
+        """Changes a device. Publishes only what the new entries change."""
         before = self._devices.get(name)
         if not before:
             raise DescriptionError(f'device "{name}": is not known; "list" shows the known ones')
         after = description.change(before, entries, f'device "{name}"')
         if after.name != name and after.name in self._devices:
-            raise DescriptionError(f'device "{after.name}": is there already; take another name')
+            raise DescriptionError(f'device "{after.name}": exists already; choose another name')
         after = self._with_addresses(after, name)
         if after.name != name:
             self._devices = {after.name if key == name else key: value
@@ -127,7 +127,7 @@ class Network:
                 self._publish(after)
 
     def list(self):
-        """One table a device: its entries as described, and "state", Avahi's word for it."""
+        """Returns a dictionary per device: its entries, and Avahi's word for its state as "state"."""
         return [{key: value for key, value in dataclasses.asdict(device).items()
                  if value is not None}
                 | {"txt": dict(device.txt), "state": self._state(device)}
@@ -152,13 +152,13 @@ class Network:
         self._agents.stop(device)
 
     def _with_addresses(self, device, known_as=None):
-        """The device with addresses that no other device answers at, all known to the host."""
+        """Returns the device with addresses that no other device answers at. Adds them to the host."""
         name = known_as or device.name
         used = {address for key, other in self._devices.items() if key != name
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())
                 if behaviour != description.CLOSED}
         if isinstance(device.addresses, int):
-            # A loopback network's first addresses are the host's own, and so are those of a cable.
+            # The first addresses of the network belong to the hosts themselves.
             hosts = itertools.islice(self._subnet.hosts(), 256 if self._subnet.is_loopback else 9,
                                      None)
             avoided = used if device.is_closed() else used | self._addresses_of_others(name)
@@ -171,7 +171,7 @@ class Network:
         for address, behaviour in zip(device.addresses, device.behaviour()):
             if address in used and behaviour != description.CLOSED:
                 raise DescriptionError(f'device "{device.name}": {address} is another device\'s '
-                                       "address; take one that is free, or leave addresses away")
+                                       "address; use a free one, or leave addresses out")
             self._admit(device, ipaddress.ip_address(address))
         return device
 

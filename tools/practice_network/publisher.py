@@ -1,4 +1,4 @@
-"""The mDNS side of the devices: their host names and services in a real Avahi daemon."""
+"""The mDNS side of the devices: a real Avahi daemon publishes their host names and services."""
 
 import dataclasses
 import ipaddress
@@ -11,9 +11,9 @@ AVAHI = "org.freedesktop.Avahi"
 ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
-# Unique, not probed for, several of a name allowed. Host names are the network's own, so there is
-# nobody to ask; and a probe that comes back on loopback after its record was replaced would make
-# Avahi see a conflict with itself.
+# Unique, without probes, several records of a name allowed. Nobody else uses these host names, so
+# probes are unnecessary. They would also do harm: a probe that comes back on loopback after its
+# record was replaced looks to Avahi like a conflict.
 ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
 ADDRESS_SECONDS = dbus.UInt32(120)  # RFC 6762, section 10
 CLASS_IN, TYPE_A, TYPE_AAAA = dbus.UInt16(1), dbus.UInt16(1), dbus.UInt16(28)
@@ -22,11 +22,11 @@ GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 
 
 
 class PublishError(Exception):
-    """Avahi refused something or is not there; says what."""
+    """Avahi refused a request or is not running. The text says which."""
 
 
 def connect(bus_address, seconds=10):
-    """A connection to a bus on which Avahi is up and running, and Avahi's server; waits for it."""
+    """Waits until Avahi runs. Returns a connection to its bus and its server object."""
     bus = dbus.bus.BusConnection(bus_address)
     deadline = time.monotonic() + seconds
     while True:
@@ -45,7 +45,7 @@ def connect(bus_address, seconds=10):
 
 @dataclasses.dataclass(frozen=True)
 class _Entry:
-    """What is published of a device, in two groups, so that its addresses can change alone."""
+    """What is published for a device. Its addresses are a separate group and can change alone."""
 
     host: str
     addresses: dbus.Interface
@@ -53,7 +53,7 @@ class _Entry:
 
 
 class Publisher:
-    """Publishes devices. Everything is gone again when the connection closes."""
+    """Publishes devices. Closing the connection withdraws all of them."""
 
     def __init__(self, bus_address):
         self._bus, self._server = connect(bus_address)
@@ -73,7 +73,7 @@ class Publisher:
         entry.services.Commit()
 
     def publish_addresses(self, device):
-        """Publishes the device's present addresses in place of those it had."""
+        """Replaces the published addresses by the device's present ones."""
         entry = self._entries[device.name]
         entry.addresses.Reset()
         for address in map(ipaddress.ip_address, device.addresses):
@@ -84,7 +84,7 @@ class Publisher:
         entry.addresses.Commit()
 
     def publish_txt(self, device):
-        """Publishes the device's present texts in place of those it had."""
+        """Replaces the published TXT records by the device's present ones."""
         services = self._entries[device.name].services
         for service_type in device.type:
             services.UpdateServiceTxt(ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name,
@@ -96,16 +96,16 @@ class Publisher:
             entry.addresses.Free()
 
     def await_probed(self, device, seconds=5):
-        """Waits out the probes for the device's name; what they ask for must not change meanwhile.
+        """Waits until Avahi has probed for the device's name. Its records must not change before.
 
-        On loopback Avahi hears its own probes, and takes one with an older text for a rival's.
+        On loopback Avahi hears its own probes, and mistakes one with an older text for a rival's.
         """
         deadline = time.monotonic() + seconds
         while self.state(device) == "probing" and time.monotonic() < deadline:
             time.sleep(0.01)
 
     def state(self, device):
-        """"established" when everything of the device is; otherwise the state of what is not."""
+        """Returns "established" when both groups are, otherwise the state of one that is not."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"

@@ -1,4 +1,4 @@
-# Sourced by the scripts at the root: installs what a list of packages names and this machine lacks.
+# Sourced by the scripts at the root. Installs the packages of a list that this machine lacks.
 
 install_packages() {
   local list=$1 missing
@@ -8,7 +8,7 @@ install_packages() {
   done)
   [ -z "$missing" ] && return
   if ! command -v apt-get >/dev/null; then
-    echo "No apt-get here. Install the equivalents of:" $missing >&2
+    echo "There is no apt-get here. Install the equivalents of these packages:" $missing >&2
     return 1
   fi
   local as_root=()

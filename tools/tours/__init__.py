@@ -1,1 +1,1 @@
-"""The ways on which the tour leads through any medium's wizard."""
+"""The routes that the tour takes through the wizard of any medium."""

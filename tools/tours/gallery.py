@@ -1,4 +1,4 @@
-"""Pictures of every page in every language, size and colour scheme that users may have."""
+"""Takes pictures of every page in every language, and in several sizes and colour schemes."""
 
 import pathlib
 import tempfile
@@ -24,7 +24,7 @@ _SCHEMES = {"light": {}, "dark": _DARK, "contrast": _CONTRAST}
 
 
 def settings(scheme, points):
-    """A desktop's settings file for these colours and this size of text."""
+    """Returns a desktop's settings file for that colour scheme and text size."""
     lines = ["[General]", f"font=Sans Serif,{points},-1,5,50,0,0,0,0,0"]
     for group, (background, text) in _SCHEMES[scheme].items():
         lines += [f"[Colors:{group}]", f"BackgroundNormal={background}",
@@ -36,7 +36,7 @@ def settings(scheme, points):
 
 
 def all_looks():
-    """(language, scale in per cent, scheme, points) of every set of pictures."""
+    """Returns (language, scale in per cent, scheme, points) for every set of pictures."""
     looks = [(language, scale, scheme, _USUAL) for language in LANGUAGES for scale in (100, 200)
              for scheme in ("light", "dark")]
     looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
@@ -45,7 +45,7 @@ def all_looks():
 
 
 class Gallery:
-    """`medium` is a crowded copy, `network` a practice network without devices."""
+    """Takes the pictures. `medium` is a crowded copy; `network` has no devices yet."""
 
     def __init__(self, desktop, medium, pictures, network):
         self._desktop = desktop
@@ -54,7 +54,7 @@ class Gallery:
         self._network = network
 
     def take(self, model, service_type, version):
-        """All pictures: the search finds devices of `model`, and `version` is not supported."""
+        """Takes all pictures. The search finds devices of `model`; `version` is not supported."""
         self._add_devices(model, service_type)
         with tempfile.TemporaryDirectory() as folder:
             for look in all_looks():
@@ -94,7 +94,7 @@ class Gallery:
         with self._start() as person:
             person.see("label", self._text["INST_TXT_MODEL"], _PATIENCE)
             self._take(person, "1-models")
-            # The list finds a model by the start of any word of its name.
+            # Typing the beginning of any word of a model's name selects that model in the list.
             words = model.split(" ", 1)[1]
             person.press(*("space" if letter == " " else letter for letter in words))
             person.press("Return")

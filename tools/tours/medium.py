@@ -1,4 +1,4 @@
-"""What the tour has to know of a medium to find its way through it."""
+"""What the tour has to know about a medium to walk through its wizard."""
 
 import pathlib
 import plistlib
@@ -9,7 +9,7 @@ _RESOURCES = "MacResources/CDCommonInfo.plist"
 
 
 class Unsuitable(Exception):
-    """The tour cannot be led through this medium; says why."""
+    """The tour cannot walk through this medium's wizard. The text says why."""
 
 
 class Medium:
@@ -25,11 +25,11 @@ class Medium:
 
     @property
     def service_type(self):
-        """The type of the services that are browsed for, without the dot at its end."""
+        """The service type that the wizard looks for, without its closing dot."""
         return self._resources.get("BonjourNetwork", "").rstrip(".")
 
     def wireless_models(self):
-        """The models that can be set up over a wireless network, in the order of their names."""
+        """Returns the models that support wireless, in the order of their names."""
         contained = _read(self._path("CDInfo")).get("ContainedModel", {})
         details = _read(self._path("ModelInfo")).get("Model", {})
         wireless = [name for name in contained
@@ -40,7 +40,7 @@ class Medium:
         return sorted(wireless, key=str.lower)
 
     def unsupported_version(self):
-        """A version of the system that the medium refuses; None where it supports all."""
+        """Returns a system version that the medium does not support; None if it supports all."""
         for bound, step in (("SystemMin", -1), ("SystemMax", 1)):
             try:
                 major = int(self._resources[bound]["Major"])

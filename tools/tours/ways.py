@@ -1,19 +1,19 @@
-"""Ways through the wizard, with a picture of everything that there is to see on them."""
+"""Routes through the wizard, with a picture of each page."""
 
 from onscreen.person import Person
 from onscreen.processes import wait_for
 
 _LOCALES = {"en": "en_US"}
 _GEAR, _GEAR_REFRESH = "Actions", 2
-_LONGEST_SEARCH = 60  # seconds: five pauses of three, on a machine with much else to do
+_LONGEST_SEARCH = 60  # seconds; the wizard waits 15, but the machine may be busy
 
 
 class WentWrong(Exception):
-    """The wizard did not do what it should; says what."""
+    """The wizard did not do what it should. The text says what."""
 
 
 class Tour:
-    """A person on a desktop before a medium's wizard. `network` is the practice network or None."""
+    """Uses a medium's wizard on a desktop. `network` is the practice network or None."""
 
     def __init__(self, desktop, medium, pictures, network):
         self._desktop = desktop
@@ -23,7 +23,7 @@ class Tour:
         self._network = network
 
     def alert(self):
-        """A system that the medium does not support."""
+        """Shows the alert on a system that the medium does not support."""
         version = self._medium.unsupported_version()
         if not version:
             print("The medium supports every system version: there is no alert to see.")
@@ -35,7 +35,7 @@ class Tour:
             _expect(person.wait_for_end() == 0 and not self._files(), "the alert's end")
 
     def usb(self):
-        """Model list, connection type, USB, and the package opens."""
+        """Goes from the model list to the connection page and USB, until the package opens."""
         model = self._medium.wireless_models()[0]
         with self._start() as person:
             chosen = self._to_connection_page(person, model, "usb")
@@ -47,11 +47,11 @@ class Tour:
             self._see_package_open(person, 2 if chosen else 1)
 
     def wireless(self):
-        """The same by the wireless row: devices are found, are gone, and are found again."""
+        """Goes the wireless way: devices are found, disappear, and are found again."""
         model = next((name for name in self._medium.wireless_models() if " " in name), None)
         if not model:
-            print("No device can match a model whose name has no blank: "
-                  "the wireless way ends in the set-up tool and is not walked.")
+            print("No device can match a model whose name has no blank, so "
+                  "the tour leaves out the wireless way.")
             return
         self._make_up_devices(model)
         with self._start() as person:
@@ -101,7 +101,7 @@ class Tour:
                       env={"LANG": f"{_LOCALES.get(language, language)}.UTF-8"})
 
     def _to_connection_page(self, person, model, way):
-        """Whether a model was chosen on the way; there is no list when all models are alike."""
+        """Goes to the connection page. Returns whether the model list was shown before it."""
         title, list_title = (self._text[key]
                              for key in ("INST_TXT_CONNECTIONTYPE", "INST_TXT_MODEL"))
         wait_for(lambda: person.sees("label", title) or person.sees("label", list_title), 20,
@@ -116,7 +116,7 @@ class Tour:
         return on_list
 
     def _choose_model(self, person, model):
-        """With the keyboard, since the model may be out of sight."""
+        """Chooses a model with the keyboard, because it may be scrolled out of sight."""
         person.see("list item")
         person.press("Home")
         while (selected := self._selected_model(person)) != model:
@@ -147,7 +147,7 @@ class Tour:
         print("\nopened: " + "\n".join(self._desktop.opened()))
 
     def _files(self):
-        """The hand-off files, those for all users first."""
+        """Returns the hand-off files, those for all users first."""
         return sorted(self._desktop.local_folder.glob("*/*.plist")) + sorted(
             self._desktop.user_folder.glob("*/*.plist"))
 

@@ -4,7 +4,7 @@
 #include <cstdint>
 #include <span>
 
-/// Makes the fewest calls that a request over UDP takes: socket, sendto, poll, recvfrom and close.
-/// Returns the size of the reply, 0 when anything failed. `agent` is in host byte order.
+/// Makes one UDP exchange with the fewest possible system calls: socket, sendto, poll, recvfrom and
+/// close. Returns the size of the reply, or 0 when anything failed. `agent` is in host byte order.
 std::size_t bareExchange(std::uint32_t agent, std::uint16_t port,
                          std::span<const std::uint8_t> request, std::span<std::uint8_t> reply);

@@ -9,8 +9,8 @@ namespace onramp::conformance {
 /// The application's window.
 [[nodiscard]] const Window& window();
 
-/// Does what a user does who clicks the button with the title `title` in an alert or a sheet, once
-/// there is such a button. Each front end defines it. Returns at once.
+/// Clicks the button titled `title` in an alert or a sheet, as a user would, once such a button is
+/// visible. Returns at once. Each front end has its own definition.
 void clickSoon(const std::string& title);
 
 }  // namespace onramp::conformance

@@ -27,7 +27,7 @@ const Window& window() {
 
 namespace {
 
-/// Runs all tests inside the application's main loop, once it has launched.
+/// Runs all tests inside the application's main loop, once the application has launched.
 class Tests : public ApplicationDelegate {
  public:
   void performAction(std::string_view) override {}
@@ -37,7 +37,8 @@ class Tests : public ApplicationDelegate {
   void awakeFromNib() override {}
   void applicationWillFinishLaunching() override {}
   void applicationDidFinishLaunching() override {
-    // By a timer, because some systems count as running only after this call.
+    // A timer starts the tests, because on some systems the application counts as running only
+    // after this function has returned.
     scheduleTimer(std::chrono::milliseconds(0), [] {
       const int status = RUN_ALL_TESTS();
       std::fflush(nullptr);

@@ -52,7 +52,7 @@ TEST_F(MainLoop, PerformsActionsOfAnyThreadInOrderWhileAModalLoopRuns) {
               ElementsAre("before the loop", "first", "second", "third", "posted by an action"));
 }
 
-TEST_F(MainLoop, EndsAModalLoopBeforeAllThatWaits) {
+TEST_F(MainLoop, EndsAModalLoopBeforeTheWaitingActions) {
   performOnMainThread([&] {
     noting("takes long")();
     std::thread(abortModal).join();
@@ -81,7 +81,7 @@ TEST_F(Timers, RunInTheOrderOfTheirTimesWhileAModalLoopRuns) {
   EXPECT_THAT(log, ElementsAre("before the loop", "first", "second", "third"));
 }
 
-TEST_F(Timers, RunNotTooSoon) {
+TEST_F(Timers, DoNotRunTooSoon) {
   const auto start = std::chrono::steady_clock::now();
   scheduleTimer(100ms, [] { abortModal(); });
   runModalForWindow(window());
@@ -114,13 +114,13 @@ TEST_F(Alert, SheetReturnsAtOnceAndReportsTheButton) {
 
 constexpr int kEndedAsPromised = 7;
 
-TEST(Termination, EndsAModalLoopAndSleepsAndNothingRunsAnyMore) {
+TEST(Termination, EndsModalLoopsAndSleepsAndRunsNothingMore) {
   GTEST_FLAG_SET(death_test_style, "threadsafe");
   const auto terminateInAModalLoop = [] {
     static bool hasRun = false;
     static bool slept = true;
     static std::thread sleeper([] { slept = sleepOffMainThread(1h) || sleepOffMainThread(1h); });
-    // Some systems exit inside terminateApplication().
+    // On some systems terminateApplication() exits, so the result is checked at exit.
     std::atexit([] {
       sleeper.join();
       std::_Exit(slept || hasRun ? 1 : kEndedAsPromised);

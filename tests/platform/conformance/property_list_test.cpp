@@ -30,13 +30,13 @@ std::string plist(const std::string& inside) {
          inside + "</dict></plist>\n";
 }
 
-TEST(PropertyList, HoldsEveryKindOfValueForAnotherReaderAndBack) {
+TEST(PropertyList, ExchangesEveryKindOfValueWithAnotherImplementation) {
   const TemporaryFolder folder;
   ASSERT_EQ(runAndWait(PYTHON, {PEER, "write", folder / "xml", folder / "binary"}), 0);
   const auto read = loadDictionary(folder / "binary");
   const auto fromXML = loadDictionary(folder / "xml");
   ASSERT_TRUE(read && fromXML);
-  // The other writer's XML turns carriage returns into line feeds.
+  // Python's XML writer turns carriage returns into line feeds.
   EXPECT_EQ(fromXML->with("carriage return", "a\rb\r\n"), *read);
 
   ASSERT_TRUE(writeDictionaryAtomically(read->with("not for XML", "bell \a, broken \xFF\xC3"),
@@ -44,7 +44,7 @@ TEST(PropertyList, HoldsEveryKindOfValueForAnotherReaderAndBack) {
   EXPECT_EQ(runAndWait(PYTHON, {PEER, "check", folder / "written"}), 0);
   EXPECT_EQ(loadDictionary(folder / "written"), *read);
 
-  // Values that could be misread and yet written back unchanged.
+  // A reader could misread these values and still write them back unchanged.
   const Dictionary known{{"true", true},
                          {"least", std::numeric_limits<std::int64_t>::min()},
                          {"greatest", std::numeric_limits<std::uint64_t>::max()},
@@ -61,7 +61,7 @@ TEST(PropertyList, HoldsEveryKindOfValueForAnotherReaderAndBack) {
   }
 }
 
-TEST(PropertyList, IsNothingWhenTheFileHoldsSomethingElse) {
+TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
   const std::string whole = plist("<key>k</key><string>text</string>");
   const std::string cases[] = {"",
                                "plain text",
@@ -81,10 +81,10 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsSomethingElse) {
   EXPECT_EQ(loadDictionary(folder / "absent"), std::nullopt);
   EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
   EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
-  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "it has no writer";
+  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "the pipe has no writer";
 }
 
-TEST(PropertyList, MustKeepWithinTheLimits) {
+TEST(PropertyList, IsRefusedBeyondTheLimits) {
   const auto nested = [](std::size_t depth) {
     std::string text;
     for (std::size_t i = 0; i < depth; ++i)

@@ -4,8 +4,8 @@
 #include "tests/platform/conformance/front_end.h"
 #include "tests/recording/front_end.h"
 
-// The recording front end has a modal loop. Its timers and alerts wait for a test to play the clock
-// and the user, so what the suite asks of those does not apply.
+// Only the main-loop tests run on the recording front end. Its timers and alerts do nothing until a
+// test plays the clock and the user, so the other tests do not apply.
 
 namespace onramp::conformance {
 

@@ -40,7 +40,7 @@ TEST(UserLocale, IsTheOneThatCTestSets) {
   EXPECT_EQ(languages.front(), "zh_CN");
 }
 
-TEST(Folders, AreAbsoluteAndTheUsersOwnIsMade) {
+TEST(Folders, AreAbsoluteAndTheUsersIsCreated) {
   const std::string user = applicationSupportFolder(FolderDomain::kUser);
   EXPECT_TRUE(fs::is_directory(user)) << user;
   for (const std::string& folder : {user, applicationSupportFolder(FolderDomain::kLocal)}) {
@@ -61,7 +61,7 @@ TEST(ChildProcess, ReportsHowItEnded) {
   EXPECT_EQ(runAndWait(folder / "", {}), std::nullopt);
 }
 
-// The folder "bin" has an xdg-open, which ctest puts first on the path.
+// ctest puts the folder "bin" first on the path. Its xdg-open stands in for the desktop's opener.
 TEST(Workspace, OpensWithoutWaitingForTheOpener) {
   const std::string home = std::getenv("HOME");
   for (const char* const name : {"/go", "/opened"})
@@ -76,7 +76,7 @@ TEST(Workspace, OpensWithoutWaitingForTheOpener) {
   EXPECT_EQ(opened, "http://support.kestrel.example/?a=b&c=d");
 }
 
-TEST(Bundle, SpeaksTheUsersLanguageOrElseEnglish) {
+TEST(Bundle, UsesTheUsersLanguageOrElseEnglish) {
   struct Case {
     std::vector<std::string> offered;
     const char* expected;

@@ -1,7 +1,7 @@
 // Stands in for the part of Core Foundation that the macOS backends call, so that they compile and
-// run where the framework is missing. It shows what the backends do with objects, not what macOS
-// does. The sanitizers report an object that is released too often or never. Functions are lambdas,
-// which take a line each.
+// run where the framework is missing. Its tests show how the backends use objects, not how
+// macOS behaves. The sanitizers report an object that is released too often or never. The functions
+// are lambdas, which take only one line each.
 #pragma once
 
 #include <cstddef>
@@ -77,7 +77,8 @@ inline const auto CFStringCreateWithBytes = [](std::nullptr_t, const UInt8* byte
   std::string text(reinterpret_cast<const char*>(bytes), static_cast<std::size_t>(size));
   return onramp::isUTF8(text) ? new standin::Object(standin::kString, text) : nullptr;
 };
-// The real length counts UTF-16 units, which does not matter for a string that is read whole.
+// The real function counts UTF-16 units. The difference does not matter, because the backends read
+// strings whole.
 inline const auto CFStringGetLength = [](CFStringRef text) { return text->bytes.size(); };
 inline const auto CFRangeMake = [](int, std::size_t length) { return length; };
 using CFRange = std::size_t;

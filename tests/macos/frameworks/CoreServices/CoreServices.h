@@ -1,4 +1,4 @@
-// Stands in for CFNetwork's services, as CoreFoundation.h beside it says.
+// Stands in for CFNetwork's services. CoreFoundation/CoreFoundation.h explains the purpose.
 #pragma once
 
 #include <CoreFoundation/CoreFoundation.h>
@@ -16,8 +16,8 @@ struct CFNetServiceClientContext {
 
 namespace standin {
 
-/// What services and browsers have in common. Events reach the client only while the object is
-/// scheduled on the main loop in its common modes.
+/// The state that services and browsers share. `isScheduled` is true while the object is scheduled
+/// on the main loop in its common modes.
 template <typename Client>
 struct Scheduled : Object {
   Scheduled() : Object(kOther) {}

@@ -1,4 +1,4 @@
-// Stands in for the dynamic store, as CoreFoundation.h beside it says.
+// Stands in for the dynamic store. CoreFoundation/CoreFoundation.h explains the purpose.
 #pragma once
 
 #include <CoreFoundation/CoreFoundation.h>
@@ -13,7 +13,7 @@ struct SCDynamicStoreContext {
 
 namespace standin {
 
-/// A session, which answers every question with what it was asked for.
+/// A session. Its answer to a request holds the keys or patterns of that request.
 struct Store : Object {
   Store() : Object(kOther) { last = this; }
   ~Store() override {
