@@ -30,7 +30,7 @@ std::optional<Records::Record> recordIn(sd_bus_message* message) {
   return record;
 }
 
-// The daemon takes every other character as it stands.
+// Escapes dots and backslashes. The daemon accepts every other character without an escape.
 void appendLabel(std::string& name, std::string_view label) {
   for (const char c : label) {
     if (c == '.' || c == '\\') name += '\\';

@@ -7,7 +7,8 @@ namespace onramp::avahi {
 
 namespace {
 
-// Long enough for one repetition of a question whose first answer was lost.
+// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. In this
+// time the daemon can repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 
 }  // namespace
@@ -64,7 +65,7 @@ void Resolve::check() {
   for (const Records::Record& record : addresses->all()) {
     const auto address = socketAddress(record, port_);
     auto& list = resolution.addressing;
-    // The daemon reports it again for each interface and protocol.
+    // The daemon reports the same address once for each interface and protocol.
     if (address && std::find(list.begin(), list.end(), *address) == list.end()) {
       list.push_back(*address);
     }
@@ -72,8 +73,8 @@ void Resolve::check() {
   end(std::move(resolution));
 }
 
-// The IPv4 addresses, or the IPv6 ones when no IPv4 address has come in time. Null while neither is
-// known.
+// Returns the IPv4 addresses, or the IPv6 addresses when no IPv4 address has arrived in time.
+// Returns null while no usable address is known.
 const Records* Resolve::knownAddresses() {
   if (!ipv4_ || !ipv4_->isCacheExhausted()) return nullptr;
   if (!ipv4_->all().empty()) return &*ipv4_;
