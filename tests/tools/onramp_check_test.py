@@ -116,6 +116,10 @@ def both(*breakers):
     return lambda folder: [breaker(folder) for breaker in breakers]
 
 
+def rename_model(new):
+    return both(rename(DESCRIPTION, MODEL, new, "ContainedModel"), rename(MODELS, MODEL, new, "Model"))
+
+
 def packages(**keys):
     return put(COMMON, "PkgInfo", {"PkgLocation": "Packages"} |
                {key.removeprefix("v"): Path(PACKAGE).name for key in keys})
@@ -159,13 +163,10 @@ MISTAKES = [
     (take(DESCRIPTION, "ContainedModel", MODEL), "model-unoffered", "cannot be chosen"),
     (take(MODELS, "Model", MODEL, "KSCID"), "key-missing", "KSCID", "no connection at all"),
     (take(MODELS, "Model", MODEL, "Interfaces"), "key-missing", "Interfaces", "USB only"),
-    (both(*(put(path, key, "Kestrel100", {"KSCID": "x", "Interfaces":
-        {"USB": True, "WiredLAN": False, "WirelessLAN": True}})
-            for path, key in ((DESCRIPTION, "ContainedModel"), (MODELS, "Model")))),
-     "model-unannounceable", "without a blank"),
-    (both(rename(DESCRIPTION, MODEL, MODEL + " ", "ContainedModel"),
-          rename(MODELS, MODEL, MODEL + " ", "Model")), "model-blanks", "some really do"),
-    (both(*(put(path, key, MODEL.lower(), {"KSCID": "x", "Interfaces":
+    (rename_model("Kestrel100"), "model-unannounceable", "without a blank"),
+    (rename_model(MODEL + " "), "model-blanks", "some really do"),
+    (rename_model("kestrel Model 100"), "maker-capitals", "usb_MFG"),
+    (both(*(put(path, key, MODEL.capitalize(), {"KSCID": "x", "Interfaces":
         {"USB": True, "WiredLAN": False, "WirelessLAN": True}})
             for path, key in ((DESCRIPTION, "ContainedModel"), (MODELS, "Model")))),
      "model-twice", "capitals only"),
@@ -200,7 +201,7 @@ MISTAKES = [
     (replace(ENGLISH, "Wireless Network", "Wireless Network, " * 5), "text-wide", "450 points"),
     (replace(ENGLISH, '"Next";', '"";'), "text-empty", "button"),
     (replace(ENGLISH, '"Next";', '"Next"'), "strings-unreadable", '";" expected', "line 9"),
-    (take(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion"), "region-missing", "left to the system"),
+    (take(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion"), "region-missing", "usually English"),
     (put(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion", "fr"), "region-without-texts",
      "de, en, ja, ko, zh_CN"),
     (remove(f"{APPLICATION}/Resources/ko.lproj"), "language-not-in-application", "ko.lproj"),
@@ -214,7 +215,7 @@ MISTAKES = [
      "picture-size", "680 × 480", "192 × 192"),
     (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
     # Names in the network and in files.
-    (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", '"_pdl-datastream._tcp."'),
+    (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", "_pdl-datastream._tcp.", "add the dot"),
     (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
     (put(COMMON, "BonjourNetwork", "_http._tcp."), "service-unknown", "which model"),
     (take(COMMON, "BonjourNetwork"), "service-none", "no device is ever found"),
@@ -224,7 +225,7 @@ MISTAKES = [
     (put(COMMON, "VenderName", "Kestrel " * 40), "vendor-long", "at most"),
     (put(COMMON, "VenderName", "Kestrél"), "vendor-letters", "outside ASCII"),
     (put(COMMON, "VenderName", " "), "vendor-empty", "an empty name"),
-    (put(DESCRIPTION, "KSCSeriesCode", "K S"), "series-address", "letters, digits"),
+    (put(DESCRIPTION, "KSCSeriesCode", "K S"), "series-address", "opens nothing"),
 ]
 
 
@@ -280,7 +281,7 @@ class OnrampCheck(unittest.TestCase):
         self.assertEqual(1, result.returncode)
         line = result.stdout.splitlines()[0]
         self.assertTrue(line.startswith(f'{ENGLISH}:9: error: ";" expected'), line)
-        self.assertIn("Users get: ", line)
+        self.assertIn("Effect: ", line)
 
     def test_lists_every_text_that_the_sources_ask_for_and_no_other(self):
         sources = "".join(path.read_text() for room in ("app", "pages")

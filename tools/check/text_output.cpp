@@ -39,7 +39,7 @@ std::string sentences(const Finding& finding) {
   if (!finding.expected.empty()) text += "; expected: " + finding.expected;
   if (!finding.nearest.empty()) text += "; did you mean " + quoted(finding.nearest) + "?";
   if (finding.nearest.empty()) text += ".";
-  if (!finding.effect.empty()) text += " Users get: " + finding.effect + ".";
+  if (!finding.effect.empty()) text += " Effect: " + finding.effect + ".";
   if (!finding.remedy.empty()) text += " Remedy: " + finding.remedy + ".";
   return text;
 }

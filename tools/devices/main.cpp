@@ -42,7 +42,7 @@ void addBrowse(CLI::App& app, BrowseOptions& options) {
       ->type_name("N")
       ->check(CLI::Range(0.1, 86400.0));
   command->add_flag("-a,--all-types", options.allTypes,
-                    "Also look for service types that do not name maker and model");
+                    "Also look for every other service type that is announced");
   command->add_flag("--json", options.json, "Print JSON when the search has ended");
   command->add_flag("-v,--verbose", options.verbose,
                     "Show records, TXT data and the SNMP exchanges");
