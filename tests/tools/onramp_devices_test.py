@@ -49,6 +49,49 @@ DESCRIPTION = "".join(f'[[device]]\nname = "{name}"\n{entries}\n'
 DESCRIPTION += '[[device]]\nname = "two models"\nmaker = "Kestrel"\nmodel = "Model 200"\n'
 
 
+
+
+def tlv(tag, *parts):
+    return bytes((tag, sum(map(len, parts)))) + b"".join(parts)
+
+
+def reply(value=b"\x02\x01\x02", status=0, name=b"\x06\x0f+\x06\x01\x04\x01\xa1\x12\x02\x04\x04\x89\x58\x01\x02\x00",
+          change=0, bindings=None, seconds=0):
+    """Returns a function from a request to the reply with these parts. `change` is added to the request's number."""
+    def answer(request):
+        time.sleep(seconds)
+        at = request.index(b"corridor") + 10
+        number = request[at:at + 1 + request[at + 1]] + bytes((request[at + 1 + request[at + 1]] ^ change,))
+        pdu = tlv(0xa2, number, tlv(2, bytes((status,))), tlv(2, bytes((status and 1,))),
+                  tlv(0x30, tlv(0x30, name, value)) if bindings is None else bindings)
+        return tlv(0x30, b"\x02\x01\x00\x04\x08corridor", pdu)
+    return answer
+
+
+# The reply, or None for a closed port → the outcome, its value, and what snmpget prints.
+REPLIES = [
+    (reply(), "value", 2, "INTEGER: 2"),
+    (reply(tlv(2, b"\x01")), "value", 1, "INTEGER: 1"),
+    (reply(tlv(2, b"\xff")), "value", -1, "INTEGER: -1"),
+    (reply(tlv(4, b"two")), "other-type", None, 'STRING: "two"'),
+    (reply(tlv(5)), "other-type", None, "NULL"),
+    (reply(tlv(0x40, b"\x7f\0\0\1")), "other-type", None, "IpAddress: 127.0.0.1"),
+    (reply(tlv(0x41, b"\x02")), "other-type", None, "Counter32: 2"),
+    (reply(tlv(0x42, b"\x02")), "other-type", None, "Gauge32: 2"),
+    (reply(tlv(0x43, b"\x02")), "other-type", None, "Timeticks: "),
+    (reply(tlv(5), status=2), "error", None, "noSuchName"),
+    (reply(tlv(5), status=5), "error", None, "genError"),
+    (reply(name=b"\x06\x0e+\x06\x01\x04\x01\xa1\x12\x02\x04\x04\x89\x58\x01\x02"), "value", 2, "INTEGER: 2"),
+    (reply(bindings=tlv(0x30)), "other-type", None, ""),
+    (reply(change=1), "other-request", None, "Timeout"),
+    (reply(seconds=2.5), "late", None, "Timeout"),
+    (lambda request: request[:-6].replace(b"\xa0", b"\xa2") + b"?", "unreadable", None, "Timeout"),
+    (lambda request: b"", "unreadable", None, "Timeout"),
+    (lambda request: time.sleep(60), "none", None, "Timeout"),
+    (None, "refused", None, "Timeout"),
+]
+
+
 def run(*command, **options):
     return subprocess.run(command, capture_output=True, text=True, timeout=120, **options)
 
@@ -70,7 +113,7 @@ class Everybody(unittest.TestCase):
 
     @classmethod
     def setUpClass(cls):
-        serve("127.0.9.3", shortened, seconds=2.5)
+        serve("127.0.9.3", reply(seconds=2.5))
 
     def test_every_device_gets_its_verdict(self):
         ghost = start("avahi-publish-service", "-H", "nowhere.local", "unresolved",
@@ -104,38 +147,23 @@ class Everybody(unittest.TestCase):
                     self.assertEqual(devices["listed"]["verdict"]["id"], "other-model")
 
     def test_asks_as_net_snmp_does(self):
-        known = by_name(run(*browse("-s", "4")).stdout)
-        asked = {name: device["record"]["IP address list"][0] for name, device in known.items()
-                 if "answer" in device and name != "late"}
-        ours = {name: start(PROGRAM, "ask", "--json", address) for name, address in asked.items()}
-        theirs = {name: start("snmpget", "-v1", "-Ov", "-r0", "-t5", "-c", "corridor", address, OBJECT)
-                  for name, address in asked.items()}
-        for name in asked:
-            answer = json.loads(ours[name].communicate()[0])
-            text = "".join(theirs[name].communicate())
-            with self.subTest(name):
-                last = answer["answer"]["exchanges"][-1]
-                value = re.match(r"INTEGER: (-?\d+)", text)
-                if value:
-                    self.assertEqual(last["value"], int(value[1]))
-                    self.assertEqual(answer["status"], 0 if last["value"] == 2 else 1)
-                else:
-                    self.assertIn(last["outcome"], {"noSuchName": ("error",), "STRING": ("other-type",),
-                                                    "Timeout": ("none", "refused")}[
-                        re.search("noSuchName|STRING|Timeout", text)[0]])
-                    self.assertEqual(answer["status"], 2)
-
-    def test_shows_what_a_malformed_reply_does(self):
-        answers = {"127.0.9.1": lambda request: request[:-6].replace(b"\xa0", b"\xa2") + b"?",
-                   "127.0.9.2": shortened}
-        for address, reply in answers.items():
-            serve(address, reply)
-        result = run(PROGRAM, "ask", "-v", "127.0.9.1")
-        self.assertEqual(result.returncode, 2)
+        asked = []
+        for number, (answer, *expected) in enumerate(REPLIES):
+            address = f"127.0.8.{number + 1}"
+            if answer:
+                serve(address, answer)
+            asked.append((start(PROGRAM, "ask", "--json", address), start(
+                "snmpget", "-v1", "-Ov", "-r0", "-t2", "-c", "corridor", address, OBJECT), *expected))
+        for number, (ours, theirs, outcome, value, text) in enumerate(asked):
+            with self.subTest(number=number, outcome=outcome, text=text):
+                answer = json.loads(ours.communicate()[0])
+                exchange = answer["answer"]["exchanges"][0]
+                self.assertEqual((exchange["outcome"], exchange["value"]), (outcome, value))
+                self.assertEqual(answer["status"], {2: 0, None: 2}.get(value, 1))
+                self.assertEqual(exchange["changedQuestion"], number == 11)
+                self.assertIn(text, "".join(theirs.communicate()))
+        result = run(PROGRAM, "ask", "-v", "127.0.8.16")
         self.assertRegex(result.stdout, r"unreadable after .*(?s:.*)no element: ")
-        result = run(PROGRAM, "ask", "--json", "127.0.9.2")
-        self.assertEqual(result.returncode, 0)
-        self.assertTrue(json.loads(result.stdout)["answer"]["exchanges"][0]["changedQuestion"])
 
     def test_an_interruption_shows_what_was_found(self):
         process = start(*browse("-s", "60"))
@@ -173,23 +201,15 @@ class Nobody(unittest.TestCase):
         self.assertEqual(self.problems(), ["no-daemon"])
 
 
-def shortened(request):
-    """Returns a reply of the same length: 2, under the requested name without its last arc."""
-    reply = request.replace(b"\xa0", b"\xa2", 1)
-    name = reply.index(b"\x06\x0f")
-    return reply[:name] + b"\x06\x0e" + reply[name + 2:name + 16] + b"\x02\x01\x02"
-
-
-def serve(address, reply, seconds=0):
+def serve(address, answer):
     agent = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
     agent.bind((address, 161))
 
-    def answer():
+    def respond():
         while True:
             request, sender = agent.recvfrom(1500)
-            time.sleep(seconds)
-            agent.sendto(reply(request), sender)
-    threading.Thread(target=answer, daemon=True).start()
+            agent.sendto(answer(request), sender)
+    threading.Thread(target=respond, daemon=True).start()
 
 
 class CommandLine(unittest.TestCase):

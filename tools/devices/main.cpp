@@ -30,7 +30,7 @@ const std::string kHostsExamples = R"(
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
   CLI::App* const command =
-      app.add_subcommand("browse", "Show announced devices and why each is listed or not");
+      app.add_subcommand("browse", "Show devices, and why each is listed or not");
   command->footer("Examples:" + kBrowseExamples);
   command->add_option("-m,--medium", options.medium, "The folder that the application lies in")
       ->required()
