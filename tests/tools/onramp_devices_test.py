@@ -8,7 +8,7 @@ import plistlib
 import re
 import shutil
 import signal
-import socket
+import socketserver
 import subprocess
 import sys
 import tempfile
@@ -31,7 +31,6 @@ DEVICES = {
     "wrong-type": MAKER_AND_MODEL + 'activeif = "text"',
     "refused": MAKER_AND_MODEL + 'activeif = "closed"',
     "no-answer": MAKER_AND_MODEL + 'activeif = "silent"',
-    # serve() answers at this address
     "late": MAKER_AND_MODEL + 'activeif = "closed"\naddresses = ["127.0.9.3"]',
     "other-subnet": MAKER_AND_MODEL + 'activeif = "silent"\naddresses = ["203.0.113.9"]',
     "ipv6-only": MAKER_AND_MODEL + 'addresses = ["fd00::9"]',
@@ -46,7 +45,8 @@ DEVICES = {
 }
 DESCRIPTION = "".join(f'[[device]]\nname = "{name}"\n{entries}\n'
                       for name, entries in DEVICES.items())
-DESCRIPTION += '[[device]]\nname = "two models"\nmaker = "Kestrel"\nmodel = "Model 200"\n'
+DESCRIPTION += '[[device]]\nname = "two models"\nmaker = "Kestrel"\nmodel = "Model 200"\n' \
+               '[[device]]\nname = "odd"\ntype = "_odd._tcp"\n'
 
 
 
@@ -55,35 +55,29 @@ def tlv(tag, *parts):
     return bytes((tag, sum(map(len, parts)))) + b"".join(parts)
 
 
-def reply(value=b"\x02\x01\x02", status=0, name=b"\x06\x0f+\x06\x01\x04\x01\xa1\x12\x02\x04\x04\x89\x58\x01\x02\x00",
-          change=0, bindings=None, seconds=0):
-    """Returns a function from a request to the reply with these parts. `change` is added to the request's number."""
+def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
+    """Returns a function from a request to the reply with these parts. Changes the request's number by `number`."""
     def answer(request):
         time.sleep(seconds)
-        at = request.index(b"corridor") + 10
-        number = request[at:at + 1 + request[at + 1]] + bytes((request[at + 1 + request[at + 1]] ^ change,))
-        pdu = tlv(0xa2, number, tlv(2, bytes((status,))), tlv(2, bytes((status and 1,))),
-                  tlv(0x30, tlv(0x30, name, value)) if bindings is None else bindings)
+        at = request.index(b"corridor") + 12
+        end = at + request[at - 1]
+        bound = tlv(0x30, tlv(6, request[-17:arcs - 16]), value) if binding else b""
+        pdu = tlv(0xa2, tlv(2, request[at:end - 1], bytes((request[end - 1] ^ number,))),
+                  tlv(2, bytes((status,))), tlv(2, bytes((status and 1,))), tlv(0x30, bound))
         return tlv(0x30, b"\x02\x01\x00\x04\x08corridor", pdu)
     return answer
 
 
-# The reply, or None for a closed port → the outcome, its value, and what snmpget prints.
+# The reply, or nothing for a closed port → the outcome, the value, and what snmpget prints.
 REPLIES = [
-    (reply(), "value", 2, "INTEGER: 2"),
-    (reply(tlv(2, b"\x01")), "value", 1, "INTEGER: 1"),
-    (reply(tlv(2, b"\xff")), "value", -1, "INTEGER: -1"),
-    (reply(tlv(4, b"two")), "other-type", None, 'STRING: "two"'),
-    (reply(tlv(5)), "other-type", None, "NULL"),
-    (reply(tlv(0x40, b"\x7f\0\0\1")), "other-type", None, "IpAddress: 127.0.0.1"),
-    (reply(tlv(0x41, b"\x02")), "other-type", None, "Counter32: 2"),
-    (reply(tlv(0x42, b"\x02")), "other-type", None, "Gauge32: 2"),
-    (reply(tlv(0x43, b"\x02")), "other-type", None, "Timeticks: "),
-    (reply(tlv(5), status=2), "error", None, "noSuchName"),
-    (reply(tlv(5), status=5), "error", None, "genError"),
-    (reply(name=b"\x06\x0e+\x06\x01\x04\x01\xa1\x12\x02\x04\x04\x89\x58\x01\x02"), "value", 2, "INTEGER: 2"),
-    (reply(bindings=tlv(0x30)), "other-type", None, ""),
-    (reply(change=1), "other-request", None, "Timeout"),
+    *((reply(tlv(2, bytes((n & 255,)))), "value", n, f"INTEGER: {n}") for n in (2, 1, -1)),
+    *((reply(value), "other-type", None, text) for value, text in (
+        (tlv(4, b"two"), 'STRING: "two"'), (tlv(5), "NULL"), (tlv(0x40, b"\x7f\0\0\1"), "IpAddress: 127.0.0.1"),
+        (tlv(0x41, b"\2"), "Counter32: 2"), (tlv(0x42, b"\2"), "Gauge32: 2"), (tlv(0x43, b"\2"), "Timeticks: "))),
+    *((reply(tlv(5), status), "error", None, text) for status, text in ((2, "noSuchName"), (5, "genError"))),
+    (reply(arcs=13), "value", 2, "INTEGER: 2"),
+    (reply(binding=False), "other-type", None, ""),
+    (reply(number=1), "other-request", None, "Timeout"),
     (reply(seconds=2.5), "late", None, "Timeout"),
     (lambda request: request[:-6].replace(b"\xa0", b"\xa2") + b"?", "unreadable", None, "Timeout"),
     (lambda request: b"", "unreadable", None, "Timeout"),
@@ -120,11 +114,11 @@ class Everybody(unittest.TestCase):
                       "_pdl-datastream._tcp", "9100")
         self.addCleanup(ghost.communicate)
         self.addCleanup(ghost.terminate)
-        result = run(*browse())
+        result = run(*browse("--all-types"))
         devices = by_name(result.stdout)
         self.assertEqual({name: device["verdict"]["id"] for name, device in devices.items()},
                          {name: name for name in DEVICES} |
-                         {"unresolved": "unresolved", "two models": "listed"}, result.stderr)
+                         {"unresolved": "unresolved", "two models": "listed", "odd": "other-type"}, result.stderr)
         self.assertEqual({one["address"] for one in devices["listed"]["answer"]["exchanges"]},
                          set(devices["listed"]["record"]["IP address list"]))
         self.assertIn("lo IPv4", devices["listed"]["sightings"])
@@ -181,49 +175,36 @@ class Everybody(unittest.TestCase):
 
 
 class Nobody(unittest.TestCase):
-    """Tests on a network without devices."""
-
     def problems(self):
         result = run(*browse("-s", "1"))
         return [problem["id"] for problem in json.loads(result.stdout)["network"]]
 
     def test_says_what_is_wrong_with_the_network(self):
-        ip = lambda *words: subprocess.run(("ip",) + words, check=True)
         self.assertEqual(self.problems(), ["nothing-announced"])
-        ip("route", "del", "224.0.0.0/4", "dev", "lo")
+        subprocess.run("ip route del 224.0.0.0/4 dev lo", shell=True, check=True)
         self.assertEqual(self.problems(), ["no-network"])
-        ip("link", "add", "here", "type", "veth", "peer", "name", "there")
-        ip("address", "add", "192.0.2.7/24", "dev", "here")
-        for interface in "here", "there":
-            ip("link", "set", interface, "up")
+        subprocess.run("ip link add here type veth peer name there && ip address add 192.0.2.7/24 dev here"
+                       " && ip link set here up && ip link set there up", shell=True, check=True)
         self.assertEqual(self.problems(), ["multicast-blocked"])
         subprocess.run([TOOL, "ctl", "stop-daemon"], check=True)
         self.assertEqual(self.problems(), ["no-daemon"])
 
 
 def serve(address, answer):
-    agent = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
-    agent.bind((address, 161))
-
-    def respond():
-        while True:
-            request, sender = agent.recvfrom(1500)
-            agent.sendto(answer(request), sender)
-    threading.Thread(target=respond, daemon=True).start()
+    class Handler(socketserver.BaseRequestHandler):
+        def handle(self):
+            self.request[1].sendto(answer(self.request[0]), self.client_address)
+    threading.Thread(target=socketserver.UDPServer((address, 161), Handler).serve_forever, daemon=True).start()
 
 
 class CommandLine(unittest.TestCase):
     def test_refuses_bad_arguments_with_a_remedy(self):
-        with tempfile.TemporaryDirectory() as empty:
-            for arguments, message in ((["browse"], "--medium is required"),
-                                       (["browse", "-m", empty], "holds no application"),
-                                       (["ask"], "ADDRESS is required"),
-                                       (["ask", "no such host"], "neither an IPv4 address"),
-                                       (["serch"], "--help")):
-                with self.subTest(arguments):
-                    result = run(PROGRAM, *arguments)
-                    self.assertEqual(result.returncode, 2)
-                    self.assertIn(message, result.stderr)
+        for words, message in (("browse", "--medium is required"), ("browse -m /proc", "holds no application"),
+                               ("ask", "ADDRESS is required"), ("ask no-such", "neither an IPv4 address"),
+                               ("serch", "--help")):
+            with self.subTest(words):
+                result = run(PROGRAM, *words.split())
+                self.assertEqual((result.returncode, message in result.stderr), (2, True), result.stderr)
 
 
 class Networks(unittest.TestCase):
