@@ -63,7 +63,7 @@ TEST_F(BrowserTest, AServiceIsForwardedResolvedAndForgotten) {
   };
   network.resolves(onOne, {});
   recorder->also = [] {};
-  EXPECT_THAT(network.log, testing::Contains("browser search \"\" _ipp._tcp."));
+  EXPECT_EQ(network.domain, "") << "all domains are searched";
   network.gone(onOne);
   EXPECT_FALSE(contains());
   EXPECT_THAT(recorder->events,
@@ -128,11 +128,10 @@ TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
   network.gone(onOne);
   EXPECT_THAT(scannerRecorder->events,
               ElementsAre(Event{"add", onOne}, Event{"resolved", onOne}, Event{"remove", nullptr}));
-  EXPECT_EQ(recorder->events.back(), (Event{"remove", onOne}));
-
+  recorder->events.clear();
   browser->addKSNetService({std::string(kAddNotification), nullptr, {}});
   browser->resolvedKSNetService({std::string(kResolvedNotification), nullptr, {}});
-  EXPECT_EQ(recorder->events.back(), (Event{"resolved", nullptr}));
+  EXPECT_THAT(recorder->events, ElementsAre(Event{"add", nullptr}, Event{"resolved", nullptr}));
 }
 
 TEST_F(BrowserTest, StoppingForgetsEverythingWithoutEventsAndARestartBeginsEmpty) {
@@ -152,16 +151,6 @@ TEST_F(BrowserTest, StoppingForgetsEverythingWithoutEventsAndARestartBeginsEmpty
   network.found(onOne);
   EXPECT_THAT(recorder->events,
               ElementsAre(Event{"add", onOne}, Event{"add", onOne}, Event{"add", onOne}));
-}
-
-TEST_F(BrowserTest, ABrowseThatCannotStartLeavesAnIdleBrowser) {
-  network.searchesStart = false;
-  browser->startBrowsing();
-  EXPECT_THAT(network.browsers, IsEmpty());
-  const auto typeless = KSBonjour::initWithType(std::nullopt);
-  network.log.clear();
-  typeless->startBrowsing();
-  EXPECT_THAT(network.log, IsEmpty());
 }
 
 TEST_F(BrowserTest, AnObserverMayDestroyTheBrowser) {

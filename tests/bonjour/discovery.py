@@ -78,9 +78,6 @@ class Search(Process):
         return self.wait(lambda _: len(self.events(word, name)) >= count
                          and self.events(word, name)[-1])
 
-    def processor_seconds(self):
-        return float(self.events("cpu")[0][2])
-
 
 class Avahi:
     """This host's Avahi daemon, which tests kill, freeze and restart."""

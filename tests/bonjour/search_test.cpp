@@ -48,10 +48,9 @@ class SearchTest : public ::testing::Test {
   std::shared_ptr<KSBonjourSearch> search = KSBonjourSearch::init();
   std::shared_ptr<DeviceRecorder> recorder = std::make_shared<DeviceRecorder>();
   NetServiceRef onOne = Network::service("Kestrel", "_ipp._tcp.");
-  NetServiceRef onTwo = Network::service("Kestrel", "_ipp._tcp.");
 };
 
-TEST_F(SearchTest, ADeviceIsReportedOnceItIsResolved) {
+TEST_F(SearchTest, ADeviceIsReportedWhenItIsResolvedAndWhenItLeaves) {
   network.found(onOne);
   EXPECT_THAT(recorder->events, IsEmpty());
   network.resolves(onOne, {ipv4Address(192, 0, 2, 7)},
@@ -65,16 +64,9 @@ TEST_F(SearchTest, ADeviceIsReportedOnceItIsResolved) {
                                         {"location", "Lobby"},
                                         {"device URI", "dnssd://Kestrel._ipp._tcp.local."},
                                         {"IP address list", Array{"192.0.2.7"}}}));
-}
-
-TEST_F(SearchTest, ADeviceLeavesWithItsLastInterface) {
-  network.found(onOne);
-  network.found(onTwo);
-  network.resolves(onTwo, {});
   network.gone(onOne);
-  network.gone(onTwo);
-  network.gone(onTwo);
-  EXPECT_THAT(recorder->events, ElementsAre("update Kestrel", "update Kestrel", "remove Kestrel"));
+  network.gone(onOne);
+  EXPECT_THAT(recorder->events, ElementsAre("update Kestrel", "remove Kestrel"));
   EXPECT_EQ(*recorder->last.array(KSDevice::kBonjourServiceType), Array());
 }
 

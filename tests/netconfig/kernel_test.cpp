@@ -1,7 +1,6 @@
 // Runs as root in a new network namespace; see tests/in_namespace.
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 #include <algorithm>
 #include <cstdlib>

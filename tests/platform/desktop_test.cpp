@@ -22,13 +22,12 @@ namespace {
 using Environment = std::vector<std::pair<const char*, const char*>>;
 
 TEST(Desktop, TakesLanguageAndCountryFromTheLocaleVariables) {
-  struct Case {
+  const struct {
     Environment environment;
     const char* language;
     const char* country;
     std::vector<std::string> preferred;
-  };
-  const Case cases[] = {
+  } cases[] = {
       {{{"LANG", "ja_JP.UTF-8"}}, "ja", "JP", {"ja_JP"}},
       {{{"LANG", "ja_JP"}, {"LC_MESSAGES", "de_DE@euro"}}, "de", "DE", {"de_DE"}},
       {{{"LANG", "ja_JP"}, {"LC_MESSAGES", "de_DE"}, {"LC_ALL", "fr_CA"}}, "fr", "CA", {"fr_CA"}},
@@ -41,7 +40,7 @@ TEST(Desktop, TakesLanguageAndCountryFromTheLocaleVariables) {
       {{{"LANG", "de"}}, "de", "", {"de"}},
       {{{"LANG", "nonsense"}}, "en", "", {"en"}},
       {{{"LANG", ""}}, "en", "", {"en"}}};
-  for (const Case& c : cases) {
+  for (const auto& c : cases) {
     recording::MediumFolder medium;
     for (const auto& [name, value] : c.environment)
       medium.setEnvironment(name, value);

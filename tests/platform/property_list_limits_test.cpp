@@ -1,11 +1,5 @@
-#include <gtest/gtest.h>
-#include <sys/resource.h>
-#include <sys/wait.h>
-#include <unistd.h>
-
-#include <functional>
-
 #include "platform/property_list.h"
+#include "tests/platform/in_process.h"
 #include "tests/recording/temporary_folder.h"
 
 namespace onramp {
@@ -67,22 +61,6 @@ std::string arrays(std::size_t depth, std::size_t times) {
   });
 }
 
-struct Outcome {
-  bool read;
-  long peakKilobytes;
-};
-
-// Loads the file in a separate process, so that the memory that loading takes can be measured.
-Outcome load(const std::string& path) {
-  const pid_t loader = fork();
-  if (loader == 0) _exit(loadDictionary(path) ? 0 : 1);
-  int status = 0;
-  rusage usage{};
-  EXPECT_EQ(wait4(loader, &status, 0, &usage), loader);
-  EXPECT_TRUE(WIFEXITED(status)) << "the loading process crashed";
-  return {status == 0, usage.ru_maxrss};
-}
-
 TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
   const TemporaryFolder folder;
   const std::pair<const char*, std::string> cases[] = {
@@ -112,11 +90,17 @@ TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
                       })},
       {"a list that holds itself",
        dictionaryOver(2, [](std::size_t i) { return "\xA1" + reference(5 - i); })}};
-  const long usual = load(folder.holding("usual", plistWith("<true/>"))).peakKilobytes;
+  // The file is loaded in another process, so that the memory that loading takes can be measured.
+  rusage usage{};
+  const auto load = [&](const std::string& bytes) {
+    const std::string path = folder.holding("list", bytes);
+    return inProcess([&] { return loadDictionary(path).has_value(); }, &usage);
+  };
+  EXPECT_EQ(load(plistWith("<true/>")), 0);
+  const long usual = usage.ru_maxrss;
   for (const auto& [name, bytes] : cases) {
-    const Outcome outcome = load(folder.holding("list", bytes));
-    EXPECT_FALSE(outcome.read) << name;
-    EXPECT_LT(outcome.peakKilobytes - usual, 32 * 1024) << name;
+    EXPECT_EQ(load(bytes), W_EXITCODE(1, 0)) << name;
+    EXPECT_LT(usage.ru_maxrss - usual, 32 * 1024) << name;
   }
 }
 

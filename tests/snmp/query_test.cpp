@@ -3,7 +3,6 @@
 #include "snmp/query.h"
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 #include <algorithm>
 
@@ -255,23 +254,22 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
 }
 
 TEST_F(GetSet, SendTheSlotsThatTheIndexesNameIfTheyFitTheStorage) {
-  for (const std::uint16_t length : std::vector<std::uint16_t>{1, 16, 17, 500, 700}) {
+  for (const std::uint16_t length : std::vector<std::uint16_t>{1, 17, 700}) {
     give(0, 700, length);
     give(1, 700, length);
     ASSERT_EQ(set({1, 0}), SNMP_OK) << length;
     Message request(2);
     ASSERT_EQ(request.decode(sent), SNMP_OK);
-    EXPECT_EQ(request.message.pdu_type, kPduSet);
-    EXPECT_EQ(
-        std::string(request.strings.begin(), request.strings.begin() + std::ptrdiff_t{2} * length),
-        std::string(length, 'y') + std::string(length, 'x'));
+    const auto both = request.strings.begin();
+    EXPECT_EQ(std::string(both, both + std::ptrdiff_t{2} * length),
+              std::string(length, 'y') + std::string(length, 'x'));
     EXPECT_EQ(texts[0].front(), 'y') << "the reply's first value goes to the first slot";
   }
   agents.asked.clear();
-  give(0, 1500, 1485);
+  give(0, 60000, 1485);
   EXPECT_EQ(set({0, 1}), SNMP_ERR_CODEC);
   EXPECT_EQ(set({3}), SNMP_ERR_CODEC);
-  give(0, 60000, 60000);
+  octets[0].length = 60000;
   EXPECT_EQ(set({0}), SNMP_ERR_CODEC);
   EXPECT_TRUE(agents.asked.empty());
 
@@ -287,16 +285,16 @@ TEST_F(GetSet, ReturnTheErrorStatusAndCountRequestsFromTwoHundred) {
   EXPECT_EQ(kFirstExtendedIdentifier, 200);
   const std::int64_t next = snmp_request_counter_ext;
   reply = replyWith("", 2);
-  EXPECT_EQ(get(3, kPduResponse), 2U);
-  EXPECT_EQ(sent.at(kPduTagAt), 0xA0);
-  EXPECT_EQ(get(3, kPduGetNext), 2U);
-  EXPECT_EQ(sent.at(kPduTagAt), 0xA1);
+  for (const auto& [kind, tag] : {std::pair(kPduResponse, 0xA0), std::pair(kPduGetNext, 0xA1)}) {
+    EXPECT_EQ(get(3, kind), 2U);
+    EXPECT_EQ(sent.at(kPduTagAt), tag);
+  }
   EXPECT_EQ(set({0}), 2U);
+  EXPECT_EQ(sent.at(kPduTagAt), 0xA3);
   EXPECT_EQ(snmp_request_counter_ext, next + 3);
 
   reply = replyWith("30 00 06 01 2B 05 00");
-  slots[0].type = kTagNull;
-  slots[0].int_value = m.varbinds[0].int_value = 9;
+  slots[0] = {.type = kTagNull, .int_value = 9};
   EXPECT_EQ(get(1), SNMP_OK);
   EXPECT_EQ(slots[0].int_value, 0) << "the old value is gone";
 }
