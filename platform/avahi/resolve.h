@@ -34,17 +34,19 @@ class Resolve {
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
   /// Whether the daemon says that no service can have that name.
-  [[nodiscard]] bool isRefused() const { return server_ && server_->isRefused(); }
+  [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:
   void begin();
-  void ask(std::optional<Records>& records, const std::string& name, RecordType type);
+  void happened(Query::Event event, sd_bus_message* message);
+  void ask(std::optional<Records>& addresses, RecordType type);
+  void checkSoon();
   void check();
   [[nodiscard]] const Records* knownAddresses();
   void end(std::optional<Resolution> resolution);
 
   Daemon& daemon_;
-  std::string name_;
+  Instance name_;
   Report report_;
   Timer check_;  ///< due after a change, when all messages are read
   Timer timeUp_;
@@ -52,13 +54,12 @@ class Resolve {
   bool isGraceOver_ = false;
   unsigned losses_ = 0;  ///< of the daemon, when the resolve began
   // A daemon allows each client a limited number of questions, so each ends with its answer.
-  std::optional<Records> server_;
-  std::optional<Records> txt_;
+  std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;
-  std::string host_;
+  std::string host_;  ///< empty until the service is known
   std::uint16_t port_ = 0;
-  std::optional<Data> txtData_;
+  Data txt_;
 };
 
 }  // namespace onramp::avahi
