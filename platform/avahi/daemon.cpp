@@ -19,10 +19,12 @@ constexpr const char* kOwnerChanges =
     "type='signal',sender='org.freedesktop.DBus',interface='org.freedesktop.DBus',"
     "member='NameOwnerChanged',arg0='org.freedesktop.Avahi'";
 
-// What fails at once is not tried again at once, or it would keep the processor busy.
+// The pause before a retry. Without it, an operation that fails immediately would keep the
+// processor busy.
 constexpr std::chrono::milliseconds kRetryPause{1000};
 
-// A daemon that hangs answers when it goes on. When the daemon dies, the bus answers for it.
+// Calls need no time limit. A daemon that hangs answers when it resumes, and the bus answers for a
+// daemon that has died.
 constexpr std::uint64_t kForever = std::numeric_limits<std::uint64_t>::max();
 
 }  // namespace
@@ -101,7 +103,8 @@ bool Daemon::watchDaemon() {
          });
 }
 
-// Systems that start the daemon on demand do it now. The bus reports its arrival.
+// Starts the daemon on systems that start it on demand. The bus reports when the daemon has
+// arrived.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");
   if (request && sd_bus_message_append(request.get(), "su", kAvahi, 0U) >= 0) {
@@ -142,7 +145,7 @@ void Daemon::arrived() {
   }
 }
 
-// A query's handler may remove other queries.
+// A query's handler may remove other queries from `queries_`, so this loops over a copy.
 void Daemon::lost() {
   isPresent_ = false;
   ++losses_;
@@ -165,7 +168,8 @@ Message Daemon::newCall(const char* method) const {
   return Message(message);
 }
 
-// The bus owns `reply` and destroys it after the answer, or when it is destroyed itself.
+// The connection to the bus takes ownership of `reply`. It destroys `reply` after the answer has
+// arrived, or when the connection itself is destroyed.
 bool Daemon::call(sd_bus_message* message, Reply reply) {
   const auto answered = [](sd_bus_message* answer, void* receiver, sd_bus_error*) {
     (*static_cast<Reply*>(receiver))(answer);

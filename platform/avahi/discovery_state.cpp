@@ -13,7 +13,7 @@ namespace onramp {
 
 namespace {
 
-constexpr int kIPv6Protocol = 1;  // the daemon's number
+constexpr int kIPv6Protocol = 1;  // the daemon's number for IPv6
 
 std::function<void(const ServiceSighting&)>& sightingWatch() {
   static std::function<void(const ServiceSighting&)> watch;
@@ -56,7 +56,7 @@ std::optional<std::string> discoveryProblem() {
   sd_bus_creds* owner = nullptr;
   const int status = sd_bus_get_name_creds(bus.get(), "org.freedesktop.Avahi", 0, &owner);
   sd_bus_creds_unref(owner);
-  if (status < 0) return "avahi-daemon does not run";
+  if (status < 0) return "avahi-daemon is not running";
   return std::nullopt;
 }
 

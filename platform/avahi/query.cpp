@@ -23,11 +23,11 @@ void Query::ask() {
   if (asked_ || isRefused_) return;
   const Message call = daemon_.newCall((std::string(kind_) + "Prepare").c_str());
   if (call && arguments_(call.get()) < 0) {
-    isRefused_ = true;  // Only a text that is not UTF-8 cannot be appended.
+    isRefused_ = true;  // Appending fails only for a text that is not UTF-8.
     return;
   }
-  // The answer may come when this query is gone or has been sent again. It then names an object
-  // that nobody uses.
+  // The answer may arrive after this query has been destroyed or sent again. The object that it
+  // names is then unused and is freed.
   asked_ = std::make_shared<char>();
   const auto answer = [this, &daemon = daemon_, interface = interface(),
                        asked = std::weak_ptr(asked_)](sd_bus_message* reply) {

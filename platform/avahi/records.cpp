@@ -2,9 +2,7 @@
 
 #include <algorithm>
 #include <cstring>
-#include <string_view>
 #include <utility>
-
 
 namespace onramp::avahi {
 

@@ -7,7 +7,8 @@ namespace onramp::avahi {
 
 namespace {
 
-// Long enough for one repetition of a question whose first answer was lost.
+// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. In this
+// time the daemon can repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 
 // A service resolver reports only one address, and Records reports all of them.
@@ -20,7 +21,8 @@ struct Server {
 };
 
 // Reads the arguments of a service resolver's Found signal. The strings of the TXT record become
-// the record's data again (RFC 1035 section 3.3.14). A record without strings has one empty string.
+// the record's data again (RFC 1035 section 3.3.14): the signal has them in reverse order. A record
+// without strings is written as one empty string.
 std::optional<Server> serverIn(sd_bus_message* message) {
   Server server;
   const char* host = nullptr;
@@ -35,8 +37,8 @@ std::optional<Server> serverIn(sd_bus_message* message) {
   std::size_t size = 0;
   while (sd_bus_message_read_array(message, 'y', &text, &size) > 0) {
     const auto* const bytes = static_cast<const std::byte*>(text);
-    server.txt.push_back(static_cast<std::byte>(size));
-    server.txt.insert(server.txt.end(), bytes, bytes + size);
+    server.txt.insert(server.txt.begin(), bytes, bytes + size);
+    server.txt.insert(server.txt.begin(), static_cast<std::byte>(size));
   }
   if (server.txt.empty()) server.txt.push_back(std::byte{0});
   return server.host.empty() ? std::nullopt : std::optional(std::move(server));
@@ -108,7 +110,7 @@ void Resolve::check() {
   for (const Records::Record& record : addresses->all()) {
     const auto address = socketAddress(record, port_);
     auto& list = resolution.addressing;
-    // The daemon reports it again for each interface and protocol.
+    // The daemon reports the same address once for each interface and protocol.
     if (address && std::find(list.begin(), list.end(), *address) == list.end()) {
       list.push_back(*address);
     }
@@ -116,8 +118,8 @@ void Resolve::check() {
   end(std::move(resolution));
 }
 
-// The IPv4 addresses, or the IPv6 ones when no IPv4 address has come in time. Null while neither is
-// known.
+// Returns the IPv4 addresses, or the IPv6 addresses when no IPv4 address has arrived in time.
+// Returns null while no usable address is known.
 const Records* Resolve::knownAddresses() {
   if (!ipv4_ || !ipv4_->isCacheExhausted()) return nullptr;
   if (!ipv4_->all().empty()) return &*ipv4_;

@@ -7,7 +7,7 @@ namespace onramp::avahi {
 
 namespace {
 
-constexpr std::uint64_t kMicrosecond = 1;  // as precise as sd-event can be
+constexpr std::uint64_t kMicrosecond = 1;  // the best accuracy that sd-event offers
 
 }  // namespace
 

@@ -20,15 +20,17 @@ NSArray* allModes() {
 // Whether the running modal loop was asked to end. Main thread only.
 bool isModalAborted = false;
 
-// Runs `action` once only, even if its timer fires again inside a loop that the action runs.
-// Destroys it on the thread that ran it, although another thread may release the object last.
+// Returns an object that runs `action` only once, even if its timer fires again inside a loop that
+// the action runs. The action is destroyed on the thread that ran it, even if another thread
+// releases the object last.
 OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
   }];
 }
 
-// A modal loop checks whether it was stopped only after it has handled an event.
+// Posts an empty event, because a modal loop checks whether it was stopped only after it has
+// handled an event.
 void wakeEventLoop() {
   [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
                                       location:NSZeroPoint
@@ -64,13 +66,15 @@ void performOnMainThread(std::function<void()> action) {
   }
 }
 
-// AppKit may end a modal loop unasked, for example for a key that cancels; it is then run again.
+// AppKit may end a modal loop without being asked, for example when the user presses a key that
+// cancels. The loop is then run again.
 void runModalForWindow(const Window& window) {
-  // AppKit shows no window of a hidden application.
+  // AppKit does not show windows of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
   NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
-  // The controller refuses to close the window meanwhile, and the button shows it.
+  // The close button is disabled, because the controller refuses to close the window while the loop
+  // runs.
   NSButton* const closeButton = [modal standardWindowButton:NSWindowCloseButton];
   [closeButton setEnabled:NO];
   isModalAborted = !modal;

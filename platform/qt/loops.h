@@ -2,11 +2,10 @@
 
 namespace onramp::qt {
 
-/// Whether a modal loop runs. Main thread only.
+/// Returns whether a modal loop is running. Main thread only.
 [[nodiscard]] bool isModal();
 
-/// Ends the main loop, every modal one and every sleep off the main thread, for good. Main thread
-/// only.
+/// Ends the main loop, every modal loop and every sleepOffMainThread() for good. Main thread only.
 void endAllLoops();
 
 }  // namespace onramp::qt

@@ -17,7 +17,8 @@ namespace {
 using qt::ListModel;
 using qt::nativeOf;
 
-// Returns the view's model, which is made on first use: headers may be set before bind().
+// Returns the view's model. The model is created on first use, because headers may be set before
+// bind().
 ListModel* modelOf(QAbstractItemView* view) {
   if (!view) return nullptr;
   if (auto* const model = qobject_cast<ListModel*>(view->model())) return model;
@@ -93,7 +94,8 @@ void TableView::bind(ArrayController& controller) const {
                    [&controller](const QModelIndex& index) {
                      controller.choose(static_cast<std::size_t>(index.row()));
                    });
-  // The button's action may remove the list, so it waits until the list has handled the click.
+  // The button's action may remove the list, so it runs after the list has handled the
+  // double-click.
   QObject::connect(
       view, &QAbstractItemView::doubleClicked, view,
       [view] { clickDefaultButton(*view->window()); }, Qt::QueuedConnection);
@@ -116,7 +118,7 @@ void TableView::setColumnHeader(std::string_view identifier, const std::string& 
   }
 }
 
-// Nothing can be edited: the model takes no values.
+// Does nothing, because the model accepts no edits.
 void TableView::setColumnEditable(std::string_view, bool) const {}
 
 }  // namespace onramp

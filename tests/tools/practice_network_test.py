@@ -96,10 +96,10 @@ class FromInside(unittest.TestCase):
     def test_a_refused_request_changes_nothing(self):
         before = self.network.list()
         for message, request in (
-                ("is not known", lambda: self.network.set("Nobody", port=1)),
+                ("is unknown", lambda: self.network.set("Nobody", port=1)),
                 ("port must be", lambda: self.network.set("Odd", port="x")),
-                ("known are lo", lambda: self.network.unplug("eth7")),
-                ("is there already", lambda: self.network.rename("Odd", "Scanner")),
+                ("the interfaces are lo", lambda: self.network.unplug("eth7")),
+                ("exists already", lambda: self.network.rename("Odd", "Scanner")),
                 ("another device's", lambda: self.network.add("Twin", addresses=["127.0.1.2"]))):
             with self.subTest(message), self.assertRaisesRegex(ControlError, message):
                 request()

@@ -124,7 +124,7 @@ Verdict judge(const Device& device, const Medium& medium,
     return {.id = device.ipv6.empty() ? "no-address" : "ipv6-only",
             .why = device.ipv6.empty() ? "has no address"
                                        : "has IPv6 addresses only: " + joined(device.ipv6),
-            .remedy = "switch on IPv4 in the device; the wizard asks IPv4 addresses only"};
+            .remedy = "switch on IPv4 in the device; the wizard uses only IPv4 addresses"};
   }
   if (!device.answer || !device.answer->isComplete) {
     return {.id = "not-asked-yet", .why = "the search ended before the device had answered"};
