@@ -132,13 +132,13 @@ class Avahi:
         return int(self.pid_file.read_text())
 
 
-def announce_pointer(service_type, target_labels):
+def announce_pointer(service_type, target_labels, seconds=4500):
     """Announces (RFC 6762 section 8.3) that `service_type` has an instance with those labels.
-    Announces no other record of the instance."""
+    Announces no other record of the instance. With 0 `seconds` to live, takes that back."""
     name = _labels(*service_type.encode().split(b"."), b"local")
     target = _labels(*target_labels)
     packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name
-              + struct.pack("!HHIH", 12, 1, 4500, len(target)) + target)
+              + struct.pack("!HHIH", 12, 1, seconds, len(target)) + target)
     with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as sender:
         sender.setsockopt(socket.SOL_SOCKET, socket.SO_REUSEADDR, 1)
         sender.setsockopt(socket.SOL_SOCKET, socket.SO_REUSEPORT, 1)
