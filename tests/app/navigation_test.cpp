@@ -221,7 +221,7 @@ TEST_F(Navigation, TheSheetAfterAnEmptySearchOffersTheSupportPage) {
   medium.write(kEnglishTexts,
                std::string("INST_TXT_ALERT_WIFI_DEVICENOTFOUND = \"100%% of 5%%\";"));
   delegate->showListAlertSheet();
-  EXPECT_EQ(screen.sheets[1].sheet.message, "100% of 5%\n\nPush the gear button");
+  EXPECT_EQ(screen.sheets[1].first.message, "100% of 5%\n\nPush the gear button");
 }
 
 TEST_F(Navigation, AToolThatCannotBeStartedLeadsToTheChooser) {

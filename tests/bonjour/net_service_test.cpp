@@ -111,7 +111,8 @@ TEST_F(NetServiceTest, UnusableTxtDataGivesNoValues) {
     EXPECT_EQ(KSNetServiceCopyNote(unusable), std::nullopt);
     EXPECT_FALSE(KSNetServiceSupportsURF(unusable));
   };
-  for (const auto& txt : std::vector<std::optional<Data>>{std::nullopt, Data(), cutShort, notTexts}) {
+  for (const auto& txt :
+       std::vector<std::optional<Data>>{std::nullopt, Data(), cutShort, notTexts}) {
     Network::fill(service, {}, txt);
     expectNone(service);
   }

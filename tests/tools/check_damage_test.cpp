@@ -45,8 +45,14 @@ class DamagedMedium {
     const fs::path file = files_[below(files_.size())];
     damaged_ = file;
     whole_ = read(file);
-    const auto list = below(2) == 0 ? loadDictionary(file.string()) : std::nullopt;
-    return file.filename().string() + ": " + (list ? damageList(*list) : damageBytes());
+    std::string what = file.filename().string() + ": ";
+    if (const auto list = below(2) == 0 ? loadDictionary(file.string()) : std::nullopt) {
+      EXPECT_TRUE(writeDictionaryAtomically(damagedCopy(*list, what), damaged_.string()));
+      return what;
+    }
+    const std::size_t at = below(whole_.size());
+    write(damaged_, whole_.substr(0, at));
+    return what + "cut off at " + std::to_string(at);
   }
 
   void mend() const { write(damaged_, whole_); }
@@ -60,19 +66,6 @@ class DamagedMedium {
   }
   static void write(const fs::path& file, const std::string& bytes) {
     std::ofstream(file, std::ios::binary) << bytes;
-  }
-
-  std::string damageBytes() {
-    const std::size_t at = below(whole_.size());
-    write(damaged_, whole_.substr(0, at));
-    return "cut off at " + std::to_string(at);
-  }
-
-  std::string damageList(const Dictionary& list) {
-    std::string what;
-    const Dictionary damaged = damagedCopy(list, what);
-    EXPECT_TRUE(writeDictionaryAtomically(damaged, damaged_.string()));
-    return what;
   }
 
   // Returns a copy in which one random key below `dictionary` is removed, renamed or given another
