@@ -181,7 +181,7 @@ class NetworkTest(unittest.TestCase):
                 self.add(name, addresses=["192.0.2.100"])
             self.avahi.restart(objects_per_client_max=limit)
             with self.subTest(limit=limit), Search(PROBE, TYPE) as search:
-                search.wait(lambda _: names <= {event[2] for event in search.events("update")})
+                search.wait(lambda: names <= {event[2] for event in search.events("update")})
 
     def test_the_daemon_may_be_absent_and_come_and_go(self):
         self.avahi.kill()

@@ -144,11 +144,7 @@ TEST_F(Netconfig, DestinationIsReachedFromTheFirstInterfaceInItsSubnet) {
   const Dictionary maskless = {{"Addresses", Array{"192.168.7.1"}}};
   const Dictionary addressless = {{"SubnetMasks", Array{"255.255.255.0"}}};
   const Dictionary everything = state("172.16.0.1", "0.0.0.0");
-  const struct {
-    std::vector<Dictionary> entries;
-    const char* destination;
-    std::optional<std::string> local;
-  } cases[] = {
+  const std::tuple<std::vector<Dictionary>, const char*, std::optional<std::string>> cases[] = {
       {{home}, "192.168.2.20", std::nullopt},
       {{wide, home}, "192.168.1.20", "192.168.0.1"},
       {{home, wide}, "192.168.2.20", "192.168.0.1"},

@@ -25,16 +25,16 @@ std::string utf16(const std::string& ascii, bool bigEndian) {
 TEST(PropertyList, ReadsXMLInTheFormsThatPeopleWrite) {
   const Dictionary expected{{"k", "a<b"}};
   const std::pair<std::string, Dictionary> cases[] = {
-      {plist("<key>k</key><string>a&lt;b</string>"), expected},
-      {"\xEF\xBB\xBF" + plist("<key>k</key><string>a&lt;b</string>"), expected},
-      {"\xFF\xFE" + utf16(plist("<key>k</key><string>a&lt;b</string>"), false), expected},
-      {utf16(plist("<key>k</key><string>a&lt;b</string>"), true), expected},
+      {plistWith("<string>a&lt;b</string>"), expected},
+      {"\xEF\xBB\xBF" + plistWith("<string>a&lt;b</string>"), expected},
+      {"\xFF\xFE" + utf16(plistWith("<string>a&lt;b</string>"), false), expected},
+      {utf16(plistWith("<string>a&lt;b</string>"), true), expected},
       {"<plist><dict><key>k</key><string><![CDATA[a<b]]></string></dict></plist>", expected},
-      {plist("<!-- <array> --><key>k</key><string>a<!-- > -->&#60;&#x62;</string>"), expected},
-      {plist("<key>k</key>\n\t<integer>010</integer><key>m</key><integer> -09</integer>"
-             "<key>h</key><integer>0x1F</integer><key>z</key><integer>00</integer>"),
+      {plistWith("<!-- <array> --><string>a<!-- > -->&#60;&#x62;</string>"), expected},
+      {plistWith("\n\t<integer>010</integer><key>m</key><integer> -09</integer>"
+                 "<key>h</key><integer>0x1F</integer><key>z</key><integer>00</integer>"),
        Dictionary{{"k", 10}, {"m", -9}, {"h", 31}, {"z", 0}}},
-      {plist("<key>k</key><string/><key>t</key><true></true><key>d</key><dict/>"),
+      {plistWith("<string/><key>t</key><true></true><key>d</key><dict/>"),
        Dictionary{{"k", ""}, {"t", true}, {"d", Dictionary()}}}};
   const TemporaryFolder folder;
   for (const auto& [text, dictionary] : cases)

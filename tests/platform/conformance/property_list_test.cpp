@@ -51,7 +51,7 @@ TEST(PropertyList, ExchangesEveryKindOfValueWithAnotherImplementation) {
 }
 
 TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
-  const std::string whole = plist("<key>k</key><string>text</string>");
+  const std::string whole = plistWith("<string>text</string>");
   const std::string cases[] = {"",
                                "plain text",
                                "<",
@@ -59,9 +59,9 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
                                "<plist><string>text</string></plist>",
                                "<html><body/></html>",
                                whole.substr(0, whole.size() - 12),
-                               plist("<key>k</key>\xFF"),
-                               plist(std::string("<key>k</key><string>\0</string>", 30)),
-                               plist("<key>k</key><string>&unknown;</string>"),
+                               plistWith("\xFF"),
+                               plistWith(std::string("<string>\0</string>", 18)),
+                               plistWith("<string>&unknown;</string>"),
                                "bplist00",
                                "bplist00" + std::string(40, '\xFF')};
   const TemporaryFolder folder;
