@@ -59,7 +59,7 @@ void Query::answered(sd_bus_message* reply) {
 
 void Query::signalled(sd_bus_message* signal) {
   const std::string_view member = sd_bus_message_get_member(signal);
-  if (member == "ItemNew") {
+  if (member == "ItemNew" || member == "Found") {
     handler_(Event::kFound, signal);
   } else if (member == "ItemRemove") {
     handler_(Event::kGone, signal);

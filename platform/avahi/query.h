@@ -14,13 +14,13 @@ inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
 /// A question to the daemon that stays open for as long as this object exists. In the daemon it is
-/// a browser object of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms before it
-/// starts a browser that was made with an earlier version's method. The *Prepare methods of 0.8
+/// a browser or resolver object of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms
+/// before it starts one that was made with an earlier version's method. The *Prepare methods of 0.8
 /// avoid that.)
 class Query {
  public:
   enum class Event {
-    kFound,           ///< a new result; the message is at the arguments of ItemNew
+    kFound,           ///< a new result; the message is at the arguments of ItemNew or Found
     kGone,            ///< a removed result; the message is at the arguments of ItemRemove
     kCacheExhausted,  ///< the daemon has reported everything in its cache
     kLost,            ///< the daemon went away or failed: all results so far are invalid

@@ -23,8 +23,8 @@ struct Instance {
   }
 };
 
-/// The DNS record types that this backend uses (RFC 1035 section 3.2.2, RFC 3596, RFC 2782).
-enum class RecordType : std::uint16_t { kIPv4 = 1, kTXT = 16, kIPv6 = 28, kServer = 33 };
+/// The DNS record types that this backend uses (RFC 1035 section 3.2.2, RFC 3596).
+enum class RecordType : std::uint16_t { kIPv4 = 1, kIPv6 = 28 };
 
 /// The records of one name and type on any interface and protocol, kept up to date.
 class Records {
@@ -46,8 +46,6 @@ class Records {
   /// Returns whether the daemon has reported everything in its cache.
   [[nodiscard]] bool isCacheExhausted() const { return isCacheExhausted_; }
 
-  [[nodiscard]] bool isRefused() const { return query_.isRefused(); }
-
  private:
   void happened(Query::Event event, sd_bus_message* message);
 
@@ -56,18 +54,6 @@ class Records {
   bool isCacheExhausted_ = false;
   Query query_;
 };
-
-/// Returns the instance's full domain name, with escapes (RFC 6763 section 4.3).
-[[nodiscard]] std::string fullName(const Instance& instance);
-
-/// The host and port at which a service is offered, as an SRV record gives them.
-struct Server {
-  std::string host;  ///< a domain name with escapes and without a closing dot
-  std::uint16_t port = 0;
-};
-
-/// Reads an SRV record's data (RFC 2782). Returns nothing when the data is malformed.
-[[nodiscard]] std::optional<Server> serverIn(const Data& data);
 
 /// Converts an address record to a socket address in the layout that NetService::addressing()
 /// describes. Returns nothing when the record's data has the size of neither an IPv4 nor an IPv6

@@ -34,32 +34,33 @@ class Resolve {
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
   /// Returns whether the service's name is invalid, so that the daemon cannot look it up.
-  [[nodiscard]] bool isRefused() const { return server_ && server_->isRefused(); }
+  [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:
   void begin();
-  void ask(std::optional<Records>& records, const std::string& name, RecordType type);
+  void happened(Query::Event event, sd_bus_message* message);
+  void ask(std::optional<Records>& addresses, RecordType type);
+  void checkSoon();
   void check();
   [[nodiscard]] const Records* knownAddresses();
   void end(std::optional<Resolution> resolution);
 
   Daemon& daemon_;
-  std::string name_;
+  Instance name_;
   Report report_;
   Timer check_;  ///< runs after a change, once all messages have been read
   Timer timeUp_;
   Timer graceForIPv4_;
   bool isGraceOver_ = false;
   unsigned losses_ = 0;  ///< the daemon's losses() when the resolve last began
-  // The daemon limits the number of questions that a client has open, so the questions for the
-  // server and the TXT record are closed as soon as they are answered.
-  std::optional<Records> server_;
-  std::optional<Records> txt_;
+  // The daemon limits the number of questions that a client has open, so this one is closed as
+  // soon as it is answered.
+  std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;
-  std::string host_;
+  std::string host_;  ///< empty until the daemon has named it
   std::uint16_t port_ = 0;
-  std::optional<Data> txtData_;
+  Data txt_;
 };
 
 }  // namespace onramp::avahi
