@@ -20,7 +20,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// A copy of the example medium, to which a test does one random damage at a time.
+/// A copy of the example medium, which a test damages at random, in one place at a time.
 class DamagedMedium {
  public:
   DamagedMedium() {
@@ -134,15 +134,15 @@ std::string startOfTheWizard() {
 }
 
 // Returns the start that `report` predicts, in the words of startOfTheWizard(). Returns `start`
-// itself when the wizard refused the system, and when the report predicts no page and the wizard
-// does not show the model list.
+// itself, so that the comparison passes, in two cases: the wizard refused the system, or the report
+// predicts no page and the wizard does not show the model list.
 std::string startIn(const check::Report& report, const std::string& start) {
   if (start == "refused") return start;
   if (report.start == FirstPage::kNone) return start.starts_with("ModelListView") ? "" : start;
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";
 }
 
-// For a longer run, set ONRAMP_DAMAGES to the number of damages.
+// For a longer run, set ONRAMP_DAMAGES to the number of times the medium is damaged.
 TEST(OnrampCheck, ReportsEveryDamageThatChangesTheStart) {
   const char* const wanted = std::getenv("ONRAMP_DAMAGES");
   const unsigned long count = wanted ? std::strtoul(wanted, nullptr, 10) : 100;
