@@ -1,4 +1,4 @@
-"""Makes one mistake at a time on a copy of a medium and reads what onramp-check reports.
+"""Makes one mistake at a time in a copy of a medium and reads what onramp-check reports.
 Arguments: the program, and the example medium with the application on it."""
 
 import json
@@ -123,7 +123,7 @@ def maximum(major, minor, bug_fix):
 
 # For each mistake: its breaker, the identifier of the only finding, and parts of the report on it.
 MISTAKES = [
-    # The lists.
+    # Property lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
     (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
     (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
@@ -205,7 +205,7 @@ MISTAKES = [
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
      "picture-size", "680 × 480", "192 × 192"),
     (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
-    # Names in the network and in files.
+    # Names on the network and in files.
     (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", "_pdl-datastream._tcp.", "add the dot"),
     (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
     (put(COMMON, "BonjourNetwork", "_http._tcp."), "service-unknown", "which model"),
