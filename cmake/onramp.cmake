@@ -52,8 +52,8 @@ function(onramp_test name)
 endfunction()
 
 # onramp_namespace_test(NAME …): as onramp_test, but the test runs as root in a new network namespace
-# and is skipped where none can be created. ctest runs it through tests/in_namespace, by CMake's
-# setting for an emulator. SOURCE_FOLDER is defined as the folder of the test's sources.
+# and is skipped where none can be created. CMake calls tests/in_namespace, through which ctest runs the
+# test, an emulator. SOURCE_FOLDER is defined as the folder of the test's sources.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})

@@ -7,11 +7,11 @@
 
 namespace onramp {
 
-/// The answers that a sheet gives for its buttons.
+/// The codes that a sheet returns for its default button and its other button.
 inline constexpr int kAlertDefaultReturn = 1;
 inline constexpr int kAlertOtherReturn = -1;
 
-/// Shows an alert of the critical style with one button and returns when the user has dismissed it.
+/// Shows a critical alert with one button. Returns when the user has dismissed the alert.
 void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
                       const std::string& buttonTitle);
 
@@ -22,8 +22,9 @@ struct AlertSheet {
   std::string otherButton;
 };
 
-/// Shows a sheet on `window` and returns at once. `didEnd` gets the answer when the user dismisses
-/// it.
+/// Shows a sheet on `window` and returns at once. When the sheet has ended, calls `didEnd` with
+/// kAlertOtherReturn if the user clicked the other button, and with kAlertDefaultReturn in all
+/// other cases.
 void beginAlertSheet(const AlertSheet& sheet, const Window& window,
                      std::function<void(int returnCode)> didEnd);
 

@@ -9,39 +9,44 @@
 
 namespace onramp {
 
-/// What the application asks of, and tells, the one controller behind its main interface file.
+/// The interface through which the application asks and notifies its controller, which owns the
+/// main interface file. An application has one controller.
 class ApplicationDelegate : public InterfaceOwner {
  public:
-  /// Gives the controller its outlets; then awakeFromNib() follows.
+  /// Gives the controller the objects of the main interface file. The application calls
+  /// awakeFromNib() next.
   virtual void setOutlets(const Interface& mainInterface) = 0;
   virtual void awakeFromNib() = 0;
 
-  /// Called one after the other when the main loop starts. When the first one asks to terminate,
-  /// the second is not called.
+  /// Both are called in this order when the main loop starts. The second is not called when the
+  /// first has asked the application to terminate.
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 
-  /// Asked after the user closed the last window.
+  /// Called after the user has closed the last window. Returns whether the application should then
+  /// terminate.
   [[nodiscard]] virtual bool applicationShouldTerminateAfterLastWindowClosed() = 0;
 
-  /// Asked before the user closes `window`.
+  /// Called when the user tries to close `window`. Returns whether the window may close.
   [[nodiscard]] virtual bool windowShouldClose(const Window& window) = 0;
 };
 
-/// Makes the controller, loads the main interface file for it and runs the main loop until the
-/// application terminates. Returns the process's exit status.
+/// Creates the controller with `makeDelegate`, loads the main interface file for the controller,
+/// and runs the main loop until the application terminates. Returns the process's exit status.
 int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
-/// Asks the application to end. The main loop, and a modal one inside it, stop; no timer or event
-/// is handled any more. May not return; where it does, the caller ends what it is doing.
+/// Asks the application to terminate. The main loop and any modal loop inside it stop, and no
+/// further timer or event is handled. This function may not return. If it does return, the caller
+/// must stop what it is doing.
 void terminateApplication();
 
-/// Takes all windows off the screen, and brings those back that hideApplication() took.
+/// hideApplication() takes all windows off the screen. unhideApplication() brings those windows
+/// back.
 void hideApplication();
 void unhideApplication();
 
-/// Makes this the active application, whatever else is in use.
+/// Makes this the active application, even if the user is working in another one.
 void activateIgnoringOtherApps();
 
 [[nodiscard]] Menu mainMenu();

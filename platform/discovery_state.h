@@ -6,25 +6,28 @@
 
 namespace onramp {
 
-// What programs that explain service discovery ask for besides; the wizard does not use it. Main
+// Information about service discovery for diagnostic programs. The wizard does not use it. Main
 // thread only.
 
-/// Returns why the system's service discovery cannot be used; nothing when it can. A browse that
-/// was started meanwhile finds services once it can be used.
+/// Returns the reason why the system's service discovery cannot be used, or nothing when it can be
+/// used. A browse may be started even while discovery cannot be used. It finds services as soon as
+/// discovery works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
-/// One place where a browse sees a service, or no longer sees it. Browsers fold these.
+/// Reports that a browse sees a service on one network interface and protocol, or no longer sees it
+/// there. NetServiceBrowser merges all sightings of a service.
 struct ServiceSighting {
   std::string name;       ///< as NetService::name()
   std::string type;       ///< as NetService::type()
   std::string domain;     ///< as NetService::domain()
   std::string interface;  ///< the network interface's name
-  bool isIPv6 = false;    ///< whether it was announced by IPv6, otherwise by IPv4
+  bool isIPv6 = false;    ///< seen by IPv6; otherwise by IPv4
   bool isGone = false;
 };
 
-/// Calls `watch` on the main thread for each sighting of all browses; null ends that. The backend
-/// for macOS does not learn of sightings and never calls it.
+/// Sets the function that is called on the main thread for each sighting in any browse. A null
+/// `watch` ends the calls. The backend for macOS does not receive sightings and never calls
+/// `watch`.
 void watchSightings(std::function<void(const ServiceSighting&)> watch);
 
 }  // namespace onramp

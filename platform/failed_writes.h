@@ -2,8 +2,9 @@
 
 namespace onramp {
 
-/// Makes a write fail, instead of ending the process, when its reader is gone or the file would
-/// exceed the user's limit on file sizes. Call it once, before anything is written.
+/// Makes a write return an error, instead of ending the process, when the reader of a pipe has gone
+/// away or when the file would exceed the user's limit on file sizes. Call this once, before
+/// anything is written.
 void surviveFailedWrites();
 
 }  // namespace onramp

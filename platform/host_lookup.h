@@ -5,9 +5,9 @@
 
 namespace onramp {
 
-/// Asks the system's name services for the host `name` and returns its first IPv4 address, dotted;
-/// nothing when it has none. A dotted address is returned as it is. Blocks for as long as the name
-/// services take.
+/// Asks the system's name services for the host `name` and returns the host's first IPv4 address in
+/// dotted form, or nothing when the host has none. A dotted address is returned as it is. Blocks
+/// for as long as the name services take.
 [[nodiscard]] std::optional<std::string> lookUpIPv4Address(const std::string& name);
 
 }  // namespace onramp

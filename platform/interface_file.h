@@ -9,8 +9,8 @@
 
 namespace onramp {
 
-/// Who an interface file is loaded for: the file binds titles to the owner's texts and sends clicks
-/// to the owner's actions. The owner outlives everything loaded for it.
+/// The object that an interface file is loaded for. The file binds titles to the owner's texts and
+/// sends clicks to the owner's actions. The owner must outlive everything that is loaded for it.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;
@@ -18,7 +18,7 @@ class InterfaceOwner {
   InterfaceOwner& operator=(const InterfaceOwner&) = delete;
   virtual ~InterfaceOwner() = default;
 
-  /// Does what the action named in the interface file asks for; an unknown name does nothing.
+  /// Performs the action that the interface file calls `action`. An unknown name has no effect.
   virtual void performAction(std::string_view action) = 0;
 
   [[nodiscard]] KeyValueTexts& boundTexts() { return boundTexts_; }
@@ -27,10 +27,11 @@ class InterfaceOwner {
   KeyValueTexts boundTexts_;
 };
 
-/// The objects made from one interface file of the application's bundle. Owns them.
+/// Owns the objects that were created from one interface file of the application's bundle.
 class Interface {
  public:
-  /// Null when the bundle has no readable interface file of that name (given without extension).
+  /// Loads the interface file `name`, which is given without an extension, for `owner`. Returns
+  /// null when the bundle has no readable interface file of that name.
   [[nodiscard]] static std::unique_ptr<Interface> load(const std::string& name,
                                                        InterfaceOwner& owner);
 
@@ -38,13 +39,16 @@ class Interface {
   Interface& operator=(const Interface&) = delete;
   ~Interface();
 
-  /// The first top-level object that is a view, whatever its class; empty when none is.
+  /// Returns the first top-level object that is a view of any class, or an empty handle when there
+  /// is none.
   [[nodiscard]] View view() const;
 
-  /// The class that the file gives that view, such as "ModelListView"; empty when there is no view.
+  /// Returns the class that the file gives to the result of view(), such as "ModelListView", or an
+  /// empty text when there is no view.
   [[nodiscard]] std::string viewClass() const;
 
-  /// The object that the file names `name`, or an empty handle when there is none of that kind.
+  /// Returns the object that the file calls `name`, or an empty handle when no object of the
+  /// handle's kind has that name.
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

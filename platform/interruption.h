@@ -4,9 +4,9 @@
 
 namespace onramp {
 
-/// Runs `action` on the main thread, by performOnMainThread(), when the user interrupts the program
-/// from the terminal or somebody asks it to end. A second interruption ends the program at once.
-/// Call it once, before the program has other threads.
+/// Runs `action` by performOnMainThread() when the user interrupts the program from the terminal
+/// (SIGINT) or the program is asked to terminate (SIGTERM). A second such signal ends the program
+/// at once. Call this once, before the program starts other threads.
 void onInterruption(std::function<void()> action);
 
 }  // namespace onramp

@@ -6,7 +6,8 @@
 
 namespace onramp {
 
-/// Returns an IPv6 address, its sixteen bytes in network order, as text (RFC 5952).
+/// Returns the text form of an IPv6 address (RFC 5952). `address` holds its sixteen bytes in
+/// network order.
 [[nodiscard]] std::string ipv6Text(std::span<const std::byte, 16> address);
 
 }  // namespace onramp

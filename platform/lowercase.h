@@ -4,8 +4,9 @@
 
 namespace onramp {
 
-/// The UTF-8 text with every letter made small, of whatever alphabet and in whatever language the
-/// user works. What is no letter, or not well formed, stays as it is.
+/// Returns the UTF-8 text with all letters of every alphabet in lower case, whatever the user's
+/// language is. Characters that are not letters stay unchanged. The result for malformed UTF-8
+/// depends on the backend.
 [[nodiscard]] std::string lowercaseString(const std::string& text);
 
 }  // namespace onramp

@@ -19,7 +19,7 @@ class OperationQueue {
       thread.join();
   }
 
-  /// Starts `operation`. False when the system gives no thread for it; it is then not run.
+  /// Starts `operation`. Returns false, without running it, when the system provides no thread.
   [[nodiscard]] bool addOperation(std::function<void()> operation) {
     try {
       threads_.emplace_back(std::move(operation));

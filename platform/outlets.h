@@ -27,10 +27,10 @@ enum class OutletKind {
   kMenuItem,
 };
 
-/// A handle on an object of the user interface that the front end owns. Copies refer to the same
-/// object. An empty handle accepts every request and does nothing. The handle of an object that is
-/// missing from the interface file is empty, so a page works with whatever its file has. Main
-/// thread only.
+/// A handle to an object of the user interface. The front end owns the object. Copies refer to the
+/// same object. An empty handle accepts every request and does nothing. The handle of an object
+/// that is missing from the interface file is empty, so a page also works when its file lacks some
+/// objects. Main thread only.
 class Outlet {
  public:
   Outlet() = default;
@@ -52,13 +52,14 @@ class View : public Outlet {
 
   void setHidden(bool hidden) const;
 
-  /// The first of the views inside this one; empty when there is none.
+  /// Returns the first of the views inside this one, or an empty handle when there is none.
   [[nodiscard]] View firstSubview() const;
 
-  /// Puts `view` inside this one, filling it, and shows it. The owner of `view` does not change.
+  /// Puts `view` inside this one, makes it fill this one, and shows it. The owner of `view` does
+  /// not change.
   void addSubview(const View& view) const;
 
-  /// Removes this view from the one that it is in. Its owner does not change.
+  /// Removes this view from the view that contains it. The owner of this view does not change.
   void removeFromSuperview() const;
 };
 
@@ -95,20 +96,21 @@ class RadioMatrix : public Control {
   void setTitle(int row, int column, const std::string& title) const;
   void selectCell(int row, int column) const;
 
-  /// Row of the selected button, counted from 0; 0 when this handle is empty.
+  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty.
   [[nodiscard]] int selectedRow() const;
 };
 
-/// An image file by reference: it is read when it is drawn.
+/// A reference to an image file. The file is read when the image is drawn.
 struct Image {
   std::string path;
 
-  /// The image resource of the application's bundle with this file name, if there is one.
+  /// Returns the image resource of the application's bundle with this file name, or nothing when
+  /// there is none.
   [[nodiscard]] static std::optional<Image> named(const std::string& fileName);
 };
 
 enum class ImageScaling {
-  kProportionallyDown,  ///< shown in its own size, or smaller where that does not fit
+  kProportionallyDown,  ///< shown at its own size, or smaller where that does not fit
   kAxesIndependently,   ///< stretched to fill the view
 };
 
@@ -132,15 +134,15 @@ class ProgressIndicator : public View {
   void stopAnimation() const;
 };
 
-/// A list with columns. Each column has an identifier, set by the interface file, and shows the
-/// text that every entry has under that key.
+/// A list with columns. The interface file gives each column an identifier. The column shows the
+/// text that each entry has under that identifier.
 class TableView : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kTableView;
   using Control::Control;
 
-  /// Shows the controller's entries and keeps both selections the same. `controller` must exist
-  /// until the table is destroyed or bound again.
+  /// Shows the entries of `controller` and keeps the table's selection the same as the
+  /// controller's. `controller` must exist until the table is destroyed or bound again.
   void bind(ArrayController& controller) const;
 
   void setAllowsColumnReordering(bool allows) const;
@@ -149,7 +151,8 @@ class TableView : public Control {
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 is the button's own face.
+/// A button that opens a menu of commands. Item 0 is what the button itself shows; it is not a
+/// command.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;
@@ -187,7 +190,7 @@ class Menu : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kMenu;
   using Outlet::Outlet;
 
-  /// The first item with this title; empty when there is none.
+  /// Returns the first item with this title, or an empty handle when there is none.
   [[nodiscard]] MenuItem itemWithTitle(const std::string& title) const;
 };
 
@@ -196,7 +199,7 @@ class MenuItem : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kMenuItem;
   using Outlet::Outlet;
 
-  /// The menu that the item opens; empty for a plain item.
+  /// Returns the menu that this item opens, or an empty handle when the item opens none.
   [[nodiscard]] Menu submenu() const;
   void setTitle(const std::string& title) const;
 };

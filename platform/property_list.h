@@ -12,8 +12,8 @@ namespace onramp {
 // Limits on the property lists that are read. For comparison, the description of a medium with
 // 5,000 models takes about a megabyte and 60,000 objects, nested four levels deep.
 
-/// The maximum size of a file in bytes. Also the maximum total size of all texts and data after
-/// expanding the shared references of a binary list.
+/// The maximum size of a file in bytes. It is also the maximum total size of all texts and data,
+/// where a shared object of a binary list counts once for each reference to it.
 inline constexpr std::size_t kMostPropertyListBytes = std::size_t{16} << 20;
 
 /// The maximum number of values in a list, containers included. A shared object counts once for
@@ -29,12 +29,12 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 [[nodiscard]] std::optional<Dictionary> loadDictionary(const std::string& path);
 
 /// Writes `dictionary` to `path` as an XML property list. The write is atomic: a temporary file in
-/// the same folder is completed and then renamed. Returns false when it failed; a file that was at
-/// `path` is then unchanged.
+/// the same folder is completed and then renamed. Returns false on failure. In that case a file
+/// that was at `path` is unchanged.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
 /// Removes the file or the folder tree at `path`, and the temporary files that killed processes
-/// left when writing to it. Ignores failures.
+/// left while they were writing to `path`. Ignores failures.
 void removeDictionary(const std::string& path);
 
 }  // namespace onramp

@@ -4,14 +4,15 @@
 
 namespace onramp {
 
-/// Whether standard output, or standard error, is a terminal that understands escape sequences.
+/// Return whether standard output or standard error, respectively, is a terminal that understands
+/// escape sequences.
 [[nodiscard]] bool isOutputTerminal();
 [[nodiscard]] bool isErrorTerminal();
 
-/// The terminal's width in columns; 80 when it is unknown.
+/// Returns the terminal's width in columns, or 80 when the width is unknown.
 [[nodiscard]] std::size_t terminalWidth();
 
-/// The columns that a character takes on a terminal, by the rules of the locale of the process.
+/// Returns how many columns a character takes on a terminal, by the rules of the process's locale.
 [[nodiscard]] std::size_t columnsOf(char32_t character);
 
 }  // namespace onramp

@@ -5,7 +5,7 @@ namespace onramp {
 // Connects a front end, which knows when the application terminates, with the threads that sleep in
 // sleepOffMainThread(). Both functions are callable from any thread.
 
-/// Whether beginTermination() was called.
+/// Returns whether beginTermination() has been called.
 [[nodiscard]] bool isTerminating();
 
 /// Makes every current and future call of sleepOffMainThread() return false.

@@ -5,14 +5,15 @@
 
 namespace onramp {
 
-/// The user's language as an ISO 639 code of two or three lower-case letters, such as "ja".
+/// Returns the user's language as an ISO 639 code of two or three lower-case letters, such as "ja".
 [[nodiscard]] std::string localeLanguageCode();
 
-/// The user's country as an ISO 3166 code of two upper-case letters, such as "JP"; empty when
-/// unknown.
+/// Returns the user's country as an ISO 3166 code of two upper-case letters, such as "JP". The
+/// result is empty when the country is unknown.
 [[nodiscard]] std::string localeCountryCode();
 
-/// The user's languages, most preferred first, as identifiers such as "zh_CN" or "de".
+/// Returns the user's languages, the most preferred one first, as identifiers such as "zh_CN" or
+/// "de".
 [[nodiscard]] std::vector<std::string> preferredLanguages();
 
 }  // namespace onramp

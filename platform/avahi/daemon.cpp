@@ -19,10 +19,12 @@ constexpr const char* kOwnerChanges =
     "type='signal',sender='org.freedesktop.DBus',interface='org.freedesktop.DBus',"
     "member='NameOwnerChanged',arg0='org.freedesktop.Avahi'";
 
-// What fails at once is not tried again at once, or it would keep the processor busy.
+// The pause before a retry. Without it, an operation that fails immediately would keep the
+// processor busy.
 constexpr std::chrono::milliseconds kRetryPause{1000};
 
-// A daemon that hangs answers when it goes on. When the daemon dies, the bus answers for it.
+// Calls need no time limit. A daemon that hangs answers when it resumes, and the bus answers for a
+// daemon that has died.
 constexpr std::uint64_t kForever = std::numeric_limits<std::uint64_t>::max();
 
 }  // namespace
@@ -74,7 +76,7 @@ void Daemon::retryLater() {
 void Daemon::add(Query* query) {
   queries_.push_back(query);
   if (isPresent_) query->ask();
-  runSoon();  // arms the timers that the query started
+  runSoon();  // arms the timers of the resolve that the query belongs to
 }
 
 void Daemon::remove(Query* query) {
@@ -101,7 +103,8 @@ bool Daemon::watchDaemon() {
          });
 }
 
-// Systems that start the daemon on demand do it now. The bus reports its arrival.
+// Starts the daemon on systems that start it on demand. The bus reports when the daemon has
+// arrived.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");
   if (request && sd_bus_message_append(request.get(), "su", kAvahi, 0U) >= 0) {
@@ -135,6 +138,8 @@ int Daemon::onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error*) {
   return 0;
 }
 
+// Here and in lost(), a query may remove other queries from `queries_`, so the loop runs over a
+// copy and skips the removed ones.
 void Daemon::arrived() {
   isPresent_ = true;
   for (Query* const query : std::vector(queries_)) {
@@ -142,7 +147,6 @@ void Daemon::arrived() {
   }
 }
 
-// A query's handler may remove other queries.
 void Daemon::lost() {
   isPresent_ = false;
   ++losses_;
@@ -165,22 +169,24 @@ Message Daemon::newCall(const char* method) const {
   return Message(message);
 }
 
-// The bus owns `reply` and destroys it after the answer, or when it is destroyed itself.
+// The connection to the bus takes ownership of `reply`. It destroys `reply` after the answer has
+// arrived, or when the connection itself is destroyed.
 bool Daemon::call(sd_bus_message* message, Reply reply) {
   const auto answered = [](sd_bus_message* answer, void* receiver, sd_bus_error*) {
     (*static_cast<Reply*>(receiver))(answer);
     return 0;
   };
   auto receiver = std::make_unique<Reply>(std::move(reply));
-  sd_bus_slot* slot = nullptr;
-  if (sd_bus_call_async(bus_.get(), &slot, message, answered, receiver.get(), kForever) < 0) {
+  sd_bus_slot* created = nullptr;
+  if (sd_bus_call_async(bus_.get(), &created, message, answered, receiver.get(), kForever) < 0) {
     return false;
   }
-  sd_bus_slot_set_destroy_callback(
-      slot, [](void* held) { const std::unique_ptr<Reply> freed(static_cast<Reply*>(held)); });
+  const Slot slot(created);
+  sd_bus_slot_set_destroy_callback(slot.get(), [](void* held) {
+    const std::unique_ptr<Reply> freed(static_cast<Reply*>(held));
+  });
   static_cast<void>(receiver.release());
-  sd_bus_slot_set_floating(slot, 1);
-  sd_bus_slot_unref(slot);
+  sd_bus_slot_set_floating(slot.get(), 1);
   runSoon();
   return true;
 }

@@ -16,27 +16,29 @@ namespace onramp::avahi {
 
 class Query;
 
-/// The connection to the Avahi daemon over the system's message bus. Bus and daemon may be absent,
-/// come and go at any time. Queries stay, and are sent again to each new daemon. No call waits for
-/// the daemon. Main thread only. README.md explains the whole.
+/// The connection to the Avahi daemon over the system's message bus. The bus and the daemon may be
+/// absent, and may come and go at any time. Queries are kept and are sent again to each new daemon.
+/// Only runUntil() waits for the daemon. Main thread only. README.md in this folder explains how
+/// the parts of this backend work together.
 class Daemon {
  public:
-  /// The connection that the main thread's loop runs. It lives as long as somebody holds it. Null
-  /// when the system has no descriptor or thread for it.
+  /// Returns the connection that runs on the main thread's loop, and creates it if there is none.
+  /// The connection exists for as long as somebody holds it. Returns null when the system provides
+  /// no descriptor or thread.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 
-  /// Creates a connection that runs only inside runUntil(). Null when the system has no descriptor
-  /// for it.
+  /// Creates a connection that runs only inside runUntil(). Returns null when the system provides
+  /// no descriptor.
   [[nodiscard]] static std::unique_ptr<Daemon> create();
 
   Daemon(const Daemon&) = delete;
   Daemon& operator=(const Daemon&) = delete;
   ~Daemon() = default;
 
-  /// Runs the loop until `done` returns true. Returns false when the loop fails before.
+  /// Runs the loop until `done` returns true. Returns false when the loop fails before that.
   bool runUntil(const std::function<bool()>& done);
 
-  /// How often the daemon has gone away so far.
+  /// Returns how many times the daemon has gone away so far.
   [[nodiscard]] unsigned losses() const { return losses_; }
 
   [[nodiscard]] sd_event* loop() const { return loop_.get(); }
@@ -47,7 +49,7 @@ class Daemon {
 
   explicit Daemon(EventLoop loop);
 
-  // What queries use.
+  // Queries use the functions below.
   void add(Query* query);
   void remove(Query* query);
   void listen(const std::string& path, Query* query) { listeners_[path] = query; }
@@ -67,15 +69,15 @@ class Daemon {
   static int onMessage(sd_bus_message* message, void* self, sd_bus_error* error);
   static int onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error* error);
 
-  // The members are destroyed from the last to the first: the thread polls the loop, and bus and
-  // timer are part of it.
+  // The order matters, because members are destroyed from last to first. The thread polls the loop,
+  // and the bus and the timer use the loop.
   EventLoop loop_;
   Timer retry_;
   std::vector<Query*> queries_;
-  std::map<std::string, Query*> listeners_;  ///< by the daemon's path of the query's object
+  std::map<std::string, Query*> listeners_;  ///< by the path of the query's object in the daemon
   unsigned losses_ = 0;
   bool isPresent_ = false;    ///< the daemon is on the bus
-  bool isConnected_ = false;  ///< `bus_` is there and works
+  bool isConnected_ = false;  ///< `bus_` is set and works
   Bus bus_;
   std::shared_ptr<LoopThread> thread_;
 };

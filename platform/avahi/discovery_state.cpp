@@ -13,7 +13,7 @@ namespace onramp {
 
 namespace {
 
-constexpr int kIPv6Protocol = 1;  // the daemon's number
+constexpr int kIPv6Protocol = 1;  // the daemon's number for IPv6
 
 std::function<void(const ServiceSighting&)>& sightingWatch() {
   static std::function<void(const ServiceSighting&)> watch;
@@ -53,10 +53,10 @@ std::optional<std::string> discoveryProblem() {
   sd_bus* opened = nullptr;
   if (sd_bus_open_system(&opened) < 0) return "the system's message bus cannot be reached";
   const avahi::Bus bus(opened);
-  sd_bus_creds* owner = nullptr;
-  const int status = sd_bus_get_name_creds(bus.get(), "org.freedesktop.Avahi", 0, &owner);
-  sd_bus_creds_unref(owner);
-  if (status < 0) return "avahi-daemon does not run";
+  sd_bus_creds* found = nullptr;
+  const int status = sd_bus_get_name_creds(bus.get(), "org.freedesktop.Avahi", 0, &found);
+  const avahi::Credentials owner(found);
+  if (status < 0) return "avahi-daemon is not running";
   return std::nullopt;
 }
 

@@ -14,7 +14,8 @@ namespace onramp::avahi {
 
 namespace {
 
-// What fails at once is not tried again at once, or it would keep the processor busy.
+// The pause before a retry. Without it, an operation that fails immediately would keep the
+// processor busy.
 constexpr std::chrono::seconds kPauseAfterFailure{1};
 
 }  // namespace
@@ -53,7 +54,8 @@ void LoopThread::runSoon() {
   });
 }
 
-// Runs on the thread. After asking the main thread, waits for its answer alone.
+// Runs on `thread_`. After it has asked the main thread, it waits only for the main thread's
+// answer.
 void LoopThread::wait() {
   bool isAsking = false;
   while (!isEnding_) {
@@ -81,7 +83,8 @@ void LoopThread::askMainThread() {
   });
 }
 
-// The last round finds nothing to do, and prepares what the loop waits for next.
+// The last call of sd_event_run() finds nothing to do. It prepares the loop's descriptor for the
+// next wait.
 void LoopThread::runLoop() {
   int done = 0;
   do {

@@ -9,20 +9,23 @@
 
 namespace onramp::avahi {
 
-/// Lets the main thread run an event loop of sd-event in addition to its own: a thread waits until
-/// the loop has something to do, and then asks the main thread to run it. The thread only polls the
-/// loop's descriptor and never touches the loop.
+/// Lets the main thread run an sd-event loop in addition to its own loop. A separate thread waits
+/// until the sd-event loop has something to do and then asks the main thread to run that loop. The
+/// separate thread only polls the loop's descriptor and never touches the loop itself.
 class LoopThread : public std::enable_shared_from_this<LoopThread> {
  public:
-  /// Null when the system has no descriptor or thread for it. The loop must outlive the result.
+  /// Starts the thread for `loop`, which must outlive the result. Returns null when the system
+  /// provides no descriptor or thread.
   [[nodiscard]] static std::shared_ptr<LoopThread> start(sd_event* loop);
 
   LoopThread(const LoopThread&) = delete;
   LoopThread& operator=(const LoopThread&) = delete;
+  /// Ends the thread and waits for its end. This takes up to a second if the thread is pausing
+  /// after a failure.
   ~LoopThread();
 
-  /// Makes the main thread run the loop soon. To be called after code outside the loop has changed
-  /// what the loop waits for. Main thread only.
+  /// Makes the main thread run the loop soon. Call this when code outside the loop has changed what
+  /// the loop waits for. Main thread only.
   void runSoon();
 
  private:
@@ -33,9 +36,9 @@ class LoopThread : public std::enable_shared_from_this<LoopThread> {
   void runLoop();
 
   sd_event* loop_;
-  int descriptor_;            ///< the loop's; readable when the loop has something to do
-  posix::Descriptor resume_;  ///< an eventfd; readable when the thread has to go on or to end
-  bool isRunSoon_ = false;    ///< a run that runSoon() has asked for has not begun yet
+  int descriptor_;            ///< the loop's descriptor; readable when the loop has something to do
+  posix::Descriptor resume_;  ///< an eventfd; readable when the thread must continue or end
+  bool isRunSoon_ = false;    ///< runSoon() has asked for a run that has not begun yet
   std::atomic<bool> hasFailed_ = false;
   std::atomic<bool> isEnding_ = false;
   std::thread thread_;

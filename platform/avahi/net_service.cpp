@@ -65,7 +65,7 @@ class Service final : public NetService, public std::enable_shared_from_this<Ser
   bool isScheduled_ = false;
   std::shared_ptr<Daemon> daemon_;  ///< held while a resolve runs
   std::unique_ptr<Resolve> resolve_;
-  unsigned long resolves_ = 0;  ///< tells the end of this resolve from a late one of an earlier one
+  unsigned long resolves_ = 0;  ///< number of this resolve; late ends of earlier ones are ignored
 };
 
 bool Service::resolveWithTimeout(double seconds) {
@@ -75,8 +75,9 @@ bool Service::resolveWithTimeout(double seconds) {
   return client_ ? startResolve(timeLimitOf(seconds)) : resolveNow(timeLimitOf(seconds));
 }
 
-// The client is called from the main loop and not from within the daemon's, so that it may end
-// whatever it likes, and so that one that takes long delays no other service's resolve.
+// The client is called from the main loop, not from inside the daemon's loop. It may therefore
+// destroy any object, and a slow client does not keep the daemon's loop from reading the messages
+// that are already waiting.
 bool Service::startResolve(TimeLimit timeLimit) {
   daemon_ = Daemon::shared();
   if (!daemon_) return false;
@@ -89,7 +90,7 @@ bool Service::startResolve(TimeLimit timeLimit) {
   return true;
 }
 
-// Uses a separate connection, so that no other client is called meanwhile.
+// Uses a separate connection, so that no other client is called in the meantime.
 bool Service::resolveNow(TimeLimit timeLimit) {
   const auto daemon = Daemon::create();
   if (!daemon) return false;

@@ -18,7 +18,7 @@ namespace avahi {
 namespace {
 
 constexpr const char* kLocalDomain = "local";
-constexpr int kDomainsToBrowse = 0;  // the daemon's number for this use of a domain browser
+constexpr int kDomainsToBrowse = 0;  // the daemon's code for finding domains to browse
 
 class Browser final : public NetServiceBrowser, public std::enable_shared_from_this<Browser> {
  public:
@@ -54,17 +54,18 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   Client client_;
   void* info_;
   bool isScheduled_ = false;
-  unsigned long search_ = 0;  ///< tells this search's events from late ones of an earlier one
+  unsigned long search_ = 0;  ///< number of this search; late events of earlier ones are ignored
   std::string type_;
-  std::map<Instance, NetServiceRef> services_;  ///< so that a removal comes with the same object
+  std::map<Instance, NetServiceRef> services_;  ///< so that a removal passes the same object
   std::shared_ptr<Daemon> daemon_;              ///< held while a search runs
   std::map<std::string, Browse> browses_;       ///< by domain
   Sightings<std::string> domains_;
   std::unique_ptr<Query> domainQuery_;
 };
 
-// The domain query reports the domains that the computer or the network is configured for, without
-// the local one.
+// For an empty domain, a DomainBrowser query reports the domains that the computer or the network
+// is configured to browse. The query never reports the local domain, which is therefore always
+// browsed.
 bool Browser::searchForServices(const std::string& domain, const std::string& type) {
   if (!client_ || daemon_) return false;
   daemon_ = Daemon::shared();
@@ -159,8 +160,9 @@ void Browser::gone(const Instance& instance) {
   if (const auto node = services_.extract(instance)) tell(kNetServiceFlagRemove, node.mapped());
 }
 
-// The client is called from the main loop and not from within the daemon's, so that it may end
-// whatever it likes, and so that one that takes long delays no resolve.
+// The client is called from the main loop, not from inside the daemon's loop. It may therefore
+// destroy any object, and a slow client does not keep the daemon's loop from reading the messages
+// that are already waiting.
 void Browser::tell(unsigned long flags, const NetServiceRef& service) {
   performOnMainThread([weak = weak_from_this(), search = search_, flags, service] {
     const auto browser = weak.lock();

@@ -23,11 +23,11 @@ void Query::ask() {
   if (asked_ || isRefused_) return;
   const Message call = daemon_.newCall((std::string(kind_) + "Prepare").c_str());
   if (call && arguments_(call.get()) < 0) {
-    isRefused_ = true;  // Only a text that is not UTF-8 cannot be appended.
+    isRefused_ = true;  // Appending fails for a text that is not UTF-8, or for lack of memory.
     return;
   }
-  // The answer may come when this query is gone or has been sent again. It then names an object
-  // that nobody uses.
+  // The answer may arrive after this query has been destroyed or sent again. The object that it
+  // names is then unused and is freed.
   asked_ = std::make_shared<char>();
   const auto answer = [this, &daemon = daemon_, interface = interface(),
                        asked = std::weak_ptr(asked_)](sd_bus_message* reply) {
@@ -59,7 +59,7 @@ void Query::answered(sd_bus_message* reply) {
 
 void Query::signalled(sd_bus_message* signal) {
   const std::string_view member = sd_bus_message_get_member(signal);
-  if (member == "ItemNew") {
+  if (member == "ItemNew" || member == "Found") {
     handler_(Event::kFound, signal);
   } else if (member == "ItemRemove") {
     handler_(Event::kGone, signal);

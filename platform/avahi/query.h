@@ -13,30 +13,31 @@ namespace onramp::avahi {
 inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
-/// A question to the daemon that stays open as long as this object lives: a browser object of
-/// Avahi's D-Bus interface, version 0.8. (The daemon delays by 10 ms what the methods of earlier
-/// versions start; the *Prepare methods of 0.8 avoid that.)
+/// A question to the daemon that stays open for as long as this object exists. In the daemon it is
+/// a browser or resolver object of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms
+/// before it starts one that was made with an earlier version's method. The *Prepare methods of 0.8
+/// avoid that.)
 class Query {
  public:
   enum class Event {
-    kFound,           ///< the message is at the arguments of ItemNew
-    kGone,            ///< the message is at the arguments of ItemRemove
-    kCacheExhausted,  ///< the daemon has reported all that it knew already
-    kLost,            ///< the daemon went away or failed: what was found so far is void
+    kFound,           ///< a new result; the message is at the arguments of ItemNew or Found
+    kGone,            ///< a removed result; the message is at the arguments of ItemRemove
+    kCacheExhausted,  ///< the daemon has reported everything in its cache
+    kLost,            ///< the daemon went away or failed: all results so far are invalid
   };
-  /// Called from within the daemon's loop. It must not destroy the query.
+  /// Called from inside the daemon's loop. The handler must not destroy the query.
   using Handler = std::function<void(Event event, sd_bus_message* message)>;
-  /// Appends the arguments of the *Prepare method. Returns a negative number on failure.
+  /// Appends the arguments of the *Prepare method to `call`. Returns a negative number on failure.
   using Arguments = std::function<int(sd_bus_message* call)>;
 
-  /// `kind` names the objects, such as "RecordBrowser", and is not copied. The daemon must outlive
-  /// the query.
+  /// `kind` is the object's kind in the daemon, such as "RecordBrowser". The text is not copied, so
+  /// it must outlive the query, and so must `daemon`.
   Query(Daemon& daemon, const char* kind, Arguments arguments, Handler handler);
   Query(const Query&) = delete;
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Whether the daemon calls the question invalid. Such a question is not repeated.
+  /// Returns whether the question is invalid. Such a question is not repeated.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:
@@ -53,8 +54,8 @@ class Query {
   const char* kind_;
   Arguments arguments_;
   Handler handler_;
-  std::shared_ptr<char> asked_;  ///< set while an answer or an object is expected or held
-  std::string path_;             ///< the daemon's name for the object; empty before it has one
+  std::shared_ptr<char> asked_;  ///< set while an answer is expected or the daemon holds the object
+  std::string path_;  ///< the object's path in the daemon; empty while there is no object
   bool isRefused_ = false;
 };
 

@@ -2,10 +2,7 @@
 
 #include <algorithm>
 #include <cstring>
-#include <string_view>
 #include <utility>
-
-#include "base/byte_reader.h"
 
 namespace onramp::avahi {
 
@@ -28,14 +25,6 @@ std::optional<Records::Record> recordIn(sd_bus_message* message) {
   const auto* const bytes = static_cast<const std::byte*>(data);
   record.data.assign(bytes, bytes + size);
   return record;
-}
-
-// The daemon takes every other character as it stands.
-void appendLabel(std::string& name, std::string_view label) {
-  for (const char c : label) {
-    if (c == '.' || c == '\\') name += '\\';
-    name += c;
-  }
 }
 
 template <typename Number>
@@ -73,29 +62,6 @@ void Records::happened(Query::Event event, sd_bus_message* message) {
       break;
   }
   changed_();
-}
-
-std::string fullName(const Instance& instance) {
-  std::string name;
-  appendLabel(name, instance.name);
-  return name + '.' + instance.type + '.' + instance.domain;
-}
-
-std::optional<Server> serverIn(const Data& data) {
-  ByteReader reader{std::span(data)};
-  Server server;
-  const auto priorityAndWeight = reader.take(4);
-  const auto port = reader.number(2);
-  if (!priorityAndWeight || !port) return std::nullopt;
-  server.port = static_cast<std::uint16_t>(*port);
-  while (const auto length = reader.byte()) {
-    if (*length == 0) return server.host.empty() ? std::nullopt : std::optional(server);
-    const auto label = reader.text(*length);
-    if (!label) return std::nullopt;
-    if (!server.host.empty()) server.host += '.';
-    appendLabel(server.host, *label);
-  }
-  return std::nullopt;
 }
 
 std::optional<Data> socketAddress(const Records::Record& record, std::uint16_t port) {

@@ -12,8 +12,8 @@
 
 namespace onramp::avahi {
 
-/// The three parts of a service's name as the daemon writes them: without escapes in the name, and
-/// without closing dots.
+/// The three parts of a service's full name. As in the daemon's messages, the name has no escapes,
+/// and the type and the domain have no closing dots.
 struct Instance {
   std::string name;
   std::string type;
@@ -23,8 +23,8 @@ struct Instance {
   }
 };
 
-/// The DNS record types that are used here (RFC 1035 section 3.2.2, RFC 3596, RFC 2782).
-enum class RecordType : std::uint16_t { kIPv4 = 1, kTXT = 16, kIPv6 = 28, kServer = 33 };
+/// The DNS record types that this backend uses (RFC 1035 section 3.2.2, RFC 3596).
+enum class RecordType : std::uint16_t { kIPv4 = 1, kIPv6 = 28 };
 
 /// The records of one name and type on any interface and protocol, kept up to date.
 class Records {
@@ -36,17 +36,15 @@ class Records {
     friend bool operator==(const Record&, const Record&) = default;
   };
 
-  /// `name` is a domain name with escapes, without closing dot. `changed` is called from within the
-  /// daemon's loop and must not destroy this object.
+  /// `name` is a domain name with escapes and without a closing dot. `changed` is called from
+  /// inside the daemon's loop after every change and must not destroy this object.
   Records(Daemon& daemon, const std::string& name, RecordType type, std::function<void()> changed);
 
-  /// The present records, in the order in which the daemon reported them.
+  /// Returns the current records in the order in which the daemon reported them.
   [[nodiscard]] const std::vector<Record>& all() const { return records_; }
 
-  /// Whether the daemon has reported all that it knew already.
+  /// Returns whether the daemon has reported everything in its cache.
   [[nodiscard]] bool isCacheExhausted() const { return isCacheExhausted_; }
-
-  [[nodiscard]] bool isRefused() const { return query_.isRefused(); }
 
  private:
   void happened(Query::Event event, sd_bus_message* message);
@@ -57,20 +55,9 @@ class Records {
   Query query_;
 };
 
-/// The instance's full domain name, with escapes (RFC 6763 section 4.3).
-[[nodiscard]] std::string fullName(const Instance& instance);
-
-/// What an SRV record says: where a service is offered.
-struct Server {
-  std::string host;  ///< a domain name with escapes, without closing dot
-  std::uint16_t port = 0;
-};
-
-/// Reads an SRV record's data (RFC 2782). Nothing when it is malformed.
-[[nodiscard]] std::optional<Server> serverIn(const Data& data);
-
-/// Makes the socket address that NetService::addressing() describes from an address record. Nothing
-/// when the data has the size of neither an IPv4 nor an IPv6 address.
+/// Converts an address record to a socket address in the layout that NetService::addressing()
+/// describes. Returns nothing when the record's data has the size of neither an IPv4 nor an IPv6
+/// address.
 [[nodiscard]] std::optional<Data> socketAddress(const Records::Record& record, std::uint16_t port);
 
 }  // namespace onramp::avahi

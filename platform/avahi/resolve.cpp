@@ -7,15 +7,49 @@ namespace onramp::avahi {
 
 namespace {
 
-// Long enough for one repetition of a question whose first answer was lost.
+// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. In this
+// time the daemon can repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
+
+// A service resolver reports only one address, and Records reports all of them.
+constexpr unsigned kNoAddress = 8;
+
+struct Server {
+  std::string host;
+  std::uint16_t port = 0;
+  Data txt;
+};
+
+// Reads the arguments of a service resolver's Found signal. The strings of the TXT record become
+// the record's data again (RFC 1035 section 3.3.14): the signal has them in reverse order. A record
+// without strings is written as one empty string.
+std::optional<Server> serverIn(sd_bus_message* message) {
+  Server server;
+  const char* host = nullptr;
+  if (sd_bus_message_skip(message, "iisss") < 0 || sd_bus_message_read(message, "s", &host) <= 0 ||
+      sd_bus_message_skip(message, "is") < 0 ||
+      sd_bus_message_read(message, "q", &server.port) <= 0 ||
+      sd_bus_message_enter_container(message, 'a', "ay") < 0) {
+    return std::nullopt;
+  }
+  server.host = host;
+  const void* text = nullptr;
+  std::size_t size = 0;
+  while (sd_bus_message_read_array(message, 'y', &text, &size) > 0) {
+    const auto* const bytes = static_cast<const std::byte*>(text);
+    server.txt.insert(server.txt.begin(), bytes, bytes + size);
+    server.txt.insert(server.txt.begin(), static_cast<std::byte>(size));
+  }
+  if (server.txt.empty()) server.txt.push_back(std::byte{0});
+  return server.host.empty() ? std::nullopt : std::optional(std::move(server));
+}
 
 }  // namespace
 
 Resolve::Resolve(Daemon& daemon, const Instance& service,
                  std::optional<std::chrono::milliseconds> timeLimit, Report report)
     : daemon_(daemon),
-      name_(fullName(service)),
+      name_(service),
       report_(std::move(report)),
       check_(
           daemon.loop(), [this] { check(); }, SD_EVENT_PRIORITY_IDLE),
@@ -30,41 +64,54 @@ Resolve::Resolve(Daemon& daemon, const Instance& service,
 
 void Resolve::begin() {
   losses_ = daemon_.losses();
+  graceForIPv4_.stop();
   ipv4_.reset();
   ipv6_.reset();
-  txtData_.reset();
-  ask(server_, name_, RecordType::kServer);
-  ask(txt_, name_, RecordType::kTXT);
+  host_.clear();
+  service_.emplace(
+      daemon_, "ServiceResolver",
+      [name = name_](sd_bus_message* call) {
+        return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
+                                     name.name.c_str(), name.type.c_str(), name.domain.c_str(),
+                                     kAnyProtocol, kNoAddress);
+      },
+      [this](Query::Event event, sd_bus_message* message) { happened(event, message); });
 }
 
-void Resolve::ask(std::optional<Records>& records, const std::string& name, RecordType type) {
-  records.emplace(daemon_, name, type, [this] { check_.start(std::chrono::milliseconds(0)); });
+// The daemon gives up after some seconds with a failure, after which the query asks again.
+void Resolve::happened(Query::Event event, sd_bus_message* message) {
+  if (auto server = event == Query::Event::kFound ? serverIn(message) : std::nullopt) {
+    host_ = std::move(server->host);
+    port_ = server->port;
+    txt_ = std::move(server->txt);
+  }
+  checkSoon();
+}
+
+void Resolve::checkSoon() {
+  check_.start(std::chrono::milliseconds(0));
+}
+
+void Resolve::ask(std::optional<Records>& addresses, RecordType type) {
+  addresses.emplace(daemon_, host_, type, [this] { checkSoon(); });
 }
 
 void Resolve::check() {
   if (!report_) return;
   if (losses_ != daemon_.losses()) begin();
-  if (txt_ && !txt_->all().empty()) {
-    txtData_ = txt_->all().front().data;
-    txt_.reset();
-  }
-  const auto server =
-      server_ && !server_->all().empty() ? serverIn(server_->all().front().data) : std::nullopt;
-  if (server) {
-    host_ = server->host;
-    port_ = server->port;
-    server_.reset();
+  if (service_ && !host_.empty()) {
+    service_.reset();
     isGraceOver_ = false;
-    ask(ipv4_, host_, RecordType::kIPv4);
+    ask(ipv4_, RecordType::kIPv4);
   }
   const Records* const addresses = knownAddresses();
-  if (!addresses || !txtData_) return;
+  if (!addresses) return;
 
-  Resolution resolution{{}, *txtData_};
+  Resolution resolution{{}, txt_};
   for (const Records::Record& record : addresses->all()) {
     const auto address = socketAddress(record, port_);
     auto& list = resolution.addressing;
-    // The daemon reports it again for each interface and protocol.
+    // The daemon reports the same address once for each interface and protocol.
     if (address && std::find(list.begin(), list.end(), *address) == list.end()) {
       list.push_back(*address);
     }
@@ -72,13 +119,13 @@ void Resolve::check() {
   end(std::move(resolution));
 }
 
-// The IPv4 addresses, or the IPv6 ones when no IPv4 address has come in time. Null while neither is
-// known.
+// Returns the IPv4 addresses, or the IPv6 addresses when no IPv4 address has arrived in time.
+// Returns null while no usable address is known.
 const Records* Resolve::knownAddresses() {
   if (!ipv4_ || !ipv4_->isCacheExhausted()) return nullptr;
   if (!ipv4_->all().empty()) return &*ipv4_;
   if (!ipv6_) {
-    ask(ipv6_, host_, RecordType::kIPv6);
+    ask(ipv6_, RecordType::kIPv6);
     graceForIPv4_.start(kGraceForIPv4);
   }
   return isGraceOver_ && !ipv6_->all().empty() ? &*ipv6_ : nullptr;

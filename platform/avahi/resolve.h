@@ -20,45 +20,47 @@ struct Resolution {
   Data txt;
 };
 
-/// Looks for the server, the TXT record and the addresses of one service, on any interface and
-/// protocol. It goes on until it has all of them or its time is up. When the daemon goes away, it
-/// begins again with the next one.
+/// Looks up the server, the TXT record and the addresses of one service on any interface and
+/// protocol. The resolve continues until it has all of them or its time is up. When the daemon goes
+/// away, the resolve starts again once the daemon is back.
 class Resolve {
  public:
-  /// Called once, from within the daemon's loop, and with nothing when the time is up. It must not
-  /// destroy the resolve.
+  /// Called once, from inside the daemon's loop. The argument is nothing when the time is up. The
+  /// function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
   /// The daemon must outlive the resolve.
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
-  /// Whether the daemon says that no service can have that name.
-  [[nodiscard]] bool isRefused() const { return server_ && server_->isRefused(); }
+  /// Returns whether the service's name is invalid, so that the daemon cannot look it up.
+  [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:
   void begin();
-  void ask(std::optional<Records>& records, const std::string& name, RecordType type);
+  void happened(Query::Event event, sd_bus_message* message);
+  void ask(std::optional<Records>& addresses, RecordType type);
+  void checkSoon();
   void check();
   [[nodiscard]] const Records* knownAddresses();
   void end(std::optional<Resolution> resolution);
 
   Daemon& daemon_;
-  std::string name_;
+  Instance name_;
   Report report_;
-  Timer check_;  ///< due after a change, when all messages are read
+  Timer check_;  ///< runs after a change, once all messages have been read
   Timer timeUp_;
   Timer graceForIPv4_;
   bool isGraceOver_ = false;
-  unsigned losses_ = 0;  ///< of the daemon, when the resolve began
-  // A daemon allows each client a limited number of questions, so each ends with its answer.
-  std::optional<Records> server_;
-  std::optional<Records> txt_;
+  unsigned losses_ = 0;  ///< the daemon's losses() when the resolve last began
+  // The daemon limits the number of questions that a client has open, so this one is closed as
+  // soon as it is answered.
+  std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;
-  std::string host_;
+  std::string host_;  ///< empty until the daemon has named it
   std::uint16_t port_ = 0;
-  std::optional<Data> txtData_;
+  Data txt_;
 };
 
 }  // namespace onramp::avahi

@@ -5,7 +5,7 @@
 
 namespace onramp::avahi {
 
-/// Tells the watch that watchSightings() has set, if there is one.
+/// Passes a sighting to the function that watchSightings() has set, if there is one.
 void tellSighting(const Instance& instance, Place place, bool isGone);
 
 }  // namespace onramp::avahi

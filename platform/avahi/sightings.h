@@ -8,21 +8,22 @@
 
 namespace onramp::avahi {
 
-/// An interface and a protocol on which something is seen, by the daemon's numbers.
+/// The daemon's numbers for the interface and the protocol on which a service or domain is seen.
 using Place = std::pair<std::int32_t, std::int32_t>;
 
-/// Folds the sightings of things on several interfaces and protocols into one presence of each.
+/// Merges the sightings of a thing on several interfaces and protocols. The thing is present from
+/// its first sighting until its last sighting is removed.
 template <typename Thing>
 class Sightings {
  public:
-  /// Returns whether this is the thing's first sighting.
+  /// Adds a sighting. Returns whether it is the thing's first one.
   bool add(const Thing& thing, Place place) {
     auto& places = places_[thing];
     const bool isNew = places.insert(place).second;
     return isNew && places.size() == 1;
   }
 
-  /// Returns whether the thing's last sighting is gone with this one.
+  /// Removes a sighting. Returns whether it was the thing's last one.
   bool remove(const Thing& thing, Place place) {
     const auto found = places_.find(thing);
     if (found == places_.end()) return false;

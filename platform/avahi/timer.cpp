@@ -7,7 +7,7 @@ namespace onramp::avahi {
 
 namespace {
 
-constexpr std::uint64_t kMicrosecond = 1;  // as precise as sd-event can be
+constexpr std::uint64_t kMicrosecond = 1;  // the best accuracy that sd-event offers
 
 }  // namespace
 
@@ -32,6 +32,10 @@ void Timer::start(std::chrono::milliseconds wait) {
   sd_event_source_set_time_relative(source_.get(),
                                     static_cast<std::uint64_t>(microseconds.count()));
   sd_event_source_set_enabled(source_.get(), SD_EVENT_ONESHOT);
+}
+
+void Timer::stop() {
+  sd_event_source_set_enabled(source_.get(), SD_EVENT_OFF);
 }
 
 void Timer::ensure(std::chrono::milliseconds wait) {

@@ -8,12 +8,13 @@
 
 namespace onramp::avahi {
 
-/// Calls back once after a while, from within an event loop. When the system has no memory or
-/// descriptor for it, it does nothing and isUsable() returns false.
+/// Calls an action once after a given time, from inside an event loop. When the system provides no
+/// memory or descriptor, the timer does nothing and isUsable() returns false.
 class Timer {
  public:
-  /// What is due in a loop at the same time happens in the order of the priorities. Timers of
-  /// SD_EVENT_PRIORITY_IDLE come after all messages. The action must not destroy the timer.
+  /// Events that are due in a loop at the same time are handled in the order of their priorities.
+  /// Timers with SD_EVENT_PRIORITY_IDLE run after all messages have been handled. `action` must not
+  /// destroy the timer.
   Timer(sd_event* loop, std::function<void()> action,
         std::int64_t priority = SD_EVENT_PRIORITY_NORMAL);
   Timer(const Timer&) = delete;
@@ -22,10 +23,12 @@ class Timer {
 
   [[nodiscard]] bool isUsable() const { return source_ != nullptr; }
 
-  /// Starts the wait, from the beginning if it is under way.
+  /// Starts the wait, or restarts it if it is already running.
   void start(std::chrono::milliseconds wait);
-  /// Starts the wait unless it is under way.
+  /// Starts the wait unless it is already running.
   void ensure(std::chrono::milliseconds wait);
+  /// Ends the wait without calling the action. Does nothing when the timer is not running.
+  void stop();
 
  private:
   std::function<void()> action_;

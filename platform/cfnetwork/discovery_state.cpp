@@ -2,12 +2,12 @@
 
 namespace onramp {
 
-// The system starts its responder again whenever it ends.
+// There is never a problem, because macOS restarts its responder whenever the responder ends.
 std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }
 
-// The seam takes the watch by value, since a backend that has sightings keeps it.
+// The parameter is passed by value, because a backend that receives sightings stores it.
 // NOLINTNEXTLINE(performance-unnecessary-value-param)
 void watchSightings(std::function<void(const ServiceSighting&)>) {}
 

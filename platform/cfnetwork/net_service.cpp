@@ -16,7 +16,7 @@ using corefoundation::toString;
 
 class CFService;
 
-// The living handles, by their services.
+// The existing handles, by the services that they wrap.
 std::map<CFNetServiceRef, std::weak_ptr<CFService>>& liveServices() {
   static std::map<CFNetServiceRef, std::weak_ptr<CFService>> services;
   return services;
@@ -88,7 +88,7 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   void cancel() override { CFNetServiceCancel(service_.get()); }
 
  private:
-  // The client may let go of the last handle.
+  // `self` keeps this object alive, because the client may release the last other handle.
   static void resolved(CFNetServiceRef, CFStreamError* error, void* info) {
     const auto self = static_cast<CFService*>(info)->shared_from_this();
     self->isResolved_ = !error || error->error == 0;

@@ -6,7 +6,8 @@
 
 namespace onramp::cfnetwork {
 
-/// The handle of `service`: the same one for as long as it lives. Null for null.
+/// Returns the handle for `service`. Repeated calls return the same handle for as long as it
+/// exists. Returns null when `service` is null.
 [[nodiscard]] NetServiceRef handleOf(CFNetServiceRef service);
 
 }  // namespace onramp::cfnetwork

@@ -14,7 +14,8 @@ namespace onramp {
 
 namespace {
 
-// An error that comes at once must not keep the processor busy.
+// The pause before a retry. Without it, a search that fails immediately would keep the processor
+// busy.
 constexpr std::chrono::seconds kRetryPause{1};
 
 using corefoundation::Reference;
@@ -75,7 +76,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     ++search_;
   }
 
-  // The client may let go of the last handle.
+  // `self` keeps this object alive, because the client may release the last other handle.
   static void browsed(CFNetServiceBrowserRef, CFOptionFlags flags, CFTypeRef found,
                       CFStreamError* error, void* info) {
     const auto self = static_cast<CFBrowser*>(info)->shared_from_this();
@@ -83,7 +84,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
       self->failed({error->error});
       return;
     }
-    // CFNetServiceRef is not const, but `found` is. It is a service, since no domains are searched.
+    // `found` is a service, because this browser never searches for domains. CFTypeRef is a pointer
+    // to const, but CFNetServiceRef is not.
     const NetServiceRef service =
         cfnetwork::handleOf(static_cast<CFNetServiceRef>(const_cast<void*>(found)));
     if (!service) return;
@@ -110,8 +112,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     return gone;
   }
 
-  // The responder may have gone away, for instance. The next search finds all services again, so
-  // they are reported as gone. Stopping a search may cause another error, which is ignored.
+  // A search fails, for instance, when the responder goes away. All services are reported as gone,
+  // because the next search will find them again. Stopping a search may cause another error, which
+  // is ignored.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;
     isFailed_ = true;
@@ -142,11 +145,11 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Client client_;
   void* info_;
   Reference<CFNetServiceBrowserRef> browser_;
-  Reference<CFStringRef> domain_;  ///< of the running search; null without one
+  Reference<CFStringRef> domain_;  ///< of the running search; null when there is none
   Reference<CFStringRef> type_;
   std::vector<Found> found_;
-  unsigned long search_ = 0;  ///< tells this search's retry from a late one of an earlier one
-  bool isFailed_ = false;     ///< the next try is pending
+  unsigned long search_ = 0;  ///< number of this search; retries of earlier ones are ignored
+  bool isFailed_ = false;     ///< a retry is pending
 };
 
 }  // namespace

@@ -4,7 +4,8 @@
 
 #include <functional>
 
-/// Wraps a function as the target of controls, menu items, timers and messages between threads.
+/// Wraps a function in an object, so that controls, menu items, timers and messages between threads
+/// can call it.
 @interface OnrampAction : NSObject {
   std::function<void()> _function;
 }

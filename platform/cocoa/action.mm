@@ -10,7 +10,8 @@
   return action;
 }
 
-// The function may release the last reference to this object.
+// Keeps this object alive during the call, because the function may release the last other
+// reference to it.
 - (void)perform:(id)sender {
   [[self retain] autorelease];
   _function();

@@ -7,7 +7,7 @@
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
-/// Receives a sheet's answer, passes it on and releases itself.
+/// Receives a sheet's return code, passes it to the function and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }
@@ -25,7 +25,7 @@
          returnCode:(NSInteger)returnCode
         contextInfo:(void*)contextInfo {
   [self autorelease];
-  // A sheet may also be ended from elsewhere, with a code that is none of its buttons'.
+  // The sheet may also be ended by other code, with a return code that belongs to no button.
   _didEnd(returnCode == NSAlertSecondButtonReturn ? onramp::kAlertOtherReturn
                                                   : onramp::kAlertDefaultReturn);
 }
@@ -53,7 +53,8 @@ void runCriticalAlert(const std::string& messageText, const std::string& informa
   const Retained<NSAlert> alert = makeAlert(messageText, informativeText);
   [alert.get() setAlertStyle:NSCriticalAlertStyle];
   [alert.get() addButtonWithTitle:toNSString(buttonTitle)];
-  // The alert at launch comes before the application is active, and would open behind the Finder.
+  // An alert at launch is shown before the application is active. It would otherwise open behind
+  // the Finder's windows.
   [NSApp activateIgnoringOtherApps:YES];
   [alert.get() runModal];
 }
@@ -63,7 +64,7 @@ void beginAlertSheet(const AlertSheet& sheet, const Window& window,
   const Retained<NSAlert> alert = makeAlert(sheet.title, sheet.message);
   [alert.get() addButtonWithTitle:toNSString(sheet.defaultButton)];
   [alert.get() addButtonWithTitle:toNSString(sheet.otherButton)];
-  // The user may quit or log out while the sheet is up.
+  // Lets the user quit or log out while the sheet is shown.
   [[alert.get() window] setPreventsApplicationTerminationWhenModal:NO];
   [alert.get() beginSheetModalForWindow:cocoa::nativeOf<NSWindow>(window)
                           modalDelegate:[[OnrampSheetEnd alloc] initWithFunction:std::move(didEnd)]

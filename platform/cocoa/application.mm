@@ -64,7 +64,7 @@ namespace onramp {
 
 using cocoa::Retained;
 
-// AppKit reads its own options from the process's arguments.
+// The arguments are not passed on, because AppKit reads its options from the process itself.
 int runApplication(int, char**, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate) {
   @autoreleasepool {

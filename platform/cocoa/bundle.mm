@@ -10,7 +10,7 @@ using cocoa::toStdString;
 
 namespace {
 
-// NSBundle keeps one object for each bundle that was opened.
+// NSBundle caches one object for each bundle, so repeated calls are cheap.
 NSBundle* bundleAt(const std::string& path) {
   return [NSBundle bundleWithPath:toNSString(path)];
 }

@@ -55,7 +55,7 @@ void PopUpButton::removeItem(std::size_t index) const {
   [nativeOf<NSPopUpButton>(*this) removeItemAtIndex:static_cast<NSInteger>(index)];
 }
 
-// A menu item retains its represented object but not its target, so the action is both.
+// A menu item retains its represented object but not its target, so `target` is set as both.
 void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {
   NSPopUpButton* const button = nativeOf<NSPopUpButton>(*this);
   if (!button) return;

@@ -4,8 +4,8 @@
 
 #include "platform/interface_file.h"
 
-/// The file's owner in an interface file, in place of an InterfaceOwner. A binding to any of its
-/// keys shows the InterfaceOwner's text under that key.
+/// Takes the place of an InterfaceOwner as the owner of an interface file. A binding to any key of
+/// this object shows the InterfaceOwner's text under that key.
 @interface OnrampFileOwner : NSObject {
   onramp::InterfaceOwner* _owner;
   NSMutableSet* _boundKeys;
@@ -15,7 +15,7 @@
 /// `owner` must outlive the object.
 - (instancetype)initWithOwner:(onramp::InterfaceOwner&)owner;
 
-/// The window that the file connects to the outlet "window"; nil when it connects none.
+/// The window that the file connects to the outlet "window"; nil when the file connects none.
 - (NSWindow*)window;
 - (void)setWindow:(NSWindow*)window;
 

@@ -23,12 +23,13 @@
   return _window;
 }
 
-// Not retained: the interface that the window was loaded with owns it.
+// The window is not retained, because the Interface that loaded the file owns the window.
 - (void)setWindow:(NSWindow*)window {
   _window = window;
 }
 
-// A binding begins by asking for its key's value. From then on it is notified of every change.
+// A binding first asks for the value of its key. From then on, this object notifies the binding of
+// every change.
 - (id)valueForUndefinedKey:(NSString*)key {
   const std::string name = onramp::cocoa::toStdString(key);
   if (![_boundKeys containsObject:key]) {

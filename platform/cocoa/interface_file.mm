@@ -67,7 +67,8 @@ NSView* findView(NSView* view, NSString* identifier, Class kind) {
   return nil;
 }
 
-// Translates the tool tips, which also serve as accessibility labels of untitled controls.
+// Translates the tool tips and makes each one the accessibility label of its view. Only controls
+// without a title have tool tips.
 void localize(NSView* view, const std::string& interfaceName) {
   if (const std::string key = toStdString([view toolTip]); !key.empty()) {
     NSString* const text = toNSString(Bundle::main().localizedString(key, key, interfaceName));
@@ -78,7 +79,8 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// Actions that the file sends to the first responder are the owner's.
+// Connects buttons to the owner's actions. In the file, such a button sends its action to the first
+// responder, so it has an action but no target.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {
@@ -97,8 +99,8 @@ void connectActions(NSView* view, InterfaceOwner& owner,
     connectActions(subview, owner, actions);
 }
 
-// The file's top-level objects; nil when there is no such file or it is damaged, which the loader
-// reports by an exception or a result.
+// Returns the file's top-level objects, or nil when the file is missing or damaged. The loader
+// reports such a failure by an exception or by its result.
 NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
   NSArray* topLevelObjects = nil;
   @try {
@@ -132,8 +134,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {
-    // AppKit asks the delegate whether the application may quit during a modal loop or a sheet, and
-    // does not refuse by itself.
+    // Makes AppKit ask the delegate whether the application may quit during a modal loop or a sheet.
     [window setPreventsApplicationTerminationWhenModal:NO];
     localize([window contentView], name);
     connectActions([window contentView], owner, tree -> actions);
@@ -145,12 +146,12 @@ View Interface::view() const {
   return View(cocoa::toNative(rootView(tree_->topLevelObjects.get())));
 }
 
-// The identifier carries the page class, which AppKit does not know.
+// The view's identifier names the page's class, because AppKit does not know page classes.
 std::string Interface::viewClass() const {
   return toStdString([rootView(tree_->topLevelObjects.get()) identifier]);
 }
 
-// Views are found by their identifiers, the window by the owner's outlet.
+// Finds a view by its identifier, and the window through the owner's outlet.
 NativeObject* Interface::find(std::string_view name, OutletKind kind) const {
   NSWindow* const window = [tree_->owner.get() window];
   if (kind == OutletKind::kWindow) return name == kWindowOutlet ? cocoa::toNative(window) : nullptr;

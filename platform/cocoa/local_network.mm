@@ -1,6 +1,7 @@
-// Makes macOS ask for the local network while the user reads the first page. Since macOS 15 a
-// program needs the user's consent, and the system asks at the first use. Asked only when the
-// search begins, a user who stops to read the question would miss the search.
+// Makes macOS ask for access to the local network while the user reads the first page. Since macOS
+// 15 a program needs the user's consent, and the system asks for it when the program first uses the
+// network. If the system asked only when the search begins, the search might end before the user
+// has answered.
 
 #import <AppKit/AppKit.h>
 
@@ -10,7 +11,7 @@ constexpr NSTimeInterval kBrowseDuration = 1;  // seconds
 
 }  // namespace
 
-/// Browses for a moment when the wizard's window first becomes the main one.
+/// Browses for a moment when the wizard's window becomes the main window for the first time.
 @interface OnrampLocalNetwork : NSObject
 @end
 
@@ -25,7 +26,8 @@ constexpr NSTimeInterval kBrowseDuration = 1;  // seconds
 
 + (void)ask:(NSNotification*)notification {
   [[NSNotificationCenter defaultCenter] removeObserver:self];
-  // A type that the information dictionary does not list is refused without a question.
+  // For a type that is not listed in the information dictionary, macOS refuses to browse and does
+  // not ask the user.
   NSArray* const types = [[NSBundle mainBundle] objectForInfoDictionaryKey:@"NSBonjourServices"];
   if ([types count] == 0) return;
   NSNetServiceBrowser* const browser = [[[NSNetServiceBrowser alloc] init] autorelease];

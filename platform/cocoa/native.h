@@ -6,7 +6,8 @@
 
 namespace onramp::cocoa {
 
-/// The object that `outlet` stands for if it is of that class; else nil, which takes every message.
+/// Returns the object behind `outlet` if it is of class `Class`, or nil otherwise. Messages to nil
+/// do nothing.
 template <typename Class>
 [[nodiscard]] Class* nativeOf(const Outlet& outlet) {
   id const object = reinterpret_cast<id>(outlet.native());

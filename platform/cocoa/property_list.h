@@ -8,12 +8,12 @@
 
 namespace onramp::cocoa {
 
-/// Converts a property-list object to a dictionary. Leaves out members that are no property-list
-/// objects. Nothing when it is no dictionary, or exceeds the limits of nesting depth, number of
-/// objects, and bytes of texts and data.
+/// Converts a property-list object to a dictionary. Leaves out members that are not property-list
+/// objects. Returns nothing when `object` is not a dictionary or exceeds the limits in
+/// platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
-/// `value` as a property-list object.
+/// Converts `value` to a property-list object.
 [[nodiscard]] id toPropertyList(const Value& value);
 
 }  // namespace onramp::cocoa

@@ -11,7 +11,8 @@ namespace onramp {
 
 namespace {
 
-// Converts a property list to a value, within the limits.
+// Converts a property list to a value, unless the list exceeds the limits in
+// platform/property_list.h.
 class Reader {
  public:
   std::optional<Value> read(id object, std::size_t depth) {
@@ -29,7 +30,7 @@ class Reader {
   }
 
  private:
-  // The two booleans are singletons; any other number's type tells its kind.
+  // The two Boolean objects are singletons. The kind of any other number follows from its type.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);
@@ -43,7 +44,8 @@ class Reader {
     return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
   }
 
-  // Objects may share texts and data but values copy them, so the copies are limited like a file.
+  // Several containers may share one text or data object, but each value gets a copy. The total
+  // size of the copies is limited like the size of a file.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;
     if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;
@@ -61,8 +63,8 @@ class Reader {
     return Value(Data(bytes, bytes + [data length]));
   }
 
-  // Leaves out what is no property-list object: systems have put an NSURL into the information
-  // dictionaries of bundles.
+  // Leaves out objects that do not belong in a property list. Some versions of macOS have put an
+  // NSURL into the information dictionary of a bundle.
   std::optional<Value> array(NSArray* array, std::size_t depth) {
     Array values;
     for (id object in array) {
@@ -117,8 +119,8 @@ struct ToPropertyList {
   }
 };
 
-// The bytes of a regular file within the size limit. Links are resolved first, because the
-// attributes of a link are its own.
+// Returns the bytes of a regular file, or nil when the file is of another kind or exceeds the size
+// limit. Links are resolved first, because attributesOfItemAtPath: does not follow them.
 NSData* contents(NSString* path) {
   NSString* const file = [path stringByResolvingSymlinksInPath];
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file

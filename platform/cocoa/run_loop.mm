@@ -27,8 +27,9 @@ bool isModalAborted = false;
 // thread for seconds, so posted actions are held back meanwhile.
 std::atomic<bool> isAborting = false;
 
-// Runs `action` once only, even if its timer fires again inside a loop that the action runs.
-// Destroys it on the thread that ran it, although another thread may release the object last.
+// Returns an object that runs `action` only once, even if its timer fires again inside a loop that
+// the action runs. The action is destroyed on the thread that ran it, even if another thread
+// releases the object last.
 OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
@@ -44,8 +45,8 @@ void post(std::function<void()> action) {
   }
 }
 
-// Drops the clicks and keys that came in while the main thread was busy: they were meant for the
-// page that was shown then. Neither timers nor actions run in the mode in which they are fetched.
+// Drops the clicks and keys that arrived while the main thread was busy, because they were meant
+// for the page that was shown then. Timers and actions do not run in the mode used here.
 void dropWaitingInput() {
   const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
                            NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;
@@ -56,7 +57,8 @@ void dropWaitingInput() {
   }
 }
 
-// A modal loop checks whether it was stopped only after it has handled an event.
+// Posts an empty event, because a modal loop checks whether it was stopped only after it has
+// handled an event.
 void wakeEventLoop() {
   [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
                                       location:NSZeroPoint
@@ -93,16 +95,18 @@ void performOnMainThread(std::function<void()> action) {
   });
 }
 
-// AppKit may end a modal loop unasked, for example for a key that cancels; it is then run again.
+// AppKit may end a modal loop without being asked, for example when the user presses a key that
+// cancels. The loop is then run again.
 void runModalForWindow(const Window& window) {
   // Showing the window may already run an action that ends the loop.
   isModalAborted = false;
   ++modalLoops;
-  // AppKit shows no window of a hidden application.
+  // AppKit does not show windows of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
   NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
-  // The controller refuses to close the window meanwhile, and the button shows it.
+  // The close button is disabled, because the controller refuses to close the window while the loop
+  // runs.
   NSButton* const closeButton = [modal standardWindowButton:NSWindowCloseButton];
   [closeButton setEnabled:NO];
   while (modal && !isModalAborted)

@@ -6,8 +6,8 @@ namespace onramp {
 class ArrayController;
 }
 
-/// Shows an array controller's entries in a table and keeps the two selections equal. A
-/// double-click on a row does what the window's default button does.
+/// Shows an array controller's entries in a table and keeps the table's selection the same as the
+/// controller's. A double-click on a row clicks the window's default button.
 @interface OnrampTableSource : NSObject <NSTableViewDataSource, NSTableViewDelegate> {
   NSTableView* _table;
   onramp::ArrayController* _controller;
@@ -17,10 +17,10 @@ class ArrayController;
 /// Retains `table`; `controller` must outlive the object.
 - (instancetype)initWithTable:(NSTableView*)table controller:(onramp::ArrayController&)controller;
 
-/// Call when the controller's entries have changed.
+/// Call this when the controller's entries have changed.
 - (void)reload;
 
-/// Call when the controller's selection has changed.
+/// Call this when the controller's selection has changed.
 - (void)showSelection;
 
 @end

@@ -10,7 +10,7 @@ namespace {
 
 constexpr CGFloat kCellPadding = 6;  // points
 
-// The enabled button that Return presses, if the view has one.
+// Returns the enabled button in `view` that the Return key presses, or nil when there is none.
 NSButton* defaultButton(NSView* view) {
   if ([view isKindOfClass:[NSButton class]] && ![view isHidden]) {
     NSButton* const button = static_cast<NSButton*>(view);
@@ -61,8 +61,8 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   [self showSelection];
 }
 
-// Widens the columns to fit their texts. When they need more room than there is, the first column,
-// which holds the names, is narrowed.
+// Widens all columns but the first one to fit their texts. If the table is too narrow for all
+// columns, narrows the first one, which holds the names.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -123,7 +123,8 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// Follows the user's selection. When they deselect the row, it is selected again.
+// Passes the user's selection to the controller. If the user deselects the row, it is selected
+// again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;
   const NSInteger row = [_table selectedRow];

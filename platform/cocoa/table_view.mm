@@ -10,7 +10,7 @@ using cocoa::nativeOf;
 using cocoa::Retained;
 using cocoa::toNSString;
 
-// The controller owns the source, which the table only refers to.
+// The controller's callbacks own the source, because the table does not retain it.
 void TableView::bind(ArrayController& controller) const {
   NSTableView* const table = nativeOf<NSTableView>(*this);
   if (!table) return;

@@ -7,7 +7,7 @@
 
 namespace onramp::cocoa {
 
-/// `text` as a string object; empty when it is not valid UTF-8.
+/// Converts `text` to a string object. The result is empty when `text` is not valid UTF-8.
 [[nodiscard]] inline NSString* toNSString(std::string_view text) {
   NSString* const string = [[NSString alloc] initWithBytes:text.data()
                                                     length:text.size()
@@ -15,7 +15,7 @@ namespace onramp::cocoa {
   return string ? [string autorelease] : @"";
 }
 
-/// `string` in UTF-8; empty for nil.
+/// Converts `string` to UTF-8. The result is empty when `string` is nil.
 [[nodiscard]] inline std::string toStdString(NSString* string) {
   NSData* const bytes = [string dataUsingEncoding:NSUTF8StringEncoding];
   return bytes ? std::string(static_cast<const char*>([bytes bytes]), [bytes length]) : "";

@@ -7,7 +7,8 @@ using cocoa::nativeOf;
 
 namespace {
 
-// The first view of `kind` inside the view, in subview order, that accepts the keyboard focus.
+// Returns the first view of class `kind` that accepts the keyboard focus, or nil. Searches `view`
+// itself and then its subviews in their order.
 NSView* firstKeyView(NSView* view, Class kind) {
   if ([view isKindOfClass:kind] && [view canBecomeKeyView]) return view;
   for (NSView* subview in [view subviews]) {

@@ -15,7 +15,7 @@ namespace {
 using corefoundation::Reference;
 using Action = std::function<void()>;
 
-// A timer of the main run loop that runs an action once and then frees it.
+// Adds a timer to the main run loop. The timer runs `action` once and then frees it.
 void addTimer(double seconds, Action action) {
   const auto release = [](const void* info) {
     std::unique_ptr<const Action>(static_cast<const Action*>(info));
@@ -36,7 +36,8 @@ bool hasEnded = false;  // main thread only
 
 void runMainLoop() {
   hasEnded = false;
-  // A loop without sources returns at once, and stays so until another thread adds one.
+  // CFRunLoopRunInMode() returns at once while the loop has no sources or timers. The function is
+  // therefore called again until another thread has added one.
   while (!hasEnded)
     CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);
 }

@@ -20,18 +20,19 @@ struct MainLoop {
   std::mutex mutex;
   std::condition_variable posted;
   std::deque<std::function<void()>> actions;
-  // Main thread only.
+  // The members below are used only on the main thread.
   std::multimap<Clock::time_point, std::function<void()>> timers;
   bool ended = false;
 };
 
-// Never destroyed, because other threads may still post while the process exits.
+// Returns the program's only main loop. It is never destroyed, because other threads may still post
+// actions while the process exits.
 MainLoop& mainLoop() {
   static MainLoop* const instance = std::make_unique<MainLoop>().release();
   return *instance;
 }
 
-// Returns the action that is due next, after waiting until there is one.
+// Waits until an action is due, and returns it.
 std::function<void()> nextAction() {
   MainLoop& loop = mainLoop();
   std::unique_lock lock(loop.mutex);
@@ -44,7 +45,7 @@ std::function<void()> nextAction() {
   if (!hasAction()) return std::move(loop.timers.extract(loop.timers.begin()).mapped());
   std::function<void()> action = std::move(loop.actions.front());
   loop.actions.pop_front();
-  // Timers that are due must not wait for ever behind actions that keep coming.
+  // A timer that is due must not wait forever behind actions that keep arriving.
   if (!loop.timers.empty() && loop.timers.begin()->first <= Clock::now()) {
     loop.actions.push_back(std::move(loop.timers.extract(loop.timers.begin()).mapped()));
   }

@@ -10,20 +10,21 @@
 
 namespace onramp::corefoundation {
 
-/// Converts `text` to a string object; null when it is not valid UTF-8.
+/// Converts `text` to a string object. Returns null when `text` is not valid UTF-8.
 [[nodiscard]] Reference<CFStringRef> toCFString(std::string_view text);
 
 /// Converts `texts` to an array of string objects. Texts that are not valid UTF-8 are left out.
 [[nodiscard]] Reference<CFArrayRef> toCFArray(const std::vector<std::string>& texts);
 
-/// Returns the object's text in UTF-8; nothing when it is null or not a string.
+/// Returns the text of a string object in UTF-8. Returns nothing when `object` is null or not a
+/// string.
 [[nodiscard]] std::optional<std::string> toString(CFTypeRef object);
 
 /// Copies the bytes of `data`, which must not be null.
 [[nodiscard]] Data toData(CFDataRef data);
 
-/// Converts a string, or an array or dictionary of such objects, to a value. Members of other kinds
-/// are left out. Nothing when the object is null or of another kind itself.
+/// Converts an object to a value. The object may be a string, an array or a dictionary. Members of
+/// other kinds are left out. Returns nothing when `object` is null or of another kind.
 [[nodiscard]] std::optional<Value> toValue(CFTypeRef object);
 
 }  // namespace onramp::corefoundation

@@ -25,7 +25,7 @@ bool isFile(const std::string& path) {
   return fs::is_regular_file(path, ignored);
 }
 
-// The languages that have a folder in the resources folder, in an order of no meaning.
+// Returns the languages that have a folder in the resources folder, in no particular order.
 std::vector<std::string> offeredLanguages(const std::string& resources) {
   std::vector<std::string> languages;
   std::error_code error;

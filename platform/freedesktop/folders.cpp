@@ -12,7 +12,8 @@ namespace onramp {
 
 namespace {
 
-// By the XDG base directories, relative paths are ignored.
+// Returns an absolute path without its trailing slashes. Returns an empty text for a relative path,
+// because the XDG Base Directory Specification says that relative paths must be ignored.
 std::string absolutePath(std::string_view path) {
   while (path.size() > 1 && path.ends_with('/'))
     path.remove_suffix(1);

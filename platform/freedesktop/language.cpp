@@ -15,7 +15,8 @@ struct Renamed {
   std::string_view to;
 };
 
-// Names that bundles used before language codes, and codes that have been replaced.
+// Language names that bundles used before there were language codes, and codes that have since been
+// replaced.
 constexpr std::array kRenamed = {
     Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},
     Renamed{"japanese", "ja"},  Renamed{"italian", "it"}, Renamed{"spanish", "es"},
@@ -48,12 +49,12 @@ std::string chineseScript(std::string_view region) {
   return region == "TW" || region == "HK" || region == "MO" ? "Hant" : "Hans";
 }
 
-// A bundle that offers Norwegian offers Bokmål.
+// Treats Norwegian Bokmål (nb) and Norwegian (no) as the same language.
 std::string_view offeredAs(std::string_view code) {
   return code == "nb" ? "no" : code;
 }
 
-// How well an offered language matches a preferred one; 0 when it does not match.
+// Returns how well an offered language matches a preferred one. 0 means that it does not match.
 int fitness(const Language& offered, const Language& preferred) {
   if (offered.code.empty() || offeredAs(offered.code) != offeredAs(preferred.code)) return 0;
   if (!offered.script.empty() && !preferred.script.empty() && offered.script != preferred.script) {
@@ -64,7 +65,7 @@ int fitness(const Language& offered, const Language& preferred) {
 }
 
 // Moves the languages in `offered` that match `wanted` to the end of `chosen`, the best match
-// first.
+// first. Returns whether there was a match.
 bool choose(std::vector<std::string>& offered, const Language& wanted,
             std::vector<std::string>& chosen) {
   std::vector<std::pair<int, std::string>> fitting;

@@ -15,7 +15,8 @@ std::string environment(const char* name) {
   return value ? value : "";
 }
 
-// The locale that the environment names for messages; empty for C and POSIX.
+// Returns the locale for messages from the environment. The result is empty when there is none, and
+// for the locales C and POSIX.
 std::string messagesLocale() {
   for (const char* const name : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
     const std::string locale = environment(name);
@@ -44,7 +45,7 @@ std::string localeCountryCode() {
 std::vector<std::string> preferredLanguages() {
   const std::string locale = messagesLocale();
   if (locale.empty()) return {kDefaultLanguage};
-  // As in gettext, the list is ignored in a locale without translations.
+  // As in gettext, the list in LANGUAGE is ignored when the locale is C or POSIX.
   const std::string list = environment("LANGUAGE") + ":" + locale;
   std::vector<std::string> languages;
   for (std::size_t at = 0; at <= list.size();) {

@@ -1,6 +1,9 @@
 #include "platform/lowercase.h"
 
 #include <wctype.h>
+#if __has_include(<xlocale.h>)
+#include <xlocale.h>  // macOS declares newlocale() only here
+#endif
 
 #include <clocale>
 #include <string_view>
@@ -11,7 +14,8 @@ namespace onramp {
 
 namespace {
 
-// The user's own locale will not do: in Turkish "I" becomes a letter without a dot.
+// Converts letters by the rules of a neutral locale. The user's own locale is not suitable, because
+// in Turkish "I" becomes a letter without a dot.
 class PlainLetters {
  public:
   PlainLetters() : locale_(newlocale(LC_CTYPE_MASK, "C.UTF-8", nullptr)) {}

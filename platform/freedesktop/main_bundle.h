@@ -4,12 +4,13 @@
 
 namespace onramp {
 
-/// Makes the folder at `path` (absolute) the running application's bundle instead of the one that
-/// holds its executable. For tests.
+/// Makes the folder at `path`, an absolute path, the running application's bundle. Tests use this,
+/// and so do tools that examine another application.
 void setMainBundlePath(std::string path);
 
-/// Path of the running application's bundle, without a closing "/": the folder that holds
-/// Contents/<system>/<executable>. For an executable anywhere else, its own folder.
+/// Returns the path of the running application's bundle, without a trailing "/". The bundle is the
+/// folder that holds Contents/<system>/<executable>. For an executable that is located elsewhere,
+/// it is the executable's own folder.
 [[nodiscard]] std::string mainBundlePath();
 
 }  // namespace onramp

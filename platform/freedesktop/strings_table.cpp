@@ -14,7 +14,8 @@ namespace onramp {
 
 namespace {
 
-// Octal escapes name characters of the NEXTSTEP character set, whose lower half is ASCII.
+// Octal escapes name characters of the NEXTSTEP character set. Its lower half is ASCII. This table
+// is its upper half.
 constexpr std::array<char16_t, 128> kNextStepUpperHalf = {
     0x00A0, 0x00C0, 0x00C1, 0x00C2, 0x00C3, 0x00C4, 0x00C5, 0x00C7, 0x00C8, 0x00C9, 0x00CA, 0x00CB,
     0x00CC, 0x00CD, 0x00CE, 0x00CF, 0x00D0, 0x00D1, 0x00D2, 0x00D3, 0x00D4, 0x00D5, 0x00D6, 0x00D9,
@@ -52,9 +53,9 @@ class Parser {
     }
     if (!problem_.reason.empty()) return std::nullopt;
     if (braces && !take('}')) refuse("\"}\" expected", lastEnd_);
-    if (!skipBlanks() || !rest_.empty()) refuse("a \"}\" that closes nothing", at());
+    if (!skipBlanks() || !rest_.empty()) refuse("a \"}\" without a \"{\"", at());
     if (!problem_.reason.empty()) return std::nullopt;
-    std::reverse(pairs.begin(), pairs.end());  // a dictionary keeps the first of equal keys
+    std::reverse(pairs.begin(), pairs.end());  // a dictionary keeps a key's first value
     return Dictionary(std::move(pairs));
   }
 
@@ -81,7 +82,7 @@ class Parser {
            refuse(hasText ? "\";\" expected" : "\"=\" or \";\" expected", lastEnd_);
   }
 
-  // Skips blanks and comments. False when a comment does not end.
+  // Skips blanks and comments. Returns false when a comment does not end.
   bool skipBlanks() {
     for (;;) {
       rest_.remove_prefix(std::min(rest_.find_first_not_of(" \t\n\v\f\r"), rest_.size()));
@@ -103,7 +104,8 @@ class Parser {
     return true;
   }
 
-  // Nothing, for the reason `expected`, when no word stands here.
+  // Reads a word, with or without quotation marks. If there is no word here, reports `expected` as
+  // the problem and returns nothing.
   std::optional<std::string> word(const char* expected) {
     const std::size_t start = at();
     std::optional<std::string> word;
@@ -120,7 +122,7 @@ class Parser {
       word = std::string(rest_.begin(), end);
       rest_.remove_prefix(word->size());
     }
-    if (!word) refuse("a quotation mark without its partner", start);
+    if (!word) refuse("a quotation mark that is never closed", start);
     lastEnd_ = at();
     return word;
   }
@@ -157,7 +159,7 @@ class Parser {
     return true;
   }
 
-  // A code of up to three digits.
+  // Reads a code of up to three octal digits and returns its character.
   char32_t octal() {
     char32_t code = 0;
     for (int i = 0; i < 3 && !rest_.empty() && isOctal(rest_.front()); ++i) {
@@ -168,7 +170,8 @@ class Parser {
     return code < 0x80 ? code : kNextStepUpperHalf[code - 0x80];
   }
 
-  // The character of one UTF-16 unit of up to four digits, or of two that form a pair.
+  // Reads a UTF-16 unit of up to four hexadecimal digits, or two units that form a surrogate pair,
+  // and returns the character.
   char32_t unicode() {
     const char32_t first = unit();
     if (!isLeadSurrogate(first) || !rest_.starts_with("\\U")) return first;
@@ -194,7 +197,7 @@ class Parser {
   std::string_view text_;
   std::string_view rest_;
   ParseProblem& problem_;
-  std::size_t lastEnd_ = 0;  ///< of the last key or text, for reporting what is missing after it
+  std::size_t lastEnd_ = 0;  ///< end of the last key or text, where a missing mark is reported
 };
 
 }  // namespace

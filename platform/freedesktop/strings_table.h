@@ -14,10 +14,10 @@ namespace onramp {
 /// larger than a property list may be.
 [[nodiscard]] std::optional<Dictionary> loadStringsTable(const std::string& path);
 
-/// The pairs in a strings file's text: `"key" = "text";` in the grammar of old-style property
-/// lists, with comments. A key without a text stands for itself; when a key has several texts, the
-/// last one counts. Returns nothing when the input breaks the grammar anywhere; the form with
-/// `problem` then says where and how.
+/// Parses the text of a strings file. The file consists of pairs `"key" = "text";` in the grammar
+/// of old-style property lists, and may contain comments. The text of a key without one is the key
+/// itself. When a key occurs more than once, its last text counts. Returns nothing when any part of
+/// the input violates the grammar. The second form then sets `problem` to the place and the reason.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);
 

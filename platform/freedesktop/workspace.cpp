@@ -21,7 +21,7 @@ std::optional<std::string> programOnPath(std::string_view name) {
     const std::size_t end = rest.find(':');
     const std::string folder(rest.substr(0, end));
     rest.remove_prefix(end == std::string_view::npos ? rest.size() : end + 1);
-    // An empty entry means the current folder; programs are not run from there.
+    // An empty entry means the current folder. Running programs from there would be unsafe.
     if (folder.empty()) continue;
     std::string program = folder + "/" + std::string(name);
     std::error_code ignored;
@@ -36,8 +36,8 @@ bool openWithDesktop(const std::string& target) {
   const auto opener = programOnPath("xdg-open");
   const auto process = opener ? startProcess(*opener, {target}, Session::kOwn) : std::nullopt;
   if (!process) return false;
-  // A process that nobody waits for stays as a zombie until this program ends. That is harmless
-  // when the system gives no thread to wait in.
+  // The thread waits for the process, which would otherwise remain as a zombie until this program
+  // ends. If the system provides no thread, the zombie is harmless.
   try {
     std::thread([process] { waitForProcess(*process); }).detach();
   } catch (const std::system_error&) {
@@ -48,7 +48,7 @@ bool openWithDesktop(const std::string& target) {
 }  // namespace
 
 bool openFile(const std::string& path) {
-  // With "./" in front, a relative path is taken neither for an option nor for an address.
+  // The prefix "./" ensures that a relative path is not mistaken for an option or an address.
   return openWithDesktop(path.starts_with('/') ? path : "./" + path);
 }
 

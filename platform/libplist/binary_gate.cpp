@@ -13,7 +13,7 @@ namespace {
 constexpr std::string_view kHeader = "bplist00";
 constexpr std::size_t kTrailerSize = 32;
 
-// The high half of an object's first byte.
+// The kind of an object, which is stored in the upper four bits of the object's first byte.
 enum Kind : std::uint64_t {
   kSimple = 0x0,
   kInteger = 0x1,
@@ -28,14 +28,14 @@ enum Kind : std::uint64_t {
   kDictionary = 0xD,
 };
 
-// What an object costs with everything that it refers to; a shared object counts at every
-// reference.
+// The total size of an object and of everything that it refers to. A shared object counts once for
+// each reference.
 struct Cost {
   std::uint64_t objects = 1;
   std::uint64_t bytes = 0;
   std::size_t depth = 0;
 
-  // Sums cannot overflow: each side is within the limits.
+  // The sums cannot overflow, because both costs are within the limits.
   void add(const Cost& inner) {
     objects += inner.objects;
     bytes += inner.bytes;
@@ -48,7 +48,7 @@ struct Cost {
   }
 };
 
-// Offsets, references and UIDs take any number of bytes, not only powers of two.
+// Offsets, references and UIDs may take any number of bytes from 1 to 8, not only powers of two.
 bool isNumberSize(std::uint64_t size) {
   return size >= 1 && size <= 8;
 }
@@ -102,21 +102,23 @@ class BinaryWalk {
     Cost cost;
   };
 
-  // A reader of the object and everything after it; empty when its offset lies outside the file.
+  // Returns a reader of the object and everything after it. The reader is empty when the object's
+  // offset lies after the object area.
   [[nodiscard]] ByteReader objectAt(std::size_t index) const {
     const std::uint64_t offset = offsets_[index];
     return ByteReader(objects_.substr(std::min<std::uint64_t>(offset, objects_.size())));
   }
 
-  // Works out the object's cost. False when the object must not be built. The depth limit ends the
-  // recursion.
+  // Computes the object's cost. Returns false when libplist must not build the object. The depth
+  // limit ends the recursion.
   bool visit(std::size_t index, std::size_t depth) {
     State& state = states_[index];
     if (state.progress == Progress::kOpen) {
-      return refuse("a container that holds itself", offsets_[index]);
+      return refuse("a container that contains itself", offsets_[index]);
     }
     if (depth > kMostPropertyListDepth) {
-      return refuse("more containers inside each other than the limit allows", offsets_[index]);
+      return refuse("containers that are nested more deeply than the limit allows",
+                    offsets_[index]);
     }
     if (state.progress == Progress::kDone) return true;
     state.progress = Progress::kOpen;
@@ -133,7 +135,7 @@ class BinaryWalk {
                std::size_t depth) {
     switch (kind) {
       case kSimple:
-        return low == 0x8 || low == 0x9;  // false and true; null has no place in a list
+        return low == 0x8 || low == 0x9;  // false and true; a list cannot contain null
       case kInteger:
         return low <= 4 && object.skip(std::uint64_t{1} << low);
       case kReal:
@@ -158,7 +160,8 @@ class BinaryWalk {
     }
   }
 
-  // The number of a container's items or of a text's units; an impossible one when it is malformed.
+  // Returns the number of a container's items or of a text's units. Returns UINT64_MAX, which
+  // exceeds every limit, when the number is malformed.
   static std::uint64_t count(std::uint64_t low, ByteReader& object) {
     if (low < 0xF) return low;
     const std::uint64_t marker = object.number(1).value_or(0);
@@ -173,7 +176,8 @@ class BinaryWalk {
     return object.skip(cost.bytes);
   }
 
-  // A key that contains a null character makes libplist end the process.
+  // Refuses every text that contains a null character, because such a text makes libplist end the
+  // process when it is a key.
   static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
     ByteReader text = object;
     if (!measureBytes(units, 2, object, cost)) return false;

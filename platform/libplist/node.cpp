@@ -24,9 +24,9 @@ struct Free {
 template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
-// libplist's functions for numbers do not distinguish -1 from 2^64-1, and those for dates keep 32
-// bits. A binary list that holds only that object keeps everything; these are the objects' first
-// bytes.
+// libplist's functions for numbers do not distinguish -1 from 2^64-1, and its functions for dates
+// keep only 32 bits. A binary list that holds a single number or date keeps every bit. These
+// constants are the first bytes of such objects.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;
@@ -43,14 +43,15 @@ Node nodeOfObject(const std::string& object) {
   std::string list(kBinaryHeader);
   list += object;
   const std::uint64_t offsets = list.size();
-  list += static_cast<char>(kBinaryHeader.size());  // the table: one offset of one byte
+  list += static_cast<char>(kBinaryHeader.size());  // the table of offsets: one offset of one byte
   list += std::string(6, '\0') + '\1' + '\1' + bigEndian(1) + bigEndian(0) + bigEndian(offsets);
   plist_t node = nullptr;
   plist_from_bin(list.data(), static_cast<std::uint32_t>(list.size()), &node);
   return Node(node);
 }
 
-// The bytes of `node` in a binary list that holds nothing else.
+// Converts `node` to a binary list that holds nothing else, and returns the bytes after the list's
+// header. They begin with the object.
 std::string objectOf(plist_t node) {
   char* bytes = nullptr;
   std::uint32_t size = 0;
@@ -118,7 +119,8 @@ Value dictionaryOf(plist_t node) {
   return Dictionary(std::move(pairs));
 }
 
-// XML 1.0 does not allow control characters, not even as references.
+// Replaces the characters that XML 1.0 does not allow. Control characters are not allowed even as
+// references.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());

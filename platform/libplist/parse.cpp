@@ -1,6 +1,9 @@
 #include "platform/libplist/parse.h"
 
 #include <locale.h>
+#if __has_include(<xlocale.h>)
+#include <xlocale.h>  // macOS declares newlocale() only here
+#endif
 
 #include <cstdint>
 #include <memory>
@@ -16,8 +19,9 @@ namespace onramp::libplist {
 
 namespace {
 
-// libplist reads and writes real numbers in the thread's locale. In a desktop program that is the
-// user's locale, which may have a decimal comma.
+// Sets the thread's locale to "C" while this object exists. libplist reads and writes real numbers
+// in the thread's locale. In a desktop program this is the user's locale, which may use a decimal
+// comma.
 class PlainNumbers {
  public:
   PlainNumbers() : plain_(newlocale(LC_ALL_MASK, "C", nullptr)), before_(uselocale(plain_)) {}
@@ -37,13 +41,14 @@ struct XMLFree {
   void operator()(char* text) const { plist_to_xml_free(text); }
 };
 
-// An XML reader turns a bare carriage return into a line feed, but not a reference to one.
+// Writes carriage returns as references, because an XML reader turns a literal carriage return into
+// a line feed.
 void referToCarriageReturns(std::string& xml) {
   for (std::size_t at = xml.find('\r'); at != std::string::npos; at = xml.find('\r', at))
     xml.replace(at, 1, "&#13;");
 }
 
-// Readers expect a year of four digits.
+// Pads years with zeros, because readers expect a year of four digits.
 void padYears(std::string& xml) {
   constexpr std::string_view kDate = "<date>";
   for (std::size_t at = xml.find(kDate); at != std::string::npos; at = xml.find(kDate, at)) {

@@ -8,13 +8,13 @@
 
 namespace onramp::libplist {
 
-/// The value in the bytes of an XML (UTF-8 or UTF-16) or binary property list; nothing when they
-/// hold none or exceed the limits. The second form says why. It cannot say where libplist itself
-/// failed.
+/// Returns the value in `bytes`, an XML property list (in UTF-8 or UTF-16) or a binary one. Returns
+/// nothing when `bytes` are no such list or exceed the limits. The second form then sets `problem`
+/// to the place and the reason, unless libplist itself fails.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 
-/// `dictionary` as an XML property list.
+/// Formats `dictionary` as an XML property list. Returns an empty text on failure.
 [[nodiscard]] std::string formatPropertyList(const Dictionary& dictionary);
 
 }  // namespace onramp::libplist

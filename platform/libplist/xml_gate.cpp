@@ -14,9 +14,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// The limit on steps where libplist takes quadratic time: on the keys of a dictionary, which it
-// hashes into a fixed number of chains, and on the entities of a text, where it moves the rest of
-// the text at each one.
+// The limit on libplist's steps where their number grows quadratically. It does so with the keys of
+// a dictionary, because libplist hashes keys into a fixed number of chains, and with the entities
+// in a text, because libplist moves the rest of the text at each entity.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {
@@ -25,7 +25,7 @@ class XMLWalk {
 
   bool run() {
     if (const std::size_t null = text_.find('\0'); null != kNone) {
-      return refuse("a null character, which XML has no place for", null);
+      return refuse("a null character, which XML does not allow", null);
     }
     while (at_ < text_.size()) {
       const std::size_t markup = std::min(text_.find('<', at_), text_.size());
@@ -54,7 +54,7 @@ class XMLWalk {
     const std::string_view run = std::string_view(text_).substr(at_, end - at_);
     const auto entities = static_cast<std::uint64_t>(std::count(run.begin(), run.end(), '&'));
     return spend(entities * run.size()) ||
-           refuse("more references (&…;) than a text may hold", at_);
+           refuse("more references (&…;) than the limit allows", at_);
   }
 
   bool markupHere() {
@@ -67,8 +67,8 @@ class XMLWalk {
     return skipPast(">", 9) && quotesArePaired("[");
   }
 
-  // Moves past the next `end`, looking from `from` characters ahead, and leaves the markup in
-  // between in `skipped_`.
+  // Moves past the next `end` that is at least `from` characters ahead. Sets `skipped_` to the
+  // markup before that `end`, without its first `from` characters.
   bool skipPast(std::string_view end, std::size_t from) {
     const std::size_t found = text_.find(end, at_ + from);
     if (found == kNone) {
@@ -80,11 +80,11 @@ class XMLWalk {
     return true;
   }
 
-  // True when the `end` that skipPast() found is not inside a quoted text, and none of the
-  // characters in `refused` is in the markup.
+  // Returns true when the `end` that skipPast() found is not inside a quoted text and the skipped
+  // markup contains none of the characters in `refused`.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
-      return refuse("markup with a quotation mark that has no partner", start_);
+      return refuse("markup with a quotation mark that is never closed", start_);
     }
     const std::size_t found = skipped_.find_first_of(refused);
     return found == kNone ||
@@ -105,7 +105,7 @@ class XMLWalk {
     containers_.push_back({start_, name.size(), 0});
     return containers_.size() <= kMostPropertyListDepth + 1 ||  // the outermost is <plist>
            refuse("more than " + std::to_string(kMostPropertyListDepth) +
-                      " containers inside each other",
+                      " containers nested in each other",
                   start_);
   }
 
@@ -115,7 +115,7 @@ class XMLWalk {
 
   bool close(std::string_view name) {
     if (!isContainer(name)) return true;
-    if (containers_.empty()) return refuse("a container's end without its beginning", start_);
+    if (containers_.empty()) return refuse("the end of a container that was not opened", start_);
     const Container closed = innermost();
     containers_.pop_back();
     if (text_.compare(closed.name, closed.nameSize, name) != 0) {
@@ -124,7 +124,7 @@ class XMLWalk {
                     start_);
     }
     return spend(closed.keys * closed.keys) ||
-           refuse("more keys than dictionaries may hold", closed.name);
+           refuse("more keys than the limit allows", closed.name);
   }
 
   bool spend(std::uint64_t steps) {

@@ -7,11 +7,12 @@
 
 namespace onramp::libplist {
 
-/// `text`, which is UTF-8 without a byte-order mark, in a form that libplist reads correctly and
-/// within the limits: blanks replace the leading zeros of integers, which libplist would take for
-/// octal numbers. Nothing when the markup exceeds the limits, or when libplist might parse it
-/// differently from this check, such as a document type with an internal part; `problem` then says
-/// why.
+/// Returns `text`, an XML property list in UTF-8 without a byte-order mark, in a form that libplist
+/// reads correctly. Blanks replace the leading zeros of integers, because libplist would read an
+/// integer with leading zeros as octal. Returns nothing when `text` exceeds the limits in
+/// platform/property_list.h or contains markup that libplist might parse differently from this
+/// check. A document type with an internal part is an example of such markup. When the result is
+/// nothing, `problem` gives the place and the reason.
 [[nodiscard]] std::optional<std::string> admittedXML(std::string text, ParseProblem& problem);
 
 }  // namespace onramp::libplist

@@ -14,8 +14,9 @@ namespace onramp::netlink {
 
 namespace {
 
-// Takes all waiting messages off the socket. Messages that did not fit its buffer (ENOBUFS) stand
-// for changes too. Returns false when the socket is unusable.
+// Reads and discards all messages that wait on the socket. The error ENOBUFS means that messages
+// did not fit into the socket's buffer, so something has changed in this case, too. Returns false
+// when the socket is unusable.
 bool drain(int socket) {
   for (;;) {
     std::uint8_t byte = 0;

@@ -10,18 +10,21 @@
 namespace onramp::netlink {
 
 /// Reports that the computer's interfaces, IPv4 addresses or, on request, IPv4 routes may have
-/// changed. It does not say how; ask the kernel for the new state.
+/// changed. It does not say what has changed, so the caller has to ask the kernel for the new
+/// state.
 class ChangeWatch {
  public:
-  /// Starts to collect changes. Returns null on failure.
+  /// Creates a watch, which collects changes from then on. It includes routes if `withRoutes` is
+  /// true. Returns null on failure.
   [[nodiscard]] static std::unique_ptr<ChangeWatch> create(bool withRoutes);
 
   ChangeWatch(const ChangeWatch&) = delete;
   ChangeWatch& operator=(const ChangeWatch&) = delete;
   ~ChangeWatch();
 
-  /// Calls `changed` after every burst of changes since creation, on the watch's own thread. The
-  /// destructor ends this and waits for a running call. May be called once.
+  /// Starts to call `changed` on the watch's own thread after every burst of changes, including
+  /// those since the watch was created. The destructor stops the calls and waits for a call that is
+  /// running. This function may be called only once.
   void start(std::function<void()> changed);
 
  private:

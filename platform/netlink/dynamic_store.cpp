@@ -56,7 +56,7 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
   std::optional<netlink::Selection> selection = netlink::Selection::of(keys, patterns);
   if (!selection) return fail(kSCStatusInvalidArgument, false);
 
-  // Watching begins before reading, so that no change falls between the two.
+  // The watch starts before the state is read, so that no change is missed in between.
   auto watch = netlink::ChangeWatch::create(selection->hasGlobal());
   std::optional<Dictionary> known = watch ? selection->read(store->socket.get()) : std::nullopt;
   if (!known) return fail(kSCStatusFailed, false);

@@ -25,7 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// How often a dump is requested, because a table that changes during a dump spoils it.
+// The maximum number of times that a dump is requested. The kernel marks a dump as invalid when the
+// table changes during the dump.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;
@@ -126,7 +127,7 @@ std::map<int, Interface> interfacesOf(const Objects& addresses) {
   return interfaces;
 }
 
-// Returns the index of the interface that the preferred route leads through.
+// Returns the index of the interface of the preferred route.
 std::optional<int> primaryIndex(const Objects& routes) {
   std::optional<int> index;
   std::uint32_t lowest = 0;

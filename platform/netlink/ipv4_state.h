@@ -8,11 +8,12 @@
 namespace onramp::netlink {
 
 /// Reads the store's whole IPv4 state from the kernel through `socket`: every entry that
-/// platform/dynamic_store.h promises, under its key. The global entry requires reading all routes,
-/// so it is included only `withGlobal`. Returns nothing when the kernel cannot be asked.
+/// platform/dynamic_store.h promises, under its key. The global entry is included only if
+/// `withGlobal` is true, because it requires reading all routes. Returns nothing when the state
+/// cannot be read.
 ///
-/// The preferred default route is the first one with the lowest metric in the main table. It leads
-/// through its first next hop that is not dead.
+/// The preferred default route is the first one with the lowest metric in the main table. Its
+/// interface is that of its first next hop that is not dead.
 [[nodiscard]] std::optional<Dictionary> readIPv4State(nl_sock* socket, bool withGlobal);
 
 }  // namespace onramp::netlink

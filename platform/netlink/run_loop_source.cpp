@@ -1,4 +1,5 @@
-// In a file apart, so that a program without a run loop can link the other operations.
+// This function is in a file of its own, so that a program without a run loop can link the other
+// functions of the store.
 
 #include <atomic>
 #include <memory>
@@ -16,7 +17,8 @@ void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
   static std::vector<DynamicStoreSourceRef> sourcesOnLoop;
   sourcesOnLoop.push_back(source);
 
-  // Makes the main thread look for changes, once however many the kernel reports meanwhile.
+  // Makes the main thread look for changes. If the kernel reports more changes before the main
+  // thread has looked, the main thread still looks only once.
   const auto posted = std::make_shared<std::atomic<bool>>(false);
   store->changesArrived = [posted, weak = std::weak_ptr(store)] {
     if (posted->exchange(true)) return;

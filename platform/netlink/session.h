@@ -23,8 +23,8 @@ class Selection {
   /// Selects nothing.
   Selection() = default;
 
-  /// Makes a selection by the rules in platform/dynamic_store.h. Returns nothing when a pattern is
-  /// invalid.
+  /// Creates a selection by the rules of copyMultiple() in platform/dynamic_store.h. Returns
+  /// nothing when a pattern is invalid.
   [[nodiscard]] static std::optional<Selection> of(const std::vector<std::string>& keys,
                                                    const std::vector<std::string>& patterns);
 
@@ -33,8 +33,8 @@ class Selection {
   /// Returns whether the global IPv4 entity is selected.
   [[nodiscard]] bool hasGlobal() const;
 
-  /// Returns the selected entries of the system's present state, or nothing when the kernel cannot
-  /// be asked.
+  /// Returns the selected entries of the system's current state, or nothing when the state cannot
+  /// be read.
   [[nodiscard]] std::optional<Dictionary> read(nl_sock* socket) const;
 
  private:
@@ -58,14 +58,14 @@ struct DynamicStore {
   netlink::Socket socket;
   DynamicStoreCallback callback;
   netlink::Selection notified;
-  Dictionary known;  ///< the entries of `notified` that the callback was last told about
-  std::function<void()> changesArrived;         ///< empty until the session's source is on the loop
+  Dictionary known;                      ///< the entries that `notified` selects, as last read
+  std::function<void()> changesArrived;  ///< empty until the session's source is on the loop
   std::unique_ptr<netlink::ChangeWatch> watch;  ///< null until setNotificationKeys()
 
-  /// Calls the callback with the keys of the notified entries that have changed, if there are any.
+  /// Calls the callback with the keys in `notified` whose values have changed, if there are any.
   void tellChanges();
 
-  /// Makes the watch call `changesArrived`, when both are set.
+  /// Starts `watch` so that it calls `changesArrived`, if both are set.
   void startWatch() const;
 };
 

@@ -27,7 +27,7 @@ sockaddr_in socketAddress(const DatagramEndpoint& endpoint) {
   return address;
 }
 
-// A signal does not shorten the wait.
+// Waits until `event` occurs or `timeout` has passed. A signal does not shorten the wait.
 bool waitFor(int descriptor, short event, std::chrono::nanoseconds timeout) {
   using std::chrono::steady_clock;
   const auto deadline = steady_clock::now() + timeout;

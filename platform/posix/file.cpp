@@ -20,16 +20,18 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// A temporary file is called ".NAME.PROCESS-NUMBER". The limit on NAME keeps that within the 255
-// bytes that a name may have.
+// Returns the beginning of the names of temporary files for `path`. A temporary file is called
+// ".NAME.PROCESS-NUMBER". The limit on NAME keeps that within the 255 bytes that a file name may
+// have.
 std::string temporaryStem(const fs::path& path) {
   constexpr std::size_t kMostNameBytes = 200;
   return "." + path.filename().string().substr(0, kMostNameBytes) + ".";
 }
 
-// Creates a file next to `path` under a new name. Its access rights follow the user's mask.
+// Creates a file next to `path` under an unused name, which `name` receives. The user's umask
+// determines its access rights.
 Descriptor createBeside(const fs::path& path, std::string& name) {
-  constexpr int kMostTries = 100;  // a killed process may have left some of them
+  constexpr int kMostTries = 100;  // killed processes may have left files with such names
   const std::string stem =
       (path.parent_path() / temporaryStem(path)).string() + std::to_string(getpid()) + "-";
   for (int i = 0; i < kMostTries; ++i) {
@@ -50,8 +52,8 @@ bool writeAll(int descriptor, std::string_view bytes) {
   return true;
 }
 
-// Whether no process writes a file any more whose name ends with `processAndNumber`. One with this
-// process's own number was left by an earlier process.
+// Returns whether the temporary file whose name ends with `processAndNumber` is no longer being
+// written. A file with this process's own ID was left by an earlier process with the same ID.
 bool isLeftOver(std::string_view processAndNumber) {
   constexpr std::string_view kDigits = "0123456789";
   const std::size_t dash = processAndNumber.find('-');

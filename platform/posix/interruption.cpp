@@ -13,7 +13,7 @@ namespace onramp {
 
 namespace {
 
-constexpr int kExitOfSignals = 128;  // as a shell tells them
+constexpr int kExitOfSignals = 128;  // a shell adds this to the signal's number
 
 }  // namespace
 
@@ -22,7 +22,8 @@ void onInterruption(std::function<void()> action) {
   sigemptyset(&signals);
   sigaddset(&signals, SIGINT);
   sigaddset(&signals, SIGTERM);
-  // Threads inherit the mask, so that only the one that waits gets the signals.
+  // Every thread that starts later inherits this mask. Only the thread that calls sigwait()
+  // receives the signals.
   pthread_sigmask(SIG_BLOCK, &signals, nullptr);
   std::thread([signals, action = std::move(action)]() mutable {
     int number = 0;

@@ -7,7 +7,7 @@
 
 #include <cerrno>
 
-// macOS declares it in no header.
+// No header of macOS declares `environ`.
 extern char** environ;  // NOLINT(readability-redundant-declaration)
 
 namespace onramp {

@@ -9,17 +9,19 @@
 namespace onramp {
 
 enum class Session {
-  kOwn,     ///< the program survives the end of this one's terminal
-  kShared,  ///< the program ends with this one's terminal
+  kOwn,     ///< a new session: the program survives the end of this one's terminal
+  kShared,  ///< this program's session: the program ends with the terminal
 };
 
-/// Starts the program at `executable` with every signal in its default state and returns its
-/// process, which must be waited for. Nothing when the program could not be started.
+/// Starts the program at `executable` with all signals in their default state. Returns the ID of
+/// the new process, which the caller must pass to waitForProcess(). Returns nothing when the
+/// program cannot be started.
 [[nodiscard]] std::optional<pid_t> startProcess(const std::string& executable,
                                                 const std::vector<std::string>& arguments,
                                                 Session session);
 
-/// Blocks until `process` ends and returns its exit status; nothing when a signal ended it.
+/// Blocks until `process` ends. Returns the exit status, or nothing when a signal ended the
+/// process.
 std::optional<int> waitForProcess(pid_t process);
 
 }  // namespace onramp

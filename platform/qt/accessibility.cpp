@@ -26,7 +26,7 @@ class Heading final : public QAccessibleWidget {
   }
 };
 
-// Qt owns what it gets.
+// Qt takes ownership of the returned object.
 QAccessibleInterface* interfaceOf(const QString&, QObject* object) {
   if (auto* const matrix = qobject_cast<RadioMatrixWidget*>(object)) {
     return std::make_unique<Group>(matrix).release();

@@ -2,7 +2,7 @@
 
 namespace onramp::qt {
 
-/// Makes assistive programs see headings and groups of radio buttons as such. Call it once, before
+/// Lets assistive programs recognize headings and groups of radio buttons. Call this once, before
 /// the first interface file is loaded.
 void describeControls();
 

@@ -40,14 +40,15 @@ std::vector<QPointer<QWidget>>& hiddenWindows() {
   return windows;
 }
 
-// Exits after --help and --version, and with a message when an option makes no sense.
+// Reads the options. Ends the process after --help and --version, and with an error message when an
+// option is invalid.
 void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
   parser.setApplicationDescription(
-      QStringLiteral("Sets up a new device from the medium that this application lies on."));
+      QStringLiteral("Sets up a new device from the medium that this application is on."));
   const QCommandLineOption version(
       QStringLiteral("system-version"),
-      QStringLiteral("The system version that the wizard takes to be running."),
+      QStringLiteral("The system version that the wizard assumes is running."),
       QStringLiteral("X.Y.Z"));
   parser.addOption(version);
   const QCommandLineOption help = parser.addHelpOption();
@@ -61,7 +62,7 @@ void readCommandLine(const QStringList& arguments) {
   if (!parser.isSet(version)) return;
   static const QRegularExpression form(QStringLiteral("^\\d+(\\.\\d+){0,2}$"));
   if (!form.match(parser.value(version)).hasMatch()) {
-    std::fprintf(stderr, "--system-version: \"%s\" is no version; give numbers, as in 10.15.7\n",
+    std::fprintf(stderr, "--system-version: \"%s\" is not a version; give numbers, as in 10.15.7\n",
                  qPrintable(parser.value(version)));
     std::exit(kUsageError);
   }
@@ -75,7 +76,7 @@ bool asksForInformation(int argc, char** argv) {
   });
 }
 
-// Qt aborts the process when it finds no display.
+// Reports a missing display and ends the process. Qt itself would abort the process.
 void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
   if (type == QtFatalMsg) {
     std::fprintf(stderr,
@@ -87,7 +88,7 @@ void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString
   if (isVerbose) std::fprintf(stderr, "%s\n", qPrintable(message));
 }
 
-// Makes the application object, which needs a display.
+// Creates the application object. Ends the process with a message when there is no display.
 std::unique_ptr<QApplication> makeApplication(int& argc, char** argv) {
   const QtMessageHandler usual = qInstallMessageHandler(exitWithoutDisplay);
   auto application = std::make_unique<QApplication>(argc, argv);
@@ -173,7 +174,7 @@ Menu mainMenu() {
   return Menu(qt::toNative(menuBar()));
 }
 
-// The window shows its menu bar itself.
+// Does nothing, because the window shows its own menu bar.
 void setMainMenu(const Menu&) {}
 
 }  // namespace onramp

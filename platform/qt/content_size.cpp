@@ -10,7 +10,7 @@ namespace onramp::qt {
 
 namespace {
 
-constexpr int kTitleBarHeight = 32;  // until the window manager has told it
+constexpr int kTitleBarHeight = 32;  // assumed until the window manager reports the real height
 
 }  // namespace
 
@@ -25,7 +25,8 @@ bool ContentSize::eventFilter(QObject*, QEvent* event) {
   return false;
 }
 
-// The height of text that wraps depends on the width.
+// The height is computed for the needed width, because the height of wrapped text depends on the
+// width.
 QSize ContentSize::neededSize() const {
   const QLayout* const contents = window_->centralWidget()->layout();
   const int menu = window_->menuWidget() ? window_->menuWidget()->sizeHint().height() : 0;
@@ -48,7 +49,7 @@ void ContentSize::fit() {
   const QSize grown = size - window_->size();
   window_->setFixedSize(size);
   if (!window_->isVisible()) return;
-  // The window's middle stays where it is, as far as the screen allows.
+  // Keeps the middle of the window in place as far as the screen allows.
   const QPoint corner = window_->pos() - QPoint(grown.width(), grown.height()) / 2;
   const QPoint last = screen.bottomRight() - QPoint(size.width(), size.height() + title);
   window_->move(std::clamp(corner.x(), screen.left(), std::max(screen.left(), last.x())),

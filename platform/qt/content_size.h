@@ -4,8 +4,8 @@
 
 namespace onramp::qt {
 
-/// Gives a window that the user cannot resize the size that its contents need. The window grows
-/// with them, up to the size of its screen, and never shrinks.
+/// Gives a window the size that its contents need, and prevents the user from resizing it. The
+/// window grows with its contents, up to the size of the screen, and never shrinks.
 class ContentSize final : public QObject {
   Q_OBJECT
 

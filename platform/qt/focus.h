@@ -4,11 +4,11 @@ class QWidget;
 
 namespace onramp::qt {
 
-/// Gives the keyboard focus to the page's list or else to its first control in tab order that can
-/// take it.
+/// Gives the keyboard focus to the first list on the page. If the page has no list, its first
+/// control in tab order that accepts the focus gets it.
 void focusFirstControl(QWidget& page);
 
-/// The same for the page that `window` shows, if it shows one.
+/// Calls focusFirstControl() for the page that `window` shows, if there is one.
 void focusPage(const QWidget& window);
 
 }  // namespace onramp::qt

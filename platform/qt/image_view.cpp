@@ -10,7 +10,7 @@ namespace qt {
 
 namespace {
 
-// Images are drawn for displays of twice the usual density.
+// The image files are made for displays with twice the usual pixel density.
 constexpr int kImageDensity = 2;
 
 }  // namespace

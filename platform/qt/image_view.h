@@ -22,10 +22,11 @@ class ImageViewWidget final : public QWidget {
   void paintEvent(QPaintEvent* event) override;
 
  private:
-  /// A stretched picture lies behind light text, which could not be read on it.
+  /// Returns whether the image must not be drawn. A stretched image is a background for dark text.
+  /// In a dark colour scheme the text is light and could not be read on it.
   [[nodiscard]] bool isOutOfPlace() const;
 
-  /// Where in this view the image goes.
+  /// Returns the rectangle in this view in which the image is drawn.
   [[nodiscard]] QRectF target() const;
 
   QString path_;

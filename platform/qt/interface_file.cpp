@@ -32,13 +32,15 @@ QString textOf(std::string_view text) {
   return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-// Makes this front end's own widgets. For a class that it does not know, it makes a plain widget
-// and keeps the name: this is how an interface file names a page's class.
+// Creates the widgets of an interface file, including those that this front end defines. For an
+// unknown class it creates a plain widget and stores the name of the class in a property, because
+// an interface file names a page's class in this way.
 class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;
 
-  /// The application's only loader. Making one takes as long as loading a file.
+  /// Returns the application's only loader. There is only one, because creating a loader takes as
+  /// long as loading a file.
   static Loader& shared() {
     static Loader* const loader = makeWithoutPlugIns();
     return *loader;
@@ -67,8 +69,8 @@ class Loader final : public QUiLoader {
   }
 
  private:
-  // QUiLoader's constructor would load every Designer plug-in that it finds, and half of Qt with
-  // them, so it is given no paths to search.
+  // Creates the loader while Qt has no library paths to search. QUiLoader's constructor would
+  // otherwise load every Designer plug-in that it finds, together with many libraries of Qt.
   static Loader* makeWithoutPlugIns() {
     const QStringList paths = QCoreApplication::libraryPaths();
     QCoreApplication::setLibraryPaths({});
@@ -84,7 +86,7 @@ void enlargeFont(QWidget& widget, double scale) {
   widget.setFont(font);
 }
 
-// Sizes follow the user's text size.
+// Enlarges headings and tool buttons in proportion to the user's text size.
 void enlargeFonts(QWidget& root) {
   for (QWidget* const widget : root.findChildren<QWidget*>()) {
     if (widget->property(qt::kHeading).toBool()) enlargeFont(*widget, kHeadingScale);
@@ -158,8 +160,8 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// While a page is shown, its root is a child of the window, and the window may be destroyed before
-// the page.
+// Owns the root widget unless its parent has destroyed it. While a page is shown, its root is a
+// child of the window, and the window may be destroyed before the page.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

@@ -49,11 +49,11 @@ int ListModel::columnCount(const QModelIndex& parent) const {
 QVariant ListModel::data(const QModelIndex& index, int role) const {
   switch (role) {
     case Qt::DisplayRole:
-    case Qt::ToolTipRole:  // a text too long for its column can be read in full
+    case Qt::ToolTipRole:  // shows a text in full when its column is too narrow
       return text(index.row(), columns_.at(index.column()));
     case Qt::AccessibleTextRole:
       return index.column() == 0 ? spokenName(index.row()) : QVariant();
-    case Qt::SizeHintRole:  // a single column is as wide as its view, and elides longer texts
+    case Qt::SizeHintRole:  // a single column is as wide as its view and elides longer texts
       return columns_.size() == 1 ? QSize(0, rowHeight()) : QVariant();
     default:
       return {};

@@ -9,21 +9,22 @@ class ArrayController;
 
 namespace qt {
 
-/// An array controller's entries as a table: one row an entry, one column an identifier.
+/// Presents an array controller's entries as a table. Each entry is a row, and each identifier in
+/// `columns` is a column.
 class ListModel final : public QAbstractTableModel {
   Q_OBJECT
 
  public:
-  /// `spokenColumns` are those that together name a row to assistive programs.
+  /// Assistive programs name a row by its texts in `spokenColumns`.
   ListModel(QStringList columns, QStringList spokenColumns, QObject* parent);
 
-  /// The height of a row, with some room around its text.
+  /// Returns the height of a row, including some space around its text.
   [[nodiscard]] static int rowHeight();
 
   /// Shows the entries of `controller` from now on.
   void setController(const ArrayController& controller);
 
-  /// The controller's entries have changed.
+  /// Call this when the controller's entries have changed.
   void reload();
 
   void setHeader(const QString& identifier, const QString& title);
@@ -35,7 +36,7 @@ class ListModel final : public QAbstractTableModel {
                                     int role) const override;
 
  private:
-  /// Empty where the controller has no such entry or the entry no such text.
+  /// Returns an empty text when the controller has no such entry or the entry has no such text.
   [[nodiscard]] QString text(int row, const QString& column) const;
 
   [[nodiscard]] QString spokenName(int row) const;
@@ -44,7 +45,7 @@ class ListModel final : public QAbstractTableModel {
   const QStringList spokenColumns_;
   QStringList headers_;
   const ArrayController* controller_ = nullptr;
-  int rows_ = 0;  ///< as the views know it
+  int rows_ = 0;  ///< the number of rows that the views were told
 };
 
 }  // namespace qt

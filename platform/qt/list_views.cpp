@@ -71,7 +71,7 @@ void ColumnsWidget::resizeEvent(QResizeEvent* event) {
   fitColumns();
 }
 
-// The first column may be cut, the others may not.
+// The user may make the first column too narrow for its texts, but not the others.
 void ColumnsWidget::sectionResized(int column, int width) {
   if (QGuiApplication::mouseButtons() == Qt::NoButton) return;
   isUsersLayout_ = true;

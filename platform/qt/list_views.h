@@ -7,13 +7,15 @@
 
 namespace onramp::qt {
 
-/// The least height of a list that shows some rows at a time, without its frame and header.
+/// Returns the minimum height of a list without its frame and header. It is enough for several
+/// rows.
 [[nodiscard]] int leastListHeight();
 
-/// The least width of a column of names.
+/// Returns the minimum width of a column of names.
 [[nodiscard]] int leastNameWidth();
 
-/// Draws the whole frame again when the focus comes or goes. Qt's views draw only their rows again.
+/// Redraws the whole view, including its frame, when it gets or loses the focus. Qt's views would
+/// redraw only their rows.
 template <typename View>
 class FramedView : public View {
  public:
@@ -30,7 +32,7 @@ class FramedView : public View {
   }
 };
 
-/// A list of one column.
+/// A list with one column.
 class ListWidget final : public FramedView<QListView> {
   Q_OBJECT
 
@@ -44,15 +46,16 @@ class ListWidget final : public FramedView<QListView> {
   TypeAhead typeAhead_;
 };
 
-/// A list of several columns, each as wide as its contents. The first gets what the others leave
-/// and gives way to them. Once the user has dragged a column's edge, all widths are theirs.
+/// A list with several columns. Each column is as wide as its contents, except the first one, which
+/// gets the remaining width. Once the user has dragged a column's edge, the widths are no longer
+/// adjusted.
 class ColumnsWidget final : public FramedView<QTreeView> {
   Q_OBJECT
 
  public:
   explicit ColumnsWidget(QWidget* parent = nullptr);
 
-  /// Call it after every change of the contents or of a header.
+  /// Call this after every change of the contents or of a header.
   void fitColumns();
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }
@@ -62,10 +65,10 @@ class ColumnsWidget final : public FramedView<QTreeView> {
   void resizeEvent(QResizeEvent* event) override;
 
  private:
-  /// The width at which nothing of the column is cut.
+  /// Returns the width that shows all texts of the column in full.
   [[nodiscard]] int neededWidth(int column) const;
 
-  /// What the columns after the first need together.
+  /// Returns the total width that the columns after the first one need.
   [[nodiscard]] int neededWidthOfOthers() const;
 
   void sectionResized(int column, int width);

@@ -2,8 +2,7 @@
 
 namespace onramp::qt {
 
-/// Ends the main loop, every modal one and every sleep off the main thread, for good. Main thread
-/// only.
+/// Ends the main loop, every modal loop and every sleepOffMainThread() for good. Main thread only.
 void endAllLoops();
 
 }  // namespace onramp::qt

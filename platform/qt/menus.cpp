@@ -20,7 +20,8 @@ std::string information(const std::string& key) {
   return Bundle::main().infoString(key).value_or("");
 }
 
-// The panel runs no nested event loop, so a search wait goes on and ends behind it.
+// The panel runs no nested event loop, so that a search can continue and end while the panel is
+// open.
 void showAboutPanel(QWidget* window, const QString& title) {
   const std::string version = Bundle::main().localizedString("Version %@", "Version %@", "About");
   auto* const panel = qt::makeChild<QMessageBox>(window);
@@ -56,7 +57,8 @@ void connectStandardMenuItems(QWidget* window) {
       QObject::connect(item, &QAction::triggered, window,
                        [window, item] { showAboutPanel(window, item->text()); });
     } else if (action == QLatin1String("hide:")) {
-      // Desktops cannot bring a hidden program back, but they can a minimised window.
+      // Minimises the window instead, because a desktop can bring back a minimised window but not a
+      // hidden program.
       QObject::connect(item, &QAction::triggered, window, [window] { window->showMinimized(); });
     } else if (action == QLatin1String("unhideAllApplications:")) {
       QObject::connect(item, &QAction::triggered, window, [window] { window->showNormal(); });
@@ -72,7 +74,7 @@ void connectStandardMenuItems(QWidget* window) {
 
 using qt::nativeOf;
 
-// A Menu stands for a QMenuBar or a QMenu, a MenuItem for one of its actions.
+// A Menu refers to a QMenuBar or a QMenu. A MenuItem refers to one of its actions.
 
 MenuItem Menu::itemWithTitle(const std::string& title) const {
   const auto* const menu = nativeOf<QWidget>(*this);

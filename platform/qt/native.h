@@ -10,12 +10,12 @@
 
 namespace onramp::qt {
 
-// Properties by which interface files say more than Qt's own ones can.
-inline constexpr const char* kViewClass = "viewClass";          ///< text, set on a page's root
-inline constexpr const char* kHeading = "heading";              ///< of a label: it is a title
-inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: what names a list's row
+// The properties of widgets that this front end adds to those of Qt.
+inline constexpr const char* kViewClass = "viewClass";  ///< text: a page's class, set on its root
+inline constexpr const char* kHeading = "heading";      ///< true for a label that is a title
+inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: columns that name a row
 
-/// The object that `outlet` stands for, if it is there and of that class; else null.
+/// Returns the object behind `outlet` if it is of class `Class`, or null otherwise.
 template <typename Class>
 [[nodiscard]] Class* nativeOf(const Outlet& outlet) {
   return qobject_cast<Class*>(reinterpret_cast<QObject*>(outlet.native()));
@@ -25,13 +25,14 @@ template <typename Class>
   return reinterpret_cast<NativeObject*>(object);
 }
 
-/// A new object that `parent` owns and deletes.
+/// Creates an object that `parent` owns and deletes.
 template <typename Class, typename Parent, typename... Arguments>
 Class* makeChild(Parent* parent, Arguments&&... arguments) {
   return std::make_unique<Class>(std::forward<Arguments>(arguments)..., parent).release();
 }
 
-/// `text` as the title of a button or menu item, where a lone "&" would mark the next letter.
+/// Converts `text` to the title of a button or menu item. Each "&" is doubled, because a single one
+/// would underline the next letter.
 [[nodiscard]] inline QString titleText(const std::string& text) {
   return QString::fromStdString(text).replace(QLatin1Char('&'), QLatin1String("&&"));
 }

@@ -11,7 +11,7 @@ namespace onramp {
 
 using qt::nativeOf;
 
-// The button itself is item 0; the others are its menu's actions.
+// Item 0 is the button itself. The other items are the actions of its menu.
 
 std::size_t PopUpButton::numberOfItems() const {
   const auto* const button = nativeOf<QToolButton>(*this);
@@ -31,7 +31,7 @@ void PopUpButton::addItem(const std::string& title, std::function<void()> action
   if (!button) return;
   if (!button->menu()) button->setMenu(qt::makeChild<QMenu>(button));
   const QAction* const item = button->menu()->addAction(qt::titleText(title));
-  // The command runs once the menu has closed: it may block for seconds.
+  // The command runs after the menu has closed, because it may block for seconds.
   QObject::connect(item, &QAction::triggered, button, std::move(action), Qt::QueuedConnection);
 }
 

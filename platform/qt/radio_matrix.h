@@ -12,10 +12,10 @@ class RadioMatrixWidget final : public QWidget {
  public:
   using QWidget::QWidget;
 
-  /// The button in that place, or null.
+  /// Returns the button in that place, or null when there is none.
   [[nodiscard]] QRadioButton* cell(int row, int column) const;
 
-  /// Row of the selected button; 0 when none is.
+  /// Returns the row of the selected button, or 0 when no button is selected.
   [[nodiscard]] int selectedRow() const;
 };
 

@@ -17,7 +17,7 @@ namespace onramp {
 
 namespace {
 
-// The modal loops that run now, the innermost last. Main thread only.
+// Returns the modal loops that are running, the innermost last. Main thread only.
 std::vector<QEventLoop*>& modalLoops() {
   static std::vector<QEventLoop*> loops;
   return loops;
@@ -28,7 +28,7 @@ bool isModal() {
 }
 
 // True from abortModal() until the modal loop has returned. Each posted action may occupy the main
-// thread for seconds, so posted actions are held back meanwhile.
+// thread for seconds, so posted actions are held back until then.
 std::atomic<bool> isAborting = false;
 
 }  // namespace
@@ -68,8 +68,8 @@ void runModalForWindow(const Window& window) {
   QEventLoop loop;
   modalLoops().push_back(&loop);
   loop.exec();
-  // Handles the clicks and keys that came in while the main thread was busy: they were meant for
-  // the page that was shown then.
+  // Handles the clicks and keys that arrived while the main thread was busy, because the user meant
+  // them for the page that was shown then.
   if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;

@@ -5,9 +5,9 @@
 
 namespace onramp::qt {
 
-/// A wheel of spokes that turns while it is animated. To assistive programs it is a progress bar
-/// that does not show how much is done. It takes the keyboard focus when it appears, so that they
-/// read out what the user is waiting for.
+/// A wheel of spokes that turns while it is animated. Assistive programs see it as a progress bar
+/// that does not show how much is done. It takes the keyboard focus when it appears, so that these
+/// programs read out what the user is waiting for.
 class Spinner final : public QProgressBar {
   Q_OBJECT
 
@@ -26,7 +26,7 @@ class Spinner final : public QProgressBar {
 
  private:
   QBasicTimer timer_;
-  int turn_ = 0;  ///< spokes that the wheel has turned
+  int turn_ = 0;  ///< by how many spokes the wheel has turned
 };
 
 }  // namespace onramp::qt

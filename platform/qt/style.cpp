@@ -14,7 +14,7 @@ constexpr int kRingWidth = 2;
 constexpr qreal kCornerRadius = 3;
 constexpr int kRoomBesideTitle = 10;
 constexpr int kRoomAboveTitle = 3;
-constexpr int kLeastGrayDistance = 150;  ///< of 255, between a title and the button behind it
+constexpr int kLeastGrayDistance = 150;  ///< grey levels of 255 between a title and its button
 constexpr int kLeastDisabledDistance = 40;
 
 void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
@@ -28,7 +28,8 @@ void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.restore();
 }
 
-// The selection's colour, dark enough for the title on it where that is light.
+// Returns the colour of the selection. If the title on it is lighter, the colour is darkened until
+// the title can be read.
 QColor defaultButtonColor(const QPalette& palette) {
   QColor color = palette.color(QPalette::Highlight);
   const int title = qGray(palette.color(QPalette::HighlightedText).rgb());
@@ -51,7 +52,7 @@ void drawDefaultFace(QPainter& painter, const QStyleOptionButton& button) {
   painter.restore();
 }
 
-// Fusion's own outline of a radio button cannot be seen on dark colours.
+// Draws the outline of a radio button. Fusion's own outline is invisible on dark colours.
 void drawOutline(QPainter& painter, const QStyleOption& radioButton) {
   painter.save();
   painter.setRenderHint(QPainter::Antialiasing);
@@ -114,12 +115,12 @@ void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, 
   if (element != PE_FrameFocusRect) {
     QProxyStyle::drawPrimitive(element, option, painter, widget);
     if (element == PE_IndicatorRadioButton) drawOutline(*painter, *option);
-  } else if (!isList(widget)) {  // a list has its ring around all rows
+  } else if (!isList(widget)) {  // drawControl() draws a list's ring around all rows
     drawRing(*painter, option->rect, option->palette.color(QPalette::Highlight));
   }
 }
 
-// Some high-contrast palettes have disabled text in the colour of the window.
+// Makes disabled text readable. Some high-contrast palettes give it the colour of the window.
 void Style::drawItemText(QPainter* painter, const QRect& rectangle, int flags,
                          const QPalette& palette, bool isEnabled, const QString& text,
                          QPalette::ColorRole role) const {
@@ -143,7 +144,7 @@ int Style::pixelMetric(PixelMetric metric, const QStyleOption* option,
 QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,
                               const QWidget* widget) const {
   const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
-  // Rows a little higher than their text are easier to read and to hit.
+  // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

@@ -5,8 +5,8 @@
 
 namespace onramp::qt {
 
-/// Fusion, except that the default button is filled and the focused control has a ring. Fusion
-/// outlines both alike.
+/// Qt's style "Fusion" with a filled default button and a ring around the focused control. Fusion
+/// itself outlines both in the same way.
 class Style final : public QProxyStyle {
   Q_OBJECT
 

@@ -17,7 +17,8 @@ namespace {
 using qt::ListModel;
 using qt::nativeOf;
 
-// Returns the view's model, which is made on first use: headers may be set before bind().
+// Returns the view's model. The model is created on first use, because headers may be set before
+// bind().
 ListModel* modelOf(QAbstractItemView* view) {
   if (!view) return nullptr;
   if (auto* const model = qobject_cast<ListModel*>(view->model())) return model;
@@ -116,7 +117,7 @@ void TableView::setColumnHeader(std::string_view identifier, const std::string& 
   }
 }
 
-// Nothing can be edited: the model takes no values.
+// Does nothing, because the model accepts no edits.
 void TableView::setColumnEditable(std::string_view, bool) const {}
 
 }  // namespace onramp

@@ -17,7 +17,8 @@ bool hasWordThatStarts(const QString& text, const QString& start) {
   return false;
 }
 
-// The first matching row from `from` on, going round at the end; -1 when there is none.
+// Returns the first matching row from row `from` on. The search continues at row 0 after the last
+// row. Returns -1 when no row matches.
 int rowFrom(int from, const QAbstractItemModel& model, const QString& start) {
   const int count = model.rowCount();
   for (int step = 0; step < count; ++step) {

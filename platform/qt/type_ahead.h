@@ -7,11 +7,12 @@ class QAbstractItemView;
 
 namespace onramp::qt {
 
-/// Finds a list's row by what the user types: the start of any word of its text, whatever the case.
+/// Finds a row of a list by what the user types. A row matches if any word of its text starts with
+/// the typed text, ignoring case.
 class TypeAhead {
  public:
-  /// Selects the next row that matches, the current one included, when `text` was typed. The same
-  /// letter typed again leads to the next match.
+  /// Call this when the user has typed `text`. Selects the first matching row, starting at the
+  /// current row. If the user types the same letter again, selects the next match.
   void type(QAbstractItemView& view, const QString& text);
 
  private:

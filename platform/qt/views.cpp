@@ -46,7 +46,7 @@ void TextField::setStringValue(const std::string& text) const {
   if (auto* const label = nativeOf<QLabel>(*this)) {
     label->setTextFormat(Qt::PlainText);
     label->setText(QString::fromStdString(text));
-    // Qt gives only some kinds of control the name of the label that belongs to them.
+    // Qt uses a label's text as the accessible name of its buddy only for some kinds of control.
     if (label->buddy()) label->buddy()->setAccessibleName(label->text());
   }
 }

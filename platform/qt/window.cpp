@@ -10,7 +10,7 @@ namespace onramp {
 
 using qt::nativeOf;
 
-// A window without the indicator cannot be resized.
+// A window without a resize indicator must not be resizable, so ContentSize fixes its size.
 void Window::setShowsResizeIndicator(bool shows) const {
   auto* const window = nativeOf<QMainWindow>(*this);
   if (window && !shows) qt::makeChild<qt::ContentSize>(window);

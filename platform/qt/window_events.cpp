@@ -25,7 +25,7 @@ bool clickFirst(const QWidget& window, const QString& keyEquivalent) {
   return false;
 }
 
-// The turning spinner of the page that is shown, or null.
+// Returns the spinner of the page that is shown, or null when it has none.
 const Spinner* visibleSpinner(const QWidget& window) {
   for (const Spinner* const spinner : window.findChildren<Spinner*>()) {
     if (spinner->isVisible()) return spinner;
@@ -53,7 +53,7 @@ bool WindowEvents::eventFilter(QObject*, QEvent* event) {
     close();
     return true;
   }
-  // A key comes here when the widget with the focus has no use for it.
+  // The window receives a key only if the widget with the focus has not used it.
   if (event->type() == QEvent::KeyPress) return performKey(static_cast<QKeyEvent*>(event)->key());
   return false;
 }

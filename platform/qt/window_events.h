@@ -10,13 +10,13 @@ class ApplicationDelegate;
 
 namespace qt {
 
-/// Gives a window what the delegate and the keyboard expect of it: the delegate's veto on closing,
-/// and key equivalents.
+/// Handles two kinds of events of a window. The delegate decides whether the window may close, and
+/// some keys click buttons or open the menu.
 class WindowEvents final : public QObject {
   Q_OBJECT
 
  public:
-  /// Watches `window`, which owns this object. `delegate` outlives the window.
+  /// Watches `window`, which owns this object. `delegate` must outlive the window.
   WindowEvents(ApplicationDelegate& delegate, QWidget* window);
 
   bool eventFilter(QObject* watched, QEvent* event) override;
@@ -24,21 +24,23 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Says in the title bar what the window waits for, until the wait is over.
+  /// Shows in the title bar what the wizard is waiting for, until the wait is over.
   void explainRefusal();
 
   /// Returns whether the key did anything.
   bool performKey(int key);
 
-  /// Clicks the button with the focus or else the default one.
+  /// Clicks the button that has the focus, or else the default button. Returns whether a button was
+  /// clicked.
   bool performReturn();
 
-  /// Selects the first menu of the menu bar, from where the arrow keys lead on.
+  /// Selects the first menu of the menu bar, so that the arrow keys can be used from there. Returns
+  /// whether there is a menu.
   bool openMenu();
 
   QWidget* window_;
   ApplicationDelegate& delegate_;
-  bool isExplained_ = false;  ///< the title bar says what the window waits for
+  bool isExplained_ = false;  ///< the title bar shows what the wizard is waiting for
 };
 
 }  // namespace qt

@@ -4,9 +4,9 @@
 
 namespace onramp {
 
-/// Sets the version of macOS that this desktop stands in for, such as "10.9.5". The default, also
-/// for an empty `version`, is the environment variable ONRAMP_SYSTEM_VERSION, or 10.15.7 without
-/// it.
+/// Sets the version of macOS, such as "10.9.5", that is reported as the running system's. If
+/// `version` is empty or was never set, the environment variable ONRAMP_SYSTEM_VERSION gives the
+/// version. Without this variable the version is 10.15.7.
 void setSystemVersion(std::string version);
 
 }  // namespace onramp

@@ -25,7 +25,8 @@ std::string runningVersion() {
   return version && *version ? version : kDefaultVersion;
 }
 
-// Removes the text up to and including the next point, and returns its number.
+// Removes the text up to and including the next dot. Returns the number at the start of that text,
+// limited to the range from 0 to `most`.
 std::int64_t takeComponent(std::string_view& version, std::int64_t most) {
   const std::int64_t number = leadingInteger(version.substr(0, version.find('.')));
   version.remove_prefix(std::min(version.find('.'), version.size() - 1) + 1);
@@ -43,7 +44,7 @@ std::optional<std::string> productVersion() {
 }
 
 std::optional<std::int32_t> gestaltSystemVersion() {
-  // Three more points, so that each of the three components ends with one.
+  // The three added dots ensure that each of the three components ends with a dot.
   const std::string version = runningVersion() + "...";
   std::string_view rest = version;
   std::int64_t digits = takeComponent(rest, 9999);

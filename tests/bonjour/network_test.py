@@ -1,15 +1,13 @@
-"""Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE INFO_PLIST.
+"""Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM.
 
 The tests run on two hosts that are joined by two cables, with IPv4 and IPv6. Avahi announces the
 other host's devices. Another mDNS implementation, zeroconf, announces one device of this host."""
 
 import os
 import pathlib
-import shutil
 import socket
 import subprocess
 import sys
-import tempfile
 import time
 import unittest
 
@@ -21,7 +19,7 @@ from practice_network.control import PracticeNetwork
 from discovery import Avahi, Search
 from zeroconf import ServiceInfo, Zeroconf
 
-PROBE, CHOOSER, INFORMATION = map(os.path.abspath, sys.argv[1:4])
+PROBE, CHOOSER, MEDIUM = map(os.path.abspath, sys.argv[1:4])
 TYPE = "_ipp._tcp"
 WIZARDS_TYPE = "_pdl-datastream._tcp"
 ETH_P_ALL = 3
@@ -54,6 +52,11 @@ class NetworkTest(unittest.TestCase):
                                   "model": "Model 100"} | entries)
         self.addCleanup(self.network.remove, name)
 
+    def assert_leads_to(self, uri, address):
+        answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True, check=True,
+                                stdout=subprocess.PIPE).stdout
+        self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+
     def test_names_of_all_kinds_lead_to_their_devices_and_back(self):
         names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
                  "Osprey #2", "x" * 63]
@@ -65,9 +68,7 @@ class NetworkTest(unittest.TestCase):
                 self.assertEqual(model, "Kestrel Model 100")
                 if "." in name:  # A URI does not escape dots, so the name may be misread.
                     continue
-                answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True,
-                                        stdout=subprocess.PIPE, check=True).stdout
-                self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+                self.assert_leads_to(uri, address)
 
     def test_a_device_has_all_its_ipv4_addresses_and_no_others(self):
         self.add("Three", addresses=3)
@@ -79,18 +80,20 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Six")[6], "")
 
     def test_a_second_mdns_implementation_is_understood(self):
-        def service(**texts):
+        def service(model):
+            # Of two equal keys, the first one counts.
+            texts = (b"usb_MFG=Harrier", b"note=Attic", b"usb_MDL=" + model, b"usb_MDL=Other")
             return ServiceInfo(f"{TYPE}.local.", f"Harrier (2).{TYPE}.local.", port=631,
                                addresses=[socket.inet_aton("192.0.2.1")], server="second.local.",
-                               properties={"usb_MFG": "Harrier", "note": "Attic"} | texts)
+                               properties=b"".join(bytes([len(text)]) + text for text in texts))
 
         responder = Zeroconf(interfaces=["192.0.2.1"])
         self.addCleanup(responder.close)
-        responder.register_service(service(usb_MDL="Jet 7"))
+        responder.register_service(service(b"Jet 7"))
         with Search(PROBE, TYPE) as search:
             self.assertEqual(search.wait_for("update", "Harrier (2)")[3:7:3],
                              ["Harrier Jet 7", "192.0.2.1"])
-            responder.update_service(service(usb_MDL="Jet 8"))
+            responder.update_service(service(b"Jet 8"))
             # A running search does not notice the change. Avahi needs some time to notice it.
             model = None
             deadline = time.monotonic() + discovery.PATIENCE
@@ -129,9 +132,7 @@ class NetworkTest(unittest.TestCase):
                 self.network.unplug(lost)
                 # This host's daemon notices the loss a little later.
                 self.avahi.wait_for_interfaces(TYPE, {left})
-                answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True, check=True,
-                                        stdout=subprocess.PIPE).stdout
-                self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+                self.assert_leads_to(uri, address)
                 self.assertEqual(search.events("gone"), [])
                 self.network.plug(lost)
                 self.avahi.wait_for_interfaces(TYPE, {lost, left})
@@ -143,16 +144,11 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(len(search.events("found", "Kestrel")), 2)
 
     def test_the_wizard_does_not_ask_a_device_that_leaves(self):
-        medium = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
-        shutil.copytree(discovery.ROOT / "examples" / "medium", medium, dirs_exist_ok=True)
-        contents = medium / "Onramp OSX.app" / "Contents"
-        contents.mkdir(parents=True)
-        shutil.copy(INFORMATION, contents)
         self.network.add("Leaving", maker="Kestrel", model="Model 100", addresses=["192.0.2.91"])
         self.network.settle()
         self.avahi.wait_for_interfaces(WIZARDS_TYPE, {"practice0", "practice1"})
         with packets() as seen:
-            chooser = subprocess.Popen([CHOOSER, contents.parent, "600", "Kestrel Model 100"])
+            chooser = subprocess.Popen([CHOOSER, f"{MEDIUM}/Onramp OSX.app", "600", "Kestrel Model 100"])
             self.addCleanup(chooser.wait)
             self.addCleanup(chooser.kill)
             asked(seen, "192.0.2.91")
@@ -166,12 +162,16 @@ class NetworkTest(unittest.TestCase):
 
     def test_all_domains_that_the_computer_browses_are_searched(self):
         self.add("Far", domain="annex.local")
+        self.add("Farther", domain="attic.local")
         with Search(PROBE, TYPE) as search:
             self.assertEqual(search.wait_for("update", "Far")[5],
                              "dnssd://Far._ipp._tcp.annex.local.")
             search.wait_for("update", "Kestrel")
-            self.network.remove("Far")
-            search.wait_for("remove", "Far")
+            discovery.announce_pointer("b._dns-sd._udp", [b"attic", b"local"])
+            search.wait_for("update", "Farther")
+            discovery.announce_pointer("b._dns-sd._udp", [b"attic", b"local"], seconds=0)
+            search.wait_for("remove", "Farther")
+            self.assertEqual(search.events("remove", "Far"), [])
 
     def test_many_devices_are_found_even_by_a_daemon_with_a_low_limit(self):
         self.addCleanup(self.avahi.restart)
@@ -181,7 +181,7 @@ class NetworkTest(unittest.TestCase):
                 self.add(name, addresses=["192.0.2.100"])
             self.avahi.restart(objects_per_client_max=limit)
             with self.subTest(limit=limit), Search(PROBE, TYPE) as search:
-                search.wait(lambda _: names <= {event[2] for event in search.events("update")})
+                search.wait(lambda: names <= {event[2] for event in search.events("update")})
 
     def test_the_daemon_may_be_absent_and_come_and_go(self):
         self.avahi.kill()

@@ -51,7 +51,7 @@ class Agents:
         deadline = time.monotonic() + 20
         while awaited := [agent for agent in awaited if not agent.is_listening()]:
             if time.monotonic() > deadline:
-                raise AgentError(f"snmpd at {awaited[0].address} does not listen:"
+                raise AgentError(f"snmpd at {awaited[0].address} did not start listening:"
                                  f"\n{awaited[0].log()}")
             time.sleep(0.005)
 

@@ -26,9 +26,9 @@ status of COMMAND. Real Avahi and net-snmp daemons play the devices, inside sepa
 packet leaves this machine, and no hardware is needed. When COMMAND or this tool ends, in whatever
 way, the network is gone.
 
-The wizard against twenty devices:
+This runs the wizard with twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
-A shell to look around in:
+This starts a shell, in which such commands show the devices:
     tools/practice-network examples/practice-network.toml
     avahi-browse -rpt _pdl-datastream._tcp
     snmpget -v1 -c corridor 127.0.1.1 1.3.6.1.4.1.4242.2.4.4.1240.1.2.0
@@ -49,7 +49,7 @@ and one table for each device:
     name = "Kestrel Model 100"     the name in the wizard's list; all other entries are optional
     maker = "Kestrel"              as in the medium's model names: maker, blank, model
     model = "Model 100"
-    note = "2nd floor"             where it stands
+    note = "2nd floor"             the device's location
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
     domain = "annex.local"         default "local"; other domains have to end in ".local"
     port = 631                     default: the type's usual port
@@ -69,7 +69,7 @@ is an entry as in the file:
     practice-network ctl set NAME KEY=VALUE ...       such as activeif=silent, delay=3, note=Attic
     practice-network ctl rename NAME NEW-NAME
     practice-network ctl remove NAME
-    practice-network ctl unplug INTERFACE             pulls an interface's cable
+    practice-network ctl unplug INTERFACE             takes an interface down
     practice-network ctl plug INTERFACE               brings the interface back
     practice-network ctl stop-daemon | start-daemon | restart-daemon      controls Avahi
     practice-network ctl settle                       waits until all devices are published
@@ -136,7 +136,7 @@ def _enclose(options):
     from practice_network import namespace
     reason = namespace.why_not_enclosed()
     if reason:
-        return _complain(f"this machine gives no namespaces: {reason}", NO_NAMESPACE)
+        return _complain(f"this machine cannot create namespaces: {reason}", NO_NAMESPACE)
     user, group, path = json.loads(options.invoker) if options.invoker else (0, 0, "")
     command = options.command[1:] if options.command[:1] == ["--"] else options.command
     return namespace.enclose({
@@ -147,11 +147,11 @@ def _enclose(options):
 
 def _become_root(program, arguments):
     if not shutil.which("sudo"):
-        return _complain("this machine gives no namespaces: not root, and there is no sudo",
+        return _complain("namespaces need root: you are not root, and there is no sudo",
                          NO_NAMESPACE)
     ask = [] if sys.stdin.isatty() else ["-n"]
     if os.spawnvp(os.P_WAIT, "sudo", ["sudo", *ask, "-v"]):
-        return _complain("this machine gives no namespaces: not root, and sudo refuses",
+        return _complain("namespaces need root: you are not root, and sudo refuses",
                          NO_NAMESPACE)
     invoker = json.dumps([os.getuid(), os.getgid(), os.environ.get("PATH", "")])
     os.execvp("sudo", ["sudo", "-E", *ask, "--", "setpriv", "--pdeathsig", "KILL", sys.executable,

@@ -163,7 +163,7 @@ class Host:
         deadline = time.monotonic() + 10
         while not os.path.exists(BUS_SOCKET):
             if bus.poll() is not None or time.monotonic() > deadline:
-                raise HostError(f"dbus-daemon does not come up:\n{log('dbus-daemon')}")
+                raise HostError(f"dbus-daemon did not start:\n{log('dbus-daemon')}")
             time.sleep(0.005)
 
 

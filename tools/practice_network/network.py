@@ -55,7 +55,7 @@ class Network:
 
     def _plug(self, interface, plugged):
         if interface not in self._host.interfaces:
-            raise DescriptionError(f'interface "{interface}": is not known; known are '
+            raise DescriptionError(f'interface "{interface}": is unknown; the interfaces are '
                                    + ", ".join(self._host.interfaces))
         self._host.plug(interface, plugged)
 
@@ -94,7 +94,7 @@ class Network:
         """Changes a device. Publishes only what the new entries change."""
         before = self._devices.get(name)
         if not before:
-            raise DescriptionError(f'device "{name}": is not known; "list" shows the known ones')
+            raise DescriptionError(f'device "{name}": is unknown; "list" shows the known devices')
         after = description.change(before, entries, f'device "{name}"')
         if after.name != name and after.name in self._devices:
             raise DescriptionError(f'device "{after.name}": exists already; choose another name')
@@ -127,7 +127,7 @@ class Network:
                 self._publish(after)
 
     def list(self):
-        """Returns a dictionary per device: its entries, and Avahi's word for its state as "state"."""
+        """Returns a dictionary per device: its entries and Avahi's word for its state, "state"."""
         return [{key: value for key, value in dataclasses.asdict(device).items()
                  if value is not None}
                 | {"txt": dict(device.txt), "state": self._state(device)}
@@ -166,7 +166,7 @@ class Network:
             addresses = tuple(itertools.islice(free, device.addresses))
             if len(addresses) < device.addresses:
                 raise DescriptionError(f'device "{device.name}": no address of {self._subnet} is '
-                                       "left; let closed devices share some")
+                                       "left; closed devices can share an address")
             device = dataclasses.replace(device, addresses=addresses)
         for address, behaviour in zip(device.addresses, device.behaviour()):
             if address in used and behaviour != description.CLOSED:

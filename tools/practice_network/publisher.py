@@ -39,7 +39,7 @@ def connect(bus_address, seconds=10):
         except dbus.DBusException as error:
             state = error
         if time.monotonic() > deadline:
-            raise PublishError(f"avahi-daemon does not come up: {state}")
+            raise PublishError(f"avahi-daemon did not start: {state}")
         time.sleep(0.01)
 
 

@@ -23,5 +23,5 @@ install_packages() {
   "${as_root[@]}" apt-get update -qq &&
     "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
       apt-get install -y -qq --no-install-recommends $missing >/dev/null ||
-    { echo "apt-get could not install all of: $missing" >&2; return 1; }
+    { echo "apt-get could not install all of these packages: $missing" >&2; return 1; }
 }

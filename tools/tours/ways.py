@@ -26,7 +26,7 @@ class Tour:
         """Shows the alert on a system that the medium does not support."""
         version = self._medium.unsupported_version()
         if not version:
-            print("The medium supports every system version: there is no alert to see.")
+            print("The medium supports every system version, so there is no alert to show.")
             return
         with self._start("--system-version", version) as person:
             person.see("push button", self._text.get("BTN_CLOSE", "Close"))

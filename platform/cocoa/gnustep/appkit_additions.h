@@ -4,7 +4,8 @@
 
 #import <AppKit/AppKit.h>
 
-// Declares what the front end uses of AppKit and GNUstep lacks. Included ahead of every source.
+// Declares the AppKit methods that the front end uses and GNUstep lacks. The build includes this
+// header before every Objective-C++ source.
 
 @interface NSView (OnrampIdentification)
 - (NSString*)identifier;

@@ -1,4 +1,4 @@
-// The rest of what GNUstep's AppKit lacks.
+// Small features of AppKit that GNUstep lacks and that need no file of their own.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
@@ -12,17 +12,18 @@ using PerformKey = BOOL(id, SEL, NSEvent*);
 BeginSheet* originalBeginSheet = nullptr;
 PerformKey* originalPerformKey = nullptr;
 
-// A hidden button does not answer to its key equivalent.
+// GNUstep would let a hidden button respond to its key equivalent. AppKit does not.
 BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
   return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
 }
 
-// GNUstep shows no resize indicator on a window of fixed size, and no window prevents termination.
+// Stands in for two setters that GNUstep lacks. They do nothing, because GNUstep shows no resize
+// indicator on a window of fixed size and lets no window prevent termination.
 void ignore(id, SEL, BOOL) {}
 
 }  // namespace
 
-/// A sheet that begins on the loop's next turn.
+/// A sheet that opens in the next iteration of the main loop.
 @interface OnrampWaitingSheet : NSObject {
  @public
   NSAlert* _alert;
@@ -54,7 +55,8 @@ void ignore(id, SEL, BOOL) {}
 
 namespace {
 
-// GNUstep runs a sheet in a modal loop before it returns to the caller.
+// Opens the sheet later, because GNUstep would run it in a modal loop before it returns to the
+// caller.
 void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) {
   OnrampWaitingSheet* const sheet = [[[OnrampWaitingSheet alloc] init] autorelease];
   sheet->_alert = [self retain];
@@ -68,13 +70,14 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
                              arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
-// The application exchanges no notifications with others. GNUstep would start a daemon for them,
-// and fail to launch when the daemon is slow to answer.
+// The application exchanges no notifications with other applications. GNUstep would start a daemon
+// for such notifications, and the application would fail to launch if that daemon were slow to
+// answer.
 id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// GNUstep's workspace knows only GNUstep's programs; the desktop's opener knows all.
+// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows every program.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
@@ -90,8 +93,9 @@ BOOL openURL(id, SEL, NSURL* url) {
 
 }  // namespace
 
-/// A control's accessibility relation in an interface file. GNUstep creates an object for each
-/// element, and refuses the whole file if it lacks the class of one.
+/// Stands for an accessibility relation between controls in an interface file. GNUstep creates an
+/// object for each element of the file, and rejects the whole file if it lacks the class of one
+/// element.
 @interface IBAccessibilityConnection : NSObject
 @end
 

@@ -1,4 +1,4 @@
-// Reads bundles that are laid out as on macOS, with everything in a folder "Contents".
+// Makes GNUstep read bundles that are laid out as on macOS, with everything in a folder "Contents".
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -61,7 +61,7 @@ NSString* executablePath(id self, SEL selector) {
   return originalExecutablePath(self, selector);
 }
 
-// The bundle that holds the running program in Contents/Linux.
+// Returns the bundle that holds the running program in its folder Contents/Linux.
 NSBundle* mainBundle(id, SEL) {
   static NSBundle* bundle = nil;
   if (!bundle) {

@@ -7,8 +7,8 @@ namespace {
 // The defaults domain that GNUstep searches first.
 NSString* const kFirstDomain = @"GSPrimaryDomain";
 
-// GNUstep looks for folders named after languages, such as "German.lproj". A bundle's folders are
-// named after language codes.
+// Returns the codes of the user's languages. GNUstep would look for folders named after languages,
+// such as "German.lproj", but the folders of our bundles are named after codes, such as "de.lproj".
 NSArray* languageCodes() {
   NSDictionary* const environment = [[NSProcessInfo processInfo] environment];
   NSMutableArray* const codes = [NSMutableArray array];
@@ -32,7 +32,7 @@ NSArray* languageCodes() {
 
 @implementation OnrampDefaults
 
-// The menu is shown in the window, and no icon on the desktop.
+// Shows the menu inside the window, and shows no icon of the application on the desktop.
 + (void)load {
   @autoreleasepool {
     NSUserDefaults* const defaults = [NSUserDefaults standardUserDefaults];

@@ -1,6 +1,7 @@
-// Keeps the time of the last event correct. Every request for the keyboard carries it, and the
-// window manager refuses a request that looks old. GNUstep also takes the time from "_NET_WM_PING"
-// messages, whose number need not be a time: Openbox counts from one.
+// Keeps GNUstep's time of the last event correct. Every request for the keyboard focus carries this
+// time, and the window manager refuses a request that looks old. GNUstep also takes the time from
+// "_NET_WM_PING" messages, in which the number need not be a time. The window manager Openbox, for
+// example, sends a count that starts at one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -9,7 +10,7 @@ namespace {
 
 using SetTime = void(id, SEL, unsigned long);
 
-// Times are milliseconds in 32 bits. A greater step back than this is a wrap-around.
+// Times are milliseconds in 32 bits. A step back of at least this size is a wrap-around.
 constexpr unsigned long kGreatestStepBack = 0xF0000000UL;
 
 SetTime* originalSetLastTime = nullptr;
@@ -37,7 +38,7 @@ void setLastTime(id self, SEL selector, unsigned long time) {
   }
 }
 
-// GNUstep loads its X11 backend together with the application object.
+// This runs after the application object was created, because GNUstep loads its X11 backend then.
 + (void)replace:(NSNotification*)notification {
   Class const server = NSClassFromString(@"XGServer");
   if (!server) return;

@@ -1,6 +1,6 @@
-// Hides and unhides the application as AppKit does. GNUstep would make an icon of each window,
-// since the application has none to click on, and a window that is brought back before its icon is
-// on the screen does not always get the keyboard.
+// Hides and unhides the application as AppKit does. GNUstep would replace each window with an icon,
+// because the application has no icon that the user could click. A window that is brought back
+// before its icon is on the screen does not always get the keyboard focus.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -18,13 +18,13 @@ PlainAction* originalOrderFrontRegardless = nullptr;
 Question* originalIsHidden = nullptr;
 bool isHiddenByItself = false;
 
-// The windows that were on the screen when the application was hidden, from front to back.
+// Returns the windows that were on the screen when the application was hidden, from front to back.
 NSMutableArray* hiddenWindows() {
   static NSMutableArray* const windows = [[NSMutableArray alloc] init];
   return windows;
 }
 
-// A user who hides the application from the menu needs GNUstep's icons to bring it back.
+// When the user hides the application from the menu, GNUstep's icons are needed to bring it back.
 void hide(id self, SEL selector, id sender) {
   if (sender) {
     originalHide(self, selector, sender);
@@ -55,7 +55,7 @@ BOOL isHidden(id self, SEL selector) {
   return isHiddenByItself || originalIsHidden(self, selector);
 }
 
-// No window of a hidden application comes on the screen.
+// The windows of a hidden application must not appear on the screen.
 void makeKeyAndOrderFront(id self, SEL selector, id sender) {
   if (!isHiddenByItself) originalMakeKeyAndOrderFront(self, selector, sender);
 }

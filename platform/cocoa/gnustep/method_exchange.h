@@ -4,14 +4,15 @@
 
 namespace onramp::gnustep {
 
-/// Replaces the class's instance method and returns the previous implementation.
+/// Replaces an instance method of the class `owner` and returns its previous implementation.
 template <typename Implementation>
 Implementation* replaceMethod(Class owner, SEL selector, Implementation* replacement) {
   return reinterpret_cast<Implementation*>(method_setImplementation(
       class_getInstanceMethod(owner, selector), reinterpret_cast<IMP>(replacement)));
 }
 
-/// Adds a method to the class, or replaces it. The method takes a BOOL and returns nothing.
+/// Adds an instance method to the class `owner`, or replaces it if there is one. The method takes a
+/// BOOL and has no result.
 inline void addMethod(Class owner, SEL selector, void (*implementation)(id, SEL, BOOL)) {
   class_replaceMethod(owner, selector, reinterpret_cast<IMP>(implementation), "v@:c");
 }

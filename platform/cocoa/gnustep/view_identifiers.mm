@@ -1,4 +1,4 @@
-// Gives views the identifiers that their interface file names.
+// Gives views the identifiers that their interface file contains, because GNUstep ignores these.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -12,7 +12,7 @@ InitWithCoder* originalViewInit = nullptr;
 InitWithCoder* originalCustomViewInit = nullptr;
 Dealloc* originalDealloc = nullptr;
 
-// Identifiers by view. A view's entry is removed when the view is deallocated.
+// Returns the table of identifiers by view. A view's entry is removed when the view is deallocated.
 NSMapTable* identifiers() {
   static NSMapTable* const table =
       NSCreateMapTable(NSNonOwnedPointerMapKeyCallBacks, NSObjectMapValueCallBacks, 64);
@@ -30,7 +30,7 @@ id viewInit(id self, SEL selector, NSCoder* coder) {
   return identified(originalViewInit(self, selector, coder), coder);
 }
 
-// A decoded NSCustomView is replaced by a view of its custom class.
+// Decoding an NSCustomView returns a view of the custom class in its place.
 id customViewInit(id self, SEL selector, NSCoder* coder) {
   return identified(originalCustomViewInit(self, selector, coder), coder);
 }
@@ -56,7 +56,7 @@ void dealloc(id self, SEL selector) {
   }
 }
 
-// GNUstep has no accessibility.
+// Does nothing, because GNUstep does not support accessibility.
 - (void)setAccessibilityLabel:(NSString*)label {
 }
 
