@@ -70,17 +70,18 @@ class Everybody(unittest.TestCase):
     @classmethod
     def setUpClass(cls):
         serve("127.0.9.3", shortened, seconds=2.5)
-
-    def test_every_device_gets_its_verdict(self):
         ghost = start("avahi-publish-service", "-H", "nowhere.local", "unresolved",
                       "_pdl-datastream._tcp", "9100")
-        self.addCleanup(ghost.communicate)
-        self.addCleanup(ghost.terminate)
-        result = run(*browse())
-        devices = by_name(result.stdout)
+        cls.addClassCleanup(ghost.communicate)
+        cls.addClassCleanup(ghost.terminate)
+        cls.result = run(*browse())
+        cls.devices = by_name(cls.result.stdout)
+
+    def test_every_device_gets_its_verdict(self):
+        devices = self.devices
         self.assertEqual({name: device["verdict"]["id"] for name, device in devices.items()},
                          {name: name for name in DEVICES} |
-                         {"unresolved": "unresolved", "two models": "listed"}, result.stderr)
+                         {"unresolved": "unresolved", "two models": "listed"}, self.result.stderr)
         self.assertEqual({one["address"] for one in devices["listed"]["answer"]["exchanges"]},
                          set(devices["listed"]["record"]["IP address list"]))
         self.assertIn("lo IPv4", devices["listed"]["sightings"])
@@ -106,8 +107,7 @@ class Everybody(unittest.TestCase):
                          "other-model")
 
     def test_asks_as_net_snmp_does(self):
-        known = by_name(run(*browse("-s", "4")).stdout)
-        asked = {name: device["record"]["IP address list"][0] for name, device in known.items()
+        asked = {name: device["record"]["IP address list"][0] for name, device in self.devices.items()
                  if "answer" in device and name != "late"}
         ours = {name: start(PROGRAM, "ask", "--json", address) for name, address in asked.items()}
         theirs = {name: start("snmpget", "-v1", "-Ov", "-r0", "-t5", "-c", "corridor", address, OBJECT)
