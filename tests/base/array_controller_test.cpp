@@ -4,8 +4,6 @@
 
 #include <optional>
 #include <string>
-#include <utility>
-#include <vector>
 
 namespace onramp {
 namespace {
