@@ -1,5 +1,5 @@
-"""Makes one mistake at a time on a copy of the example medium and reads what onramp-check reports.
-Arguments: the program and the application's Info.plist."""
+"""Makes one mistake at a time in a copy of a medium and reads what onramp-check reports.
+Arguments: the program, and the example medium with the application on it."""
 
 import json
 import os
@@ -12,7 +12,7 @@ import tempfile
 import unittest
 from pathlib import Path
 
-PROGRAM, INFORMATION = sys.argv[1:]
+PROGRAM, MEDIUM = sys.argv[1:]
 ROOT = Path(__file__).resolve().parents[2]
 APPLICATION = "Onramp OSX.app/Contents"
 COMMON = "MacResources/CDCommonInfo.plist"
@@ -28,17 +28,9 @@ PICTURE = "MacResources/Images/usb.png"
 
 
 def make_medium(folder):
-    shutil.copytree(ROOT / "examples/medium", folder)
-    resources = folder / APPLICATION / "Resources"
-    resources.mkdir(parents=True)
-    for source in ROOT.glob("resources/*.lproj"):
-        shutil.copytree(source, resources / source.name)
-    for name in ("Background.png", "SupportedKOL.plist"):
-        shutil.copy(ROOT / "resources" / name, resources)
-    shutil.copy(INFORMATION, folder / APPLICATION / "Info.plist")
-    program = folder / APPLICATION / "MacOS/Onramp OSX"
-    program.parent.mkdir()
-    program.touch(0o755)
+    shutil.copytree(MEDIUM, folder, ignore=shutil.ignore_patterns("Linux"))
+    (folder / APPLICATION / "MacOS").mkdir()
+    (folder / APPLICATION / "MacOS/Onramp OSX").touch(0o755)
 
 
 def run(*arguments, **options):
@@ -127,7 +119,7 @@ def maximum(major, minor, bug_fix):
 
 # For each mistake: its breaker, the identifier of the only finding, and parts of the report on it.
 MISTAKES = [
-    # The lists.
+    # Property lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
     (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
     (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
@@ -213,7 +205,7 @@ MISTAKES = [
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
      "picture-size", "680 × 480", "192 × 192"),
     (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
-    # Names in the network and in files.
+    # Names on the network and in files.
     (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", '"_pdl-datastream._tcp."'),
     (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
     (put(COMMON, "BonjourNetwork", "_http._tcp."), "service-unknown", "which model"),

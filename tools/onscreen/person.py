@@ -17,7 +17,8 @@ _COLUMNS = 3
 def _is(control, role, name):
     """Returns whether the control matches.
 
-    A heading counts as a label, too. A row's first cell may be called "name, address".
+    A heading counts as a label, too. The name of a row's first cell may be followed by a comma and
+    the row's address.
     """
     own_role = control.get_role_name()
     if own_role != role and (own_role, role) != ("heading", "label"):
@@ -94,7 +95,7 @@ class Person:
     def click(self, role, name=None):
         """Clicks the middle of a control once the control is enabled."""
         control = self.see(role, name)
-        wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} enabled")
+        wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} to be enabled")
         self.click_control(control)
 
     def click_control(self, control):
@@ -164,9 +165,9 @@ class Person:
         return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
 
     def round_trip(self):
-        """Returns the seconds that the program takes to answer, without its waits for a processor.
+        """Returns the seconds that the program takes to answer a small request.
 
-        Returns None when the program has ended and does not answer.
+        Leaves out the time that the program and this process wait for a processor. Returns None when the program has ended and does not answer.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -221,7 +222,10 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` with everything on the screen, depth first. Skips objects that vanish."""
+        """Calls `visit` with `control` and everything visible below it, until it returns False.
+
+        Goes depth first and skips objects that vanish. Enters tables only if `tables` is set.
+        """
         if control is None:
             self._overlooked = True
             return True
