@@ -154,13 +154,13 @@ MISTAKES = [
     (both(*(put(path, key, "Kestrel100", {"KSCID": "x", "Interfaces":
         {"USB": True, "WiredLAN": False, "WirelessLAN": True}})
             for path, key in ((DESCRIPTION, "ContainedModel"), (MODELS, "Model")))),
-     "model-unannounceable", "without a blank"),
+     "model-unannounceable", "without a space"),
     (both(rename(DESCRIPTION, MODEL, MODEL + " ", "ContainedModel"),
-          rename(MODELS, MODEL, MODEL + " ", "Model")), "model-blanks", "some really do"),
+          rename(MODELS, MODEL, MODEL + " ", "Model")), "model-blanks", "some devices do"),
     (both(*(put(path, key, MODEL.lower(), {"KSCID": "x", "Interfaces":
         {"USB": True, "WiredLAN": False, "WirelessLAN": True}})
             for path, key in ((DESCRIPTION, "ContainedModel"), (MODELS, "Model")))),
-     "model-twice", "capitals only"),
+     "model-twice", "capital letters"),
     (both(put(DESCRIPTION, "ContainedModel", {}), put(MODELS, "Model", {}),
           take(COMMON, "BonjourNetwork"), take(COMMON, "WLANtool")), "models-none", "at once"),
     # Systems and packages.
@@ -243,7 +243,7 @@ class OnrampCheck(unittest.TestCase):
     def test_finds_nothing_on_the_example_medium_and_says_what_users_will_see(self):
         result = run("--strict", str(self.medium))
         self.assertEqual((0, ""), (result.returncode, result.stderr), result.stdout)
-        for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the list of models",
+        for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the model list",
                      f": {PACKAGE}", "Languages: " + " ".join(
                          f"{language} (31 texts)" for language in "de en ja ko zh_CN".split()),
                      "0 errors, 0 warnings, 17 models"):
@@ -272,7 +272,7 @@ class OnrampCheck(unittest.TestCase):
         self.assertEqual(1, result.returncode)
         line = result.stdout.splitlines()[0]
         self.assertTrue(line.startswith(f'{ENGLISH}:9: error: ";" expected'), line)
-        self.assertIn("Users get: ", line)
+        self.assertIn("Effect: ", line)
 
     def test_lists_every_text_that_the_sources_ask_for_and_no_other(self):
         sources = "".join(path.read_text() for room in ("app", "pages")

@@ -202,7 +202,7 @@ class CommandLine(unittest.TestCase):
     def test_refuses_bad_arguments_with_a_remedy(self):
         with tempfile.TemporaryDirectory() as empty:
             for arguments, message in ((["browse"], "--medium is required"),
-                                       (["browse", "-m", empty], "holds no application"),
+                                       (["browse", "-m", empty], "contains no application"),
                                        (["ask"], "ADDRESS is required"),
                                        (["ask", "no such host"], "neither an IPv4 address"),
                                        (["serch"], "--help")):

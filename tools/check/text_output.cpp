@@ -39,7 +39,7 @@ std::string sentences(const Finding& finding) {
   if (!finding.expected.empty()) text += "; expected: " + finding.expected;
   if (!finding.nearest.empty()) text += "; did you mean " + quoted(finding.nearest) + "?";
   if (finding.nearest.empty()) text += ".";
-  if (!finding.effect.empty()) text += " Users get: " + finding.effect + ".";
+  if (!finding.effect.empty()) text += " Effect: " + finding.effect + ".";
   if (!finding.remedy.empty()) text += " Remedy: " + finding.remedy + ".";
   return text;
 }
@@ -60,16 +60,20 @@ void writeModels(std::ostream& out, const Report& report) {
   }
 }
 
+std::string counted(std::size_t count, const char* word) {
+  return std::to_string(count) + ' ' + word + (count == 1 ? "" : "s");
+}
+
 const char* startInWords(FirstPage page) {
   switch (page) {
     case FirstPage::kNone:
       return "no page: the package opens at once, because no model supports wireless";
     case FirstPage::kConnectionType:
-      return "the connection type: all models have the same connections by cable";
+      return "the connection page: all models have the same connections by cable";
     case FirstPage::kModelList:
       break;
   }
-  return "the list of models";
+  return "the model list";
 }
 
 }  // namespace
@@ -92,8 +96,9 @@ void writeText(std::ostream& out, const Report& report) {
     out << ' ' << printable(language.name) << " (" << language.texts << " texts)";
   out << (report.languages.empty() ? " none\n" : "\n");
   out << '\n'
-      << report.medium << ": " << report.count(Severity::kError) << " errors, "
-      << report.count(Severity::kWarning) << " warnings, " << report.models.size() << " models\n";
+      << report.medium << ": " << counted(report.count(Severity::kError), "error") << ", "
+      << counted(report.count(Severity::kWarning), "warning") << ", "
+      << counted(report.models.size(), "model") << '\n';
 }
 
 void writeTexts(std::ostream& out) {

@@ -211,15 +211,15 @@ class TextCheck {
     const auto information = files_.list(
         path, {{.file = path},
                "the message bundle's Info.plist",
-               "the language that users of all other languages see is left to the system"});
+               "which language users without texts in their own see is left to the system"});
     if (!information) return;
     const auto region = information->string(kKey);
     Finding finding{
         .id = "region-missing",
         .place = {.file = path},
         .found = "no \"CFBundleDevelopmentRegion\"",
-        .expected = "the language for users of all other languages, such as \"en\"",
-        .effect = "the language that users of all other languages see is left to the system",
+        .expected = "the language for users without texts in their own, such as \"en\"",
+        .effect = "which language users without texts in their own see is left to the system",
         .remedy = "add it"};
     if (region) {
       if (serves(languages_, *region)) return;
@@ -251,8 +251,8 @@ class TextCheck {
            .found = "no " + quoted(language + std::string(kLanguageFolder)),
            .expected = "the languages of the message bundle; the application has " + joined(own),
            .effect = "users of " + quoted(language) +
-                     " read in English why the network is used, and hear the gear button's name in "
-                     "English",
+                     " read and hear some of the application's texts in English: why it uses the "
+                     "network, and the name of the gear button",
            .remedy = "have the application built with texts in that language"});
     }
   }

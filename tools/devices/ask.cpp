@@ -37,8 +37,8 @@ std::string conclusionOf(const Answer& answer) {
   const Exchange* const told = answer.telling();
   if (answer.isWireless) return "wireless\n";
   if (!told || !told->value) return "no usable answer: not in the wizard's list\n";
-  return "not wireless, which is " + std::to_string(kActiveIFWireless) +
-         ": not in the wizard's list\n";
+  return "not wireless (wireless would be " + std::to_string(kActiveIFWireless) +
+         "): not in the wizard's list\n";
 }
 
 std::string textOf(const std::string& address, const Answer& answer, bool isVerbose) {

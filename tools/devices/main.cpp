@@ -28,13 +28,15 @@ constexpr const char* kExamples = R"(Examples:
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
   CLI::App* const command = app.add_subcommand(
-      "browse", "Show the devices that are announced, live, and why each is listed or not");
-  command->add_option("-m,--medium", options.medium, "The folder that the application lies in")
+      "browse",
+      "Show announced devices as they are found, and why the wizard lists each one or not");
+  command->add_option("-m,--medium", options.medium, "The folder that contains the application")
       ->required()
       ->type_name("DIR");
   command
       ->add_option("--model", options.models,
-                   "Search for this model only, as for a user who chose it; may be repeated")
+                   "Search only for this model, as the wizard does once the user has chosen it; "
+                   "may be repeated")
       ->type_name("NAME")
       ->allow_extra_args(false);
   command->add_option("-s,--seconds", options.seconds, "How long to listen")
@@ -72,7 +74,7 @@ void addHosts(CLI::App& app, HostsOptions& options) {
   CLI::App* const command = app.add_subcommand(
       "hosts", "Show this computer's IPv4 addresses and the devices that answer a broadcast");
   command->add_flag_callback(
-      "-n,--no-search", [&options] { options.search = false; }, "Send nothing");
+      "-n,--no-search", [&options] { options.search = false; }, "Send no broadcasts");
   command->add_flag("--json", options.json, "Print JSON");
 }
 
