@@ -2,6 +2,7 @@
 #include <string_view>
 
 #include "base/ascii.h"
+#include "base/text.h"
 #include "bonjour/identity_keys.h"
 #include "media/medium.h"
 #include "platform/lowercase.h"
@@ -66,11 +67,12 @@ void checkServiceType(const Lists& lists, Report& report) {
   Finding finding{.place = place,
                   .found = "the service type " + quoted(*type),
                   .effect = kNoDevice,
-                  .remedy = "write the type that the devices announce"};
+                  .remedy = "write the type that the devices announce, with its closing dot"};
   if (isServiceType(*type + ".")) {
     finding.id = "service-dot";
     finding.found += " without its closing dot";
-    finding.expected = quoted(*type + ".");
+    finding.nearest = *type + ".";
+    finding.remedy = "add the dot";
   } else if (!isServiceType(*type)) {
     finding.id = "service-malformed";
     finding.found += ", which is malformed";
@@ -84,7 +86,7 @@ void checkServiceType(const Lists& lists, Report& report) {
     checkDeclared(lists, *type, report);
     return;
   }
-  finding.nearest = known.nearest(*type).value_or("");
+  if (finding.nearest.empty()) finding.nearest = known.nearest(*type).value_or("");
   report.findings.push_back(std::move(finding));
 }
 
@@ -125,17 +127,15 @@ void checkVendor(const Lists& lists, Report& report) {
 
 void checkSeries(const Lists& lists, Report& report) {
   const std::string series = lists.description->string("KSCSeriesCode").value_or("");
-  const bool plain = std::all_of(series.begin(), series.end(), [](char c) {
-    return isASCIILetterOrDigit(c) || std::string_view("-._~").find(c) != std::string_view::npos;
-  });
-  if (plain) return;
-  report.findings.push_back(
-      {.id = "series-address",
-       .place = {.file = lists.descriptionPath, .key = {"KSCSeriesCode"}},
-       .found = "the series code " + quoted(series),
-       .expected = "letters, digits, \"-\", \".\", \"_\" and \"~\"",
-       .effect = "the button for the support page opens nothing, or the wrong page",
-       .remedy = "write the code as the support site does"});
+  const bool opens = isURLText(series);
+  if (opens && series.find_first_of("/?#") == std::string::npos) return;
+  report.findings.push_back({.id = "series-address",
+                             .place = {.file = lists.descriptionPath, .key = {"KSCSeriesCode"}},
+                             .found = "the series code " + quoted(series),
+                             .expected = "letters and digits",
+                             .effect = opens ? "the button for the support page opens another page"
+                                             : "the button for the support page opens nothing",
+                             .remedy = "write the code as the support site does"});
 }
 
 }  // namespace

@@ -96,7 +96,8 @@ constexpr std::array kModelInformationRules{
 
 constexpr std::array kModelRules{
     KeyRule{"KSCID", Kind::kText, Need::kRequired,
-            "the model offers no connection at all: the package opens as soon as it is chosen"},
+            "the model offers no connection at all: the package opens as soon as it is chosen",
+            ": the model's identifier at the support centre"},
     KeyRule{"Interfaces", Kind::kDictionary, Need::kAdvised, "the model has USB only"},
 };
 
@@ -156,12 +157,13 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
     const DictionaryPlace place{path, {"Model", name}};
     const auto* const entry = value.as<Dictionary>();
     if (!entry) {
-      report.findings.push_back({.id = "value-kind",
-                                 .place = {.file = path, .key = place.path},
-                                 .found = described(value),
-                                 .expected = "a dictionary",
-                                 .effect = "the model has USB only",
-                                 .remedy = "write a value of the expected type"});
+      report.findings.push_back(
+          {.id = "value-kind",
+           .place = {.file = path, .key = place.path},
+           .found = described(value),
+           .expected = "a dictionary",
+           .effect = "the model has USB only",
+           .remedy = "write the model's dictionary, as other models have it"});
       continue;
     }
     checkKeys(*entry, place, kModelRules, OtherKeys::kReported, report);

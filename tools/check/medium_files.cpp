@@ -64,6 +64,15 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
+// `nearest` is the name on the medium that resembles the missing one. `isWritten` tells whether the
+// medium can name another file; the wizard itself decides the other names.
+std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
+                             bool isWritten) {
+  if (!nearest) return isWritten ? "put it there, or correct the path" : "put it there";
+  const std::string rename = "rename the file to " + quoted(missing);
+  return isWritten ? "write " + quoted(*nearest) + ", or " + rename : rename;
+}
+
 // Adds to `finding` why the wizard cannot read the bytes of a file, and the place.
 void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   ParseProblem problem;
@@ -127,7 +136,7 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
       finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
                                         : quoted(part) + " in " + quoted(folder);
       if (nearest) finding.nearest = *nearest;
-      finding.remedy = nearest ? "use one spelling for both" : "put it there, or correct the path";
+      finding.remedy = remedyForMissing(part, nearest, !use.place.key.empty());
       report_.findings.push_back(std::move(finding));
       return false;
     }
@@ -159,12 +168,14 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
   } else {
     explain(*bytes, isStrings, finding);
   }
-  if (finding.expected.empty()) {
-    finding.expected = isStrings ? "a strings table" : "a property list, XML or binary";
+  const bool isSyntax = isStrings && finding.place.line;
+  if (finding.expected.empty() && !isSyntax) {
+    finding.expected =
+        isStrings ? "lines of the form \"key\" = \"text\";" : "a property list, XML or binary";
   }
   if (finding.remedy.empty()) {
-    finding.remedy =
-        finding.place.line ? "correct that line or the one before it" : "save the file again";
+    finding.remedy = finding.place.line ? "correct that line or the one before it"
+                                        : "put an undamaged copy of the file there";
   }
   report_.findings.push_back(std::move(finding));
 }

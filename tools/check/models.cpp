@@ -8,6 +8,7 @@
 #include "base/text.h"
 #include "media/KSOROSXModel.h"
 #include "media/connection_type.h"
+#include "media/medium.h"
 #include "tools/check/checks.h"
 #include "tools/check/key_rules.h"
 #include "tools/check/spelling.h"
@@ -50,13 +51,14 @@ class ModelCheck {
     std::set<std::string> paired;
     Spelling unmatched(onlyKnown);
     Spelling all(known);
+    Spelling allOffered(offered);
     for (const std::string& name : onlyInFirst(offered, known)) {
       const auto pair = unmatched.nearest(name);
       if (pair) paired.insert(*pair);
-      undescribed(name, pair ? pair : all.nearest(name));
+      undescribed(name, pair, all.nearest(name));
     }
     for (const std::string& name : onlyKnown) {
-      if (!paired.contains(name)) unoffered(name);
+      if (!paired.contains(name)) unoffered(name, allOffered.nearest(name));
     }
   }
 
@@ -75,6 +77,7 @@ class ModelCheck {
     std::map<std::string, std::string> spellings;
     for (const auto& [name, unused] : *contained) {
       announceable(name);
+      spelledLikeTheVendor(name);
       const auto [other, isNew] = spellings.try_emplace(asciiLowercased(name), name);
       if (isNew) continue;
       add(name, {.id = "model-twice",
@@ -94,21 +97,28 @@ class ModelCheck {
     report_.findings.push_back(std::move(finding));
   }
 
-  void undescribed(const std::string& name, const std::optional<std::string>& nearest) {
-    add(name, {.id = "model-undescribed",
-               .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
-               .expected = "the same name under \"Model\" there",
-               .nearest = nearest.value_or(""),
-               .effect = "the model has USB only: the package opens as soon as it is chosen",
-               .remedy = nearest ? "use one spelling for both" : "describe the model there"});
+  static std::string sameName(std::string_view key, const std::optional<std::string>& nearest) {
+    return "the same name under " + quoted(std::string(key)) + " there" +
+           (nearest ? ", where the nearest is " + quoted(*nearest) : "");
   }
 
-  void unoffered(const std::string& name) {
+  // `meant` is the almost equal name that only the other list has.
+  void undescribed(const std::string& name, const std::optional<std::string>& meant,
+                   const std::optional<std::string>& nearest) {
+    add(name, {.id = "model-undescribed",
+               .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
+               .expected = sameName("Model", meant ? std::nullopt : nearest),
+               .nearest = meant.value_or(""),
+               .effect = "the model has USB only: the package opens as soon as it is chosen",
+               .remedy = meant ? "use one spelling in both lists" : "describe the model there"});
+  }
+
+  void unoffered(const std::string& name, const std::optional<std::string>& nearest) {
     report_.findings.push_back(
         {.id = "model-unoffered",
          .place = {.file = lists_.modelsPath, .key = {"Model", name}},
          .found = "a model that " + quoted(lists_.descriptionPath) + " does not have",
-         .expected = "the same name under \"ContainedModel\" there",
+         .expected = sameName(kContained, nearest),
          .effect = "the model cannot be chosen",
          .remedy = "add it there, or remove it from this file"});
   }
@@ -150,8 +160,25 @@ class ModelCheck {
     }
   }
 
+  // Reports each spelling of the maker that differs only in capitals from the vendor's name.
+  void spelledLikeTheVendor(const std::string& name) {
+    const auto vendor = lists_.resources->string(medium::kVenderName);
+    const std::string maker = name.substr(0, name.find(' '));
+    const std::string spelling = vendor ? vendor->substr(0, vendor->find(' ')) : maker;
+    if (maker == spelling || asciiLowercased(maker) != asciiLowercased(spelling)) return;
+    if (!makers_.insert(maker).second) return;
+    add(name, {.id = "maker-capitals",
+               .severity = Severity::kWarning,
+               .found = "the maker " + quoted(maker) + ", whose name is " + quoted(spelling) +
+                        " in \"VenderName\"",
+               .expected = "the maker as the devices announce it (usb_MFG), capitals included",
+               .effect = "devices of " + quoted(spelling) + " are not found on the network",
+               .remedy = "use the devices' spelling for all models"});
+  }
+
   const Lists& lists_;
   Report& report_;
+  std::set<std::string> makers_;  ///< the spellings that are reported already
 };
 
 }  // namespace

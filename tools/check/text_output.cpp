@@ -6,10 +6,16 @@
 #include "base/text.h"
 #include "tools/check/output.h"
 #include "tools/check/shown_texts.h"
+#include "tools/terminal_text.h"
 
 namespace onramp::check {
 
 namespace {
+
+constexpr std::string_view kRed = "\033[31m";
+constexpr std::string_view kYellow = "\033[33m";
+constexpr std::string_view kPlain = "\033[0m";
+constexpr std::size_t kConnectionColumns = 24;  // beside a model's name
 
 // Returns `text` with control characters replaced, so that it stays on one line and cannot control
 // the terminal.
@@ -44,18 +50,30 @@ std::string sentences(const Finding& finding) {
   return text;
 }
 
-void writeModels(std::ostream& out, const Report& report) {
+void writeFinding(std::ostream& out, const Finding& finding, std::size_t width) {
+  const bool isError = finding.severity == Severity::kError;
+  const std::string mark = isError ? "error:" : "warning:";
+  const std::string text = printable(sentences(finding)) + " [" + finding.id + "]";
+  out << printable(placeOf(finding.place));
+  if (width == 0) {
+    out << mark << ' ' << text << '\n';
+  } else {
+    out << (isError ? kRed : kYellow) << mark << kPlain << '\n' << wrapped(text, width, 2);
+  }
+}
+
+void writeModels(std::ostream& out, const Report& report, std::size_t terminal) {
   if (report.models.empty()) return;
   std::size_t width = 0;
   for (const ModelRow& model : report.models)
-    width = std::max(width, model.name.size());
+    width = std::max(width, columnsOf(printable(model.name)));
+  if (terminal > kConnectionColumns) width = std::min(width, terminal - kConnectionColumns);
   const auto cell = [](bool has, const char* word) {
     return has ? std::string(word) : std::string(std::string_view(word).size(), '-');
   };
   out << "\nModels (their devices have to announce exactly these names):\n";
   for (const ModelRow& model : report.models) {
-    const std::string blanks(width - model.name.size(), ' ');
-    out << "  " << printable(model.name) << blanks << "  " << cell(model.usb, "USB") << "  "
+    out << "  " << fitted(printable(model.name), width) << "  " << cell(model.usb, "USB") << "  "
         << cell(model.wired, "wired") << "  " << cell(model.wireless, "wireless") << '\n';
   }
 }
@@ -78,13 +96,10 @@ const char* startInWords(FirstPage page) {
 
 }  // namespace
 
-void writeText(std::ostream& out, const Report& report) {
-  for (const Finding& finding : report.findings) {
-    out << printable(placeOf(finding.place))
-        << (finding.severity == Severity::kError ? "error: " : "warning: ")
-        << printable(sentences(finding)) << " [" << finding.id << "]\n";
-  }
-  writeModels(out, report);
+void writeText(std::ostream& out, const Report& report, std::size_t width) {
+  for (const Finding& finding : report.findings)
+    writeFinding(out, finding, width);
+  writeModels(out, report, width);
   out << "\nStarts with: " << startInWords(report.start)
       << "\nSystems: " << (report.systems.empty() ? "unknown" : report.systems) << '\n';
   for (const PackageRow& row : report.packages) {

@@ -10,6 +10,7 @@
 #include "tools/devices/json_output.h"
 #include "tools/devices/name_verdict.h"
 #include "tools/devices/text.h"
+#include "tools/terminal_text.h"
 
 namespace onramp::devices {
 

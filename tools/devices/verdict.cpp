@@ -6,6 +6,7 @@
 #include "bonjour/model_match.h"
 #include "snmp/protocol.h"
 #include "snmp/records.h"
+#include "snmp/transport.h"
 #include "tools/devices/name_verdict.h"
 #include "tools/devices/text.h"
 
@@ -80,8 +81,8 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
       return {
           .id = "late",
           .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
-                 "; the wizard waits 2 s for each of its questions, " +
-                 durationText(answer.seconds) + " in all",
+                 "; the wizard waits " + std::to_string(kReceiveWait.count()) +
+                 " s for each of its questions, " + durationText(answer.seconds) + " in all",
           .remedy =
               "wake the device up, for instance by pressing a key on its panel, and search again"};
     case Outcome::kRefused:
