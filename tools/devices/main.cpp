@@ -30,12 +30,12 @@ const std::string kHostsExamples = R"(
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
   CLI::App* const command =
-      app.add_subcommand("browse", "Show devices, and why each is listed or not");
+      app.add_subcommand("browse", "Show devices, and why the wizard lists them or not");
   command->footer("Examples:" + kBrowseExamples);
-  command->add_option("-m,--medium", options.medium, "The folder that the application lies in")
+  command->add_option("-m,--medium", options.medium, "The folder that contains the application")
       ->required()
       ->type_name("DIR");
-  command->add_option("--model", options.models, "Search for this model only; may be repeated")
+  command->add_option("--model", options.models, "Search only for this model; may be repeated")
       ->type_name("NAME")
       ->allow_extra_args(false);
   command->add_option("-s,--seconds", options.seconds, "How long to listen")
@@ -75,7 +75,7 @@ void addHosts(CLI::App& app, HostsOptions& options) {
       app.add_subcommand("hosts", "Show own addresses, and who answers a broadcast");
   command->footer("Examples:" + kHostsExamples);
   command->add_flag_callback(
-      "-n,--no-search", [&options] { options.search = false; }, "Send nothing");
+      "-n,--no-search", [&options] { options.search = false; }, "Send no broadcasts");
   command->add_flag("--json", options.json, "Print JSON");
 }
 
