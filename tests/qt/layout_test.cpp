@@ -6,6 +6,7 @@
 #include <QHeaderView>
 #include <QLabel>
 #include <QScreen>
+#include <QTextDocumentFragment>
 #include <QTreeView>
 #include <cstdlib>
 
@@ -120,7 +121,8 @@ class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
 
   static void listDevices(ChooseDeviceView& page) {
     const std::string names[] = {"Kestrel Photo Printer beside the Window on the Second Floor 001",
-                                 "会議室の複合機二階の窓際にある大型", "Büro 🖨️ links"};
+                                 "会議室の複合機二階の窓際にある大型",
+                                 "<b>Büro</b> 🖨️ links"};
     for (int i = 40; i > 0; --i) {
       page.setServiceToList(
           Dictionary{{KSDevice::kDisplayName, names[i % 3] + std::to_string(i)},
@@ -156,6 +158,11 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   EXPECT_EQ(nameOf(*window->focusWidget()), "deviceListView");
   devices->progressON(true);
   expectEverythingFits();
+
+  const QModelIndex first = window->findChild<QTreeView*>("deviceListView")->model()->index(0, 0);
+  const QString tip = first.data(Qt::ToolTipRole).toString();
+  EXPECT_EQ(QTextDocumentFragment::fromHtml(tip).toPlainText(), first.data().toString())
+      << "the tool tip reads markup in a device's name";
 }
 
 INSTANTIATE_TEST_SUITE_P(Languages, Layout,
