@@ -43,8 +43,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Sets up the window, its background picture and the application menu.
   void awakeFromNib() override;
 
-  /// Checks the system's version. On a supported system, deletes the hand-off files of earlier
-  /// runs. On any other, shows an alert and terminates the application.
+  /// Checks the system's version. On a supported system, deletes the files for the package that
+  /// earlier runs wrote. On any other, shows an alert and terminates the application.
   void applicationWillFinishLaunching() override;
 
   /// Shows the first page, or opens the package and quits when no model on the medium supports

@@ -4,7 +4,6 @@
 #include <list>
 #include <map>
 #include <memory>
-#include <optional>
 #include <set>
 #include <string>
 #include <utility>
@@ -52,7 +51,7 @@ struct ShownAlert {
 
 /// A front end without a screen, and a desktop that opens nothing. It records what the program
 /// shows and asks for, and plays the user and the clock. Time passes only in runTimers(). The
-/// pauses of a search wait take no time.
+/// pauses in the wait for a device search take no time.
 class FrontEnd {
  public:
   static FrontEnd& instance();

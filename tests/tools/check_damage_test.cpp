@@ -111,8 +111,8 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the page that `report` predicts. No page is shown on an unsupported system, whatever the models
-// are.
+// Returns the page that `report` predicts. No page is shown on an unsupported system, whatever the
+// models are.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";

@@ -155,10 +155,10 @@ MISTAKES = [
     (take(DESCRIPTION, "ContainedModel", MODEL), "model-unoffered", "cannot be chosen"),
     (take(MODELS, "Model", MODEL, "KSCID"), "key-missing", "KSCID", "no connection at all"),
     (take(MODELS, "Model", MODEL, "Interfaces"), "key-missing", "Interfaces", "USB only"),
-    (rename_model("Kestrel100"), "model-unannounceable", "without a blank"),
-    (rename_model(MODEL + " "), "model-blanks", "some really do"),
+    (rename_model("Kestrel100"), "model-unannounceable", "without a space"),
+    (rename_model(MODEL + " "), "model-blanks", "some devices do"),
     (rename_model("kestrel Model 100"), "maker-capitals", "usb_MFG"),
-    (rename_model(MODEL.capitalize(), "Kestrel Model 105"), "model-twice", "capitals only"),
+    (rename_model(MODEL.capitalize(), "Kestrel Model 105"), "model-twice", "capital letters"),
     (both(put(DESCRIPTION, "ContainedModel", {}), put(MODELS, "Model", {}),
           take(COMMON, "BonjourNetwork"), take(COMMON, "WLANtool")), "models-none", "at once"),
     # Systems and packages.
@@ -243,7 +243,7 @@ class OnrampCheck(unittest.TestCase):
     def test_finds_nothing_on_the_example_medium_and_says_what_users_will_see(self):
         result = run("--strict", str(self.medium))
         self.assertEqual((0, ""), (result.returncode, result.stderr), result.stdout)
-        for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the list of models",
+        for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the model list",
                      f": {PACKAGE}", "Languages: " + " ".join(
                          f"{language} (31 texts)" for language in "de en ja ko zh_CN".split()),
                      "0 errors, 0 warnings, 17 models"):

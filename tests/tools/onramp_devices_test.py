@@ -205,7 +205,7 @@ def serve(address, answer):
 
 class CommandLine(unittest.TestCase):
     def test_refuses_bad_arguments_with_a_remedy(self):
-        for words, message in (("browse", "--medium is required"), ("browse -m /proc", "holds no application"),
+        for words, message in (("browse", "--medium is required"), ("browse -m /proc", "contains no application"),
                                ("ask", "ADDRESS is required"), ("ask no-such", "neither an IPv4 address"),
                                ("serch", "--help")):
             with self.subTest(words):

@@ -97,8 +97,8 @@ void checkVendor(const Lists& lists, Report& report) {
   const std::string name = medium::vendorName(lists.resources);
   const std::string file = "com." + lowercaseString(name) + ".installpkginfo.plist";
   Finding finding{.place = inResources(lists, medium::kVenderName),
-                  .effect = "the package does not find the files that the wizard hands over",
-                  .remedy = "write the maker's name in letters, digits and blanks"};
+                  .effect = "the package does not find the files that the wizard writes for it",
+                  .remedy = "write the maker's name in letters, digits and spaces"};
   const auto isControl = [](char c) { return static_cast<unsigned char>(c) < 0x20 || c == 0x7F; };
   const auto isForeign = [](char c) { return static_cast<unsigned char>(c) >= 0x80; };
   if (name.empty()) {
@@ -112,15 +112,15 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.expected = "a name without \"/\" that is not \".\" or \"..\"";
   } else if (file.size() > kLongestFileName) {
     finding.id = "vendor-long";
-    finding.found = "a name of " + std::to_string(name.size()) + " bytes without its blanks";
+    finding.found = "a name of " + std::to_string(name.size()) + " bytes without its spaces";
     finding.expected =
         "at most " + std::to_string(kLongestFileName - (file.size() - name.size())) + " bytes";
   } else if (std::any_of(name.begin(), name.end(), isForeign)) {
     finding.id = "vendor-letters";
     finding.severity = Severity::kWarning;
-    finding.found = quoted(*written) + ", with letters outside ASCII";
-    finding.expected = "letters from A to Z, digits, blanks";
-    finding.effect = "a folder and files with names that not every program spells in the same way";
+    finding.found = quoted(*written) + ", with characters outside ASCII";
+    finding.expected = "letters from A to Z, digits, spaces";
+    finding.effect = "a folder and files whose names not every program encodes in the same way";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }
@@ -133,8 +133,8 @@ void checkSeries(const Lists& lists, Report& report) {
                              .place = {.file = lists.descriptionPath, .key = {"KSCSeriesCode"}},
                              .found = "the series code " + quoted(series),
                              .expected = "letters and digits",
-                             .effect = opens ? "the support page's button opens another page"
-                                             : "the support page's button opens nothing",
+                             .effect = opens ? "the button for the support page opens another page"
+                                             : "the button for the support page opens nothing",
                              .remedy = "write the code as the support site does"});
 }
 

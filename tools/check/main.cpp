@@ -25,8 +25,8 @@ constexpr const char* kFooter = R"(Examples:
   onramp-check /Volumes/Setup          print what is wrong with that medium
   onramp-check --json build/medium     print it as JSON, for a program
 
-Exit status: 0 when there is no error (with --strict: and no warning), 1 when
-there is one, 2 when the medium could not be read, the output could not be
+Exit status: 0 when no error was found, 1 when an error (with --strict: or a
+warning) was found, 2 when the medium could not be read, the output could not be
 written or the command line is wrong.)";
 
 // Returns `status`, or kUnreadable after a message when standard output could not be written.
@@ -37,7 +37,8 @@ int finish(int status) {
 }
 
 int run(int count, char* arguments[]) {
-  CLI::App app("Checks a finished medium: what its users will see, and what is wrong with it.");
+  CLI::App app(
+      "Checks a finished medium: reports what is wrong with it and what its users will see.");
   app.name("onramp-check");
   app.footer(kFooter);
   app.set_version_flag("-V,--version",
@@ -46,7 +47,7 @@ int run(int count, char* arguments[]) {
   bool json = false;
   bool strict = false;
   bool texts = false;
-  app.add_option("MEDIUM", medium, "The folder that the application lies in");
+  app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with status 1 for warnings, too");
   app.add_flag("--texts", texts, "Print the keys of the texts that a medium needs");
@@ -63,7 +64,7 @@ int run(int count, char* arguments[]) {
   if (!std::filesystem::is_directory(medium, ignored)) {
     std::cerr << "onramp-check: "
               << (medium.empty() ? "MEDIUM is missing" : check::quoted(medium) + " is not a folder")
-              << "; give the folder that holds the application\n";
+              << "; give the folder that contains the application\n";
     return kUnreadable;
   }
   if (std::filesystem::directory_iterator(medium, ignored); ignored) {

@@ -65,7 +65,7 @@ bool isXML(const std::string& text) {
 }
 
 // `nearest` is the name on the medium that resembles the missing one. `isWritten` tells whether the
-// medium can name another file; the wizard itself decides the other names.
+// missing name is written on the medium; the wizard itself chooses all other names.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
                              bool isWritten) {
   if (!nearest) return isWritten ? "put it there, or correct the path" : "put it there";
@@ -129,9 +129,10 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
       const auto nearest = Spelling(there).nearest(part);
       const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
       finding.id = capitals ? "path-capitals" : "path-missing";
-      finding.found = use.what + " at " + quoted(relative) +
-                      (capitals ? ", which differs from the name on the medium in capitals only"
-                                : ", which does not exist");
+      finding.found =
+          use.what + " at " + quoted(relative) +
+          (capitals ? ", which differs from the name on the medium only in capital letters"
+                    : ", which does not exist");
       finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
                                         : quoted(part) + " in " + quoted(folder);
       if (nearest) finding.nearest = *nearest;
@@ -158,7 +159,7 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
              !ignored && size > kMostPropertyListBytes) {
     finding.found = std::to_string(size) + " bytes";
     finding.expected = "at most " + std::to_string(kMostPropertyListBytes) + " bytes";
-    finding.remedy = "spread the models over several media";
+    finding.remedy = "divide the models among several media";
   } else if (const auto bytes = posix::readFile(path, kMostPropertyListBytes); !bytes) {
     finding.found = "a file that cannot be read";
     finding.remedy = "let everyone read it (chmod a+r)";

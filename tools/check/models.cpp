@@ -82,9 +82,10 @@ class ModelCheck {
       if (isNew) continue;
       add(name, {.id = "model-twice",
                  .severity = Severity::kWarning,
-                 .found = "a name that differs from " + quoted(other->second) + " in capitals only",
+                 .found = "a name that differs from " + quoted(other->second) +
+                          " only in capital letters",
                  .expected = "each model once, spelled as its devices announce it",
-                 .effect = "both names in the list; only one of them finds its devices",
+                 .effect = "two entries in the list, only one of which finds its devices",
                  .remedy = "remove the wrong one"});
     }
   }
@@ -119,15 +120,15 @@ class ModelCheck {
          .found = "a model that " + quoted(lists_.descriptionPath) + " does not have",
          .expected = sameName(kContained, nearest),
          .effect = "the model cannot be chosen",
-         .remedy = "add it there, or remove it here"});
+         .remedy = "add it there, or remove it from this file"});
   }
 
   // Reports a model's name that no device can announce. Devices announce maker and model as two
-  // texts, which the wizard joins with a blank. Each text has at most 255 bytes, its key
+  // texts, which the wizard joins with a space. Each text has at most 255 bytes, its key
   // ("usb_MFG=") included.
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
-    const std::size_t blank = name.find(' ');
+    const std::size_t space = name.find(' ');
     const auto impossible = [&](std::string found, std::string expected, std::string remedy) {
       add(name, {.id = "model-unannounceable",
                  .found = std::move(found),
@@ -137,8 +138,8 @@ class ModelCheck {
     };
     const bool control = std::any_of(name.begin(), name.end(),
                                      [](char c) { return static_cast<unsigned char>(c) < 0x20; });
-    if (blank == std::string::npos) {
-      impossible("a name without a blank", "the USB manufacturer, a blank, the USB model",
+    if (space == std::string::npos) {
+      impossible("a name without a space", "the USB manufacturer, a space, the USB model",
                  "write both as the devices announce them");
     } else if (name.size() > kMostBytes) {
       impossible(
@@ -152,14 +153,14 @@ class ModelCheck {
       const bool edge = name.front() == ' ' || name.back() == ' ';
       add(name, {.id = "model-blanks",
                  .severity = Severity::kWarning,
-                 .found = edge ? "a blank at the edge of the name" : "two blanks in a row",
+                 .found = edge ? "a space at an end of the name" : "two spaces in a row",
                  .expected = "the name exactly as the devices announce it",
-                 .effect = "only devices that announce these blanks are found; some really do",
-                 .remedy = "remove the blanks unless the devices announce them"});
+                 .effect = "only devices that announce these spaces are found; some devices do",
+                 .remedy = "remove the spaces unless the devices announce them"});
     }
   }
 
-  // Reports each spelling of the maker that differs only in capitals from the vendor's name.
+  // Reports each spelling of the maker that differs only in capital letters from the vendor's name.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));
@@ -168,8 +169,8 @@ class ModelCheck {
     if (!makers_.insert(maker).second) return;
     add(name, {.id = "maker-capitals",
                .severity = Severity::kWarning,
-               .found = "the maker " + quoted(maker) + ", whose name is " + quoted(spelling) +
-                        " in \"VenderName\"",
+               .found = "the maker " + quoted(maker) + ", which \"VenderName\" spells " +
+                        quoted(spelling),
                .expected = "the maker as the devices announce it (usb_MFG), capitals included",
                .effect = "devices of " + quoted(spelling) + " are not found on the network",
                .remedy = "use the devices' spelling for all models"});

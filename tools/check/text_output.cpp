@@ -78,16 +78,20 @@ void writeModels(std::ostream& out, const Report& report, std::size_t terminal) 
   }
 }
 
+std::string counted(std::size_t count, const char* word) {
+  return std::to_string(count) + ' ' + word + (count == 1 ? "" : "s");
+}
+
 const char* startInWords(FirstPage page) {
   switch (page) {
     case FirstPage::kNone:
       return "no page: the package opens at once, because no model supports wireless";
     case FirstPage::kConnectionType:
-      return "the connection type: all models have the same connections by cable";
+      return "the connection page: all models have the same connections by cable";
     case FirstPage::kModelList:
       break;
   }
-  return "the list of models";
+  return "the model list";
 }
 
 }  // namespace
@@ -107,8 +111,9 @@ void writeText(std::ostream& out, const Report& report, std::size_t width) {
     out << ' ' << printable(language.name) << " (" << language.texts << " texts)";
   out << (report.languages.empty() ? " none\n" : "\n");
   out << '\n'
-      << report.medium << ": " << report.count(Severity::kError) << " errors, "
-      << report.count(Severity::kWarning) << " warnings, " << report.models.size() << " models\n";
+      << report.medium << ": " << counted(report.count(Severity::kError), "error") << ", "
+      << counted(report.count(Severity::kWarning), "warning") << ", "
+      << counted(report.models.size(), "model") << '\n';
 }
 
 void writeTexts(std::ostream& out) {

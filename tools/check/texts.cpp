@@ -208,9 +208,9 @@ class TextCheck {
     constexpr const char* kKey = "CFBundleDevelopmentRegion";
     const std::string path = kBundle + "/Contents/Info.plist";
     const std::string effect = serves(languages_, "en")
-                                   ? "users of all other languages see the language that their "
-                                     "system picks, usually English"
-                                   : "users of all other languages may see keys such as "
+                                   ? "users without texts in their language see one that "
+                                     "their system picks, usually English"
+                                   : "users without texts in their language may see keys such as "
                                      "\"INST_TXT_MODEL\" instead of texts";
     const auto information =
         files_.list(path, {{.file = path}, "the message bundle's Info.plist", effect});
@@ -219,7 +219,7 @@ class TextCheck {
     Finding finding{.id = "region-missing",
                     .place = {.file = path},
                     .found = "no \"CFBundleDevelopmentRegion\"",
-                    .expected = "the language for users of all other languages, such as \"en\"",
+                    .expected = "the language for users without texts in their own, such as \"en\"",
                     .effect = effect,
                     .remedy = "add \"CFBundleDevelopmentRegion\" with one of the languages " +
                               joined(languages_)};
@@ -253,8 +253,8 @@ class TextCheck {
            .found = "no " + quoted(language + std::string(kLanguageFolder)),
            .expected = "the languages of the message bundle; the application has " + joined(own),
            .effect = "users of " + quoted(language) +
-                     " read in English why the network is used, and hear the gear button's name in "
-                     "English",
+                     " read and hear some of the application's texts in English: why it uses the "
+                     "network, and the name of the gear button",
            .remedy = "have the application built with texts in that language"});
     }
   }

@@ -38,8 +38,8 @@ std::string conclusionOf(const Answer& answer) {
   if (!answer.isComplete) return "interrupted before the device had answered\n";
   if (answer.isWireless) return "wireless\n";
   if (!told || !told->value) return "no usable answer: not in the wizard's list\n";
-  return "not wireless, which is " + std::to_string(kActiveIFWireless) +
-         ": not in the wizard's list\n";
+  return "not wireless (wireless would be " + std::to_string(kActiveIFWireless) +
+         "): not in the wizard's list\n";
 }
 
 std::string textOf(const std::string& address, const Answer& answer, bool isVerbose) {

@@ -32,12 +32,12 @@ const std::string kHostsExamples = R"(
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
   CLI::App* const command =
-      app.add_subcommand("browse", "Show devices, and why each is listed or not");
+      app.add_subcommand("browse", "Show devices, and why the wizard lists them or not");
   command->footer("Examples:" + kBrowseExamples);
-  command->add_option("-m,--medium", options.medium, "The folder that the application lies in")
+  command->add_option("-m,--medium", options.medium, "The folder that contains the application")
       ->required()
       ->type_name("DIR");
-  command->add_option("--model", options.models, "Search for this model only; may be repeated")
+  command->add_option("--model", options.models, "Search only for this model; may be repeated")
       ->type_name("NAME")
       ->allow_extra_args(false);
   command->add_option("-s,--seconds", options.seconds, "How long to listen")
@@ -74,10 +74,10 @@ void addURI(CLI::App& app, URIOptions& options) {
 
 void addHosts(CLI::App& app, HostsOptions& options) {
   CLI::App* const command =
-      app.add_subcommand("hosts", "Show own addresses, and who answers a broadcast");
+      app.add_subcommand("hosts", "Show own addresses, and the answers to a broadcast");
   command->footer("Examples:" + kHostsExamples);
   command->add_flag_callback(
-      "-n,--no-search", [&options] { options.search = false; }, "Send nothing");
+      "-n,--no-search", [&options] { options.search = false; }, "Send no broadcasts");
   command->add_flag("--json", options.json, "Print JSON");
 }
 

@@ -40,7 +40,7 @@ Verdict judgeSilence(const Device& device, const Answer& answer,
                            ", which costs the wizard " + durationText(answer.seconds);
   if (std::none_of(addresses.begin(), addresses.end(), isLocal)) {
     return {.id = "other-subnet",
-            .why = "its address is in no local subnet: " + cost,
+            .why = "its address is in none of this computer's subnets; " + cost,
             .remedy =
                 "put the device and this computer into the same subnet; "
                 "\"onramp-devices hosts\" shows this computer's addresses"};
@@ -68,7 +68,7 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
           .id = "wrong-type",
           .why = "answers with " +
                  std::string(told->type == kTagOctetString ? "a text" : "a value of another type") +
-                 " where a number is asked for",
+                 " where a number is expected",
           .remedy = "update the firmware; this version returns a value of the wrong type"};
     case Outcome::kUnreadable:
     case Outcome::kOtherRequest:
@@ -76,16 +76,18 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
               .why = told->outcome == Outcome::kUnreadable
                          ? "answers with bytes that are not a proper reply"
                          : "answers a request other than the one that was sent",
-              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware has to be corrected"};
+              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware must be corrected"};
     case Outcome::kLate:
-      return {.id = "late",
-              .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
-                     "; the wizard waits " + std::to_string(kReceiveWait.count()) +
-                     " s for each of its questions, " + durationText(answer.seconds) + " in all",
-              .remedy = "wake the device up, for instance by pressing a key on its panel, and search again"};
+      return {
+          .id = "late",
+          .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
+                 "; the wizard waits " + std::to_string(kReceiveWait.count()) +
+                 " s for each of its questions, " + durationText(answer.seconds) + " in all",
+          .remedy =
+              "wake the device up, for instance by pressing a key on its panel, and search again"};
     case Outcome::kRefused:
       return {.id = "refused",
-              .why = "refuses SNMP: nothing uses UDP port 161 there",
+              .why = "refuses SNMP: no program on the device uses UDP port 161",
               .remedy = "switch on SNMP v1 in the device"};
     case Outcome::kNone:
     case Outcome::kUnsent:

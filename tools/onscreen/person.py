@@ -28,10 +28,14 @@ def _is(control, role, name):
         role == "table cell" and own_name.startswith(f"{name}, "))
 
 
-class Person:
-    """A context manager that starts a program on a desktop and ends it again.
+def _words(role, name):
+    return f"the {role} {name!r}" if name else f"a {role}"
 
-    Its methods use the program.
+
+class Person:
+    """A context manager that starts a program on a desktop, and ends it at the end.
+
+    Its methods use the program as a person does.
     """
 
     def __init__(self, desktop, program, arguments=(), env=None):
@@ -58,7 +62,7 @@ class Person:
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits for a control of that role and name and returns it."""
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
-                        f"a {role} named {name!r}")
+                        _words(role, name))
 
     def sees(self, role, name=None):
         """Returns whether such a control is on the screen now."""
@@ -66,7 +70,8 @@ class Person:
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits until no such control is on the screen."""
-        wait_for(lambda: self._certainly_gone(role, name), seconds, f"the end of {role} {name!r}")
+        wait_for(lambda: self._certainly_gone(role, name), seconds,
+                 f"{_words(role, name)} to disappear")
 
     def everything(self):
         """Returns a list of (role, name, control) for everything on the screen."""
@@ -95,7 +100,8 @@ class Person:
     def click(self, role, name=None):
         """Clicks the middle of a control once the control is enabled."""
         control = self.see(role, name)
-        wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} to be enabled")
+        wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS,
+                 f"{_words(role, name)} to be enabled")
         self.click_control(control)
 
     def click_control(self, control):
@@ -111,7 +117,7 @@ class Person:
     def open_menu(self, button=None):
         """Opens the menu of that button, or of the button with the focus.
 
-        The accessibility bus does not show the menu, so it has to be used with the keyboard.
+        The accessibility bus does not show the menu, so it must be used with the keyboard.
         """
         windows = self._window_count()
         if button:
@@ -119,7 +125,7 @@ class Person:
         else:
             self.press("space")
         wait_for(lambda: self._window_count() > windows, _LOOK_SECONDS,
-                 f"the menu of {button or 'the focused button'!r}")
+                 f"the menu of {repr(button) if button else 'the focused button'} to open")
 
     def choose_from_menu(self, button, item):
         """Opens a button's menu and chooses its `item`th entry."""
@@ -162,12 +168,13 @@ class Person:
             before, place = place, (box.x, box.y, box.width, box.height)
             return place == before and box
 
-        return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
+        return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} to stop moving")
 
     def round_trip(self):
         """Returns the seconds that the program takes to answer a small request.
 
-        Leaves out the time that the program and this process wait for a processor. Returns None when the program has ended and does not answer.
+        Leaves out the time that the program and this process wait for a processor. Returns None
+        when the program has ended and does not answer.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
