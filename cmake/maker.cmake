@@ -20,6 +20,9 @@ endfunction()
 # FORM.
 function(onramp_maker_setting variable key form example)
   string(JSON value ERROR_VARIABLE problem GET "${onramp_maker}" ${key})
+  if(problem)
+    set(value "")
+  endif()
   onramp_maker_check(${key} "${value}" "${form}" "${example}")
   set(${variable} "${value}" PARENT_SCOPE)
 endfunction()
@@ -40,9 +43,15 @@ onramp_maker_setting(ONRAMP_BUNDLE_IDENTIFIER bundleIdentifier "^[A-Za-z0-9-]+(\
 onramp_maker_setting(ONRAMP_SUPPORT_SITE supportSite "^https?://[A-Za-z0-9.:-]+(/[A-Za-z0-9._~/-]*[^/])?$"
   "\"http://support.kestrel.example\", without a closing slash")
 onramp_maker_setting(ONRAMP_SNMP_COMMUNITY snmpCommunity "^[A-Za-z0-9._-]+$" "\"corridor\"")
-onramp_maker_setting(ONRAMP_ACTIVE_IF_OBJECT activeIFObject "^[012]\\.[0-9]+(\\.[0-9]+)+$"
+onramp_maker_setting(ONRAMP_ACTIVE_IF_OBJECT activeIFObject "^[012](\\.[0-9][0-9]?[0-9]?[0-9]?[0-9]?)+$"
   "\"1.3.6.1.4.1.4242.2.4.4.1240.1.2.0\", with numbers up to 65535")
-onramp_maker_setting(ONRAMP_ACTIVE_IF_WIRELESS activeIFWireless "^-?[0-9]+$" "2")
+onramp_maker_setting(ONRAMP_ACTIVE_IF_WIRELESS activeIFWireless "^-?[0-9][0-9]?[0-9]?[0-9]?$" "2, a number of up to 4 digits")
+string(REPLACE "." ";" numbers ${ONRAMP_ACTIVE_IF_OBJECT})
+foreach(number IN LISTS numbers)
+  if(number GREATER 65535)
+    message(FATAL_ERROR "${ONRAMP_MAKER}: \"activeIFObject\" has the number ${number}; the greatest is 65535.")
+  endif()
+endforeach()
 string(REPLACE "." ", " ONRAMP_ACTIVE_IF_NUMBERS ${ONRAMP_ACTIVE_IF_OBJECT})
 
 onramp_maker_setting(ONRAMP_SERVICE_TYPES serviceTypes "^\\[" "[\"_ipp._tcp\", \"_scanner._tcp\"]")

@@ -60,7 +60,7 @@ void readCommandLine(const QStringList& arguments) {
   }
   if (parser.isSet(help)) parser.showHelp();
   if (parser.isSet(ownVersion)) {
-    std::printf("%s %s\n%s", qPrintable(QCoreApplication::applicationName()),
+    std::printf("%s %s\n%s\n", qPrintable(QCoreApplication::applicationName()),
                 qPrintable(QCoreApplication::applicationVersion()), maker::kSettings);
     std::exit(0);
   }
