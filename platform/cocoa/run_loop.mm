@@ -6,6 +6,7 @@
 
 #include "platform/application.h"
 #import "platform/cocoa/action.h"
+#import "platform/cocoa/focus.h"
 #import "platform/cocoa/native.h"
 
 namespace onramp {
@@ -81,6 +82,7 @@ void runModalForWindow(const Window& window) {
   while (!isModalAborted)
     [NSApp runModalForWindow:modal];
   [closeButton setEnabled:YES];
+  cocoa::focusFirstControl([modal contentView]);
 }
 
 void abortModal() {

@@ -33,6 +33,8 @@ class Person:
     Its methods use the program.
     """
 
+    follows_desktop = True  # whether the program takes the desktop's text size, scale and colours
+
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
         # The accessibility library reads the bus's address once, from this process's environment.
@@ -123,6 +125,9 @@ class Person:
     def choose_from_menu(self, button, item):
         """Opens a button's menu and chooses its `item`th entry."""
         self.open_menu(button)
+        self.choose_from_open_menu(item)
+
+    def choose_from_open_menu(self, item):
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):

@@ -5,12 +5,15 @@ import tempfile
 
 from onscreen import messages
 from onscreen.person import Person
+from onscreen.processes import wait_for
 
 from . import crowded
+from .ways import GEAR_REFRESH, choose_model
 
 LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
 DEVICES = 40
 _PATIENCE = 120
+_SEARCHES = 5
 _LARGE, _USUAL = 18, 10  # points
 _WIRELESS, _WIRED = 2, 1  # what a device answers about its interface
 
@@ -35,8 +38,13 @@ def settings(scheme, points):
     return "\n".join(lines) + "\n"
 
 
-def all_looks():
-    """Returns (language, scale in per cent, scheme, points) for every set of pictures."""
+def all_looks(follows_desktop):
+    """Returns (language, scale in per cent, scheme, points) for every set of pictures.
+
+    The front end for macOS has one size and one colour scheme under GNUstep.
+    """
+    if not follows_desktop:
+        return [(language, 100, "light", _USUAL) for language in (*LANGUAGES, crowded.LANGUAGE)]
     looks = [(language, scale, scheme, _USUAL) for language in LANGUAGES for scale in (100, 200)
              for scheme in ("light", "dark")]
     looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
@@ -57,7 +65,7 @@ class Gallery:
         """Takes all pictures. The search finds devices of `model`; `version` is not supported."""
         self._add_devices(model, service_type)
         with tempfile.TemporaryDirectory() as folder:
-            for look in all_looks():
+            for look in all_looks(Person.follows_desktop):
                 language, scale, scheme, points = look
                 (pathlib.Path(folder) / "kdeglobals").write_text(settings(scheme, points))
                 self._look = f"{language}-{scale}-{scheme}-{points}pt"
@@ -94,27 +102,38 @@ class Gallery:
         with self._start() as person:
             person.see("label", self._text["INST_TXT_MODEL"], _PATIENCE)
             self._take(person, "1-models")
-            # Typing the beginning of any word of a model's name selects that model in the list.
-            words = model.split(" ", 1)[1]
-            person.press(*("space" if letter == " " else letter for letter in words))
+            choose_model(person, model)
             person.press("Return")
             person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
             self._take(person, "2-connection")
-            person.press("Return")
-            person.see("label", self._text["INST_WAIT"], _PATIENCE)
-            self._take(person, "3-search")
-            person.see("label", self._text["INST_TXT_DEVLIST"], _PATIENCE)
+            self._search(person)
             # The devices are listed while the wait goes on.
             person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
             self._take(person, "4-devices")
-            person.press("Tab")
+            if Person.follows_desktop:
+                person.press("Tab")  # from the list to the gear button
             person.open_menu()
             self._take(person, "5-gear")
             self._let_devices_answer(_WIRED)
-            person.press("Down", "Down", "Return")
+            person.choose_from_open_menu(GEAR_REFRESH)
             person.see("label", self._text["INST_TXT_ALERT_DEVICENOTFOUND"], _PATIENCE)
             self._take(person, "6-not-found")
             self._let_devices_answer(_WIRELESS)
+
+    def _search(self, person):
+        """Searches until devices are listed. On a busy machine, the first search may be in vain."""
+        def ended():
+            return person.sees("label", title) or not person.sees("label", self._text["INST_WAIT"])
+
+        title = self._text["INST_TXT_DEVLIST"]
+        for _ in range(_SEARCHES):
+            person.press("Return")
+            person.see("label", self._text["INST_WAIT"], _PATIENCE)
+            self._take(person, "3-search")
+            wait_for(ended, _PATIENCE, "the end of the search")
+            if person.sees("label", title):
+                return
+        raise RuntimeError(f"{_SEARCHES} searches found none of the {DEVICES} devices")
 
     def _alert(self, version):
         with self._start("--system-version", version) as person:
