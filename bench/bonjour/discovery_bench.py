@@ -13,6 +13,7 @@ part ends with the processor time of an idle search.
 """
 
 import pathlib
+import resource
 import statistics
 import subprocess
 import sys
@@ -93,12 +94,17 @@ def compare(state, interfaces, probe):
 
 
 def idle(interfaces, probe):
+    def processor_seconds():
+        usage = resource.getrusage(resource.RUSAGE_CHILDREN)
+        return usage.ru_utime + usage.ru_stime
+
+    before = processor_seconds()
     with discovery.Search(probe, TYPE) as search:
         search.wait_for("update", "Kestrel 1")
         time.sleep(IDLE_SECONDS)
         search.end()
         print(f"idle for {IDLE_SECONDS} s, {interfaces} interface(s), {COUNTS[-1]} services found: "
-              f"{search.processor_seconds():.3f} s of processor time, start included", flush=True)
+              f"{processor_seconds() - before:.3f} s of processor time, start included", flush=True)
 
 
 def run_inside(state, interfaces, probe):

@@ -19,11 +19,7 @@ TEST_F(HandOff, OptionsFileHoldsTheMediumsOptionsAndFiveStandardOnes) {
                         {"PKG_RemoteTool", false},
                         {"PKG_LabelTool", false},
                         {"PKG_FontSet", false}};
-  const struct {
-    const char* locale;
-    Dictionary onMedium;
-    Dictionary expected;
-  } cases[] = {
+  const std::tuple<const char*, Dictionary, Dictionary> cases[] = {
       {"en_US.UTF-8", {{"PKG_FontSet", true}}, none},
       {"ja_JP.UTF-8", {}, none},
       {"ja_JP.UTF-8",
@@ -95,11 +91,7 @@ TEST_F(HandOff, TheSharedFolderIsWritableByEveryoneAndTheUsersIsNot) {
 }
 
 TEST_F(HandOff, TheVendorNameHasNoSpacesAndIsLowerCaseInFileNames) {
-  const struct {
-    Dictionary resources;
-    std::string folder;
-    std::string inFileName;
-  } cases[] = {
+  const std::tuple<Dictionary, std::string, std::string> cases[] = {
       {{{"VenderName", "Kestrel Imaging  Works"}}, "KestrelImagingWorks", "kestrelimagingworks"},
       {{{"VenderName", "Ärzte ÜBER ΣΩ Ж\uFF21 ıI"}},
        "ÄrzteÜBERΣΩЖ\uFF21ıI",

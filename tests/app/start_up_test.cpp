@@ -32,25 +32,24 @@ TEST_F(StartUp, SkipsTheListWhenAllModelsShareTheirCables) {
   const std::string wired =
       expectedConnectionPage("wiredLan.png", "INST_TXT_USB\nINST_TXT_ETHERNET");
   const std::string usb = expectedConnectionPage("usb.png", "INST_TXT_USB");
-  const struct {
-    std::vector<Dictionary::Pair> models;
-    std::string connectionPage;  // empty when the model list is shown
-  } cases[] = {{{{"A", model(true, false, true)}}, usb},
-               {{{"A", model(true, true, false)}, {"B", model(true, true, true)}}, wired},
-               {{{"A", model(false, true, true)}, {"B", model(false, true, true)}}, usb},
-               {{{"A", model(true, true, true)}, {"B", model(true, false, true)}}, ""},
-               {{{"A", model(true, false, true)}, {"B", model(false, true, true)}}, ""},
-               {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, ""},
-               {{{"A", model(true, false, true)},
-                 {"No identifier", Dictionary{{"Interfaces", Dictionary{{"USB", true}}}}}},
-                ""}};
-  for (const auto& c : cases) {
+  // The page is empty when the model list is shown.
+  const std::pair<std::vector<Dictionary::Pair>, std::string> cases[] = {
+      {{{"A", model(true, false, true)}}, usb},
+      {{{"A", model(true, true, false)}, {"B", model(true, true, true)}}, wired},
+      {{{"A", model(false, true, true)}, {"B", model(false, true, true)}}, usb},
+      {{{"A", model(true, true, true)}, {"B", model(true, false, true)}}, ""},
+      {{{"A", model(true, false, true)}, {"B", model(false, true, true)}}, ""},
+      {{{"A", model(false, false, true)}, {"B", model(false, false, true)}}, ""},
+      {{{"A", model(true, false, true)},
+        {"No identifier", Dictionary{{"Interfaces", Dictionary{{"USB", true}}}}}},
+       ""}};
+  for (const auto& [models, shownPage] : cases) {
     screen.reset();
-    describe(c.models);
+    describe(models);
     launch();
-    EXPECT_EQ(page(), c.connectionPage.empty() ? "ModelListView" : "ConnectionTypeView");
-    if (!c.connectionPage.empty()) {
-      EXPECT_EQ(connectionPage(), c.connectionPage);
+    EXPECT_EQ(page(), shownPage.empty() ? "ModelListView" : "ConnectionTypeView");
+    if (!shownPage.empty()) {
+      EXPECT_EQ(connectionPage(), shownPage);
     }
     EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no page to go back to";
   }
@@ -190,40 +189,37 @@ Dictionary version(Value major, Value minor, Value bugFix) {
 
 TEST_F(StartUp, ChecksTheSystemFirst) {
   const Dictionary none = version("0", "0", "0");
-  const struct {
-    const char* system;
-    Dictionary minimum;
-    Dictionary maximum;
-    std::string alert;  // a part of the alert's text; empty for a supported system
-  } cases[] = {{"10.5.8", version(10, 6, 0), none, "Mac OS X 10.6 or"},
-               {"10.6.0", version("10", "6", "0"), none, ""},
-               {"10.9.9", version(10, 10, 0), none, "Mac OS X 10.10 or"},
-               {"10.6.2", version(10, 6, 3), none, "Mac OS X 10.6.3 or"},
-               {"9.9.9", version(10, 0, 0), none, "Mac OS X 10.0 or"},
-               {"10.9.5", none, version(10, 9, "X"), ""},
-               {"10.10.0", none, version(10, 9, "X"), "Solutions Center"},
-               {"10.9.2", none, version(10, 9, 3), ""},
-               {"10.9.3", none, version("10", "9", "3"), "Solutions Center"},
-               {"11.0", none, version(10, 15, "x"), "Solutions Center"},
-               {"10.9", none, version(10, 9, 1), ""},
-               {"10.9", none, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
-               {"99.9.9", none, none, ""},
-               {"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
-               // The system is outside both bounds. The maximum is checked first.
-               {"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}};
-  for (const auto& c : cases) {
-    SCOPED_TRACE(std::string(c.system) + ' ' + c.alert);
+  // The last text is a part of the alert. It is empty for a supported system.
+  const std::tuple<const char*, Dictionary, Dictionary, std::string> cases[] = {
+      {"10.5.8", version(10, 6, 0), none, "Mac OS X 10.6 or"},
+      {"10.6.0", version("10", "6", "0"), none, ""},
+      {"10.9.9", version(10, 10, 0), none, "Mac OS X 10.10 or"},
+      {"10.6.2", version(10, 6, 3), none, "Mac OS X 10.6.3 or"},
+      {"9.9.9", version(10, 0, 0), none, "Mac OS X 10.0 or"},
+      {"10.9.5", none, version(10, 9, "X"), ""},
+      {"10.10.0", none, version(10, 9, "X"), "Solutions Center"},
+      {"10.9.2", none, version(10, 9, 3), ""},
+      {"10.9.3", none, version("10", "9", "3"), "Solutions Center"},
+      {"11.0", none, version(10, 15, "x"), "Solutions Center"},
+      {"10.9", none, version(10, 9, 1), ""},
+      {"10.9", none, Dictionary{{"Major", 10}, {"Minor", 9}}, "Solutions Center"},
+      {"99.9.9", none, none, ""},
+      {"99.9.9", Dictionary{}, Dictionary{{"Minor", 3}}, ""},
+      // The system is outside both bounds. The maximum is checked first.
+      {"10.9.0", version(10, 10, 0), version(10, 8, 0), "Solutions Center"}};
+  for (const auto& [system, minimum, maximum, alert] : cases) {
+    SCOPED_TRACE(std::string(system) + ' ' + alert);
     screen.reset();
-    describeTwoModels(Dictionary{{"SystemMin", c.minimum}, {"SystemMax", c.maximum}});
-    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
+    describeTwoModels(Dictionary{{"SystemMin", minimum}, {"SystemMax", maximum}});
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", system);
     leaveFile(medium.modelFilePath());
     launch();
-    EXPECT_EQ(std::filesystem::exists(medium.modelFilePath()), !c.alert.empty())
+    EXPECT_EQ(std::filesystem::exists(medium.modelFilePath()), !alert.empty())
         << "only a supported system loses old hand-off files";
-    EXPECT_EQ(page(), c.alert.empty() ? "ModelListView" : "");
-    ASSERT_EQ(screen.alerts.size(), c.alert.empty() ? 0U : 1U);
-    if (c.alert.empty()) continue;
-    EXPECT_NE(screen.alerts[0].informativeText.find(c.alert), std::string::npos)
+    EXPECT_EQ(page(), alert.empty() ? "ModelListView" : "");
+    ASSERT_EQ(screen.alerts.size(), alert.empty() ? 0U : 1U);
+    if (alert.empty()) continue;
+    EXPECT_NE(screen.alerts[0].informativeText.find(alert), std::string::npos)
         << screen.alerts[0].informativeText;
     EXPECT_EQ(screen.alerts[0].messageText + screen.alerts[0].buttonTitle,
               "This OS version is not supported.\nSoftware cannot be installed.Close");

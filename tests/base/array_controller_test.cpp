@@ -44,12 +44,9 @@ TEST(ArrayController, SelectsTheFirstEntryAddedToAnEmptyListAndNotifiesTheTable)
 }
 
 TEST(ArrayController, SelectsTheSuccessorOfARemovedSelection) {
-  const struct {
-    std::size_t selected;
-    const char* removed;
-    const char* expected;
-  } cases[] = {{0, "a", "[b]cb"}, {2, "c", "ab[b]"}, {1, "b", "a[c]"},        {3, "b", "a[c]"},
-               {2, "a", "b[c]b"}, {0, "b", "[a]c"},  {1, "absent", "a[b]cb"}, {4, "a", "bcb"}};
+  const std::tuple<std::size_t, const char*, const char*> cases[] = {
+      {0, "a", "[b]cb"}, {2, "c", "ab[b]"}, {1, "b", "a[c]"},        {3, "b", "a[c]"},
+      {2, "a", "b[c]b"}, {0, "b", "[a]c"},  {1, "absent", "a[b]cb"}, {4, "a", "bcb"}};
   for (const auto& [selected, removed, expected] : cases) {
     ArrayController list;
     list.addObjects({entry("a"), entry("b"), entry("c"), entry("b")});

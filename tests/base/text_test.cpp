@@ -17,11 +17,7 @@ std::string readAndWritten(std::string_view bytes) {
   std::string text;
   while (!bytes.empty()) {
     const auto character = takeUTF8(bytes);
-    if (character) {
-      appendUTF8(text, *character);
-    } else {
-      text += '?';
-    }
+    appendUTF8(text, character.value_or('?'));
   }
   return text;
 }

@@ -67,10 +67,9 @@ TEST(Dictionary, ReturnsOnlyValuesOfTheRequestedType) {
   EXPECT_EQ(record.boolean("flag"), true);
   EXPECT_EQ(record.dictionary("inner"), inner);
   EXPECT_EQ(*record.array("list"), Array{1});
-  for (const char* const other : {"inner", "list", "absent"}) {
+  for (const char* const other : {"inner", "list", "absent"})
     EXPECT_FALSE(record.string(other) || record.boolean(other) || record.integerValue(other));
-    EXPECT_FALSE(record.dictionary("text") || record.array("text"));
-  }
+  EXPECT_FALSE(record.dictionary("text") || record.array("text"));
 }
 
 }  // namespace

@@ -23,13 +23,13 @@ def enclose(description):
                               str(description), sys.executable, "-B", *sys.argv])
 
 
-class Process:
-    """A running program whose output lines can be waited for. It ends when its input is closed."""
+class Search:
+    """A running `bonjour_probe search`. Each line is an event: time, word, name and details."""
 
-    def __init__(self, *command, **options):
-        self._process = subprocess.Popen([str(word) for word in command], text=True,
+    def __init__(self, probe, service_type, **options):
+        self._process = subprocess.Popen([probe, "search", service_type + "."], text=True,
                                          stdin=subprocess.PIPE, stdout=subprocess.PIPE, **options)
-        self.lines = []
+        self._events = []
         self._news = threading.Condition()
         self._reader = threading.Thread(target=self._read)
         self._reader.start()
@@ -43,43 +43,33 @@ class Process:
     def _read(self):
         for line in self._process.stdout:
             with self._news:
-                self.lines.append(line.rstrip("\n"))
+                self._events.append(line.rstrip("\n").split("\t"))
                 self._news.notify_all()
 
-    def wait(self, condition, patience=PATIENCE):
-        """Returns `condition(lines)` once it is true. Raises after `patience` seconds."""
+    def events(self, word, name=None):
+        return [event for event in self._events
+                if word in (None, event[1]) and name in (None, event[2])]
+
+    def wait(self, condition):
+        """Returns `condition()` once it is true. Raises after PATIENCE seconds."""
         with self._news:
-            if not self._news.wait_for(lambda: condition(self.lines), patience):
-                raise AssertionError("no expected line in this output:\n" + "\n".join(self.lines))
-            return condition(self.lines)
+            if not self._news.wait_for(condition, PATIENCE):
+                raise AssertionError(f"no expected event among these: {self._events}")
+            return condition()
+
+    def wait_for(self, word, name, count=1):
+        """Waits for `count` events of that kind and returns the fields of the latest one."""
+        return self.wait(lambda: len(self.events(word, name)) >= count and
+                         self.events(word, name)[-1])
 
     def end(self, patience=PATIENCE):
+        """Closes the program's input, which ends it, and returns its exit status."""
         if not self._process.stdin.closed:
             self._process.stdin.close()
         status = self._process.wait(patience)
         self._reader.join()
         self._process.stdout.close()
         return status
-
-
-class Search(Process):
-    """A running `bonjour_probe search`. Each line is an event: time, word, name and details."""
-
-    def __init__(self, probe, service_type, **options):
-        super().__init__(probe, "search", service_type + ".", **options)
-
-    def events(self, word, name=None):
-        fields = [line.split("\t") for line in self.lines]
-        return [event for event in fields
-                if word in (None, event[1]) and name in (None, event[2])]
-
-    def wait_for(self, word, name, count=1):
-        """Waits for `count` events of that kind and returns the fields of the latest one."""
-        return self.wait(lambda _: len(self.events(word, name)) >= count
-                         and self.events(word, name)[-1])
-
-    def processor_seconds(self):
-        return float(self.events("cpu")[0][2])
 
 
 class Avahi:

@@ -1,15 +1,13 @@
-"""Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE INFO_PLIST.
+"""Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM.
 
 The tests run on two hosts that are joined by two cables, with IPv4 and IPv6. Avahi announces the
 other host's devices. Another mDNS implementation, zeroconf, announces one device of this host."""
 
 import os
 import pathlib
-import shutil
 import socket
 import subprocess
 import sys
-import tempfile
 import time
 import unittest
 
@@ -21,7 +19,7 @@ from practice_network.control import PracticeNetwork
 from discovery import Avahi, Search
 from zeroconf import ServiceInfo, Zeroconf
 
-PROBE, CHOOSER, INFORMATION = map(os.path.abspath, sys.argv[1:4])
+PROBE, CHOOSER, MEDIUM = map(os.path.abspath, sys.argv[1:4])
 TYPE = "_ipp._tcp"
 WIZARDS_TYPE = "_pdl-datastream._tcp"
 ETH_P_ALL = 3
@@ -54,6 +52,11 @@ class NetworkTest(unittest.TestCase):
                                   "model": "Model 100"} | entries)
         self.addCleanup(self.network.remove, name)
 
+    def assert_leads_to(self, uri, address):
+        answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True, check=True,
+                                stdout=subprocess.PIPE).stdout
+        self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+
     def test_names_of_all_kinds_lead_to_their_devices_and_back(self):
         names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
                  "Osprey #2", "x" * 63]
@@ -65,9 +68,7 @@ class NetworkTest(unittest.TestCase):
                 self.assertEqual(model, "Kestrel Model 100")
                 if "." in name:  # A URI does not escape dots, so the name may be misread.
                     continue
-                answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True,
-                                        stdout=subprocess.PIPE, check=True).stdout
-                self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+                self.assert_leads_to(uri, address)
 
     def test_a_device_has_all_its_ipv4_addresses_and_no_others(self):
         self.add("Three", addresses=3)
@@ -131,9 +132,7 @@ class NetworkTest(unittest.TestCase):
                 self.network.unplug(lost)
                 # This host's daemon notices the loss a little later.
                 self.avahi.wait_for_interfaces(TYPE, {left})
-                answer = subprocess.run([PROBE, "addresses", uri, "20"], text=True, check=True,
-                                        stdout=subprocess.PIPE).stdout
-                self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
+                self.assert_leads_to(uri, address)
                 self.assertEqual(search.events("gone"), [])
                 self.network.plug(lost)
                 self.avahi.wait_for_interfaces(TYPE, {lost, left})
@@ -145,16 +144,11 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(len(search.events("found", "Kestrel")), 2)
 
     def test_the_wizard_does_not_ask_a_device_that_leaves(self):
-        medium = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
-        shutil.copytree(discovery.ROOT / "examples" / "medium", medium, dirs_exist_ok=True)
-        contents = medium / "Onramp OSX.app" / "Contents"
-        contents.mkdir(parents=True)
-        shutil.copy(INFORMATION, contents)
         self.network.add("Leaving", maker="Kestrel", model="Model 100", addresses=["192.0.2.91"])
         self.network.settle()
         self.avahi.wait_for_interfaces(WIZARDS_TYPE, {"practice0", "practice1"})
         with packets() as seen:
-            chooser = subprocess.Popen([CHOOSER, contents.parent, "600", "Kestrel Model 100"])
+            chooser = subprocess.Popen([CHOOSER, f"{MEDIUM}/Onramp OSX.app", "600", "Kestrel Model 100"])
             self.addCleanup(chooser.wait)
             self.addCleanup(chooser.kill)
             asked(seen, "192.0.2.91")
@@ -187,7 +181,7 @@ class NetworkTest(unittest.TestCase):
                 self.add(name, addresses=["192.0.2.100"])
             self.avahi.restart(objects_per_client_max=limit)
             with self.subTest(limit=limit), Search(PROBE, TYPE) as search:
-                search.wait(lambda _: names <= {event[2] for event in search.events("update")})
+                search.wait(lambda: names <= {event[2] for event in search.events("update")})
 
     def test_the_daemon_may_be_absent_and_come_and_go(self):
         self.avahi.kill()

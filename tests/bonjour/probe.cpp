@@ -5,7 +5,6 @@
 //   bonjour_probe search TYPE            searches for services of TYPE with KSBonjourSearch
 //   bonjour_probe addresses URI SECONDS  looks up the addresses of the device that URI names
 
-#include <sys/resource.h>
 #include <unistd.h>
 
 #include <chrono>
@@ -16,11 +15,9 @@
 #include "bonjour/KSBonjourSearch.h"
 #include "bonjour/KSDevice.h"
 #include "bonjour/KSNetService.h"
-#include "platform/bundle.h"
-#include "platform/property_list.h"
 #include "platform/run_loop.h"
-#include "platform/system_version.h"
 #include "tests/recording/loop.h"
+#include "tests/recording/medium_folder.h"
 
 namespace onramp {
 
@@ -29,7 +26,6 @@ namespace {
 using Clock = std::chrono::steady_clock;
 
 const Clock::time_point start = Clock::now();
-std::string browsedType;
 
 void print(const char* what, const std::string& details) {
   const std::chrono::duration<double> since = Clock::now() - start;
@@ -84,17 +80,11 @@ void runUntilInputEnds() {
   });
   recording::runPosted([&ended] { return ended; }, std::chrono::hours(1));
   waiter.join();
-
-  rusage usage{};
-  getrusage(RUSAGE_SELF, &usage);
-  const auto seconds = [](const timeval& time) {
-    return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
-  };
-  print("cpu", std::to_string(seconds(usage.ru_utime) + seconds(usage.ru_stime)));
 }
 
 int search(const std::string& type) {
-  browsedType = type;
+  const recording::MediumFolder medium;
+  medium.describe({{"BonjourNetwork", type}}, {}, {});
   const auto printer = std::make_shared<Printer>();
   const auto bonjour = KSBonjourSearch::init();
   bonjour->addKSDeviceObserver(printer);
@@ -113,37 +103,12 @@ int addresses(const std::string& uri, double timeout) {
   return status;
 }
 
-int run(const std::vector<std::string>& arguments) {
-  if (arguments.size() == 2 && arguments[0] == "search") return search(arguments[1]);
-  if (arguments.size() == 3 && arguments[0] == "addresses") {
-    return addresses(arguments[1], std::stod(arguments[2]));
-  }
-  std::fputs("usage: bonjour_probe search TYPE | addresses URI SECONDS\n", stderr);
-  return 2;
-}
-
 }  // namespace
-
-// Stand-ins for the medium and the system version, which a search reads.
-
-Bundle Bundle::main() {
-  return Bundle("/medium/Onramp OSX.app");
-}
-
-std::optional<std::string> Bundle::infoString(std::string_view) const {
-  return "resources";
-}
-
-std::optional<Dictionary> loadDictionary(const std::string&) {
-  return Dictionary{{"CDInfo", "description"}, {"BonjourNetwork", browsedType}};
-}
-
-std::optional<std::int32_t> gestaltSystemVersion() {
-  return 0x1095;
-}
-
 }  // namespace onramp
 
-int main(int count, char** arguments) {
-  return onramp::run({arguments + 1, arguments + count});
+int main(int count, char** words) {
+  const std::vector<std::string> arguments(words + 1, words + count);
+  if (arguments.size() == 2) return onramp::search(arguments[1]);
+  if (arguments.size() == 3) return onramp::addresses(arguments[1], std::stod(arguments[2]));
+  return 2;
 }

@@ -162,7 +162,6 @@ TEST(SystemConfigurationStore, AsksByKeysAndByPatternsAndOmitsValuesOfUnknownTyp
   const DynamicStoreRef store = createDynamicStore("test");
   const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
   EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");
-  EXPECT_EQ(copyMultiple(store, {*key}, {}), (Dictionary{{"keys", Array{*key}}}));
   EXPECT_EQ(copyMultiple(store, {}, {"a", "b"}), (Dictionary{{"patterns", Array{"a", "b"}}}));
   EXPECT_EQ(copyMultiple(nullptr, {*key}, {}), std::nullopt);
   EXPECT_EQ(lastDynamicStoreError(), kSCStatusNoStoreSession);

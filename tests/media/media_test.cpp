@@ -12,20 +12,15 @@ namespace {
 using recording::MediumFolder;
 
 TEST(FullPath, IsRelativeToTheFolderThatHoldsTheBundle) {
-  struct Case {
-    const char* bundle;
-    std::optional<std::string> relative;
-    const char* expected;
-  };
-  const Case cases[] = {
+  const std::tuple<const char*, std::optional<std::string>, const char*> cases[] = {
       {"/Volumes/Disc/Setup.app", "MacResources/Images", "/Volumes/Disc/MacResources/Images"},
       {"/Setup.app", "MacResources/Images", "/MacResources/Images"},
       {"/Volumes/Disc/Setup.app", "MacResources/", "/Volumes/Disc/MacResources"},
       {"/Volumes/Disc/Setup.app", std::nullopt, "/Volumes/Disc"},
       {"/Setup.app", std::nullopt, "/"},
       {"Setup.app", "MacResources/", "MacResources"}};
-  for (const Case& c : cases) {
-    EXPECT_EQ(medium::fullPath(c.bundle, c.relative), c.expected) << c.bundle;
+  for (const auto& [bundle, relative, expected] : cases) {
+    EXPECT_EQ(medium::fullPath(bundle, relative), expected) << bundle;
   }
 }
 
@@ -81,31 +76,27 @@ TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
                              {"106", "6"},
                              {"107", "7"},
                              {"109", "9"}};
-  struct Case {
-    const char* system;
-    Dictionary package;
-    std::optional<std::string> expected;
-  };
-  const Case cases[] = {{"10.3.9", byVersion, std::nullopt},
-                        {"10.4.0", byVersion, "Packages/4"},
-                        {"10.5.9", byVersion, "Packages/5"},
-                        {"10.6.0", byVersion, "Packages/6"},
-                        {"10.7.5", byVersion, "Packages/7"},
-                        {"10.8.5", byVersion, std::nullopt},  // the medium has no package for 10.8
-                        {"10.9.0", byVersion, "Packages/9"},
-                        {"11.0.0", byVersion, "Packages/9"},
-                        {"100.9.9", byVersion, "Packages/9"},  // version code 0x10099
-                        {"101.0.0", byVersion, std::nullopt},  // version code above 0x100FF
-                        {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
-                        {"10.6.8", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
-                        {"10.6.8", byVersion.with("PkgName", Array{}), std::nullopt},
-                        {"10.6.8", Dictionary{{"PkgName", "all.pkg"}}, std::nullopt}};
-  for (const Case& c : cases) {
+  const std::tuple<const char*, Dictionary, std::optional<std::string>> cases[] = {
+      {"10.3.9", byVersion, std::nullopt},
+      {"10.4.0", byVersion, "Packages/4"},
+      {"10.5.9", byVersion, "Packages/5"},
+      {"10.6.0", byVersion, "Packages/6"},
+      {"10.7.5", byVersion, "Packages/7"},
+      {"10.8.5", byVersion, std::nullopt},  // the medium has no package for 10.8
+      {"10.9.0", byVersion, "Packages/9"},
+      {"11.0.0", byVersion, "Packages/9"},
+      {"100.9.9", byVersion, "Packages/9"},  // version code 0x10099
+      {"101.0.0", byVersion, std::nullopt},  // version code above 0x100FF
+      {"101.0.0", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+      {"10.6.8", byVersion.with("PkgName", "all.pkg"), "Packages/all.pkg"},
+      {"10.6.8", byVersion.with("PkgName", Array{}), std::nullopt},
+      {"10.6.8", Dictionary{{"PkgName", "all.pkg"}}, std::nullopt}};
+  for (const auto& [system, package, expected] : cases) {
     MediumFolder medium;
-    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", c.system);
-    medium.describe(Dictionary{{"PkgInfo", c.package}}, {}, {});
+    medium.setEnvironment("ONRAMP_SYSTEM_VERSION", system);
+    medium.describe(Dictionary{{"PkgInfo", package}}, {}, {});
     const auto url = KSInstallerInfo().pkgURL();
-    EXPECT_EQ(url ? url->path : "none", c.expected ? medium.path(*c.expected) : "none") << c.system;
+    EXPECT_EQ(url ? url->path : "none", expected ? medium.path(*expected) : "none") << system;
   }
 }
 

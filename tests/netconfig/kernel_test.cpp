@@ -1,7 +1,6 @@
 // Runs as root in a new network namespace; see tests/in_namespace.
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 #include <algorithm>
 #include <cstdlib>
@@ -62,59 +61,56 @@ class Kernel : public ::testing::Test {
 
 const char* const kLoopback = "127.0.0.1,|255.0.0.0,||";
 
-struct Scenario {
-  const char* name;
-  std::vector<const char*> commands;
-  std::vector<std::string> entries;  // in addition to the loopback interface's
-  const char* primary;
-};
-
-const Scenario kScenarios[] = {
-    {"addresses of every kind, and a subnet's route",
-     {"addr add 192.0.2.1/24 brd + dev near", "addr add 192.0.2.7/24 brd + dev near",
-      "addr add 10.0.0.1/8 brd 10.9.9.9 dev left", "addr add 10.1.0.1 peer 10.1.0.2 dev left",
-      "addr add 10.1.0.1 peer 10.1.0.3 dev left", "addr add 203.0.113.4/31 dev right",
-      "addr add 203.0.113.9/0 dev right", "route add 0.0.0.0/1 via 192.0.2.254"},
-     {"192.0.2.1,192.0.2.7,|255.255.255.0,255.255.255.0,|192.0.2.255,192.0.2.255,|",
-      "10.0.0.1,10.1.0.1,10.1.0.1,|255.0.0.0,255.255.255.255,255.255.255.255,|10.9.9.9,|",
-      "203.0.113.4,203.0.113.9,|255.255.255.254,0.0.0.0,||"},
-     ""},
-    {"a name with a dot, and an interface without carrier",
-     {"link set near down", "link set near name near.7", "link set near.7 up",
-      "addr add 192.0.2.1/24 brd + dev near.7", "route add default via 192.0.2.254",
-      "addr add 198.51.100.1/24 dev left", "link set right down"},
-     {"192.0.2.1,|255.255.255.0,|192.0.2.255,|"},
-     "near.7"},
-    {"the first route with the lowest metric wins",
-     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
-      "route add unreachable default metric 5", "route add default via 192.0.2.254 metric 600",
-      "route append default via 198.51.100.254 metric 9",
-      "route append default via 192.0.2.254 metric 9", "route add default via 192.0.2.254 table 9"},
-     {"192.0.2.1,|255.255.255.0,||", "198.51.100.1,|255.255.255.0,||"},
-     "left"},
-    {"a default route over two interfaces, the first of them down",
-     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
-      "route add default nexthop via 192.0.2.254 nexthop via 198.51.100.254", "link set near down"},
-     {"198.51.100.1,|255.255.255.0,||"},
-     "left"},
-    {"a default route over two interfaces",
-     {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
-      "route add default nexthop via 192.0.2.254 nexthop via 198.51.100.254"},
-     {"192.0.2.1,|255.255.255.0,||", "198.51.100.1,|255.255.255.0,||"},
-     "near"},
+// For each scenario: its name, the commands, the entries in addition to the loopback interface's,
+// and the primary interface.
+const std::tuple<const char*, std::vector<const char*>, std::vector<std::string>, const char*>
+    kScenarios[] = {
+        {"addresses of every kind, and a subnet's route",
+         {"addr add 192.0.2.1/24 brd + dev near", "addr add 192.0.2.7/24 brd + dev near",
+          "addr add 10.0.0.1/8 brd 10.9.9.9 dev left", "addr add 10.1.0.1 peer 10.1.0.2 dev left",
+          "addr add 10.1.0.1 peer 10.1.0.3 dev left", "addr add 203.0.113.4/31 dev right",
+          "addr add 203.0.113.9/0 dev right", "route add 0.0.0.0/1 via 192.0.2.254"},
+         {"192.0.2.1,192.0.2.7,|255.255.255.0,255.255.255.0,|192.0.2.255,192.0.2.255,|",
+          "10.0.0.1,10.1.0.1,10.1.0.1,|255.0.0.0,255.255.255.255,255.255.255.255,|10.9.9.9,|",
+          "203.0.113.4,203.0.113.9,|255.255.255.254,0.0.0.0,||"},
+         ""},
+        {"a name with a dot, and an interface without carrier",
+         {"link set near down", "link set near name near.7", "link set near.7 up",
+          "addr add 192.0.2.1/24 brd + dev near.7", "route add default via 192.0.2.254",
+          "addr add 198.51.100.1/24 dev left", "link set right down"},
+         {"192.0.2.1,|255.255.255.0,|192.0.2.255,|"},
+         "near.7"},
+        {"the first route with the lowest metric wins",
+         {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
+          "route add unreachable default metric 5", "route add default via 192.0.2.254 metric 600",
+          "route append default via 198.51.100.254 metric 9",
+          "route append default via 192.0.2.254 metric 9",
+          "route add default via 192.0.2.254 table 9"},
+         {"192.0.2.1,|255.255.255.0,||", "198.51.100.1,|255.255.255.0,||"},
+         "left"},
+        {"a default route over two interfaces, the first of them down",
+         {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
+          "route add default nexthop via 192.0.2.254 nexthop via 198.51.100.254",
+          "link set near down"},
+         {"198.51.100.1,|255.255.255.0,||"},
+         "left"},
+        {"a default route over two interfaces",
+         {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
+          "route add default nexthop via 192.0.2.254 nexthop via 198.51.100.254"},
+         {"192.0.2.1,|255.255.255.0,||", "198.51.100.1,|255.255.255.0,||"},
+         "near"},
 };
 
 TEST_F(Kernel, ListsTheAddressesAndThePrimaryInterface) {
-  for (const Scenario& scenario : kScenarios) {
-    SCOPED_TRACE(scenario.name);
-    for (const char* command : scenario.commands)
+  for (auto [name, commands, expected, primary] : kScenarios) {
+    SCOPED_TRACE(name);
+    for (const char* command : commands)
       ip(command);
-    std::vector<std::string> expected = scenario.entries;
     expected.emplace_back(kLoopback);
     local_address_list list;
     EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(&list), 0);
     EXPECT_THAT(entriesOf(list), UnorderedElementsAreArray(expected));
-    EXPECT_EQ(KSSCCopyCurrentInterfaceName().value_or(""), scenario.primary);
+    EXPECT_EQ(KSSCCopyCurrentInterfaceName().value_or(""), primary);
     TearDown();
     SetUp();
   }

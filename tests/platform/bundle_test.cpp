@@ -10,65 +10,33 @@ namespace {
 
 using Names = std::vector<std::string>;
 
-TEST(Language, IsReadInEverySpelling) {
-  struct Case {
-    const char* identifier;
-    const char* code;
-    const char* script;
-    const char* region;
-  };
-  const Case cases[] = {{"de_DE@euro", "de", "", "DE"},
-                        {"pt-BR", "pt", "", "BR"},
-                        {"zh-Hant", "zh", "Hant", ""},
-                        {"zh_TW", "zh", "Hant", "TW"},
-                        {"zh-Hant-HK", "zh", "Hant", "HK"},
-                        {"German", "de", "", ""},
-                        {"es-419", "es", "", ""},
-                        {"EN_us", "en", "", "US"},
-                        {"yue-Hant", "yue", "Hant", ""},
-                        {"Base", "", "", ""},
-                        {"", "", "", ""},
-                        {"../en", "", "", ""}};
-  for (const Case& c : cases) {
-    const Language language = Language::parse(c.identifier);
-    EXPECT_EQ(language.code, c.code) << c.identifier;
-    EXPECT_EQ(language.script, c.script) << c.identifier;
-    EXPECT_EQ(language.region, c.region) << c.identifier;
-  }
-}
-
 TEST(Language, FallsBackToTheDevelopmentLanguageThenEnglishThenAny) {
-  struct Case {
-    Names offered;
-    Names preferred;
-    std::string development;
-    Names expected;
-  };
-  const Case cases[] = {{{"de", "en"}, {"de_AT"}, "en", {"de", "en"}},
-                        {{"de", "de_AT", "en"}, {"de_AT"}, "en", {"de_AT", "de", "en"}},
-                        {{"de_AT", "de_CH", "de"}, {"de"}, "en", {"de", "de_AT", "de_CH"}},
-                        {{"English", "German"}, {"de_DE"}, "English", {"German", "English"}},
-                        {{"English", "Japanese"}, {"fr"}, "en", {"English"}},
-                        {{"en", "fr"}, {"ko", "fr_CA"}, "en", {"fr", "en"}},
-                        {{"en", "pt-BR"}, {"pt_PT"}, "en", {"pt-BR", "en"}},
-                        {{"en", "no"}, {"nb_NO"}, "en", {"no", "en"}},
-                        {{"en", "zh_CN", "zh_TW"}, {"zh_CN"}, "en", {"zh_CN", "en"}},
-                        {{"en", "zh-Hans", "zh-Hant"}, {"zh_TW"}, "en", {"zh-Hant", "en"}},
-                        {{"en", "zh-Hans"}, {"zh_TW"}, "en", {"en"}},
-                        {{"en", "zh_TW"}, {"zh_HK"}, "en", {"zh_TW", "en"}},
-                        {{"en", "zh_CN"}, {"zh-Hans-SG"}, "en", {"zh_CN", "en"}},
-                        {{"en", "zh"}, {"zh-Hans-CN"}, "en", {"zh", "en"}},
-                        {{"sr", "sr-Latn"}, {"sr_RS"}, "en", {"sr", "sr-Latn"}},
-                        {{"ja"}, {"fr"}, "en", {"ja"}},
-                        {{"de", "en_GB"}, {"fr"}, "it", {"en_GB"}},
-                        {{"Base", "zh", "ko", "ja"}, {"zh_TW"}, "it", {"ja"}},
-                        {{"en", "zh_CN", "zh_TW"}, {"zh_MO"}, "en", {"zh_TW", "en"}},
-                        {{"Base"}, {"fr"}, "en", {}},
-                        {{"en", "ja"}, {"fr"}, "ja_JP", {"ja"}},
-                        {{}, {"en"}, "en", {}}};
-  for (const Case& c : cases) {
-    EXPECT_EQ(languagesToSearch(c.offered, c.preferred, c.development), c.expected)
-        << testing::PrintToString(c.offered) << " for " << testing::PrintToString(c.preferred);
+  const std::tuple<Names, Names, std::string, Names> cases[] = {
+      {{"de", "en"}, {"de_AT@euro"}, "en", {"de", "en"}},
+      {{"EN_us", "yue-Hant", "../en"}, {"zh-Hant-HK", "en_US"}, "fr", {"EN_us"}},
+      {{"es-AA", "es_419"}, {"es"}, "en", {"es_419", "es-AA"}},
+      {{"de", "de_AT", "en"}, {"de_AT"}, "en", {"de_AT", "de", "en"}},
+      {{"de_AT", "de_CH", "de"}, {"de"}, "en", {"de", "de_AT", "de_CH"}},
+      {{"English", "German"}, {"de_DE"}, "English", {"German", "English"}},
+      {{"en", "fr"}, {"ko", "fr_CA"}, "en", {"fr", "en"}},
+      {{"en", "no"}, {"nb_NO"}, "en", {"no", "en"}},
+      {{"en", "zh_CN", "zh_TW"}, {"zh_CN"}, "en", {"zh_CN", "en"}},
+      {{"en", "zh-Hans", "zh-Hant"}, {"zh_TW"}, "en", {"zh-Hant", "en"}},
+      {{"en", "zh-Hans"}, {"zh_TW"}, "en", {"en"}},
+      {{"en", "zh_TW"}, {"zh_HK"}, "en", {"zh_TW", "en"}},
+      {{"en", "zh_CN"}, {"zh-Hans-SG"}, "en", {"zh_CN", "en"}},
+      {{"en", "zh"}, {"zh-Hans-CN"}, "en", {"zh", "en"}},
+      {{"sr", "sr-Latn"}, {"sr_RS"}, "en", {"sr", "sr-Latn"}},
+      {{"ja"}, {"fr"}, "en", {"ja"}},
+      {{"de", "en_GB"}, {"fr"}, "it", {"en_GB"}},
+      {{"Base", "zh", "ko", "ja"}, {"zh_TW"}, "it", {"ja"}},
+      {{"en", "zh_CN", "zh_TW"}, {"zh_MO"}, "en", {"zh_TW", "en"}},
+      {{"Base"}, {"fr"}, "en", {}},
+      {{"en", "ja"}, {"fr"}, "ja_JP", {"ja"}},
+      {{}, {"en"}, "en", {}}};
+  for (const auto& [offered, preferred, development, expected] : cases) {
+    EXPECT_EQ(languagesToSearch(offered, preferred, development), expected)
+        << testing::PrintToString(offered) << " for " << testing::PrintToString(preferred);
   }
 }
 

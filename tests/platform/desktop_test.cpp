@@ -22,13 +22,7 @@ namespace {
 using Environment = std::vector<std::pair<const char*, const char*>>;
 
 TEST(Desktop, TakesLanguageAndCountryFromTheLocaleVariables) {
-  struct Case {
-    Environment environment;
-    const char* language;
-    const char* country;
-    std::vector<std::string> preferred;
-  };
-  const Case cases[] = {
+  const std::tuple<Environment, const char*, const char*, std::vector<std::string>> cases[] = {
       {{{"LANG", "ja_JP.UTF-8"}}, "ja", "JP", {"ja_JP"}},
       {{{"LANG", "ja_JP"}, {"LC_MESSAGES", "de_DE@euro"}}, "de", "DE", {"de_DE"}},
       {{{"LANG", "ja_JP"}, {"LC_MESSAGES", "de_DE"}, {"LC_ALL", "fr_CA"}}, "fr", "CA", {"fr_CA"}},
@@ -41,14 +35,14 @@ TEST(Desktop, TakesLanguageAndCountryFromTheLocaleVariables) {
       {{{"LANG", "de"}}, "de", "", {"de"}},
       {{{"LANG", "nonsense"}}, "en", "", {"en"}},
       {{{"LANG", ""}}, "en", "", {"en"}}};
-  for (const Case& c : cases) {
+  for (const auto& [environment, language, country, preferred] : cases) {
     recording::MediumFolder medium;
-    for (const auto& [name, value] : c.environment)
+    for (const auto& [name, value] : environment)
       medium.setEnvironment(name, value);
-    const std::string trace = testing::PrintToString(c.environment);
-    EXPECT_EQ(localeLanguageCode(), c.language) << trace;
-    EXPECT_EQ(localeCountryCode(), c.country) << trace;
-    EXPECT_EQ(preferredLanguages(), c.preferred) << trace;
+    const std::string trace = testing::PrintToString(environment);
+    EXPECT_EQ(localeLanguageCode(), language) << trace;
+    EXPECT_EQ(localeCountryCode(), country) << trace;
+    EXPECT_EQ(preferredLanguages(), preferred) << trace;
   }
 }
 

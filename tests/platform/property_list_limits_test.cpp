@@ -1,11 +1,6 @@
-#include <gtest/gtest.h>
-#include <sys/resource.h>
-#include <sys/wait.h>
-#include <unistd.h>
-
-#include <functional>
-
 #include "platform/property_list.h"
+#include "tests/platform/in_process.h"
+#include "tests/platform/plist.h"
 #include "tests/recording/temporary_folder.h"
 
 namespace onramp {
@@ -18,19 +13,11 @@ std::string repeated(const std::string& text, std::size_t times) {
   return result;
 }
 
-std::string plistWith(const std::string& inside) {
-  return "<plist version=\"1.0\"><dict><key>k</key>" + inside + "</dict></plist>";
-}
-
-std::string bigEndian(std::size_t number, int bytes) {
+std::string bigEndian(std::size_t number, int bytes = 4) {
   std::string text(static_cast<std::size_t>(bytes), '\0');
   for (auto byte = text.rbegin(); byte != text.rend(); ++byte, number >>= 8U)
     *byte = static_cast<char>(number & 0xFF);
   return text;
-}
-
-std::string reference(std::size_t index) {
-  return bigEndian(index, 4);
 }
 
 // Returns a binary list of `objects` whose root is the first one.
@@ -52,7 +39,7 @@ std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
 // bytes of object 2 and of the objects after it, `count` in all.
 std::string dictionaryOver(std::size_t count,
                            const std::function<std::string(std::size_t)>& object) {
-  std::vector<std::string> objects{"\xD1" + reference(1) + reference(2), "\x51k"};
+  std::vector<std::string> objects{"\xD1" + bigEndian(1) + bigEndian(2), "\x51k"};
   for (std::size_t i = 2; i < count + 2; ++i)
     objects.push_back(object(i));
   return binary(objects);
@@ -63,24 +50,8 @@ std::string dictionaryOver(std::size_t count,
 std::string arrays(std::size_t depth, std::size_t times) {
   return dictionaryOver(depth + 1, [&](std::size_t i) {
     return i == depth + 2 ? std::string("\x51t")
-                          : static_cast<char>(0xA0 + times) + repeated(reference(i + 1), times);
+                          : static_cast<char>(0xA0 + times) + repeated(bigEndian(i + 1), times);
   });
-}
-
-struct Outcome {
-  bool read;
-  long peakKilobytes;
-};
-
-// Loads the file in a separate process, so that the memory that loading takes can be measured.
-Outcome load(const std::string& path) {
-  const pid_t loader = fork();
-  if (loader == 0) _exit(loadDictionary(path) ? 0 : 1);
-  int status = 0;
-  rusage usage{};
-  EXPECT_EQ(wait4(loader, &status, 0, &usage), loader);
-  EXPECT_TRUE(WIFEXITED(status)) << "the loading process crashed";
-  return {status == 0, usage.ru_maxrss};
 }
 
 TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
@@ -107,16 +78,22 @@ TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
                       [](std::size_t i) {
                         return i == 2
                                    ? "\xAF\x12" + bigEndian(200000, 4) +
-                                         repeated(reference(3), 200000)
+                                         repeated(bigEndian(3), 200000)
                                    : "\x5F\x12" + bigEndian(1000000, 4) + std::string(1000000, 'x');
                       })},
       {"a list that holds itself",
-       dictionaryOver(2, [](std::size_t i) { return "\xA1" + reference(5 - i); })}};
-  const long usual = load(folder.holding("usual", plistWith("<true/>"))).peakKilobytes;
+       dictionaryOver(2, [](std::size_t i) { return "\xA1" + bigEndian(5 - i); })}};
+  // The file is loaded in another process, so that the memory that loading takes can be measured.
+  rusage usage{};
+  const auto load = [&](const std::string& bytes) {
+    const std::string path = folder.holding("list", bytes);
+    return inProcess([&] { return loadDictionary(path).has_value(); }, &usage);
+  };
+  EXPECT_EQ(load(plistWith("<true/>")), 0);
+  const long usual = usage.ru_maxrss;
   for (const auto& [name, bytes] : cases) {
-    const Outcome outcome = load(folder.holding("list", bytes));
-    EXPECT_FALSE(outcome.read) << name;
-    EXPECT_LT(outcome.peakKilobytes - usual, 32 * 1024) << name;
+    EXPECT_EQ(load(bytes), W_EXITCODE(1, 0)) << name;
+    EXPECT_LT(usage.ru_maxrss - usual, 32 * 1024) << name;
   }
 }
 
@@ -166,8 +143,8 @@ TEST(Limits, EveryObjectOfABinaryListMustBeValidAndWhole) {
       {"a size that is no integer", "\x5F\x51t"},
       {"data without its size", "\x4F"},
       {"an array past the objects", "\xA9"},
-      {"a reference past the table", "\xA1" + reference(3)},
-      {"a dictionary with a number for a key", "\xD1" + reference(2) + reference(1)}};
+      {"a reference past the table", "\xA1" + bigEndian(3)},
+      {"a dictionary with a number for a key", "\xD1" + bigEndian(2) + bigEndian(1)}};
   for (const auto& [name, object] : objects) {
     const std::string bytes = dictionaryOver(1, [&o = object](std::size_t) { return o; });
     EXPECT_FALSE(loadDictionary(folder.holding("list", bytes))) << name;

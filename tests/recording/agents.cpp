@@ -37,10 +37,6 @@ Agents& Agents::instance() {
   return agents;
 }
 
-void Agents::reset() {
-  *this = Agents();
-}
-
 int Agents::nextAnswer(const std::string& address) {
   const auto found = answers.find(address);
   if (found == answers.end() || found->second.empty()) return kSilent;

@@ -25,7 +25,7 @@ class Agents {
   static Agents& instance();
 
   /// Returns to the initial state, in which no address answers.
-  void reset();
+  void reset() { *this = Agents(); }
 
   /// The values that each dotted address answers with, in order. The last one answers all further
   /// requests too.

@@ -18,19 +18,9 @@ FrontEnd& FrontEnd::instance() {
 
 void FrontEnd::reset() {
   mainInterface_.reset();
-  timers_.clear();
-  menus_.clear();
-  log.clear();
-  alerts.clear();
-  sheets.clear();
-  pauses.clear();
-  delays.clear();
-  opened.clear();
-  missingInterfaces.clear();
-  duringPause = nullptr;
-  duringOpening = nullptr;
-  terminated = false;
-  now_ = 0;
+  const std::vector<Object*> others = std::move(loaded);  // still belong to a page
+  *this = FrontEnd();
+  loaded = others;
   resetLoop();
 
   Object& bar = addMenuObject(OutletKind::kMenu, "");
@@ -151,7 +141,7 @@ void runCriticalAlert(const std::string& messageText, const std::string& informa
 
 void beginAlertSheet(const AlertSheet& sheet, const Window&, std::function<void(int)> didEnd) {
   FrontEnd::instance().log.emplace_back("sheet");
-  FrontEnd::instance().sheets.push_back({sheet, std::move(didEnd)});
+  FrontEnd::instance().sheets.emplace_back(sheet, std::move(didEnd));
 }
 
 }  // namespace onramp

@@ -50,11 +50,6 @@ struct ShownAlert {
   std::string buttonTitle;
 };
 
-struct ShownSheet {
-  AlertSheet sheet;
-  std::function<void(int)> didEnd;
-};
-
 /// A front end without a screen, and a desktop that opens nothing. It records what the program
 /// shows and asks for, and plays the user and the clock. Time passes only in runTimers(). The
 /// pauses of a search wait take no time.
@@ -88,7 +83,7 @@ class FrontEnd {
   // What the program did.
   std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
   std::vector<ShownAlert> alerts;
-  std::vector<ShownSheet> sheets;
+  std::vector<std::pair<AlertSheet, std::function<void(int)>>> sheets;  ///< with their handlers
   std::vector<unsigned> pauses;     ///< seconds of every pause off the main thread
   std::vector<double> delays;       ///< the delay of every timer, in seconds
   std::vector<std::string> opened;  ///< every path and address that was to be opened

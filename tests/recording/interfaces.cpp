@@ -39,10 +39,7 @@ struct Interface::Tree {
 
 namespace {
 
-struct Part {
-  OutletKind kind;
-  const char* name;
-};
+using Part = std::pair<OutletKind, const char*>;
 
 // The outlets in the interface files. tests/resources compares them with the files and the program.
 const std::vector<Part>& partsOf(const std::string& interfaceName) {
@@ -97,8 +94,8 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
   if (parts.empty() || FrontEnd::instance().missingInterfaces.contains(name)) return nullptr;
   auto tree = std::make_unique<Tree>();
   tree->add(OutletKind::kView, name, owner);
-  for (const Part& part : parts)
-    bindAsTheFilesDo(tree->add(part.kind, part.name, owner), owner.boundTexts());
+  for (const auto& [kind, outlet] : parts)
+    bindAsTheFilesDo(tree->add(kind, outlet, owner), owner.boundTexts());
   return std::unique_ptr<Interface>(new Interface(std::move(tree)));
 }
 

@@ -3,7 +3,6 @@
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
-#include <sstream>
 #include <utility>
 
 #include "platform/freedesktop/main_bundle.h"
@@ -11,18 +10,7 @@
 
 namespace onramp::recording {
 
-namespace {
-
 namespace fs = std::filesystem;
-
-std::string contents(const std::string& path) {
-  std::ifstream file(path);
-  std::ostringstream text;
-  text << file.rdbuf();
-  return text.str();
-}
-
-}  // namespace
 
 MediumFolder::MediumFolder() {
   setEnvironment("XDG_DATA_HOME", root_ / "user");
@@ -40,13 +28,8 @@ MediumFolder::MediumFolder() {
 }
 
 MediumFolder::~MediumFolder() {
-  for (const auto& [name, value] : std::exchange(before_, {})) {
-    if (value) {
-      setenv(name.c_str(), value->c_str(), 1);
-    } else {
-      unsetenv(name.c_str());
-    }
-  }
+  for (const auto& [name, value] : std::exchange(before_, {}))
+    setEnvironment(name, value);
 }
 
 std::string MediumFolder::path(const std::string& relative) const {
@@ -85,7 +68,9 @@ void MediumFolder::addSetUpTool(int status) const {
 }
 
 std::string MediumFolder::setUpToolArguments() const {
-  return contents(root_ / "tool");
+  std::string arguments;
+  std::getline(std::ifstream(root_ / "tool"), arguments);
+  return arguments;
 }
 
 std::string MediumFolder::optionsFilePath() const {

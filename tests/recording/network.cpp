@@ -9,10 +9,6 @@ namespace recording {
 
 namespace {
 
-void record(std::string call) {
-  Network::instance().log.push_back(std::move(call));
-}
-
 class ScriptedService final : public NetService,
                               public std::enable_shared_from_this<ScriptedService> {
  public:
@@ -26,23 +22,16 @@ class ScriptedService final : public NetService,
   [[nodiscard]] std::optional<Data> txtData() const override { return txt; }
 
   void setClient(Client client, void* info) override {
-    record(client ? "service client" : "service no client");
     client_ = client;
     info_ = info;
   }
-  void schedule() override {
-    record("service schedule");
-    scheduled_ = true;
-  }
-  void unschedule() override {
-    record("service unschedule");
-    scheduled_ = false;
-  }
+  void schedule() override { scheduled_ = true; }
+  void unschedule() override { scheduled_ = false; }
   bool resolveWithTimeout(double seconds) override {
-    record("service resolve");
     addresses.clear();
     txt.reset();
     Network::instance().timeouts.push_back(seconds);
+    Network::instance().cancelled = false;
     if (client_) {
       resolving = true;
       return true;
@@ -54,7 +43,7 @@ class ScriptedService final : public NetService,
     return true;
   }
   void cancel() override {
-    record("service cancel");
+    Network::instance().cancelled = true;
     resolving = false;
   }
 
@@ -88,20 +77,17 @@ class ScriptedBrowser final : public NetServiceBrowser,
   ScriptedBrowser& operator=(const ScriptedBrowser&) = delete;
   ~ScriptedBrowser() override { std::erase(Network::instance().browsers, this); }
 
-  void schedule() override { record("browser schedule"); }
-  void unschedule() override { record("browser unschedule"); }
+  void schedule() override {}
+  void unschedule() override {}
   bool searchForServices(const std::string& domain, const std::string& type) override {
-    record("browser search \"" + domain + "\" " + type);
+    Network::instance().domain = domain;
     if (!Network::instance().searchesStart) return false;
     type_ = type;
     Network::instance().browsers.push_back(this);
     return true;
   }
-  void invalidate() override { record("browser invalidate"); }
-  void stopSearch() override {
-    record("browser stop");
-    std::erase(Network::instance().browsers, this);
-  }
+  void invalidate() override {}
+  void stopSearch() override { std::erase(Network::instance().browsers, this); }
 
   void tell(unsigned long flags, const NetServiceRef& service) {
     if (service->type() == type_) client_(shared_from_this(), flags, service, {0}, info_);
@@ -124,10 +110,6 @@ void tellAll(unsigned long flags, const NetServiceRef& service) {
 Network& Network::instance() {
   static Network network;
   return network;
-}
-
-void Network::reset() {
-  *this = Network();
 }
 
 NetServiceRef Network::service(const std::string& name, const std::string& type,
@@ -194,13 +176,11 @@ Data txtData(const std::vector<std::string>& strings) {
 }  // namespace recording
 
 NetServiceBrowserRef NetServiceBrowser::create(Client client, void* info) {
-  recording::record("browser create");
   return std::make_shared<recording::ScriptedBrowser>(client, info);
 }
 
 NetServiceRef NetService::create(const std::string& domain, const std::string& type,
                                  const std::string& name, std::int32_t) {
-  recording::record("service create");
   return recording::Network::service(name, type, domain);
 }
 

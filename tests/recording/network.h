@@ -16,7 +16,7 @@ class Network {
   static Network& instance();
 
   /// Returns to the initial state. Earlier browsers and services get no more events.
-  void reset();
+  void reset() { *this = Network(); }
 
   /// Makes a service object like those that browse events carry.
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
@@ -41,8 +41,9 @@ class Network {
   std::map<std::string, std::vector<Data>> answers;
 
   bool searchesStart = true;
-  std::vector<std::string> log;              ///< every call, in order, such as "browser schedule"
+  std::string domain;                        ///< of the latest search
   std::vector<double> timeouts;              ///< of every resolve
+  bool cancelled = false;                    ///< whether the latest resolve was cancelled
   std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 

@@ -3,7 +3,6 @@
 #include "snmp/query.h"
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 #include <algorithm>
 
@@ -68,11 +67,7 @@ TEST_F(Query, BuildsTheResultFromTheValuesThatATableAsksFor) {
   const auto text = binding("04 01 05");
   auto stale = replyWith(one + two);
   stale[11] = 6;
-  const struct {
-    const char* what;
-    Agents::Bytes reply;
-    const char* outcome;
-  } cases[] = {
+  const std::tuple<const char*, Agents::Bytes, const char*> cases[] = {
       {"two integers", replyWith(one + two), "one 5 two -2147483648 0 0"},
       {"a refused value before another", replyWith(text + two), "two -2147483648 0 0"},
       {"a refused value at the end", replyWith(one + text), "nothing 0 0"},
@@ -96,8 +91,8 @@ TEST_F(Query, BuildsTheResultFromTheValuesThatATableAsksFor) {
     reply(bytes);
     return outcome(&table);
   };
-  for (const auto& c : cases)
-    EXPECT_EQ(ask(c.reply), c.outcome) << c.what;
+  for (const auto& [what, reply, outcome] : cases)
+    EXPECT_EQ(ask(reply), outcome) << what;
   handlers[0].decode = nullptr;
   EXPECT_EQ(ask(replyWith(text + two)), "two -2147483648 0 0");
   table.count = 0;
@@ -225,12 +220,9 @@ class GetSet : public testing::Test {
 
 TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
-  const struct {
-    const char* what;
-    std::string reply;
-    std::uint16_t capacity;  // of the second slot
-    std::string second;      // its contents afterwards; unchanged by a refused reply
-  } cases[] = {
+  // The reply, the second slot's capacity, and its contents afterwards, which a refused reply
+  // leaves.
+  const std::tuple<const char*, std::string, std::uint16_t, std::string> cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},
       {"no room for the string", abc + abc + five, 2, "yy##"},
@@ -238,15 +230,15 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
       {"another kind of string", abc + "30 00 06 01 2B 44 01 61", 4, "yyyy##"},
       {"one value too many", abc + abc + five + five, 4, "yyyy##"},
   };
-  for (const auto& c : cases) {
+  for (const auto& [what, bindings, capacity, second] : cases) {
     for (const bool setting : {false, true}) {
-      SCOPED_TRACE(c.what + std::string(setting ? ", set" : ", get"));
-      give(1, c.capacity, 1);
+      SCOPED_TRACE(what + std::string(setting ? ", set" : ", get"));
+      give(1, capacity, 1);
       slots[2].int_value = 9;
-      reply = replyWith(c.reply);
-      const bool taken = c.second[0] == 'a';
+      reply = replyWith(bindings);
+      const bool taken = second[0] == 'a';
       EXPECT_EQ(setting ? set({0, 1, 2}) : get(3), taken ? SNMP_OK : SNMP_ERR_CODEC);
-      EXPECT_EQ(texts[1], c.second);
+      EXPECT_EQ(texts[1], second);
       EXPECT_EQ(octets[1].length, taken ? 3 : 1);
       EXPECT_EQ(slots[2].int_value, taken ? 5 : 9);
       EXPECT_EQ(m.varbinds[1].octets_value, nullptr);
@@ -255,23 +247,22 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
 }
 
 TEST_F(GetSet, SendTheSlotsThatTheIndexesNameIfTheyFitTheStorage) {
-  for (const std::uint16_t length : std::vector<std::uint16_t>{1, 16, 17, 500, 700}) {
+  for (const std::uint16_t length : std::vector<std::uint16_t>{1, 17, 700}) {
     give(0, 700, length);
     give(1, 700, length);
     ASSERT_EQ(set({1, 0}), SNMP_OK) << length;
     Message request(2);
     ASSERT_EQ(request.decode(sent), SNMP_OK);
-    EXPECT_EQ(request.message.pdu_type, kPduSet);
-    EXPECT_EQ(
-        std::string(request.strings.begin(), request.strings.begin() + std::ptrdiff_t{2} * length),
-        std::string(length, 'y') + std::string(length, 'x'));
+    const auto both = request.strings.begin();
+    EXPECT_EQ(std::string(both, both + std::ptrdiff_t{2} * length),
+              std::string(length, 'y') + std::string(length, 'x'));
     EXPECT_EQ(texts[0].front(), 'y') << "the reply's first value goes to the first slot";
   }
   agents.asked.clear();
-  give(0, 1500, 1485);
+  give(0, 60000, 1485);
   EXPECT_EQ(set({0, 1}), SNMP_ERR_CODEC);
   EXPECT_EQ(set({3}), SNMP_ERR_CODEC);
-  give(0, 60000, 60000);
+  octets[0].length = 60000;
   EXPECT_EQ(set({0}), SNMP_ERR_CODEC);
   EXPECT_TRUE(agents.asked.empty());
 
@@ -287,16 +278,16 @@ TEST_F(GetSet, ReturnTheErrorStatusAndCountRequestsFromTwoHundred) {
   EXPECT_EQ(kFirstExtendedIdentifier, 200);
   const std::int64_t next = snmp_request_counter_ext;
   reply = replyWith("", 2);
-  EXPECT_EQ(get(3, kPduResponse), 2U);
-  EXPECT_EQ(sent.at(kPduTagAt), 0xA0);
-  EXPECT_EQ(get(3, kPduGetNext), 2U);
-  EXPECT_EQ(sent.at(kPduTagAt), 0xA1);
+  for (const auto& [kind, tag] : {std::pair(kPduResponse, 0xA0), std::pair(kPduGetNext, 0xA1)}) {
+    EXPECT_EQ(get(3, kind), 2U);
+    EXPECT_EQ(sent.at(kPduTagAt), tag);
+  }
   EXPECT_EQ(set({0}), 2U);
+  EXPECT_EQ(sent.at(kPduTagAt), 0xA3);
   EXPECT_EQ(snmp_request_counter_ext, next + 3);
 
   reply = replyWith("30 00 06 01 2B 05 00");
-  slots[0].type = kTagNull;
-  slots[0].int_value = m.varbinds[0].int_value = 9;
+  slots[0] = {.type = kTagNull, .int_value = 9};
   EXPECT_EQ(get(1), SNMP_OK);
   EXPECT_EQ(slots[0].int_value, 0) << "the old value is gone";
 }

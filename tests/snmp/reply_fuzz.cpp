@@ -4,7 +4,6 @@
 #include <array>
 #include <cstdio>
 #include <cstdlib>
-#include <ctime>
 #include <memory>
 
 #include "snmp/get_set.h"
@@ -61,10 +60,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   recording::Agents& agents = recording::Agents::instance();
   agents.reset();
   agents.reply = [=](const auto&) { return recording::Agents::Bytes(data, data + size); };
-  const std::clock_t start = std::clock();  // processor time, whatever else runs
   query();
   exchangeStrings(false);
   exchangeStrings(true);
-  require(std::clock() - start < CLOCKS_PER_SEC / 10, "a reply takes less than 0.1 s");
   return 0;
 }

@@ -1,5 +1,5 @@
-"""Makes one mistake at a time on a copy of the example medium and reads what onramp-check reports.
-Arguments: the program and the application's Info.plist."""
+"""Makes one mistake at a time on a copy of a medium and reads what onramp-check reports.
+Arguments: the program, and the example medium with the application on it."""
 
 import json
 import os
@@ -12,7 +12,7 @@ import tempfile
 import unittest
 from pathlib import Path
 
-PROGRAM, INFORMATION = sys.argv[1:]
+PROGRAM, MEDIUM = sys.argv[1:]
 ROOT = Path(__file__).resolve().parents[2]
 APPLICATION = "Onramp OSX.app/Contents"
 COMMON = "MacResources/CDCommonInfo.plist"
@@ -28,17 +28,9 @@ PICTURE = "MacResources/Images/usb.png"
 
 
 def make_medium(folder):
-    shutil.copytree(ROOT / "examples/medium", folder)
-    resources = folder / APPLICATION / "Resources"
-    resources.mkdir(parents=True)
-    for source in ROOT.glob("resources/*.lproj"):
-        shutil.copytree(source, resources / source.name)
-    for name in ("Background.png", "SupportedKOL.plist"):
-        shutil.copy(ROOT / "resources" / name, resources)
-    shutil.copy(INFORMATION, folder / APPLICATION / "Info.plist")
-    program = folder / APPLICATION / "MacOS/Onramp OSX"
-    program.parent.mkdir()
-    program.touch(0o755)
+    shutil.copytree(MEDIUM, folder, ignore=shutil.ignore_patterns("Linux"))
+    (folder / APPLICATION / "MacOS").mkdir()
+    (folder / APPLICATION / "MacOS/Onramp OSX").touch(0o755)
 
 
 def run(*arguments, **options):

@@ -1,12 +1,11 @@
 #!/usr/bin/python3
 """Random walks over the wizard's real window while devices come and go.
 
-Usage: walk.py [--seed N] [--count N] [--silence SECONDS] MEDIUM
+Usage: walk.py [--seed N] [--count N] MEDIUM
 
 Walk number i, counted from 0, uses seed N + i, so that it can be repeated. A walk fails when the
-program exits with an error, when the main loop is silent for longer than SECONDS (default 0.5),
-when the window cannot be closed at the end, or when a hand-off file is incomplete. A failed walk
-prints its seed and its steps.
+program exits with an error, when the main loop hangs, when the window cannot be closed at the end,
+or when a hand-off file is incomplete. A failed walk prints its seed and its steps.
 """
 
 import argparse
@@ -29,6 +28,7 @@ from practice_network import PracticeNetwork
 AT_A_TIME = 4
 STEPS = 14
 PATIENCE = 60
+HANG = 10  # seconds without an answer; the devices answer at once, so nothing takes so long
 CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu item")
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
@@ -46,14 +46,12 @@ class Wrong(Exception):
 
 
 class Walk:
-    def __init__(self, desktop, network, seed, silence):
-        self.desktop, self.network, self.silence = desktop, network, silence
+    def __init__(self, desktop, network, seed):
+        self.desktop, self.network = desktop, network
         self.kind = f"Walk {seed}"
         self.dice = random.Random(seed)
         self.steps = []
-        self.longest = 0.0
         self.devices = {}
-        self.seen = set()
 
     def take(self):
         self.desktop.forget()
@@ -82,7 +80,7 @@ class Walk:
                                      (8, 5, 5, 0.3))[0]
             try:
                 step(person)
-            except (TimeoutError, *person.errors):
+            except person.errors:
                 pass  # The control has vanished meanwhile.
             self.listen(person, self.dice.choice((0, 0.1, 1)))
             self.check_files()
@@ -91,7 +89,6 @@ class Walk:
 
     def click(self, person):
         shown = person.everything()
-        self.seen |= {name for role, name, _ in shown if role in ("label", "heading")}
         controls = [one for one in shown if one[0] in CLICKABLE and one[1]]
         if not controls:
             return
@@ -131,8 +128,7 @@ class Walk:
             silent = person.round_trip()
             if silent is None:
                 return
-            self.longest = max(self.longest, silent)
-            if silent > self.silence:
+            if silent > HANG:
                 raise Wrong(f"the main loop was silent for {silent:.2f} s")
             if time.monotonic() >= until:
                 return
@@ -163,18 +159,16 @@ class Walk:
                     raise Wrong(f"{file.name} is incomplete: {content}")
 
 
-def take_walks(seeds, silence):
+def take_walks(seeds):
     """Takes the walks one after the other and returns whether all of them passed."""
     network = PracticeNetwork()
     passed = True
     with Desktop() as desktop:
         for seed in seeds:
-            walk = Walk(desktop, network, seed, silence)
+            walk = Walk(desktop, network, seed)
             try:
                 walk.take()
-                print(f"walk {seed}: ok, {len(walk.steps)} steps, "
-                      f"silent for {walk.longest:.3f} s at most, seen: {', '.join(sorted(walk.seen))}",
-                      flush=True)
+                print(f"walk {seed}: ok, {len(walk.steps)} steps", flush=True)
             except (Wrong, RuntimeError, TimeoutError) as error:
                 passed = False
                 print(f"walk {seed}: {error}, after:\n  " + "\n  ".join(walk.steps), flush=True)
@@ -185,7 +179,6 @@ def main():
     parser = argparse.ArgumentParser()
     parser.add_argument("--seed", type=int, default=1)
     parser.add_argument("--count", type=int, default=4)
-    parser.add_argument("--silence", type=float, default=0.5)
     options = parser.parse_args()
     if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
         os.execv(sys.executable, [sys.executable, PRACTICE_NETWORK, "/dev/null", sys.executable,
@@ -194,7 +187,7 @@ def main():
               for first in range(AT_A_TIME)]
     sys.argv.append(str(BUILT))  # way.py takes it from there in each process
     with multiprocessing.get_context("spawn").Pool(AT_A_TIME) as pool:
-        return all(pool.starmap(take_walks, [(share, options.silence) for share in shares]))
+        return all(pool.map(take_walks, shares))
 
 
 if __name__ == "__main__":

@@ -21,7 +21,6 @@ from onscreen.person import Person  # noqa: E402
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TEXT = messages.read(BUILT, "en")
 PRACTICE_NETWORK = TOOLS / "practice-network"
-WIRELESS, WIRED = 2, 1  # a device's answers for ActiveIF
 GEAR, GEAR_REFRESH = "Actions", 2
 # The Cocoa front end under GNUstep has no keys for menus, no names for lists and no options.
 ON_GNUSTEP = "gnustep_person" in sys.modules

@@ -6,28 +6,17 @@
 #include <limits>
 
 #include "platform/child_process.h"
+#include "tests/platform/plist.h"
 #include "tests/recording/temporary_folder.h"
 
 namespace onramp {
 namespace {
-
-Date date(double seconds) {
-  return Date{seconds};
-}
 
 Data allBytes() {
   Data data;
   for (int i = 0; i < 256; ++i)
     data.push_back(static_cast<std::byte>(i));
   return data;
-}
-
-std::string plist(const std::string& inside) {
-  return "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
-         "<!DOCTYPE plist PUBLIC \"-//Apple//DTD PLIST 1.0//EN\" "
-         "\"http://www.apple.com/DTDs/PropertyList-1.0.dtd\">\n"
-         "<plist version=\"1.0\"><dict>" +
-         inside + "</dict></plist>\n";
 }
 
 TEST(PropertyList, ExchangesEveryKindOfValueWithAnotherImplementation) {
@@ -52,8 +41,8 @@ TEST(PropertyList, ExchangesEveryKindOfValueWithAnotherImplementation) {
                          {"infinite", std::numeric_limits<double>::infinity()},
                          {"Schlüssel 鍵 🖨", "Größe 大きさ 🖨"},
                          {"data", allBytes()},
-                         {"day", date(730902896)},
-                         {"first", date(-63113904000)},
+                         {"day", Date{730902896}},
+                         {"first", Date{-63113904000}},
                          {"list", Array{1, Array{2, Array{"three"}}, Dictionary{{"four", 4}}}}};
   for (const auto& [key, value] : known) {
     const Value* const found = read->find(key);
@@ -62,7 +51,7 @@ TEST(PropertyList, ExchangesEveryKindOfValueWithAnotherImplementation) {
 }
 
 TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
-  const std::string whole = plist("<key>k</key><string>text</string>");
+  const std::string whole = plistWith("<string>text</string>");
   const std::string cases[] = {"",
                                "plain text",
                                "<",
@@ -70,9 +59,9 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
                                "<plist><string>text</string></plist>",
                                "<html><body/></html>",
                                whole.substr(0, whole.size() - 12),
-                               plist("<key>k</key>\xFF"),
-                               plist(std::string("<key>k</key><string>\0</string>", 30)),
-                               plist("<key>k</key><string>&unknown;</string>"),
+                               plistWith("\xFF"),
+                               plistWith(std::string("<string>\0</string>", 18)),
+                               plistWith("<string>&unknown;</string>"),
                                "bplist00",
                                "bplist00" + std::string(40, '\xFF')};
   const TemporaryFolder folder;
@@ -82,27 +71,6 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
   EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
   EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
   EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "the pipe has no writer";
-}
-
-TEST(PropertyList, IsRefusedBeyondTheLimits) {
-  const auto nested = [](std::size_t depth) {
-    std::string text;
-    for (std::size_t i = 0; i < depth; ++i)
-      text += "<array>";
-    for (std::size_t i = 0; i < depth; ++i)
-      text += "</array>";
-    return plist("<key>k</key>" + text);
-  };
-  const auto textOf = [](std::size_t size) {
-    return plist("<key>k</key><string>" + std::string(size, 'x') + "</string>");
-  };
-  const TemporaryFolder folder;
-  for (const std::string& bytes : {nested(100), textOf(15 << 20)})
-    EXPECT_TRUE(loadDictionary(folder.holding("list", bytes))) << bytes.size() << " bytes";
-  for (const std::string& bytes :
-       {nested(kMostPropertyListDepth + 1), textOf(kMostPropertyListBytes)}) {
-    EXPECT_FALSE(loadDictionary(folder.holding("list", bytes))) << bytes.size() << " bytes";
-  }
 }
 
 TEST(PropertyList, IsWrittenWholeOrNotAtAll) {

@@ -1,5 +1,4 @@
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 #include "tests/platform/conformance/front_end.h"
 #include "tests/recording/front_end.h"

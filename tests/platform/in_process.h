@@ -1,0 +1,22 @@
+#pragma once
+
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <functional>
+
+namespace onramp {
+
+/// Calls `action` in another process and returns that process's wait status. That is 0 if
+/// `action` returned true. When `usage` is not null, it receives what the process used.
+inline int inProcess(const std::function<bool()>& action, rusage* usage = nullptr) {
+  const pid_t process = fork();
+  if (process == 0) _exit(action() ? 0 : 1);
+  int status = -1;
+  EXPECT_EQ(wait4(process, &status, 0, usage), process);
+  return status;
+}
+
+}  // namespace onramp

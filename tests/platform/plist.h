@@ -1,0 +1,13 @@
+#pragma once
+
+#include <string>
+
+namespace onramp {
+
+/// Returns an XML property list whose root dictionary has the key "k" with `value` and what
+/// follows.
+inline std::string plistWith(const std::string& value) {
+  return "<plist version=\"1.0\"><dict><key>k</key>" + value + "</dict></plist>";
+}
+
+}  // namespace onramp
