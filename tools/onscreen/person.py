@@ -109,6 +109,14 @@ class Person:
         self.click(role, name)
         self.desktop.run(["xdotool", "click", "1"])
 
+    def act(self, role, name):
+        """Performs a control's first action over the accessibility bus, without mouse or keys."""
+        def acts():
+            control = self.see(role, name)
+            return self.has_state(control, "enabled") and control.get_action_iface().do_action(0)
+
+        wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
+
     def open_menu(self, button=None):
         """Opens the menu of that button, or of the button with the focus.
 
