@@ -28,7 +28,7 @@ enum class ToolStart { kAutomatic, kManual };
 
 /// The wizard's only controller. It owns the state, decides which page is shown and passes the
 /// user's choices to the installer package. Each group of functions has its own source file. All
-/// functions except waitDeviceSearchTask() must be called on the main thread.
+/// functions must be called on the main thread, except waitDeviceSearchTask() and listedDevices().
 class OnrampOSXAppDelegate final : public ApplicationDelegate {
  public:
   OnrampOSXAppDelegate();
@@ -43,8 +43,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Sets up the window, its background picture and the application menu.
   void awakeFromNib() override;
 
-  /// Checks the system's version. On a supported system, deletes the hand-off files of earlier
-  /// runs. On any other, shows an alert and terminates the application.
+  /// Checks the system's version. On a supported system, deletes the files for the package that
+  /// earlier runs wrote. On any other, shows an alert and terminates the application.
   void applicationWillFinishLaunching() override;
 
   /// Shows the first page, or opens the package and quits when no model on the medium supports
@@ -63,8 +63,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Whether any of `models` supports wireless.
   [[nodiscard]] static bool isSupportWiFi(const std::vector<std::string>& models);
 
-  /// Returns the type of a model that supports USB if `usb` is set, and wired Ethernet if
-  /// `ethernet` is set.
+  /// Returns the connection type of a model; `usb` and `ethernet` say whether it supports USB and
+  /// wired Ethernet.
   [[nodiscard]] static ConnectionType isIFType(bool usb, bool ethernet);
 
   /// Returns the type of the model called `model`; kNeither without a name.
@@ -84,9 +84,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// the interface file `name` instead. The window stays empty when that page cannot be loaded.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
-  /// Show a new model list, and a new connection page for `type`. showConnectionTypeView() also
-  /// tells the chooser, a ChooseDeviceView, which models to look for: the model that the user
-  /// chose, or else all models on the medium.
+  /// showModelListView() shows a new model list; showConnectionTypeView() shows a new connection
+  /// page for `type`. The latter also tells the chooser, a ChooseDeviceView, which models to look
+  /// for: the model that the user chose, or else all models on the medium.
   void showModelListView();
   void showConnectionTypeView(ConnectionType type);
 
@@ -149,7 +149,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static std::string setVenderName();
 
   /// Return the paths of the package-options file and of the model file. Each creates the file's
-  /// folder if it is missing. Every user can write to a new folder for the package options.
+  /// folder if it is missing. If InstallPKGInfoURL() creates the folder, it makes it writable for
+  /// every user.
   [[nodiscard]] static std::string InstallPKGInfoURL();
   [[nodiscard]] static std::string instmodelPlistURL();
 
@@ -176,7 +177,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Hide the application, run the wireless set-up tool and act on its exit status. Both functions
   /// return before the tool starts. launchWLANToolAutomatically() is for a search that found no
-  /// device. Only then can the tool send the user back to the connection page.
+  /// device. Only after this function can the tool send the user back to the connection page.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 

@@ -1,10 +1,10 @@
-#include <algorithm>
 #include <chrono>
 #include <filesystem>
 #include <system_error>
 
 #include "app/OnrampOSXAppDelegate.h"
 #include "base/ascii.h"
+#include "base/text.h"
 #include "media/KSOROSXCD.h"
 #include "platform/bundle.h"
 #include "platform/child_process.h"
@@ -29,23 +29,6 @@ constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 // search.
 constexpr int kToolAsksToGoBack = 1;
 constexpr int kToolAsksToQuit = 2;
-
-// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). It may have only the
-// characters allowed there, at most one "#", and "%" only before two hexadecimal digits.
-bool isURLText(std::string_view text) {
-  constexpr std::string_view kPunctuation = "-._~:/?#@!$&'()*+,;=";
-  for (std::size_t at = 0; at < text.size(); ++at) {
-    const char c = text[at];
-    if (c == '%') {
-      if (at + 2 >= text.size() || !hexDigitValue(text[at + 1]) || !hexDigitValue(text[at + 2])) {
-        return false;
-      }
-    } else if (!isASCIILetterOrDigit(c) && kPunctuation.find(c) == std::string_view::npos) {
-      return false;
-    }
-  }
-  return std::count(text.begin(), text.end(), '#') <= 1;
-}
 
 std::optional<int> runSetUpTool(const std::optional<FileURL>& tool) {
   const auto bundle = tool ? Bundle::open(tool->path) : std::nullopt;

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "base/ascii.h"
+
 namespace onramp {
 
 namespace {
@@ -105,6 +107,21 @@ std::optional<std::string> decodedText(std::string_view bytes) {
   if (bytes.size() >= 2 && bytes[0] == '\0') return fromUTF16(bytes, true);
   if (bytes.size() >= 2 && bytes[1] == '\0') return fromUTF16(bytes, false);
   return fromUTF8(bytes);
+}
+
+bool isURLText(std::string_view text) {
+  constexpr std::string_view kPunctuation = "-._~:/?#@!$&'()*+,;=";
+  for (std::size_t at = 0; at < text.size(); ++at) {
+    const char c = text[at];
+    if (c == '%') {
+      if (at + 2 >= text.size() || !hexDigitValue(text[at + 1]) || !hexDigitValue(text[at + 2])) {
+        return false;
+      }
+    } else if (!isASCIILetterOrDigit(c) && kPunctuation.find(c) == std::string_view::npos) {
+      return false;
+    }
+  }
+  return std::count(text.begin(), text.end(), '#') <= 1;
 }
 
 }  // namespace onramp

@@ -43,4 +43,8 @@ std::optional<char32_t> takeUTF8(std::string_view& text);
 /// when the bytes are malformed.
 [[nodiscard]] std::optional<std::string> decodedText(std::string_view bytes);
 
+/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). It may have only
+/// the characters allowed there, at most one "#", and "%" only before two hexadecimal digits.
+[[nodiscard]] bool isURLText(std::string_view text);
+
 }  // namespace onramp

@@ -48,7 +48,7 @@ class KSBonjourObserver {
 /// must be called on the main thread.
 class KSBonjour {
  public:
-  /// Creates an idle browser for `type`. A browser without a type never starts.
+  /// Creates an idle browser for `type`. A browser without a type never starts to browse.
   [[nodiscard]] static std::shared_ptr<KSBonjour> initWithType(std::optional<std::string> type);
 
   KSBonjour(const KSBonjour&) = delete;

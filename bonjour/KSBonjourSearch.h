@@ -18,7 +18,7 @@ class KSDeviceObserver {
   KSDeviceObserver& operator=(const KSDeviceObserver&) = delete;
   virtual ~KSDeviceObserver() = default;
 
-  /// Called when a device is resolved that is in no browser's table.
+  /// Called when a device that is in no browser's table is resolved.
   virtual void addKSDevice(const Dictionary& device) = 0;
   /// Called when a device is resolved, or when it is reported gone but is still in a browser's
   /// table. A new device is usually announced by this function, so an observer must add a device

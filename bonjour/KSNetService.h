@@ -8,8 +8,9 @@
 
 namespace onramp {
 
-// The operations on network services that the browser classes use. A function that returns an int
-// returns 0 on success and 1 on failure. All functions must be called on the main thread.
+// Operations on network services, for KSBonjour and the other classes of this room. A function that
+// returns an int returns 0 on success and 1 on failure. All functions must be called on the main
+// thread.
 
 /// The functions that receive the results of browse and resolve operations. A function pointer may
 /// be null. The structure must outlive every browse and resolve that is started with it.
@@ -56,7 +57,7 @@ int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
 [[nodiscard]] std::optional<std::vector<std::string>> KSNetServiceCopyIPv4Addresses(
     const NetServiceRef& service);
 
-/// Stores the IPv4 addresses of the device that `uri` names in `addresses`. A "dnssd://" or
+/// Stores in `addresses` the IPv4 addresses of the device that `uri` names. A "dnssd://" or
 /// "mdns://" URI must name a service in the local domain, which is resolved within `timeout`
 /// seconds. A "usb://" URI fails. For any other URL, looks up the host without a time limit and
 /// stores its first address.

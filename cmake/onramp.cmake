@@ -12,8 +12,8 @@ target_compile_options(onramp_options INTERFACE
 # These options are global, so that every object file is instrumented, including code from
 # third-party headers.
 if(ONRAMP_SANITIZE)
-  add_compile_options(-fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
-  add_link_options(-fsanitize=address,undefined)
+  add_compile_options(-fsanitize=${ONRAMP_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  add_link_options(-fsanitize=${ONRAMP_SANITIZE})
 endif()
 if(ONRAMP_FUZZ)
   add_compile_options(-fsanitize=fuzzer-no-link)

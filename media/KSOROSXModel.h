@@ -9,8 +9,8 @@
 namespace onramp {
 
 /// What the medium says about one model: its connections and its support-centre identifier. To
-/// query many models, load modelInfo() once and pass it to initWithName(), which otherwise reads
-/// the medium on every call.
+/// query many models, call modelInfo() once and pass its result to initWithName(), which otherwise
+/// reads the medium on every call.
 namespace KSOROSXModel {
 
 // Keys of the record.

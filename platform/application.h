@@ -9,8 +9,8 @@
 
 namespace onramp {
 
-/// The interface through which the application asks and notifies its controller, which owns the
-/// main interface file. An application has one controller.
+/// The interface through which the application informs and asks its controller. An application has
+/// one controller, for which the main interface file is loaded.
 class ApplicationDelegate : public InterfaceOwner {
  public:
   /// Gives the controller the objects of the main interface file. The application calls
@@ -18,8 +18,8 @@ class ApplicationDelegate : public InterfaceOwner {
   virtual void setOutlets(const Interface& mainInterface) = 0;
   virtual void awakeFromNib() = 0;
 
-  /// Both are called in this order when the main loop starts. The second is not called when the
-  /// first has asked the application to terminate.
+  /// The two functions below are called, in this order, when the main loop starts. The second one
+  /// is not called if the first one has asked the application to terminate.
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 

@@ -151,8 +151,8 @@ class TableView : public Control {
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 is what the button itself shows; it is not a
-/// command.
+/// A button that opens a menu of commands. Item 0 is what the button itself shows, not
+/// a command.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;

@@ -68,8 +68,8 @@ class snmp_table_request {
   void clear_values();
 
   /// Returns the values that the handlers store from the reply in the message, plus kConnectionKey
-  /// and, under kIPAddressKey, `address`. A refused value drops everything stored before it, so
-  /// nothing is returned when the last entry's value is refused.
+  /// and, under kIPAddressKey, `address`. If a handler refuses a value, all values stored before it
+  /// are dropped. Returns nothing when the value of the last entry is refused.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
  private:

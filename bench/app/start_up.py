@@ -63,7 +63,7 @@ def main():
         noise = (times[-len(times) // 4] - times[len(times) // 4]) / time
         print(f"{name:13} {time:7.1f} ms (noise {noise:4.0%})  {time / empty_time:5.2f} × empty  "
               f"{time / plain_time:5.2f} × plain  {time / hundred_time:5.2f} × 100 models   "
-              f"peak {memory:6.1f} MiB ({memory - plain_memory:+.1f} beside plain)")
+              f"peak {memory:6.1f} MiB ({memory - plain_memory:+.1f} more than plain)")
 
 
 main()

@@ -53,7 +53,7 @@ def main():
             base = statistics.median(times[COUNTS[0]]) / COUNTS[0]
             for count, runs in times.items():
                 median = statistics.median(runs)
-                print(f"{count:6} models {median:7.3f} s (least {min(runs):.3f})"
+                print(f"{count:6} models {median:7.3f} s (fastest {min(runs):.3f})"
                       f"  per model {median / count / base:5.2f} × that of {COUNTS[0]}")
 
 

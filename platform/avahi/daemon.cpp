@@ -76,7 +76,7 @@ void Daemon::retryLater() {
 void Daemon::add(Query* query) {
   queries_.push_back(query);
   if (isPresent_) query->ask();
-  runSoon();  // arms the timers that the query started
+  runSoon();  // arms the timers of the resolve that the query belongs to
 }
 
 void Daemon::remove(Query* query) {
@@ -138,6 +138,8 @@ int Daemon::onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error*) {
   return 0;
 }
 
+// Here and in lost(), a query may remove other queries from `queries_`, so the loop runs over a
+// copy and skips the removed ones.
 void Daemon::arrived() {
   isPresent_ = true;
   for (Query* const query : std::vector(queries_)) {
@@ -145,7 +147,6 @@ void Daemon::arrived() {
   }
 }
 
-// A query's handler may remove other queries from `queries_`, so this loops over a copy.
 void Daemon::lost() {
   isPresent_ = false;
   ++losses_;
@@ -176,15 +177,16 @@ bool Daemon::call(sd_bus_message* message, Reply reply) {
     return 0;
   };
   auto receiver = std::make_unique<Reply>(std::move(reply));
-  sd_bus_slot* slot = nullptr;
-  if (sd_bus_call_async(bus_.get(), &slot, message, answered, receiver.get(), kForever) < 0) {
+  sd_bus_slot* created = nullptr;
+  if (sd_bus_call_async(bus_.get(), &created, message, answered, receiver.get(), kForever) < 0) {
     return false;
   }
-  sd_bus_slot_set_destroy_callback(
-      slot, [](void* held) { const std::unique_ptr<Reply> freed(static_cast<Reply*>(held)); });
+  const Slot slot(created);
+  sd_bus_slot_set_destroy_callback(slot.get(), [](void* held) {
+    const std::unique_ptr<Reply> freed(static_cast<Reply*>(held));
+  });
   static_cast<void>(receiver.release());
-  sd_bus_slot_set_floating(slot, 1);
-  sd_bus_slot_unref(slot);
+  sd_bus_slot_set_floating(slot.get(), 1);
   runSoon();
   return true;
 }

@@ -53,9 +53,9 @@ std::optional<std::string> discoveryProblem() {
   sd_bus* opened = nullptr;
   if (sd_bus_open_system(&opened) < 0) return "the system's message bus cannot be reached";
   const avahi::Bus bus(opened);
-  sd_bus_creds* owner = nullptr;
-  const int status = sd_bus_get_name_creds(bus.get(), "org.freedesktop.Avahi", 0, &owner);
-  sd_bus_creds_unref(owner);
+  sd_bus_creds* found = nullptr;
+  const int status = sd_bus_get_name_creds(bus.get(), "org.freedesktop.Avahi", 0, &found);
+  const avahi::Credentials owner(found);
   if (status < 0) return "avahi-daemon is not running";
   return std::nullopt;
 }

@@ -20,6 +20,8 @@ class LoopThread : public std::enable_shared_from_this<LoopThread> {
 
   LoopThread(const LoopThread&) = delete;
   LoopThread& operator=(const LoopThread&) = delete;
+  /// Ends the thread and waits for its end. This takes up to a second if the thread is pausing
+  /// after a failure.
   ~LoopThread();
 
   /// Makes the main thread run the loop soon. Call this when code outside the loop has changed what

@@ -64,6 +64,7 @@ Resolve::Resolve(Daemon& daemon, const Instance& service,
 
 void Resolve::begin() {
   losses_ = daemon_.losses();
+  graceForIPv4_.stop();
   ipv4_.reset();
   ipv6_.reset();
   host_.clear();

@@ -34,6 +34,10 @@ void Timer::start(std::chrono::milliseconds wait) {
   sd_event_source_set_enabled(source_.get(), SD_EVENT_ONESHOT);
 }
 
+void Timer::stop() {
+  sd_event_source_set_enabled(source_.get(), SD_EVENT_OFF);
+}
+
 void Timer::ensure(std::chrono::milliseconds wait) {
   if (sd_event_source_get_enabled(source_.get(), nullptr) == 0) start(wait);
 }

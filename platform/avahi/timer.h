@@ -27,6 +27,8 @@ class Timer {
   void start(std::chrono::milliseconds wait);
   /// Starts the wait unless it is already running.
   void ensure(std::chrono::milliseconds wait);
+  /// Ends the wait without calling the action. Does nothing when the timer is not running.
+  void stop();
 
  private:
   std::function<void()> action_;

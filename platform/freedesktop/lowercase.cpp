@@ -1,6 +1,9 @@
 #include "platform/lowercase.h"
 
 #include <wctype.h>
+#if __has_include(<xlocale.h>)
+#include <xlocale.h>  // macOS declares newlocale() only here
+#endif
 
 #include <clocale>
 #include <string_view>

@@ -82,7 +82,7 @@ class Parser {
            refuse(hasText ? "\";\" expected" : "\"=\" or \";\" expected", lastEnd_);
   }
 
-  // Skips blanks and comments. Returns false when a comment does not end.
+  // Skips white space and comments. Returns false when a comment does not end.
   bool skipBlanks() {
     for (;;) {
       rest_.remove_prefix(std::min(rest_.find_first_not_of(" \t\n\v\f\r"), rest_.size()));

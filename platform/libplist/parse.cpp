@@ -1,6 +1,9 @@
 #include "platform/libplist/parse.h"
 
 #include <locale.h>
+#if __has_include(<xlocale.h>)
+#include <xlocale.h>  // macOS declares newlocale() only here
+#endif
 
 #include <cstdint>
 #include <memory>

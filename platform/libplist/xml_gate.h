@@ -8,7 +8,7 @@
 namespace onramp::libplist {
 
 /// Returns `text`, an XML property list in UTF-8 without a byte-order mark, in a form that libplist
-/// reads correctly. Blanks replace the leading zeros of integers, because libplist would read an
+/// reads correctly. Spaces replace the leading zeros of integers, because libplist would read an
 /// integer with leading zeros as octal. Returns nothing when `text` exceeds the limits in
 /// platform/property_list.h or contains markup that libplist might parse differently from this
 /// check. A document type with an internal part is an example of such markup. When the result is

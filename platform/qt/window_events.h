@@ -24,7 +24,7 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Shows in the title bar what the wizard is waiting for, until the wait is over.
+  /// Shows in the title bar what the wizard is waiting for, as long as it waits.
   void explainRefusal();
 
   /// Returns whether the key did anything.

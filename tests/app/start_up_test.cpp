@@ -215,7 +215,7 @@ TEST_F(StartUp, ChecksTheSystemFirst) {
     leaveFile(medium.modelFilePath());
     launch();
     EXPECT_EQ(std::filesystem::exists(medium.modelFilePath()), !alert.empty())
-        << "only a supported system loses old hand-off files";
+        << "only a supported system loses the files of earlier runs";
     EXPECT_EQ(page(), alert.empty() ? "ModelListView" : "");
     ASSERT_EQ(screen.alerts.size(), alert.empty() ? 0U : 1U);
     if (alert.empty()) continue;

@@ -4,6 +4,7 @@
 
 #include <optional>
 #include <string>
+#include <thread>
 #include <utility>
 #include <vector>
 
@@ -73,6 +74,19 @@ TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
   list.setSelectedObject(entry("absent"));
   list.rearrange();
   EXPECT_EQ(list.selectionIndex(), std::nullopt);
+}
+
+// The thread sanitizer watches this one.
+TEST(ArrayController, LetsAnotherThreadWaitForAnEntry) {
+  ArrayController list;
+  std::size_t seen = 0;
+  std::thread reader([&] {
+    while (seen == 0)
+      seen = list.arrangedCount();
+  });
+  list.addObjects({entry("a")});
+  reader.join();
+  EXPECT_EQ(seen, 1U);
 }
 
 }  // namespace

@@ -54,7 +54,7 @@ class Search:
         """Returns `condition()` once it is true. Raises after PATIENCE seconds."""
         with self._news:
             if not self._news.wait_for(condition, PATIENCE):
-                raise AssertionError(f"no expected event among these: {self._events}")
+                raise AssertionError(f"the expected event is not among these: {self._events}")
             return condition()
 
     def wait_for(self, word, name, count=1):

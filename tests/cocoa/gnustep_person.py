@@ -51,7 +51,7 @@ class GNUstepPerson(Person):
             control = self.see(role, name)
             return control if self.has_state(control, "enabled") else None
 
-        self.click_control(wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} enabled"))
+        self.click_control(wait_for(clickable, _LOOK_SECONDS, f"{role} {name!r} to be enabled"))
 
     def click_control(self, control):
         self._point_at(control)

@@ -118,7 +118,7 @@ TEST_F(Kernel, ListsTheAddressesAndThePrimaryInterface) {
   EXPECT_EQ(KSSCcurrentAddressWithInterfaceName("near"), "192.0.2.1");
   EXPECT_EQ(KSSCcurrentAddressWithInterfaceName("left"), std::nullopt);
   ip("link set lo down");
-  ip("link set far down");
+  ip("link set near down");
   local_address_list none;
   EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(&none), 0);
   EXPECT_THAT(none, ::testing::Pointee(Array{}));

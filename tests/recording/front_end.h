@@ -52,7 +52,7 @@ struct ShownAlert {
 
 /// A front end without a screen, and a desktop that opens nothing. It records what the program
 /// shows and asks for, and plays the user and the clock. Time passes only in runTimers(). The
-/// pauses of a search wait take no time.
+/// pauses in the wait for a device search take no time.
 class FrontEnd {
  public:
   static FrontEnd& instance();

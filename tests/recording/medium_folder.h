@@ -40,8 +40,8 @@ class MediumFolder {
   /// Returns the arguments of the tool's last run, or an empty text when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// Return the contents of the two hand-off files, or nothing when a file is absent, and the paths
-  /// of these files.
+  /// The first two return the contents of the two files for the package, or nothing when a file is
+  /// absent. The others return the paths of these files.
   [[nodiscard]] std::optional<Dictionary> optionsFile() const;
   [[nodiscard]] std::optional<Dictionary> modelFile() const;
   [[nodiscard]] std::string optionsFilePath() const;

@@ -146,7 +146,8 @@ TEST_F(Query, ReturnsTheStatusOfTheExchange) {
       << "not the reply's community";
 
   snmp_request_counter = 6;
-  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT) << "stale";
+  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT)
+      << "answers an earlier request";
   agents.socketsOpen = false;
   EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork), SNMP_ERR_TRANSPORT);
   EXPECT_EQ(snmp_request_to_address(nullptr, "192.0.2.1"), SNMP_ERR_TRANSPORT);

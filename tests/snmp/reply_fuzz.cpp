@@ -1,5 +1,6 @@
 // Uses every input as an agent's reply to a query, a get and a set. Nothing may be written past the
-// callers' storage. The storage has no spare room, so the sanitizers report such a write.
+// storage that the caller provides. The storage has no spare room, so the sanitizers report such a
+// write.
 
 #include <array>
 #include <cstdio>

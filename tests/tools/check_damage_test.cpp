@@ -20,7 +20,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// A copy of the example medium, to which a test does one random damage at a time.
+/// A copy of the example medium, which a test damages at random, in one place at a time.
 class DamagedMedium {
  public:
   DamagedMedium() {
@@ -111,14 +111,14 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the page that `report` predicts. An unsupported system gets none, whatever the models
-// are.
+// Returns the page that `report` predicts. No page is shown on an unsupported system, whatever the
+// models are.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";
 }
 
-// For a longer run, set ONRAMP_DAMAGES to the number of damages.
+// For a longer run, set ONRAMP_DAMAGES to the number of times the medium is damaged.
 TEST(OnrampCheck, ReportsEveryDamageThatChangesTheStart) {
   const char* const wanted = std::getenv("ONRAMP_DAMAGES");
   const unsigned long count = wanted ? std::strtoul(wanted, nullptr, 10) : 100;

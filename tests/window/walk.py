@@ -5,7 +5,7 @@ Usage: walk.py [--seed N] [--count N] MEDIUM
 
 Walk number i, counted from 0, uses seed N + i, so that it can be repeated. A walk fails when the
 program exits with an error, when the main loop hangs, when the window cannot be closed at the end,
-or when a hand-off file is incomplete. A failed walk prints its seed and its steps.
+or when a file for the package is incomplete. A failed walk prints its seed and its steps.
 """
 
 import argparse

@@ -46,7 +46,7 @@ class WayTest(unittest.TestCase):
         return self.enterContext(Person(self.desktop, program, arguments, env))
 
     def files(self):
-        """Returns the contents of the hand-off files by their short names, such as "instmodel"."""
+        """Returns the contents of the files for the package by short names, such as "instmodel"."""
         found = {}
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
             for path in folder.rglob("com.kestrelimaging.*"):

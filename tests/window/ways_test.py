@@ -75,7 +75,7 @@ class Ways(WayTest):
         person.see("list", TEXT["INST_TXT_MODEL"])
         person.press("s", "c")
         wait_for(lambda: person.has_state(person.see("list item", "Kestrel Scan 2"), "selected"),
-                 20, "the model found by its second word")
+                 20, "a model to be selected by its second word")
         person.double_click("list item", "Kestrel Photo 1")
         person.see("heading", TEXT["INST_TXT_CONNECTIONTYPE"])
         person.see("panel", TEXT["INST_TXT_CONNECTIONTYPE"])

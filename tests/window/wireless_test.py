@@ -50,7 +50,7 @@ class WirelessWays(WayTest):
         person = self.start(self.models, **details)
         person.click("list item", self.model)
         wait_for(lambda: person.has_state(person.see("list item", self.model), "selected"),
-                 PATIENCE, "the choice")
+                 PATIENCE, f"{self.model!r} to be selected")
         person.click("push button", TEXT["BTN_NEXT"])
         person.click("radio button", TEXT["INST_TXT_WIFI"])
         person.click("push button", TEXT["BTN_NEXT"])
@@ -62,7 +62,8 @@ class WirelessWays(WayTest):
 
     def see_tool_run(self):
         called = self.medium / "tool"
-        arguments = wait_for(lambda: called.exists() and called.read_text(), PATIENCE, "the tool")
+        arguments = wait_for(lambda: called.exists() and called.read_text(), PATIENCE,
+                             "the tool to run")
         self.assertEqual(arguments, "-installer")
 
     def is_enabled(self, person, button):
@@ -122,7 +123,7 @@ class WirelessWays(WayTest):
                    TEXT["INST_TXT_ALERT_CONFIRM_DEVICENOTFOUND_WIFI"])
         self.assertFalse(person.sees("push button", TEXT["BTN_BACK"]))
         person.click("push button", TEXT["BTN_WEB"])
-        wait_for(self.desktop.opened, PATIENCE, "the support page")
+        wait_for(self.desktop.opened, PATIENCE, "the support page to open")
         self.assertEqual(self.desktop.opened(), [SUPPORT_PAGE])
         self.desktop.forget()
         person.see_gone("alert")

@@ -25,8 +25,8 @@ void checkTool(const MediumFiles& files, const Lists& lists);
 /// online service.
 void checkApplication(const MediumFiles& files, const Lists& lists);
 
-/// Checks what leaves the wizard for the network and for other programs: the service type, the
-/// vendor's name and the series code.
+/// Checks the values that the wizard passes to the network and to other programs: the service type,
+/// the vendor's name and the series code.
 void checkIdentity(const Lists& lists, Report& report);
 
 /// Checks the texts of every language.

@@ -2,6 +2,7 @@
 #include <string_view>
 
 #include "base/ascii.h"
+#include "base/text.h"
 #include "bonjour/identity_keys.h"
 #include "media/medium.h"
 #include "platform/lowercase.h"
@@ -66,11 +67,12 @@ void checkServiceType(const Lists& lists, Report& report) {
   Finding finding{.place = place,
                   .found = "the service type " + quoted(*type),
                   .effect = kNoDevice,
-                  .remedy = "write the type that the devices announce"};
+                  .remedy = "write the type that the devices announce, with its closing dot"};
   if (isServiceType(*type + ".")) {
     finding.id = "service-dot";
     finding.found += " without its closing dot";
-    finding.expected = quoted(*type + ".");
+    finding.nearest = *type + ".";
+    finding.remedy = "add the dot";
   } else if (!isServiceType(*type)) {
     finding.id = "service-malformed";
     finding.found += ", which is malformed";
@@ -84,7 +86,7 @@ void checkServiceType(const Lists& lists, Report& report) {
     checkDeclared(lists, *type, report);
     return;
   }
-  finding.nearest = known.nearest(*type).value_or("");
+  if (finding.nearest.empty()) finding.nearest = known.nearest(*type).value_or("");
   report.findings.push_back(std::move(finding));
 }
 
@@ -95,8 +97,8 @@ void checkVendor(const Lists& lists, Report& report) {
   const std::string name = medium::vendorName(lists.resources);
   const std::string file = "com." + lowercaseString(name) + ".installpkginfo.plist";
   Finding finding{.place = inResources(lists, medium::kVenderName),
-                  .effect = "the package does not find the files that the wizard hands over",
-                  .remedy = "write the maker's name in letters, digits and blanks"};
+                  .effect = "the package does not find the files that the wizard writes for it",
+                  .remedy = "write the maker's name in letters, digits and spaces"};
   const auto isControl = [](char c) { return static_cast<unsigned char>(c) < 0x20 || c == 0x7F; };
   const auto isForeign = [](char c) { return static_cast<unsigned char>(c) >= 0x80; };
   if (name.empty()) {
@@ -110,30 +112,29 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.expected = "a name without \"/\" that is not \".\" or \"..\"";
   } else if (file.size() > kLongestFileName) {
     finding.id = "vendor-long";
-    finding.found = "a name of " + std::to_string(name.size()) + " bytes without its blanks";
+    finding.found = "a name of " + std::to_string(name.size()) + " bytes without its spaces";
     finding.expected =
         "at most " + std::to_string(kLongestFileName - (file.size() - name.size())) + " bytes";
   } else if (std::any_of(name.begin(), name.end(), isForeign)) {
     finding.id = "vendor-letters";
     finding.severity = Severity::kWarning;
-    finding.found = quoted(*written) + ", with letters outside ASCII";
-    finding.expected = "letters from A to Z, digits, blanks";
-    finding.effect = "a folder and files with names that not every program spells in the same way";
+    finding.found = quoted(*written) + ", with characters outside ASCII";
+    finding.expected = "letters from A to Z, digits, spaces";
+    finding.effect = "a folder and files whose names not every program encodes in the same way";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }
 
 void checkSeries(const Lists& lists, Report& report) {
   const std::string series = lists.description->string("KSCSeriesCode").value_or("");
-  const bool plain = std::all_of(series.begin(), series.end(), [](char c) {
-    return isASCIILetterOrDigit(c) || std::string_view("-._~").find(c) != std::string_view::npos;
-  });
-  if (plain) return;
+  const bool opens = isURLText(series);
+  if (opens && series.find_first_of("/?#") == std::string::npos) return;
   report.findings.push_back({.id = "series-address",
                              .place = {.file = lists.descriptionPath, .key = {"KSCSeriesCode"}},
                              .found = "the series code " + quoted(series),
-                             .expected = "letters, digits, \"-\", \".\", \"_\" and \"~\"",
-                             .effect = "the support page's button opens nothing, or the wrong page",
+                             .expected = "letters and digits",
+                             .effect = opens ? "the button for the support page opens another page"
+                                             : "the button for the support page opens nothing",
                              .remedy = "write the code as the support site does"});
 }
 

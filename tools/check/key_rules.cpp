@@ -4,6 +4,7 @@
 #include <set>
 #include <variant>
 
+#include "base/ascii.h"
 #include "tools/check/spelling.h"
 
 namespace onramp::check {
@@ -63,6 +64,16 @@ const char* expectationOf(Kind kind) {
   return "any value";
 }
 
+// Returns how to mend a value of another kind than `kind`.
+std::string remedyFor(Kind kind, const Value& value) {
+  if (kind != Kind::kBoolean) return std::string("write ") + expectationOf(kind);
+  const auto* const text = value.as<std::string>();
+  const std::string word = text ? asciiLowercased(*text) : "";
+  if (word == "yes" || word == "true" || word == "1") return "write <true/>";
+  if (word == "no" || word == "false" || word == "0") return "write <false/>";
+  return "write <true/> or <false/>";
+}
+
 class KeyCheck {
  public:
   KeyCheck(const Dictionary& dictionary, const DictionaryPlace& place,
@@ -86,7 +97,7 @@ class KeyCheck {
                                     .severity = Severity::kWarning,
                                     .place = place_.of(key),
                                     .found = "a key that the wizard does not read",
-                                    .effect = "nothing: the key is ignored",
+                                    .effect = "none: the key is ignored",
                                     .remedy = "remove it"});
       }
     }
@@ -101,9 +112,9 @@ class KeyCheck {
            .severity = rule.need == Need::kRequired ? Severity::kError : Severity::kWarning,
            .place = {.file = place_.file, .key = place_.path},
            .found = "no " + quoted(std::string(rule.key)),
-           .expected = expectationOf(rule.kind),
+           .expected = std::string(expectationOf(rule.kind)) + rule.meaning,
            .effect = rule.otherwise,
-           .remedy = "add it"});
+           .remedy = "add " + quoted(std::string(rule.key))});
     }
   }
 
@@ -116,7 +127,7 @@ class KeyCheck {
                                   .found = described(*value),
                                   .expected = expectationOf(rule.kind),
                                   .effect = rule.otherwise,
-                                  .remedy = "write a value of the expected type"});
+                                  .remedy = remedyFor(rule.kind, *value)});
     }
   }
 
@@ -128,10 +139,9 @@ class KeyCheck {
     report_.findings.push_back({.id = "key-misspelt",
                                 .place = place_.of(key),
                                 .found = "an unknown key",
-                                .expected = quoted(meant),
                                 .nearest = meant,
                                 .effect = rule->otherwise,
-                                .remedy = "rename the key"});
+                                .remedy = "rename the key to " + quoted(meant)});
   }
 
   const Dictionary& dictionary_;

@@ -18,7 +18,8 @@ struct KeyRule {
   std::string_view key;
   Kind kind;
   Need need;
-  const char* otherwise;  ///< what users see when the key is absent or its value of another kind
+  const char* otherwise;  ///< what users see when the key is absent or its value is of another kind
+  const char* meaning = "";  ///< of the value, where its kind alone does not explain it
 };
 
 /// The location of a dictionary: its file and the path of keys that leads to it.

@@ -31,12 +31,14 @@ constexpr std::array kResourceRules{
     KeyRule{medium::kCDInfo, Kind::kPath, Need::kRequired, kNoModels},
     KeyRule{medium::kModelInfo, Kind::kPath, Need::kRequired, kPackageAtOnce},
     KeyRule{medium::kPkgInfo, Kind::kDictionary, Need::kRequired, kNoPackage},
-    KeyRule{medium::kSystemMin, Kind::kDictionary, Need::kOptional, "no system is too old"},
-    KeyRule{medium::kSystemMax, Kind::kDictionary, Need::kOptional, "no system is too new"},
+    KeyRule{medium::kSystemMin, Kind::kDictionary, Need::kOptional,
+            "every older system is accepted"},
+    KeyRule{medium::kSystemMax, Kind::kDictionary, Need::kOptional,
+            "every newer system is accepted"},
     KeyRule{medium::kVenderName, Kind::kText, Need::kRequired,
             "the package does not find the wizard's files: their names lack the maker's name"},
     KeyRule{medium::kWLANtool, Kind::kPath, Need::kOptional,
-            "no set-up tool runs when no wireless device is found"},
+            "no set-up tool runs after a search that finds no wireless device"},
 };
 
 constexpr std::array kPackageRules{
@@ -51,17 +53,17 @@ constexpr std::array kPackageRules{
 };
 
 constexpr std::array kMinimumRules{
-    KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "no system is too old"},
-    KeyRule{"Minor", Kind::kNumberOrText, Need::kAdvised, "it counts as 0"},
-    KeyRule{"BugFix", Kind::kNumberOrText, Need::kAdvised, "it counts as 0"},
+    KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "every older system is accepted"},
+    KeyRule{"Minor", Kind::kNumberOrText, Need::kAdvised, "the value counts as 0"},
+    KeyRule{"BugFix", Kind::kNumberOrText, Need::kAdvised, "the value counts as 0"},
 };
 
 constexpr std::array kMaximumRules{
-    KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "no system is too new"},
+    KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "every newer system is accepted"},
     KeyRule{"Minor", Kind::kNumberOrText, Need::kRequired,
-            "it counts as 0: every later minor version is refused"},
+            "the value counts as 0: every later minor version is refused"},
     KeyRule{"BugFix", Kind::kNumberOrText, Need::kRequired,
-            "it counts as 0: all of that minor version is refused"},
+            "the value counts as 0: all of that minor version is refused"},
 };
 
 constexpr std::array kDescriptionRules{
@@ -74,17 +76,17 @@ constexpr std::array kDescriptionRules{
 };
 
 constexpr std::array kTypeRules{
-    KeyRule{"Printer", Kind::kBoolean, Need::kOptional, "it counts as true"},
-    KeyRule{"TWAIN", Kind::kBoolean, Need::kOptional, "it counts as true"},
+    KeyRule{"Printer", Kind::kBoolean, Need::kOptional, "the value counts as true"},
+    KeyRule{"TWAIN", Kind::kBoolean, Need::kOptional, "the value counts as true"},
 };
 
 constexpr std::array kOptionRules{
-    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets the value as it is"},
-    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "it counts as true"},
+    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets the value unchanged"},
+    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "the value counts as true"},
     KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value as it is"},
+            "the package gets the value unchanged"},
     KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value as it is"},
+            "the package gets the value unchanged"},
     KeyRule{"PKG_FontSet", Kind::kAny, Need::kOptional, "the fonts are not installed"},
 };
 
@@ -94,7 +96,8 @@ constexpr std::array kModelInformationRules{
 
 constexpr std::array kModelRules{
     KeyRule{"KSCID", Kind::kText, Need::kRequired,
-            "the model offers no connection at all: the package opens as soon as it is chosen"},
+            "the model offers no connection at all: the package opens as soon as it is chosen",
+            ": the model's identifier at the support centre"},
     KeyRule{"Interfaces", Kind::kDictionary, Need::kAdvised, "the model has USB only"},
 };
 
@@ -154,12 +157,13 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
     const DictionaryPlace place{path, {"Model", name}};
     const auto* const entry = value.as<Dictionary>();
     if (!entry) {
-      report.findings.push_back({.id = "value-kind",
-                                 .place = {.file = path, .key = place.path},
-                                 .found = described(value),
-                                 .expected = "a dictionary",
-                                 .effect = "the model has USB only",
-                                 .remedy = "write a value of the expected type"});
+      report.findings.push_back(
+          {.id = "value-kind",
+           .place = {.file = path, .key = place.path},
+           .found = described(value),
+           .expected = "a dictionary",
+           .effect = "the model has USB only",
+           .remedy = "write the model's dictionary, as other models have it"});
       continue;
     }
     checkKeys(*entry, place, kModelRules, OtherKeys::kReported, report);

@@ -1,6 +1,7 @@
 // onramp-check: reads a finished medium as the wizard does and reports what is wrong with it.
 
 #include <CLI/CLI.hpp>
+#include <clocale>
 #include <cstdlib>
 #include <exception>
 #include <filesystem>
@@ -8,6 +9,7 @@
 #include <string>
 #include <system_error>
 
+#include "platform/terminal.h"
 #include "tools/check/check.h"
 #include "tools/check/output.h"
 
@@ -34,7 +36,8 @@ int finish(int status) {
 }
 
 int run(int count, char* arguments[]) {
-  CLI::App app("Checks a finished medium: what its users will see, and what is wrong with it.");
+  CLI::App app(
+      "Checks a finished medium: reports what is wrong with it and what its users will see.");
   app.name("onramp-check");
   app.footer(kFooter);
   app.set_version_flag("-V,--version", "onramp-check " ONRAMP_VERSION);
@@ -42,11 +45,10 @@ int run(int count, char* arguments[]) {
   bool json = false;
   bool strict = false;
   bool texts = false;
-  app.add_option("MEDIUM", medium, "The folder that the application lies in");
+  app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with status 1 for warnings, too");
-  app.add_flag("--texts", texts,
-               "Print the keys of the texts that the wizard shows, and the room for each");
+  app.add_flag("--texts", texts, "Print the keys of the texts that a medium needs");
   try {
     app.parse(count, arguments);
   } catch (const CLI::ParseError& error) {
@@ -60,7 +62,7 @@ int run(int count, char* arguments[]) {
   if (!std::filesystem::is_directory(medium, ignored)) {
     std::cerr << "onramp-check: "
               << (medium.empty() ? "MEDIUM is missing" : check::quoted(medium) + " is not a folder")
-              << "; give the folder that holds the application\n";
+              << "; give the folder that contains the application\n";
     return kUnreadable;
   }
   if (std::filesystem::directory_iterator(medium, ignored); ignored) {
@@ -72,7 +74,7 @@ int run(int count, char* arguments[]) {
   if (json) {
     check::writeJSON(std::cout, report);
   } else {
-    check::writeText(std::cout, report);
+    check::writeText(std::cout, report, isOutputTerminal() ? terminalWidth() : 0);
   }
   const bool clean = report.count(check::Severity::kError) == 0 &&
                      !(strict && report.count(check::Severity::kWarning) != 0);
@@ -82,6 +84,7 @@ int run(int count, char* arguments[]) {
 }  // namespace
 
 int main(int count, char* arguments[]) {
+  std::setlocale(LC_CTYPE, "");  // for the width of characters
   try {
     return run(count, arguments);
   } catch (const std::exception& error) {

@@ -64,6 +64,15 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
+// `nearest` is the name on the medium that resembles the missing one. `isWritten` tells whether the
+// medium can name another file; the wizard itself decides the other names.
+std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
+                             bool isWritten) {
+  if (!nearest) return isWritten ? "put it there, or correct the path" : "put it there";
+  const std::string rename = "rename the file to " + quoted(missing);
+  return isWritten ? "write " + quoted(*nearest) + ", or " + rename : rename;
+}
+
 // Adds to `finding` why the wizard cannot read the bytes of a file, and the place.
 void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   ParseProblem problem;
@@ -120,13 +129,14 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
       const auto nearest = Spelling(there).nearest(part);
       const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
       finding.id = capitals ? "path-capitals" : "path-missing";
-      finding.found = use.what + " at " + quoted(relative) +
-                      (capitals ? ", which differs from the name on the medium in capitals only"
-                                : ", which does not exist");
+      finding.found =
+          use.what + " at " + quoted(relative) +
+          (capitals ? ", which differs from the name on the medium only in capital letters"
+                    : ", which does not exist");
       finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
                                         : quoted(part) + " in " + quoted(folder);
       if (nearest) finding.nearest = *nearest;
-      finding.remedy = nearest ? "use one spelling for both" : "put it there, or correct the path";
+      finding.remedy = remedyForMissing(part, nearest, !use.place.key.empty());
       report_.findings.push_back(std::move(finding));
       return false;
     }
@@ -149,7 +159,7 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
              !ignored && size > kMostPropertyListBytes) {
     finding.found = std::to_string(size) + " bytes";
     finding.expected = "at most " + std::to_string(kMostPropertyListBytes) + " bytes";
-    finding.remedy = "spread the models over several media";
+    finding.remedy = "divide the models among several media";
   } else if (const auto bytes = posix::readFile(path, kMostPropertyListBytes); !bytes) {
     finding.found = "a file that cannot be read";
     finding.remedy = "let everyone read it (chmod a+r)";
@@ -158,12 +168,14 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
   } else {
     explain(*bytes, isStrings, finding);
   }
-  if (finding.expected.empty()) {
-    finding.expected = isStrings ? "a strings table" : "a property list, XML or binary";
+  const bool isSyntax = isStrings && finding.place.line;
+  if (finding.expected.empty() && !isSyntax) {
+    finding.expected =
+        isStrings ? "lines of the form \"key\" = \"text\";" : "a property list, XML or binary";
   }
   if (finding.remedy.empty()) {
-    finding.remedy =
-        finding.place.line ? "correct that line or the one before it" : "write the file again";
+    finding.remedy = finding.place.line ? "correct that line or the one before it"
+                                        : "put an undamaged copy of the file there";
   }
   report_.findings.push_back(std::move(finding));
 }

@@ -8,6 +8,7 @@
 #include "base/text.h"
 #include "media/KSOROSXModel.h"
 #include "media/connection_type.h"
+#include "media/medium.h"
 #include "tools/check/checks.h"
 #include "tools/check/key_rules.h"
 #include "tools/check/spelling.h"
@@ -50,13 +51,14 @@ class ModelCheck {
     std::set<std::string> paired;
     Spelling unmatched(onlyKnown);
     Spelling all(known);
+    Spelling allOffered(offered);
     for (const std::string& name : onlyInFirst(offered, known)) {
       const auto pair = unmatched.nearest(name);
       if (pair) paired.insert(*pair);
-      undescribed(name, pair ? pair : all.nearest(name));
+      undescribed(name, pair, all.nearest(name));
     }
     for (const std::string& name : onlyKnown) {
-      if (!paired.contains(name)) unoffered(name);
+      if (!paired.contains(name)) unoffered(name, allOffered.nearest(name));
     }
   }
 
@@ -75,13 +77,15 @@ class ModelCheck {
     std::map<std::string, std::string> spellings;
     for (const auto& [name, unused] : *contained) {
       announceable(name);
+      spelledLikeTheVendor(name);
       const auto [other, isNew] = spellings.try_emplace(asciiLowercased(name), name);
       if (isNew) continue;
       add(name, {.id = "model-twice",
                  .severity = Severity::kWarning,
-                 .found = "a name that differs from " + quoted(other->second) + " in capitals only",
+                 .found = "a name that differs from " + quoted(other->second) +
+                          " only in capital letters",
                  .expected = "each model once, spelled as its devices announce it",
-                 .effect = "both names in the list; only one of them finds its devices",
+                 .effect = "two entries in the list, only one of which finds its devices",
                  .remedy = "remove the wrong one"});
     }
   }
@@ -93,31 +97,38 @@ class ModelCheck {
     report_.findings.push_back(std::move(finding));
   }
 
-  void undescribed(const std::string& name, const std::optional<std::string>& nearest) {
-    add(name, {.id = "model-undescribed",
-               .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
-               .expected = "the same name under \"Model\" there",
-               .nearest = nearest.value_or(""),
-               .effect = "the model has USB only: the package opens as soon as it is chosen",
-               .remedy = nearest ? "use one spelling for both" : "describe the model there"});
+  static std::string sameName(std::string_view key, const std::optional<std::string>& nearest) {
+    return "the same name under " + quoted(std::string(key)) + " there" +
+           (nearest ? ", where the nearest is " + quoted(*nearest) : "");
   }
 
-  void unoffered(const std::string& name) {
+  // `meant` is the almost equal name that only the other list has.
+  void undescribed(const std::string& name, const std::optional<std::string>& meant,
+                   const std::optional<std::string>& nearest) {
+    add(name, {.id = "model-undescribed",
+               .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
+               .expected = sameName("Model", meant ? std::nullopt : nearest),
+               .nearest = meant.value_or(""),
+               .effect = "the model has USB only: the package opens as soon as it is chosen",
+               .remedy = meant ? "use one spelling in both lists" : "describe the model there"});
+  }
+
+  void unoffered(const std::string& name, const std::optional<std::string>& nearest) {
     report_.findings.push_back(
         {.id = "model-unoffered",
          .place = {.file = lists_.modelsPath, .key = {"Model", name}},
          .found = "a model that " + quoted(lists_.descriptionPath) + " does not have",
-         .expected = "the same name under \"ContainedModel\" there",
+         .expected = sameName(kContained, nearest),
          .effect = "the model cannot be chosen",
-         .remedy = "add it there, or remove it here"});
+         .remedy = "add it there, or remove it from this file"});
   }
 
   // Reports a model's name that no device can announce. Devices announce maker and model as two
-  // texts, which the wizard joins with a blank. Each text has at most 255 bytes, its key
+  // texts, which the wizard joins with a space. Each text has at most 255 bytes, its key
   // ("usb_MFG=") included.
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
-    const std::size_t blank = name.find(' ');
+    const std::size_t space = name.find(' ');
     const auto impossible = [&](std::string found, std::string expected, std::string remedy) {
       add(name, {.id = "model-unannounceable",
                  .found = std::move(found),
@@ -127,8 +138,8 @@ class ModelCheck {
     };
     const bool control = std::any_of(name.begin(), name.end(),
                                      [](char c) { return static_cast<unsigned char>(c) < 0x20; });
-    if (blank == std::string::npos) {
-      impossible("a name without a blank", "the USB manufacturer, a blank, the USB model",
+    if (space == std::string::npos) {
+      impossible("a name without a space", "the USB manufacturer, a space, the USB model",
                  "write both as the devices announce them");
     } else if (name.size() > kMostBytes) {
       impossible(
@@ -142,15 +153,32 @@ class ModelCheck {
       const bool edge = name.front() == ' ' || name.back() == ' ';
       add(name, {.id = "model-blanks",
                  .severity = Severity::kWarning,
-                 .found = edge ? "a blank at the edge of the name" : "two blanks in a row",
+                 .found = edge ? "a space at an end of the name" : "two spaces in a row",
                  .expected = "the name exactly as the devices announce it",
-                 .effect = "only devices that announce these blanks are found; some really do",
-                 .remedy = "remove the blanks unless the devices announce them"});
+                 .effect = "only devices that announce these spaces are found; some devices do",
+                 .remedy = "remove the spaces unless the devices announce them"});
     }
+  }
+
+  // Reports each spelling of the maker that differs only in capitals from the vendor's name.
+  void spelledLikeTheVendor(const std::string& name) {
+    const auto vendor = lists_.resources->string(medium::kVenderName);
+    const std::string maker = name.substr(0, name.find(' '));
+    const std::string spelling = vendor ? vendor->substr(0, vendor->find(' ')) : maker;
+    if (maker == spelling || asciiLowercased(maker) != asciiLowercased(spelling)) return;
+    if (!makers_.insert(maker).second) return;
+    add(name, {.id = "maker-capitals",
+               .severity = Severity::kWarning,
+               .found = "the maker " + quoted(maker) + ", whose name is " + quoted(spelling) +
+                        " in \"VenderName\"",
+               .expected = "the maker as the devices announce it (usb_MFG), capitals included",
+               .effect = "devices of " + quoted(spelling) + " are not found on the network",
+               .remedy = "use the devices' spelling for all models"});
   }
 
   const Lists& lists_;
   Report& report_;
+  std::set<std::string> makers_;  ///< the spellings that are reported already
 };
 
 }  // namespace

@@ -1,13 +1,16 @@
 #pragma once
 
+#include <cstddef>
 #include <ostream>
 
 #include "tools/check/report.h"
 
 namespace onramp::check {
 
-/// Writes a line for every finding, then a description of what users will see, then a summary.
-void writeText(std::ostream& out, const Report& report);
+/// Writes a line for every finding, then a description of what users will see, then a summary. On a
+/// terminal of `width` columns, the findings are wrapped and have coloured marks. A width of 0
+/// means that the output is not a terminal.
+void writeText(std::ostream& out, const Report& report, std::size_t width);
 
 /// Writes the report as JSON, in the form that onramp-check(1) describes. Bytes that are not UTF-8
 /// become replacement characters.

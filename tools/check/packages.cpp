@@ -18,8 +18,8 @@ namespace {
 
 using Version = std::array<std::int64_t, 3>;
 
-// Returns every version that may get another package than the version before it, and the first
-// version.
+// Returns the first version, and every version that may get a different package from the version
+// before it.
 std::set<Version> differentSystems() {
   constexpr std::int64_t kLastMinor = 16;
   std::set<Version> systems{{11, 0, 0}};
@@ -133,7 +133,7 @@ class PackageCheck {
            .expected = which == medium::kSystemMax && key == std::string_view("BugFix")
                            ? "a number, or \"x\" for all of that minor version"
                            : "a number",
-           .effect = "it counts as " + std::to_string(leadingInteger(*text)),
+           .effect = "the value counts as " + std::to_string(leadingInteger(*text)),
            .remedy = "write a number"});
     }
   }
@@ -144,7 +144,7 @@ class PackageCheck {
     report_.findings.push_back({.id = "range-empty",
                                 .place = placeOf(medium::kSystemMax),
                                 .found = "a range that contains no system: " + report_.systems,
-                                .expected = "a newest system that is newer than the oldest",
+                                .expected = "a newest system later than the oldest",
                                 .effect = "every system is refused",
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }
@@ -164,11 +164,11 @@ class PackageCheck {
         {.id = "range-excludes-maximum",
          .severity = Severity::kWarning,
          .place = placeOf(medium::kSystemMax, "BugFix"),
-         .found = "a range of " + report_.systems,
+         .found = "the supported systems: " + report_.systems,
          .expected = "\"x\" for \"BugFix\" to accept all of " + std::to_string(named[0]) + "." +
                      std::to_string(named[1]) + ", or the first release that is refused",
          .effect = name + " itself is refused as too new",
-         .remedy = "leave it only if " + name + " is meant to be refused"});
+         .remedy = "keep this only if " + name + " is meant to be refused"});
   }
 
   void checkApplicationsOwnMinimum() {
@@ -180,12 +180,13 @@ class PackageCheck {
         systemVersion({own->substr(0, point), own->substr(std::min(point + 1, own->size()))});
     const Dictionary& maximum = info_.supportSystemMax();
     if (!isBound(maximum) || !isNewerThan(maximum, oldest)) return;
-    report_.findings.push_back({.id = "range-before-application",
-                                .place = {.file = lists_.informationPath, .key = {kKey}},
-                                .found = "an application for " + *own + " and later",
-                                .expected = "one that starts on " + report_.systems,
-                                .effect = "no system both starts the wizard and is supported",
-                                .remedy = "widen the range with \"SystemMax\""});
+    report_.findings.push_back(
+        {.id = "range-before-application",
+         .place = {.file = lists_.informationPath, .key = {kKey}},
+         .found = "an application for " + *own + " and later",
+         .expected = "an application that starts on the supported systems: " + report_.systems,
+         .effect = "the wizard starts on none of the systems that the medium supports",
+         .remedy = "widen the range with \"SystemMax\""});
   }
 
   // Returns the package for one version by the wizard's own rule, as a path from the medium's top
@@ -230,7 +231,7 @@ class PackageCheck {
     const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
     const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
-        "on " + words(row.from, row.to) + " the window closes and nothing opens";
+        "on " + words(row.from, row.to) + ", the window closes and nothing opens";
     if (!row.package.empty()) {
       const PathUse use{placeOf(medium::kPkgInfo, key), "the package", effect};
       if (checked_.insert(row.package).second) static_cast<void>(files_.exists(row.package, use));
@@ -271,12 +272,13 @@ class PackageCheck {
   }
 
   void neverUsed(const std::string& key) {
-    report_.findings.push_back({.id = "package-key-unknown",
-                                .place = placeOf(medium::kPkgInfo, key),
-                                .found = "a key that no system uses",
-                                .expected = "\"104\" to \"109\"",
-                                .effect = "10.9 and every later system gets what \"109\" names",
-                                .remedy = "move the name to \"109\", or remove the key"});
+    report_.findings.push_back(
+        {.id = "package-key-unknown",
+         .place = placeOf(medium::kPkgInfo, key),
+         .found = "a key that no system uses",
+         .expected = "\"104\" to \"109\"",
+         .effect = "10.9 and every later system get the package that \"109\" names",
+         .remedy = "move the name to \"109\", or remove the key"});
   }
 
   void unsupported(const std::string& key) {

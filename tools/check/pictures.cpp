@@ -85,7 +85,7 @@ void checkPicture(const MediumFiles& files, const std::string& folder, const Pic
     finding.found = "a picture of " + std::to_string(decoded.width) + " × " +
                     std::to_string(decoded.height) + " pixels";
     finding.expected = size;
-    finding.effect = "a picture that is scaled, and looks blurred or distorted";
+    finding.effect = "a picture that is scaled, so it looks blurred or distorted";
     finding.remedy = "save it at that size";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));

@@ -10,9 +10,9 @@
 namespace onramp::check {
 
 /// Finds the known word that a misspelt word was probably meant to be. A hash table finds a word
-/// that differs only in capitals, blanks and punctuation. Any other word is compared with every
-/// known word. The work for all these comparisons together is limited, because it grows with the
-/// product of the two lists' lengths.
+/// that differs only in capital letters, spaces and punctuation. Any other word is compared with
+/// every known word. The work for all these comparisons together is limited, because it grows with
+/// the product of the two lists' lengths.
 class Spelling {
  public:
   explicit Spelling(const std::vector<std::string>& known);

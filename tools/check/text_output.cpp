@@ -6,10 +6,16 @@
 #include "base/text.h"
 #include "tools/check/output.h"
 #include "tools/check/shown_texts.h"
+#include "tools/terminal_text.h"
 
 namespace onramp::check {
 
 namespace {
+
+constexpr std::string_view kRed = "\033[31m";
+constexpr std::string_view kYellow = "\033[33m";
+constexpr std::string_view kPlain = "\033[0m";
+constexpr std::size_t kConnectionColumns = 24;  // beside a model's name
 
 // Returns `text` with control characters replaced, so that it stays on one line and cannot control
 // the terminal.
@@ -39,25 +45,41 @@ std::string sentences(const Finding& finding) {
   if (!finding.expected.empty()) text += "; expected: " + finding.expected;
   if (!finding.nearest.empty()) text += "; did you mean " + quoted(finding.nearest) + "?";
   if (finding.nearest.empty()) text += ".";
-  if (!finding.effect.empty()) text += " Users get: " + finding.effect + ".";
+  if (!finding.effect.empty()) text += " Effect: " + finding.effect + ".";
   if (!finding.remedy.empty()) text += " Remedy: " + finding.remedy + ".";
   return text;
 }
 
-void writeModels(std::ostream& out, const Report& report) {
+void writeFinding(std::ostream& out, const Finding& finding, std::size_t width) {
+  const bool isError = finding.severity == Severity::kError;
+  const std::string mark = isError ? "error:" : "warning:";
+  const std::string text = printable(sentences(finding)) + " [" + finding.id + "]";
+  out << printable(placeOf(finding.place));
+  if (width == 0) {
+    out << mark << ' ' << text << '\n';
+  } else {
+    out << (isError ? kRed : kYellow) << mark << kPlain << '\n' << wrapped(text, width, 2);
+  }
+}
+
+void writeModels(std::ostream& out, const Report& report, std::size_t terminal) {
   if (report.models.empty()) return;
   std::size_t width = 0;
   for (const ModelRow& model : report.models)
-    width = std::max(width, model.name.size());
+    width = std::max(width, columnsOf(printable(model.name)));
+  if (terminal > kConnectionColumns) width = std::min(width, terminal - kConnectionColumns);
   const auto cell = [](bool has, const char* word) {
     return has ? std::string(word) : std::string(std::string_view(word).size(), '-');
   };
   out << "\nModels (their devices have to announce exactly these names):\n";
   for (const ModelRow& model : report.models) {
-    const std::string blanks(width - model.name.size(), ' ');
-    out << "  " << printable(model.name) << blanks << "  " << cell(model.usb, "USB") << "  "
+    out << "  " << fitted(printable(model.name), width) << "  " << cell(model.usb, "USB") << "  "
         << cell(model.wired, "wired") << "  " << cell(model.wireless, "wireless") << '\n';
   }
+}
+
+std::string counted(std::size_t count, const char* word) {
+  return std::to_string(count) + ' ' + word + (count == 1 ? "" : "s");
 }
 
 const char* startInWords(FirstPage page) {
@@ -65,22 +87,19 @@ const char* startInWords(FirstPage page) {
     case FirstPage::kNone:
       return "no page: the package opens at once, because no model supports wireless";
     case FirstPage::kConnectionType:
-      return "the connection type: all models have the same connections by cable";
+      return "the connection page: all models have the same connections by cable";
     case FirstPage::kModelList:
       break;
   }
-  return "the list of models";
+  return "the model list";
 }
 
 }  // namespace
 
-void writeText(std::ostream& out, const Report& report) {
-  for (const Finding& finding : report.findings) {
-    out << printable(placeOf(finding.place))
-        << (finding.severity == Severity::kError ? "error: " : "warning: ")
-        << printable(sentences(finding)) << " [" << finding.id << "]\n";
-  }
-  writeModels(out, report);
+void writeText(std::ostream& out, const Report& report, std::size_t width) {
+  for (const Finding& finding : report.findings)
+    writeFinding(out, finding, width);
+  writeModels(out, report, width);
   out << "\nStarts with: " << startInWords(report.start)
       << "\nSystems: " << (report.systems.empty() ? "unknown" : report.systems) << '\n';
   for (const PackageRow& row : report.packages) {
@@ -92,8 +111,9 @@ void writeText(std::ostream& out, const Report& report) {
     out << ' ' << printable(language.name) << " (" << language.texts << " texts)";
   out << (report.languages.empty() ? " none\n" : "\n");
   out << '\n'
-      << report.medium << ": " << report.count(Severity::kError) << " errors, "
-      << report.count(Severity::kWarning) << " warnings, " << report.models.size() << " models\n";
+      << report.medium << ": " << counted(report.count(Severity::kError), "error") << ", "
+      << counted(report.count(Severity::kWarning), "warning") << ", "
+      << counted(report.models.size(), "model") << '\n';
 }
 
 void writeTexts(std::ostream& out) {

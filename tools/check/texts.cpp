@@ -131,16 +131,15 @@ class TextCheck {
                     .severity = Severity::kWarning,
                     .place = {.file = tablePath(language), .key = {key}},
                     .found = "a text that the wizard does not show",
-                    .effect = "nothing",
+                    .effect = "none: the text is ignored",
                     .remedy = "remove it"};
     if (nearest && meant.insert(*nearest).second) {
       finding.id = "text-misspelt";
       finding.severity = Severity::kError;
       finding.found = "an unknown key";
-      finding.expected = quoted(*nearest);
       finding.nearest = *nearest;
       finding.effect = effectOf(language, *nearest);
-      finding.remedy = "rename the key";
+      finding.remedy = "rename the key to " + quoted(*nearest);
     }
     report_.findings.push_back(std::move(finding));
   }
@@ -156,7 +155,7 @@ class TextCheck {
          .found = "no " + quoted(key),
          .expected = others.empty() ? "a text" : "a text, as in " + joined(others),
          .effect = effectOf(language, key),
-         .remedy = "add it"});
+         .remedy = "add the line " + quoted(key) + " = \"…\";"});
   }
 
   void checkText(const std::string& language, const ShownText& shown, const std::string& text) {
@@ -176,7 +175,7 @@ class TextCheck {
       finding.expected = filled ? "once or twice" : "none";
       finding.effect = filled && count == 0 ? "an alert that does not say which version is needed"
                                             : "a literal \"%@\" (" + std::string(shown.where) + ")";
-      finding.remedy = filled ? "leave it where the version belongs" : "remove it";
+      finding.remedy = filled ? "write it only where a version belongs" : "remove it";
     } else if (shown.where == "sheet when no device is found" &&
                text.find('%') != std::string::npos) {
       finding.id = "text-percent";
@@ -208,19 +207,22 @@ class TextCheck {
   void checkDevelopmentRegion() {
     constexpr const char* kKey = "CFBundleDevelopmentRegion";
     const std::string path = kBundle + "/Contents/Info.plist";
-    const auto information = files_.list(
-        path, {{.file = path},
-               "the message bundle's Info.plist",
-               "the language that users of all other languages see is left to the system"});
+    const std::string effect = serves(languages_, "en")
+                                   ? "users without texts in their language see one that "
+                                     "their system picks, usually English"
+                                   : "users without texts in their language may see keys such as "
+                                     "\"INST_TXT_MODEL\" instead of texts";
+    const auto information =
+        files_.list(path, {{.file = path}, "the message bundle's Info.plist", effect});
     if (!information) return;
     const auto region = information->string(kKey);
-    Finding finding{
-        .id = "region-missing",
-        .place = {.file = path},
-        .found = "no \"CFBundleDevelopmentRegion\"",
-        .expected = "the language for users of all other languages, such as \"en\"",
-        .effect = "the language that users of all other languages see is left to the system",
-        .remedy = "add it"};
+    Finding finding{.id = "region-missing",
+                    .place = {.file = path},
+                    .found = "no \"CFBundleDevelopmentRegion\"",
+                    .expected = "the language for users without texts in their own, such as \"en\"",
+                    .effect = effect,
+                    .remedy = "add \"CFBundleDevelopmentRegion\" with one of the languages " +
+                              joined(languages_)};
     if (region) {
       if (serves(languages_, *region)) return;
       finding.id = "region-without-texts";
@@ -251,8 +253,8 @@ class TextCheck {
            .found = "no " + quoted(language + std::string(kLanguageFolder)),
            .expected = "the languages of the message bundle; the application has " + joined(own),
            .effect = "users of " + quoted(language) +
-                     " read in English why the network is used, and hear the gear button's name in "
-                     "English",
+                     " read and hear some of the application's texts in English: why it uses the "
+                     "network, and the name of the gear button",
            .remedy = "have the application built with texts in that language"});
     }
   }

@@ -79,7 +79,7 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
          .found = "the name " + quoted(*translated) + ", without " + quoted(maker),
          .expected = "a translation of " + quoted(name),
          .effect = "on macOS, users of that language see that name",
-         .remedy = "translate the tool's present name"});
+         .remedy = "translate the tool's current name"});
   }
 }
 
@@ -127,7 +127,7 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
                                      .place = {.file = list},
                                      .found = "no \"CFBundleDisplayName\"",
                                      .expected = "the tool's name, a string",
-                                     .effect = "an entry without a name in the chooser's menu",
+                                     .effect = "an entry without a name in the device list's menu",
                                      .remedy = "add it"});
 }
 

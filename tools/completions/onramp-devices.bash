@@ -12,6 +12,11 @@ _onramp_devices() {
     uri) options="--seconds --help" ;;
     hosts) options="--no-search --json --help" ;;
   esac
+  if [[ $word == "=" ]]; then  # bash makes "=" a word of its own
+    word=
+  elif [[ $before == "=" ]]; then
+    before=${COMP_WORDS[COMP_CWORD-2]}
+  fi
   if [[ $before == --medium || $before == -m ]]; then
     mapfile -t COMPREPLY < <(compgen -d -- "$word")
     compopt -o filenames

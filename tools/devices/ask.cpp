@@ -30,15 +30,16 @@ std::string questionText(const std::string& address) {
   for (const std::uint16_t arc : kActiveIFObject)
     object += (object.empty() ? "" : ".") + std::to_string(arc);
   return address + ", UDP port " + std::to_string(kSnmpPort) + ", community " +
-         inQuotes(kCommunity) + ", object " + object + '\n';
+         inQuotes(kCommunity) + "\nobject " + object + '\n';
 }
 
 std::string conclusionOf(const Answer& answer) {
   const Exchange* const told = answer.telling();
+  if (!answer.isComplete) return "interrupted before the device had answered\n";
   if (answer.isWireless) return "wireless\n";
   if (!told || !told->value) return "no usable answer: not in the wizard's list\n";
-  return "not wireless, which is " + std::to_string(kActiveIFWireless) +
-         ": not in the wizard's list\n";
+  return "not wireless (wireless would be " + std::to_string(kActiveIFWireless) +
+         "): not in the wizard's list\n";
 }
 
 std::string textOf(const std::string& address, const Answer& answer, bool isVerbose) {

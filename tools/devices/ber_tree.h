@@ -15,7 +15,7 @@ namespace onramp::devices {
 /// the characters.
 [[nodiscard]] std::string hexDump(std::span<const std::uint8_t> bytes);
 
-/// Returns the bytes as hexadecimal digits without blanks.
+/// Returns the bytes as hexadecimal digits without spaces.
 [[nodiscard]] std::string hexText(std::span<const std::uint8_t> bytes);
 
 }  // namespace onramp::devices

@@ -1,5 +1,4 @@
 #include <algorithm>
-#include <array>
 #include <chrono>
 #include <cstdint>
 #include <map>
@@ -25,20 +24,13 @@ namespace onramp::devices {
 
 namespace {
 
-constexpr double kWizardSearchSeconds = 10;
 constexpr std::chrono::milliseconds kProgressPause{250};
 
-// Types that printers and scanners announce, but under which the wizard reads no maker and model.
-constexpr std::array<std::string_view, 5> kNamelessTypes{
-    "_ipps._tcp.", "_uscan._tcp.", "_uscans._tcp.", "_printer-admin._tcp.", "_http._tcp."};
-
-std::vector<std::string> typesToBrowse(const Medium& medium, bool all) {
+std::vector<std::string> typesToBrowse(const Medium& medium) {
   std::vector<std::string> types{medium.type};
-  const auto add = [&types](std::string_view type) {
-    if (std::find(types.begin(), types.end(), type) == types.end()) types.emplace_back(type);
-  };
-  std::for_each(kIdentifyingTypes.begin(), kIdentifyingTypes.end(), add);
-  if (all) std::for_each(kNamelessTypes.begin(), kNamelessTypes.end(), add);
+  for (const std::string_view type : kIdentifyingTypes) {
+    if (type != medium.type) types.emplace_back(type);
+  }
   return types;
 }
 
@@ -137,7 +129,7 @@ BrowseResult Session::result() {
     result.devices.push_back(judged(*device));
   std::stable_sort(result.devices.begin(), result.devices.end(),
                    [](const auto& a, const auto& b) { return a.device->found < b.device->found; });
-  computeDelays(result.devices, kWizardSearchSeconds);
+  computeDelays(result.devices);
   result.network = networkProblems(!result.devices.empty(), result.seconds);
   return result;
 }
@@ -149,7 +141,7 @@ int Session::run() {
   });
   AddNetworkInterfaceListChangeCallbackSCF();
   if (!options_.json) progress_.print(tableHead(style_));
-  finder_->start(typesToBrowse(medium_, options_.allTypes));
+  finder_->start(typesToBrowse(medium_), options_.allTypes);
   scheduleTimer(std::chrono::milliseconds(static_cast<std::int64_t>(options_.seconds * 1000)),
                 [this] { stopListening(); });
   if (Progress::isShown()) showProgress();

@@ -1,16 +1,21 @@
 #include "tools/devices/browse_result.h"
 
 #include <algorithm>
+#include <chrono>
+#include <cmath>
+
+#include "app/search_wait.h"
 
 namespace onramp::devices {
 
 namespace {
 
 constexpr double kNoticeable = 1;  // seconds
+constexpr double kPause = std::chrono::duration<double>(kFirstSearchPause).count();
 
 }  // namespace
 
-void computeDelays(std::vector<JudgedDevice>& devices, double searchSeconds) {
+void computeDelays(std::vector<JudgedDevice>& devices) {
   std::vector<JudgedDevice*> asked;
   for (JudgedDevice& one : devices) {
     if (one.device->answer) asked.push_back(&one);
@@ -19,15 +24,18 @@ void computeDelays(std::vector<JudgedDevice>& devices, double searchSeconds) {
     return a->device->resolved.value_or(0) < b->device->resolved.value_or(0);
   });
   double clock = 0;
+  double end = kMostPauses * kPause;
   for (std::size_t i = 0; i < asked.size(); ++i) {
     const double cost = asked[i]->device->answer->seconds;
     clock = std::max(clock, asked[i]->device->resolved.value_or(0)) + cost;
+    // The search ends at the end of a pause, once a device is listed.
+    if (asked[i]->verdict.isListed) end = std::min(end, std::ceil(clock / kPause) * kPause);
     if (cost < kNoticeable) continue;
     asked[i]->delay.seconds = cost;
     for (std::size_t later = i + 1; later < asked.size(); ++later) {
       if (!asked[later]->verdict.isListed) continue;
       ++asked[i]->delay.delayed;
-      if (clock >= searchSeconds) ++asked[i]->delay.hidden;
+      if (clock >= end) ++asked[i]->delay.hidden;
     }
   }
 }

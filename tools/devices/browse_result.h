@@ -30,9 +30,9 @@ struct BrowseResult {
   std::vector<Verdict> network{};       ///< what is wrong with the network as a whole
 };
 
-/// Fills in the delays. They assume that the wizard asks one device after another, in the order in
-/// which the devices were resolved, and ends its search after `searchSeconds`.
-void computeDelays(std::vector<JudgedDevice>& devices, double searchSeconds);
+/// Fills in the delays. They assume that the wizard makes its first search, and asks one device
+/// after another, in the order in which the devices were resolved.
+void computeDelays(std::vector<JudgedDevice>& devices);
 
 /// Returns the result as JSON, in the form that the manual page describes.
 [[nodiscard]] std::string jsonOf(const BrowseResult& result);

@@ -10,6 +10,7 @@
 #include "tools/devices/json_output.h"
 #include "tools/devices/name_verdict.h"
 #include "tools/devices/text.h"
+#include "tools/terminal_text.h"
 
 namespace onramp::devices {
 
@@ -71,8 +72,8 @@ std::string explanation(const Verdict& verdict) {
 
 std::string delayText(const Delay& delay) {
   if (delay.delayed == 0) return "";
-  return "The wizard's window stands still for " + durationText(delay.seconds) +
-         " meanwhile, which delays " + std::to_string(delay.delayed) + " of the listed devices" +
+  return "Meanwhile, the wizard's window stands still for " + durationText(delay.seconds) +
+         ", which delays " + std::to_string(delay.delayed) + " of the listed devices" +
          (delay.hidden == 0 ? "" : " and hides " + std::to_string(delay.hidden) + " of them") + '.';
 }
 

@@ -3,6 +3,8 @@
 #include <string>
 #include <vector>
 
+#include "app/search_wait.h"
+
 namespace onramp::devices {
 
 /// The exit status of a command that was called incorrectly or could not do its work.
@@ -11,7 +13,7 @@ inline constexpr int kTrouble = 2;
 struct BrowseOptions {
   std::string medium;
   std::vector<std::string> models;
-  double seconds = 10;  // the length of the wizard's first search
+  double seconds = std::chrono::duration<double>(kMostPauses * kFirstSearchPause).count();
   bool allTypes = false;
   bool json = false;
   bool verbose = false;

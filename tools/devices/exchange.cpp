@@ -79,7 +79,7 @@ class Questioning {
 
  private:
   bool send(snmp_table_request& request, Exchange& exchange);
-  std::optional<std::size_t> await(Sent& sent, snmp_packet& reply);
+  void await(Sent& sent, Exchange& exchange);
   std::optional<Dictionary> read(snmp_table_request& request, std::uint64_t id, Exchange& exchange);
 
   const std::atomic<bool>& stopped_;
@@ -105,19 +105,25 @@ bool Questioning::send(snmp_table_request& request, Exchange& exchange) {
   return true;
 }
 
-// Waits for the reply as long as the wizard does. Returns the reply's size, 0 when the device's
-// host refused the request, and nothing when no reply came in time.
-std::optional<std::size_t> Questioning::await(Sent& sent, snmp_packet& reply) {
+// Waits for the reply as long as the wizard does, and stores it in `exchange`. Leaves the outcome
+// as it is unless the device's host refuses the request.
+void Questioning::await(Sent& sent, Exchange& exchange) {
   const auto deadline = sent.at + kReceiveWait;
   while (!stopped_ && Clock::now() < deadline) {
     const auto left = std::min<Clock::duration>(kGlance, deadline - Clock::now());
     if (sent.socket.waitReadable(left)) {
+      snmp_packet reply{};
       const auto received = sent.socket.receive(std::span(reply).first(kReplySize));
-      return received ? received->length : 0;
+      if (!received) {
+        exchange.outcome = Outcome::kRefused;
+        return;
+      }
+      exchange.seconds = secondsSince(sent.at);
+      exchange.reply.assign(reply.begin(), reply.begin() + static_cast<long>(received->length));
+      return;
     }
     collectLateReplies();
   }
-  return std::nullopt;
 }
 
 void Questioning::collectLateReplies() {
@@ -166,15 +172,8 @@ std::optional<Dictionary> Questioning::once(const char* address, bool& noReply) 
     request.message().request_id = nextRequestId();
     if (send(request, exchange)) {
       const std::uint64_t id = request.message().request_id;
-      snmp_packet reply{};
-      const auto length = await(sent_.back(), reply);
-      if (length == 0) {
-        exchange.outcome = Outcome::kRefused;
-      } else if (length) {
-        exchange.seconds = secondsSince(sent_.back().at);
-        exchange.reply.assign(reply.begin(), reply.begin() + static_cast<long>(*length));
-        result = read(request, id, exchange);
-      }
+      await(sent_.back(), exchange);
+      if (exchange.seconds) result = read(request, id, exchange);
     }
     exchanges_.push_back(exchange);
   }

@@ -7,10 +7,18 @@
 
 namespace onramp::devices {
 
+namespace {
+
+// The search for this type finds the types that are announced (RFC 6763 section 9). A type such as
+// "_ipp._tcp." is found as a service named "_ipp" whose type begins with "_tcp.".
+constexpr const char* kTypeOfTypes = "_services._dns-sd._udp.";
+
+}  // namespace
+
 Finder::Finder(std::string preferred, Changed changed)
     : preferred_(std::move(preferred)), changed_(std::move(changed)) {}
 
-void Finder::start(const std::vector<std::string>& types) {
+void Finder::start(const std::vector<std::string>& types, bool all) {
   start_ = std::chrono::steady_clock::now();
   for (const std::string& type : types)
     browsers_.push_back(KSBonjour::initWithType(type));
@@ -19,11 +27,32 @@ void Finder::start(const std::vector<std::string>& types) {
   watchSightings([this](const ServiceSighting& sighting) { sighted(sighting); });
   for (const auto& browser : browsers_)
     browser->startBrowsing();
+  typeBrowser_ = all ? NetServiceBrowser::create(typeFound, this) : nullptr;
+  if (!typeBrowser_) return;
+  typeBrowser_->schedule();
+  typeBrowser_->searchForServices("", kTypeOfTypes);
+}
+
+void Finder::typeFound(const NetServiceBrowserRef& /*browser*/, unsigned long flags,
+                       const NetServiceRef& service, const NetServiceError& error, void* self) {
+  if (error.code != 0 || !service || (flags & kNetServiceFlagRemove) != 0) return;
+  const std::string protocol = service->type().value_or("");
+  static_cast<Finder*>(self)->browse(service->name().value_or("") + '.' +
+                                     protocol.substr(0, protocol.find('.')) + '.');
+}
+
+void Finder::browse(const std::string& type) {
+  const bool isBrowsed = std::any_of(browsers_.begin(), browsers_.end(),
+                                     [&](const auto& browser) { return browser->type() == type; });
+  if (isBrowsed) return;
+  browsers_.push_back(KSBonjour::initWithType(type));
+  browsers_.back()->startBrowsing();
 }
 
 void Finder::stop() {
   const auto self = shared_from_this();
   watchSightings(nullptr);
+  if (typeBrowser_) typeBrowser_->invalidate();
   for (const auto& browser : browsers_) {
     browser->stopBrowsing();
     browser->removeKSBonjourObserver(this);

@@ -28,8 +28,9 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   Finder& operator=(const Finder&) = delete;
   ~Finder() override = default;
 
-  /// Starts browsing `types`. Until stop(), the finder and its browsers keep each other alive.
-  void start(const std::vector<std::string>& types);
+  /// Starts browsing `types`, and with `all` every other type that is announced. Until stop(), the
+  /// finder and its browsers keep each other alive.
+  void start(const std::vector<std::string>& types, bool all);
   void stop();
 
   /// Returns all devices seen so far, in the order of their names.
@@ -43,6 +44,9 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   void resolvedBonjourService(const NetServiceRef& service) override;
 
  private:
+  static void typeFound(const NetServiceBrowserRef& browser, unsigned long flags,
+                        const NetServiceRef& service, const NetServiceError& error, void* self);
+  void browse(const std::string& type);
   Device* deviceOf(const NetServiceRef& service);
   void sighted(const ServiceSighting& sighting);
 
@@ -50,6 +54,7 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   Changed changed_;
   std::chrono::steady_clock::time_point start_;
   std::vector<std::shared_ptr<KSBonjour>> browsers_;
+  NetServiceBrowserRef typeBrowser_;
   std::map<std::pair<std::string, std::string>, Device> devices_;
   // Kept apart, because a service is seen before the device that it belongs to is known.
   std::map<std::pair<std::string, std::string>, std::set<std::string>> sightings_;

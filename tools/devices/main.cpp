@@ -12,37 +12,37 @@ namespace {
 
 using namespace onramp::devices;
 
-constexpr const char* kExamples = R"(Examples:
+// The examples of the commands. The program's own help shows all of them.
+const std::string kBrowseExamples = R"(
   onramp-devices browse --medium build/medium
       shows every announced device, and why the wizard lists it or not
   onramp-devices browse --medium /media/setup --model "Kestrel Model 100" -v
-      does so for a user who chose that model, and shows all that is known
+      does so for a user who chose that model, and shows all that is known)";
+const std::string kAskExamples = R"(
   onramp-devices ask 192.0.2.17
-      shows what the device answers about its interface, byte for byte
+      shows what the device answers about its interface, byte for byte)";
+const std::string kURIExamples = R"(
   onramp-devices uri "dnssd://Office%20Printer._ipp._tcp.local."
-      shows the addresses behind a printer's URI
+      shows the addresses behind a printer's URI)";
+const std::string kHostsExamples = R"(
   onramp-devices hosts
-      shows this computer's addresses, and which devices answer a broadcast
-
-"onramp-devices COMMAND --help" shows a command's options.)";
+      shows this computer's addresses, and which devices answer a broadcast)";
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
-  CLI::App* const command = app.add_subcommand(
-      "browse", "Show the devices that are announced, live, and why each is listed or not");
-  command->add_option("-m,--medium", options.medium, "The folder that the application lies in")
+  CLI::App* const command =
+      app.add_subcommand("browse", "Show devices, and why the wizard lists them or not");
+  command->footer("Examples:" + kBrowseExamples);
+  command->add_option("-m,--medium", options.medium, "The folder that contains the application")
       ->required()
       ->type_name("DIR");
-  command
-      ->add_option("--model", options.models,
-                   "Search for this model only, as for a user who chose it; may be repeated")
+  command->add_option("--model", options.models, "Search only for this model; may be repeated")
       ->type_name("NAME")
       ->allow_extra_args(false);
   command->add_option("-s,--seconds", options.seconds, "How long to listen")
       ->capture_default_str()
       ->type_name("N")
       ->check(CLI::Range(0.1, 86400.0));
-  command->add_flag("-a,--all-types", options.allTypes,
-                    "Also look for service types that do not name maker and model");
+  command->add_flag("-a,--all-types", options.allTypes, "Also look for every other announced type");
   command->add_flag("--json", options.json, "Print JSON when the search has ended");
   command->add_flag("-v,--verbose", options.verbose,
                     "Show records, TXT data and the SNMP exchanges");
@@ -55,11 +55,13 @@ void addAsk(CLI::App& app, AskOptions& options) {
       ->required();
   command->add_flag("--json", options.json, "Print JSON");
   command->add_flag("-v,--verbose", options.verbose, "Show the bytes of every attempt");
-  command->footer("Exit status: 0 wireless, 1 not wireless, 2 no usable answer.");
+  command->footer("Exit status: 0 wireless, 1 not wireless, 2 no usable answer.\n\nExamples:" +
+                  kAskExamples);
 }
 
 void addURI(CLI::App& app, URIOptions& options) {
   CLI::App* const command = app.add_subcommand("uri", "Show the addresses behind a device URI");
+  command->footer("Examples:" + kURIExamples);
   command->add_option("URI", options.uri, "Such as \"dnssd://Office%20Printer._ipp._tcp.local.\"")
       ->required();
   command->add_option("-s,--seconds", options.seconds, "How long to wait for the addresses")
@@ -69,17 +71,19 @@ void addURI(CLI::App& app, URIOptions& options) {
 }
 
 void addHosts(CLI::App& app, HostsOptions& options) {
-  CLI::App* const command = app.add_subcommand(
-      "hosts", "Show this computer's IPv4 addresses and the devices that answer a broadcast");
+  CLI::App* const command =
+      app.add_subcommand("hosts", "Show own addresses, and who answers a broadcast");
+  command->footer("Examples:" + kHostsExamples);
   command->add_flag_callback(
-      "-n,--no-search", [&options] { options.search = false; }, "Send nothing");
+      "-n,--no-search", [&options] { options.search = false; }, "Send no broadcasts");
   command->add_flag("--json", options.json, "Print JSON");
 }
 
 int run(int count, char* arguments[]) {
   CLI::App app("Explains which devices the wizard lists, and why it leaves out the others.");
   app.name("onramp-devices");
-  app.footer(kExamples);
+  app.footer("Examples:" + kBrowseExamples + kAskExamples + kURIExamples + kHostsExamples +
+             "\n\n\"onramp-devices COMMAND --help\" shows a command's options.");
   app.set_version_flag("-V,--version", "onramp-devices " ONRAMP_VERSION);
   app.require_subcommand(1);
   BrowseOptions browseOptions;

@@ -27,11 +27,11 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
   std::error_code error;
   const std::string folder = fs::canonical(path, error).string();
   if (error || !fs::is_directory(folder, error)) {
-    return fail(path, "is not a folder; give the folder that holds the application");
+    return fail(path, "is not a folder; give the folder that contains the application");
   }
   const std::string application = check::findApplication(folder);
   if (application.empty()) {
-    return fail(path, "holds no application; give the folder that holds it");
+    return fail(path, "contains no application; give the folder that contains it");
   }
   setMainBundlePath(folder + '/' + application);
   const Dictionary description = KSOROSXCD::initWithCDInfo();
@@ -42,7 +42,7 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
   if (medium.type.empty()) {
     return fail(path,
                 "names no service type to look for; its resource dictionary needs "
-                "BonjourNetwork, and CDInfo.plist has to be readable; try onramp-check");
+                "BonjourNetwork, and CDInfo.plist must be readable; try onramp-check");
   }
   if (medium.models.empty()) return fail(path, "has no models in CDInfo.plist; try onramp-check");
   for (const std::string& model : wanted) {

@@ -23,7 +23,7 @@ constexpr std::array<std::string_view, 9> kMakerKeys{
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
                                                      "modelName", "ty",  "product"};
 
-// Removes blanks at both ends of the text, and replaces several blanks in a row by one.
+// Removes spaces at both ends of the text, and replaces several spaces in a row by one.
 std::string withSingleBlanks(std::string_view text) {
   std::string out;
   for (const char c : text) {
@@ -59,15 +59,15 @@ Verdict missingKey(const Device& device, std::string_view wanted,
   const std::string key(wanted);
   if (const auto other = otherKey(device, wanted, keys)) {
     return {.id = "other-key",
-            .why = "announces no " + key + "; the name comes under another key, " +
+            .why = "announces no " + key + "; the name is under another key, " +
                    std::string(*other) + " = " + inQuotes(textUnder(device, *other)),
-            .remedy = "the firmware has to announce it as " + key + " too"};
+            .remedy = "the firmware must announce it under " + key + ", too"};
   }
   const bool isModel = keys.data() == kModelKeys.data();
   return {.id = isModel ? "no-model" : "no-maker",
           .why = "announces no " + key,
-          .remedy = "the firmware has to announce the " + std::string(isModel ? "model" : "maker") +
-                    " as " + key + "; a firmware update may do so"};
+          .remedy = "the firmware must announce the " + std::string(isModel ? "model" : "maker") +
+                    " under " + key + "; a firmware update may help"};
 }
 
 Verdict differs(const char* id, const std::string& how, const std::string& announced,
@@ -80,13 +80,13 @@ Verdict differs(const char* id, const std::string& how, const std::string& annou
 }
 
 std::string edgeBlanks(const std::string& announced) {
-  return announced.find("  ") != std::string::npos ? "has two blanks, unlike"
-                                                   : "differs in blanks at its edges from";
+  return announced.find("  ") != std::string::npos ? "has two spaces in a row, unlike"
+                                                   : "differs only in spaces at an end from";
 }
 
 std::string nearestOf(const std::string& announced, const Medium& medium) {
   const auto nearest = check::Spelling(medium.models).nearest(announced);
-  return nearest ? ", the nearest is " + inQuotes(*nearest) : "";
+  return nearest ? "; the nearest is " + inQuotes(*nearest) : "";
 }
 
 }  // namespace
@@ -107,9 +107,10 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
   const std::string model = device.record.string(KSDevice::kUSBModel).value_or("");
   const auto keys = identityKeysOf(device.type);
   if (!keys) {
-    return Verdict{.id = "other-type",
-                   .why = "announced as " + device.type + " only, which carries no names",
-                   .remedy = "switch on the device's " + medium.type + " service"};
+    return Verdict{
+        .id = "other-type",
+        .why = "announced only as " + device.type + ", a type that names no maker and model",
+        .remedy = "switch on the device's " + medium.type + " service"};
   }
   if (model.empty()) return missingKey(device, keys->model, kModelKeys);
   if (maker.empty()) return missingKey(device, keys->manufacturer, kMakerKeys);
@@ -120,10 +121,10 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
     const std::string plainKnown = withSingleBlanks(known);
     if (plain == plainKnown) return differs("blanks", edgeBlanks(announced), announced, known);
     if (asciiLowercased(announced) == asciiLowercased(known)) {
-      return differs("capitals", "differs in capitals only from", announced, known);
+      return differs("capitals", "differs only in capital letters from", announced, known);
     }
     if (asciiLowercased(plain) == asciiLowercased(plainKnown)) {
-      return differs("capitals", "differs in capitals and blanks from", announced, known);
+      return differs("capitals", "differs in capital letters and spaces from", announced, known);
     }
     if (asciiLowercased(withSingleBlanks(model)) == asciiLowercased(plainKnown)) {
       return differs("maker-twice", "repeats the maker, unlike", announced, known);

@@ -4,6 +4,7 @@
 
 #include "platform/terminal.h"
 #include "tools/devices/text.h"
+#include "tools/terminal_text.h"
 
 namespace onramp::devices {
 
@@ -13,7 +14,11 @@ bool Progress::isShown() {
 
 void Progress::show(const std::string& text) {
   if (!isShown()) return;
-  std::cerr << '\r' << fitted(text, terminalWidth() - 1) << std::flush;
+  std::string line = fitted(text, terminalWidth() - 3);
+  // Ends at the text, so that the "^C" of an interruption stays on the line.
+  while (line.ends_with(' '))
+    line.pop_back();
+  std::cerr << '\r' << line << "\033[K" << std::flush;
   isThere_ = true;
 }
 

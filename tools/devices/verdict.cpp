@@ -6,6 +6,7 @@
 #include "bonjour/model_match.h"
 #include "snmp/protocol.h"
 #include "snmp/records.h"
+#include "snmp/transport.h"
 #include "tools/devices/name_verdict.h"
 #include "tools/devices/text.h"
 
@@ -25,9 +26,11 @@ std::string joined(const std::vector<std::string>& texts) {
 Verdict judgeValue(std::int64_t value) {
   const bool isCable = value == 1;
   return {.id = isCable ? "on-cable" : "other-interface",
-          .why = (isCable ? "on cable: answers " : "answers ") + std::to_string(value) +
-                 ", wireless is " + std::to_string(kActiveIFWireless),
-          .remedy = "connect the device to the wireless network; the wizard's list has no others"};
+          .why = (isCable ? "on cable: reports interface " : "reports interface ") +
+                 std::to_string(value) + "; wireless would be " + std::to_string(kActiveIFWireless),
+          .remedy =
+              "connect the device to the wireless network; the wizard lists only devices on "
+              "wireless"};
 }
 
 Verdict judgeSilence(const Device& device, const Answer& answer,
@@ -37,7 +40,7 @@ Verdict judgeSilence(const Device& device, const Answer& answer,
                            ", which costs the wizard " + durationText(answer.seconds);
   if (std::none_of(addresses.begin(), addresses.end(), isLocal)) {
     return {.id = "other-subnet",
-            .why = "its address is in no local subnet: " + cost,
+            .why = "its address is in none of this computer's subnets; " + cost,
             .remedy =
                 "put the device and this computer into the same subnet; "
                 "\"onramp-devices hosts\" shows this computer's addresses"};
@@ -58,31 +61,33 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
     case Outcome::kError:
       return {.id = "no-such-object",
               .why = "answers " + errorStatusName(told->errorStatus) +
-                     " to the question for its interface",
-              .remedy = "update the firmware; this one does not know the question"};
+                     " when asked which interface it uses",
+              .remedy = "update the firmware; this version does not support the request"};
     case Outcome::kOtherType:
       return {
           .id = "wrong-type",
           .why = "answers with " +
                  std::string(told->type == kTagOctetString ? "a text" : "a value of another type") +
-                 " where a number is asked for",
-          .remedy = "update the firmware; this one gives the object another type"};
+                 " where a number is expected",
+          .remedy = "update the firmware; this version returns a value of the wrong type"};
     case Outcome::kUnreadable:
     case Outcome::kOtherRequest:
       return {.id = "unreadable-reply",
               .why = told->outcome == Outcome::kUnreadable
                          ? "answers with bytes that are not a proper reply"
-                         : "answers another request than the one asked",
-              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware has to be corrected"};
+                         : "answers a request other than the one that was sent",
+              .remedy = "\"onramp-devices ask\" shows the bytes; the firmware must be corrected"};
     case Outcome::kLate:
-      return {.id = "late",
-              .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
-                     "; the wizard waits 2 s for each of its questions, " +
-                     durationText(answer.seconds) + " in all",
-              .remedy = "wake the device up, for instance by a key on its panel, and search again"};
+      return {
+          .id = "late",
+          .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
+                 "; the wizard waits " + std::to_string(kReceiveWait.count()) +
+                 " s for each of its questions, " + durationText(answer.seconds) + " in all",
+          .remedy =
+              "wake the device up, for instance by pressing a key on its panel, and search again"};
     case Outcome::kRefused:
       return {.id = "refused",
-              .why = "refuses SNMP: nothing uses UDP port 161 there",
+              .why = "refuses SNMP: no program on the device uses UDP port 161",
               .remedy = "switch on SNMP v1 in the device"};
     case Outcome::kNone:
     case Outcome::kUnsent:
@@ -104,21 +109,23 @@ Verdict judge(const Device& device, const Medium& medium,
     return {
         .id = "unresolved",
         .why = "announced as " + joined(device.types) +
-               ", but never resolved: no host announces its address",
+               ", but never resolved: nothing on the network announces the address of its host",
         .remedy = "switch the device off and on; check that no other device uses its host name"};
   }
   if (auto verdict = judgeName(device, medium)) return *verdict;
   if (device.type != medium.type) {
-    return {.id = "other-type",
-            .why = "announced as " + joined(device.types) + "; the medium looks for " + medium.type,
-            .remedy = "switch on the device's " + medium.type +
-                      " service, or name its type in the medium's BonjourNetwork"};
+    return {
+        .id = "other-type",
+        .why = "announced as " + joined(device.types) + "; the medium looks for " + medium.type,
+        .remedy =
+            "switch on the device's " + medium.type +
+            " service, or name the type that the device announces in the medium's BonjourNetwork"};
   }
   if (!isOneOf(medium.wanted, device.record)) {
     return {.id = "other-model",
             .why = "is a " + inQuotes(modelTextOf(device.record)) + "; the search is for " +
                    (medium.wanted.size() == 1 ? inQuotes(medium.wanted.front()) : "other models"),
-            .remedy = "choose that model in the wizard"};
+            .remedy = "choose the device's own model in the wizard"};
   }
   if (ipv4AddressesOf(device.record).empty()) {
     return {.id = device.ipv6.empty() ? "no-address" : "ipv6-only",
@@ -143,8 +150,9 @@ std::vector<Verdict> notesOn(const Device& device, const Medium&) {
                   [](const Exchange& e) { return e.changedQuestion; })) {
     notes.push_back({.id = "changed-question",
                      .why = "its reply changed the question that all later devices are asked",
-                     .remedy = "switch the device off while others are set up; its firmware has to "
-                               "repeat the name that it was asked for"});
+                     .remedy =
+                         "switch the device off while others are set up; the fault is in its "
+                         "firmware, which must repeat the object's name (OID) from the request"});
   }
   return notes;
 }

@@ -118,7 +118,7 @@ class Desktop:
                           stdout=subprocess.PIPE, text=True)
         address = bus.stdout.readline().strip()
         if not address:
-            raise Missing("dbus-daemon gave no address of a session bus")
+            raise Missing("dbus-daemon printed no address of a session bus")
         self.env["DBUS_SESSION_BUS_ADDRESS"] = address
 
     def _start_display(self):
@@ -128,10 +128,10 @@ class Desktop:
             "xvfb", stdout=subprocess.PIPE, text=True)
         number = display.stdout.readline().strip()
         if not number:
-            raise Missing("Xvfb gave no display")
+            raise Missing("Xvfb did not start a display")
         self.env["DISPLAY"] = f":{number}"
         if not self._window_manager:
             return
         self._start(["openbox", "--sm-disable"], "openbox", stdout=subprocess.DEVNULL)
         wait_for(lambda: "_NET_SUPPORTING_WM_CHECK(WINDOW)" in
-                 self.run(["xprop", "-root", "_NET_SUPPORTING_WM_CHECK"]), 10, "openbox")
+                 self.run(["xprop", "-root", "_NET_SUPPORTING_WM_CHECK"]), 10, "openbox to start")

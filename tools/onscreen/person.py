@@ -17,7 +17,8 @@ _COLUMNS = 3
 def _is(control, role, name):
     """Returns whether the control matches.
 
-    A heading counts as a label, too. A row's first cell may be called "name, address".
+    A heading counts as a label, too. The name of a row's first cell may be followed by a comma and
+    the row's address.
     """
     own_role = control.get_role_name()
     if own_role != role and (own_role, role) != ("heading", "label"):
@@ -27,10 +28,14 @@ def _is(control, role, name):
         role == "table cell" and own_name.startswith(f"{name}, "))
 
 
-class Person:
-    """A context manager that starts a program on a desktop and ends it again.
+def _words(role, name):
+    return f"the {role} {name!r}" if name else f"a {role}"
 
-    Its methods use the program.
+
+class Person:
+    """A context manager that starts a program on a desktop, and ends it at the end.
+
+    Its methods use the program as a person does.
     """
 
     follows_desktop = True  # whether the program takes the desktop's text size, scale and colours
@@ -59,7 +64,7 @@ class Person:
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits for a control of that role and name and returns it."""
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
-                        f"a {role} named {name!r}")
+                        _words(role, name))
 
     def sees(self, role, name=None):
         """Returns whether such a control is on the screen now."""
@@ -67,7 +72,8 @@ class Person:
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits until no such control is on the screen."""
-        wait_for(lambda: self._certainly_gone(role, name), seconds, f"the end of {role} {name!r}")
+        wait_for(lambda: self._certainly_gone(role, name), seconds,
+                 f"{_words(role, name)} to disappear")
 
     def everything(self):
         """Returns a list of (role, name, control) for everything on the screen."""
@@ -96,7 +102,8 @@ class Person:
     def click(self, role, name=None):
         """Clicks the middle of a control once the control is enabled."""
         control = self.see(role, name)
-        wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS, f"{name!r} enabled")
+        wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS,
+                 f"{_words(role, name)} to be enabled")
         self.click_control(control)
 
     def click_control(self, control):
@@ -120,7 +127,7 @@ class Person:
     def open_menu(self, button=None):
         """Opens the menu of that button, or of the button with the focus.
 
-        The accessibility bus does not show the menu, so it has to be used with the keyboard.
+        The accessibility bus does not show the menu, so it must be used with the keyboard.
         """
         windows = self._window_count()
         if button:
@@ -128,7 +135,7 @@ class Person:
         else:
             self.press("space")
         wait_for(lambda: self._window_count() > windows, _LOOK_SECONDS,
-                 f"the menu of {button or 'the focused button'!r}")
+                 f"the menu of {repr(button) if button else 'the focused button'} to open")
 
     def choose_from_menu(self, button, item):
         """Opens a button's menu and chooses its `item`th entry."""
@@ -174,12 +181,13 @@ class Person:
             before, place = place, (box.x, box.y, box.width, box.height)
             return place == before and box
 
-        return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} at rest")
+        return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} to stop moving")
 
     def round_trip(self):
-        """Returns the seconds that the program takes to answer, without its waits for a processor.
+        """Returns the seconds that the program takes to answer a small request.
 
-        Returns None when the program has ended and does not answer.
+        Leaves out the time that the program and this process wait for a processor. Returns None
+        when the program has ended and does not answer.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -234,7 +242,10 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` with everything on the screen, depth first. Skips objects that vanish."""
+        """Calls `visit` with `control` and everything visible below it, until it returns False.
+
+        Goes depth first and skips objects that vanish. Enters tables only if `tables` is set.
+        """
         if control is None:
             self._overlooked = True
             return True

@@ -28,7 +28,7 @@ way, the network is gone.
 
 This runs the wizard with twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
-This starts a shell, in which such commands show the devices:
+This starts a shell, in which commands such as these show the devices:
     tools/practice-network examples/practice-network.toml
     avahi-browse -rpt _pdl-datastream._tcp
     snmpget -v1 -c corridor 127.0.1.1 1.3.6.1.4.1.4242.2.4.4.1240.1.2.0
@@ -47,19 +47,19 @@ the description is a TOML file. It has one table for the network, which may be l
 and one table for each device:
     [[device]]
     name = "Kestrel Model 100"     the name in the wizard's list; all other entries are optional
-    maker = "Kestrel"              as in the medium's model names: maker, blank, model
+    maker = "Kestrel"              as in the medium's model names: maker, space, model
     model = "Model 100"
     note = "2nd floor"             the device's location
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
-    domain = "annex.local"         default "local"; other domains have to end in ".local"
+    domain = "annex.local"         default "local"; other domains must end in ".local"
     port = 631                     default: the type's usual port
-    addresses = ["127.0.1.9"]      or a number of addresses to choose for it; default 1
-    activeif = 2                   the number that SNMP answers; default 2, which is wireless.
+    addresses = ["127.0.1.9"]      or how many addresses the network chooses; default 1
+    activeif = 2                   the number that the device answers; default 2, for wireless.
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
                                    answers with a text. A list gives each address its own value.
     delay = 1.5                    seconds before each SNMP answer; default 0
-    present = false                begins switched off; default true
+    present = false                switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
 these commands, run inside the network, add, remove and change devices while COMMAND runs. KEY=VALUE
@@ -73,8 +73,8 @@ is an entry as in the file:
     practice-network ctl plug INTERFACE               brings the interface back
     practice-network ctl stop-daemon | start-daemon | restart-daemon      controls Avahi
     practice-network ctl settle                       waits until all devices are published
-Python tests do the same with PracticeNetwork from tools/practice_network. Both find the network by
-the variable ONRAMP_PRACTICE_SOCKET.
+Python tests do the same with PracticeNetwork from tools/practice_network. Both find the network
+through the environment variable ONRAMP_PRACTICE_SOCKET.
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
 do by default. Abstract sockets and TCP connections do not cross into the namespace. XDG_RUNTIME_DIR
@@ -82,7 +82,8 @@ is a new, empty folder. The session bus, Wayland and the accessibility bus of yo
 reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
 exit status: that of COMMAND, or 128 + n if signal n ended it; 2 for a bad description, 77 if
-namespaces cannot be created here, 125 if the network did not start, 126 or 127 if COMMAND did not.
+namespaces cannot be created here, 125 if the network did not start, 126 or 127 if COMMAND could not
+be run.
 """
 
 
@@ -108,7 +109,8 @@ def _run(program, arguments):
         description=textwrap.dedent(HELP), epilog=DETAILS)
     parser.add_argument("--hosts", type=int, choices=(1, 2), default=1,
                         help="2: devices and COMMAND are on two hosts joined by a cable, "
-                             "192.0.2.0/24, each with its own Avahi; ctl controls the devices' one")
+                             "192.0.2.0/24, each with its own Avahi; ctl controls that of the "
+                             "devices")
     parser.add_argument("--invoker", help=argparse.SUPPRESS)
     parser.add_argument("description", metavar="DESCRIPTION")
     parser.add_argument("command", metavar="COMMAND", nargs=argparse.REMAINDER)

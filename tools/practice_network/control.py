@@ -26,7 +26,7 @@ class PracticeNetwork:
     def __init__(self, path=None):
         self._path = path or os.environ.get(SOCKET_VARIABLE)
         if not self._path:
-            raise ControlError(f"{SOCKET_VARIABLE} is not set: this is no practice network; "
+            raise ControlError(f"{SOCKET_VARIABLE} is not set: this is not a practice network; "
                                "start one with: practice-network DESCRIPTION")
 
     def add(self, name, **entries):
@@ -74,7 +74,8 @@ class PracticeNetwork:
         while waiting := [one for one in self.list()
                           if one["present"] and one["state"] != "established"]:
             if time.monotonic() > deadline:
-                raise ControlError(f'device "{waiting[0]["name"]}" is still {waiting[0]["state"]}')
+                raise ControlError(f'device "{waiting[0]["name"]}" is still not published: it is '
+                                   f'{waiting[0]["state"]}')
             time.sleep(0.02)
 
     def _ask(self, operation, *arguments):

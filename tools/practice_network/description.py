@@ -6,7 +6,7 @@ import ipaddress
 import re
 import tomllib
 
-# What an address can do with an SNMP request instead of answering an integer.
+# What an address can do with an SNMP request instead of answering with an integer.
 SILENT = "silent"    # receives the request and never answers
 CLOSED = "closed"    # has no agent, so the host refuses the packet
 MISSING = "missing"  # has an agent that lacks the object
@@ -21,7 +21,7 @@ PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
 
 class DescriptionError(Exception):
-    """A bad description. The text names the file and the device, and says what would be right."""
+    """A bad description. The text names the file and the device, and says how to correct it."""
 
 
 @dataclasses.dataclass(frozen=True)
@@ -135,7 +135,8 @@ def _read(table, readers, place):
     for key, value in table.items():
         if key not in readers:
             near = difflib.get_close_matches(key, readers, 1)
-            known = f'did you mean "{near[0]}"?' if near else f"known are {', '.join(readers)}"
+            known = (f'did you mean "{near[0]}"?' if near
+                     else f"the known entries are {', '.join(readers)}")
             raise DescriptionError(f'{place}: unknown entry "{key}"; {known}')
         reader, wanted = readers[key]
         try:

@@ -65,7 +65,8 @@ class Network:
         for device in self._devices.values():
             while device.present and (state := self._state(device)) != "established":
                 if time.monotonic() > deadline:
-                    raise PublishError(f'device "{device.name}" is still {state}')
+                    raise PublishError(f'device "{device.name}" is still not published: it is '
+                                       f'{state}')
                 time.sleep(0.01)
 
     def stop_daemon(self):
@@ -152,7 +153,7 @@ class Network:
         self._agents.stop(device)
 
     def _with_addresses(self, device, known_as=None):
-        """Returns the device with addresses that no other device answers at. Adds them to the host."""
+        """Gives the device its own addresses and adds them to the host. Returns the device."""
         name = known_as or device.name
         used = {address for key, other in self._devices.items() if key != name
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())

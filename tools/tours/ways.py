@@ -14,7 +14,7 @@ def choose_model(person, model):
     while (selected := _selected_model(person)) != model:
         person.press("Down")
         wait_for(lambda: _selected_model(person) != selected, 10,
-                 f"{model!r} in the list, beyond {selected!r}")
+                 f"the selection to move from {selected!r} towards {model!r}")
 
 
 def _selected_model(person):
@@ -48,7 +48,8 @@ class Tour:
             person.see("push button", self._text.get("BTN_CLOSE", "Close"))
             person.picture(self._pictures / "alert.png")
             person.press("Return")
-            _expect(person.wait_for_end() == 0 and not self._files(), "the alert's end")
+            _expect(person.wait_for_end() == 0 and not self._files(),
+                    "after the alert, the wizard did not end cleanly, or it wrote files")
 
     def usb(self):
         """Goes from the model list to the connection page and USB, until the package opens."""
@@ -63,11 +64,11 @@ class Tour:
             self._see_package_open(person, 2 if chosen else 1)
 
     def wireless(self):
-        """Goes the wireless way: devices are found, disappear, and are found again."""
+        """Takes the wireless route: devices are found, disappear, and are found again."""
         model = next((name for name in self._medium.wireless_models() if " " in name), None)
         if not model:
-            print("No device can match a model whose name has no blank, so "
-                  "the tour leaves out the wireless way.")
+            print("No device can match a model whose name has no space, so "
+                  "the tour leaves out the wireless route.")
             return
         self._make_up_devices(model)
         with self._start() as person:
@@ -142,12 +143,13 @@ class Tour:
         _expect(status == 0, f"the wizard ended with status {status}")
         for file in self._files():
             print(f"\n{file.name}:\n{file.read_text(encoding='utf-8')}", end="")
-        _expect(len(self._files()) == files, f"the wizard did not write {files} hand-off file(s)")
+        _expect(len(self._files()) == files,
+                f"the wizard wrote {len(self._files())} files for the package instead of {files}")
         _expect(self._desktop.opened(), "the wizard did not open the package")
         print("\nopened: " + "\n".join(self._desktop.opened()))
 
     def _files(self):
-        """Returns the hand-off files, those for all users first."""
+        """Returns the files that the wizard wrote for the package, those for all users first."""
         return sorted(self._desktop.local_folder.glob("*/*.plist")) + sorted(
             self._desktop.user_folder.glob("*/*.plist"))
 
