@@ -77,7 +77,7 @@ void OnrampOSXAppDelegate::applicationWillFinishLaunching() {
     terminateApplication();
     return;
   }
-  // What an earlier run left must not pass for this run's choices.
+  // The package must not take an earlier run's files for this run's choices.
   removeDictionary(instmodelPlistURL());
   removeDictionary(InstallPKGInfoURL());
 }

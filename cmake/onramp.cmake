@@ -6,7 +6,7 @@ target_compile_options(onramp_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
   # GCC 12 mistakes string concatenation in the standard library for an overlapping copy.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
-  # macOS deprecates the C functions for network services and for its version without C successors.
+  # macOS deprecates its C functions for network services and for its own version, and has no others.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
 # These options are global, so that every object file is instrumented, including code from
@@ -52,8 +52,8 @@ function(onramp_test name)
 endfunction()
 
 # onramp_namespace_test(NAME …): as onramp_test, but the test runs as root in a new network namespace
-# and is skipped where none can be created. CMake calls tests/in_namespace, through which ctest runs the
-# test, an emulator. SOURCE_FOLDER is defined as the folder of the test's sources.
+# and is skipped where none can be created. ctest runs the test through tests/in_namespace,
+# which CMake calls an emulator. SOURCE_FOLDER is defined as the folder of the test's sources.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})

@@ -1,4 +1,4 @@
-// This function is in a file of its own, so that a program without a run loop can link the other
+// This function is in a separate file, so that a program without a run loop can link the other
 // functions of the store.
 
 #include <atomic>

@@ -1,8 +1,6 @@
 #include <gmock/gmock.h>
 #include <pthread.h>
 
-#include <cstdint>
-
 #include "platform/run_loop.h"
 #include "tests/app/wizard.h"
 

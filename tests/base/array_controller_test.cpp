@@ -76,7 +76,7 @@ TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
   EXPECT_EQ(list.selectionIndex(), std::nullopt);
 }
 
-// The thread sanitizer watches this one.
+// The thread sanitizer checks this test.
 TEST(ArrayController, LetsAnotherThreadWaitForAnEntry) {
   ArrayController list;
   std::size_t seen = 0;

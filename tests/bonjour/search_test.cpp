@@ -121,8 +121,11 @@ TEST_F(BrowserTest, RemovalsOfUnknownServicesAreForwardedAsNull) {
 TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
   const auto scanners = KSBonjour::initWithType("_scanner._tcp.");
   const auto scannerRecorder = std::make_shared<ServiceRecorder>();
-  scanners->addKSBonjourObserver(scannerRecorder);
-  scanners->startBrowsing();
+  const auto idle = KSBonjour::initWithType(std::nullopt);
+  for (const auto& other : {scanners, idle}) {
+    other->addKSBonjourObserver(scannerRecorder);
+    other->startBrowsing();
+  }
 
   network.found(onOne);
   network.resolves(onOne, {});

@@ -59,6 +59,7 @@ TEST_F(Chooser, ShowsItsTextsAndItsMenu) {
                                           "INST_TXT_IPADDRESS = place; INST_TXT_REFRESH = again;"));
   load();
   EXPECT_EQ(screen.object("deviceListTitle").text, "INST_TXT_DEVLIST");
+  EXPECT_TRUE(screen.object("progress").hidden && screen.object("progressTxtField").hidden);
   const recording::Object& table = screen.object("deviceListView");
   EXPECT_THAT(table.headers, ElementsAre(Pair("device", "name"), Pair("interface", "way"),
                                          Pair("location", "place")));

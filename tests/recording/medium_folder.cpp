@@ -6,7 +6,6 @@
 #include <utility>
 
 #include "platform/freedesktop/main_bundle.h"
-#include "platform/property_list.h"
 
 namespace onramp::recording {
 
@@ -30,10 +29,6 @@ MediumFolder::MediumFolder() {
 MediumFolder::~MediumFolder() {
   for (const auto& [name, value] : std::exchange(before_, {}))
     setEnvironment(name, value);
-}
-
-std::string MediumFolder::path(const std::string& relative) const {
-  return root_ / "medium/" + relative;
 }
 
 void MediumFolder::write(const std::string& relative, const std::string& bytes) const {
@@ -71,22 +66,6 @@ std::string MediumFolder::setUpToolArguments() const {
   std::string arguments;
   std::getline(std::ifstream(root_ / "tool"), arguments);
   return arguments;
-}
-
-std::string MediumFolder::optionsFilePath() const {
-  return root_ / "local/KestrelImaging/com.kestrelimaging.installpkginfo.plist";
-}
-
-std::string MediumFolder::modelFilePath() const {
-  return root_ / "user/KestrelImaging/com.kestrelimaging.instmodel.plist";
-}
-
-std::optional<Dictionary> MediumFolder::optionsFile() const {
-  return loadDictionary(optionsFilePath());
-}
-
-std::optional<Dictionary> MediumFolder::modelFile() const {
-  return loadDictionary(modelFilePath());
 }
 
 void MediumFolder::setEnvironment(const std::string& name,

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "base/value.h"
+#include "platform/property_list.h"
 #include "tests/recording/temporary_folder.h"
 
 namespace onramp::recording {
@@ -22,7 +23,9 @@ class MediumFolder {
   ~MediumFolder();
 
   /// Returns the full path of a file on the medium.
-  [[nodiscard]] std::string path(const std::string& relative) const;
+  [[nodiscard]] std::string path(const std::string& relative) const {
+    return root_ / "medium/" + relative;
+  }
 
   /// Write a file on the medium, and create its folder if it is missing.
   void write(const std::string& relative, const std::string& bytes) const;
@@ -42,10 +45,14 @@ class MediumFolder {
 
   /// The first two return the contents of the two files for the package, or nothing when a file is
   /// absent. The others return the paths of these files.
-  [[nodiscard]] std::optional<Dictionary> optionsFile() const;
-  [[nodiscard]] std::optional<Dictionary> modelFile() const;
-  [[nodiscard]] std::string optionsFilePath() const;
-  [[nodiscard]] std::string modelFilePath() const;
+  [[nodiscard]] auto optionsFile() const { return loadDictionary(optionsFilePath()); }
+  [[nodiscard]] auto modelFile() const { return loadDictionary(modelFilePath()); }
+  [[nodiscard]] std::string optionsFilePath() const {
+    return root_ / "local/KestrelImaging/com.kestrelimaging.installpkginfo.plist";
+  }
+  [[nodiscard]] std::string modelFilePath() const {
+    return root_ / "user/KestrelImaging/com.kestrelimaging.instmodel.plist";
+  }
 
   /// Sets or unsets an environment variable until the destructor restores it.
   void setEnvironment(const std::string& name, const std::optional<std::string>& value);

@@ -99,6 +99,7 @@ TEST(Primitives, UnusedByTheProgramKeepTheirContracts) {
   std::uint16_t a[] = {1, 3, 6}, b[] = {1, 3, 7};
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {3, 3, b}), -1);
   EXPECT_EQ(snmp_oid_compare({3, 3, b}, {3, 3, a}), 1);
+  EXPECT_EQ(snmp_oid_compare({2, 2, a}, {3, 3, b}), -1);
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {2, 2, b}), 0);
 
   const auto bytes = hex("1F 62 63");

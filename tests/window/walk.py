@@ -20,9 +20,8 @@ import time
 
 import media
 from media import model
-from way import BUILT, PRACTICE_NETWORK
+from way import BUILT, PRACTICE_NETWORK, Person
 from onscreen.desktop import Desktop
-from onscreen.person import Person
 from practice_network import PracticeNetwork
 
 AT_A_TIME = 4

@@ -1,8 +1,10 @@
 """The common part of the tests that go through the wizard from start to end.
 
-The last argument of each test program is a medium's folder with the application on it.
+The last argument of each test program is a medium's folder with the application on it. With
+ONRAMP_GNUSTEP in the environment, that application is the Cocoa front end under GNUstep.
 """
 
+import os
 import pathlib
 import plistlib
 import sys
@@ -16,14 +18,20 @@ sys.path.insert(0, str(TOOLS))
 import media  # noqa: E402
 from onscreen import messages  # noqa: E402
 from onscreen.desktop import Desktop  # noqa: E402
-from onscreen.person import Person  # noqa: E402
+
+# The Cocoa front end under GNUstep has no accessibility bus, no keys for menus, no names for lists and
+# no options.
+ON_GNUSTEP = "ONRAMP_GNUSTEP" in os.environ
+if ON_GNUSTEP:
+    sys.path.append(str(TOOLS.parent / "tests/cocoa"))
+    from gnustep_person import GNUstepPerson as Person
+else:
+    from onscreen.person import Person
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TEXT = messages.read(BUILT, "en")
 PRACTICE_NETWORK = TOOLS / "practice-network"
 GEAR, GEAR_REFRESH = "Actions", 2
-# The Cocoa front end under GNUstep has no keys for menus, no names for lists and no options.
-ON_GNUSTEP = "gnustep_person" in sys.modules
 OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": False,
            "PKG_LabelTool": False, "PKG_FontSet": False}
 

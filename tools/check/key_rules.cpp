@@ -64,7 +64,7 @@ const char* expectationOf(Kind kind) {
   return "any value";
 }
 
-// Returns how to mend a value of another kind than `kind`.
+// Returns how to correct a value that is not of the kind `kind`.
 std::string remedyFor(Kind kind, const Value& value) {
   if (kind != Kind::kBoolean) return std::string("write ") + expectationOf(kind);
   const auto* const text = value.as<std::string>();

@@ -171,8 +171,8 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
   }
 }
 
-// Reads the property list whose path stands in the resource dictionary under `key`. Sets `path` to
-// that path.
+// Reads the property list whose path the resource dictionary has under `key`. Sets `path` to that
+// path.
 std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists,
                                     std::string_view key, const char* what, const char* effect,
                                     std::string& path) {

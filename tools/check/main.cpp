@@ -24,8 +24,8 @@ constexpr const char* kFooter = R"(Examples:
   onramp-check /Volumes/Setup          print what is wrong with that medium
   onramp-check --json build/medium     print it as JSON, for a program
 
-Exit status: 0 when there is no error (with --strict: and no warning), 1 when
-there is one, 2 when the medium could not be read, the output could not be
+Exit status: 0 when no error was found, 1 when an error (with --strict: or a
+warning) was found, 2 when the medium could not be read, the output could not be
 written or the command line is wrong.)";
 
 // Returns `status`, or kUnreadable after a message when standard output could not be written.

@@ -65,7 +65,7 @@ bool isXML(const std::string& text) {
 }
 
 // `nearest` is the name on the medium that resembles the missing one. `isWritten` tells whether the
-// medium can name another file; the wizard itself decides the other names.
+// missing name is written on the medium; the wizard itself chooses all other names.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
                              bool isWritten) {
   if (!nearest) return isWritten ? "put it there, or correct the path" : "put it there";

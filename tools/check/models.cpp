@@ -160,7 +160,7 @@ class ModelCheck {
     }
   }
 
-  // Reports each spelling of the maker that differs only in capitals from the vendor's name.
+  // Reports each spelling of the maker that differs only in capital letters from the vendor's name.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));
@@ -169,8 +169,8 @@ class ModelCheck {
     if (!makers_.insert(maker).second) return;
     add(name, {.id = "maker-capitals",
                .severity = Severity::kWarning,
-               .found = "the maker " + quoted(maker) + ", whose name is " + quoted(spelling) +
-                        " in \"VenderName\"",
+               .found = "the maker " + quoted(maker) + ", which \"VenderName\" spells " +
+                        quoted(spelling),
                .expected = "the maker as the devices announce it (usb_MFG), capitals included",
                .effect = "devices of " + quoted(spelling) + " are not found on the network",
                .remedy = "use the devices' spelling for all models"});

@@ -48,11 +48,11 @@ constexpr std::array kTexts{
     ShownText{
         .key = "INST_TXT_CONNECTION", .where = "header of a column", .width = 128, .size = kHeader},
     ShownText{.key = "INST_TXT_CONNECTIONTYPE",
-              .where = "title of the connection type",
+              .where = "title of the connection page",
               .width = kPage,
               .size = kTitleSize},
     ShownText{.key = "INST_TXT_CONNECTIONTYPE_DESC",
-              .where = "below that title",
+              .where = "explanation on the connection page",
               .width = kPage,
               .lines = 2},
     ShownText{.key = "INST_TXT_CONNECTION_NETWORK",
@@ -73,12 +73,14 @@ constexpr std::array kTexts{
               .where = "title of the model list",
               .width = kPage,
               .size = kTitleSize},
-    ShownText{
-        .key = "INST_TXT_MODEL_DESC", .where = "below that title", .width = kPage, .lines = 2},
+    ShownText{.key = "INST_TXT_MODEL_DESC",
+              .where = "explanation above the model list",
+              .width = kPage,
+              .lines = 2},
     ShownText{.key = "INST_TXT_REFRESH", .where = "device list's menu"},
     ShownText{.key = "INST_TXT_USB", .where = "name of a connection", .width = 450},
     ShownText{.key = "INST_TXT_WIFI", .where = "name of a connection", .width = 450},
-    ShownText{.key = "INST_WAIT", .where = "beside the turning wheel", .width = 588},
+    ShownText{.key = "INST_WAIT", .where = "beside the spinner of a search", .width = 588},
 };
 
 struct Range {

@@ -42,7 +42,7 @@ class OwnTable {
 
   [[nodiscard]] mib_table& get() { return table_; }
 
-  /// Returns the objects' present names.
+  /// Returns the objects' current names.
   [[nodiscard]] std::vector<std::vector<std::uint16_t>> names() const {
     std::vector<std::vector<std::uint16_t>> names;
     for (const mib_entry& entry : entries_)

@@ -72,7 +72,7 @@ void addURI(CLI::App& app, URIOptions& options) {
 
 void addHosts(CLI::App& app, HostsOptions& options) {
   CLI::App* const command =
-      app.add_subcommand("hosts", "Show own addresses, and who answers a broadcast");
+      app.add_subcommand("hosts", "Show own addresses, and the answers to a broadcast");
   command->footer("Examples:" + kHostsExamples);
   command->add_flag_callback(
       "-n,--no-search", [&options] { options.search = false; }, "Send no broadcasts");

@@ -1,4 +1,4 @@
-// Small features of AppKit that GNUstep lacks and that need no file of their own.
+// Small features of AppKit that GNUstep lacks and that need no separate files.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
