@@ -144,7 +144,8 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {
-    // Lets the wizard quit while a sheet or a modal loop runs on the window.
+    // Makes AppKit ask the delegate whether the application may quit during a modal loop or a
+    // sheet.
     [window setPreventsApplicationTerminationWhenModal:NO];
     localize([window contentView], name);
     connectActions([window contentView], owner, tree -> actions);

@@ -106,8 +106,13 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   if (row >= 0) _controller->choose(static_cast<std::size_t>(row));
 }
 
+// The table is still handling the mouse, and the button's action may remove it, so the button is
+// clicked afterwards.
 - (void)goOn:(id)sender {
-  if ([_table clickedRow] >= 0) [defaultButton([[_table window] contentView]) performClick:nil];
+  if ([_table clickedRow] < 0) return;
+  [defaultButton([[_table window] contentView]) performSelector:@selector(performClick:)
+                                                     withObject:nil
+                                                     afterDelay:0];
 }
 
 - (void)showSelection {
@@ -161,8 +166,9 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   const NSInteger row = [_table selectedRow];
   if (row < 0) {
     [self showSelection];
-  } else {
-    _controller->choose(static_cast<std::size_t>(row));
+  } else if (const auto index = static_cast<std::size_t>(row);
+             index != _controller->selectionIndex()) {
+    _controller->choose(index);
   }
 }
 

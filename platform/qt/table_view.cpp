@@ -67,10 +67,12 @@ void takeSelection(QAbstractItemView* view, ArrayController& controller,
   }
 }
 
-void clickDefaultButton(const QWidget& window) {
+// Clicks the window's default button once the list has handled its own click, because the button's
+// action may remove the list. A button that is disabled now is not clicked later either.
+void clickDefaultButtonSoon(const QWidget& window) {
   for (QPushButton* const button : window.findChildren<QPushButton*>()) {
-    if (!button->isDefault() || !button->isVisible()) continue;
-    button->click();
+    if (!button->isDefault() || !button->isVisible() || !button->isEnabled()) continue;
+    QMetaObject::invokeMethod(button, &QPushButton::click, Qt::QueuedConnection);
     return;
   }
 }
@@ -96,11 +98,8 @@ void TableView::bind(ArrayController& controller) const {
                    [&controller](const QModelIndex& index) {
                      controller.choose(static_cast<std::size_t>(index.row()));
                    });
-  // The button's action may remove the list, so it runs after the list has handled the
-  // double-click.
-  QObject::connect(
-      view, &QAbstractItemView::doubleClicked, view,
-      [view] { clickDefaultButton(*view->window()); }, Qt::QueuedConnection);
+  QObject::connect(view, &QAbstractItemView::doubleClicked, view,
+                   [view] { clickDefaultButtonSoon(*view->window()); });
 }
 
 void TableView::setAllowsColumnReordering(bool allows) const {

@@ -79,7 +79,9 @@ class WirelessWays(WayTest):
                 "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
                 "IP address": address}})
 
-    def test_keyboard_or_accessible_tree_alone_is_enough(self):
+    def test_keyboard_or_accessible_tree_alone_is_enough_beside_closed_devices(self):
+        for number in (1, 2, 3):
+            self.add(f"closed {number} of {self.kind}", activeif="closed")
         self.add("Büro – 会議室", addresses=["127.0.90.1"], note="2nd floor")
         self.network.settle()
         ways = (self.use_keyboard,) if ON_GNUSTEP else (self.use_keyboard, self.use_accessible_tree)
@@ -98,6 +100,8 @@ class WirelessWays(WayTest):
         self.see_chooser(person, text)
         self.assertEqual(person.rows(), [
             ("Büro – 会議室", text["INST_TXT_CONNECTION_NETWORK"], "127.0.90.1")])
+        # A wait in vain would have started the set-up tool, after which there is no way back.
+        self.assertTrue(person.sees("push button", text["BTN_BACK"]))
         if not ON_GNUSTEP:
             person.press("Tab")
             person.open_menu()  # Tab leads from the list to the gear button
@@ -141,6 +145,8 @@ class WirelessWays(WayTest):
         person.see("label", TEXT["INST_WAIT"])
         person.close_window()
         person.press("Escape")
+        self.open_application_menu(person)
+        person.click("menu item", TEXT["APP_MENU_QUIT"])
         self.add_devices("One")
         self.see_chooser(person)
         person.close_window()
