@@ -4,8 +4,24 @@ from onscreen.person import Person
 from onscreen.processes import wait_for
 
 _LOCALES = {"en": "en_US"}
-_GEAR, _GEAR_REFRESH = "Actions", 2
+GEAR, GEAR_REFRESH = "Actions", 2
 _LONGEST_SEARCH = 60  # seconds; the wizard waits 15, but the machine may be busy
+
+
+def choose_model(person, model):
+    """Chooses a model with the keyboard, because it may be scrolled out of sight."""
+    person.see("list item")
+    while (selected := _selected_model(person)) != model:
+        person.press("Down")
+        wait_for(lambda: _selected_model(person) != selected, 10,
+                 f"the selection to move from {selected!r} towards {model!r}")
+
+
+def _selected_model(person):
+    return wait_for(lambda: next(
+        (name for role, name, item in person.everything()
+         if role == "list item" and person.has_state(item, "selected")), None),
+        10, "a selected model")
 
 
 class WentWrong(Exception):
@@ -63,10 +79,10 @@ class Tour:
             person.picture(self._pictures / "wireless-4-devices.png")
 
             self._let_devices(self._network.remove)
-            person.open_menu(_GEAR)
+            person.open_menu(GEAR)
             person.picture(self._pictures / "wireless-5-gear.png")
             person.press("Escape")
-            person.choose_from_menu(_GEAR, _GEAR_REFRESH)
+            person.choose_from_menu(GEAR, GEAR_REFRESH)
             self._wait_for_search(person, "wireless-6-search.png")
             person.see("label", self._text.get("INST_TXT_ALERT_DEVICENOTFOUND", "Device not found"))
             person.picture(self._pictures / "wireless-7-not-found.png")
@@ -76,7 +92,7 @@ class Tour:
 
             self._let_devices(self._network.add)
             self._network.settle()
-            person.choose_from_menu(_GEAR, _GEAR_REFRESH)
+            person.choose_from_menu(GEAR, GEAR_REFRESH)
             self._wait_for_search(person)
             person.click("table cell", _second_of(model))
             person.picture(self._pictures / "wireless-9-choice.png")
@@ -109,28 +125,12 @@ class Tour:
                  "the first page")
         on_list = person.sees("label", list_title)
         if on_list:
-            self._choose_model(person, model)
+            choose_model(person, model)
             person.picture(self._pictures / f"{way}-1-models.png")
             person.press("Return")
             person.see("label", title)
         person.picture(self._pictures / f"{way}-2-connection.png")
         return on_list
-
-    def _choose_model(self, person, model):
-        """Chooses a model with the keyboard, because it may be scrolled out of sight."""
-        person.see("list item")
-        person.press("Home")
-        while (selected := self._selected_model(person)) != model:
-            person.press("Down")
-            wait_for(lambda: self._selected_model(person) != selected, 10,
-                     f"the selection to move from {selected!r} towards {model!r}")
-
-    @staticmethod
-    def _selected_model(person):
-        return wait_for(lambda: next(
-            (name for role, name, item in person.everything()
-             if role == "list item" and person.has_state(item, "selected")), None),
-            10, "a selected model")
 
     def _wait_for_search(self, person, picture=None):
         person.see("label", self._text["INST_WAIT"])
