@@ -4,10 +4,10 @@ import pathlib
 import tempfile
 
 from onscreen import messages
-from onscreen.person import Person
 from onscreen.processes import wait_for
 
 from . import crowded
+from .person import Person
 from .ways import GEAR_REFRESH, choose_model
 
 LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")

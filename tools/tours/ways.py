@@ -1,7 +1,8 @@
 """Routes through the wizard, with a picture of each page."""
 
-from onscreen.person import Person
 from onscreen.processes import wait_for
+
+from .person import Person
 
 _LOCALES = {"en": "en_US"}
 GEAR, GEAR_REFRESH = "Actions", 2
