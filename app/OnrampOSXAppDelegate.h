@@ -244,7 +244,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void launchWLANTool(ToolStart start);
   void performTimerQuitMe();
   void performLaunchWLANTool(ToolStart start);
-  void setWaiting(Page* page, bool waiting);
+  void setWaiting(bool waiting);
   void waitOnMainLoop(std::chrono::seconds pause, int pausesLeft);
 
   Window window;

@@ -14,6 +14,14 @@ namespace onramp {
 
 namespace {
 
+void showProgressOn(Page* page, bool on) {
+  if (auto* const connections = dynamic_cast<ConnectionTypeView*>(page)) {
+    connections->progressON(on);
+  } else if (auto* const devices = dynamic_cast<ChooseDeviceView*>(page)) {
+    devices->progressON(on);
+  }
+}
+
 // The message texts are format strings, in which "%%" stands for a percent sign. The sheet shows
 // plain text, so "%%" is replaced by "%".
 std::string textOfFormat(std::string format) {
@@ -27,7 +35,8 @@ std::string textOfFormat(std::string format) {
 
 void OnrampOSXAppDelegate::showProgress(const std::shared_ptr<Page>& page,
                                         std::chrono::seconds pause) {
-  setWaiting(page.get(), true);
+  showProgressOn(page.get(), true);
+  setWaiting(true);
   {
     OperationQueue queue;
     if (!queue.addOperation([this, pause] { waitDeviceSearchTask(pause); })) {
@@ -35,16 +44,12 @@ void OnrampOSXAppDelegate::showProgress(const std::shared_ptr<Page>& page,
     }
     runModalForWindow(window);
   }
+  showProgressOn(page.get(), false);
   if (ChooseDeviceView* const search = chooser()) search->stopBrowsing();
-  setWaiting(page.get(), false);
+  setWaiting(false);
 }
 
-void OnrampOSXAppDelegate::setWaiting(Page* page, bool waiting) {
-  if (auto* const connections = dynamic_cast<ConnectionTypeView*>(page)) {
-    connections->progressON(waiting);
-  } else if (auto* const devices = dynamic_cast<ChooseDeviceView*>(page)) {
-    devices->progressON(waiting);
-  }
+void OnrampOSXAppDelegate::setWaiting(bool waiting) {
   rightButton.setEnabled(!waiting);
   leftButton.setEnabled(!waiting);
   rightMostButton.setEnabled(!waiting);

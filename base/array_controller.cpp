@@ -30,7 +30,10 @@ void ArrayController::removeObject(const Dictionary& entry) {
   std::optional<std::size_t> selection;
   for (std::size_t i = 0; i < entries_.size(); ++i) {
     if (selection_ == i) selection = kept;  // if this entry is removed, its successor moves here
-    if (entries_[i] == entry) continue;
+    if (entries_[i] == entry) {
+      if (selection_ == i) hasChoice_ = false;
+      continue;
+    }
     if (kept != i) entries_[kept] = std::move(entries_[i]);
     ++kept;
   }
@@ -78,9 +81,18 @@ void ArrayController::choose(std::size_t index) {
   setSelectionIndex(index);
 }
 
+void ArrayController::chooseObject(const Dictionary& entry) {
+  choose(indexOf(entry));
+}
+
 void ArrayController::setSelectedObject(const Dictionary& entry) {
+  setSelectionIndex(indexOf(entry));
+}
+
+// Returns the number of entries when no entry is equal.
+std::size_t ArrayController::indexOf(const Dictionary& entry) const {
   const auto found = std::find(entries_.begin(), entries_.end(), entry);
-  setSelectionIndex(static_cast<std::size_t>(found - entries_.begin()));
+  return static_cast<std::size_t>(found - entries_.begin());
 }
 
 std::optional<Dictionary> ArrayController::selectedObject() const {

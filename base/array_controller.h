@@ -45,10 +45,12 @@ class ArrayController {
   /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
   void setSelectedObject(const Dictionary& entry);
 
-  /// Selects the entry at `index` on behalf of the user. The bound table calls this function.
+  /// Select an entry, as setSelectionIndex() and setSelectedObject() do, on behalf of the user. The
+  /// bound table calls choose().
   void choose(std::size_t index);
+  void chooseObject(const Dictionary& entry);
 
-  /// Whether the user has chosen an entry since the last removeAllObjects().
+  /// Whether the user has chosen an entry, and that entry has not been removed since.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
   /// Return the index of the selected entry, and the entry itself. Both return nothing when no
@@ -63,6 +65,7 @@ class ArrayController {
 
  private:
   void entriesChanged();
+  [[nodiscard]] std::size_t indexOf(const Dictionary& entry) const;
 
   std::vector<Dictionary> entries_;
   std::optional<std::size_t> selection_;

@@ -7,7 +7,6 @@ set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
 set_target_properties(onramp PROPERTIES
   OUTPUT_NAME "Onramp OSX"
   RUNTIME_OUTPUT_DIRECTORY "${onramp_contents}/Linux")
-configure_file(${PROJECT_SOURCE_DIR}/resources/Info.plist.in ${PROJECT_BINARY_DIR}/Info.plist @ONLY)
 file(GLOB onramp_languages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.lproj)
 file(GLOB onramp_pictures CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.png)
 file(GLOB onramp_interfaces CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/${ONRAMP_UI}/*.*)

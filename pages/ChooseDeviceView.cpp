@@ -54,6 +54,7 @@ ChooseDeviceView::ChooseDeviceView(std::unique_ptr<Interface> interface)
 
 ChooseDeviceView::~ChooseDeviceView() {
   stopBrowsing();
+  destroyView();
 }
 
 void ChooseDeviceView::awakeFromNib() {
@@ -152,16 +153,17 @@ bool ChooseDeviceView::doesWiFi(const Dictionary& device) {
 
 void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   const Dictionary entry = entryFor(device);
-  const bool isSelected = deviceArrayController.selectedObject() == entry;
+  const bool isChoice =
+      deviceArrayController.hasChoice() && deviceArrayController.selectedObject() == entry;
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
   // The first row is selected until the user makes a choice. Later reports do not change that
   // choice.
-  if (!deviceArrayController.hasChoice()) {
+  if (isChoice) {
+    deviceArrayController.chooseObject(entry);
+  } else if (!deviceArrayController.hasChoice()) {
     deviceArrayController.setSelectionIndex(0);
-  } else if (isSelected) {
-    deviceArrayController.setSelectedObject(entry);
   }
 }
 

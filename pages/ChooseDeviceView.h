@@ -100,8 +100,6 @@ class ChooseDeviceView final : public Page,
   std::shared_ptr<KSBonjourSearch> mBonjourSearch;  ///< null when not browsing
   std::vector<std::string> searchModelList;
 
-  // The table view is bound to the controller, so the controller is declared first and destroyed
-  // last.
   ArrayController deviceArrayController;
   TableView deviceListView;
   TextField deviceListTitle;

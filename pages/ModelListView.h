@@ -15,6 +15,9 @@ namespace onramp {
 class ModelListView final : public Page {
  public:
   explicit ModelListView(std::unique_ptr<Interface> interface);
+  ModelListView(const ModelListView&) = delete;
+  ModelListView& operator=(const ModelListView&) = delete;
+  ~ModelListView() override { destroyView(); }
 
   /// The name of the selected model; nothing when no model is selected.
   [[nodiscard]] std::optional<std::string> choosedModelName() const;
@@ -26,8 +29,6 @@ class ModelListView final : public Page {
   void awakeFromNib();
   void addModelToList();
 
-  // The table view is bound to the controller, so the controller is declared first and destroyed
-  // last.
   ArrayController modelArrayController;
   TableView modelListView;
   TextField modelListTitle;

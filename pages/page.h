@@ -27,6 +27,10 @@ class Page {
     return interface_->outlet<Handle>(name);
   }
 
+  /// Destroys the view. A page whose members are bound to the view must call this function in its
+  /// destructor, because the members are destroyed before the base class.
+  void destroyView() { interface_.reset(); }
+
  private:
   std::unique_ptr<Interface> interface_;
 };

@@ -5,15 +5,9 @@
 
 #include <memory>
 
-namespace onramp::avahi {
+#include "base/released_by.h"
 
-template <auto release>
-struct ReleasedBy {
-  template <typename Object>
-  void operator()(Object* object) const {
-    release(object);
-  }
-};
+namespace onramp::avahi {
 
 template <typename Object, auto release>
 using Handle = std::unique_ptr<Object, ReleasedBy<release>>;

@@ -46,7 +46,7 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
 
   [[nodiscard]] std::vector<Data> addressing() const override {
     std::vector<Data> addresses;
-    const CFArrayRef array = CFNetServiceGetAddressing(service_.get());
+    const CFArrayRef array = isResolved_ ? CFNetServiceGetAddressing(service_.get()) : nullptr;
     const CFIndex count = array ? CFArrayGetCount(array) : 0;
     for (CFIndex index = 0; index < count; ++index) {
       addresses.push_back(
@@ -56,7 +56,7 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   }
 
   [[nodiscard]] std::optional<Data> txtData() const override {
-    const CFDataRef data = CFNetServiceGetTXTData(service_.get());
+    const CFDataRef data = isResolved_ ? CFNetServiceGetTXTData(service_.get()) : nullptr;
     return data ? std::optional(corefoundation::toData(data)) : std::nullopt;
   }
 
@@ -79,7 +79,10 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   }
 
   bool resolveWithTimeout(double seconds) override {
-    return CFNetServiceResolveWithTimeout(service_.get(), seconds, nullptr);
+    isResolved_ = false;
+    const bool done = CFNetServiceResolveWithTimeout(service_.get(), seconds, nullptr);
+    if (!client_) isResolved_ = done;
+    return done;
   }
 
   void cancel() override { CFNetServiceCancel(service_.get()); }
@@ -88,12 +91,14 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   // `self` keeps this object alive, because the client may release the last other handle.
   static void resolved(CFNetServiceRef, CFStreamError* error, void* info) {
     const auto self = static_cast<CFService*>(info)->shared_from_this();
+    self->isResolved_ = !error || error->error == 0;
     if (self->client_) self->client_(self, {error ? error->error : 0}, self->info_);
   }
 
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
+  bool isResolved_ = false;  ///< the framework may keep what an earlier resolve found
 };
 
 }  // namespace

@@ -1,5 +1,6 @@
 #include <CoreServices/CoreServices.h>
 
+#include <algorithm>
 #include <chrono>
 #include <memory>
 #include <utility>
@@ -88,9 +89,27 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     const NetServiceRef service =
         cfnetwork::handleOf(static_cast<CFNetServiceRef>(const_cast<void*>(found)));
     if (!service) return;
-    std::erase(self->found_, service);
-    if ((flags & kNetServiceFlagRemove) == 0) self->found_.push_back(service);
-    self->client_(self, flags, service, {}, self->info_);
+    if (const NetServiceRef changed = self->count(service, (flags & kNetServiceFlagRemove) == 0)) {
+      self->client_(self, flags, changed, {}, self->info_);
+    }
+  }
+
+  // Counts the sightings of a service, which may be one for each network interface, and each with
+  // another object. Returns the service when it is found or gone, and null in between.
+  NetServiceRef count(const NetServiceRef& service, bool isSeen) {
+    const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
+      return found.service->name() == service->name() && found.service->type() == service->type() &&
+             found.service->domain() == service->domain();
+    });
+    if (known == found_.end()) {
+      if (isSeen) found_.push_back({service, 1});
+      return isSeen ? service : nullptr;
+    }
+    known->sightings += isSeen ? 1 : -1;
+    if (known->sightings > 0) return nullptr;
+    NetServiceRef gone = std::move(known->service);
+    found_.erase(known);
+    return gone;
   }
 
   // A search fails, for instance, when the responder goes away. All services are reported as gone,
@@ -103,8 +122,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     retryLater();
     const unsigned long search = search_;
     const auto self = shared_from_this();
-    for (const NetServiceRef& service : std::exchange(found_, {})) {
-      if (search == search_) client_(self, kNetServiceFlagRemove, service, {}, info_);
+    for (const Found& found : std::exchange(found_, {})) {
+      if (search == search_) client_(self, kNetServiceFlagRemove, found.service, {}, info_);
     }
     if (search == search_) client_(self, 0, nullptr, error, info_);
   }
@@ -118,12 +137,17 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     });
   }
 
+  struct Found {
+    NetServiceRef service;
+    int sightings;
+  };
+
   Client client_;
   void* info_;
   Reference<CFNetServiceBrowserRef> browser_;
   Reference<CFStringRef> domain_;  ///< of the running search; null when there is none
   Reference<CFStringRef> type_;
-  std::vector<NetServiceRef> found_;
+  std::vector<Found> found_;
   unsigned long search_ = 0;  ///< number of this search; retries of earlier ones are ignored
   bool isFailed_ = false;     ///< a retry is pending
 };

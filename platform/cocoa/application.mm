@@ -10,14 +10,20 @@
 /// Forwards the application's and the window's events and questions to the controller.
 @interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
   onramp::ApplicationDelegate* _delegate;
+  onramp::Window _window;
 }
 @end
 
 @implementation OnrampDelegate
 
-- (instancetype)initWithDelegate:(onramp::ApplicationDelegate&)delegate {
+- (instancetype)initWithDelegate:(onramp::ApplicationDelegate&)delegate
+                          window:(const onramp::Window&)window {
   self = [super init];
-  if (self) _delegate = &delegate;
+  if (self) {
+    _delegate = &delegate;
+    _window = window;
+    [onramp::cocoa::nativeOf<NSWindow>(window) setDelegate:self];
+  }
   return self;
 }
 
@@ -33,6 +39,13 @@
   return _delegate->applicationShouldTerminateAfterLastWindowClosed();
 }
 
+// Quit from the menu is refused when closing the window would be.
+- (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
+  if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
+  NSBeep();
+  return NSTerminateCancel;
+}
+
 - (BOOL)applicationSupportsSecureRestorableState:(NSApplication*)application {
   return YES;
 }
@@ -42,7 +55,7 @@
 }
 
 - (BOOL)windowShouldClose:(NSWindow*)window {
-  return _delegate->windowShouldClose(onramp::Window(onramp::cocoa::toNative(window)));
+  return _delegate->windowShouldClose(_window);
 }
 
 @end
@@ -63,10 +76,10 @@ int runApplication(int, char**, const std::string& mainInterfaceName,
                    Bundle::main().path().c_str(), mainInterfaceName.c_str());
       return 1;
     }
-    const auto listener =
-        Retained<OnrampDelegate>::adopt([[OnrampDelegate alloc] initWithDelegate:*delegate]);
+    const auto listener = Retained<OnrampDelegate>::adopt([[OnrampDelegate alloc]
+        initWithDelegate:*delegate
+                  window:mainInterface->outlet<Window>("window")]);
     [application setDelegate:listener.get()];
-    [cocoa::nativeOf<NSWindow>(mainInterface->outlet<Window>("window")) setDelegate:listener.get()];
     delegate->setOutlets(*mainInterface);
     delegate->awakeFromNib();
     [application run];
@@ -75,6 +88,7 @@ int runApplication(int, char**, const std::string& mainInterfaceName,
 }
 
 void terminateApplication() {
+  beginTermination();
   [NSApp terminate:nil];
 }
 

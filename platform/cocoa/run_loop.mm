@@ -2,10 +2,12 @@
 
 #import <AppKit/AppKit.h>
 
+#include <atomic>
 #include <utility>
 
 #include "platform/application.h"
 #import "platform/cocoa/action.h"
+#import "platform/cocoa/focus.h"
 #import "platform/cocoa/native.h"
 
 namespace onramp {
@@ -17,8 +19,14 @@ NSArray* allModes() {
                                    NSEventTrackingRunLoopMode, nil];
 }
 
-// Whether the running modal loop was asked to end. Main thread only.
+// The number of modal loops that run now, and whether the innermost one was asked to end. Main
+// thread only.
+int modalLoops = 0;
 bool isModalAborted = false;
+
+// True from abortModal() until the modal loop has returned. Each posted action may occupy the main
+// thread for seconds, so posted actions are held back meanwhile.
+std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if its timer fires again inside a loop that
 // the action runs. The action is destroyed on the thread that ran it, even if another thread
@@ -27,6 +35,27 @@ OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
   }];
+}
+
+void post(std::function<void()> action) {
+  @autoreleasepool {
+    [once(std::move(action)) performSelectorOnMainThread:@selector(perform:)
+                                              withObject:nil
+                                           waitUntilDone:NO
+                                                   modes:allModes()];
+  }
+}
+
+// Drops the clicks and keys that arrived while the main thread was busy, because they were meant
+// for the page that was shown then. Timers and actions do not run in the mode used here.
+void dropWaitingInput() {
+  const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
+                           NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;
+  while ([NSApp nextEventMatchingMask:input
+                            untilDate:[NSDate distantPast]
+                               inMode:@"OnrampDropInput"
+                              dequeue:YES]) {
+  }
 }
 
 // Posts an empty event, because a modal loop checks whether it was stopped only after it has
@@ -58,17 +87,21 @@ void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action
 }
 
 void performOnMainThread(std::function<void()> action) {
-  @autoreleasepool {
-    [once(std::move(action)) performSelectorOnMainThread:@selector(perform:)
-                                              withObject:nil
-                                           waitUntilDone:NO
-                                                   modes:allModes()];
-  }
+  post([action = std::move(action)]() mutable {
+    if (isAborting && modalLoops > 0) {
+      performOnMainThread(std::move(action));
+    } else {
+      action();
+    }
+  });
 }
 
 // AppKit may end a modal loop without being asked, for example when the user presses a key that
 // cancels. The loop is then run again.
 void runModalForWindow(const Window& window) {
+  // Showing the window may already run an action that ends the loop.
+  isModalAborted = false;
+  ++modalLoops;
   // AppKit does not show windows of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
@@ -77,15 +110,24 @@ void runModalForWindow(const Window& window) {
   // runs.
   NSButton* const closeButton = [modal standardWindowButton:NSWindowCloseButton];
   [closeButton setEnabled:NO];
-  isModalAborted = !modal;
-  while (!isModalAborted)
+  while (modal && !isModalAborted)
     [NSApp runModalForWindow:modal];
+  --modalLoops;
+  isAborting = false;
+  dropWaitingInput();
   [closeButton setEnabled:YES];
+  cocoa::focusFirstControl([modal contentView]);
 }
 
 void abortModal() {
-  performOnMainThread([] {
+  isAborting = true;
+  post([] {
+    if (modalLoops == 0) {
+      isAborting = false;
+      return;
+    }
     isModalAborted = true;
+    if (![NSApp modalWindow]) return;  // the window is not shown yet
     [NSApp stopModalWithCode:NSModalResponseAbort];
     wakeEventLoop();
   });

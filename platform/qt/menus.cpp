@@ -6,10 +6,8 @@
 #include <QMenuBar>
 #include <QMessageBox>
 
-#include "platform/application.h"
 #include "platform/bundle.h"
 #include "platform/outlets.h"
-#include "platform/qt/loops.h"
 #include "platform/qt/native.h"
 
 namespace onramp {
@@ -47,8 +45,9 @@ void showAboutPanel(QWidget* window, const QString& title) {
 namespace qt {
 
 void nameMenuAfterProduct(const QMenuBar& bar) {
-  if (bar.actions().isEmpty()) return;
-  bar.actions().first()->setText(QLatin1Char('&') + titleText(information("CFBundleName")));
+  const QString name = titleText(information("CFBundleName"));
+  if (bar.actions().isEmpty() || name.isEmpty()) return;
+  bar.actions().first()->setText(QLatin1Char('&') + name);
 }
 
 void connectStandardMenuItems(QWidget* window) {
@@ -66,9 +65,7 @@ void connectStandardMenuItems(QWidget* window) {
     } else if (action == QLatin1String("hideOtherApplications:")) {
       item->setEnabled(false);  // only the desktop can hide other programs' windows
     } else if (action == QLatin1String("terminate:")) {
-      QObject::connect(item, &QAction::triggered, window, [] {
-        if (!isModal()) terminateApplication();
-      });
+      QObject::connect(item, &QAction::triggered, window, &QWidget::close);
     }
   }
 }

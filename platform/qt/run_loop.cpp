@@ -23,6 +23,10 @@ std::vector<QEventLoop*>& modalLoops() {
   return loops;
 }
 
+bool isModal() {
+  return !modalLoops().empty();
+}
+
 // True from abortModal() until the modal loop has returned. Each posted action may occupy the main
 // thread for seconds, so posted actions are held back until then.
 std::atomic<bool> isAborting = false;
@@ -30,10 +34,6 @@ std::atomic<bool> isAborting = false;
 }  // namespace
 
 namespace qt {
-
-bool isModal() {
-  return !modalLoops().empty();
-}
 
 void endAllLoops() {
   beginTermination();
@@ -53,7 +53,7 @@ void performOnMainThread(std::function<void()> action) {
       qApp,
       [action = std::move(action)]() mutable {
         if (isTerminating()) return;
-        if (isAborting && qt::isModal()) {
+        if (isAborting && isModal()) {
           performOnMainThread(std::move(action));
         } else {
           action();

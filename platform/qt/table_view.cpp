@@ -55,21 +55,24 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
 }
 
 // Passes the row that the user selected to the controller, or selects the controller's row again
-// when the user deselected it.
-void takeSelection(QAbstractItemView* view, ArrayController& controller) {
-  const QModelIndexList rows = view->selectionModel()->selectedRows();
-  if (rows.isEmpty()) {
+// when the user deselected it. An assistive program deselects the old row before it selects another
+// one, so both rows are selected for a moment and only `added` tells which one is meant.
+void takeSelection(QAbstractItemView* view, ArrayController& controller,
+                   const QItemSelection& added) {
+  if (!view->selectionModel()->hasSelection()) {
     showSelection(view, controller);
-    return;
+  } else if (!added.isEmpty()) {
+    const auto row = static_cast<std::size_t>(added.first().top());
+    if (row != controller.selectionIndex()) controller.choose(row);
   }
-  const auto row = static_cast<std::size_t>(rows.first().row());
-  if (row != controller.selectionIndex()) controller.choose(row);
 }
 
-void clickDefaultButton(const QWidget& window) {
+// Clicks the window's default button once the list has handled its own click, because the button's
+// action may remove the list. A button that is disabled now is not clicked later either.
+void clickDefaultButtonSoon(const QWidget& window) {
   for (QPushButton* const button : window.findChildren<QPushButton*>()) {
-    if (!button->isDefault() || !button->isVisible()) continue;
-    button->click();
+    if (!button->isDefault() || !button->isVisible() || !button->isEnabled()) continue;
+    QMetaObject::invokeMethod(button, &QPushButton::click, Qt::QueuedConnection);
     return;
   }
 }
@@ -88,17 +91,15 @@ void TableView::bind(ArrayController& controller) const {
         showSelection(view, controller);
       },
       [view, &controller] { showSelection(view, controller); });
-  QObject::connect(view->selectionModel(), &QItemSelectionModel::selectionChanged, view,
-                   [view, &controller] { takeSelection(view, controller); });
+  QObject::connect(
+      view->selectionModel(), &QItemSelectionModel::selectionChanged, view,
+      [view, &controller](const QItemSelection& added) { takeSelection(view, controller, added); });
   QObject::connect(view, &QAbstractItemView::pressed, view,
                    [&controller](const QModelIndex& index) {
                      controller.choose(static_cast<std::size_t>(index.row()));
                    });
-  // The button's action may remove the list, so it runs after the list has handled the
-  // double-click.
-  QObject::connect(
-      view, &QAbstractItemView::doubleClicked, view,
-      [view] { clickDefaultButton(*view->window()); }, Qt::QueuedConnection);
+  QObject::connect(view, &QAbstractItemView::doubleClicked, view,
+                   [view] { clickDefaultButtonSoon(*view->window()); });
 }
 
 void TableView::setAllowsColumnReordering(bool allows) const {

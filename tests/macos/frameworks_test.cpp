@@ -65,7 +65,7 @@ void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
   browser.client(&browser, flags, found, &error, browser.info);
 }
 
-TEST(CFNetworkBrowser, ReportsFoundAndRemovedServices) {
+TEST(CFNetworkBrowser, ReportsAServiceWithItsFirstSightingAndItsLast) {
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
   seen.browser->schedule();
@@ -81,7 +81,11 @@ TEST(CFNetworkBrowser, ReportsFoundAndRemovedServices) {
   EXPECT_EQ(seen.flags, kNetServiceFlagMoreComing);
 
   const NetServiceRef first = seen.service;
+  const auto again = makeService();
+  deliver(0, again.get(), 0);
   deliver(kNetServiceFlagRemove, service.get(), 0);
+  EXPECT_EQ(seen.events, 1);
+  deliver(kNetServiceFlagRemove, again.get(), 0);
   EXPECT_EQ(seen.service, first);
   EXPECT_EQ(seen.flags, kNetServiceFlagRemove);
 }
@@ -130,24 +134,25 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient)
   seen.service = NetService::create("local.", "_ipp._tcp.", "Büro", 0);
   auto* native = standin::Service::last;
   const auto kept = Reference<CFNetServiceRef>::retaining(native);
-  EXPECT_TRUE(seen.service->addressing().empty());
-  EXPECT_EQ(seen.service->txtData(), std::nullopt);
-
   seen.service->setClient(Seen::resolved, &seen);
   seen.service->schedule();
   EXPECT_TRUE(seen.service->resolveWithTimeout(5));
   EXPECT_TRUE(native->isScheduled && native->isRunning);
-
   standin::Object addresses(standin::kArray), txt(standin::kData, std::string("\3a=1", 4));
   addresses.members = {new standin::Object(standin::kData, "one"),
                        new standin::Object(standin::kData, std::string("t\0o", 3))};
   native->addresses = &addresses;
   native->txt = &txt;
-  EXPECT_THAT(seen.service->addressing(),
-              ElementsAre(bytesOf("one"), bytesOf(std::string("t\0o", 3))));
-  EXPECT_EQ(seen.service->txtData(), bytesOf("\3a=1"));
+  NetServiceRef service = seen.service;
+  CFStreamError error = {0, 0};
+  native->client(native, &error, native->info);
+  EXPECT_THAT(service->addressing(), ElementsAre(bytesOf("one"), bytesOf(std::string("t\0o", 3))));
+  EXPECT_EQ(service->txtData(), bytesOf("\3a=1"));
 
-  CFStreamError error = {0, kNetServiceErrorTimeout};
+  EXPECT_TRUE(service->resolveWithTimeout(5));
+  EXPECT_TRUE(service->addressing().empty() && !service->txtData()) << "the last resolve's";
+  seen.service = std::move(service);
+  error.error = kNetServiceErrorTimeout;
   native->client(native, &error, native->info);
   EXPECT_EQ(seen.code, kNetServiceErrorTimeout);
   EXPECT_FALSE(native->isScheduled || native->isRunning || native->client);

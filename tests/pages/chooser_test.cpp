@@ -150,6 +150,9 @@ TEST_F(Chooser, SortsByNameAndSelectsTheFirstRowUntilTheUserChoosesOne) {
   for (const char* name : {"a", "b", "C"})
     page->updateKSDevice(device(name));
   EXPECT_THAT(rows(), ElementsAre("C 192.0.2.1", "a 192.0.2.1", "b 192.0.2.1*"));
+  page->removeKSDevice(device("b"));
+  page->updateKSDevice(device("B"));
+  EXPECT_THAT(rows(), ElementsAre("B 192.0.2.1*", "C 192.0.2.1", "a 192.0.2.1"));
 }
 
 TEST_F(Chooser, AnUpdateWithAnotherAddressKeepsTheOldEntry) {

@@ -53,6 +53,13 @@ class WayTest(unittest.TestCase):
         program = self.medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
         return self.enterContext(Person(self.desktop, program, arguments, env))
 
+    @staticmethod
+    def open_application_menu(person):
+        if ON_GNUSTEP:
+            person.click("menu item", "Onramp OSX")
+        else:
+            person.press("F10")
+
     def files(self):
         """Returns the contents of the files for the package by short names, such as "instmodel"."""
         found = {}

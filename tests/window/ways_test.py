@@ -59,10 +59,7 @@ class Ways(WayTest):
         german = messages.read(BUILT, "de")
         person = self.start(TWO_MODELS, env={"LANG": "de_DE.UTF-8"})
         person.see("list item", "Kestrel 1")
-        if ON_GNUSTEP:
-            person.click("menu item", "Onramp OSX")
-        else:
-            person.press("F10")
+        self.open_application_menu(person)
         for key in ("ABOUT", "HIDE", "HIDEOHTERS", "SHOWALL"):
             person.see("menu item", german["APP_MENU_" + key])
         person.click("menu item", german["APP_MENU_QUIT"])

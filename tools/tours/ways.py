@@ -2,15 +2,32 @@
 
 import contextlib
 
-from onscreen.person import Person
 from onscreen.processes import wait_for
 
-_GEAR_REFRESH = 2
+from .person import Person
+
+GEAR_REFRESH = 2
 _ALERT = "BTN_CLOSE"
 # The texts that tell the first pages apart: key, role, and what the wizard shows without the text.
 _FIRST_PAGES = (("INST_TXT_CONNECTIONTYPE", "label", "INST_TXT_CONNECTIONTYPE"),
                 ("INST_TXT_MODEL", "label", "INST_TXT_MODEL"), (_ALERT, "push button", "Close"))
 _LONGEST_SEARCH = 60  # seconds; the wizard waits 15, but the machine may be busy
+
+
+def choose_model(person, model):
+    """Chooses a model with the keyboard, because it may be scrolled out of sight."""
+    person.see("list item")
+    while (selected := _selected_model(person)) != model:
+        person.press("Down")
+        wait_for(lambda: _selected_model(person) != selected, 10,
+                 f"the selection to move from {selected!r} towards {model!r}")
+
+
+def _selected_model(person):
+    return wait_for(lambda: next(
+        (name for role, name, item in person.everything()
+         if role == "list item" and person.has_state(item, "selected")), None),
+        10, "a selected model")
 
 
 class WentWrong(Exception):
@@ -87,7 +104,7 @@ class Tour:
             person.open_menu(self._medium.gear)
             person.picture(self._pictures / "wireless-5-gear.png")
             person.press("Escape")
-            person.choose_from_menu(self._medium.gear, _GEAR_REFRESH)
+            person.choose_from_menu(self._medium.gear, GEAR_REFRESH)
             self._wait_for_search(person, "wireless-6-search.png")
             person.see("label", self._text.get("INST_TXT_ALERT_DEVICENOTFOUND", "Device not found"))
             person.picture(self._pictures / "wireless-7-not-found.png")
@@ -97,7 +114,7 @@ class Tour:
 
             self._let_devices(self._network.add)
             self._network.settle()
-            person.choose_from_menu(self._medium.gear, _GEAR_REFRESH)
+            person.choose_from_menu(self._medium.gear, GEAR_REFRESH)
             self._wait_for_search(person)
             person.click("table cell", _second_of(model))
             person.picture(self._pictures / "wireless-9-choice.png")
@@ -151,28 +168,12 @@ class Tour:
         title = self._text["INST_TXT_CONNECTIONTYPE"]
         on_list = self._first_page(person) == "INST_TXT_MODEL"
         if on_list:
-            self._choose_model(person, model)
+            choose_model(person, model)
             person.picture(self._pictures / f"{way}-1-models.png")
             person.press("Return")
             person.see("label", title)
         person.picture(self._pictures / f"{way}-2-connection.png")
         return on_list
-
-    def _choose_model(self, person, model):
-        """Chooses a model with the keyboard, because it may be scrolled out of sight."""
-        person.see("list item")
-        person.press("Home")
-        while (selected := self._selected_model(person)) != model:
-            person.press("Down")
-            wait_for(lambda: self._selected_model(person) != selected, 10,
-                     f"the selection to move from {selected!r} towards {model!r}")
-
-    @staticmethod
-    def _selected_model(person):
-        return wait_for(lambda: next(
-            (name for role, name, item in person.everything()
-             if role == "list item" and person.has_state(item, "selected")), None),
-            10, "a selected model")
 
     def _wait_for_search(self, person, picture=None):
         person.see("label", self._text["INST_WAIT"])

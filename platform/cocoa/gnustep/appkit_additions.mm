@@ -30,12 +30,16 @@ void ignore(id, SEL, BOOL) {}
   NSWindow* _window;
   id _delegate;
   SEL _didEnd;
+  BOOL _hasBegun;
 }
 @end
 
 @implementation OnrampWaitingSheet
 
+// The timer fires again inside the sheet's loop when that runs in another mode.
 - (void)begin {
+  if (_hasBegun) return;
+  _hasBegun = YES;
   originalBeginSheet(_alert,
                      @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:),
                      _window, _delegate, _didEnd, nullptr);
@@ -59,7 +63,11 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
   sheet->_window = [window retain];
   sheet->_delegate = delegate;
   sheet->_didEnd = didEnd;
-  [sheet performSelector:@selector(begin) withObject:nil afterDelay:0];
+  [sheet performSelector:@selector(begin)
+              withObject:nil
+              afterDelay:0
+                 inModes:[NSArray
+                             arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
 // The application exchanges no notifications with other applications. GNUstep would start a daemon

@@ -24,9 +24,27 @@ NSString* contentsOf(NSString* bundlePath) {
   return isFolder(contents) ? contents : bundlePath;
 }
 
+// The folder of the first of the user's languages, if the bundle has it. GNUstep looks for
+// "zh_CN.lproj" only under names such as "SimplifiedChinese.lproj".
+NSString* firstLanguageFolder(NSString* rootPath, NSString* subPath) {
+  NSArray* const languages =
+      [[NSUserDefaults standardUserDefaults] stringArrayForKey:@"NSLanguages"];
+  NSString* const folder = [[[[rootPath stringByAppendingPathComponent:@"Resources"]
+      stringByAppendingPathComponent:subPath ? subPath : @""]
+      stringByAppendingPathComponent:[languages objectAtIndex:0]]
+      stringByAppendingPathExtension:@"lproj"];
+  return isFolder(folder) ? folder : nil;
+}
+
 NSArray* resourcePaths(id self, SEL selector, NSString* rootPath, NSString* subPath,
                        NSString* localization) {
-  return originalResourcePaths(self, selector, contentsOf(rootPath), subPath, localization);
+  NSString* const contents = contentsOf(rootPath);
+  NSArray* const paths = originalResourcePaths(self, selector, contents, subPath, localization);
+  NSString* const first = localization ? nil : firstLanguageFolder(contents, subPath);
+  if (!first || [paths count] == 0) return paths;
+  NSMutableArray* const all = [NSMutableArray arrayWithArray:paths];
+  [all insertObject:first atIndex:1];  // after the folder of what is in no language
+  return all;
 }
 
 NSString* resourcePath(id self, SEL) {

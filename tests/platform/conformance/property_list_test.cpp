@@ -60,8 +60,6 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
                                "<html><body/></html>",
                                whole.substr(0, whole.size() - 12),
                                plistWith("\xFF"),
-                               plistWith(std::string("<string>\0</string>", 18)),
-                               plistWith("<string>&unknown;</string>"),
                                "bplist00",
                                "bplist00" + std::string(40, '\xFF')};
   const TemporaryFolder folder;
@@ -71,6 +69,14 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
   EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
   EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
   EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "the pipe has no writer";
+}
+
+TEST(PropertyList, IsNothingWhenItsXMLIsNotWellFormed) {
+  const TemporaryFolder folder;
+  for (const std::string& text : {std::string("\0", 1), std::string("&unknown;")}) {
+    const std::string bytes = plistWith("<string>" + text + "</string>");
+    EXPECT_EQ(loadDictionary(folder.holding("list", bytes)), std::nullopt) << bytes;
+  }
 }
 
 TEST(PropertyList, IsWrittenWholeOrNotAtAll) {
