@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <cstdint>
 #include <memory>
 #include <optional>
@@ -115,12 +116,12 @@ class NetService {
   virtual void schedule() = 0;
   virtual void unschedule() = 0;
 
-  /// Asks the network for the service's addresses and TXT record. If `seconds` is 0 or less, there
-  /// is no time limit, and only success or cancel() ends the resolve. With a client, returns at
-  /// once whether the resolve has started, and calls the client when the resolve ends. Without a
+  /// Asks the network for the service's addresses and TXT record. If `timeLimit` is 0 or less,
+  /// there is no time limit, and only success or cancel() ends the resolve. With a client, returns
+  /// at once whether the resolve has started, and calls the client when the resolve ends. Without a
   /// client, blocks until the resolve ends and returns whether it succeeded. Returns false when
   /// another resolve of the service is running.
-  virtual bool resolveWithTimeout(double seconds) = 0;
+  virtual bool resolveWithTimeout(std::chrono::duration<double> timeLimit) = 0;
 
   /// Cancels the running resolve, if there is one, without calling the client.
   virtual void cancel() = 0;
