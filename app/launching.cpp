@@ -4,6 +4,7 @@
 
 #include "app/OnrampOSXAppDelegate.h"
 #include "base/ascii.h"
+#include "base/maker.h"
 #include "base/text.h"
 #include "media/KSOROSXCD.h"
 #include "platform/bundle.h"
@@ -16,8 +17,6 @@
 namespace onramp {
 
 namespace {
-
-constexpr std::string_view kSupportSite = "http://support.kestrel.example";
 
 // How long the package has to open before the application terminates.
 constexpr std::chrono::milliseconds kQuitDelay{1000};
@@ -101,7 +100,7 @@ std::optional<std::string> OnrampOSXAppDelegate::FAQ_URL() {
       KSOROSXCD::initWithCDInfo().string(KSOROSXCD::kKSCSeriesCode).value_or("");
   const std::string path = "/g/d/c2f2/" + series + "/" + localeLanguageCode() + "/" +
                            asciiLowercased(localeCountryCode()) + "/";
-  return isURLText(path) ? std::optional(std::string(kSupportSite) + path) : std::nullopt;
+  return isURLText(path) ? std::optional(std::string(maker::kSupportSite) + path) : std::nullopt;
 }
 
 void OnrampOSXAppDelegate::openURL(const std::optional<std::string>& url) {

@@ -1,5 +1,6 @@
 #include "bonjour/KSNetService.h"
 
+#include <chrono>
 #include <cstddef>
 #include <cstdint>
 
@@ -68,7 +69,7 @@ int KSNetServiceResolveAsync(const NetServiceRef& service, ServiceClientCallback
   KSNetServiceCancelResolve(service);
   service->setClient(KSNetServiceResolveCallBack, callbacks);
   service->schedule();
-  service->resolveWithTimeout(0.0);
+  service->resolveWithTimeout(std::chrono::seconds(0));
   return 0;
 }
 
@@ -86,7 +87,7 @@ void KSNetServiceResolveCallBack(const NetServiceRef& service, const NetServiceE
 int KSNetServiceResolveSync(const NetServiceRef& service, double timeout) {
   if (!service) return 1;
   KSNetServiceCancelResolve(service);
-  const bool resolved = service->resolveWithTimeout(timeout);
+  const bool resolved = service->resolveWithTimeout(std::chrono::duration<double>(timeout));
   service->cancel();
   return resolved ? 0 : 1;
 }

@@ -4,7 +4,6 @@
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_application "${ONRAMP_MEDIUM}/Onramp OSX.app")
 
-configure_file(${PROJECT_SOURCE_DIR}/resources/Info.plist.in ${PROJECT_BINARY_DIR}/Info.plist @ONLY)
 set_target_properties(onramp PROPERTIES
   OUTPUT_NAME "Onramp OSX"
   MACOSX_BUNDLE ON

@@ -7,7 +7,6 @@ set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
 set_target_properties(onramp PROPERTIES
   OUTPUT_NAME "Onramp OSX"
   RUNTIME_OUTPUT_DIRECTORY "${onramp_contents}/Linux")
-configure_file(${PROJECT_SOURCE_DIR}/resources/Info.plist.in ${PROJECT_BINARY_DIR}/Info.plist @ONLY)
 file(GLOB onramp_languages CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.lproj)
 file(GLOB onramp_pictures CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/*.png)
 file(GLOB onramp_interfaces CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/resources/${ONRAMP_UI}/*.*)
@@ -33,3 +32,10 @@ add_custom_target(medium ALL
   DEPENDS onramp
   COMMENT "Assembling the medium"
   VERBATIM)
+
+set(onramp_installed "${CMAKE_INSTALL_LIBDIR}/onramp/medium/Onramp OSX.app/Contents")
+install(TARGETS onramp DESTINATION "${onramp_installed}/Linux")
+install(FILES ${PROJECT_BINARY_DIR}/Info.plist DESTINATION "${onramp_installed}")
+install(FILES ${onramp_interfaces} ${onramp_pictures} ${PROJECT_SOURCE_DIR}/resources/SupportedKOL.plist
+  DESTINATION "${onramp_installed}/Resources")
+install(DIRECTORY ${onramp_languages} DESTINATION "${onramp_installed}/Resources")

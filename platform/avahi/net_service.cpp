@@ -14,11 +14,10 @@ namespace avahi {
 
 namespace {
 
-std::optional<std::chrono::milliseconds> timeLimitOf(double seconds) {
-  constexpr double kLongest = 365.0 * 24 * 60 * 60;
-  if (!(seconds > 0)) return std::nullopt;
-  return std::chrono::ceil<std::chrono::milliseconds>(
-      std::chrono::duration<double>(std::min(seconds, kLongest)));
+std::optional<std::chrono::milliseconds> timeLimitOf(std::chrono::duration<double> limit) {
+  constexpr std::chrono::duration<double> kLongest = std::chrono::years(1);
+  if (!(limit.count() > 0)) return std::nullopt;
+  return std::chrono::ceil<std::chrono::milliseconds>(std::min(limit, kLongest));
 }
 
 class Service final : public NetService, public std::enable_shared_from_this<Service> {
@@ -43,7 +42,7 @@ class Service final : public NetService, public std::enable_shared_from_this<Ser
   void schedule() override { isScheduled_ = true; }
   void unschedule() override { isScheduled_ = false; }
 
-  bool resolveWithTimeout(double seconds) override;
+  bool resolveWithTimeout(std::chrono::duration<double> timeLimit) override;
   void cancel() override {
     resolve_.reset();
     daemon_.reset();
@@ -68,11 +67,11 @@ class Service final : public NetService, public std::enable_shared_from_this<Ser
   unsigned long resolves_ = 0;  ///< number of this resolve; late ends of earlier ones are ignored
 };
 
-bool Service::resolveWithTimeout(double seconds) {
+bool Service::resolveWithTimeout(std::chrono::duration<double> timeLimit) {
   if (resolve_) return false;
   addressing_.clear();
   txt_.reset();
-  return client_ ? startResolve(timeLimitOf(seconds)) : resolveNow(timeLimitOf(seconds));
+  return client_ ? startResolve(timeLimitOf(timeLimit)) : resolveNow(timeLimitOf(timeLimit));
 }
 
 // The client is called from the main loop, not from inside the daemon's loop. It may therefore

@@ -78,9 +78,9 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
     CFNetServiceUnscheduleFromRunLoop(service_.get(), CFRunLoopGetCurrent(), kCFRunLoopCommonModes);
   }
 
-  bool resolveWithTimeout(double seconds) override {
+  bool resolveWithTimeout(std::chrono::duration<double> timeLimit) override {
     isResolved_ = false;
-    const bool done = CFNetServiceResolveWithTimeout(service_.get(), seconds, nullptr);
+    const bool done = CFNetServiceResolveWithTimeout(service_.get(), timeLimit.count(), nullptr);
     if (!client_) isResolved_ = done;
     return done;
   }

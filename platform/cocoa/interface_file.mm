@@ -67,6 +67,15 @@ NSView* findView(NSView* view, NSString* identifier, Class kind) {
   return nil;
 }
 
+// Makes a page's title a heading for assistive programs. AppKit has no constant for this role.
+void describe(NSView* view) {
+  if ([view isKindOfClass:[NSTextField class]] && [[view identifier] hasSuffix:@"Title"]) {
+    [NSAccessibilityUnignoredDescendant(view) setAccessibilityRole:@"AXHeading"];
+  }
+  for (NSView* subview in [view subviews])
+    describe(subview);
+}
+
 // Translates the tool tips and makes each one the accessibility label of its view. Only controls
 // without a title have tool tips.
 void localize(NSView* view, const std::string& interfaceName) {
@@ -131,6 +140,7 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
 
   for (NSView *view in [NSArray arrayWithObjects:rootView(objects), nil]) {
     localize(view, name);
+    describe(view);
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {

@@ -7,6 +7,7 @@
 
 #include "platform/application.h"
 #import "platform/cocoa/action.h"
+#import "platform/cocoa/focus.h"
 #import "platform/cocoa/native.h"
 
 namespace onramp {
@@ -115,6 +116,7 @@ void runModalForWindow(const Window& window) {
   isAborting = false;
   dropWaitingInput();
   [closeButton setEnabled:YES];
+  cocoa::focusFirstControl([modal contentView]);
 }
 
 void abortModal() {

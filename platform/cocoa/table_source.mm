@@ -22,6 +22,23 @@ NSButton* defaultButton(NSView* view) {
   return nil;
 }
 
+// Whether a word of `text` starts with `start`. A blank in `start` may continue into the next
+// words.
+bool hasWordThatStarts(NSString* text, NSString* start) {
+  NSCharacterSet* const letters = [NSCharacterSet alphanumericCharacterSet];
+  NSRange rest = NSMakeRange(0, [text length]);
+  while (rest.length > 0) {
+    const NSRange found = [text rangeOfString:start options:NSCaseInsensitiveSearch range:rest];
+    if (found.location == NSNotFound) return false;
+    if (found.location == 0 ||
+        ![letters characterIsMember:[text characterAtIndex:found.location - 1]]) {
+      return true;
+    }
+    rest = NSMakeRange(found.location + 1, [text length] - found.location - 1);
+  }
+  return false;
+}
+
 CGFloat textWidth(NSCell* cell, NSString* text) {
   NSDictionary* const attributes = [NSDictionary dictionaryWithObject:[cell font]
                                                                forKey:NSFontAttributeName];
@@ -61,8 +78,9 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   [self showSelection];
 }
 
-// Widens all columns but the first one to fit their texts. If the table is too narrow for all
-// columns, narrows the first one, which holds the names.
+// Widens all columns but the first one to fit their texts, and keeps the user from making them
+// narrower. If the table is too narrow for all columns, narrows the first one, which holds the
+// names.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -75,6 +93,7 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
       NSString* const text = [self tableView:_table objectValueForTableColumn:column row:row];
       width = std::max(width, textWidth([column dataCell], text));
     }
+    [column setMinWidth:width];
     if (width > [column width]) [column setWidth:width];
     room -= [column width] + [_table intercellSpacing].width;
   }
@@ -121,6 +140,23 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   if (index >= entries.size()) return @"";
   const std::string key = onramp::cocoa::toStdString([column identifier]);
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
+}
+
+// Finds a row by the start of any word of its name. The search continues at row 0 after the last
+// row.
+- (NSInteger)tableView:(NSTableView*)table
+    nextTypeSelectMatchFromRow:(NSInteger)startRow
+                         toRow:(NSInteger)endRow
+                     forString:(NSString*)typed {
+  NSTableColumn* const names = [[table tableColumns] objectAtIndex:0];
+  const NSInteger count = [self numberOfRowsInTableView:table];
+  for (NSInteger step = 0; step < count; ++step) {
+    const NSInteger row = (startRow + step) % count;
+    NSString* const name = [self tableView:table objectValueForTableColumn:names row:row];
+    if (hasWordThatStarts(name, typed)) return row;
+    if (row == endRow) break;
+  }
+  return -1;
 }
 
 // Passes the user's selection to the controller. If the user deselects the row, it is selected

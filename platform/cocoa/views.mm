@@ -1,3 +1,4 @@
+#import "platform/cocoa/focus.h"
 #import "platform/cocoa/native.h"
 #import "platform/cocoa/text.h"
 
@@ -7,20 +8,26 @@ using cocoa::nativeOf;
 
 namespace {
 
-// Returns the first view of class `kind` that accepts the keyboard focus, or nil. Searches `view`
-// itself and then its subviews in their order.
-NSView* firstKeyView(NSView* view, Class kind) {
-  if ([view isKindOfClass:kind] && [view canBecomeKeyView]) return view;
-  for (NSView* subview in [view subviews]) {
-    if (NSView* const found = firstKeyView(subview, kind)) return found;
-  }
-  return nil;
+// Asks a screen reader to read the text of a text field aloud, because the keyboard focus is
+// elsewhere.
+void announce(NSTextField* field) {
+  NSDictionary* const announcement = [NSDictionary
+      dictionaryWithObjectsAndKeys:[field stringValue], NSAccessibilityAnnouncementKey,
+                                   [NSNumber numberWithInteger:NSAccessibilityPriorityHigh],
+                                   NSAccessibilityPriorityKey, nil];
+  NSAccessibilityPostNotificationWithUserInfo(
+      [field window], NSAccessibilityAnnouncementRequestedNotification, announcement);
 }
 
 }  // namespace
 
 void View::setHidden(bool hidden) const {
-  [nativeOf<NSView>(*this) setHidden:hidden];
+  NSView* const view = nativeOf<NSView>(*this);
+  const bool appears = [view isHidden] && !hidden;
+  [view setHidden:hidden];
+  if (NSTextField* const field = nativeOf<NSTextField>(*this); appears && [field window]) {
+    announce(field);
+  }
 }
 
 View View::firstSubview() const {
@@ -35,8 +42,7 @@ void View::addSubview(const View& inner) const {
   [added setFrame:[view bounds]];
   [added setAutoresizingMask:NSViewWidthSizable | NSViewHeightSizable];
   [view addSubview:added];
-  NSView* const list = firstKeyView(added, [NSTableView class]);
-  [[view window] makeFirstResponder:list ? list : firstKeyView(added, [NSControl class])];
+  cocoa::focusFirstControl(added);
 }
 
 void View::removeFromSuperview() const {

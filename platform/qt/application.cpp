@@ -13,6 +13,7 @@
 #include <string_view>
 #include <vector>
 
+#include "base/maker.h"
 #include "platform/bundle.h"
 #include "platform/qt/accessibility.h"
 #include "platform/qt/loops.h"
@@ -58,7 +59,11 @@ void readCommandLine(const QStringList& arguments) {
     std::exit(kUsageError);
   }
   if (parser.isSet(help)) parser.showHelp();
-  if (parser.isSet(ownVersion)) parser.showVersion();
+  if (parser.isSet(ownVersion)) {
+    std::printf("%s %s\n%s\n", qPrintable(QCoreApplication::applicationName()),
+                qPrintable(QCoreApplication::applicationVersion()), maker::kSettings);
+    std::exit(0);
+  }
   if (!parser.isSet(version)) return;
   static const QRegularExpression form(QStringLiteral("^\\d+(\\.\\d+){0,2}$"));
   if (!form.match(parser.value(version)).hasMatch()) {

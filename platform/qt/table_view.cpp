@@ -55,15 +55,16 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
 }
 
 // Passes the row that the user selected to the controller, or selects the controller's row again
-// when the user deselected it.
-void takeSelection(QAbstractItemView* view, ArrayController& controller) {
-  const QModelIndexList rows = view->selectionModel()->selectedRows();
-  if (rows.isEmpty()) {
+// when the user deselected it. An assistive program deselects the old row before it selects another
+// one, so both rows are selected for a moment and only `added` tells which one is meant.
+void takeSelection(QAbstractItemView* view, ArrayController& controller,
+                   const QItemSelection& added) {
+  if (!view->selectionModel()->hasSelection()) {
     showSelection(view, controller);
-    return;
+  } else if (!added.isEmpty()) {
+    const auto row = static_cast<std::size_t>(added.first().top());
+    if (row != controller.selectionIndex()) controller.choose(row);
   }
-  const auto row = static_cast<std::size_t>(rows.first().row());
-  if (row != controller.selectionIndex()) controller.choose(row);
 }
 
 // Clicks the window's default button once the list has handled its own click, because the button's
@@ -90,8 +91,9 @@ void TableView::bind(ArrayController& controller) const {
         showSelection(view, controller);
       },
       [view, &controller] { showSelection(view, controller); });
-  QObject::connect(view->selectionModel(), &QItemSelectionModel::selectionChanged, view,
-                   [view, &controller] { takeSelection(view, controller); });
+  QObject::connect(
+      view->selectionModel(), &QItemSelectionModel::selectionChanged, view,
+      [view, &controller](const QItemSelection& added) { takeSelection(view, controller, added); });
   QObject::connect(view, &QAbstractItemView::pressed, view,
                    [&controller](const QModelIndex& index) {
                      controller.choose(static_cast<std::size_t>(index.row()));

@@ -108,7 +108,6 @@ bool WindowEvents::performReturn() {
 bool WindowEvents::openMenu() {
   auto* const bar = window_->findChild<QMenuBar*>();
   if (!bar || bar->actions().isEmpty()) return false;
-  bar->setFocus(Qt::MenuBarFocusReason);
   bar->setActiveAction(bar->actions().first());
   return true;
 }

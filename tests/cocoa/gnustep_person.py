@@ -24,6 +24,7 @@ _MENU_BAR_ITEM = "Onramp OSX"
 class GNUstepPerson(Person):
     """Starts a program on a desktop and uses it. Use it in a `with` statement."""
 
+    follows_desktop = False
     errors = ()  # using a control that has vanished raises nothing
 
     def __init__(self, desktop, program, arguments=(), env=None):
@@ -68,10 +69,13 @@ class GNUstepPerson(Person):
     def _noticed_presses(self):
         return self._read()[0]["presses"] if self.is_running() else 0
 
-    def choose_from_menu(self, button, item):
-        """Chooses entry number `item` of a button's menu, which a held mouse button keeps open."""
+    def open_menu(self, button=None):
+        """Opens a button's menu, which the held mouse button keeps open."""
         self._point_at(self.see("button menu", button))
         self.desktop.run(["xdotool", "mousedown", "1"])
+        wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
+
+    def choose_from_open_menu(self, item):
         nudge = itertools.cycle((0, 1))
 
         def noticed():
@@ -84,7 +88,7 @@ class GNUstepPerson(Person):
             self._point_at(entries[item - 1], next(nudge))
             return self.has_state((self._menu_entries() or entries)[item - 1], "selected")
 
-        wait_for(noticed, _LOOK_SECONDS, f"entry {item} of {button!r} to be selected")
+        wait_for(noticed, _LOOK_SECONDS, f"entry {item} of the menu to be selected")
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):

@@ -4,6 +4,8 @@
 #include <SystemConfiguration/SystemConfiguration.h>
 #include <gmock/gmock.h>
 
+#include <chrono>
+
 #include "platform/corefoundation/convert.h"
 #include "platform/dynamic_store.h"
 #include "platform/net_service.h"
@@ -136,7 +138,7 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient)
   const auto kept = Reference<CFNetServiceRef>::retaining(native);
   seen.service->setClient(Seen::resolved, &seen);
   seen.service->schedule();
-  EXPECT_TRUE(seen.service->resolveWithTimeout(5));
+  EXPECT_TRUE(seen.service->resolveWithTimeout(std::chrono::seconds(5)));
   EXPECT_TRUE(native->isScheduled && native->isRunning);
   standin::Object addresses(standin::kArray), txt(standin::kData, std::string("\3a=1", 4));
   addresses.members = {new standin::Object(standin::kData, "one"),
@@ -149,7 +151,7 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient)
   EXPECT_THAT(service->addressing(), ElementsAre(bytesOf("one"), bytesOf(std::string("t\0o", 3))));
   EXPECT_EQ(service->txtData(), bytesOf("\3a=1"));
 
-  EXPECT_TRUE(service->resolveWithTimeout(5));
+  EXPECT_TRUE(service->resolveWithTimeout(std::chrono::seconds(5)));
   EXPECT_TRUE(service->addressing().empty() && !service->txtData()) << "the last resolve's";
   seen.service = std::move(service);
   error.error = kNetServiceErrorTimeout;

@@ -5,8 +5,11 @@
 #include <QApplication>
 #include <QHeaderView>
 #include <QLabel>
+#include <QMenu>
+#include <QProgressBar>
 #include <QScreen>
 #include <QTextDocumentFragment>
+#include <QToolButton>
 #include <QTreeView>
 #include <cstdlib>
 
@@ -15,6 +18,7 @@
 #include "pages/ChooseDeviceView.h"
 #include "pages/ConnectionTypeView.h"
 #include "platform/freedesktop/main_bundle.h"
+#include "platform/qt/image_view.h"
 #include "platform/qt/native.h"
 #include "platform/qt/style.h"
 
@@ -27,14 +31,13 @@ std::string nameOf(const QWidget& widget) {
   return widget.objectName().toStdString();
 }
 
-/// The wizard's window with the texts of one language, in one font size.
-class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
+/// The wizard's window in one font size, with the texts of the process's language. A process has
+/// only one language, because the language decides which fonts Qt loads.
+class Layout : public testing::TestWithParam<int> {
  protected:
   void SetUp() override {
-    const auto [language, points] = GetParam();
-    setenv("LANG", language, 1);
     QFont font = QApplication::font();
-    font.setPointSize(points);
+    font.setPointSize(GetParam());
     QApplication::setFont(font);
     setMainBundlePath(ONRAMP_CROWDED_MEDIUM "/Onramp OSX.app");
     delegate = std::make_unique<OnrampOSXAppDelegate>();
@@ -54,9 +57,10 @@ class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
   [[nodiscard]] std::vector<QWidget*> shownControls() const {
     std::vector<QWidget*> controls;
     for (QWidget* const widget : window->findChildren<QWidget*>()) {
-      const bool isControl = qobject_cast<QLabel*>(widget) ||
-                             qobject_cast<QAbstractButton*>(widget) ||
-                             qobject_cast<QAbstractItemView*>(widget);
+      const bool isControl =
+          qobject_cast<QLabel*>(widget) || qobject_cast<QAbstractButton*>(widget) ||
+          qobject_cast<QProgressBar*>(widget) || qobject_cast<QAbstractItemView*>(widget) ||
+          (qobject_cast<qt::ImageViewWidget*>(widget) && nameOf(*widget) != "mBackGroundView");
       const bool isPart = qobject_cast<QHeaderView*>(widget) != nullptr;
       if (isControl && !isPart && widget->isVisible()) controls.push_back(widget);
     }
@@ -98,6 +102,19 @@ class Layout : public testing::TestWithParam<std::tuple<const char*, int>> {
       EXPECT_TRUE(
           list->viewport()->rect().contains(list->visualRect(list->currentIndex()).center()));
     }
+  }
+
+  // Expects that the menu looks the same when it is wider, so that none of its texts is elided.
+  static void expectMenuFits(QMenu& menu) {
+    const QSize size = menu.sizeHint();
+    menu.resize(size);
+    const QImage usual = menu.grab().toImage();
+    menu.setMinimumWidth(2 * size.width());
+    menu.resize(menu.sizeHint());
+    const double pixels = usual.devicePixelRatio();
+    const QRect texts(0, 0, usual.width() - static_cast<int>(pixels * size.height() / 2),
+                      usual.height());
+    EXPECT_EQ(usual.copy(texts), menu.grab().toImage().copy(texts));
   }
 
   void expectEverythingFits() const {
@@ -158,6 +175,7 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   EXPECT_EQ(nameOf(*window->focusWidget()), "deviceListView");
   devices->progressON(true);
   expectEverythingFits();
+  expectMenuFits(*window->findChild<QToolButton*>()->menu());
 
   const QModelIndex first = window->findChild<QTreeView*>("deviceListView")->model()->index(0, 0);
   const QString tip = first.data(Qt::ToolTipRole).toString();
@@ -165,11 +183,7 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
       << "the tool tip reads markup in a device's name";
 }
 
-INSTANTIATE_TEST_SUITE_P(Languages, Layout,
-                         testing::Combine(testing::Values("en_US.UTF-8", "de_DE.UTF-8",
-                                                          "ja_JP.UTF-8", "ko_KR.UTF-8",
-                                                          "zh_CN.UTF-8", "art.UTF-8"),
-                                          testing::Values(10, 18)));
+INSTANTIATE_TEST_SUITE_P(Points, Layout, testing::Values(10, 18));
 
 }  // namespace
 }  // namespace onramp

@@ -27,10 +27,10 @@ class ScriptedService final : public NetService,
   }
   void schedule() override { scheduled_ = true; }
   void unschedule() override { scheduled_ = false; }
-  bool resolveWithTimeout(double seconds) override {
+  bool resolveWithTimeout(std::chrono::duration<double> timeLimit) override {
     addresses.clear();
     txt.reset();
-    Network::instance().timeouts.push_back(seconds);
+    Network::instance().timeouts.push_back(timeLimit.count());
     Network::instance().cancelled = false;
     if (client_) {
       resolving = true;

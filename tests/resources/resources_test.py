@@ -4,12 +4,14 @@ current systems need. At run time, the program and macOS ignore most mistakes wi
 
 import plistlib
 import re
+import sys
 import unittest
 import xml.etree.ElementTree as ElementTree
 from collections import Counter
 from pathlib import Path
 
 ROOT = Path(__file__).resolve().parents[2]
+INFORMATION = Path(sys.argv[1])
 RESOURCES = ROOT / "resources"
 PAGES = ("ModelListView", "ConnectionTypeView", "ChooseDeviceView")
 
@@ -183,7 +185,7 @@ class CocoaFiles(unittest.TestCase):
 
 class Information(unittest.TestCase):
     def setUp(self):
-        self.information = plistlib.loads((RESOURCES / "Info.plist.in").read_bytes())
+        self.information = plistlib.loads(INFORMATION.read_bytes())
 
     def test_has_what_current_systems_look_for(self):
         self.assertRegex(self.information["CFBundleIdentifier"], r"^[a-z]+(\.[a-z]+){2}$")
@@ -211,4 +213,4 @@ class Information(unittest.TestCase):
 
 
 if __name__ == "__main__":
-    unittest.main()
+    unittest.main(argv=sys.argv[:1] + sys.argv[2:])

@@ -6,6 +6,7 @@ is mostly waiting.
 """
 
 import concurrent.futures
+import itertools
 import os
 import subprocess
 import sys
@@ -13,7 +14,7 @@ import unittest
 
 import media
 from media import model
-from way import BUILT, GEAR, GEAR_REFRESH, ON_GNUSTEP, PRACTICE_NETWORK, TEXT, WayTest
+from way import BUILT, GEAR, GEAR_REFRESH, ON_GNUSTEP, PRACTICE_NETWORK, TEXT, WayTest, messages
 from onscreen.processes import wait_for
 from practice_network import PracticeNetwork
 
@@ -29,6 +30,8 @@ class WirelessWays(WayTest):
         self.network = PracticeNetwork()
         self.kind = self.id().rpartition("test_")[2][:30]
         self.model = f"Kestrel {self.kind}"
+        self.models = {self.model: model(usb=True, wired=True, wireless=True),
+                       "Kestrel Cable": model(usb=True)}
 
     def add(self, name, **entries):
         self.network.add(name, **{"maker": "Kestrel", "model": self.kind} | entries)
@@ -44,8 +47,7 @@ class WirelessWays(WayTest):
 
     def search(self, **details):
         """Starts the wizard and clicks through it until a search begins."""
-        person = self.start({self.model: model(usb=True, wired=True, wireless=True),
-                             "Kestrel Cable": model(usb=True)}, **details)
+        person = self.start(self.models, **details)
         person.click("list item", self.model)
         wait_for(lambda: person.has_state(person.see("list item", self.model), "selected"),
                  PATIENCE, f"{self.model!r} to be selected")
@@ -54,9 +56,9 @@ class WirelessWays(WayTest):
         person.click("push button", TEXT["BTN_NEXT"])
         return person
 
-    def see_chooser(self, person):
-        person.see("label", TEXT["INST_TXT_DEVLIST"], PATIENCE)
-        person.see_gone("label", TEXT["INST_WAIT"], PATIENCE)
+    def see_chooser(self, person, text=TEXT):
+        person.see("label", text["INST_TXT_DEVLIST"], PATIENCE)
+        person.see_gone("label", text["INST_WAIT"], PATIENCE)
 
     def see_tool_run(self):
         called = self.medium / "tool"
@@ -77,24 +79,43 @@ class WirelessWays(WayTest):
                 "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
                 "IP address": address}})
 
-    def test_a_device_beside_three_closed_ones_is_listed_in_the_first_wait(self):
+    def test_keyboard_or_accessible_tree_alone_is_enough_beside_closed_devices(self):
         for number in (1, 2, 3):
             self.add(f"closed {number} of {self.kind}", activeif="closed")
-        name = "Büro – 会議室"
-        self.add(name, addresses=["127.0.90.1"], note="2nd floor")
+        self.add("Büro – 会議室", addresses=["127.0.90.1"], note="2nd floor")
         self.network.settle()
-        person = self.search()
-        self.see_chooser(person)
-        self.assertEqual(person.rows(),
-                         [(name, TEXT["INST_TXT_CONNECTION_NETWORK"], "127.0.90.1")])
+        ways = (self.use_keyboard,) if ON_GNUSTEP else (self.use_keyboard, self.use_accessible_tree)
+        for language, use in itertools.product(("en_US", "ja_JP"), ways):
+            with self.subTest(language=language, use=use.__name__):
+                self.desktop.forget()
+                person = self.start(self.models, env={"LANG": f"{language}.UTF-8"})
+                use(person, messages.read(BUILT, language[:2]))
+                self.assert_handed_on(person, "Büro – 会議室", "127.0.90.1")
+
+    def use_keyboard(self, person, text):
+        person.see("list item", "Kestrel Cable")
+        person.press("Down", "Return")
+        person.see("radio button", text["INST_TXT_WIFI"])
+        person.press("Return")
+        self.see_chooser(person, text)
+        self.assertEqual(person.rows(), [
+            ("Büro – 会議室", text["INST_TXT_CONNECTION_NETWORK"], "127.0.90.1")])
         # A wait in vain would have started the set-up tool, after which there is no way back.
-        self.assertTrue(person.sees("push button", TEXT["BTN_BACK"]))
+        self.assertTrue(person.sees("push button", text["BTN_BACK"]))
         if not ON_GNUSTEP:
             person.press("Tab")
             person.open_menu()  # Tab leads from the list to the gear button
             person.press("Escape", "shift+Tab")
         person.press("Return")
-        self.assert_handed_on(person, name, "127.0.90.1")
+
+    def use_accessible_tree(self, person, text):
+        person.act("list item", self.model)
+        person.act("push button", text["BTN_NEXT"])
+        person.act("radio button", text["INST_TXT_WIFI"])
+        person.act("push button", text["BTN_NEXT"])
+        self.see_chooser(person, text)
+        person.act("table cell", "Büro – 会議室")
+        person.act("push button", text["BTN_NEXT"])
 
     def test_other_exit_status_searches_again_and_so_does_the_person(self):
         person = self.search(tool_status=3)

@@ -9,6 +9,7 @@
 #include <string>
 #include <system_error>
 
+#include "base/maker.h"
 #include "platform/terminal.h"
 #include "tools/check/check.h"
 #include "tools/check/output.h"
@@ -40,7 +41,8 @@ int run(int count, char* arguments[]) {
       "Checks a finished medium: reports what is wrong with it and what its users will see.");
   app.name("onramp-check");
   app.footer(kFooter);
-  app.set_version_flag("-V,--version", "onramp-check " ONRAMP_VERSION);
+  app.set_version_flag("-V,--version",
+                       std::string("onramp-check " ONRAMP_VERSION "\n") + maker::kSettings);
   std::string medium;
   bool json = false;
   bool strict = false;

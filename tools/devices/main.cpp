@@ -4,7 +4,9 @@
 #include <clocale>
 #include <exception>
 #include <iostream>
+#include <string>
 
+#include "base/maker.h"
 #include "platform/failed_writes.h"
 #include "tools/devices/commands.h"
 
@@ -84,7 +86,8 @@ int run(int count, char* arguments[]) {
   app.name("onramp-devices");
   app.footer("Examples:" + kBrowseExamples + kAskExamples + kURIExamples + kHostsExamples +
              "\n\n\"onramp-devices COMMAND --help\" shows a command's options.");
-  app.set_version_flag("-V,--version", "onramp-devices " ONRAMP_VERSION);
+  app.set_version_flag("-V,--version", std::string("onramp-devices " ONRAMP_VERSION "\n") +
+                                           onramp::maker::kSettings);
   app.require_subcommand(1);
   BrowseOptions browseOptions;
   AskOptions askOptions;

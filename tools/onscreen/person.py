@@ -38,6 +38,8 @@ class Person:
     Its methods use the program as a person does.
     """
 
+    follows_desktop = True  # whether the program takes the desktop's text size, scale and colours
+
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
         # The accessibility library reads the bus's address once, from this process's environment.
@@ -114,6 +116,14 @@ class Person:
         self.click(role, name)
         self.desktop.run(["xdotool", "click", "1"])
 
+    def act(self, role, name):
+        """Performs a control's first action over the accessibility bus, without mouse or keys."""
+        def acts():
+            control = self.see(role, name)
+            return self.has_state(control, "enabled") and control.get_action_iface().do_action(0)
+
+        wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
+
     def open_menu(self, button=None):
         """Opens the menu of that button, or of the button with the focus.
 
@@ -130,6 +140,9 @@ class Person:
     def choose_from_menu(self, button, item):
         """Opens a button's menu and chooses its `item`th entry."""
         self.open_menu(button)
+        self.choose_from_open_menu(item)
+
+    def choose_from_open_menu(self, item):
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):

@@ -1,5 +1,6 @@
 """The SNMP side of the devices: one net-snmp agent for each address that answers."""
 
+import json
 import os
 import pathlib
 import signal
@@ -10,8 +11,10 @@ import time
 
 from practice_network.description import CLOSED, MISSING, SILENT, TEXT
 
-COMMUNITY = "corridor"
-OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
+MAKER = json.loads(pathlib.Path(os.environ.get("ONRAMP_MAKER")
+                                or pathlib.Path(__file__).parents[2] / "maker.json").read_text())
+COMMUNITY = MAKER["snmpCommunity"]
+OBJECT = MAKER["activeIFObject"]
 PORT = 161
 # With these modules only, an agent starts in some 15 ms and does not listen for sub-agents.
 MODULES = "override,pass,vacm_conf,vacm_context"

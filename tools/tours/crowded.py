@@ -41,7 +41,7 @@ def _add_models(folder):
         models = content[key]
         for number in range(MODELS - len(models)):
             kind = LONG_NAMES[number % 7] if number % 7 < 2 else "Model"
-            models[f"Kestrel {kind} {1000 + number}"] = entry
+            models[f"Kestrel {1000 + number} {kind}"] = entry
         path.write_bytes(plistlib.dumps(content))
 
 

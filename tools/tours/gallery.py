@@ -4,13 +4,16 @@ import pathlib
 import tempfile
 
 from onscreen import messages
-from onscreen.person import Person
+from onscreen.processes import wait_for
 
 from . import crowded
+from .person import Person
+from .ways import GEAR_REFRESH, choose_model
 
 LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
 DEVICES = 40
 _PATIENCE = 120
+_SEARCHES = 10
 _LARGE, _USUAL = 18, 10  # points
 _WIRELESS, _WIRED = 2, 1  # what a device answers about its interface
 
@@ -35,8 +38,15 @@ def settings(scheme, points):
     return "\n".join(lines) + "\n"
 
 
-def all_looks():
-    """Returns (language, scale in per cent, scheme, points) for every set of pictures."""
+def all_looks(follows_desktop):
+    """Returns (language, scale in per cent, scheme, points) for every set of pictures.
+
+    The front end for macOS has one size and one colour scheme under GNUstep, which finds no texts for
+    zh_CN.
+    """
+    if not follows_desktop:
+        return [(language, 100, "light", _USUAL) for language in (*LANGUAGES, crowded.LANGUAGE)
+                if language != "zh_CN"]
     looks = [(language, scale, scheme, _USUAL) for language in LANGUAGES for scale in (100, 200)
              for scheme in ("light", "dark")]
     looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
@@ -57,7 +67,7 @@ class Gallery:
         """Takes all pictures. The search finds devices of `model`; `version` is not supported."""
         self._add_devices(model, service_type)
         with tempfile.TemporaryDirectory() as folder:
-            for look in all_looks():
+            for look in all_looks(Person.follows_desktop):
                 language, scale, scheme, points = look
                 (pathlib.Path(folder) / "kdeglobals").write_text(settings(scheme, points))
                 self._look = f"{language}-{scale}-{scheme}-{points}pt"
@@ -74,11 +84,12 @@ class Gallery:
     def _add_devices(self, model, service_type):
         maker, kind = model.split(" ", 1)
         for number in range(DEVICES):
-            name = crowded.LONG_NAMES[number % len(crowded.LONG_NAMES)]
-            ending = f" {number:02}"
-            while len((name + ending).encode()) > 63:
+            # The number comes first, so that the first picture of the sorted list has every kind of
+            # name.
+            name = f"{number:02} {crowded.LONG_NAMES[number % len(crowded.LONG_NAMES)]}"
+            while len(name.encode()) > 63:
                 name = name[:-1]
-            self._network.add(name + ending, maker=maker, model=kind, type=service_type)
+            self._network.add(name, maker=maker, model=kind, type=service_type)
         self._network.settle()
 
     def _let_devices_answer(self, interface):
@@ -94,27 +105,43 @@ class Gallery:
         with self._start() as person:
             person.see("label", self._text["INST_TXT_MODEL"], _PATIENCE)
             self._take(person, "1-models")
-            # Typing the beginning of any word of a model's name selects that model in the list.
-            words = model.split(" ", 1)[1]
-            person.press(*("space" if letter == " " else letter for letter in words))
+            choose_model(person, model)
             person.press("Return")
             person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
             self._take(person, "2-connection")
-            person.press("Return")
-            person.see("label", self._text["INST_WAIT"], _PATIENCE)
-            self._take(person, "3-search")
-            person.see("label", self._text["INST_TXT_DEVLIST"], _PATIENCE)
+            self._search(person)
             # The devices are listed while the wait goes on.
             person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
             self._take(person, "4-devices")
-            person.press("Tab")
+            if Person.follows_desktop:
+                person.press("Tab")  # from the list to the gear button
             person.open_menu()
             self._take(person, "5-gear")
             self._let_devices_answer(_WIRED)
-            person.press("Down", "Down", "Return")
+            person.choose_from_open_menu(GEAR_REFRESH)
             person.see("label", self._text["INST_TXT_ALERT_DEVICENOTFOUND"], _PATIENCE)
             self._take(person, "6-not-found")
             self._let_devices_answer(_WIRELESS)
+
+    def _search(self, person):
+        """Searches until devices are listed. On a busy machine, the first search may be in vain."""
+        title = self._text["INST_TXT_DEVLIST"]
+        for _ in range(_SEARCHES):
+            person.press("Return")
+            person.see("label", self._text["INST_WAIT"], _PATIENCE)
+            self._take(person, "3-search")
+            wait_for(lambda: person.sees("label", title) or self._can_connect(person), _PATIENCE,
+                     "the end of the search")
+            if person.sees("label", title):
+                return
+        raise RuntimeError(f"{_SEARCHES} searches found none of the {DEVICES} devices")
+
+    @staticmethod
+    def _can_connect(person):
+        """Returns whether the connection page takes keys: no search and no set-up tool is running."""
+        return any(role == "radio button" and person.has_state(control, "enabled") and
+                   person.has_state(control, "focused")
+                   for role, _, control in person.everything())
 
     def _alert(self, version):
         with self._start("--system-version", version) as person:

@@ -11,6 +11,7 @@
 - (NSString*)identifier;
 - (void)setIdentifier:(NSString*)identifier;
 - (void)setAccessibilityLabel:(NSString*)label;
+- (void)setAccessibilityRole:(NSString*)role;
 @end
 
 @interface NSWindow (OnrampTermination)

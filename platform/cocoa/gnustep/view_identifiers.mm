@@ -56,8 +56,12 @@ void dealloc(id self, SEL selector) {
   }
 }
 
-// Does nothing, because GNUstep does not support accessibility.
+// The setters for accessibility do nothing, because GNUstep does not support it.
+
 - (void)setAccessibilityLabel:(NSString*)label {
+}
+
+- (void)setAccessibilityRole:(NSString*)role {
 }
 
 @end
