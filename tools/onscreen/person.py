@@ -222,7 +222,7 @@ class Person:
         return None
 
     def _certainly_gone(self, role, name):
-        """Returns whether such a control is surely gone.
+        """Returns whether it is certain that no control of that role and name is on the screen.
 
         A busy program does not answer, which does not mean that the control is gone.
         """
@@ -242,7 +242,7 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` with `control` and everything visible below it, until it returns False.
+        """Calls `visit` with `control` and everything visible below it, until `visit` returns False.
 
         Goes depth first and skips objects that vanish. Enters tables only if `tables` is set.
         """
