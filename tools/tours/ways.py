@@ -1,11 +1,16 @@
 """Routes through the wizard, with a picture of each page."""
 
+import contextlib
+
 from onscreen.processes import wait_for
 
 from .person import Person
 
-_LOCALES = {"en": "en_US"}
-GEAR, GEAR_REFRESH = "Actions", 2
+GEAR_REFRESH = 2
+_ALERT = "BTN_CLOSE"
+# The texts that tell the first pages apart: key, role, and what the wizard shows without the text.
+_FIRST_PAGES = (("INST_TXT_CONNECTIONTYPE", "label", "INST_TXT_CONNECTIONTYPE"),
+                ("INST_TXT_MODEL", "label", "INST_TXT_MODEL"), (_ALERT, "push button", "Close"))
 _LONGEST_SEARCH = 60  # seconds; the wizard waits 15, but the machine may be busy
 
 
@@ -30,18 +35,34 @@ class WentWrong(Exception):
 
 
 class Tour:
-    """Uses a medium's wizard on a desktop. `network` is the practice network or None."""
+    """Uses a medium's wizard on a desktop. `network` is the practice network or None.
 
-    def __init__(self, desktop, medium, pictures, network):
+    Each start of the wizard gets `options`.
+    """
+
+    def __init__(self, desktop, medium, pictures, network, options=()):
         self._desktop = desktop
         self._medium = medium
         self._text = medium.text
         self._pictures = pictures
         self._network = network
+        self._options = options
+
+    def refuses(self):
+        """Returns whether the wizard refuses the system that the options name; shows the alert."""
+        with self._start() as person:
+            if self._first_page(person) != _ALERT:
+                return False
+            person.picture(self._pictures / "alert.png")
+            print("The medium does not support this system version, so the wizard shows only the "
+                  "alert.")
+            return True
 
     def alert(self):
         """Shows the alert on a system that the medium does not support."""
         version = self._medium.unsupported_version()
+        if any(option.startswith("--system-version") for option in self._options):
+            return
         if not version:
             print("The medium supports every system version, so there is no alert to show.")
             return
@@ -80,10 +101,10 @@ class Tour:
             person.picture(self._pictures / "wireless-4-devices.png")
 
             self._let_devices(self._network.remove)
-            person.open_menu(GEAR)
+            person.open_menu(self._medium.gear)
             person.picture(self._pictures / "wireless-5-gear.png")
             person.press("Escape")
-            person.choose_from_menu(GEAR, GEAR_REFRESH)
+            person.choose_from_menu(self._medium.gear, GEAR_REFRESH)
             self._wait_for_search(person, "wireless-6-search.png")
             person.see("label", self._text.get("INST_TXT_ALERT_DEVICENOTFOUND", "Device not found"))
             person.picture(self._pictures / "wireless-7-not-found.png")
@@ -93,7 +114,7 @@ class Tour:
 
             self._let_devices(self._network.add)
             self._network.settle()
-            person.choose_from_menu(GEAR, GEAR_REFRESH)
+            person.choose_from_menu(self._medium.gear, GEAR_REFRESH)
             self._wait_for_search(person)
             person.click("table cell", _second_of(model))
             person.picture(self._pictures / "wireless-9-choice.png")
@@ -112,19 +133,40 @@ class Tour:
         for device in self._network.list():
             do(device["name"])
 
+    @contextlib.contextmanager
     def _start(self, *arguments):
         self._desktop.forget()
-        language = self._medium.language
-        return Person(self._desktop, self._medium.program, arguments,
-                      env={"LANG": f"{_LOCALES.get(language, language)}.UTF-8"})
+        with Person(self._desktop, self._medium.program, [*self._options, *arguments]) as person:
+            try:
+                yield person
+            except TimeoutError as error:
+                place = self._pictures / "last.png"
+                person.picture(place)
+                raise WentWrong(f"{error}. {place} shows the screen at that time.") from error
+
+    def _first_page(self, person):
+        """Waits for the wizard's first page, or for the alert. Returns which of them it shows."""
+        def shown():
+            _expect(person.is_running(), f"no page appeared: the wizard ended with status "
+                    f"{person.process.returncode}, and {self._what_was_opened()}")
+            return next((page for page, role, default in _FIRST_PAGES
+                         if person.sees(role, self._text.get(page, default))), None)
+        try:
+            return wait_for(shown, 20, "the first page")
+        except TimeoutError as error:
+            titles = " or ".join(f'"{self._text[page]}"' for page, *_ in _FIRST_PAGES[:2])
+            raise TimeoutError(
+                "the first page did not appear, because nothing on the screen has its title in "
+                f"the language {self._medium.language!r}: {titles}") from error
+
+    def _what_was_opened(self):
+        opened = self._desktop.opened()
+        return f"opened {', '.join(opened)}" if opened else "opened nothing"
 
     def _to_connection_page(self, person, model, way):
         """Goes to the connection page. Returns whether the model list was shown before it."""
-        title, list_title = (self._text[key]
-                             for key in ("INST_TXT_CONNECTIONTYPE", "INST_TXT_MODEL"))
-        wait_for(lambda: person.sees("label", title) or person.sees("label", list_title), 20,
-                 "the first page")
-        on_list = person.sees("label", list_title)
+        title = self._text["INST_TXT_CONNECTIONTYPE"]
+        on_list = self._first_page(person) == "INST_TXT_MODEL"
         if on_list:
             choose_model(person, model)
             person.picture(self._pictures / f"{way}-1-models.png")
