@@ -44,7 +44,7 @@ int KSNetServiceCancelResolve(const NetServiceRef& service);
 /// limit. Returns 1 for a null service and when the resolve does not succeed in time.
 int KSNetServiceResolveSync(const NetServiceRef& service, double timeout);
 
-/// Resolves the service with that name, type and domain as KSNetServiceResolveSync does. On success
+/// Resolves the service with this name, type and domain as KSNetServiceResolveSync does. On success
 /// `addresses` holds the service's IPv4 addresses, or nothing when there are none; on failure
 /// `addresses` is unchanged. Also returns 1 when an argument is nothing or null.
 int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
