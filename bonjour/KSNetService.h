@@ -27,7 +27,7 @@ int KSNetServiceBrowserStart(NetServiceBrowserRef& browser, const std::string& d
                              const std::optional<std::string>& type,
                              ServiceClientCallbacks* callbacks);
 
-/// Ends the browse. The caller keeps the handle. Returns 1 for a null browser.
+/// Ends `browser` for good. The caller keeps the handle. Returns 1 for a null browser.
 int KSNetServiceBrowserStop(const NetServiceBrowserRef& browser);
 
 /// Starts to resolve `service`, after cancelling its running resolve if there is one. A resolve

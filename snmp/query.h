@@ -31,7 +31,7 @@ struct mib_value_handler {
   mib_decode decode = nullptr;  ///< null when the value is not stored
 };
 
-/// The objects that one request asks for.
+/// The objects that one request asks for: `count` entries, and a handler for each of them.
 struct mib_table {
   mib_entry* entries = nullptr;
   std::uint64_t count = 0;
