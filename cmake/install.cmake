@@ -41,6 +41,8 @@ foreach(modules IN ITEMS onscreen practice_network tours)
 endforeach()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/examples/medium DESTINATION ${home} USE_SOURCE_PERMISSIONS)
 install(FILES ${PROJECT_SOURCE_DIR}/examples/practice-network.toml DESTINATION ${home}/examples)
+# The practice network's devices answer as the maker's do.
+install(FILES ${ONRAMP_MAKER} RENAME maker.json DESTINATION ${home})
 
 foreach(tool IN ITEMS check devices)
   install_compressed(${PROJECT_SOURCE_DIR}/tools/${tool}/onramp-${tool}.1 ${CMAKE_INSTALL_MANDIR}/man1)

@@ -16,15 +16,16 @@ class Unsuitable(Exception):
 
 
 class Medium:
-    """A medium's folder with the application on it."""
+    """A medium's folder with the application on it, read in `language` or the user's."""
 
-    def __init__(self, folder):
+    def __init__(self, folder, language=None):
         self.folder = pathlib.Path(folder)
         application = self._application()
         self.program = application / _PROGRAM
         about = _read(application / "Contents/Info.plist")
         self._resources = _read(self.folder / about.get("CommonResourcePath", _RESOURCES))
-        self.language = messages.language(self.folder, self._locales())
+        self.locale = language or self._locales()[0]
+        self.language = messages.language(self.folder, [language] if language else self._locales())
         self.text = messages.read(self.folder, self.language)
         # The name of the menu's button comes from the application, not from the medium.
         self.gear = messages.read_table(
