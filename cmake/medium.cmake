@@ -32,3 +32,10 @@ add_custom_target(medium ALL
   DEPENDS onramp
   COMMENT "Assembling the medium"
   VERBATIM)
+
+set(onramp_installed "${CMAKE_INSTALL_LIBDIR}/onramp/medium/Onramp OSX.app/Contents")
+install(TARGETS onramp DESTINATION "${onramp_installed}/Linux")
+install(FILES ${PROJECT_BINARY_DIR}/Info.plist DESTINATION "${onramp_installed}")
+install(FILES ${onramp_interfaces} ${onramp_pictures} ${PROJECT_SOURCE_DIR}/resources/SupportedKOL.plist
+  DESTINATION "${onramp_installed}/Resources")
+install(DIRECTORY ${onramp_languages} DESTINATION "${onramp_installed}/Resources")

@@ -5,6 +5,7 @@ import re
 
 _ENTRY = re.compile(r'"((?:[^"\\]|\\.)*)"\s*=\s*"((?:[^"\\]|\\.)*)"\s*;')
 _RESOURCES = "MacResources/CDCommonMessage.bundle/Contents/Resources"
+_TRADITIONAL_CHINESE = ("zh_hant", "zh_tw", "zh_hk", "zh_mo")
 
 
 class _Texts(dict):
@@ -14,16 +15,45 @@ class _Texts(dict):
         return key
 
 
-def language(medium, wanted):
-    """Returns `wanted` if the medium has that language, else the first language that it has."""
+def _fitness(offered, wanted):
+    """Returns how well a language fits. 0 means that users of `wanted` do not read it."""
+    offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
+                       for name in (offered, wanted))
+    if offered == wanted:
+        return 3
+    if offered.split("_")[0] != wanted.split("_")[0]:
+        return 0
+    if (offered.startswith(_TRADITIONAL_CHINESE)) != (wanted.startswith(_TRADITIONAL_CHINESE)):
+        return 0
+    return 1 if "_" in offered else 2
+
+
+def languages(medium):
+    """Returns the names of the languages that the medium has texts in."""
     folders = (pathlib.Path(medium) / _RESOURCES).glob("*.lproj")
-    languages = sorted(folder.stem for folder in folders)
-    return languages[0] if languages and wanted not in languages else wanted
+    return sorted(folder.stem for folder in folders)
+
+
+def language(medium, locales):
+    """Returns the medium's language that users read whose locales are `locales`, the first first.
+
+    Returns "en" if the medium has no texts.
+    """
+    offered = languages(medium)
+    for wanted in locales:
+        best = max(offered, key=lambda name: _fitness(name, wanted), default="")
+        if best and _fitness(best, wanted):
+            return best
+    return offered[0] if offered else "en"
 
 
 def read(medium, language):
-    """Returns the texts of one language. The table may be UTF-8 or UTF-16."""
-    table = pathlib.Path(medium) / _RESOURCES / f"{language}.lproj/Localizable.strings"
+    """Returns the texts of one language."""
+    return read_table(pathlib.Path(medium) / _RESOURCES / f"{language}.lproj/Localizable.strings")
+
+
+def read_table(table):
+    """Returns the texts of a strings file, which may be UTF-8 or UTF-16. A missing file has none."""
     data = table.read_bytes() if table.exists() else b""
     wide = data[:2] in (b"\xff\xfe", b"\xfe\xff")
     entries = _ENTRY.findall(data.decode("utf-16" if wide else "utf-8"))

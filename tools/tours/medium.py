@@ -1,11 +1,14 @@
 """What the tour has to know about a medium to walk through its wizard."""
 
+import os
 import pathlib
 import plistlib
 
 from onscreen import messages
 
 _RESOURCES = "MacResources/CDCommonInfo.plist"
+_MESSAGES = "MacResources/CDCommonMessage.bundle/Contents/Info.plist"
+_PROGRAM = "Contents/Linux/Onramp OSX"
 
 
 class Unsuitable(Exception):
@@ -13,15 +16,38 @@ class Unsuitable(Exception):
 
 
 class Medium:
-    """A medium's folder with the application on it."""
+    """A medium's folder with the application on it, read in `language` or the user's."""
 
-    def __init__(self, folder):
+    def __init__(self, folder, language=None):
         self.folder = pathlib.Path(folder)
-        self.program = self.folder / "Onramp OSX.app/Contents/Linux/Onramp OSX"
-        about = _read(self.folder / "Onramp OSX.app/Contents/Info.plist")
+        application = self._application()
+        self.program = application / _PROGRAM
+        about = _read(application / "Contents/Info.plist")
         self._resources = _read(self.folder / about.get("CommonResourcePath", _RESOURCES))
-        self.language = messages.language(self.folder, "en")
+        self.locale = language or self._locales()[0]
+        self.language = messages.language(self.folder, [language] if language else self._locales())
         self.text = messages.read(self.folder, self.language)
+        # The name of the menu's button comes from the application, not from the medium.
+        self.gear = messages.read_table(
+            application / f"Contents/Resources/{self.language}.lproj/ChooseDeviceView.strings")[
+                "Actions"]
+
+    def _application(self):
+        programs = sorted(self.folder.glob(f"*.app/{_PROGRAM}"))
+        if not programs:
+            raise Unsuitable(f"{self.folder} has no application that runs on Linux")
+        return programs[0].parents[2]
+
+    def _locales(self):
+        """Returns the locales that the user prefers, then those that stand in for them."""
+        names = ("LC_ALL", "LC_MESSAGES", "LANG")
+        locale = next((os.environ[name] for name in names if os.environ.get(name)), "C")
+        preferred = []
+        if locale.split(".")[0] not in ("C", "POSIX"):
+            preferred = [*filter(None, os.environ.get("LANGUAGE", "").split(":")), locale]
+        table = self.folder / _MESSAGES
+        about = _read(table) if table.exists() else {}
+        return [*(preferred or ["en"]), about.get("CFBundleDevelopmentRegion", "en"), "en"]
 
     @property
     def service_type(self):
