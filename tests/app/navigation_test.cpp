@@ -184,7 +184,7 @@ TEST_F(Navigation, AToolThatAsksToGoBackLeadsToTheConnectionPageWithWirelessSele
   EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedColumn, 0);
   EXPECT_EQ(screen.log, (Strings{"unhide", "activate", "key and front"}));
 
-  // The tool may run again after another empty search.
+  // The tool runs again after another search that finds nothing.
   screen.log.clear();
   screen.click("rightMostButton");
   EXPECT_EQ(screen.log.back(), "hide");

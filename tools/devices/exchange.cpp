@@ -193,7 +193,7 @@ constexpr std::array kTellingOrder{
 }  // namespace
 
 const Exchange* Answer::telling() const {
-  // Asking ends at the address that decides, so the last value is that address's.
+  // If an address decides with a value, the asking ends there, so that value is the last.
   const auto last = std::find_if(exchanges.rbegin(), exchanges.rend(),
                                  [](const Exchange& e) { return e.outcome == Outcome::kValue; });
   if (last != exchanges.rend()) return &*last;

@@ -35,9 +35,10 @@ def languages(medium):
 
 
 def language(medium, locales):
-    """Returns the medium's language that users read whose locales are `locales`, the first first.
+    """Returns the language in which a user reads the medium's texts.
 
-    Returns "en" if the medium has no texts.
+    `locales` are the user's, the preferred one first. If the medium has texts for none of them,
+    returns its first language, or "en" if it has no texts at all.
     """
     offered = languages(medium)
     for wanted in locales:

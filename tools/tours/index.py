@@ -16,7 +16,10 @@ img {{ max-width: 30em; border: 1px solid gray }}
 
 
 def write(pictures, medium):
-    """Writes index.html beside the pictures, with a section for each language, if there are any."""
+    """Writes index.html beside the pictures, with a section for each language.
+
+    Writes nothing when there are no pictures.
+    """
     sections = {}
     for picture in sorted(pictures.glob("*.png")):
         sections.setdefault(picture.stem.partition("-")[0], []).append(picture)

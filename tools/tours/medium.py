@@ -16,7 +16,10 @@ class Unsuitable(Exception):
 
 
 class Medium:
-    """A medium's folder with the application on it, read in `language` or the user's."""
+    """A medium's folder with the application on it, and its texts in one language.
+
+    The language is `language`, or the one in which the user reads the medium.
+    """
 
     def __init__(self, folder, language=None):
         self.folder = pathlib.Path(folder)

@@ -154,7 +154,7 @@ class Tour:
                 raise WentWrong(f"the wizard's window is not there any more: {error}") from error
 
     def _first_page(self, person):
-        """Waits for the wizard's first page, or for the alert. Returns which of them it shows."""
+        """Waits for the wizard's first page or alert. Returns the key of the text that it is known by."""
         def shown():
             _expect(person.is_running(), f"no page appeared: the wizard ended with status "
                     f"{person.process.returncode}, and {self._what_was_opened()}")
