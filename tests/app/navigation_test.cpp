@@ -18,7 +18,7 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// Launches the wizard with a list of `models` and goes to the connection page of the first one.
+  /// Launches the wizard with a list of `models` and goes to the connection page of the first.
   /// The models must differ in their cables, because the wizard otherwise skips the list.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
@@ -30,8 +30,8 @@ class Navigation : public Wizard {
     ASSERT_EQ(page(), "ConnectionTypeView");
   }
 
-  /// Starts a search on the connection page that finds nothing. The set-up tool then runs and exits
-  /// with `exitStatus`.
+  /// On the connection page, starts a search that finds nothing. The set-up tool then runs and
+  /// exits with `exitStatus`.
   void searchInVainWithTool(int exitStatus) {
     medium.addSetUpTool(exitStatus);
     screen.click("rightMostButton");

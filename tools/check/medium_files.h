@@ -33,8 +33,8 @@ class MediumFiles {
   /// Returns the path at which the wizard looks for `relative`.
   [[nodiscard]] std::string fullPath(const std::string& relative) const;
 
-  /// Returns whether the medium has a file or folder at `relative`, capitals included. Reports it
-  /// if not.
+  /// Returns whether `relative`, capitals included, is the path of a file or folder on the medium.
+  /// Reports the mistake if it is not.
   bool exists(const std::string& relative, const PathUse& use) const;
 
   /// Returns the property list at `relative`, and reports keys that a dictionary in it has twice.
@@ -51,7 +51,7 @@ class MediumFiles {
   /// read.
   [[nodiscard]] std::vector<std::string> names(const std::string& relative) const;
 
-  /// Adds the line number to each finding about a key of an XML property list, if it is known.
+  /// Adds the line number, if it is known, to each finding about a key of an XML property list.
   void addLines() const;
 
  private:

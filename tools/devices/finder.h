@@ -19,7 +19,7 @@ namespace onramp::devices {
 /// only.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Called with a device when it is found or found again, is resolved, or is gone.
+  /// Called with a device when it is found under a type, is resolved, or has left a type.
   using Changed = std::function<void(Device& device)>;
 
   /// For a device that is announced under several types, the announcement under `preferred` is
