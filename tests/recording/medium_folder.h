@@ -27,7 +27,7 @@ class MediumFolder {
     return root_ / "medium/" + relative;
   }
 
-  /// Write a file on the medium, and create its folder if it is missing.
+  /// Write a file on the medium. The file's folder is created if it is missing.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   void makeExecutable(const std::string& relative) const;
