@@ -11,8 +11,8 @@ namespace onramp {
 
 namespace {
 
-// Converts a property list to a value, unless the list exceeds the limits in
-// platform/property_list.h.
+// Converts a property list to a value. Returns nothing when the list exceeds the limits in
+// platform/property_list.h or `object` is not a property-list object.
 class Reader {
  public:
   std::optional<Value> read(id object, std::size_t depth) {
@@ -30,7 +30,7 @@ class Reader {
   }
 
  private:
-  // The two Boolean objects are singletons. The kind of any other number follows from its type.
+  // The two Boolean objects are singletons. The kind of any other number follows from its C type.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);
@@ -119,8 +119,9 @@ struct ToPropertyList {
   }
 };
 
-// Returns the bytes of a regular file, or nil when the file is of another kind or exceeds the size
-// limit. Links are resolved first, because attributesOfItemAtPath: does not follow them.
+// Returns the bytes of a regular file, or nil when the file is of another kind, exceeds the size
+// limit or cannot be read. Links are resolved first, because attributesOfItemAtPath: does not
+// follow them.
 NSData* contents(NSString* path) {
   NSString* const file = [path stringByResolvingSymlinksInPath];
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file

@@ -34,7 +34,7 @@ QString textOf(std::string_view text) {
 
 // Creates the widgets of an interface file, including those that this front end defines. For an
 // unknown class it creates a plain widget and stores the name of the class in a property, because
-// an interface file names a page's class in this way.
+// an interface file gives a page's root the class of the page.
 class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;
@@ -160,8 +160,8 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// Owns the root widget unless its parent has destroyed it. While a page is shown, its root is a
-// child of the window, and the window may be destroyed before the page.
+// Owns the root widget, unless the widget's parent has already destroyed the widget. While a page
+// is shown, its root is a child of the window, and the window may be destroyed before the page.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

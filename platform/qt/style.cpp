@@ -28,8 +28,8 @@ void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.restore();
 }
 
-// Returns the colour of the selection. If the title on it is lighter, the colour is darkened until
-// the title can be read.
+// Returns the colour of the default button, which is that of selections. If the button's title is
+// lighter than this colour, the colour is darkened until the title can be read.
 QColor defaultButtonColor(const QPalette& palette) {
   QColor color = palette.color(QPalette::Highlight);
   const int title = qGray(palette.color(QPalette::HighlightedText).rgb());
@@ -146,8 +146,8 @@ QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, con
   const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
   // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
-  // Fusion's column for check marks is as wide as the item is high, but its width leaves no room
-  // for that column when the text is large.
+  // Fusion's column for check marks is as wide as the item is high, but the width that Fusion
+  // computes leaves no room for that column when the text is large.
   if (type == CT_MenuItem) return normal + QSize(normal.height(), 0);
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

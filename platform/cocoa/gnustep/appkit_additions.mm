@@ -36,7 +36,7 @@ void ignore(id, SEL, BOOL) {}
 
 @implementation OnrampWaitingSheet
 
-// The timer fires again inside the sheet's loop when that runs in another mode.
+// The timer fires again inside the sheet's loop if that loop runs in another mode.
 - (void)begin {
   if (_hasBegun) return;
   _hasBegun = YES;
@@ -77,7 +77,8 @@ id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows every program.
+// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows the programs of the
+// desktop.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
