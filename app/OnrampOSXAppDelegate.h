@@ -52,7 +52,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void applicationDidFinishLaunching() override;
   [[nodiscard]] bool applicationShouldTerminateAfterLastWindowClosed() override { return true; }
 
-  /// Returns false, which keeps the window open, while the wizard waits for a device search.
+  /// Returns false while the wizard waits for a device search. The window then stays open.
   [[nodiscard]] bool windowShouldClose(const Window& closing) override;
 
   /// Asks the application to terminate.

@@ -27,7 +27,7 @@ class ApplicationDelegate : public InterfaceOwner {
   /// terminate.
   [[nodiscard]] virtual bool applicationShouldTerminateAfterLastWindowClosed() = 0;
 
-  /// Called when the user tries to close `window`. Returns whether the window may close.
+  /// Called when the user tries to close `window` or to quit. Returns whether that is allowed.
   [[nodiscard]] virtual bool windowShouldClose(const Window& window) = 0;
 };
 
