@@ -43,8 +43,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Sets up the window, its background picture and the application menu.
   void awakeFromNib() override;
 
-  /// Checks the system's version. On a supported system, deletes the files for the package that
-  /// earlier runs wrote. On any other, shows an alert and terminates the application.
+  /// Checks the system's version. On a supported system, deletes the files that earlier runs wrote
+  /// for the installer package. On any other system, closes the window, shows an alert and
+  /// terminates the application.
   void applicationWillFinishLaunching() override;
 
   /// Shows the first page, or opens the package and quits when no model on the medium supports
@@ -52,7 +53,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void applicationDidFinishLaunching() override;
   [[nodiscard]] bool applicationShouldTerminateAfterLastWindowClosed() override { return true; }
 
-  /// Returns false while the wizard waits for a device search. The window then stays open.
+  /// Returns whether the window may close: false while the wizard waits for a device search.
   [[nodiscard]] bool windowShouldClose(const Window& closing) override;
 
   /// Asks the application to terminate.
@@ -76,12 +77,12 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // navigation.cpp: pages and buttons.
 
-  /// Loads the page from the interface file `name`. Returns null when the file is missing or holds
-  /// no view.
+  /// Loads the page from the interface file `name`. Returns null when the file is missing or
+  /// unreadable, or holds no view.
   [[nodiscard]] std::shared_ptr<Page> loadView(const std::string& name);
 
   /// Removes the page that is shown, then shows `page`. When `page` is null, loads a new page from
-  /// the interface file `name` instead. The window stays empty when that page cannot be loaded.
+  /// the interface file `name` instead. The window shows no page when that page cannot be loaded.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
   /// showModelListView() shows a new model list; showConnectionTypeView() shows a new connection
@@ -91,8 +92,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void showConnectionTypeView(ConnectionType type);
 
   /// On the chooser, searches again. On the connection page, shows the chooser if it lists a
-  /// device, and otherwise starts the wireless set-up tool. On any other page, or once the wizard
-  /// has started the tool, shows the chooser and searches.
+  /// device, and otherwise starts the wireless set-up tool. On any other page, and on the
+  /// connection page after the wizard has started the tool, shows the chooser and searches.
   void showChooseDeviceView();
 
   /// Shows `image` stretched over the window's background. Does nothing without an image.
@@ -100,14 +101,14 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Set the titles of a page's buttons and show or hide each button. Every page has Next and
   /// Cancel. The connection page also has Back if the user chose a model, and the chooser has Back
-  /// unless the wizard has started the set-up tool. These functions neither enable nor disable a
-  /// button.
+  /// unless the wizard itself has started the set-up tool. These functions neither enable nor
+  /// disable a button.
   void setModelListViewButton();
   void setConnentionTypeViewButton();
   void setChooseDeviceViewButton();
 
-  /// Each sets the title of the button that is bound to `titleKey` to the localized "Cancel",
-  /// "Back" or "Next".
+  /// Set the text under `titleKey`, which is a button's title, to the localized "Cancel", "Back"
+  /// and "Next", in this order.
   void setCancelButton(std::string_view titleKey);
   void setBackButton(std::string_view titleKey);
   void setNextButton(std::string_view titleKey);
@@ -115,8 +116,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void performAction(std::string_view action) override;
 
   // The buttons' actions. The rightmost button is Next. The button to its left is Back, or Cancel
-  // on a page without Back. The other two buttons always quit. Every button quits while no page is
-  // shown.
+  // on a page without Back. The other two buttons always quit. Every button quits when none of the
+  // three pages is shown.
   void rightMostButtonClicked();
   void rightButtonClicked();
   void leftButtonClicked();
@@ -128,8 +129,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
   /// Compare the running system's version with the medium's maximum and minimum, by the rules of
-  /// isNewerThan() and isOlderThan(). Unlike installationCheck(), they do not skip a bound whose
-  /// "Major" is 0.
+  /// isNewerThan() and isOlderThan(). Unlike installationCheck(), these functions do not skip a
+  /// bound whose "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
@@ -148,28 +149,30 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// The medium's vendor name without its spaces; empty when the medium names no vendor.
   [[nodiscard]] static std::string setVenderName();
 
-  /// Return the paths of the package-options file and of the model file. Each creates the file's
-  /// folder if it is missing. If InstallPKGInfoURL() creates the folder, it makes it writable for
-  /// every user.
+  /// Return the paths of the package-options file, which tells the package what else to install,
+  /// and of the model file, which names the device's model and connection. Each function creates
+  /// the file's folder if the folder is missing, and ignores failures. InstallPKGInfoURL() makes a
+  /// folder that it creates writable for every user.
   [[nodiscard]] static std::string InstallPKGInfoURL();
   [[nodiscard]] static std::string instmodelPlistURL();
 
-  /// Builds and writes the package-options file.
+  /// Builds and writes the package-options file. Ignores failures.
   static void copyCDInfo();
 
   /// Returns the model file's contents for a device that is connected by cable: USB or Ethernet.
   [[nodiscard]] static Dictionary instmodelPlistNotWiFi(const std::string& model);
 
   /// Returns the model file's contents for a wireless device with the KSDevice record `property`.
-  /// Returns the contents for a wired `model` instead when there is no record, when the record
-  /// lacks a name or an address, or when the medium names no service type.
+  /// When there is no record, when the record lacks a name or an address, or when the medium names
+  /// no service type, returns instmodelPlistNotWiFi() for `model`, or for an empty name when
+  /// `model` is nothing.
   [[nodiscard]] static Dictionary instmodelPlistWiFi(const std::optional<std::string>& model,
                                                      const std::optional<Dictionary>& property);
 
   // launching.cpp: starting the package, the set-up tool and the support page.
 
-  /// Writes the package-options file and opens the package. Returns false when the package could
-  /// not be opened.
+  /// Writes the package-options file and opens the package. Returns false when the medium has no
+  /// package for the system, or when the package cannot be opened.
   bool launchPackage();
 
   /// Terminates the application after one second, which gives the package time to open.
@@ -182,7 +185,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void launchWLANToolManually();
 
   /// Returns the URL of the support page for this medium and the user's language and country;
-  /// nothing when the medium's series code makes the URL invalid.
+  /// nothing when the URL would be invalid, for example because the medium's series code contains a
+  /// space.
   [[nodiscard]] static std::optional<std::string> FAQ_URL();
 
   /// Opens `url` in the user's browser. Does nothing without a URL.
@@ -190,34 +194,36 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop until the chooser lists a device, for at most kMostPauses pauses of
-  /// length `pause`, and then ends the search. Meanwhile `page` shows its waiting state, and the
-  /// user can neither click a button nor close the window.
+  /// Waits in a modal loop for kMostPauses pauses of length `pause`, or only until the end of a
+  /// pause at which the chooser lists a device. Then ends the search. During the wait, `page`,
+  /// unless it is null, shows its waiting state, and the user can neither click a button nor close
+  /// the window.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Sleeps for up to kMostPauses pauses, stops early once a device is listed, then ends the modal
-  /// loop. Must not be called on the main thread.
+  /// Sleeps for kMostPauses pauses of length `pause`, or only until the end of a pause at which a
+  /// device is listed, or until the application terminates. Then ends the modal loop. Must not be
+  /// called on the main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 
   /// Waits as showProgress() does, with the chooser as the page. Afterwards enables Next if a
   /// device is listed; otherwise disables Next and says in a sheet that no device was found.
   void showProgressAtChooseDeviceView(std::chrono::seconds pause);
 
-  /// Does the same with the pause that the notification carries under kWaitTime. Without that
-  /// value, the pauses have no length.
+  /// Calls showProgressAtChooseDeviceView() with the pause that the notification carries under
+  /// kWaitTime. If it carries none, the pauses have length 0.
   void showProgressAtChooseDeviceViewByRefresh(const Notification& notification);
 
   /// Tells the user in a sheet that no device was found.
   void showListAlertSheet();
 
-  /// Opens the support page if the user dismissed the sheet with its second button,
-  /// kAlertOtherReturn.
+  /// Opens the support page if `returnCode` is kAlertOtherReturn, which stands for the sheet's
+  /// second button.
   void didEndCloseSheet(int returnCode);
 
  private:
   [[nodiscard]] static std::vector<std::string> allContainedModels();
 
-  /// The chooser page, or null when its interface file was not usable.
+  /// The chooser, or null when its interface file was not usable.
   [[nodiscard]] ChooseDeviceView* chooser() const;
 
   /// The number of devices that the chooser lists. Callable from any thread.
@@ -259,7 +265,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   Dictionary mKSCD;
   std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses from the model list
   std::uint32_t mContainedModelCount = 0;
-  bool mIsWLANTool = false;  ///< whether the wizard itself started the set-up tool
+  /// Whether the wizard itself has started the set-up tool, and the tool has not sent the user
+  /// back.
+  bool mIsWLANTool = false;
   std::shared_ptr<Page> mChooseDeviceViewController;
   std::shared_ptr<Page> mShownPage;  ///< the page whose view is in `mainView`
 };

@@ -25,8 +25,8 @@ std::string fileName(const std::string& vendor, const std::string& kind) {
   return "com." + lowercaseString(vendor) + "." + kind + ".plist";
 }
 
-// Other users' runs and the installer must be able to replace the files in the folder. A folder
-// keeps its permissions if its path is longer than PATH_MAX allows on macOS.
+// Makes `folder` writable for every user, because other users' runs and the installer must be able
+// to replace the files in it. Does nothing if the path is longer than PATH_MAX allows on macOS.
 void openToEveryone(const std::string& folder) {
   constexpr std::size_t kPathBufferSize = 1024;  // bytes, including the terminating zero
   if (folder.size() >= kPathBufferSize) return;
@@ -39,7 +39,7 @@ void setDefault(Dictionary& options, const char* key) {
 }
 
 // Returns the entry for the user's country in the application's SupportedKOL.plist. Returns false
-// when there is none, or when the medium does not offer the online service.
+// when there is no such entry, or when the medium does not offer the online service.
 Value onlineServiceOption(const Dictionary& options) {
   const Value* const offered = options.find("PKG_KestrelOnline");
   if (!offered || offered->boolean() == false) return false;

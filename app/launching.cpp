@@ -18,14 +18,15 @@ namespace onramp {
 
 namespace {
 
-// How long the package has to open before the application terminates.
+// The time between opening the package and terminating the application.
 constexpr std::chrono::milliseconds kQuitDelay{1000};
 
-// How long the window has to disappear before the tool blocks the main thread.
+// The time between hiding the application and running the set-up tool, which blocks the main
+// thread. The window disappears within this time.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
-// Exit statuses of the set-up tool. Any other status, or a tool that cannot be run, leads to a new
-// search.
+// Exit statuses of the set-up tool. Any other status leads to a new search, and so does a tool that
+// cannot be run.
 constexpr int kToolAsksToGoBack = 1;
 constexpr int kToolAsksToQuit = 2;
 

@@ -64,8 +64,8 @@ void OnrampOSXAppDelegate::waitDeviceSearchTask(std::chrono::seconds pause) cons
   abortModal();
 }
 
-// Makes the same pauses when the system cannot start another thread: each pause is a timer that
-// runs in the modal loop.
+// Used in place of waitDeviceSearchTask() when the system cannot start another thread. Each pause
+// is a timer that runs in the modal loop.
 void OnrampOSXAppDelegate::waitOnMainLoop(std::chrono::seconds pause, int pausesLeft) {
   scheduleTimer(pause, [this, pause, pausesLeft] {
     if (pausesLeft > 1 && listedDevices() == 0) {

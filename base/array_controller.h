@@ -15,23 +15,24 @@ namespace onramp {
 /// them. All functions except arrangedCount() must be called on the main thread.
 class ArrayController {
  public:
-  /// Sets the key that rearrange() sorts by. rearrange() compares the entries' texts under `key`
-  /// byte by byte, in ascending order. An entry without such a text sorts as if the text were
-  /// empty. Without a sort key, entries stay in the order in which they were added.
+  /// Sets the key whose values rearrange() sorts by. An entry with no string under `key` sorts as
+  /// if the string were empty. With an empty `key`, which is the default, rearrange() does not
+  /// change the order.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
-  /// Appends `entries`. The new entries stay at the end of the list until the next rearrange(). If
-  /// the list was empty, the first new entry becomes selected.
+  /// Appends `entries` without sorting the list. If the list was empty, its first new entry becomes
+  /// selected. Does nothing when `entries` is empty.
   void addObjects(std::vector<Dictionary> entries);
 
   /// Removes every entry equal to `entry`. If the selected entry is removed, the next remaining
-  /// entry becomes selected, or the last entry when no entry follows.
+  /// entry becomes selected, or the last entry when no entry follows. Nothing is selected in an
+  /// empty list. Does nothing when no entry is equal to `entry`.
   void removeObject(const Dictionary& entry);
 
   void removeAllObjects();
 
-  /// Sorts the entries by the sort key. Entries that compare equal keep their order. The selected
-  /// entry stays selected.
+  /// Sorts the entries by their strings under the sort key, in ascending byte order. Entries with
+  /// equal strings keep their order. The selected entry stays selected.
   void rearrange();
 
   [[nodiscard]] const std::vector<Dictionary>& arrangedObjects() const { return entries_; }
@@ -45,12 +46,13 @@ class ArrayController {
   /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
   void setSelectedObject(const Dictionary& entry);
 
-  /// Select an entry, as setSelectionIndex() and setSelectedObject() do, on behalf of the user. The
-  /// bound table calls choose().
+  /// Select an entry as setSelectionIndex() and setSelectedObject() do, and record that the user
+  /// made the selection. The bound table calls choose().
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 
-  /// Whether the user has chosen an entry, and that entry has not been removed since.
+  /// Whether choose() or chooseObject() has been called. Becomes false again when the selected
+  /// entry is removed and when removeAllObjects() is called.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
   /// Return the index of the selected entry, and the entry itself. Both return nothing when no
@@ -58,9 +60,10 @@ class ArrayController {
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 
-  /// Binds a table to the list. `onChange` is called now and after every change of the entries.
-  /// `onSelect` is called when the selection is set without a change of the entries. A later call
-  /// replaces both functions. Empty functions unbind the table.
+  /// Binds a table to the list. `onChange` is called now, after every change of the entries, and
+  /// after every call of rearrange() and removeAllObjects(). `onSelect` is called after every other
+  /// call that sets the selection. A later call replaces both functions. Empty functions unbind the
+  /// table.
   void bind(std::function<void()> onChange, std::function<void()> onSelect);
 
  private:

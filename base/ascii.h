@@ -8,7 +8,7 @@ namespace onramp {
 
 // These functions classify and convert ASCII characters independently of the user's locale, as
 // protocols and file formats require. The functions of <cctype> depend on the locale, and their
-// behaviour is undefined for negative characters.
+// behaviour is undefined for most negative arguments.
 
 [[nodiscard]] constexpr bool isASCIIDigit(char c) {
   return c >= '0' && c <= '9';

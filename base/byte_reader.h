@@ -11,7 +11,7 @@ namespace onramp {
 /// Reads untrusted bytes, such as those from the network or the medium, from front to back and
 /// never past their end. A read of more bytes than remain returns nothing and does not move the
 /// reader. A copy of a reader moves independently, so it can be used to look ahead. The bytes must
-/// outlive the reader and all its copies.
+/// outlive the reader, its copies and the views that they return.
 class ByteReader {
  public:
   explicit ByteReader(std::span<const std::byte> bytes) : rest_(bytes) {}

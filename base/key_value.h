@@ -20,8 +20,8 @@ class KeyValueTexts {
   /// Returns the text under `key`, or an empty text when none was set.
   [[nodiscard]] std::string valueForKey(std::string_view key) const;
 
-  /// Calls `setter` now if `key` has a text, and again whenever a text is set for the key. A setter
-  /// stays bound as long as this object lives.
+  /// Calls `setter` now if `key` has a text, and later whenever a text is set for the key. A setter
+  /// stays bound as long as this object lives, and must not call bind().
   void bind(std::string_view key, Setter setter);
 
  private:

@@ -6,11 +6,11 @@
 
 namespace onramp {
 
-/// The reason why a file or a text cannot be parsed, and the place of the error. Only the first
-/// problem that is noted is kept.
+/// The reason why a file or a text cannot be parsed, and the place of the error. Of several calls
+/// of note(), only the first one has an effect.
 struct ParseProblem {
   std::string reason;      ///< a phrase such as "\";\" expected"; empty when nothing is wrong
-  std::size_t offset = 0;  ///< in bytes from the start of the file, or of the text in UTF-8
+  std::size_t offset = 0;  ///< in bytes: in a binary file, or in the UTF-8 form of a text
 
   void note(std::string why, std::size_t where) {
     if (reason.empty()) *this = {std::move(why), where};

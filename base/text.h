@@ -32,19 +32,21 @@ std::optional<char32_t> takeUTF8(std::string_view& text);
   return unit >= 0xDC00 && unit <= 0xDFFF;
 }
 
-/// Returns the character that a pair of surrogates encodes.
+/// Returns the character that a lead and a trail surrogate encode together.
 [[nodiscard]] constexpr char32_t joinedSurrogates(char32_t lead, char32_t trail) {
   return 0x10000 + ((lead - 0xD800) << 10) + (trail - 0xDC00);
 }
 
-/// Converts the contents of a text file in UTF-8 or UTF-16 to UTF-8 without a byte-order mark. A
-/// file without a byte-order mark is read as UTF-16 when one of its first two bytes is zero. This
-/// is safe because all files that the program reads begin with an ASCII character. Returns nothing
-/// when the bytes are malformed.
+/// Takes the contents of a text file, in UTF-8 or UTF-16, and returns the text in UTF-8 without a
+/// byte-order mark. A file without a byte-order mark is read as UTF-16 when one of its first two
+/// bytes is zero, otherwise as UTF-8. This is safe because all text files that the program reads
+/// begin with an ASCII character, which has a zero byte only in UTF-16. Returns nothing when the
+/// bytes are malformed.
 [[nodiscard]] std::optional<std::string> decodedText(std::string_view bytes);
 
-/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). It may have only
-/// the characters allowed there, at most one "#", and "%" only before two hexadecimal digits.
+/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). Such a text has
+/// only the characters that these parts may have, at most one "#", and two hexadecimal digits after
+/// every "%". An empty text is valid.
 [[nodiscard]] bool isURLText(std::string_view text);
 
 }  // namespace onramp

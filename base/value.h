@@ -39,22 +39,21 @@ class Dictionary {
   Dictionary(std::initializer_list<Pair> pairs);
   explicit Dictionary(std::vector<Pair> pairs);
 
-  /// Returns the value under `key`, or null when there is none. The pointer is valid while this
-  /// dictionary or a copy of it exists.
+  /// Returns the value under `key`, or null when there is none. The pointer is valid until this
+  /// dictionary and all its copies have been destroyed or assigned to.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
   /// Return the value under `key` if it is of the type that the function is named after. Otherwise
-  /// array() returns null and the other two return nothing. The array pointer is valid while this
-  /// dictionary or a copy of it exists.
+  /// array() returns null and the other two return nothing. The pointer to an array is valid as
+  /// long as that of find().
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;
 
-  /// Whether the number or boolean under `key` is not zero; nothing when the value is absent or of
-  /// another type.
+  /// Returns the value under `key` converted by Value::boolean(); nothing when there is no value.
   [[nodiscard]] std::optional<bool> boolean(std::string_view key) const;
 
-  /// Returns the value under `key` converted by Value::integerValue(); 0 when it is absent.
+  /// Returns the value under `key` converted by Value::integerValue(); 0 when there is no value.
   [[nodiscard]] std::int64_t integerValue(std::string_view key) const;
 
   /// Returns a copy that has `value` under `key`, replacing the earlier value if there was one.
@@ -76,8 +75,8 @@ class Dictionary {
 /// One property-list value.
 class Value {
  public:
-  /// An integer is stored as signed if it fits. The unsigned type holds only integers of 2^63 and
-  /// above.
+  /// An integer that fits in std::int64_t is stored in that type. So std::uint64_t holds only
+  /// integers of 2^63 and above.
   using Storage = std::variant<bool, std::int64_t, std::uint64_t, double, std::string, Data, Date,
                                Array, Dictionary>;
 
@@ -102,13 +101,14 @@ class Value {
     return std::get_if<Kind>(&storage_);
   }
 
-  /// Whether a number or boolean is not zero; nothing for all other types.
+  /// Returns a boolean itself, and for a number whether it is not zero. Returns nothing for all
+  /// other types.
   [[nodiscard]] std::optional<bool> boolean() const;
 
   /// Converts the value to an integer. A boolean gives 0 or 1. A real number is truncated towards
   /// zero; NaN gives 0. A string gives the decimal integer that it begins with, or 0 when it does
-  /// not begin with one. White space and one sign may precede the digits. A number outside the
-  /// signed 64-bit range gives the nearest end of the range. All other types give 0.
+  /// not begin with one. ASCII white space and one sign may precede the digits. A number outside
+  /// the signed 64-bit range gives the nearest end of the range. All other types give 0.
   [[nodiscard]] std::int64_t integerValue() const;
 
   friend bool operator==(const Value& a, const Value& b) { return a.storage_ == b.storage_; }

@@ -130,8 +130,8 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   const bool wasValid = std::exchange(entry.isValid, false);
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
-    // Only the first removal since the last resolve lowers the count. So an entry that was added
-    // three times or more survives removals in quick succession. This is intended.
+    // Only the first removal after an addition or a resolve lowers the count. So an entry that was
+    // added three times or more survives removals in quick succession. This is intended.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {
@@ -155,7 +155,7 @@ std::string KSBonjour::keyForService(const std::string& name, const std::string&
 }
 
 // Returns the key under which `service` belongs in this browser's table. Returns nothing when the
-// service is of another type, or when the browser is stopped.
+// service is null, lacks a part of the key or is of another type, and when the browser is stopped.
 std::optional<std::string> KSBonjour::ownKeyOf(const NetServiceRef& service) const {
   if (!service || !_services) return std::nullopt;
   const auto name = service->name();

@@ -35,8 +35,8 @@ class KSBonjourObserver {
   /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
   /// Called when a service is gone, after the browser's table has been updated. A service that was
-  /// added more than once may still be in it. `service` is the table's object, or null when the
-  /// table did not contain the service.
+  /// added more than once may still be in the table. `service` is the table's object, or null when
+  /// the table did not contain the service.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
   /// Called when a service's addresses and TXT record are known, after the browser's table has been
   /// updated.
@@ -84,8 +84,9 @@ class KSBonjour {
   [[nodiscard]] static std::string keyForService(const std::string& name, const std::string& type,
                                                  const std::string& domain);
 
-  // Look up a service in the table. They return false or null when the service is not in the table
-  // or when an argument is nothing.
+  // These functions look up a service in the table. They return false or null when the service is
+  // not in the table or when an argument is nothing. didServiceResolved() also returns false when
+  // the service in the table is not resolved.
   [[nodiscard]] bool isServiceContained(const std::optional<std::string>& name,
                                         const std::optional<std::string>& type,
                                         const std::optional<std::string>& domain) const;

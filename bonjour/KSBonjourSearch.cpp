@@ -101,7 +101,8 @@ void KSBonjourSearch::resolvedBonjourService(const NetServiceRef& service) {
     return b->isServiceContained(id.name, id.type, id.domain) &&
            b->didServiceResolved(id.name, id.type, id.domain);
   });
-  // The reporting browser has already stored the entry, so this is usually an update.
+  // The browser that reports the service has already stored it as resolved, so this is usually an
+  // update.
   if (known) {
     notifyUpdateToKSDeviceObserver(record);
   } else {

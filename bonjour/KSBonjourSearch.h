@@ -20,9 +20,9 @@ class KSDeviceObserver {
 
   /// Called when a device that is in no browser's table is resolved.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is resolved, or when it is reported gone but is still in a browser's
-  /// table. A new device is usually announced by this function, so an observer must add a device
-  /// that it does not know.
+  /// Called when a device that is in a browser's table is resolved, and when a device is reported
+  /// gone but is still in a browser's table. The search usually reports a new device by this
+  /// function, so an observer must add a device that it does not know.
   virtual void updateKSDevice(const Dictionary& device) = 0;
   /// Called when a device is gone from the tables of all browsers.
   virtual void removeKSDevice(const Dictionary& device) = 0;
@@ -57,8 +57,8 @@ class KSBonjourSearch final : public KSBonjourObserver,
   /// Ends the search without calling observers.
   void stopBrowsing();
 
-  /// Returns the service types for which a browser's table has the instance with that name and
-  /// domain, in the order of the browsers.
+  /// Returns the type of each browser whose table has a service with this name and domain, in the
+  /// order of the browsers. Returns no types when an argument is nothing.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

@@ -10,7 +10,8 @@ namespace onramp {
 namespace {
 
 // Returns an empty text for a null service, but nothing when a service lacks the text. So the model
-// name of a null service is one space, but it is empty when a service lacks a part of it.
+// name of a null service is one space, but the model name of a service that lacks the manufacturer
+// or the model is empty.
 std::optional<std::string> textOf(const NetServiceRef& service,
                                   std::optional<std::string> (*read)(const NetServiceRef&)) {
   return service ? read(service) : "";

@@ -9,14 +9,15 @@
 namespace onramp {
 
 /// Makes device records. A record is a dictionary that holds what one network service says about
-/// its device. Unknown texts and lists are empty.
+/// its device. Unknown texts and lists are empty, except that the model name of a null service is
+/// one space.
 class KSDevice {
  public:
   KSDevice() = delete;
 
   // Keys of the record. All eight are always present.
   static constexpr std::string_view kDisplayName = "display name";  ///< string
-  static constexpr std::string_view kModelName = "model name";      ///< string
+  static constexpr std::string_view kModelName = "model name";      ///< string, maker and model
   static constexpr std::string_view kBonjourServiceType =
       "bonjour service type";                                            ///< array of strings
   static constexpr std::string_view kUSBManufacturer = "USB_MFG";        ///< string

@@ -9,8 +9,9 @@ namespace onramp {
 
 namespace {
 
-// The offsets of the address family and of an IPv6 address in the socket addresses that
-// NetService::addressing() returns.
+// The offsets of the address family and of an IPv6 address, and the number of the family, in the
+// socket addresses that NetService::addressing() returns. They have the BSD layout on every system,
+// in which the family is 30.
 constexpr std::size_t kFamilyPlace = 1;
 constexpr std::size_t kIPv6Place = 8;
 constexpr std::size_t kIPv6Length = 16;

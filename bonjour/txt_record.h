@@ -17,8 +17,9 @@ class TxtRecord {
   /// key.
   [[nodiscard]] static std::optional<TxtRecord> parse(std::span<const std::byte> data);
 
-  /// Returns the value of the first attribute called `key`, ignoring case. The value may contain
-  /// zero bytes. Returns nothing when there is no such attribute, or when the attribute has no "=".
+  /// Returns the value of the first attribute called `key`, ignoring the case of the letters A to
+  /// Z. The value may contain zero bytes. Returns nothing when there is no such attribute, or when
+  /// the first one has no "=".
   [[nodiscard]] std::optional<std::string> value(std::string_view key) const;
 
  private:

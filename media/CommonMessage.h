@@ -5,7 +5,7 @@
 
 namespace onramp {
 
-/// The texts that the user sees. They come from the message bundle on the medium.
+/// Access to the message bundle on the medium, which holds the texts of the wizard.
 namespace CommonMessage {
 
 /// Returns medium::fullPath(relativePath).
@@ -13,8 +13,8 @@ namespace CommonMessage {
     const std::optional<std::string>& relativePath);
 
 /// Returns the text of `key` in the user's language, or `value` when the medium has no message
-/// bundle or the table lacks the key. Without a `table`, the bundle's default table is used. Every
-/// call opens the bundle again.
+/// bundle or the table lacks the key. Without a `table`, the text is looked up in the bundle's
+/// default table. Every call opens the bundle again.
 [[nodiscard]] std::string localizedStringForKey(const std::string& key, const std::string& value,
                                                 const std::optional<std::string>& table);
 

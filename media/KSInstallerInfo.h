@@ -9,44 +9,46 @@
 
 namespace onramp {
 
-/// A file, given by its absolute path.
+/// A file or folder, given by its absolute path. The file need not exist.
 struct FileURL {
   std::string path;
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
 
-/// Returns the key of "PkgInfo" that names the package for the system version `version`, or nothing
-/// when no key covers that version. `version` is in binary-coded decimal: 0x1068 is 10.6.8.
-/// "PkgName" takes precedence over the keys that this function returns.
+/// Returns the key, within the medium resource dictionary's "PkgInfo" dictionary, that names the
+/// package for system version `version`. Returns nothing when no key covers that version. `version`
+/// is in binary-coded decimal: 0x1068 is 10.6.8. "PkgName" takes precedence over the keys that this
+/// function returns.
 [[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
 /// Where the installer package and the wireless set-up tool are on the medium, and which systems
 /// the medium supports. Only the constructor reads the medium.
 class KSInstallerInfo {
  public:
-  /// Reads the medium that the application is on.
+  /// Reads the medium that the wizard is on.
   KSInstallerInfo();
 
   /// Sets all values from the medium resource dictionary `common`, or to their defaults when
   /// `common` is nothing.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
-  // Each sets the value that it is named after.
+  // Each sets only the values that it is named after, from the dictionary or to their defaults.
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);
 
-  /// The package to open; nothing when the medium has none for the running system.
+  /// The package to open, which may not exist. Nothing when the medium resource dictionary could
+  /// not be read, or when its "PkgInfo" gives no folder or no package name for the running system.
   [[nodiscard]] const std::optional<FileURL>& pkgURL() const { return mPkgURL; }
 
   /// The path of the set-up tool's application bundle, which may not exist. When the medium
-  /// resource dictionary names no tool, this is the folder that holds the application. Nothing when
-  /// the dictionary could not be read.
+  /// resource dictionary names no tool, this is the folder that holds the wizard. Nothing when the
+  /// dictionary could not be read.
   [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
 
   /// The bounds of the supported system versions, as system_range.h explains them. Each is a
-  /// dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A "Major" of 0,
-  /// the default, means that there is no bound.
+  /// dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A key that the
+  /// medium leaves out counts as 0. A "Major" of 0, the default, means that there is no bound.
   [[nodiscard]] const Dictionary& supportSystemMin() const { return mSystemMin; }
   [[nodiscard]] const Dictionary& supportSystemMax() const { return mSystemMax; }
 

@@ -9,8 +9,9 @@
 
 namespace onramp {
 
-/// Makes a record of the medium: the models that it serves, the packages that it holds, and the
-/// service type by which its devices are found.
+/// Makes a record of the medium: the models that the medium serves, whether it has a printer
+/// package and a scanner package, its series code at the support centre, and the service type by
+/// which devices of these models are found.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.
@@ -21,12 +22,13 @@ inline constexpr std::string_view kKSCSeriesCode = "KSC Series Code";           
 inline constexpr std::string_view kBonjourServiceType =
     "bonjour service type for browsing";  ///< string
 
-/// Returns the record of the medium that the application is on. Every call reads the medium again.
+/// Returns the record of the medium that the wizard is on. Every call reads the medium again.
 [[nodiscard]] Dictionary initWithCDInfo();
 
-/// Returns the record for the medium description `info` and the medium resource dictionary
-/// `CDCommonInfo`. A value that is absent or of the wrong type gets its default: no models, true or
-/// an empty text. Without a description, all values get their defaults.
+/// Returns the record for the dictionary `info`, which is in the file that "CDInfo" names, and the
+/// medium resource dictionary `CDCommonInfo`. A value that is absent or of the wrong type gets its
+/// default: no models, true for a package, an empty text. Without `info`, all values get their
+/// defaults, even the service type, which comes from `CDCommonInfo`.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
@@ -36,7 +38,8 @@ inline constexpr std::string_view kBonjourServiceType =
 
 }  // namespace KSOROSXCD
 
-/// Returns the record's "contained models" as texts, in the record's order.
+/// Returns the strings under kContainedModels, in the record's order. Returns no models when the
+/// record has no such array.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

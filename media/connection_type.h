@@ -8,9 +8,9 @@
 
 namespace onramp {
 
-/// The interfaces other than wireless that a model supports, or that several models have in common.
+/// The wired connections that a model supports, or on which several models agree.
 enum class ConnectionType : unsigned char {
-  kNeither = 0,  ///< neither USB nor wired Ethernet, or the models disagree
+  kNeither = 0,  ///< neither USB nor Ethernet, or models that disagree
   kEthernet = 2,
   kUSB = 3,
   kUSBAndEthernet = 4,
@@ -22,7 +22,7 @@ enum class ConnectionType : unsigned char {
 /// the record counts as false.
 [[nodiscard]] ConnectionType connectionType(const Dictionary& model);
 
-/// Returns the type that all of `models` share according to `modelInfo`; kNeither when any two
+/// Returns the type that all of `models` share according to `modelInfo`; kNeither also when any two
 /// differ or there are none.
 [[nodiscard]] ConnectionType sharedConnectionType(const std::vector<std::string>& models,
                                                   const std::optional<Dictionary>& modelInfo);
@@ -33,11 +33,13 @@ enum class ConnectionType : unsigned char {
 
 /// The page that the wizard begins with.
 enum class FirstPage {
-  kNone,  ///< none: no model supports wireless, so the package opens at once
+  kNone,  ///< no page: no model supports wireless, so the package opens at once
   kConnectionType,
   kModelList,
 };
 
+/// Returns the first page for a medium with `models`: kNone when no model supports wireless,
+/// kConnectionType when the models share a type other than kNeither, and otherwise kModelList.
 [[nodiscard]] FirstPage firstPage(const std::vector<std::string>& models,
                                   const std::optional<Dictionary>& modelInfo);
 

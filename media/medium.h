@@ -22,24 +22,27 @@ inline constexpr std::string_view kVenderName = "VenderName";
 [[nodiscard]] std::string withoutClosingSlash(std::string path);
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
-/// at `bundlePath`. Without a relative path, returns that folder. When `bundlePath` contains no
-/// "/", returns the relative path itself. Drops slashes at the end. Does not access the disk.
+/// at `bundlePath`. Without a relative path, returns that folder. `bundlePath` must not end in "/".
+/// When it contains no "/", returns the relative path itself, or an empty text without one. Drops
+/// slashes at the result's end, as withoutClosingSlash() does. Does not access the disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 
-/// Returns the full path of `relativePath` for the running application's bundle.
+/// Returns fullPath() for the bundle of the running program.
 [[nodiscard]] std::string fullPath(const std::optional<std::string>& relativePath);
 
 /// Reads the medium resource dictionary, a property list that describes the medium and names its
-/// other files. Returns nothing when it cannot be read.
+/// other files. The wizard's information dictionary gives the list's relative path under
+/// "CommonResourcePath". Returns nothing when the list cannot be read.
 [[nodiscard]] std::optional<Dictionary> loadResourceDictionary();
 
-/// Reads the property-list dictionary whose relative path `resources` holds under `key`. Returns
-/// nothing when the path is absent or the file cannot be read.
+/// Reads the dictionary in the property list whose relative path is the string under `key` in
+/// `resources`. Returns nothing when there is no such string or no such dictionary.
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 
-/// Returns the vendor name in `resources` without its spaces; empty when there is none.
+/// Returns the vendor name in `resources` without its spaces; empty when `resources` has no vendor
+/// name.
 [[nodiscard]] std::string vendorName(const std::optional<Dictionary>& resources);
 
 }  // namespace onramp::medium

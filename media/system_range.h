@@ -26,20 +26,23 @@ enum class SystemSupport : std::uint32_t {
   kNewerThanMaximum = 2,
 };
 
-// The bounds below are version dictionaries from KSInstallerInfo.
+// The functions that follow take bounds in the form that KSInstallerInfo returns. A key that is
+// missing counts as 0.
 
-/// Whether `bound` sets a limit. A bound whose "Major" is 0 sets none.
+/// Whether `bound` sets a limit: whether its "Major" is not 0. isNewerThan() and isOlderThan() do
+/// not check this.
 [[nodiscard]] bool isBound(const Dictionary& bound);
 
 /// Whether `version` is above `maximum`. The maximum's "Major" and "Minor" are inclusive, but its
-/// "BugFix" is exclusive: it is the first bug-fix release above the maximum. A "BugFix" of "x"
-/// allows every bug-fix release of that minor version.
+/// "BugFix" is exclusive: it is the first bug-fix release above the maximum. A "BugFix" of "x" or
+/// "X" allows every bug-fix release of that minor version.
 [[nodiscard]] bool isNewerThan(const Dictionary& maximum, const SystemVersion& version);
 
 /// Whether `version` is below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
-/// How `version` compares with both bounds. The maximum is checked first.
+/// How `version` compares with both bounds. The maximum is checked first. A bound that sets no
+/// limit is skipped.
 [[nodiscard]] SystemSupport systemSupport(const SystemVersion& version, const Dictionary& minimum,
                                           const Dictionary& maximum);
 

@@ -6,7 +6,8 @@ namespace onramp {
 
 namespace {
 
-// Returns the store's entry under `key`. The store receives the key as a pattern.
+// Returns the dictionary under `key` in the dynamic store, or nothing when there is none. Passes
+// the key to the store as a pattern.
 std::optional<Dictionary> stateUnder(const std::string& storeName,
                                      const std::optional<std::string>& key) {
   if (!key) return std::nullopt;

@@ -10,9 +10,10 @@
 namespace onramp {
 
 /// The computer's IPv4 addresses at the time the list was made: one dictionary for every interface
-/// that has IPv4 state, in no particular order. Each dictionary has arrays of dotted texts under
-/// kSCPropNetIPv4Addresses, kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks; an
-/// array may be missing. Null when there is no list.
+/// that has an IPv4 entity in the dynamic store (platform/dynamic_store.h), in no particular order.
+/// Each dictionary has arrays of dotted texts under kSCPropNetIPv4Addresses,
+/// kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks; an array may be missing. Null
+/// when there is no list.
 using local_address_list = std::shared_ptr<const Array>;
 
 /// The error code for an invalid argument.
@@ -20,8 +21,9 @@ inline constexpr int kLocalAddressListMisused = 1;
 
 /// Makes a new list and stores it in `*out_list`, which must be null on entry. Returns 0 on
 /// success; the list of a computer without IPv4 is empty. Returns kLocalAddressListMisused when
-/// `out_list` is null or already holds a list, otherwise the dynamic store's error code, or
-/// kSCStatusFailed when the store reports none. On failure `*out_list` is unchanged.
+/// `out_list` is null or `*out_list` already holds a list. For any other failure, returns the
+/// dynamic store's error code, or kSCStatusFailed when the store reports none. On failure
+/// `*out_list` is unchanged.
 int KSSysConfigCopyCurrentLocalAddressList(local_address_list* out_list);
 
 /// Returns the number of interfaces in `list`; 0 for null.

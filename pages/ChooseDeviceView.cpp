@@ -15,8 +15,8 @@ namespace onramp {
 
 namespace {
 
-// Returns the set-up tool's display name in the user's language. Without one, returns the name of
-// the tool's file without its extension.
+// Returns the set-up tool's display name in the user's language. If the tool has none, returns the
+// tool's file name without the extension. Returns an empty text when the medium cannot be read.
 std::string setupToolName() {
   const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
   if (!tool) return "";
@@ -101,7 +101,7 @@ void ChooseDeviceView::stopBrowsing() {
   if (!mBonjourSearch) return;
   mBonjourSearch->stopBrowsing();
   mBonjourSearch->removeKSDeviceObserver(this);
-  // The search may be the caller, so it is destroyed only after the current event.
+  // The search may have called this function, so it is destroyed only after the current event.
   performOnMainThread([search = std::exchange(mBonjourSearch, nullptr)] {});
 }
 

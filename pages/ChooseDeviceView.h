@@ -16,9 +16,9 @@
 
 namespace onramp {
 
-// The notifications by which the page makes requests to the application.
+// The notifications by which the chooser asks the controller to do something.
 
-/// Requests that the wireless set-up tool be launched. Has no user info.
+/// Requests that the wireless set-up tool be launched. Carries no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
 /// Requests a wait for the device search. Carries the length of a pause in seconds, an int, under
@@ -27,9 +27,9 @@ inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceW
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
 /// The page that lists the devices found on the network. A device is listed if its model is one of
-/// those being looked for and the device reports that it is on wireless. The page is created once;
-/// its list and its search continue while another page is shown. A running search shares ownership
-/// of the page until stopBrowsing() is called.
+/// those being looked for and the device reports that it is on wireless. The page is created once.
+/// While another page is shown, it keeps its list, and a running search goes on. A running search
+/// shares ownership of the page until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
@@ -37,8 +37,8 @@ class ChooseDeviceView final : public Page,
   // Keys of a list entry.
   static constexpr std::string_view kDevice = "device";        ///< string, the device's name
   static constexpr std::string_view kInterface = "interface";  ///< string, kind of connection
-  static constexpr std::string_view kLocation = "location";    ///< string, the first address
-  static constexpr std::string_view kKSDevice = "ksdevice";    ///< dictionary, the device record
+  static constexpr std::string_view kLocation = "location";  ///< string, the first address, if any
+  static constexpr std::string_view kKSDevice = "ksdevice";  ///< dictionary, the device record
 
   /// The length of a pause in the wait that refreshBrowsing() requests.
   static constexpr std::chrono::seconds kRefreshPause{3};
@@ -57,10 +57,11 @@ class ChooseDeviceView final : public Page,
   /// Ends the search. The list keeps its entries. Does nothing when no search is running.
   void stopBrowsing();
 
-  /// Empties the list, starts a new search and asks the application to wait for it.
+  /// Empties the list, starts a new search and asks the controller to wait for devices. Returns
+  /// when the wait is over.
   void refreshBrowsing();
 
-  /// Ends the search and asks the application to launch the wireless set-up tool.
+  /// Ends the search and asks the controller to launch the wireless set-up tool.
   void setupWizardMenu();
 
   /// The number of devices listed. Callable from any thread.
@@ -75,8 +76,9 @@ class ChooseDeviceView final : public Page,
   /// Shows or hides the waiting state.
   void progressON(bool on);
 
-  /// Called by the search. addKSDevice() and updateKSDevice() ask the device whether it is on
-  /// wireless, which may block for seconds.
+  /// Called by the search. addKSDevice() and updateKSDevice() call setServiceToList() if
+  /// doesMatchedModel() and then doesWiFi(), which may block for seconds, return true.
+  /// removeKSDevice() calls removeServiceFromList() if doesMatchedModel() returns true.
   void addKSDevice(const Dictionary& device) override;
   void updateKSDevice(const Dictionary& device) override;
   void removeKSDevice(const Dictionary& device) override;
@@ -84,13 +86,16 @@ class ChooseDeviceView final : public Page,
   /// Whether the device is of a model being looked for. Always false when no models have been set.
   [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
 
-  /// Whether the device answers that it is on wireless. Blocks for seconds when it does not answer.
+  /// Whether the device answers that it is on wireless; false when the record has no addresses.
+  /// Blocks for about 12 seconds for each address that does not answer.
   [[nodiscard]] static bool doesWiFi(const Dictionary& device);
 
-  /// Adds the device's entry to the list, replacing an equal entry if there is one.
+  /// Adds the device's entry to the list, replacing an equal entry if there is one. The entry that
+  /// the user has chosen stays selected.
   void setServiceToList(const Dictionary& device);
 
-  /// Removes the device's entry from the list.
+  /// Removes the entry that equals the one made from the record `device`. Does nothing when there
+  /// is no such entry.
   void removeServiceFromList(const Dictionary& device);
 
  private:

@@ -19,13 +19,14 @@ class ConnectionTypeView final : public Page {
 
   explicit ConnectionTypeView(std::unique_ptr<Interface> interface);
 
-  /// Sets the titles and images of both choices to suit `type`. The selection does not change.
+  /// Sets the titles and images of both choices. The wired choice is USB and Ethernet for
+  /// kUSBAndEthernet, and only USB for every other type. The selection does not change.
   void setConnectionType(ConnectionType type);
 
   /// The selected row: kWirelessRow or kWiredRow.
   [[nodiscard]] int chooseDeviceType() const;
 
-  /// Selects the choice in that row and column; the only column is 0.
+  /// Selects the choice in `row`. The only `column` is 0.
   void setChooseButton(int row, int column);
 
   /// Shows or hides the waiting state, in which the choice cannot be changed.

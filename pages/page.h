@@ -10,8 +10,8 @@
 
 namespace onramp {
 
-/// One page of the wizard: a view and everything loaded from the same interface file. Each kind of
-/// page is a subclass; a view of an unknown class becomes a plain Page.
+/// One page of the wizard: a view and all other objects from the view's interface file. Each kind
+/// of page is a subclass; a view of an unknown class becomes a plain Page.
 class Page {
  public:
   explicit Page(std::unique_ptr<Interface> interface) : interface_(std::move(interface)) {}
@@ -36,7 +36,7 @@ class Page {
 };
 
 /// Loads the page in the interface file `name` and binds its controls to `owner`. Returns null when
-/// the file is missing or holds no view.
+/// the file is missing or unreadable, or holds no view.
 [[nodiscard]] std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner);
 
 /// Shows or hides a page's waiting state: a turning spinner and the text beside it.

@@ -7,11 +7,12 @@
 
 namespace onramp {
 
-/// The codes that a sheet returns for its default button and its other button.
+/// The codes that beginAlertSheet() passes to `didEnd`.
 inline constexpr int kAlertDefaultReturn = 1;
 inline constexpr int kAlertOtherReturn = -1;
 
-/// Shows a critical alert with one button. Returns when the user has dismissed the alert.
+/// Shows a critical alert with one button. Blocks until the user dismisses the alert or the
+/// application terminates.
 void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
                       const std::string& buttonTitle);
 
@@ -22,9 +23,10 @@ struct AlertSheet {
   std::string otherButton;
 };
 
-/// Shows a sheet on `window` and returns at once. When the sheet has ended, calls `didEnd` with
-/// kAlertOtherReturn if the user clicked the other button, and with kAlertDefaultReturn in all
-/// other cases.
+/// Shows a sheet on `window`, which must not be an empty handle, and returns at once. When the
+/// sheet has ended, calls `didEnd` with kAlertOtherReturn if the user clicked the other button, and
+/// with kAlertDefaultReturn in all other cases. Does not call `didEnd` when the application
+/// terminates first.
 void beginAlertSheet(const AlertSheet& sheet, const Window& window,
                      std::function<void(int returnCode)> didEnd);
 

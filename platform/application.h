@@ -9,8 +9,9 @@
 
 namespace onramp {
 
-/// The interface through which the application informs and asks its controller. An application has
-/// one controller, for which the main interface file is loaded.
+/// The interface of the controller. Through this interface, the application reports events to the
+/// controller and asks for decisions. An application has one controller, for which the main
+/// interface file is loaded.
 class ApplicationDelegate : public InterfaceOwner {
  public:
   /// Gives the controller the objects of the main interface file. The application calls
@@ -23,33 +24,41 @@ class ApplicationDelegate : public InterfaceOwner {
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 
-  /// Called after the user has closed the last window. Returns whether the application should then
+  /// Called after the user has closed the last window. Returns whether the application should
   /// terminate.
   [[nodiscard]] virtual bool applicationShouldTerminateAfterLastWindowClosed() = 0;
 
-  /// Called when the user tries to close `window` or to quit. Returns whether that is allowed.
+  /// Called when the user tries to close `window` or to quit the application. Returns whether the
+  /// user may do so.
   [[nodiscard]] virtual bool windowShouldClose(const Window& window) = 0;
 };
 
-/// Creates the controller with `makeDelegate`, loads the main interface file for the controller,
-/// and runs the main loop until the application terminates. Returns the process's exit status.
+/// Creates the controller with `makeDelegate`, loads the interface file `mainInterfaceName` for the
+/// controller, and runs the main loop until the application terminates. Returns the process's exit
+/// status. If the interface file cannot be loaded, prints a message that names the file; the exit
+/// status is then 1. On some systems the process ends inside this function when the application
+/// terminates. With Qt, it also ends there after an invalid option, after --help and --version, and
+/// when there is no display.
 int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
-/// Asks the application to terminate. The main loop and any modal loop inside it stop, and no
-/// further timer or event is handled. This function may not return. If it does return, the caller
-/// must stop what it is doing.
+/// Terminates the application. The main loop and any modal loop inside it stop, and no further
+/// timer or event is handled. On some systems the process ends inside this function. On the others
+/// the function returns, and the caller must stop what it is doing.
 void terminateApplication();
 
 /// hideApplication() takes all windows off the screen. unhideApplication() brings those windows
-/// back.
+/// back. Do not call hideApplication() twice without unhideApplication() in between.
 void hideApplication();
 void unhideApplication();
 
-/// Makes this the active application, even if the user is working in another one.
+/// Asks the system to make this the active application, even if the user is working in another one.
+/// The system may refuse.
 void activateIgnoringOtherApps();
 
+/// Returns the main menu, or an empty handle when there is none.
 [[nodiscard]] Menu mainMenu();
+/// Makes `menu` the main menu. Does nothing in a front end whose windows show their own menu bars.
 void setMainMenu(const Menu& menu);
 
 }  // namespace onramp

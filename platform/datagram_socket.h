@@ -23,7 +23,7 @@ struct DatagramEndpoint {
 class DatagramSocket {
  public:
   struct Received {
-    std::size_t length = 0;
+    std::size_t length = 0;  ///< the number of bytes that were written to the buffer
     DatagramEndpoint sender;
   };
 
@@ -38,33 +38,36 @@ class DatagramSocket {
   ~DatagramSocket();
 
   /// Restricts the socket to `peer`: send() sends to `peer`, and the system drops datagrams from
-  /// anyone else. The system then also reports when the peer's host refuses a datagram because no
-  /// program uses the port. In that case waitReadable() returns true and receive() returns nothing.
-  /// This function returns false when the system has no route to `peer`.
+  /// anyone else. From then on, the system also reports when the peer's host refuses a datagram
+  /// because no program uses the port. After such a report, waitReadable() returns true and
+  /// receive() returns nothing. This function returns false when the system refuses, for example
+  /// because it has no route to `peer`.
   [[nodiscard]] bool connect(const DatagramEndpoint& peer);
 
   /// Allows sendTo() to send to broadcast addresses. Returns false when the system refuses.
   [[nodiscard]] bool permitBroadcast();
 
-  /// Asks the system for a buffer of `bytes` for datagrams that have arrived and are not yet
-  /// received. The system's overhead for each datagram counts, too. The system may provide a
-  /// smaller buffer.
+  /// Asks the system for a buffer of `bytes` for datagrams that have arrived but have not been
+  /// received. The system's overhead for each datagram also takes space in the buffer. The system
+  /// may provide a smaller buffer.
   void setReceiveBufferSize(std::size_t bytes);
 
-  /// Both wait for at most `timeout` until the socket is ready to send or to receive, and return
-  /// whether it is ready.
+  /// Wait until the socket can send a datagram, or until there is a datagram or an error for
+  /// receive(). Both functions wait for at most `timeout`, which must not be negative and is
+  /// rounded up to whole milliseconds. They return whether the socket is ready, and false on
+  /// failure.
   [[nodiscard]] bool waitWritable(std::chrono::nanoseconds timeout) const;
   [[nodiscard]] bool waitReadable(std::chrono::nanoseconds timeout) const;
 
   /// Sends one datagram to the peer of connect(). Returns whether the system accepted the datagram.
   bool send(std::span<const std::uint8_t> bytes);
 
-  /// Sends one datagram from a socket without a peer. Returns whether the system accepted the
-  /// datagram.
+  /// Sends one datagram. Must not be called after connect(). Returns whether the system accepted
+  /// the datagram.
   bool sendTo(const DatagramEndpoint& destination, std::span<const std::uint8_t> bytes);
 
-  /// Receives the next datagram. Bytes that do not fit `buffer` are lost. Returns nothing when no
-  /// datagram has arrived, when the peer's host has refused a datagram, or on any other error.
+  /// Receives the next datagram. Bytes that do not fit into `buffer` are lost. Returns nothing when
+  /// no datagram has arrived, when the peer's host has refused a datagram, or on any other error.
   [[nodiscard]] std::optional<Received> receive(std::span<std::uint8_t> buffer);
 
  private:

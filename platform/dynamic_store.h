@@ -11,17 +11,18 @@
 
 /// Access to the system's dynamic configuration store. The store describes the current state of the
 /// computer's network as dictionaries under keys such as "State:/Network/Interface/en0/IPv4". Each
-/// function here corresponds to one in the SystemConfiguration framework of macOS. One backend uses
-/// that framework, and the other fills the same keys from the Linux kernel.
+/// function here except addSourceToMainLoop() corresponds to one in the SystemConfiguration
+/// framework of macOS. One backend uses that framework. The other one obtains the entries described
+/// below from the Linux kernel.
 ///
-/// Callers can rely on two kinds of entries, both in the state domain:
+/// Callers can rely on two kinds of entries, both in the domain kSCDynamicStoreDomainState:
 /// - the IPv4 entity of an interface. It exists for every interface, including the loopback
 ///   interface, that is up, can pass traffic (has a carrier and has passed authentication) and has
 ///   an IPv4 address. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold one
 ///   dotted text for each address, in the system's order. The array
 ///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
 ///   when none is set;
-/// - the global IPv4 entity, which exists while there is a default route. Its text
+/// - the global IPv4 entity, which exists while there is a usable default route. Its text
 ///   kSCDynamicStorePropNetPrimaryInterface names the interface of the preferred default route.
 namespace onramp {
 
@@ -39,14 +40,14 @@ inline constexpr int kSCStatusFailed = 1001;
 inline constexpr int kSCStatusInvalidArgument = 1002;
 inline constexpr int kSCStatusNoStoreSession = 2001;
 
-/// A session with the store. The linked backend defines this type. A null session is allowed
-/// everywhere; every operation on it fails with kSCStatusNoStoreSession. Only one thread at a time
-/// may use a session, and only the main thread may use a session that has a callback.
+/// A session with the store. The linked backend defines this type. Every function accepts a null
+/// session, for which it fails with kSCStatusNoStoreSession. Only one thread at a time may use a
+/// session, and only the main thread may use a session that has a callback.
 struct DynamicStore;
 using DynamicStoreRef = std::shared_ptr<DynamicStore>;
 
-/// Delivers a session's change notifications once it has been added to the run loop. It keeps the
-/// session alive.
+/// Delivers a session's change notifications once addSourceToMainLoop() has added the source to the
+/// run loop. A source keeps its session alive.
 struct DynamicStoreSource;
 using DynamicStoreSourceRef = std::shared_ptr<DynamicStoreSource>;
 
@@ -70,25 +71,26 @@ using DynamicStoreCallback = std::function<void(const std::vector<std::string>& 
 [[nodiscard]] std::optional<std::string> createNetworkGlobalEntityKey(std::string_view domain,
                                                                       std::string_view entity);
 
-/// Returns the current values of all `keys` and of all keys that match one of `patterns`. The
-/// patterns are POSIX extended regular expressions that must match the whole key. Keys without a
-/// value are left out. Returns nothing on failure.
+/// Returns the current values of all `keys` and of all keys that match one of `patterns`, each
+/// under its key. The patterns are POSIX extended regular expressions that must match the whole
+/// key. Keys without a value are left out. Returns nothing on failure.
 [[nodiscard]] std::optional<Dictionary> copyMultiple(const DynamicStoreRef& store,
                                                      const std::vector<std::string>& keys,
                                                      const std::vector<std::string>& patterns);
 
-/// Makes the session call its callback when the value of one of these keys changes. The keys are
-/// selected as in copyMultiple(). Replaces any earlier request. A value that appears or disappears
-/// also counts as changed. Returns false on failure.
+/// Makes the session call its callback when the value of a key changes that copyMultiple() would
+/// select for the same `keys` and `patterns`. Replaces any earlier request. A value that appears or
+/// disappears also counts as changed. Returns false on failure.
 bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::string>& keys,
                          const std::vector<std::string>& patterns);
 
-/// Creates a source for the session's notifications. If a run loop that orders its sources has
-/// several of them, those with a lower `order` are handled first. Returns null on failure.
+/// Creates a source for the session's notifications. A run loop that orders its sources handles a
+/// source with a lower `order` first. Returns null on failure.
 [[nodiscard]] DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int order);
 
 /// Adds `source` to the main run loop in every mode, including the modal one. The loop keeps the
-/// source until the process ends. Does nothing when `source` is null.
+/// source until the process ends. Does nothing when `source` is null or when a source of the same
+/// session has already been added.
 void addSourceToMainLoop(const DynamicStoreSourceRef& source);
 
 /// Returns the error code of the calling thread's last store operation that failed, or kSCStatusOK

@@ -9,8 +9,9 @@
 
 namespace onramp {
 
-/// The object that an interface file is loaded for. The file binds titles to the owner's texts and
-/// sends clicks to the owner's actions. The owner must outlive everything that is loaded for it.
+/// The owner of an interface file, which is the object for which the file is loaded. The file binds
+/// titles to the owner's texts and sends clicks to the owner's actions. The owner must outlive
+/// everything that is loaded for it.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;
@@ -21,6 +22,7 @@ class InterfaceOwner {
   /// Performs the action that the interface file calls `action`. An unknown name has no effect.
   virtual void performAction(std::string_view action) = 0;
 
+  /// Returns the texts to which the interface file binds titles.
   [[nodiscard]] KeyValueTexts& boundTexts() { return boundTexts_; }
 
  private:
@@ -44,7 +46,7 @@ class Interface {
   [[nodiscard]] View view() const;
 
   /// Returns the class that the file gives to the result of view(), such as "ModelListView", or an
-  /// empty text when there is no view.
+  /// empty text when there is no view or the file gives it no class.
   [[nodiscard]] std::string viewClass() const;
 
   /// Returns the object that the file calls `name`, or an empty handle when no object of the

@@ -12,12 +12,14 @@ struct IPv4Address {
   friend bool operator==(IPv4Address, IPv4Address) = default;
 };
 
-/// Reads `text` as inet_aton does: one to four parts, each of which is decimal, octal after a
-/// leading 0, or hexadecimal after 0x. The last part fills the remaining bytes. Returns nothing for
-/// any other text.
+/// Reads `text` as inet_aton does. An address has one to four parts, which dots separate. Each part
+/// is decimal, octal (with a leading 0) or hexadecimal (with a leading 0x). The last part fills the
+/// remaining bytes, so "10.1" means 10.0.0.1. White space after the address, and everything that
+/// follows the white space, is ignored, so "10.0.0.1 x" is valid. Returns nothing for any other
+/// text, including an empty one.
 [[nodiscard]] std::optional<IPv4Address> parseIPv4(const std::string& text);
 
-/// Returns the address in dotted form.
+/// Returns the address in dotted form, such as "10.0.0.1".
 [[nodiscard]] std::string dottedIPv4(IPv4Address address);
 
 }  // namespace onramp

@@ -6,7 +6,7 @@
 
 namespace onramp {
 
-/// Returns the text form of an IPv6 address (RFC 5952). `address` holds its sixteen bytes in
+/// Returns the text form of an IPv6 address (RFC 5952). `address` holds the sixteen bytes in
 /// network order.
 [[nodiscard]] std::string ipv6Text(std::span<const std::byte, 16> address);
 

@@ -2,13 +2,16 @@
 
 namespace onramp {
 
-// The main loop of a program without windows. It runs the timers and actions that are scheduled by
-// the functions in platform/run_loop.h.
+// The main loop of a program without windows. The loop runs the timers of scheduleTimer() and the
+// actions of performOnMainThread(), which are declared in platform/run_loop.h. Such a program has
+// no modal loops.
 
-/// Runs the loop on the calling thread, which is the main one, until endMainLoop() is called.
+/// Runs the loop on the calling thread, which must be the main thread, until endMainLoop() is
+/// called.
 void runMainLoop();
 
-/// Makes runMainLoop() return after the running action has ended. Main thread only.
+/// Makes runMainLoop() return soon after the running action has ended. Has no effect while the loop
+/// is not running. Main thread only.
 void endMainLoop();
 
 }  // namespace onramp

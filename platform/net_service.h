@@ -14,11 +14,11 @@ namespace onramp {
 class NetService;
 class NetServiceBrowser;
 
-/// Handles are shared; two services are the same object when their handles compare equal.
+/// Handles are shared. Two handles that compare equal refer to the same object.
 using NetServiceRef = std::shared_ptr<NetService>;
 using NetServiceBrowserRef = std::shared_ptr<NetServiceBrowser>;
 
-/// The error of a browse or a resolve. The code 0 means success.
+/// The error of a search or a resolve. The code 0 means success.
 struct NetServiceError {
   std::int32_t code = 0;
 };
@@ -26,19 +26,23 @@ struct NetServiceError {
 inline constexpr std::int32_t kNetServiceErrorUnknown = -72000;
 inline constexpr std::int32_t kNetServiceErrorTimeout = -72007;
 
-// Flags of a browse event.
+// The flags that a NetServiceBrowser passes to its client.
+/// More calls follow at once. Only the backend for macOS sets this flag.
 inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
-/// When this is set, the service is gone. Otherwise it has been found.
+/// The service is gone. Without this flag, the service has been found.
 inline constexpr unsigned long kNetServiceFlagRemove = 8;
 
-/// Looks for services by DNS Service Discovery. Main thread only. The client is called on the main
-/// thread, in every mode of the main loop. Destroying a browser ends it like invalidate().
+/// Looks for services by DNS Service Discovery. The responder, a program of the system, does the
+/// actual work. Main thread only. The client is called on the main thread, in every mode of the
+/// main loop. Destroying a browser has the effect of invalidate().
 class NetServiceBrowser {
  public:
   /// Called when a service is found and when it is gone. A service is identified by its name, type
   /// and domain. It may be seen on several network interfaces and protocols. It is found when it is
   /// first seen on any of them, and gone when it is no longer seen on any of them. Both calls pass
-  /// the same `service`. `service` is null when `error` is set. The client may end or destroy the
+  /// the same `service`. When a running search fails, all its services are reported as gone, and
+  /// the search starts again by itself. Some backends report the failure in one more call, which
+  /// passes a null `service` and an `error` whose code is not 0. The client may end or destroy the
   /// browser.
   using Client = void (*)(const NetServiceBrowserRef& browser, unsigned long flags,
                           const NetServiceRef& service, const NetServiceError& error, void* info);
@@ -58,9 +62,9 @@ class NetServiceBrowser {
 
   /// Starts to look for `type`, such as "_ipp._tcp.", in `domain`, such as "local.". An empty
   /// domain means all domains that the computer is configured to browse, "local." included. Returns
-  /// false when the search cannot start. A responder that is not running is not a failure: the
-  /// search starts by itself when the responder does, and starts again after the responder has
-  /// restarted.
+  /// false when the search cannot start, for example because another search of this browser is
+  /// running. A responder that is not running is not a failure: the search starts by itself once
+  /// the responder is running, and starts again after the responder has restarted.
   virtual bool searchForServices(const std::string& domain, const std::string& type) = 0;
 
   /// Ends the browser for good. The client is not called again.
@@ -70,16 +74,18 @@ class NetServiceBrowser {
   virtual void stopSearch() = 0;
 };
 
-/// One service instance on the network. It is not bound to an interface or protocol. Main thread
-/// only. The client is called on the main thread, in every mode of the main loop. Destroying a
-/// service cancels its resolve.
+/// One service instance on the network. It is not bound to a network interface or protocol. Main
+/// thread only. The client is called on the main thread, in every mode of the main loop. Destroying
+/// a service cancels its resolve.
 class NetService {
  public:
-  /// Called when a resolve has ended, successfully or not. The client may cancel, resolve again or
-  /// destroy the service.
+  /// Called when a resolve has ended. The code in `error` is 0 after success and
+  /// kNetServiceErrorTimeout when the time was up; a backend may report other errors. The client
+  /// may cancel, resolve again or destroy the service.
   using Client = void (*)(const NetServiceRef& service, const NetServiceError& error, void* info);
 
-  /// Creates a service to be resolved by its name. Returns null on failure.
+  /// Creates a service to be resolved by its name. `port` has no effect on resolving. Returns null
+  /// on failure.
   [[nodiscard]] static NetServiceRef create(const std::string& domain, const std::string& type,
                                             const std::string& name, std::int32_t port);
 
@@ -88,20 +94,21 @@ class NetService {
   NetService& operator=(const NetService&) = delete;
   virtual ~NetService() = default;
 
-  /// Returns the instance name in UTF-8 without escapes, such as "Office Printer".
+  /// Returns the instance name in UTF-8 without escapes, such as "Office Printer". Like type() and
+  /// domain(), returns nothing when the system does not report the text.
   [[nodiscard]] virtual std::optional<std::string> name() const = 0;
   /// Returns the type with its closing dot, such as "_ipp._tcp.".
   [[nodiscard]] virtual std::optional<std::string> type() const = 0;
   /// Returns the domain with its closing dot, such as "local.".
   [[nodiscard]] virtual std::optional<std::string> domain() const = 0;
 
-  /// Returns the addresses that the last resolve found, in the responder's order. There are none
-  /// before the first resolve, and none from the start of a resolve until it succeeds. IPv6
-  /// addresses may be missing when the host has IPv4 addresses. Each address is a socket address in
-  /// the BSD layout, even on a system with another layout. Byte 0 is the length, byte 1 the family
-  /// (2 for IPv4, 30 for IPv6), and bytes 2 and 3 are the port in network order. The four bytes of
-  /// an IPv4 address start at byte 4. The sixteen bytes of an IPv6 address start at byte 8, and its
-  /// scope, in the machine's byte order, starts at byte 24.
+  /// Returns the addresses that the last resolve found, in the responder's order. The list is empty
+  /// before the first resolve, and from the start of a resolve until it succeeds. IPv6 addresses
+  /// may be missing when the host has IPv4 addresses. Each address is a socket address in the BSD
+  /// layout, even on a system with another layout. Byte 0 is the length, byte 1 the family (2 for
+  /// IPv4, 30 for IPv6), and bytes 2 and 3 are the port in network order. The four bytes of an IPv4
+  /// address start at byte 4. The sixteen bytes of an IPv6 address start at byte 8, and the
+  /// address's scope, four bytes in the machine's byte order, starts at byte 24.
   [[nodiscard]] virtual std::vector<Data> addressing() const = 0;
 
   /// Returns the data of the TXT record that the last resolve found, as on the wire (RFC 6763
@@ -109,7 +116,8 @@ class NetService {
   /// succeeds.
   [[nodiscard]] virtual std::optional<Data> txtData() const = 0;
 
-  /// Sets the client that resolves report to. Without a client, a resolve blocks the caller.
+  /// Sets the client that is called at the end of a resolve. A null `client` removes the client. A
+  /// resolve without a client blocks the caller.
   virtual void setClient(Client client, void* info) = 0;
 
   /// The client is called only between schedule() and unschedule().
@@ -117,10 +125,9 @@ class NetService {
   virtual void unschedule() = 0;
 
   /// Asks the network for the service's addresses and TXT record. If `timeLimit` is 0 or less,
-  /// there is no time limit, and only success or cancel() ends the resolve. With a client, returns
-  /// at once whether the resolve has started, and calls the client when the resolve ends. Without a
-  /// client, blocks until the resolve ends and returns whether it succeeded. Returns false when
-  /// another resolve of the service is running.
+  /// there is no time limit. With a client, returns at once whether the resolve has started, and
+  /// calls the client when the resolve ends. Without a client, blocks until the resolve ends and
+  /// returns whether it succeeded. Returns false when another resolve of the service is running.
   virtual bool resolveWithTimeout(std::chrono::duration<double> timeLimit) = 0;
 
   /// Cancels the running resolve, if there is one, without calling the client.

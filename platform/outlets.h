@@ -10,7 +10,7 @@ namespace onramp {
 
 class ArrayController;
 
-/// The object behind a handle; only the linked front end knows its type.
+/// The object to which an Outlet refers. Only the linked front end knows its type.
 struct NativeObject;
 
 enum class OutletKind {
@@ -27,10 +27,11 @@ enum class OutletKind {
   kMenuItem,
 };
 
-/// A handle to an object of the user interface. The front end owns the object. Copies refer to the
-/// same object. An empty handle accepts every request and does nothing. The handle of an object
-/// that is missing from the interface file is empty, so a page also works when its file lacks some
-/// objects. Main thread only.
+/// A handle to an object of the user interface. The handle does not own the object, and must not be
+/// used once the object has been destroyed. Copies refer to the same object. An empty handle
+/// accepts every call and does nothing; its queries return 0 or an empty handle. The handle of an
+/// object that is missing from the interface file is empty, so a page also works when its file
+/// lacks some objects. Main thread only.
 class Outlet {
  public:
   Outlet() = default;
@@ -52,14 +53,17 @@ class View : public Outlet {
 
   void setHidden(bool hidden) const;
 
-  /// Returns the first of the views inside this one, or an empty handle when there is none.
+  /// Returns the first of the views directly inside this one, or an empty handle when there is
+  /// none.
   [[nodiscard]] View firstSubview() const;
 
-  /// Puts `view` inside this one, makes it fill this one, and shows it. The owner of `view` does
-  /// not change.
+  /// Puts `view` inside this one and makes it fill this one. Gives the keyboard focus to the first
+  /// list in `view`, or to its first control if it has no list. The owner of `view` does not
+  /// change.
   void addSubview(const View& view) const;
 
-  /// Removes this view from the view that contains it. The owner of this view does not change.
+  /// Removes this view from the view that contains it, if there is one. The owner of this view does
+  /// not change.
   void removeFromSuperview() const;
 };
 
@@ -87,16 +91,18 @@ class Button : public Control {
   using Control::Control;
 };
 
-/// Radio buttons in rows and columns, of which exactly one is selected.
+/// Radio buttons in rows and columns. At most one of them is selected.
 class RadioMatrix : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kRadioMatrix;
   using Control::Control;
 
   void setTitle(int row, int column, const std::string& title) const;
+  /// Selects the button in this place, and thereby deselects every other one.
   void selectCell(int row, int column) const;
 
-  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty.
+  /// Returns the row of the selected button, counted from 0. The result is meaningless when no
+  /// button is selected, and 0 when this handle is empty.
   [[nodiscard]] int selectedRow() const;
 };
 
@@ -104,13 +110,13 @@ class RadioMatrix : public Control {
 struct Image {
   std::string path;
 
-  /// Returns the image resource of the application's bundle with this file name, or nothing when
-  /// there is none.
+  /// Returns the image with this file name in the resources of the application's bundle, or nothing
+  /// when there is none.
   [[nodiscard]] static std::optional<Image> named(const std::string& fileName);
 };
 
 enum class ImageScaling {
-  kProportionallyDown,  ///< shown at its own size, or smaller where that does not fit
+  kProportionallyDown,  ///< shown at its own size, or scaled down to fit the view
   kAxesIndependently,   ///< stretched to fill the view
 };
 
@@ -124,7 +130,7 @@ class ImageView : public View {
   void setImageScaling(ImageScaling scaling) const;
 };
 
-/// A spinner that does not show how much is done.
+/// A spinner, which does not show how much of the work is done.
 class ProgressIndicator : public View {
  public:
   static constexpr OutletKind kKind = OutletKind::kProgressIndicator;
@@ -134,20 +140,22 @@ class ProgressIndicator : public View {
   void stopAnimation() const;
 };
 
-/// A list with columns. The interface file gives each column an identifier. The column shows the
-/// text that each entry has under that identifier.
+/// A list with columns. The interface file gives each column an identifier. For each entry, the
+/// column shows the text that the entry has under that identifier.
 class TableView : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kTableView;
   using Control::Control;
 
   /// Shows the entries of `controller` and keeps the table's selection the same as the
-  /// controller's. `controller` must exist until the table is destroyed or bound again.
+  /// controller's. A double-click on an entry clicks the window's default button. May be called
+  /// only once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 
   void setAllowsColumnReordering(bool allows) const;
   void setAllowsColumnSelection(bool allows) const;
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
+  /// Does nothing in a front end whose tables never accept edits.
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
@@ -158,11 +166,13 @@ class PopUpButton : public Control {
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;
   using Control::Control;
 
+  /// Returns the number of items, including item 0.
   [[nodiscard]] std::size_t numberOfItems() const;
+  /// Removes a command. `index` must be at least 1. Does nothing when there is no such item.
   void removeItem(std::size_t index) const;
 
-  /// Adds a command to the end of the menu. When the user chooses it, `action` runs on the main
-  /// thread after the menu has closed, so it may run a modal loop.
+  /// Adds a command to the end of the menu. When the user chooses the command, `action` runs on the
+  /// main thread after the menu has closed, so it may run a modal loop.
   void addItem(const std::string& title, std::function<void()> action) const;
 };
 
@@ -171,6 +181,8 @@ class Window : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kWindow;
   using Outlet::Outlet;
 
+  /// Shows or hides the window's mark for resizing. On a system whose windows have no such mark,
+  /// hiding it prevents the user from resizing the window.
   void setShowsResizeIndicator(bool shows) const;
 
   /// Centres the window on its screen.
@@ -179,7 +191,7 @@ class Window : public Outlet {
   void orderFront() const;
   void makeKeyAndOrderFront() const;
 
-  /// Takes the window off the screen without asking windowShouldClose().
+  /// Takes the window off the screen without asking the delegate's windowShouldClose().
   void close() const;
 };
 

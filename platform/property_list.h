@@ -12,12 +12,12 @@ namespace onramp {
 // Limits on the property lists that are read. For comparison, the description of a medium with
 // 5,000 models takes about a megabyte and 60,000 objects, nested four levels deep.
 
-/// The maximum size of a file in bytes. It is also the maximum total size of all texts and data,
-/// where a shared object of a binary list counts once for each reference to it.
+/// The maximum size of a file in bytes. It also limits the total size of all texts and data in a
+/// list, where a shared object of a binary list counts once for each reference to it.
 inline constexpr std::size_t kMostPropertyListBytes = std::size_t{16} << 20;
 
-/// The maximum number of values in a list, containers included. A shared object counts once for
-/// each reference to it.
+/// The maximum number of objects in a list. Containers count, and so do the keys of dictionaries in
+/// some backends. A shared object counts once for each reference to it.
 inline constexpr std::uint64_t kMostPropertyListObjects = std::uint64_t{1} << 18;
 
 /// The maximum nesting depth of containers.
@@ -33,8 +33,8 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 /// that was at `path` is unchanged.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
-/// Removes the file or the folder tree at `path`, and the temporary files that killed processes
-/// left while they were writing to `path`. Ignores failures.
+/// Removes the file or the folder tree at `path`, and the temporary files of processes that were
+/// killed while they were writing to `path`. Ignores failures.
 void removeDictionary(const std::string& path);
 
 }  // namespace onramp

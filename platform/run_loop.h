@@ -7,22 +7,23 @@
 
 namespace onramp {
 
-/// Runs `action` once on the main thread, `delay` from now, in every mode of the main loop,
-/// including the modal mode. Timers run in the order of their due times. Must be called on the main
-/// thread.
+/// Runs `action` once on the main thread, no earlier than `delay` from now, in every mode of the
+/// main loop, including the modal mode. Timers run in the order of their due times. Must be called
+/// on the main thread.
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action);
 
 /// Runs `action` once on the main thread, in every mode of the main loop. Actions run in the order
-/// of the calls and never inside this function. Callable from any thread.
+/// of the calls, except those that abortModal() holds back, and never inside this function.
+/// Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 
-/// Shows `window`, makes it key and runs the main loop with it as the modal window, until
-/// abortModal() is called or the application is asked to terminate. Must be called on the main
-/// thread.
+/// Shows `window`, which must not be an empty handle, makes it the key window, and runs the main
+/// loop with `window` as the modal window. Returns after abortModal() has been called or when the
+/// application terminates. Must be called on the main thread.
 void runModalForWindow(const Window& window);
 
-/// Ends the running modal loop, if there is one. Actions of performOnMainThread() that have not run
-/// yet run only after the loop has ended. Callable from any thread.
+/// Ends the innermost running modal loop, if there is one. Holds back the actions of
+/// performOnMainThread() that have not run yet until that loop has ended. Callable from any thread.
 void abortModal();
 
 /// Blocks the calling thread, which must not be the main thread, for `duration`. When the

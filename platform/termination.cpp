@@ -16,8 +16,8 @@ struct Termination {
   bool begun = false;
 };
 
-// Returns the only such object. It is never destroyed, because a thread may still be sleeping while
-// the process exits.
+// Returns the only Termination object. It is never destroyed, because a thread may still be
+// sleeping while the process exits.
 Termination& termination() {
   static Termination* const instance = std::make_unique<Termination>().release();
   return *instance;

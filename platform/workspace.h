@@ -4,12 +4,13 @@
 
 namespace onramp {
 
-/// Asks the desktop to open the file or bundle at `path` in its default program. Does not wait for
-/// that program. Returns whether the desktop accepted the request.
+/// Asks the desktop to open the file or bundle at `path` in the default program for it. Does not
+/// wait for that program. Returns false when the request cannot be made or the desktop refuses it
+/// at once. A later failure is not reported.
 bool openFile(const std::string& path);
 
 /// Asks the desktop to open `url` in the user's browser. Does not wait for the browser. Returns
-/// whether the desktop accepted the request.
+/// false when `url` is malformed, and otherwise like openFile().
 bool openURL(const std::string& url);
 
 }  // namespace onramp

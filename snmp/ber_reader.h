@@ -10,8 +10,8 @@
 namespace onramp {
 
 // Functions that read one part of a BER encoding (X.690 section 8, as restricted by RFC 1157). Each
-// moves the reader past that part and returns SNMP_OK, or returns SNMP_ERR_CODEC for malformed or
-// missing bytes.
+// moves the reader past that part and returns SNMP_OK. Each returns SNMP_ERR_CODEC for malformed or
+// missing bytes and for what it refuses; the reader may then stand anywhere in the part.
 
 /// Reads a tag of one byte. Refuses a longer tag without moving the reader.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
@@ -41,7 +41,7 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads an integer of 1 to 4 bytes as an unsigned number.
+/// Reads an integer of `length` bytes, 1 to 4, as an unsigned number. Refuses any other length.
 [[nodiscard]] inline snmp_status ber_get_uint(ByteReader& in, std::uint64_t& value,
                                               std::uint16_t length) {
   if (length < 1 || length > 4) return SNMP_ERR_CODEC;
@@ -51,8 +51,9 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads an integer of 1 to 4 bytes. One or two bytes are sign-extended to 64 bits, three bytes to
-/// 32 bits, four bytes not at all. In every case the low 32 bits hold the signed value.
+/// Reads an integer of `length` bytes, 1 to 4. Refuses any other length. An integer of one or two
+/// bytes is sign-extended to 64 bits, and an integer of three bytes to 32 bits. An integer of four
+/// bytes is not extended. In every case the low 32 bits hold the signed value.
 [[nodiscard]] inline snmp_status ber_get_int(ByteReader& in, std::int64_t& value,
                                              std::uint16_t length) {
   std::uint64_t bits = 0;
@@ -66,20 +67,21 @@ namespace onramp {
 }
 
 /// Reads an object identifier of `length` content bytes into `target`. On entry `target->count` is
-/// the number of arcs that fit; on return it is the number of arcs read. Refuses a null target,
-/// more arcs than fit, an arc above 65,535, and content that ends inside an arc. A refusal leaves
-/// `count` unchanged, but some arcs may have been stored.
+/// the number of arcs that fit; on return it is the number of arcs read, which is 0 when `length`
+/// is 0. The first byte alone gives the first two arcs: its quotient and its remainder by 40.
+/// Refuses a null target, more arcs than fit, an arc above 65,535, and content that ends inside an
+/// arc. A refusal leaves `count` unchanged, but some arcs may have been stored.
 [[nodiscard]] snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length);
 
-/// Copies a string of `length` bytes to `target`. Refuses a string longer than `target->capacity`,
-/// and a string that is not empty when `target` is null.
+/// Reads a string of `length` bytes and copies it to `target`. Refuses a string longer than
+/// `target->capacity`, and a string that is not empty when `target` is null.
 [[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
 // No part of the program uses the next function. It completes this set of functions.
 
-/// Like ber_get_octets, but makes `target->bytes` point into the input instead of copying.
-/// `capacity` becomes 0, because the input must not be written to. An empty string changes nothing
-/// but `length`.
+/// Like ber_get_octets, but makes `target->bytes` point into the input instead of copying. Strings
+/// of any length fit. `capacity` becomes 0, because the input must not be written to. An empty
+/// string changes nothing but `length`.
 [[nodiscard]] snmp_status ber_get_octets_ref(ByteReader& in, snmp_octets* target,
                                              std::uint16_t length);
 

@@ -15,17 +15,19 @@ class ber_writer {
  public:
   explicit ber_writer(std::span<std::uint8_t> room) : room_(room), left_(room.size()) {}
 
-  /// Bytes written so far.
+  /// The number of bytes written so far.
   [[nodiscard]] std::size_t size() const { return room_.size() - left_; }
 
-  /// Puts one byte in front of those written so far.
+  /// Puts one byte in front of those written so far. Returns SNMP_ERR_CODEC, and writes nothing,
+  /// when the buffer is full.
   [[nodiscard]] snmp_status put(std::uint8_t byte) {
     if (left_ == 0) return SNMP_ERR_CODEC;
     room_[--left_] = byte;
     return SNMP_OK;
   }
 
-  /// Puts `bytes` in front of those written so far.
+  /// Puts `bytes` in front of those written so far. Returns SNMP_ERR_CODEC, and writes nothing,
+  /// when the buffer has too little room.
   [[nodiscard]] snmp_status put(std::span<const std::uint8_t> bytes);
 
  private:
@@ -34,8 +36,9 @@ class ber_writer {
 };
 
 // Functions that write one part of a BER encoding (X.690 section 8). Each puts that part in front
-// of the bytes written so far and returns SNMP_OK. Each returns SNMP_ERR_CODEC when the buffer is
-// full or the value cannot be encoded; some of its bytes may then have been written.
+// of the bytes written so far and returns SNMP_OK. Each returns SNMP_ERR_CODEC when the buffer has
+// too little room or the value cannot be encoded; some bytes of the part may then have been
+// written.
 
 /// Puts a length field of one, two or three bytes (short form, 0x81, 0x82). Refuses a length above
 /// 65,535.
@@ -47,8 +50,8 @@ class ber_writer {
   return out.put(high) || out.put(0x82) ? SNMP_ERR_CODEC : SNMP_OK;
 }
 
-/// Puts the tag and the length field of an element. Its content is everything written since
-/// out.size() was `end`.
+/// Puts the tag and the length field of an element. The element's content is everything written
+/// since out.size() was `end`.
 [[nodiscard]] inline snmp_status ber_put_header(ber_writer& out, std::uint8_t tag,
                                                 std::size_t end) {
   return ber_put_length(out, out.size() - end) || out.put(tag) ? SNMP_ERR_CODEC : SNMP_OK;
@@ -62,18 +65,20 @@ class ber_writer {
   return ber_put_octets(out, std::span<const std::uint8_t>(octets.bytes, octets.length), tag);
 }
 
-/// Puts the low 32 bits of `value` as a signed number in as few bytes as possible, 1 to 4. Replaces
-/// a negative `value` by the number that ber_get_uint reads from those bytes: -1 becomes 255.
+/// Puts the low 32 bits of `value` as a signed number in as few bytes as possible, 1 to 4. If this
+/// number is negative, replaces `value` by what ber_get_uint reads from those bytes: -1 becomes
+/// 255.
 [[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag);
 [[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::int64_t& value, std::uint8_t tag);
 
 /// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks. A
-/// number of 2^31 or more takes 5 bytes, of which the first is zero. The content is encoded like
-/// that of an INTEGER, so it must not look negative (RFC 1155 section 6, X.690 section 8.3).
+/// number of 2^31 or more takes 5 bytes, of which the first is zero. Without the zero byte, such a
+/// number would be negative, because the content is encoded like that of an INTEGER (RFC 1155
+/// section 6, X.690 section 8.3).
 [[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
-/// Puts an object identifier. Refuses fewer than two arcs, first two arcs that do not fit together
-/// in one byte, and content of more than 255 bytes.
+/// Puts an object identifier. Refuses an identifier with fewer than two arcs, one whose content is
+/// longer than 255 bytes, and one for which 40 times the first arc plus the second is above 255.
 [[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
 [[nodiscard]] snmp_status ber_put_null(ber_writer& out);

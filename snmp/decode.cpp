@@ -40,7 +40,7 @@ snmp_status get_community(ByteReader& in, snmp_message& message) {
   return SNMP_OK;
 }
 
-// `earlier` is the total size of the reply's strings before this one. They all share one buffer.
+// `earlier` is the total size of the reply's strings before this one. All strings share one buffer.
 snmp_status get_string(ByteReader& in, snmp_octets* target, std::uint16_t length,
                        std::size_t& earlier) {
   if (target) {

@@ -76,7 +76,8 @@ snmp_status exchange(snmp_message& message, std::span<snmp_result_slot> results,
 }
 
 // Sets the type of every binding from its slot and copies every string to `strings`. The string of
-// binding i starts at offset 16 * i, or at a higher multiple of 16 when earlier strings are longer.
+// binding i starts at offset 16 * i, or at a higher multiple of 16 when earlier strings reach
+// beyond that offset.
 snmp_status take_slots(std::span<snmp_varbind> bindings, std::span<const snmp_result_slot> results,
                        string_storage& strings) {
   std::size_t used = 0;

@@ -25,10 +25,10 @@ struct mib_entry {
 using mib_decode = snmp_status (*)(Dictionary& result, const char* name,
                                    const snmp_varbind& binding, std::uint64_t reserved);
 
-/// Tells how to store the value of the mib_entry with the same index.
+/// Tells how to store the value of the mib_entry that has the same index in the table.
 struct mib_value_handler {
-  const char* name = nullptr;  ///< the value's key in the result
-  mib_decode decode = nullptr;
+  const char* name = nullptr;   ///< the value's key in the result
+  mib_decode decode = nullptr;  ///< null when the value is not stored
 };
 
 /// The objects that one request asks for.
@@ -49,11 +49,13 @@ constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's acti
 /// at most that length fit.
 extern mib_table active_interface_table;
 
-/// Stores an INTEGER as a 32-bit number. Returns 1 for a value of any other type.
+/// Stores an INTEGER under `name` as a 32-bit number and returns 0. Returns 1 for a value of any
+/// other type.
 [[nodiscard]] snmp_status decode_active_if(Dictionary& dictionary, const char* name,
                                            const snmp_varbind& binding, std::uint64_t reserved);
 
-/// A get request for the objects of a table, with the storage for its replies.
+/// A get request for the objects of a table, with the storage for its replies. The table must
+/// outlive the request.
 class snmp_table_request {
  public:
   explicit snmp_table_request(mib_table& table);
@@ -69,7 +71,8 @@ class snmp_table_request {
 
   /// Returns the values that the handlers store from the reply in the message, plus kConnectionKey
   /// and, under kIPAddressKey, `address`. If a handler refuses a value, all values stored before it
-  /// are dropped. Returns nothing when the value of the last entry is refused.
+  /// are dropped. Returns nothing when the value of the last entry is refused, and when the table
+  /// has no entries.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
  private:
@@ -81,16 +84,16 @@ class snmp_table_request {
 };
 
 /// Asks the device at `address`, dotted IPv4 text, for the objects of `table`. Returns nothing when
-/// `table` or `address` is null, when the reply has an error status, when its values are
-/// unsuitable, and when no valid reply comes. `out_no_reply` is set in the last case only and is
-/// never cleared. A reply's error status and index are stored in the last two arguments, which may
-/// be null. Blocks as snmp_exchange does.
+/// `table` or `address` is null, when the reply has an error status, when
+/// snmp_table_request::result() returns nothing for the reply, and when no valid reply comes.
+/// `out_no_reply` is set to true in the last case only and is never cleared. A reply's error status
+/// and index are stored in the last two arguments, which may be null. Blocks as snmp_exchange does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
                                                          std::int32_t* out_error_index);
 
-/// Does the same, but asks a second time when the first request gives no result.
+/// Does what snmp_query_table does, but asks a second time when the first request gives no result.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table_retry(mib_table* table,
                                                                const char* address,
                                                                bool& out_no_reply,
@@ -101,17 +104,19 @@ class snmp_table_request {
 /// wireless interface. Tries the addresses in order. The first address that answers every request
 /// decides the result. An address that leaves a request unanswered is tried three times, 20 ms
 /// apart, with up to two requests per try. If no address decides, the last try of the last address
-/// does.
+/// does. A try without a result counts as the value 0 of ActiveIF, and so does an empty array of
+/// addresses.
 ///
-/// Blocks for about 12 seconds for an address that answers none of its six requests.
+/// Blocks for about 12 seconds for an address from which nothing comes back, not even a refusal.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
 /// Makes one request to the device at `address`, which is null when the entry in the array of
-/// addresses is not a string. Returns what snmp_query_table returns, and sets `no_reply` in the
-/// same case.
+/// addresses is not a string. Returns what snmp_query_table returns, and sets `no_reply` when that
+/// function sets `out_no_reply`.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
-/// Makes the same decision, but makes its requests through `ask`, so that a caller can record them.
+/// Does what the other function of this name does, but makes its requests through `ask`, so that a
+/// caller can record them.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);
 
 }  // namespace onramp

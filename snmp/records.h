@@ -62,9 +62,9 @@ struct snmp_message {
   std::span<snmp_varbind> varbinds;  ///< the whole array, including unused bindings
 };
 
-/// Makes `message` an SNMPv1 request with the community kCommunity. Sets `varbind_count` and makes
-/// that many bindings NULL, or all when the array has fewer. `request_id` and `pdu_type` are
-/// unchanged.
+/// Makes `message` an SNMPv1 request with the community kCommunity of snmp/protocol.h. Sets
+/// `varbind_count` and gives that many bindings the type NULL, or all bindings when the array has
+/// fewer. `request_id` and `pdu_type` are unchanged.
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
 /// Compares two object identifiers arc by arc. At the first difference, returns -1 when the arc of

@@ -26,12 +26,12 @@ constexpr std::chrono::seconds kReceiveWait{2};
 constexpr std::uint32_t kModeNetwork = 4;
 constexpr std::uint32_t kModeNoNetwork = 6;
 
-/// The next request identifiers: the first is used by snmp_request_to_address, the second by
-/// snmp_get and snmp_set. Neither is locked, so requests must be made from one thread at a time.
+/// The next request identifiers: the first is used by snmp_next_request_id, the second by snmp_get
+/// and snmp_set. Neither is locked, so requests must be made from one thread at a time.
 extern std::int32_t snmp_request_counter;
 extern std::int64_t snmp_request_counter_ext;
 
-/// Returns the next identifier of snmp_request_counter, for use as a message's `request_id`.
+/// Returns snmp_request_counter, for use as a message's `request_id`, and increases it by 1.
 [[nodiscard]] std::uint64_t snmp_next_request_id();
 
 /// Replaces each dot-separated part of `text` by the decimal number that the part starts with, or
@@ -44,13 +44,14 @@ extern std::int64_t snmp_request_counter_ext;
 [[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
 
 /// Sends `message` to the SNMP port of `address`, dotted IPv4 text, and decodes the reply into
-/// `message`. Sends nothing if `address` is any other text. Blocks for at most kSendWait plus
-/// kReceiveWait; the wait ends at once when the host refuses the request. `message.community` keeps
-/// its value, because the reply's community does not outlive the call.
+/// `message`. Sends nothing if `address` is null or any other text. Blocks for at most kSendWait
+/// plus kReceiveWait; the wait ends at once when the host refuses the request. `message.community`
+/// keeps its value, because the reply's community does not outlive the call. The reply's identifier
+/// is stored in `message.request_id` and is not checked.
 ///
-/// Returns SNMP_ERR_CODEC when the message cannot be encoded and when no valid reply came in time,
-/// and SNMP_ERR_TRANSPORT when no socket can be opened. With kModeNoNetwork, sends nothing and
-/// returns SNMP_ERR_CODEC.
+/// Returns SNMP_OK for a valid reply, SNMP_ERR_CODEC when the message cannot be encoded and when no
+/// valid reply comes in time, and SNMP_ERR_TRANSPORT when no socket can be opened. With
+/// kModeNoNetwork, sends nothing and returns SNMP_ERR_CODEC.
 [[nodiscard]] snmp_status snmp_exchange(snmp_message& message, const char* address,
                                         std::uint32_t mode);
 

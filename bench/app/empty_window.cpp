@@ -1,4 +1,5 @@
-// Shows an empty window of the wizard's size, which is the least that such a program can do.
+// Shows an empty window of the wizard's size, which is the least that a program with a window can
+// do.
 
 #include <QApplication>
 #include <QMainWindow>

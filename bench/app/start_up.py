@@ -1,5 +1,5 @@
 #!/usr/bin/python3
-"""Compares the wizard's start-up with that of an empty window and of the same page in plain Qt.
+"""Compares the start-up of the wizard, an empty window and the wizard's first page in plain Qt.
 
 Usage: start_up.py [BUILD]
 

@@ -5,11 +5,12 @@ Usage: discovery_bench.py [BUILD]
 
 BUILD is the folder of a release build (default: build/release).
 
-Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each time
-runs from the start of a program to its output line about the last service that it resolves. The
-warm part has one host, whose Avahi daemon has all services in its cache. The cold part has two
-hosts joined by virtual cables, and the daemon starts every search with an empty cache. The warm
-part ends with the processor time of an idle search.
+Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each
+measured time is from the start of a program until it prints the line about the last service that it
+resolves. The warm part has one host, whose Avahi daemon has all services in its cache. The cold
+part has two hosts joined by virtual cables. In that part, the Avahi daemon of the searching host is
+restarted before every search, so that its cache is empty. The warm part ends with the processor
+time of a search that is left idle.
 """
 
 import pathlib
@@ -63,7 +64,7 @@ def grow_to(network, count):
         network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
                     model="Model 100")
     network.settle()
-    # Announcements are repeated for a while and would fill an empty cache.
+    # New services repeat their announcements for a while, which would fill an empty cache.
     time.sleep(14 + 0.1 * count)
 
 
@@ -103,8 +104,9 @@ def idle(interfaces, probe):
         search.wait_for("update", "Kestrel 1")
         time.sleep(IDLE_SECONDS)
         search.end()
-        print(f"idle for {IDLE_SECONDS} s, {interfaces} interface(s), {COUNTS[-1]} services found: "
-              f"{processor_seconds() - before:.3f} s of processor time, start included", flush=True)
+        print(f"search of {COUNTS[-1]} services, left idle for {IDLE_SECONDS} s, "
+              f"{interfaces} interface(s): {processor_seconds() - before:.3f} s of processor time, "
+              "including start and discovery", flush=True)
 
 
 def run_inside(state, interfaces, probe):

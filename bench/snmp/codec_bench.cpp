@@ -1,6 +1,6 @@
-// Encodes the request for ActiveIF and decodes its reply, alternating between this codec and the
-// net-snmp library. Prints the time per message, the ratio of the times, and the allocations per
-// message.
+// Encodes the request for the SNMP object ActiveIF and decodes the reply, alternating between the
+// wizard's codec and the net-snmp library. Prints the time per message, the ratio of the times, and
+// the allocations per message.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -21,7 +21,8 @@ long allocations = 0;
 
 }  // namespace
 
-// Count the calls of malloc and calloc in this process, including those inside net-snmp.
+// These functions count the calls of malloc and calloc in this process, including those inside
+// net-snmp.
 extern "C" {
 // The C library's own names for its allocation functions.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)

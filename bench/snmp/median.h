@@ -4,7 +4,7 @@
 #include <chrono>
 #include <vector>
 
-/// Repeated measurements of one thing, in nanoseconds.
+/// The times of one operation that is measured repeatedly, in nanoseconds.
 class Samples {
  public:
   /// Runs `work` `times` times and keeps the mean time as one sample.
@@ -19,7 +19,8 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the value below which the fraction `part` of the samples lies. `part` is from 0 to 1.
+  /// Returns the sample below which the fraction `part`, 0 to 1, of the samples lies. There must be
+  /// at least one sample.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());

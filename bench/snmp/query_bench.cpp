@@ -1,5 +1,5 @@
-// Compares a whole query, from the request to the result, with a bare exchange of the same bytes
-// with the same agent. The two alternate.
+// Compares a whole query, from the request to the result, with a bare UDP exchange that asks the
+// same agent for the same object. The queries and the bare exchanges alternate.
 
 #include <array>
 #include <cstdio>

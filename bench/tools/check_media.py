@@ -1,5 +1,5 @@
 #!/usr/bin/python3
-"""Compares the time that onramp-check takes for media of 1,000 and of more models.
+"""Compares the times that onramp-check takes for a medium of 1,000 models and for larger media.
 
 Usage: check_media.py [BUILD]
 

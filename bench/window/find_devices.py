@@ -55,7 +55,7 @@ def time_of_tools(count):
 
 
 def time_of_wizard(person, text, count):
-    """Returns the time from a refresh, which empties the list, until it has `count` rows."""
+    """Returns the time from a refresh, which empties the list, until the list has `count` rows."""
     person.see_gone("label", text["INST_WAIT"], 60)
     table = person.see("tree").get_table_iface()
     person.open_menu(GEAR)

@@ -170,7 +170,8 @@ Message Daemon::newCall(const char* method) const {
 }
 
 // The connection to the bus takes ownership of `reply`. It destroys `reply` after the answer has
-// arrived, or when the connection itself is destroyed.
+// arrived, or when the connection itself is destroyed. Returns false when the message cannot be
+// sent.
 bool Daemon::call(sd_bus_message* message, Reply reply) {
   const auto answered = [](sd_bus_message* answer, void* receiver, sd_bus_error*) {
     (*static_cast<Reply*>(receiver))(answer);

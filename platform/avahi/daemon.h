@@ -38,7 +38,7 @@ class Daemon {
   /// Runs the loop until `done` returns true. Returns false when the loop fails before that.
   bool runUntil(const std::function<bool()>& done);
 
-  /// Returns how many times the daemon has gone away so far.
+  /// Returns how many times the daemon or the bus has gone away so far.
   [[nodiscard]] unsigned losses() const { return losses_; }
 
   [[nodiscard]] sd_event* loop() const { return loop_.get(); }
@@ -49,7 +49,7 @@ class Daemon {
 
   explicit Daemon(EventLoop loop);
 
-  // Queries use the functions below.
+  // Queries use the functions of this group.
   void add(Query* query);
   void remove(Query* query);
   void listen(const std::string& path, Query* query) { listeners_[path] = query; }

@@ -54,7 +54,7 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   Client client_;
   void* info_;
   bool isScheduled_ = false;
-  unsigned long search_ = 0;  ///< number of this search; late events of earlier ones are ignored
+  unsigned long search_ = 0;  ///< counts searches; late events of earlier ones are ignored
   std::string type_;
   std::map<Instance, NetServiceRef> services_;  ///< so that a removal passes the same object
   std::shared_ptr<Daemon> daemon_;              ///< held while a search runs

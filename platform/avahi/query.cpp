@@ -26,8 +26,8 @@ void Query::ask() {
     isRefused_ = true;  // Appending fails for a text that is not UTF-8, or for lack of memory.
     return;
   }
-  // The answer may arrive after this query has been destroyed or sent again. The object that it
-  // names is then unused and is freed.
+  // The answer may arrive after this query has been destroyed or sent again. The object that the
+  // answer names is then unused and is freed.
   asked_ = std::make_shared<char>();
   const auto answer = [this, &daemon = daemon_, interface = interface(),
                        asked = std::weak_ptr(asked_)](sd_bus_message* reply) {

@@ -15,17 +15,18 @@ inline constexpr int kAnyProtocol = -1;
 
 /// A question to the daemon that stays open for as long as this object exists. In the daemon it is
 /// a browser or resolver object of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms
-/// before it starts one that was made with an earlier version's method. The *Prepare methods of 0.8
-/// avoid that.)
+/// before it starts an object that was made with a method of an earlier version. The *Prepare
+/// methods of 0.8 avoid this pause.)
 class Query {
  public:
   enum class Event {
-    kFound,           ///< a new result; the message is at the arguments of ItemNew or Found
-    kGone,            ///< a removed result; the message is at the arguments of ItemRemove
+    kFound,           ///< a new result; `message` holds the arguments of ItemNew or Found
+    kGone,            ///< a removed result; `message` holds the arguments of ItemRemove
     kCacheExhausted,  ///< the daemon has reported everything in its cache
-    kLost,            ///< the daemon went away or failed: all results so far are invalid
+    kLost,            ///< the daemon went away or the query failed: earlier results are invalid
   };
-  /// Called from inside the daemon's loop. The handler must not destroy the query.
+  /// Called from inside the daemon's loop. The handler must not destroy the query. `message` is
+  /// null for kLost when the daemon went away.
   using Handler = std::function<void(Event event, sd_bus_message* message)>;
   /// Appends the arguments of the *Prepare method to `call`. Returns a negative number on failure.
   using Arguments = std::function<int(sd_bus_message* call)>;
@@ -37,7 +38,8 @@ class Query {
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Returns whether the question is invalid. Such a question is not repeated.
+  /// Returns whether the question is invalid. An invalid question gets no answer and is not
+  /// repeated.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:

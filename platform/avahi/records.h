@@ -37,7 +37,8 @@ class Records {
   };
 
   /// `name` is a domain name with escapes and without a closing dot. `changed` is called from
-  /// inside the daemon's loop after every change and must not destroy this object.
+  /// inside the daemon's loop whenever all() or isCacheExhausted() may have changed. It must not
+  /// destroy this object.
   Records(Daemon& daemon, const std::string& name, RecordType type, std::function<void()> changed);
 
   /// Returns the current records in the order in which the daemon reported them.

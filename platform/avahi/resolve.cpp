@@ -9,11 +9,12 @@ namespace onramp::avahi {
 
 namespace {
 
-// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. In this
-// time the daemon can repeat the question once if the first answer was lost.
+// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. This is
+// enough time for the daemon to repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 
-// A service resolver reports only one address, and Records reports all of them.
+// Tells a service resolver not to look up an address. It would find only one, and Records finds
+// all.
 constexpr unsigned kNoAddress = 8;
 
 struct Server {
@@ -22,9 +23,10 @@ struct Server {
   Data txt;
 };
 
-// Reads the arguments of a service resolver's Found signal. The strings of the TXT record become
-// the record's data again (RFC 1035 section 3.3.14): the signal has them in reverse order. A record
-// without strings is written as one empty string.
+// Reads the arguments of a service resolver's Found signal. Joins the strings of the TXT record,
+// which the signal has in reverse order, to the record's data (RFC 1035 section 3.3.14). The data
+// of a record without strings is one empty string. Returns nothing when the signal is malformed or
+// names no host.
 std::optional<Server> serverIn(sd_bus_message* message) {
   Server server;
   const char* host = nullptr;
@@ -83,7 +85,7 @@ void Resolve::begin() {
       [this](Query::Event event, sd_bus_message* message) { happened(event, message); });
 }
 
-// The daemon gives up after some seconds with a failure, after which the query asks again.
+// When the daemon gives up after some seconds, the query asks again by itself.
 void Resolve::happened(Query::Event event, sd_bus_message* message) {
   if (auto server = event == Query::Event::kFound ? serverIn(message) : std::nullopt) {
     host_ = std::move(server->host);
@@ -125,7 +127,7 @@ void Resolve::check() {
 }
 
 // Returns the IPv4 addresses, or the IPv6 addresses when no IPv4 address has arrived in time.
-// Returns null while no usable address is known.
+// Returns null while the resolve has to wait for addresses.
 const Records* Resolve::knownAddresses() {
   if (!ipv4_ || !ipv4_->isCacheExhausted()) return nullptr;
   if (!ipv4_->all().empty()) return &*ipv4_;

@@ -20,16 +20,16 @@ struct Resolution {
   Data txt;
 };
 
-/// Looks up the server, the TXT record and the addresses of one service on any interface and
-/// protocol. The resolve continues until it has all of them or its time is up. When the daemon goes
-/// away, the resolve starts again once the daemon is back.
+/// Looks up the host, the port, the TXT record and the addresses of one service on any interface
+/// and protocol. The resolve continues until all of these are known or its time is up. When the
+/// daemon goes away, the resolve starts again once the daemon is back.
 class Resolve {
  public:
   /// Called once, from inside the daemon's loop. The argument is nothing when the time is up. The
   /// function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
-  /// The daemon must outlive the resolve.
+  /// The daemon must outlive the resolve. Without a `timeLimit`, the resolve may run for ever.
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
@@ -53,8 +53,8 @@ class Resolve {
   Timer graceForIPv4_;
   bool isGraceOver_ = false;
   unsigned losses_ = 0;  ///< the daemon's losses() when the resolve last began
-  // The daemon limits the number of questions that a client has open, so this one is closed as
-  // soon as it is answered.
+  // The daemon limits the number of questions that a client has open, so the question about the
+  // service is closed as soon as it is answered.
   std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;

@@ -16,7 +16,7 @@ using Place = std::pair<std::int32_t, std::int32_t>;
 template <typename Thing>
 class Sightings {
  public:
-  /// Adds a sighting. Returns whether it is the thing's first one.
+  /// Adds a sighting, unless it is already known. Returns whether it is the thing's first one.
   bool add(const Thing& thing, Place place) {
     auto& places = places_[thing];
     const bool isNew = places.insert(place).second;

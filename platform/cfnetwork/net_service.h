@@ -6,8 +6,8 @@
 
 namespace onramp::cfnetwork {
 
-/// Returns the handle for `service`. Repeated calls return the same handle for as long as it
-/// exists. Returns null when `service` is null.
+/// Returns the handle for `service`. Every call for one service returns the same handle, for as
+/// long as that handle exists. Returns null when `service` is null.
 [[nodiscard]] NetServiceRef handleOf(CFNetServiceRef service);
 
 }  // namespace onramp::cfnetwork

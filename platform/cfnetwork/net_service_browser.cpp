@@ -93,8 +93,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     }
   }
 
-  // Counts the sightings of a service, which may be one for each network interface, and each with
-  // another object. Returns the service when it is found or gone, and null in between.
+  // Counts the sightings of a service. The framework may report one for each network interface,
+  // each with a different object. Returns the object of the first sighting when the service is
+  // found or gone, and null otherwise.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
       return found.service->name() == service->name() && found.service->type() == service->type() &&
@@ -112,8 +113,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   }
 
   // A search fails, for instance, when the responder goes away. All services are reported as gone,
-  // because the next search will find them again. Stopping a search may cause another error, which
-  // is ignored.
+  // because the next search will find them again. Stopping the failed search may cause another
+  // error, which is ignored.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;
     isFailed_ = true;
@@ -147,7 +148,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Reference<CFStringRef> domain_;  ///< of the running search; null when there is none
   Reference<CFStringRef> type_;
   std::vector<Found> found_;
-  unsigned long search_ = 0;  ///< number of this search; retries of earlier ones are ignored
+  unsigned long search_ = 0;  ///< counts searches; retries of earlier ones are ignored
   bool isFailed_ = false;     ///< a retry is pending
 };
 

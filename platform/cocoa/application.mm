@@ -39,7 +39,7 @@
   return _delegate->applicationShouldTerminateAfterLastWindowClosed();
 }
 
-// Quit from the menu is refused when closing the window would be.
+// The user may quit only when the window may be closed. terminateApplication() always works.
 - (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
   if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
   NSBeep();

@@ -9,8 +9,8 @@
 namespace onramp::cocoa {
 
 /// Converts a property-list object to a dictionary. Leaves out members that are not property-list
-/// objects. Returns nothing when `object` is not a dictionary or exceeds the limits in
-/// platform/property_list.h.
+/// objects or whose keys are not strings. Returns nothing when `object` is not a dictionary or
+/// exceeds the limits in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
 /// Converts `value` to a property-list object.

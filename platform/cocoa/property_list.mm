@@ -11,8 +11,8 @@ namespace onramp {
 
 namespace {
 
-// Converts a property list to a value, unless the list exceeds the limits in
-// platform/property_list.h.
+// Converts a property list to a value. Returns nothing when the list exceeds the limits in
+// platform/property_list.h or `object` is not a property-list object.
 class Reader {
  public:
   std::optional<Value> read(id object, std::size_t depth) {
@@ -119,8 +119,9 @@ struct ToPropertyList {
   }
 };
 
-// Returns the bytes of a regular file, or nil when the file is of another kind or exceeds the size
-// limit. Links are resolved first, because attributesOfItemAtPath: does not follow them.
+// Returns the bytes of a regular file, or nil when the file is of another kind, exceeds the size
+// limit or cannot be read. Links are resolved first, because attributesOfItemAtPath: does not
+// follow them.
 NSData* contents(NSString* path) {
   NSString* const file = [path stringByResolvingSymlinksInPath];
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file

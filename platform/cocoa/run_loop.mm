@@ -19,13 +19,13 @@ NSArray* allModes() {
                                    NSEventTrackingRunLoopMode, nil];
 }
 
-// The number of modal loops that run now, and whether the innermost one was asked to end. Main
-// thread only.
+// The number of running modal loops, and whether the innermost one was asked to end. Main thread
+// only.
 int modalLoops = 0;
 bool isModalAborted = false;
 
 // True from abortModal() until the modal loop has returned. Each posted action may occupy the main
-// thread for seconds, so posted actions are held back meanwhile.
+// thread for seconds, so posted actions are held back until the modal loop has returned.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if its timer fires again inside a loop that

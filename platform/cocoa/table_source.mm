@@ -22,8 +22,7 @@ NSButton* defaultButton(NSView* view) {
   return nil;
 }
 
-// Whether a word of `text` starts with `start`. A blank in `start` may continue into the next
-// words.
+// Returns whether `start` occurs in `text` at the start of a word, ignoring case.
 bool hasWordThatStarts(NSString* text, NSString* start) {
   NSCharacterSet* const letters = [NSCharacterSet alphanumericCharacterSet];
   NSRange rest = NSMakeRange(0, [text length]);
@@ -106,8 +105,8 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   if (row >= 0) _controller->choose(static_cast<std::size_t>(row));
 }
 
-// The table is still handling the mouse, and the button's action may remove it, so the button is
-// clicked afterwards.
+// The button is clicked once the table has handled the double-click, because the button's action
+// may remove the table.
 - (void)goOn:(id)sender {
   if ([_table clickedRow] < 0) return;
   [defaultButton([[_table window] contentView]) performSelector:@selector(performClick:)
@@ -143,7 +142,7 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
 }
 
 // Finds a row by the start of any word of its name. The search continues at row 0 after the last
-// row.
+// row. Returns -1 when no row up to `endRow` matches.
 - (NSInteger)tableView:(NSTableView*)table
     nextTypeSelectMatchFromRow:(NSInteger)startRow
                          toRow:(NSInteger)endRow

@@ -15,7 +15,7 @@ namespace onramp::cocoa {
   return string ? [string autorelease] : @"";
 }
 
-/// Converts `string` to UTF-8. The result is empty when `string` is nil.
+/// Converts `string` to UTF-8. The result is empty when `string` is nil or cannot be converted.
 [[nodiscard]] inline std::string toStdString(NSString* string) {
   NSData* const bytes = [string dataUsingEncoding:NSUTF8StringEncoding];
   return bytes ? std::string(static_cast<const char*>([bytes bytes]), [bytes length]) : "";

@@ -15,7 +15,8 @@ namespace {
 using corefoundation::Reference;
 using Action = std::function<void()>;
 
-// Adds a timer to the main run loop. The timer runs `action` once and then frees it.
+// Adds a timer to the main run loop. The timer runs `action` once and then frees it. Does nothing
+// when the system cannot create the timer.
 void addTimer(double seconds, Action action) {
   const auto release = [](const void* info) {
     std::unique_ptr<const Action>(static_cast<const Action*>(info));
@@ -36,8 +37,8 @@ bool hasEnded = false;  // main thread only
 
 void runMainLoop() {
   hasEnded = false;
-  // CFRunLoopRunInMode() returns at once while the loop has no sources or timers. The function is
-  // therefore called again until another thread has added one.
+  // CFRunLoopRunInMode() returns when it has handled a source, after 0.1 seconds, or at once while
+  // the loop has no sources or timers. It is called again until endMainLoop() has been called.
   while (!hasEnded)
     CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);
 }

@@ -32,7 +32,8 @@ MainLoop& mainLoop() {
   return *instance;
 }
 
-// Waits until an action is due, and returns it.
+// Waits until there is an action or a timer is due. Returns that action or the action of that
+// timer.
 std::function<void()> nextAction() {
   MainLoop& loop = mainLoop();
   std::unique_lock lock(loop.mutex);

@@ -22,7 +22,8 @@ struct Language {
 /// exact region comes first, then the language without a region, then the language in other
 /// regions. The languages that match `development` follow. If nothing matches, the result is
 /// English. If English is not offered, the result is the offered language that comes first in
-/// alphabetical order. A language in another script never matches.
+/// alphabetical order. The result is empty when no well-formed language is offered. Two languages
+/// whose scripts are known and differ never match.
 [[nodiscard]] std::vector<std::string> languagesToSearch(std::vector<std::string> offered,
                                                          const std::vector<std::string>& preferred,
                                                          const std::string& development);

@@ -4,13 +4,14 @@
 
 namespace onramp {
 
-/// Makes the folder at `path`, an absolute path, the running application's bundle. Tests use this,
-/// and so do tools that examine another application.
+/// Makes the folder at `path` the running application's bundle. `path` must be absolute and have no
+/// trailing "/". Tests use this, and so do tools that examine another application.
 void setMainBundlePath(std::string path);
 
-/// Returns the path of the running application's bundle, without a trailing "/". The bundle is the
-/// folder that holds Contents/<system>/<executable>. For an executable that is located elsewhere,
-/// it is the executable's own folder.
+/// Returns the path of the running application's bundle, without a trailing "/". Unless
+/// setMainBundlePath() has chosen another one, the bundle is the folder that holds
+/// Contents/<system>/<executable>. For an executable that is located elsewhere, the bundle is the
+/// executable's own folder.
 [[nodiscard]] std::string mainBundlePath();
 
 }  // namespace onramp

@@ -14,8 +14,8 @@ namespace onramp {
 
 namespace {
 
-// Octal escapes name characters of the NEXTSTEP character set. Its lower half is ASCII. This table
-// is its upper half.
+// Octal escapes name characters of the NEXTSTEP character set. The lower half of that set is ASCII,
+// and this table is the upper half.
 constexpr std::array<char16_t, 128> kNextStepUpperHalf = {
     0x00A0, 0x00C0, 0x00C1, 0x00C2, 0x00C3, 0x00C4, 0x00C5, 0x00C7, 0x00C8, 0x00C9, 0x00CA, 0x00CB,
     0x00CC, 0x00CD, 0x00CE, 0x00CF, 0x00D0, 0x00D1, 0x00D2, 0x00D3, 0x00D4, 0x00D5, 0x00D6, 0x00D9,
@@ -197,7 +197,7 @@ class Parser {
   std::string_view text_;
   std::string_view rest_;
   ParseProblem& problem_;
-  std::size_t lastEnd_ = 0;  ///< end of the last key or text, where a missing mark is reported
+  std::size_t lastEnd_ = 0;  ///< end of the last key or text, where missing punctuation is reported
 };
 
 }  // namespace

@@ -37,7 +37,7 @@ bool openWithDesktop(const std::string& target) {
   const auto process = opener ? startProcess(*opener, {target}, Session::kOwn) : std::nullopt;
   if (!process) return false;
   // The thread waits for the process, which would otherwise remain as a zombie until this program
-  // ends. If the system provides no thread, the zombie is harmless.
+  // ends. A zombie that remains because the system provides no thread is harmless.
   try {
     std::thread([process] { waitForProcess(*process); }).detach();
   } catch (const std::system_error&) {

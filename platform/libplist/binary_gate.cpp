@@ -29,7 +29,7 @@ enum Kind : std::uint64_t {
 };
 
 // The total size of an object and of everything that it refers to. A shared object counts once for
-// each reference.
+// each reference to it.
 struct Cost {
   std::uint64_t objects = 1;
   std::uint64_t bytes = 0;
@@ -103,7 +103,7 @@ class BinaryWalk {
   };
 
   // Returns a reader of the object and everything after it. The reader is empty when the object's
-  // offset lies after the object area.
+  // offset does not lie before the table of offsets.
   [[nodiscard]] ByteReader objectAt(std::size_t index) const {
     const std::uint64_t offset = offsets_[index];
     return ByteReader(objects_.substr(std::min<std::uint64_t>(offset, objects_.size())));
@@ -176,8 +176,8 @@ class BinaryWalk {
     return object.skip(cost.bytes);
   }
 
-  // Refuses every text that contains a null character, because such a text makes libplist end the
-  // process when it is a key.
+  // Refuses every UTF-16 text that contains a null character, because libplist ends the process
+  // when a key is such a text.
   static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
     ByteReader text = object;
     if (!measureBytes(units, 2, object, cost)) return false;

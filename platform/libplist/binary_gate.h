@@ -7,11 +7,11 @@
 namespace onramp::libplist {
 
 /// Returns whether `bytes` are a binary property list that libplist can build within the limits in
-/// platform/property_list.h. Every object that can be reached from the root must be of a known kind
-/// and lie inside the object area. No container may contain itself. The list must be within the
-/// limits even when each shared object counts once for each reference. The check builds nothing.
-/// The format is "bplist00": a header, objects, a table of their offsets and a trailer of 32 bytes.
-/// When the result is false, `problem` gives the reason.
+/// platform/property_list.h. The format is "bplist00": a header, objects, a table of their offsets
+/// and a trailer of 32 bytes. Every object that can be reached from the root must be of a known
+/// kind and lie before the table. No container may contain itself. The list must be within the
+/// limits even when each shared object counts once for each reference to it. The check builds
+/// nothing. When the result is false, `problem` gives the reason.
 [[nodiscard]] bool mayReadBinary(std::string_view bytes, ParseProblem& problem);
 
 }  // namespace onramp::libplist

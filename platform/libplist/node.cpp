@@ -51,7 +51,7 @@ Node nodeOfObject(const std::string& object) {
 }
 
 // Converts `node` to a binary list that holds nothing else, and returns the bytes after the list's
-// header. They begin with the object.
+// header. These bytes begin with the object. Returns an empty text on failure.
 std::string objectOf(plist_t node) {
   char* bytes = nullptr;
   std::uint32_t size = 0;
@@ -119,8 +119,8 @@ Value dictionaryOf(plist_t node) {
   return Dictionary(std::move(pairs));
 }
 
-// Replaces the characters that XML 1.0 does not allow. Control characters are not allowed even as
-// references.
+// Replaces malformed UTF-8 and the characters that XML 1.0 does not allow. XML does not allow
+// control characters even as references, except the tab, the line feed and the carriage return.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());

@@ -14,9 +14,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// The limit on libplist's steps where their number grows quadratically. It does so with the keys of
-// a dictionary, because libplist hashes keys into a fixed number of chains, and with the entities
-// in a text, because libplist moves the rest of the text at each entity.
+// The limit on those steps of libplist whose number grows quadratically. Keys cause such steps,
+// because libplist hashes the keys of a dictionary into a fixed number of chains. Entities cause
+// them as well, because libplist moves the rest of a text at each entity in the text.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {
@@ -80,8 +80,8 @@ class XMLWalk {
     return true;
   }
 
-  // Returns true when the `end` that skipPast() found is not inside a quoted text and the skipped
-  // markup contains none of the characters in `refused`.
+  // Returns true when the `end` that skipPast() found is not between quotation marks and the
+  // skipped markup contains none of the characters in `refused`.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
       return refuse("markup with a quotation mark that is never closed", start_);

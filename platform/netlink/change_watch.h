@@ -14,17 +14,18 @@ namespace onramp::netlink {
 /// state.
 class ChangeWatch {
  public:
-  /// Creates a watch, which collects changes from then on. It includes routes if `withRoutes` is
-  /// true. Returns null on failure.
+  /// Creates a watch, which collects changes from then on. Changes of routes are included if
+  /// `withRoutes` is true. Returns null on failure.
   [[nodiscard]] static std::unique_ptr<ChangeWatch> create(bool withRoutes);
 
   ChangeWatch(const ChangeWatch&) = delete;
   ChangeWatch& operator=(const ChangeWatch&) = delete;
   ~ChangeWatch();
 
-  /// Starts to call `changed` on the watch's own thread after every burst of changes, including
-  /// those since the watch was created. The destructor stops the calls and waits for a call that is
-  /// running. This function may be called only once.
+  /// Starts to call `changed` on the watch's own thread after every burst of changes, including the
+  /// changes since the watch was created. The destructor stops the calls and waits for a call that
+  /// is running. The calls also stop when the kernel no longer reports changes. This function may
+  /// be called only once. It throws std::system_error when the system provides no thread.
   void start(std::function<void()> changed);
 
  private:

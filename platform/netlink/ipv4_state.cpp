@@ -25,8 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// The maximum number of times that a dump is requested. The kernel marks a dump as invalid when the
-// table changes during the dump.
+// The maximum number of times that a dump is requested. The kernel marks a dump as interrupted when
+// the table changes during the dump.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;
@@ -50,6 +50,7 @@ struct Collector {
 };
 
 // Returns the kernel's objects of one kind for which `wanted` returns true, in the kernel's order.
+// Returns nothing on failure.
 std::optional<Objects> dump(nl_sock* socket, int request, int family, bool (*wanted)(nl_object*)) {
   for (int attempt = 0; attempt < kDumpAttempts; ++attempt) {
     Collector collector{wanted, {}};
@@ -127,7 +128,7 @@ std::map<int, Interface> interfacesOf(const Objects& addresses) {
   return interfaces;
 }
 
-// Returns the index of the interface of the preferred route.
+// Returns the index of the interface of the preferred route, or nothing when no route is usable.
 std::optional<int> primaryIndex(const Objects& routes) {
   std::optional<int> index;
   std::uint32_t lowest = 0;

@@ -12,8 +12,9 @@ namespace onramp::netlink {
 /// `withGlobal` is true, because it requires reading all routes. Returns nothing when the state
 /// cannot be read.
 ///
-/// The preferred default route is the first one with the lowest metric in the main table. Its
-/// interface is that of its first next hop that is not dead.
+/// A default route of the main table is usable if it has a next hop that is not dead. The preferred
+/// default route is the first usable one with the lowest metric. Its interface is that of its first
+/// such hop.
 [[nodiscard]] std::optional<Dictionary> readIPv4State(nl_sock* socket, bool withGlobal);
 
 }  // namespace onramp::netlink

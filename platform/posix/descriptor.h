@@ -24,7 +24,8 @@ class Descriptor {
   explicit operator bool() const { return number_ >= 0; }
   [[nodiscard]] int get() const { return number_; }
 
-  /// Closes the descriptor now. Returns false when the system reports that written data was lost.
+  /// Closes the descriptor now, if there is one. Returns false when the system reports an error,
+  /// such as the loss of written data.
   bool close() {
     const int number = std::exchange(number_, -1);
     return number < 0 || ::close(number) == 0;

@@ -21,15 +21,15 @@ namespace {
 namespace fs = std::filesystem;
 
 // Returns the beginning of the names of temporary files for `path`. A temporary file is called
-// ".NAME.PROCESS-NUMBER". The limit on NAME keeps that within the 255 bytes that a file name may
-// have.
+// ".NAME.PROCESS-NUMBER". The limit on NAME keeps the whole name within the 255 bytes that a file
+// name may have.
 std::string temporaryStem(const fs::path& path) {
   constexpr std::size_t kMostNameBytes = 200;
   return "." + path.filename().string().substr(0, kMostNameBytes) + ".";
 }
 
 // Creates a file next to `path` under an unused name, which `name` receives. The user's umask
-// determines its access rights.
+// determines the file's access rights. Returns no descriptor on failure.
 Descriptor createBeside(const fs::path& path, std::string& name) {
   constexpr int kMostTries = 100;  // killed processes may have left files with such names
   const std::string stem =
@@ -53,7 +53,8 @@ bool writeAll(int descriptor, std::string_view bytes) {
 }
 
 // Returns whether the temporary file whose name ends with `processAndNumber` is no longer being
-// written. A file with this process's own ID was left by an earlier process with the same ID.
+// written. A file with this process's ID was left by an earlier process that had the same ID.
+// Returns false when `processAndNumber` is malformed.
 bool isLeftOver(std::string_view processAndNumber) {
   constexpr std::string_view kDigits = "0123456789";
   const std::size_t dash = processAndNumber.find('-');

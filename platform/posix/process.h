@@ -9,19 +9,19 @@
 namespace onramp {
 
 enum class Session {
-  kOwn,     ///< a new session: the program survives the end of this one's terminal
-  kShared,  ///< this program's session: the program ends with the terminal
+  kOwn,     ///< a new session: the started program survives the end of the caller's terminal
+  kShared,  ///< the caller's session: the started program ends with the terminal
 };
 
-/// Starts the program at `executable` with all signals in their default state. Returns the ID of
-/// the new process, which the caller must pass to waitForProcess(). Returns nothing when the
-/// program cannot be started.
+/// Starts the program at `executable` with no signal blocked or ignored. Returns the ID of the new
+/// process, which the caller must pass to waitForProcess(). Returns nothing when the program cannot
+/// be started.
 [[nodiscard]] std::optional<pid_t> startProcess(const std::string& executable,
                                                 const std::vector<std::string>& arguments,
                                                 Session session);
 
-/// Blocks until `process` ends. Returns the exit status, or nothing when a signal ended the
-/// process.
+/// Blocks until `process` ends. Returns the exit status, or nothing when a signal ended the process
+/// or the wait failed.
 std::optional<int> waitForProcess(pid_t process);
 
 }  // namespace onramp

@@ -8,7 +8,7 @@
 
 namespace onramp::qt {
 
-/// Shows an image file, which it reads when it is first drawn.
+/// Shows an image file. The file is read when the image is first drawn.
 class ImageViewWidget final : public QWidget {
   Q_OBJECT
 

@@ -34,7 +34,7 @@ QString textOf(std::string_view text) {
 
 // Creates the widgets of an interface file, including those that this front end defines. For an
 // unknown class it creates a plain widget and stores the name of the class in a property, because
-// an interface file names a page's class in this way.
+// an interface file gives a page's root the class of the page.
 class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;

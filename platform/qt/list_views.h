@@ -7,15 +7,15 @@
 
 namespace onramp::qt {
 
-/// Returns the minimum height of a list without its frame and header. It is enough for several
-/// rows.
+/// Returns the minimum height of a list without its frame and header. This height is enough for
+/// several rows.
 [[nodiscard]] int leastListHeight();
 
 /// Returns the minimum width of a column of names.
 [[nodiscard]] int leastNameWidth();
 
-/// Redraws the whole view, including its frame, when it gets or loses the focus. Qt's views would
-/// redraw only their rows.
+/// A view that is redrawn as a whole, including its frame, when it gets or loses the focus. Qt's
+/// own views redraw only their rows.
 template <typename View>
 class FramedView : public View {
  public:
@@ -47,8 +47,8 @@ class ListWidget final : public FramedView<QListView> {
 };
 
 /// A list with several columns. Each column is as wide as its contents, except the first one, which
-/// gets the remaining width. Once the user has dragged a column's edge, the widths are no longer
-/// adjusted.
+/// gets the remaining width, but at least leastNameWidth(). Once the user has dragged a column's
+/// edge, the widths are no longer adjusted.
 class ColumnsWidget final : public FramedView<QTreeView> {
   Q_OBJECT
 

@@ -5,12 +5,13 @@ class QWidget;
 
 namespace onramp::qt {
 
-/// Makes the standard items of the application menu work. The property "action" of each item names
-/// what the item does by the name of AppKit's method, such as "terminate:".
+/// Makes the standard items of the application menu work. The property "action" of an item is the
+/// name of the AppKit method that does what the item does, such as "terminate:". An unknown name
+/// has no effect.
 void connectStandardMenuItems(QWidget* window);
 
 /// Gives the application menu the product's name from the bundle's information dictionary. Alt and
-/// the first letter of the name open the menu.
+/// the first letter of the name open the menu. Does nothing when there is no menu or no name.
 void nameMenuAfterProduct(const QMenuBar& bar);
 
 }  // namespace onramp::qt

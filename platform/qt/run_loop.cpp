@@ -28,7 +28,7 @@ bool isModal() {
 }
 
 // True from abortModal() until the modal loop has returned. Each posted action may occupy the main
-// thread for seconds, so posted actions are held back until then.
+// thread for seconds, so posted actions are held back until the modal loop has returned.
 std::atomic<bool> isAborting = false;
 
 }  // namespace
@@ -69,7 +69,7 @@ void runModalForWindow(const Window& window) {
   modalLoops().push_back(&loop);
   loop.exec();
   // Handles the clicks and keys that arrived while the main thread was busy, because the user meant
-  // them for the page that was shown then.
+  // them for the page that is still shown.
   if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;

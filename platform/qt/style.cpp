@@ -146,8 +146,8 @@ QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, con
   const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
   // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
-  // Fusion's column for check marks is as wide as the item is high, but its width leaves no room
-  // for that column when the text is large.
+  // Fusion's column for check marks is as wide as the item is high, but the width that Fusion
+  // computes leaves no room for that column when the text is large.
   if (type == CT_MenuItem) return normal + QSize(normal.height(), 0);
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

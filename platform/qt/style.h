@@ -6,7 +6,7 @@
 namespace onramp::qt {
 
 /// Qt's style "Fusion" with a filled default button and a ring around the focused control. Fusion
-/// itself outlines both in the same way.
+/// itself draws the same outline around both.
 class Style final : public QProxyStyle {
   Q_OBJECT
 

@@ -11,8 +11,10 @@ namespace onramp::qt {
 /// the typed text, ignoring case.
 class TypeAhead {
  public:
-  /// Call this when the user has typed `text`. Selects the first matching row, starting at the
-  /// current row. If the user types the same letter again, selects the next match.
+  /// Call this when the user has typed `text`. Texts that are typed in quick succession are joined.
+  /// Selects the first matching row from the current row on; after the last row, the search
+  /// continues at the first one. If the user types the same letter again, selects the next match.
+  /// Does nothing when no row matches.
   void type(QAbstractItemView& view, const QString& text);
 
  private:

@@ -10,8 +10,8 @@ class ApplicationDelegate;
 
 namespace qt {
 
-/// Handles two kinds of events of a window. The delegate decides whether the window may close, and
-/// some keys click buttons or open the menu.
+/// Lets the delegate decide whether a window may close, and lets some keys click buttons of the
+/// window or open its menu.
 class WindowEvents final : public QObject {
   Q_OBJECT
 
@@ -24,7 +24,8 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Shows in the title bar what the wizard is waiting for, as long as it waits.
+  /// Beeps. If a spinner is shown, the title bar says what the wizard is waiting for until the
+  /// spinner stops.
   void explainRefusal();
 
   /// Returns whether the key did anything.
@@ -34,7 +35,7 @@ class WindowEvents final : public QObject {
   /// clicked.
   bool performReturn();
 
-  /// Selects the first menu of the menu bar, so that the arrow keys can be used from there. Returns
+  /// Selects the first menu of the menu bar, so that the arrow keys work in the menu bar. Returns
   /// whether there is a menu.
   bool openMenu();
 

@@ -36,7 +36,7 @@ void ignore(id, SEL, BOOL) {}
 
 @implementation OnrampWaitingSheet
 
-// The timer fires again inside the sheet's loop when that runs in another mode.
+// The timer fires again inside the sheet's loop if that loop runs in another mode.
 - (void)begin {
   if (_hasBegun) return;
   _hasBegun = YES;

@@ -24,8 +24,8 @@ NSString* contentsOf(NSString* bundlePath) {
   return isFolder(contents) ? contents : bundlePath;
 }
 
-// The folder of the first of the user's languages, if the bundle has it. GNUstep looks for
-// "zh_CN.lproj" only under names such as "SimplifiedChinese.lproj".
+// Returns the folder of the first of the user's languages, or nil when the bundle lacks that
+// folder. GNUstep looks for "zh_CN.lproj" only under names such as "SimplifiedChinese.lproj".
 NSString* firstLanguageFolder(NSString* rootPath, NSString* subPath) {
   NSArray* const languages =
       [[NSUserDefaults standardUserDefaults] stringArrayForKey:@"NSLanguages"];
@@ -43,7 +43,7 @@ NSArray* resourcePaths(id self, SEL selector, NSString* rootPath, NSString* subP
   NSString* const first = localization ? nil : firstLanguageFolder(contents, subPath);
   if (!first || [paths count] == 0) return paths;
   NSMutableArray* const all = [NSMutableArray arrayWithArray:paths];
-  [all insertObject:first atIndex:1];  // after the folder of what is in no language
+  [all insertObject:first atIndex:1];  // after the folder for resources in no language
   return all;
 }
 

@@ -32,7 +32,8 @@ NSArray* languageCodes() {
 
 @implementation OnrampDefaults
 
-// Shows the menu inside the window, and shows no icon of the application on the desktop.
+// Sets the user's languages, shows the menu inside the window, and shows no icon of the application
+// on the desktop.
 + (void)load {
   @autoreleasepool {
     NSUserDefaults* const defaults = [NSUserDefaults standardUserDefaults];

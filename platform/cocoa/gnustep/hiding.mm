@@ -18,7 +18,7 @@ PlainAction* originalOrderFrontRegardless = nullptr;
 Question* originalIsHidden = nullptr;
 bool isHiddenByItself = false;
 
-// Returns the windows that were on the screen when the application was hidden, from front to back.
+// Returns the windows that were on the screen when the application hid itself, from front to back.
 NSMutableArray* hiddenWindows() {
   static NSMutableArray* const windows = [[NSMutableArray alloc] init];
   return windows;

@@ -1,6 +1,6 @@
 // Makes a posted event wake the main loop, as on macOS. A GNUstep loop fires its timers and
-// performs its messages before it waits for input, and does not notice an event that one of them
-// has posted until other input arrives.
+// performs its messages before it waits for input, and does not notice an event that a timer or
+// message has posted until other input arrives.
 
 #include <sys/eventfd.h>
 #include <unistd.h>

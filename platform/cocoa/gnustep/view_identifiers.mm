@@ -1,4 +1,5 @@
-// Gives views the identifiers that their interface file contains, because GNUstep ignores these.
+// Gives views the identifiers that their interface file contains, because GNUstep ignores the
+// identifiers.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
