@@ -129,8 +129,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
   /// Compare the running system's version with the medium's maximum and minimum, by the rules of
-  /// isNewerThan() and isOlderThan(). Unlike installationCheck(), these functions do not skip a
-  /// bound whose "Major" is 0.
+  /// isNewerThan() and isOlderThan(), and return kSupported when the version is within the bound.
+  /// Unlike installationCheck(), these functions do not skip a bound whose "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
@@ -194,14 +194,14 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop for kMostPauses pauses of length `pause`, or only until the end of a
-  /// pause at which the chooser lists a device. Then ends the search. During the wait, `page`,
-  /// unless it is null, shows its waiting state, and the user can neither click a button nor close
-  /// the window.
+  /// Waits in a modal loop for kMostPauses pauses of length `pause`. If the chooser lists a device
+  /// at the end of a pause, the wait ends there. Afterwards ends the search. During the wait,
+  /// `page`, unless it is null, shows its waiting state, and the user can neither click a button
+  /// nor close the window.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Sleeps for kMostPauses pauses of length `pause`, or only until the end of a pause at which a
-  /// device is listed, or until the application terminates. Then ends the modal loop. Must not be
+  /// Sleeps for kMostPauses pauses of length `pause`. Stops early if a device is listed at the end
+  /// of a pause, and when the application terminates. Afterwards ends the modal loop. Must not be
   /// called on the main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 

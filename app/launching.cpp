@@ -22,7 +22,7 @@ namespace {
 constexpr std::chrono::milliseconds kQuitDelay{1000};
 
 // The time between hiding the application and running the set-up tool, which blocks the main
-// thread. The window disappears within this time.
+// thread. The window gets this time to disappear.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
 // Exit statuses of the set-up tool. Any other status leads to a new search, and so does a tool that

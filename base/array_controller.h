@@ -51,8 +51,8 @@ class ArrayController {
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 
-  /// Whether choose() or chooseObject() has been called. Becomes false again when the selected
-  /// entry is removed and when removeAllObjects() is called.
+  /// Whether the user has made a selection: true after choose() and chooseObject(), false after the
+  /// selected entry has been removed and after removeAllObjects().
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
   /// Return the index of the selected entry, and the entry itself. Both return nothing when no

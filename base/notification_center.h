@@ -36,8 +36,9 @@ class NotificationCenter {
   /// it is not called.
   void removeObserver(const void* observer);
 
-  /// Calls the handlers of the notification's name. Handlers may add and remove observers and post
-  /// further notifications. An observer added during a delivery does not get that notification.
+  /// Calls the handlers that observe the notification's name. Handlers may add and remove observers
+  /// and post further notifications. An observer added during a delivery does not get that
+  /// notification.
   void post(const Notification& notification);
 
  private:

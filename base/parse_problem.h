@@ -10,7 +10,7 @@ namespace onramp {
 /// of note(), only the first one has an effect.
 struct ParseProblem {
   std::string reason;      ///< a phrase such as "\";\" expected"; empty when nothing is wrong
-  std::size_t offset = 0;  ///< in bytes: in a binary file, or in the UTF-8 form of a text
+  std::size_t offset = 0;  ///< in bytes, from the start of the binary file or of the UTF-8 text
 
   void note(std::string why, std::size_t where) {
     if (reason.empty()) *this = {std::move(why), where};

@@ -44,8 +44,8 @@ class Dictionary {
   [[nodiscard]] const Value* find(std::string_view key) const;
 
   /// Return the value under `key` if it is of the type that the function is named after. Otherwise
-  /// array() returns null and the other two return nothing. The pointer to an array is valid as
-  /// long as that of find().
+  /// array() returns null and the other two return nothing. The pointer to the array is valid as
+  /// long as a pointer that find() returns.
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;

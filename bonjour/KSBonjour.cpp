@@ -28,7 +28,7 @@ void postResolved(const NetServiceRef& service) {
 }
 
 // Returns the callbacks of all browses and resolves of the process. Every new browser sets them to
-// the same functions.
+// postAdd, postRemove and postResolved.
 ServiceClientCallbacks& clientCallbacks() {
   static ServiceClientCallbacks callbacks;
   return callbacks;
@@ -125,7 +125,7 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   }
   const auto stored = _services->find(*key);
   Entry& entry = stored->second;
-  // The table may hold a newer object for the same service than the notification does.
+  // The notification may hold an older object for this service than the table does.
   const NetServiceRef storedService = entry.service;
   const bool wasValid = std::exchange(entry.isValid, false);
   if (wasValid) KSNetServiceCancelResolve(storedService);

@@ -34,9 +34,9 @@ class KSBonjourObserver {
 
   /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service is gone, after the browser's table has been updated. A service that was
-  /// added more than once may still be in the table. `service` is the table's object, or null when
-  /// the table did not contain the service.
+  /// Called when a service is reported gone, after the browser's table has been updated. A service
+  /// that was added more than once may still be in the table. `service` is the table's object, or
+  /// null when the table did not contain the service.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
   /// Called when a service's addresses and TXT record are known, after the browser's table has been
   /// updated.
@@ -72,7 +72,8 @@ class KSBonjour {
   /// browsers.
   void startBrowsing();
 
-  /// Ends the browse and forgets the table without calling observers.
+  /// Ends the browse and forgets the table, without calling observers. Does nothing when the
+  /// browser is idle.
   void stopBrowsing();
 
   // Handlers of the three notifications.
@@ -86,7 +87,7 @@ class KSBonjour {
 
   // These functions look up a service in the table. They return false or null when the service is
   // not in the table or when an argument is nothing. didServiceResolved() also returns false when
-  // the service in the table is not resolved.
+  // the service has not been resolved since it was last added.
   [[nodiscard]] bool isServiceContained(const std::optional<std::string>& name,
                                         const std::optional<std::string>& type,
                                         const std::optional<std::string>& domain) const;
@@ -99,7 +100,7 @@ class KSBonjour {
   struct Entry {
     NetServiceRef service;
     int referenceCount = 0;    ///< additions, less the removals that counted
-    bool didResolved = false;  ///< whether the service is resolved
+    bool didResolved = false;  ///< whether the service has been resolved since its last addition
     bool isValid = true;       ///< false from a removal until the next addition or resolve
   };
   using Table = std::map<std::string, Entry>;

@@ -72,7 +72,8 @@ void KSBonjourSearch::startBrowsing() {
 // Stopped browsers stay in the array. They have no table, so no service is found in them.
 void KSBonjourSearch::stopBrowsing() {
   NotificationCenter::defaultCenter().removeObserver(this);
-  // The browsers may hold the last references to this object.
+  // The browsers may hold the last references to this object, so `self` keeps the object alive
+  // until this function returns.
   const auto self = weak_from_this().lock();
   for (const auto& browser : _aryKSBonjour) {
     browser->stopBrowsing();

@@ -11,7 +11,8 @@ namespace onramp {
 namespace {
 
 // The offsets of the address family and of an IPv4 address, and the number of the family, in the
-// socket addresses that NetService::addressing() returns. They have the BSD layout on every system.
+// socket addresses that NetService::addressing() returns. These have the BSD layout on every
+// system.
 constexpr std::size_t kFamilyOffset = 1;
 constexpr std::size_t kIPv4Offset = 4;
 constexpr std::size_t kIPv4Size = 4;

@@ -27,7 +27,7 @@ int KSNetServiceBrowserStart(NetServiceBrowserRef& browser, const std::string& d
                              const std::optional<std::string>& type,
                              ServiceClientCallbacks* callbacks);
 
-/// Ends the browse. The caller keeps the handle. Returns 1 for a null browser.
+/// Ends `browser` for good. The caller keeps the handle. Returns 1 for a null browser.
 int KSNetServiceBrowserStop(const NetServiceBrowserRef& browser);
 
 /// Starts to resolve `service`, after cancelling its running resolve if there is one. A resolve
@@ -44,7 +44,7 @@ int KSNetServiceCancelResolve(const NetServiceRef& service);
 /// limit. Returns 1 for a null service and when the resolve does not succeed in time.
 int KSNetServiceResolveSync(const NetServiceRef& service, double timeout);
 
-/// Resolves the service with that name, type and domain as KSNetServiceResolveSync does. On success
+/// Resolves the service with this name, type and domain as KSNetServiceResolveSync does. On success
 /// `addresses` holds the service's IPv4 addresses, or nothing when there are none; on failure
 /// `addresses` is unchanged. Also returns 1 when an argument is nothing or null.
 int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,

@@ -10,8 +10,8 @@ namespace onramp {
 namespace {
 
 // The offsets of the address family and of an IPv6 address, and the number of the family, in the
-// socket addresses that NetService::addressing() returns. They have the BSD layout on every system,
-// in which the family is 30.
+// socket addresses that NetService::addressing() returns. These have the BSD layout on every
+// system, so the number of the family is 30 on Linux, too.
 constexpr std::size_t kFamilyPlace = 1;
 constexpr std::size_t kIPv6Place = 8;
 constexpr std::size_t kIPv6Length = 16;

@@ -1,5 +1,5 @@
 # Assembles a medium that the application can run from, in ONRAMP_MEDIUM: the example medium's files
-# and the application's bundle.
+# and the application's bundle. Installs the bundle into the installed example medium.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")

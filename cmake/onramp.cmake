@@ -6,7 +6,7 @@ target_compile_options(onramp_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
   # GCC 12 mistakes string concatenation in the standard library for an overlapping copy.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
-  # macOS deprecates its C functions for network services and for its own version, and has no others.
+  # macOS deprecates its C functions for network services and for its own version, but has no newer ones.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
 # These options are global, so that every object file is instrumented, including code from

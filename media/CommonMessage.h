@@ -5,7 +5,7 @@
 
 namespace onramp {
 
-/// Access to the message bundle on the medium, which holds the texts of the wizard.
+/// Access to the wizard's texts in the message bundle on the medium.
 namespace CommonMessage {
 
 /// Returns medium::fullPath(relativePath).

@@ -9,7 +9,7 @@
 
 namespace onramp {
 
-/// A file or folder, given by its absolute path. The file need not exist.
+/// The absolute path of a file or folder, which need not exist.
 struct FileURL {
   std::string path;
   friend bool operator==(const FileURL&, const FileURL&) = default;

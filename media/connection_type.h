@@ -38,8 +38,9 @@ enum class FirstPage {
   kModelList,
 };
 
-/// Returns the first page for a medium with `models`: kNone when no model supports wireless,
-/// kConnectionType when the models share a type other than kNeither, and otherwise kModelList.
+/// Returns the first page for a medium with `models`, according to `modelInfo`: kNone when no model
+/// supports wireless, kConnectionType when the models share a type other than kNeither, and
+/// otherwise kModelList.
 [[nodiscard]] FirstPage firstPage(const std::vector<std::string>& models,
                                   const std::optional<Dictionary>& modelInfo);
 

@@ -23,8 +23,8 @@ inline constexpr std::string_view kVenderName = "VenderName";
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
 /// at `bundlePath`. Without a relative path, returns that folder. `bundlePath` must not end in "/".
-/// When it contains no "/", returns the relative path itself, or an empty text without one. Drops
-/// slashes at the result's end, as withoutClosingSlash() does. Does not access the disk.
+/// When it contains no "/", returns the relative path itself, or an empty text when there is none.
+/// Drops slashes at the result's end, as withoutClosingSlash() does. Does not access the disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 

@@ -27,9 +27,9 @@ inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceW
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
 /// The page that lists the devices found on the network. A device is listed if its model is one of
-/// those being looked for and the device reports that it is on wireless. The page is created once.
-/// While another page is shown, it keeps its list, and a running search goes on. A running search
-/// shares ownership of the page until stopBrowsing() is called.
+/// those being looked for and the device reports that it is on wireless. The page is created once,
+/// and it keeps its list and a running search while another page is shown. A running search shares
+/// ownership of the page until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {

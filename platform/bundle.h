@@ -52,8 +52,8 @@ class Bundle {
 
   /// Returns the text under `key` in the string table `table` ("Localizable" when no table is
   /// given), or `value` when the table does not contain `key` or cannot be read. The table is the
-  /// file that pathForResource() finds for the type "strings". `value` should not be empty, because
-  /// macOS returns `key` in place of an empty `value`.
+  /// file that pathForResource() finds for the name of the table and the type "strings". `value`
+  /// should not be empty, because macOS returns `key` in place of an empty `value`.
   [[nodiscard]] std::string localizedString(const std::string& key, const std::string& value,
                                             const std::optional<std::string>& table) const;
 

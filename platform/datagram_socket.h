@@ -52,10 +52,10 @@ class DatagramSocket {
   /// may provide a smaller buffer.
   void setReceiveBufferSize(std::size_t bytes);
 
-  /// Wait until the socket can send a datagram, or until there is a datagram or an error for
-  /// receive(). Both functions wait for at most `timeout`, which must not be negative and is
-  /// rounded up to whole milliseconds. They return whether the socket is ready, and false on
-  /// failure.
+  /// waitWritable() waits until the socket can send a datagram. waitReadable() waits until there is
+  /// a datagram or an error for receive(). Both wait for at most `timeout`, which must not be
+  /// negative and is rounded up to whole milliseconds. They return whether the socket is ready, and
+  /// false on failure.
   [[nodiscard]] bool waitWritable(std::chrono::nanoseconds timeout) const;
   [[nodiscard]] bool waitReadable(std::chrono::nanoseconds timeout) const;
 

@@ -23,7 +23,7 @@ struct ServiceSighting {
   std::string name;       ///< as NetService::name()
   std::string type;       ///< as NetService::type()
   std::string domain;     ///< as NetService::domain()
-  std::string interface;  ///< the network interface's name, or its number if it is gone
+  std::string interface;  ///< the network interface's name, or its number if the interface is gone
   bool isIPv6 = false;    ///< seen by IPv6; otherwise by IPv4
   bool isGone = false;
 };

@@ -16,9 +16,9 @@
 /// below from the Linux kernel.
 ///
 /// Callers can rely on two kinds of entries, both in the domain kSCDynamicStoreDomainState:
-/// - the IPv4 entity of an interface. It exists for every interface, including the loopback
-///   interface, that is up, can pass traffic (has a carrier and has passed authentication) and has
-///   an IPv4 address. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold one
+/// - the IPv4 entity of an interface. It exists for every interface that is up, can pass traffic
+///   (has a carrier and has passed authentication) and has an IPv4 address. The loopback interface
+///   is no exception. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold one
 ///   dotted text for each address, in the system's order. The array
 ///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
 ///   when none is set;
@@ -78,9 +78,9 @@ using DynamicStoreCallback = std::function<void(const std::vector<std::string>& 
                                                      const std::vector<std::string>& keys,
                                                      const std::vector<std::string>& patterns);
 
-/// Makes the session call its callback when the value of a key changes that copyMultiple() would
-/// select for the same `keys` and `patterns`. Replaces any earlier request. A value that appears or
-/// disappears also counts as changed. Returns false on failure.
+/// Makes the session call its callback when the value of a selected key changes. `keys` and
+/// `patterns` select keys as in copyMultiple(). Replaces any earlier request. A value that appears
+/// or disappears also counts as changed. Returns false on failure.
 bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::string>& keys,
                          const std::vector<std::string>& patterns);
 

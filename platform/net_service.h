@@ -27,6 +27,7 @@ inline constexpr std::int32_t kNetServiceErrorUnknown = -72000;
 inline constexpr std::int32_t kNetServiceErrorTimeout = -72007;
 
 // The flags that a NetServiceBrowser passes to its client.
+
 /// More calls follow at once. Only the backend for macOS sets this flag.
 inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
 /// The service is gone. Without this flag, the service has been found.

@@ -58,7 +58,7 @@ class View : public Outlet {
   [[nodiscard]] View firstSubview() const;
 
   /// Puts `view` inside this one and makes it fill this one. Gives the keyboard focus to the first
-  /// list in `view`, or to its first control if it has no list. The owner of `view` does not
+  /// list in `view`, or to the first control if there is no list. The owner of `view` does not
   /// change.
   void addSubview(const View& view) const;
 
@@ -101,8 +101,8 @@ class RadioMatrix : public Control {
   /// Selects the button in this place, and thereby deselects every other one.
   void selectCell(int row, int column) const;
 
-  /// Returns the row of the selected button, counted from 0. The result is meaningless when no
-  /// button is selected, and 0 when this handle is empty.
+  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty,
+  /// and 0 or -1 when no button is selected.
   [[nodiscard]] int selectedRow() const;
 };
 
@@ -182,7 +182,7 @@ class Window : public Outlet {
   using Outlet::Outlet;
 
   /// Shows or hides the window's mark for resizing. On a system whose windows have no such mark,
-  /// hiding it prevents the user from resizing the window.
+  /// setShowsResizeIndicator(false) prevents the user from resizing the window.
   void setShowsResizeIndicator(bool shows) const;
 
   /// Centres the window on its screen.

@@ -12,8 +12,8 @@ namespace onramp {
 /// on the main thread.
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action);
 
-/// Runs `action` once on the main thread, in every mode of the main loop. Actions run in the order
-/// of the calls, except those that abortModal() holds back, and never inside this function.
+/// Runs `action` once on the main thread, in every mode of the main loop. Actions never run inside
+/// this function. They run in the order of the calls, except those that abortModal() holds back.
 /// Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 
@@ -22,8 +22,8 @@ void performOnMainThread(std::function<void()> action);
 /// application terminates. Must be called on the main thread.
 void runModalForWindow(const Window& window);
 
-/// Ends the innermost running modal loop, if there is one. Holds back the actions of
-/// performOnMainThread() that have not run yet until that loop has ended. Callable from any thread.
+/// Ends the innermost running modal loop, if there is one. Until that loop has ended, actions of
+/// performOnMainThread() that have not run yet are held back. Callable from any thread.
 void abortModal();
 
 /// Blocks the calling thread, which must not be the main thread, for `duration`. When the

@@ -6,8 +6,8 @@
 
 namespace onramp {
 
-/// Returns the running system's "ProductVersion", such as "10.15.7", or nothing when the system
-/// does not report one.
+/// Returns the running system's version as a text, such as "10.15.7". Returns nothing when the
+/// system does not report its version.
 [[nodiscard]] std::optional<std::string> productVersion();
 
 /// Returns the running system's version in binary-coded decimal, in the format of the "sysv"

@@ -21,9 +21,9 @@ std::array<mib_entry, 1> active_if_entries = {
 
 constexpr std::array<mib_value_handler, 1> kActiveIFHandlers = {{{kActiveIFKey, decode_active_if}}};
 
-// Compares as many bytes as the entry has room for arcs. An arc takes two bytes, so only the first
-// half of the name is compared. A reply is decoded into the table's own names, so the result is
-// always true for a reply.
+// Compares as many bytes as the storage of the entry's name has arcs. An arc takes two bytes, so
+// only the first half of the name is compared. A reply is decoded into the table's own names, so
+// the result is always true for a reply.
 bool names_match(const snmp_oid& entry, const snmp_oid& name) {
   return name.capacity >= entry.capacity && std::memcmp(entry.arcs, name.arcs, entry.capacity) == 0;
 }

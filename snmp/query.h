@@ -31,7 +31,7 @@ struct mib_value_handler {
   mib_decode decode = nullptr;  ///< null when the value is not stored
 };
 
-/// The objects that one request asks for.
+/// The objects that one request asks for: `count` entries, and a handler for each of them.
 struct mib_table {
   mib_entry* entries = nullptr;
   std::uint64_t count = 0;
@@ -83,8 +83,8 @@ class snmp_table_request {
   snmp_message message_;
 };
 
-/// Asks the device at `address`, dotted IPv4 text, for the objects of `table`. Returns nothing when
-/// `table` or `address` is null, when the reply has an error status, when
+/// Asks the device at `address`, a dotted IPv4 text, for the objects of `table`. Returns nothing
+/// when `table` or `address` is null, when the reply has an error status, when
 /// snmp_table_request::result() returns nothing for the reply, and when no valid reply comes.
 /// `out_no_reply` is set to true in the last case only and is never cleared. A reply's error status
 /// and index are stored in the last two arguments, which may be null. Blocks as snmp_exchange does.

@@ -43,7 +43,7 @@ extern std::int64_t snmp_request_counter_ext;
 /// the address 255.255.255.255.
 [[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
 
-/// Sends `message` to the SNMP port of `address`, dotted IPv4 text, and decodes the reply into
+/// Sends `message` to the SNMP port of `address`, a dotted IPv4 text, and decodes the reply into
 /// `message`. Sends nothing if `address` is null or any other text. Blocks for at most kSendWait
 /// plus kReceiveWait; the wait ends at once when the host refuses the request. `message.community`
 /// keeps its value, because the reply's community does not outlive the call. The reply's identifier

@@ -103,8 +103,8 @@ bool Daemon::watchDaemon() {
          });
 }
 
-// Starts the daemon on systems that start it on demand. The bus reports when the daemon has
-// arrived.
+// Asks the bus to start the daemon, which works on systems that start the daemon on demand. The bus
+// reports when the daemon has arrived.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");
   if (request && sd_bus_message_append(request.get(), "su", kAvahi, 0U) >= 0) {

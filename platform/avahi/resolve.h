@@ -25,8 +25,8 @@ struct Resolution {
 /// daemon goes away, the resolve starts again once the daemon is back.
 class Resolve {
  public:
-  /// Called once, from inside the daemon's loop. The argument is nothing when the time is up. The
-  /// function must not destroy the resolve.
+  /// Called when the resolve ends, at most once, from inside the daemon's loop. The argument is
+  /// nothing when the time is up. The function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
   /// The daemon must outlive the resolve. Without a `timeLimit`, the resolve may run for ever.

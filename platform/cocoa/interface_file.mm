@@ -126,7 +126,7 @@ NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
 
 Interface::Interface(std::unique_ptr<Tree> tree) : tree_(std::move(tree)) {}
 
-// Removes the page from the window if it is still shown.
+// Removes the page from the window if the page is still shown.
 Interface::~Interface() {
   [rootView(tree_->topLevelObjects.get()) removeFromSuperview];
 }

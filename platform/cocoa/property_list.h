@@ -13,7 +13,8 @@ namespace onramp::cocoa {
 /// exceeds the limits in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
-/// Converts `value` to a property-list object.
+/// Converts `value` to a property-list object. A text that is not valid UTF-8 becomes an empty
+/// string.
 [[nodiscard]] id toPropertyList(const Value& value);
 
 }  // namespace onramp::cocoa

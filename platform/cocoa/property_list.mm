@@ -30,7 +30,7 @@ class Reader {
   }
 
  private:
-  // The two Boolean objects are singletons. The kind of any other number follows from its type.
+  // The two Boolean objects are singletons. The kind of any other number follows from its C type.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);

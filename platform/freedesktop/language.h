@@ -18,12 +18,12 @@ struct Language {
 };
 
 /// Returns the languages in which to look for a resource, in the order of the search and spelled as
-/// in `offered`. The first ones match the first language in `preferred` that has any match: the
-/// exact region comes first, then the language without a region, then the language in other
-/// regions. The languages that match `development` follow. If nothing matches, the result is
-/// English. If English is not offered, the result is the offered language that comes first in
-/// alphabetical order. The result is empty when no well-formed language is offered. Two languages
-/// whose scripts are known and differ never match.
+/// in `offered`. The result begins with the matches of one preferred language: the first one in
+/// `preferred` that has a match. The match with the exact region comes first, then the one without
+/// a region, then those with other regions. The matches of `development` follow. If nothing
+/// matches, the result is English. If English is not offered, the result is the offered language
+/// that comes first in alphabetical order. The result is empty when no well-formed language is
+/// offered. Two languages whose scripts are known and differ never match.
 [[nodiscard]] std::vector<std::string> languagesToSearch(std::vector<std::string> offered,
                                                          const std::vector<std::string>& preferred,
                                                          const std::string& development);

@@ -11,7 +11,7 @@ namespace onramp::libplist {
 /// and a trailer of 32 bytes. Every object that can be reached from the root must be of a known
 /// kind and lie before the table. No container may contain itself. The list must be within the
 /// limits even when each shared object counts once for each reference to it. The check builds
-/// nothing. When the result is false, `problem` gives the reason.
+/// nothing. When the result is false, `problem` gives the place and the reason.
 [[nodiscard]] bool mayReadBinary(std::string_view bytes, ParseProblem& problem);
 
 }  // namespace onramp::libplist

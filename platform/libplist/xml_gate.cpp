@@ -68,7 +68,8 @@ class XMLWalk {
   }
 
   // Moves past the next `end` that is at least `from` characters ahead. Sets `skipped_` to the
-  // markup before that `end`, without its first `from` characters.
+  // markup before that `end`, without the first `from` characters. Refuses the list when there is
+  // no such `end`.
   bool skipPast(std::string_view end, std::size_t from) {
     const std::size_t found = text_.find(end, at_ + from);
     if (found == kNone) {

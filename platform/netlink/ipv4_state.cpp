@@ -25,8 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// The maximum number of times that a dump is requested. The kernel marks a dump as interrupted when
-// the table changes during the dump.
+// The maximum number of times that a dump, the list of a whole table, is requested. The kernel
+// marks a dump as interrupted when the table changes in the meantime.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;

@@ -160,8 +160,8 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// Owns the root widget unless its parent has destroyed it. While a page is shown, its root is a
-// child of the window, and the window may be destroyed before the page.
+// Owns the root widget, unless the widget's parent has already destroyed the widget. While a page
+// is shown, its root is a child of the window, and the window may be destroyed before the page.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

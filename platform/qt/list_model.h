@@ -45,7 +45,7 @@ class ListModel final : public QAbstractTableModel {
   const QStringList spokenColumns_;
   QStringList headers_;
   const ArrayController* controller_ = nullptr;
-  int rows_ = 0;  ///< the number of rows that the views were told
+  int rows_ = 0;  ///< the number of rows that the views know of
 };
 
 }  // namespace qt

@@ -74,7 +74,7 @@ void connectStandardMenuItems(QWidget* window) {
 
 using qt::nativeOf;
 
-// A Menu refers to a QMenuBar or a QMenu. A MenuItem refers to one of its actions.
+// A Menu refers to a QMenuBar or a QMenu. A MenuItem refers to an action of a menu bar or menu.
 
 MenuItem Menu::itemWithTitle(const std::string& title) const {
   const auto* const menu = nativeOf<QWidget>(*this);

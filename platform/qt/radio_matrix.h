@@ -5,7 +5,7 @@
 
 namespace onramp::qt {
 
-/// A group of radio buttons. Each is a child with the properties "row" and "column".
+/// A group of radio buttons. Each button is a child with the properties "row" and "column".
 class RadioMatrixWidget final : public QWidget {
   Q_OBJECT
 

@@ -28,8 +28,8 @@ void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.restore();
 }
 
-// Returns the colour of the selection. If the title on it is lighter, the colour is darkened until
-// the title can be read.
+// Returns the colour of the default button, which is that of selections. If the button's title is
+// lighter than this colour, the colour is darkened until the title can be read.
 QColor defaultButtonColor(const QPalette& palette) {
   QColor color = palette.color(QPalette::Highlight);
   const int title = qGray(palette.color(QPalette::HighlightedText).rgb());

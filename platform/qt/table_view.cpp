@@ -55,8 +55,9 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
 }
 
 // Passes the row that the user selected to the controller, or selects the controller's row again
-// when the user deselected it. An assistive program deselects the old row before it selects another
-// one, so both rows are selected for a moment and only `added` tells which one is meant.
+// when the user deselected it. When an assistive program deselects the old row before it selects
+// another one, the old row is selected again. Both rows are selected for a moment, and only `added`
+// tells which one is meant.
 void takeSelection(QAbstractItemView* view, ArrayController& controller,
                    const QItemSelection& added) {
   if (!view->selectionModel()->hasSelection()) {
@@ -67,8 +68,8 @@ void takeSelection(QAbstractItemView* view, ArrayController& controller,
   }
 }
 
-// Clicks the window's default button once the list has handled its own click, because the button's
-// action may remove the list. A button that is disabled now is not clicked later either.
+// Clicks the window's default button once the list has handled the double-click, because the
+// button's action may remove the list. A button that is disabled now is not clicked later either.
 void clickDefaultButtonSoon(const QWidget& window) {
   for (QPushButton* const button : window.findChildren<QPushButton*>()) {
     if (!button->isDefault() || !button->isVisible() || !button->isEnabled()) continue;

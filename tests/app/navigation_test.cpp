@@ -18,7 +18,7 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// Launches the wizard with a list of `models` and goes to the connection page of the first one.
+  /// Launches the wizard with a list of `models` and goes to the connection page of the first.
   /// The models must differ in their cables, because the wizard otherwise skips the list.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
@@ -30,8 +30,8 @@ class Navigation : public Wizard {
     ASSERT_EQ(page(), "ConnectionTypeView");
   }
 
-  /// Starts a search on the connection page that finds nothing. The set-up tool then runs and exits
-  /// with `exitStatus`.
+  /// On the connection page, starts a search that finds nothing. The set-up tool then runs and
+  /// exits with `exitStatus`.
   void searchInVainWithTool(int exitStatus) {
     medium.addSetUpTool(exitStatus);
     screen.click("rightMostButton");
@@ -184,7 +184,7 @@ TEST_F(Navigation, AToolThatAsksToGoBackLeadsToTheConnectionPageWithWirelessSele
   EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedColumn, 0);
   EXPECT_EQ(screen.log, (Strings{"unhide", "activate", "key and front"}));
 
-  // The tool may run again after another empty search.
+  // The tool runs again after another search that finds nothing.
   screen.log.clear();
   screen.click("rightMostButton");
   EXPECT_EQ(screen.log.back(), "hide");

@@ -127,7 +127,7 @@ class Avahi:
 
 def announce_pointer(service_type, target_labels, seconds=4500):
     """Announces (RFC 6762 section 8.3) that `service_type` has an instance with those labels.
-    Announces no other record of the instance. With 0 `seconds` to live, takes that back."""
+    Announces no other record of the instance. With 0 `seconds` to live, withdraws the instance."""
     name = _labels(*service_type.encode().split(b"."), b"local")
     target = _labels(*target_labels)
     packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name

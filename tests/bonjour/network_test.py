@@ -94,7 +94,7 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Harrier (2)")[3:7:3],
                              ["Harrier Jet 7", "192.0.2.1"])
             responder.update_service(service(b"Jet 8"))
-            # A running search does not notice the change. Avahi needs some time to notice it.
+            # A running search never notices the change. Avahi notices the change after a while.
             model = None
             deadline = time.monotonic() + discovery.PATIENCE
             while model != "Harrier Jet 8" and time.monotonic() < deadline:
@@ -116,7 +116,7 @@ class NetworkTest(unittest.TestCase):
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
                         # A new device is announced only after its name has been checked. By then,
-                        # all sightings of the old one have ended.
+                        # all sightings of the removed device have ended.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],

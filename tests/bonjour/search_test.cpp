@@ -99,8 +99,8 @@ TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // Only the first removal counted, so the service is still counted twice. After the next resolve,
-  // removals count again.
+  // Only the first of the three removals counted, so it takes two more to remove the service. They
+  // count only after the next resolve.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());

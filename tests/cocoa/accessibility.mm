@@ -6,8 +6,8 @@
 // file, which has the same name with ".question" appended. The application's loop removes the
 // question file and writes the answer: a JSON array of all visible controls. Each is an object with
 // role, name, states and frame (x, y, width and height in pixels from the screen's upper left
-// corner). Roles and states have their AT-SPI names. The first object has the role "application"
-// and the number of mouse presses handled so far.
+// corner). Roles and states have their AT-SPI names. The first object stands for the application.
+// It has the role "application" and the number of mouse presses handled so far.
 
 #include <unistd.h>
 

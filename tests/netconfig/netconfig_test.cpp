@@ -1,4 +1,4 @@
-// Tests the rules that no real network shows. kernel_test.cpp tests the others.
+// Tests the rules that no real network shows. kernel_test.cpp tests the other rules.
 
 #include <gtest/gtest.h>
 

@@ -120,7 +120,7 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWireless}, {kWired}}, {6, 1, 0}, true},
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
-      // An address that leaves a request unanswered gets all its attempts before the next is asked.
+      // An address that leaves a request unanswered gets all its attempts before the next address.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},
@@ -161,7 +161,7 @@ TEST_F(Chooser, AnUpdateWithAnotherAddressKeepsTheOldEntry) {
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*", "D 192.0.2.2"));
   page->removeKSDevice(device("D", {"192.0.2.2"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
-  // The listed entry's record has two addresses, so the entry of a record with one is not equal.
+  // The listed entry's record has two addresses, so it is not equal to a record with one.
   page->removeKSDevice(device("D", {"192.0.2.1"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
 }

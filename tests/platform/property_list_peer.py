@@ -1,5 +1,5 @@
 """Another implementation of property lists. "write XML BINARY" writes a list with every kind of value
-to both files. "check FILE" compares the list in FILE with that list."""
+to both files. "check FILE" compares the list in FILE with the one that "write" writes."""
 
 import datetime
 import math

@@ -55,8 +55,8 @@ TEST(PropertyList, ReadsTheSameNumbersInALocaleWithADecimalComma) {
             0);
 }
 
-// Calls `prepare` in a process whose files may hold at most 1,024 bytes, and writes a list of 5,000
-// bytes there. Returns the process's wait status.
+// Calls `prepare` and then writes a list of 5,000 bytes, in a process whose files may hold at most
+// 1,024 bytes. Returns the process's wait status.
 int statusOfWriterPastItsLimit(const std::string& path, void (*prepare)()) {
   return inProcess([&] {
     const rlimit limit{1024, 1024};

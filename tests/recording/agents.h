@@ -27,7 +27,7 @@ class Agents {
   /// Returns to the initial state, in which no address answers.
   void reset() { *this = Agents(); }
 
-  /// The values that each dotted address answers with, in order. The last one answers all further
+  /// The values that each dotted address answers with, in order. The last value answers all further
   /// requests too.
   std::map<std::string, std::vector<int>> answers;
 

@@ -27,7 +27,7 @@ class MediumFolder {
     return root_ / "medium/" + relative;
   }
 
-  /// Write a file on the medium, and create its folder if it is missing.
+  /// Write a file on the medium. The file's folder is created if it is missing.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   void makeExecutable(const std::string& relative) const;
@@ -37,14 +37,14 @@ class MediumFolder {
   void describe(const Dictionary& resources, const Dictionary& cdInfo,
                 const Dictionary& modelInfo) const;
 
-  /// Puts a set-up tool on the medium that records its arguments and exits with `status`.
+  /// Puts on the medium a set-up tool that records its arguments and exits with `status`.
   void addSetUpTool(int status) const;
 
   /// Returns the arguments of the tool's last run, or an empty text when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// The first two return the contents of the two files for the package, or nothing when a file is
-  /// absent. The others return the paths of these files.
+  /// The first two return the contents of the two files for the package, or nothing when a file
+  /// cannot be read. The others return the paths of these files.
   [[nodiscard]] auto optionsFile() const { return loadDictionary(optionsFilePath()); }
   [[nodiscard]] auto modelFile() const { return loadDictionary(modelFilePath()); }
   [[nodiscard]] std::string optionsFilePath() const {

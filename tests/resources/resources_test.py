@@ -61,7 +61,7 @@ def wanted_columns(page):
 
 
 def recorded_outlets(interface):
-    """Returns the outlets that the tests' own front end has in place of the file's."""
+    """Returns the outlets that the recording front end has for an interface file."""
     text = text_of("tests/recording/interfaces.cpp")
     parts = re.search(rf'\{{"{interface}",\s*\{{(.*?)\}}\}}[,}}]', text, re.DOTALL)[1]
     return {name: kind for kind, name in re.findall(r'\{k(\w+), "(\w+)"', parts)}

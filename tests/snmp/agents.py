@@ -19,7 +19,7 @@ def bound_to(address, port=161):
 
 
 def serve(address, number, seconds=0, strangers=()):
-    """Starts an agent that answers `number` after `seconds`, after other senders have answered 1."""
+    """Starts an agent that answers `number` after `seconds`. The `strangers` answer 1 just before it."""
     agent = bound_to(address)
 
     def answer():

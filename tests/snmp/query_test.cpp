@@ -221,8 +221,8 @@ class GetSet : public testing::Test {
 
 TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
-  // The reply, the second slot's capacity, and its contents afterwards, which a refused reply
-  // leaves.
+  // The reply, the second slot's capacity, and the contents of that slot afterwards. A refused
+  // reply leaves the contents as they were.
   const std::tuple<const char*, std::string, std::uint16_t, std::string> cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},

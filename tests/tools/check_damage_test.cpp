@@ -96,7 +96,8 @@ class DamagedMedium {
   std::minstd_rand random_;
 };
 
-// Returns the page that the wizard shows, a space, and what it opens before it waits for the user.
+// Returns the page that the wizard shows, a space, and what the wizard opens before it
+// waits for the user.
 std::string startOfTheWizard() {
   recording::FrontEnd& screen = recording::FrontEnd::instance();
   screen.reset();

@@ -12,7 +12,7 @@ CMAKE, BUILD = sys.argv[1:]
 
 
 class Install(unittest.TestCase):
-    def test_the_installed_preview_finds_its_check_and_its_medium_and_the_guide_names_what_is_there(self):
+    def test_the_installed_preview_finds_its_medium_and_the_guide_names_what_is_there(self):
         with tempfile.TemporaryDirectory() as folder:
             subprocess.run([CMAKE, "--install", BUILD, "--prefix", folder], check=True, capture_output=True)
             prefix = pathlib.Path(folder)
@@ -21,6 +21,8 @@ class Install(unittest.TestCase):
                                   capture_output=True, text=True)
             self.assertEqual((done.returncode, done.stderr), (0, ""))
             self.assertRegex(done.stdout, r"\b0 errors, 0 warnings\b[\s\S]*the medium's own[\s\S]*\d\.\d\.\d")
+            subprocess.run([sys.executable, "-Bc", "import practice_network.namespace"],
+                           cwd=prefix / "lib/onramp/tools", check=True)
             guide = (prefix / "share/doc/onramp/media-kit.md").read_text(encoding="utf-8")
             named = re.findall(r"\b(?:bin|lib/onramp|share/doc)/[-\w./]*\w", guide)
             self.assertGreater(len(named), 5)

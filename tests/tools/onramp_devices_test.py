@@ -55,7 +55,7 @@ def tlv(tag, *parts):
 
 
 def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
-    """Returns a function from a request to the reply with these parts. Changes the request's number by `number`."""
+    """Returns a function that makes a request's reply from these parts. `number` changes its identifier."""
     def answer(request):
         time.sleep(seconds)
         at = request.index(b"corridor") + 12

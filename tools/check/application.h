@@ -8,8 +8,8 @@ namespace onramp::check {
 inline constexpr const char* kUsualName = "Onramp OSX.app";
 
 /// Returns the name of the application at the top of the medium in the folder `root`. If there are
-/// several, the first one in alphabetical order that looks like the wizard is preferred. Returns an
-/// empty string when there is none.
+/// several, returns the first one in alphabetical order that looks like the wizard, or the first of
+/// all if none does. Returns an empty string when there is no application.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
 }  // namespace onramp::check

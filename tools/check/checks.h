@@ -6,7 +6,7 @@
 
 namespace onramp::check {
 
-// Each function covers one subject. It adds to the report what is wrong, or what users will see.
+// Each function covers one subject. It adds to the report what is wrong or what users will see.
 
 /// Checks the models' names in the medium description and compares them with those in the model
 /// information.
@@ -21,12 +21,11 @@ void checkPackages(const MediumFiles& files, const Lists& lists);
 /// Checks the wireless set-up tool.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
-/// Checks the application apart from its Info.plist: its program and the list of countries with the
-/// online service.
+/// Checks the application's program and its list of the countries that have the online service.
 void checkApplication(const MediumFiles& files, const Lists& lists);
 
 /// Checks the values that the wizard passes to the network and to other programs: the service type,
-/// the vendor's name and the series code.
+/// the vendor's name and the series code. Checks that the application declares the service type.
 void checkIdentity(const Lists& lists, Report& report);
 
 /// Checks the texts of every language.

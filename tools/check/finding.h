@@ -18,11 +18,11 @@ struct Place {
   std::string file{};                 ///< relative to the medium
   std::vector<std::string> key{};     ///< the path of keys in a property list or strings table
   std::optional<std::size_t> line{};  ///< from 1
-  std::optional<std::size_t> byte{};  ///< from 0, in a binary file
+  std::optional<std::size_t> byte{};  ///< from 0, in a file that is not text
 };
 
-/// One mistake on a medium. The texts are phrases without a full stop. An empty text is left out of
-/// the output.
+/// One mistake on a medium. The texts are phrases without a full stop. writeText() leaves out empty
+/// ones.
 struct Finding {
   std::string id{};  ///< names the rule; stable, for programs
   Severity severity = Severity::kError;

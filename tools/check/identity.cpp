@@ -53,14 +53,16 @@ void checkServiceType(const Lists& lists, Report& report) {
   const Place place = inResources(lists, medium::kBonjourNetwork);
   const auto type = lists.resources->string(medium::kBonjourNetwork);
   if (!type || type->empty()) {
-    if (lists.resources->find(medium::kBonjourNetwork) && !type) return;  // readLists() reported it
+    // readLists() has already reported a value that is not a string.
+    if (lists.resources->find(medium::kBonjourNetwork) && !type) return;
     if (!lists.anyWireless()) return;
     report.findings.push_back({.id = "service-none",
-                               .place = {.file = lists.resourcesPath},
-                               .found = "no \"BonjourNetwork\"",
+                               .place = type ? place : Place{.file = lists.resourcesPath},
+                               .found = type ? "an empty service type" : "no \"BonjourNetwork\"",
                                .expected = "a service type such as \"_pdl-datastream._tcp.\"",
                                .effect = kNoDevice,
-                               .remedy = "add the type that the devices announce"});
+                               .remedy = type ? "write the type that the devices announce"
+                                              : "add the type that the devices announce"});
     return;
   }
   Spelling known({kIdentifyingTypes.begin(), kIdentifyingTypes.end()});
@@ -79,7 +81,7 @@ void checkServiceType(const Lists& lists, Report& report) {
     finding.expected = "\"_name._tcp.\", with a name of at most 15 letters, digits and hyphens";
   } else if (!identityKeysOf(*type)) {
     finding.id = "service-unknown";
-    finding.found += ", whose devices do not say which model they are";
+    finding.found += ", under which the wizard reads no maker and model";
     finding.expected = "one of _pdl-datastream._tcp., _printer._tcp., _ipp._tcp., _scanner._tcp.";
   }
   if (finding.id.empty()) {
@@ -109,10 +111,11 @@ void checkVendor(const Lists& lists, Report& report) {
              std::any_of(name.begin(), name.end(), isControl)) {
     finding.id = "vendor-folder";
     finding.found = quoted(*written) + ", which cannot be the name of a folder";
-    finding.expected = "a name without \"/\" that is not \".\" or \"..\"";
+    finding.expected = "a name without \"/\" and control characters, other than \".\" and \"..\"";
   } else if (file.size() > kLongestFileName) {
     finding.id = "vendor-long";
-    finding.found = "a name of " + std::to_string(name.size()) + " bytes without its spaces";
+    finding.found = "a name of " + std::to_string(name.size()) + " bytes, not counting spaces";
+    finding.remedy = "shorten the name";
     finding.expected =
         "at most " + std::to_string(kLongestFileName - (file.size() - name.size())) + " bytes";
   } else if (std::any_of(name.begin(), name.end(), isForeign)) {
@@ -120,7 +123,7 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.severity = Severity::kWarning;
     finding.found = quoted(*written) + ", with characters outside ASCII";
     finding.expected = "letters from A to Z, digits, spaces";
-    finding.effect = "a folder and files whose names not every program encodes in the same way";
+    finding.effect = "a folder and files whose names some programs encode differently";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }

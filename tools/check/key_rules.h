@@ -39,7 +39,8 @@ enum class OtherKeys { kReported, kAllowed };
 void checkKeys(const Dictionary& dictionary, const DictionaryPlace& place,
                std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report);
 
-/// Returns the value's kind in words, followed by the value itself if it is a text or a number.
+/// Returns the value's kind in words, followed by the value itself if it is a boolean, a number or
+/// a text.
 [[nodiscard]] std::string described(const Value& value);
 
 }  // namespace onramp::check

@@ -113,7 +113,7 @@ bool isPackageVersion(const std::string& key) {
   return !key.empty() && std::all_of(key.begin(), key.end(), isASCIIDigit);
 }
 
-// checkPackages() reports package keys of unknown versions, so this removes them.
+// Returns `package` without the keys of unknown versions, which checkPackages() reports.
 Dictionary withoutOtherVersions(const Dictionary& package) {
   std::vector<Dictionary::Pair> pairs;
   for (const auto& pair : package) {
@@ -172,7 +172,7 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
 }
 
 // Reads the property list whose path the resource dictionary has under `key`. Sets `path` to that
-// path.
+// path, if there is one. Returns nothing when the wizard cannot read the list.
 std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists,
                                     std::string_view key, const char* what, const char* effect,
                                     std::string& path) {

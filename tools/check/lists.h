@@ -12,7 +12,7 @@ namespace onramp::check {
 /// The property lists that the wizard reads from a medium. A list that the wizard cannot read is
 /// nothing.
 struct Lists {
-  std::string informationPath;            ///< relative to the medium, like the other paths
+  std::string informationPath;  ///< like the other paths, relative to the medium; empty if unknown
   std::optional<Dictionary> information;  ///< the application's Info.plist
   std::string resourcesPath;
   std::optional<Dictionary> resources;

@@ -65,7 +65,7 @@ bool isXML(const std::string& text) {
 }
 
 // `nearest` is the name on the medium that resembles the missing one. `isWritten` tells whether the
-// missing name is written on the medium; the wizard itself chooses all other names.
+// missing name is written on the medium. If it is not, the wizard's code has the name.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
                              bool isWritten) {
   if (!nearest) return isWritten ? "put it there, or correct the path" : "put it there";
@@ -73,7 +73,7 @@ std::string remedyForMissing(const std::string& missing, const std::optional<std
   return isWritten ? "write " + quoted(*nearest) + ", or " + rename : rename;
 }
 
-// Adds to `finding` why the wizard cannot read the bytes of a file, and the place.
+// Adds to `finding` why the wizard cannot read the bytes of a file, and where the mistake is.
 void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   ParseProblem problem;
   const auto text = bytes.starts_with("bplist") ? std::nullopt : decodedText(bytes);
@@ -159,7 +159,8 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
              !ignored && size > kMostPropertyListBytes) {
     finding.found = std::to_string(size) + " bytes";
     finding.expected = "at most " + std::to_string(kMostPropertyListBytes) + " bytes";
-    finding.remedy = "divide the models among several media";
+    finding.remedy =
+        "remove what the wizard does not read, or divide the models among several media";
   } else if (const auto bytes = posix::readFile(path, kMostPropertyListBytes); !bytes) {
     finding.found = "a file that cannot be read";
     finding.remedy = "let everyone read it (chmod a+r)";

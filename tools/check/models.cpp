@@ -123,9 +123,9 @@ class ModelCheck {
          .remedy = "add it there, or remove it from this file"});
   }
 
-  // Reports a model's name that no device can announce. Devices announce maker and model as two
-  // texts, which the wizard joins with a space. Each text has at most 255 bytes, its key
-  // ("usb_MFG=") included.
+  // Reports a model's name that no device can announce, and one with suspicious spaces. Devices
+  // announce maker and model as two texts, which the wizard joins with a space. Each text has at
+  // most 255 bytes, including the key before it ("usb_MFG=").
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
     const std::size_t space = name.find(' ');
@@ -147,8 +147,8 @@ class ModelCheck {
           "at most " + std::to_string(kMostBytes) + " bytes, the most that a device can announce",
           "write it as the devices announce it");
     } else if (control || !isUTF8(name)) {
-      impossible("a name with a line break, a tab or another control character",
-                 "printable characters", "remove that character");
+      impossible("a name with a control character, such as a line break, or with damaged UTF-8",
+                 "printable characters", "write the name as the devices announce it");
     } else if (name.front() == ' ' || name.back() == ' ' || name.find("  ") != std::string::npos) {
       const bool edge = name.front() == ' ' || name.back() == ' ';
       add(name, {.id = "model-blanks",
@@ -160,7 +160,8 @@ class ModelCheck {
     }
   }
 
-  // Reports each spelling of the maker that differs only in capital letters from the vendor's name.
+  // Reports each spelling of the maker that differs only in capital letters from the first word of
+  // the vendor's name.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));

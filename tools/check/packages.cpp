@@ -18,8 +18,8 @@ namespace {
 
 using Version = std::array<std::int64_t, 3>;
 
-// Returns the first version, and every version that may get a different package from the version
-// before it.
+// Returns the first release of every minor version of 10, and 11.0. A package can change only at
+// these versions.
 std::set<Version> differentSystems() {
   constexpr std::int64_t kLastMinor = 16;
   std::set<Version> systems{{11, 0, 0}};
@@ -45,7 +45,8 @@ Version boundOf(const Dictionary& bound) {
   return {bound.integerValue("Major"), bound.integerValue("Minor"), bound.integerValue("BugFix")};
 }
 
-// Returns the package's key for a version by the wizard's own rule; empty when there is none.
+// Makes `version` the system's version, and returns the package's key for it by the wizard's own
+// rule; empty when there is none.
 std::string versionKey(const Version& version) {
   setSystemVersion(std::to_string(version[0]) + "." + std::to_string(version[1]) + "." +
                    std::to_string(version[2]));
@@ -149,9 +150,9 @@ class PackageCheck {
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }
 
-  // Warns of a maximum whose "BugFix" is a number, because that release itself is refused. Does not
-  // warn of the first release of a major version, which is the usual way to exclude all of that
-  // version.
+  // Warns of a maximum whose "BugFix" is a number, because the release that the maximum names is
+  // refused. Does not warn when it names the first release of a major version, which is the usual
+  // way to exclude all of that version.
   void checkNamedMaximum() {
     const Dictionary& maximum = info_.supportSystemMax();
     const auto text = maximum.string("BugFix");
@@ -245,7 +246,7 @@ class PackageCheck {
          .found = "no package for " + words(row.from, row.to),
          .expected = key.empty() ? "\"PkgName\"" : "\"PkgName\" or " + quoted(key),
          .effect = effect,
-         .remedy = "name the package, or raise \"SystemMin\""});
+         .remedy = "name the package, or narrow the range of systems"});
   }
 
   void checkKeysThatNobodyUses() {

@@ -15,7 +15,7 @@ struct ShownText {
   double width = 0;  ///< of a line, in points; 0 where there is room enough for any text
   double size = 13;  ///< of the letters, in points
   int lines = 1;
-  std::size_t mostPlaceholders = 0;  ///< how often "%@" may occur, at least once; 0: never
+  std::size_t mostPlaceholders = 0;  ///< of "%@": at least one must occur; 0: none may occur
   bool hasFallback = false;          ///< a missing text is shown in English, not as its key
 };
 

@@ -40,8 +40,8 @@ std::string joined(const std::vector<std::string>& words) {
   return text;
 }
 
-// Returns whether one of the `offered` languages is the language `wanted`. A language that is only
-// a substitute for it does not count.
+// Returns whether one of the `offered` languages is the language `wanted`. A related language that
+// the system would substitute does not count.
 bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
   const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
   if (found.empty()) return false;
@@ -171,11 +171,13 @@ class TextCheck {
       finding.remedy = "write the text";
     } else if (wrongCount) {
       finding.id = "text-placeholders";
-      finding.found = "\"%@\" " + std::to_string(count) + " times";
+      finding.found = count == 0   ? "no \"%@\""
+                      : count == 1 ? "one \"%@\""
+                                   : std::to_string(count) + " times \"%@\"";
       finding.expected = filled ? "once or twice" : "none";
       finding.effect = filled && count == 0 ? "an alert that does not say which version is needed"
                                             : "a literal \"%@\" (" + std::string(shown.where) + ")";
-      finding.remedy = filled ? "write it only where a version belongs" : "remove it";
+      finding.remedy = filled ? "write it exactly where a version belongs" : "remove it";
     } else if (shown.where == "sheet when no device is found" &&
                text.find('%') != std::string::npos) {
       finding.id = "text-percent";
@@ -216,29 +218,31 @@ class TextCheck {
         files_.list(path, {{.file = path}, "the message bundle's Info.plist", effect});
     if (!information) return;
     const auto region = information->string(kKey);
+    const std::string offered =
+        languages_.empty() ? "the languages that you add to the bundle" : joined(languages_);
     Finding finding{.id = "region-missing",
                     .place = {.file = path},
                     .found = "no \"CFBundleDevelopmentRegion\"",
                     .expected = "the language for users without texts in their own, such as \"en\"",
                     .effect = effect,
-                    .remedy = "add \"CFBundleDevelopmentRegion\" with one of the languages " +
-                              joined(languages_)};
+                    .remedy = "add \"CFBundleDevelopmentRegion\" with one of " + offered};
     if (region) {
       if (serves(languages_, *region)) return;
       finding.id = "region-without-texts";
       finding.place.key = {kKey};
       finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
-      finding.expected = "one of " + joined(languages_);
-      finding.remedy = "name one of these, or add the texts of that language";
+      finding.expected = "one of " + offered;
+      finding.remedy = "name one of the expected languages, or add the texts of " + quoted(*region);
     } else if (information->find(kKey)) {
       finding.place.key = {kKey};
       finding.found = "a value that is not a string";
+      finding.remedy = "write one of " + offered;
     }
     report_.findings.push_back(std::move(finding));
   }
 
-  // Reports languages of the medium in which the application's own texts are missing. A medium
-  // cannot supply those.
+  // Reports languages of the medium in which the application lacks texts. The medium cannot supply
+  // the application's texts.
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";
@@ -251,7 +255,8 @@ class TextCheck {
            .severity = Severity::kWarning,
            .place = {.file = resources},
            .found = "no " + quoted(language + std::string(kLanguageFolder)),
-           .expected = "the languages of the message bundle; the application has " + joined(own),
+           .expected = "the languages of the message bundle; the application has " +
+                       (own.empty() ? "none" : joined(own)),
            .effect = "users of " + quoted(language) +
                      " read and hear some of the application's texts in English: why it uses the "
                      "network, and the name of the gear button",

@@ -24,7 +24,7 @@ bool isExecutable(const std::string& path) {
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
 }
 
-// Reports a bundle whose program is missing or cannot be started.
+// Reports a bundle whose program is not named, is missing or cannot be started.
 void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::string& relative,
                   const char* effect) {
   const std::string list = relative + "/Contents/Info.plist";
@@ -34,9 +34,9 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
   if (!program) {
     finding.id = "program-unnamed";
     finding.place.key.clear();
-    finding.found = "no \"CFBundleExecutable\"";
-    finding.expected = "the program's file name";
-    finding.remedy = "add it";
+    finding.found = "no name under \"CFBundleExecutable\"";
+    finding.expected = "the program's file name, a string";
+    finding.remedy = "write the name";
   } else if (!fs::is_regular_file(*program, ignored)) {
     const std::string name = bundle.infoString("CFBundleExecutable").value_or("");
     finding.id = "program-missing";
@@ -53,8 +53,8 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// Reports translations of the tool's name that lack the maker's name. They were probably copied
-// with another maker's medium.
+// Reports translations of the tool's name that lack the maker's name. They are probably left over
+// from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor) {
   const std::string maker = firstWord(vendor);
@@ -105,12 +105,13 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
   if (!files.exists(*relative, {place, "the wireless set-up tool", kEffect})) return;
   const auto bundle = Bundle::open(files.fullPath(*relative));
   if (!bundle) {
-    files.report().findings.push_back({.id = "tool-no-bundle",
-                                       .place = place,
-                                       .found = "a file at " + quoted(*relative),
-                                       .expected = "an application bundle, which is a folder",
-                                       .effect = kEffect,
-                                       .remedy = "name the folder that ends in \".app\""});
+    files.report().findings.push_back(
+        {.id = "tool-no-bundle",
+         .place = place,
+         .found = "a file at " + quoted(*relative),
+         .expected = "an application bundle, which is a folder",
+         .effect = kEffect,
+         .remedy = "write the path of the folder that ends in \".app\""});
     return;
   }
   const std::string list = *relative + "/Contents/Info.plist";
@@ -125,10 +126,10 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
   }
   files.report().findings.push_back({.id = "tool-unnamed",
                                      .place = {.file = list},
-                                     .found = "no \"CFBundleDisplayName\"",
+                                     .found = "no name under \"CFBundleDisplayName\"",
                                      .expected = "the tool's name, a string",
                                      .effect = "an entry without a name in the device list's menu",
-                                     .remedy = "add it"});
+                                     .remedy = "write the name"});
 }
 
 void checkApplication(const MediumFiles& files, const Lists& lists) {
@@ -151,10 +152,10 @@ void checkApplication(const MediumFiles& files, const Lists& lists) {
   files.report().findings.push_back(
       {.id = "key-missing",
        .place = {.file = countries},
-       .found = "no \"Country\"",
-       .expected = "a dictionary by country code",
+       .found = "no dictionary under \"Country\"",
+       .expected = "a dictionary whose keys are country codes",
        .effect = "the package is told that the online service is not available",
-       .remedy = "add it"});
+       .remedy = "write the dictionary"});
 }
 
 }  // namespace onramp::check

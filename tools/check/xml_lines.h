@@ -8,12 +8,13 @@
 
 namespace onramp::check {
 
-/// The line numbers of keys and of mistakes in an XML property list. They come from another parser
-/// than the wizard's, which keeps no line numbers. They never decide whether the wizard can read
-/// the list.
+/// The line numbers of keys and of mistakes in an XML property list. The wizard's parser keeps no
+/// line numbers, so a second parser finds them. It never decides whether the wizard can read the
+/// list.
 struct XMLLines {
-  std::map<std::vector<std::string>, std::size_t> keys;  ///< the line of every path of keys
-  std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;  ///< repeated paths
+  /// The line on which each path of keys occurs first. Keys inside arrays are left out.
+  std::map<std::vector<std::string>, std::size_t> keys;
+  std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;  ///< paths that occur again
   std::string problem;          ///< the first mistake; empty when there is none
   std::size_t problemLine = 0;  ///< from 1
 };

@@ -84,7 +84,8 @@ void Session::changed(Device& device) {
   }
 }
 
-// Asks a device again when its announcement has changed, as the wizard does.
+// Asks a device unless it has been asked with the same record. The wizard, too, asks a device again
+// when its record has changed.
 void Session::ask(Device& device) {
   Dictionary& asked = asked_[&device];
   if (asked == device.record) return;

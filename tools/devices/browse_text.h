@@ -19,8 +19,8 @@ struct TextStyle {
 /// Returns the header line of the table of devices.
 [[nodiscard]] std::string tableHead(const TextStyle& style);
 
-/// Returns a device's row. The verdict follows on the next lines if the wizard does not list the
-/// device.
+/// Returns a device's row. Below it are the verdict if the wizard does not list the device, the
+/// notes and, in the verbose style, the details.
 [[nodiscard]] std::string rowOf(const JudgedDevice& device, const TextStyle& style);
 
 /// Returns the row of a device that is no longer announced.
@@ -29,7 +29,8 @@ struct TextStyle {
 /// Returns the summary that ends the output: delays, network problems and the number of devices.
 [[nodiscard]] std::string summaryOf(const BrowseResult& result, const TextStyle& style);
 
-/// Returns a request and its reply, as trees and in hexadecimal.
+/// Returns a request and its reply, as trees and in hexadecimal, indented by `indent` spaces.
+/// Leaves out a packet without bytes.
 [[nodiscard]] std::string packetsOf(const Exchange& exchange, std::size_t indent);
 
 /// Returns an exchange in one line, such as "127.0.1.5: 2 after 0.4 ms".

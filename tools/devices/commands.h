@@ -7,7 +7,8 @@
 
 namespace onramp::devices {
 
-/// The exit status of a command that was called incorrectly or could not do its work.
+/// The exit status when the command line is wrong, the medium lacks what a search needs, `ask` gets
+/// no usable answer, or the output cannot be written.
 inline constexpr int kTrouble = 2;
 
 struct BrowseOptions {

@@ -15,12 +15,12 @@ namespace onramp::devices {
 struct Device {
   std::string name;
   std::string domain;
-  std::string type;                ///< the type whose announcement the other fields come from
+  std::string type;                ///< the type whose announcement is resolved
   std::vector<std::string> types;  ///< all types under which the device is announced
   double found = 0;
   std::optional<double> resolved;
   std::optional<double> gone;
-  Dictionary record;                ///< a KSDevice record, once resolved
+  Dictionary record;                ///< a KSDevice record; empty until the first resolve
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
   std::set<std::string> sightings;  ///< interfaces and protocols, such as "eth0 IPv4"

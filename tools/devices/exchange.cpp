@@ -128,7 +128,7 @@ void Questioning::await(Sent& sent, Exchange& exchange) {
 
 void Questioning::collectLateReplies() {
   for (Sent& sent : sent_) {
-    if (sent.exchange >= exchanges_.size()) continue;  // await() still waits for it
+    if (sent.exchange >= exchanges_.size()) continue;  // await() still waits for this reply
     Exchange& exchange = exchanges_[sent.exchange];
     if (exchange.outcome != Outcome::kNone || !sent.socket.waitReadable({})) continue;
     snmp_packet reply{};
@@ -140,7 +140,8 @@ void Questioning::collectLateReplies() {
   }
 }
 
-// Interprets the reply as the wizard does, and sets the exchange's outcome.
+// Interprets the reply as the wizard does, and sets the exchange's outcome. Returns nothing unless
+// the outcome is kValue.
 std::optional<Dictionary> Questioning::read(snmp_table_request& request, std::uint64_t id,
                                             Exchange& exchange) {
   const auto before = table_.names();
@@ -184,7 +185,7 @@ std::optional<Dictionary> Questioning::once(const char* address, bool& noReply) 
   return result;
 }
 
-// The outcomes in the order of how much they explain.
+// All outcomes but kValue. Those that explain most come first.
 constexpr std::array kTellingOrder{
     Outcome::kError, Outcome::kOtherType, Outcome::kUnreadable, Outcome::kOtherRequest,
     Outcome::kLate,  Outcome::kRefused,   Outcome::kNone,       Outcome::kUnsent};
@@ -192,7 +193,7 @@ constexpr std::array kTellingOrder{
 }  // namespace
 
 const Exchange* Answer::telling() const {
-  // The last address that gives a value decides.
+  // If an address decides with a value, the asking ends there, so that value is the last.
   const auto last = std::find_if(exchanges.rbegin(), exchanges.rend(),
                                  [](const Exchange& e) { return e.outcome == Outcome::kValue; });
   if (last != exchanges.rend()) return &*last;

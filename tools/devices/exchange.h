@@ -21,7 +21,7 @@ struct Exchange {
     kRefused,       ///< the host reported that no program uses the port
     kLate,          ///< a reply that came after the wizard would have stopped waiting
     kNone,          ///< no reply
-    kUnsent,        ///< no valid address, no socket or no route
+    kUnsent,        ///< nothing was sent: no valid address, socket or route
   };
 
   std::string address{};
@@ -32,7 +32,8 @@ struct Exchange {
   std::uint64_t errorStatus = 0;        ///< of kError (RFC 1157 section 4.1.1)
   std::optional<std::int64_t> value{};  ///< of kValue
   unsigned type = 0;                    ///< of kOtherType: the value's tag
-  bool changedQuestion = false;         ///< the reply's name replaced the one in the table
+  /// The reply named another object, which replaced the one to ask later devices for.
+  bool changedQuestion = false;
 };
 
 /// The result of asking one device.
@@ -47,7 +48,8 @@ struct Answer {
 };
 
 /// Asks the device at `addresses` (strings) exactly as the wizard does, repetitions included. The
-/// answer holds all exchanges. Blocks for up to 12 seconds per address, or until `stopped` is set.
+/// answer holds all exchanges. Blocks for about 12 seconds per silent address, or until `stopped`
+/// is set.
 /// Does not change the wizard's own table of objects. Callable from any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 

@@ -19,10 +19,11 @@ namespace onramp::devices {
 /// only.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Called with a device each time something about it changes.
+  /// Called with a device when it is found under a type, is resolved, or has left a type.
   using Changed = std::function<void(Device& device)>;
 
-  /// If a device has several types, its announcement under the type `preferred` is used.
+  /// For a device that is announced under several types, the announcement under `preferred` is
+  /// resolved, or else the first one that was found.
   Finder(std::string preferred, Changed changed);
   Finder(const Finder&) = delete;
   Finder& operator=(const Finder&) = delete;
@@ -33,7 +34,7 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   void start(const std::vector<std::string>& types, bool all);
   void stop();
 
-  /// Returns all devices seen so far, in the order of their names.
+  /// Returns all devices seen so far, in the order of their names. The finder owns them.
   [[nodiscard]] std::vector<Device*> devices();
 
   /// Returns the seconds since start().

@@ -19,7 +19,7 @@ const std::string kBrowseExamples = R"(
   onramp-devices browse --medium build/medium
       shows every announced device, and why the wizard lists it or not
   onramp-devices browse --medium /media/setup --model "Kestrel Model 100" -v
-      does so for a user who chose that model, and shows all that is known)";
+      explains the list of a user who chose that model, and shows all that is known)";
 const std::string kAskExamples = R"(
   onramp-devices ask 192.0.2.17
       shows what the device answers about its interface, byte for byte)";

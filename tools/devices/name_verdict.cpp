@@ -16,8 +16,8 @@ namespace onramp::devices {
 
 namespace {
 
-// Keys under which some devices announce the maker or the model, although the wizard does not read
-// it there.
+// Keys under which devices announce the maker or the model. For each service type, the wizard reads
+// only one key of each list.
 constexpr std::array<std::string_view, 9> kMakerKeys{
     "usb_MFG", "mfg", "usb_MANUFACTURER", "manufacturer", "mfr", "vendor", "make", "ty", "product"};
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
@@ -81,7 +81,7 @@ Verdict differs(const char* id, const std::string& how, const std::string& annou
 
 std::string edgeBlanks(const std::string& announced) {
   return announced.find("  ") != std::string::npos ? "has two spaces in a row, unlike"
-                                                   : "differs only in spaces at an end from";
+                                                   : "differs only in spaces from";
 }
 
 std::string nearestOf(const std::string& announced, const Medium& medium) {
@@ -107,10 +107,10 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
   const std::string model = device.record.string(KSDevice::kUSBModel).value_or("");
   const auto keys = identityKeysOf(device.type);
   if (!keys) {
-    return Verdict{
-        .id = "other-type",
-        .why = "announced only as " + device.type + ", a type that names no maker and model",
-        .remedy = "switch on the device's " + medium.type + " service"};
+    return Verdict{.id = "other-type",
+                   .why = "announced as " + device.type +
+                          ", a type under which the wizard reads no maker and model",
+                   .remedy = "switch on the device's " + medium.type + " service"};
   }
   if (model.empty()) return missingKey(device, keys->model, kModelKeys);
   if (maker.empty()) return missingKey(device, keys->manufacturer, kMakerKeys);

@@ -18,7 +18,7 @@ namespace {
 constexpr IPv4Address kMulticastDNSGroup{0xE00000FB};
 constexpr std::uint16_t kMulticastDNSPort = 5353;
 
-// A question for all service types (RFC 6763 section 9): a header, then one question:
+// A query for all service types (RFC 6763 section 9). After the header comes one question: name
 // "_services._dns-sd._udp.local", type PTR, class IN.
 constexpr std::array<std::uint8_t, 46> kQuestion{
     0,   0,   0,   0,   0,   1,   0,   0,   0,   0,   0,   0,   9,   '_', 's', 'e',

@@ -7,7 +7,7 @@
 namespace onramp::devices {
 
 /// Returns why no device was found: no discovery daemon, no network, multicast blocked, or nothing
-/// announced in the `seconds` of the search. If devices were found, reports only a missing daemon.
+/// announced in the `seconds` of the search. If devices were found, returns only a missing daemon.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
 /// Returns whether an IPv4 address is in a subnet of this computer. Uses the wizard's own code.

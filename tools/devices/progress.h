@@ -4,7 +4,7 @@
 
 namespace onramp::devices {
 
-/// A progress line on the terminal, below the output.
+/// A progress line on the terminal, below the output that has been printed.
 class Progress {
  public:
   Progress() = default;
@@ -12,10 +12,10 @@ class Progress {
   Progress& operator=(const Progress&) = delete;
   ~Progress() { clear(); }
 
-  /// Returns whether standard error is a terminal, where the line is shown.
+  /// Returns whether standard error is a terminal. The line is shown only then.
   [[nodiscard]] static bool isShown();
 
-  /// Replaces the line's text. Does nothing without a terminal.
+  /// Replaces the line's text. Does nothing when isShown() is false.
   void show(const std::string& text);
 
   /// Removes the line.

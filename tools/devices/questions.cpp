@@ -20,7 +20,7 @@ void Questions::ask(const Array& addresses, Answered answered) {
       answered(answer);
     });
   };
-  // If the system gives no further thread, asks the device on this one. That blocks the caller.
+  // If the system cannot start another thread, the caller's thread asks the device and is blocked.
   if (!queue_.addOperation(operation)) operation();
 }
 

@@ -114,12 +114,11 @@ Verdict judge(const Device& device, const Medium& medium,
   }
   if (auto verdict = judgeName(device, medium)) return *verdict;
   if (device.type != medium.type) {
-    return {
-        .id = "other-type",
-        .why = "announced as " + joined(device.types) + "; the medium looks for " + medium.type,
-        .remedy =
-            "switch on the device's " + medium.type +
-            " service, or name the type that the device announces in the medium's BonjourNetwork"};
+    return {.id = "other-type",
+            .why = "announced as " + joined(device.types) + "; the medium looks for " + medium.type,
+            .remedy = "switch on the device's " + medium.type +
+                      " service, or write the type that the device announces into the medium's "
+                      "BonjourNetwork"};
   }
   if (!isOneOf(medium.wanted, device.record)) {
     return {.id = "other-model",

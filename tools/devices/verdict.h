@@ -8,8 +8,8 @@
 
 namespace onramp::devices {
 
-/// Why a device is or is not in the wizard's list. It names the first condition that the device
-/// fails.
+/// Why a device is or is not in the wizard's list. If it is not, the verdict names the first
+/// condition that the device fails. Notes and problems of the network have the same form.
 struct Verdict {
   std::string id;  ///< stable, for programs, such as "on-cable"
   bool isListed = false;

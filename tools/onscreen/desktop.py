@@ -25,7 +25,7 @@ def _free_display():
 
 
 class Desktop:
-    """A context manager that starts the desktop and, at its end, ends everything that it started.
+    """A context manager that starts the desktop, and ends its programs when it is left.
 
     Files and addresses that programs open with xdg-open are recorded instead of opened. A process
     can use only one desktop, because the accessibility library keeps the first desktop's bus.

@@ -28,18 +28,24 @@ def _fitness(offered, wanted):
     return 1 if "_" in offered else 2
 
 
-def language(medium, locales):
-    """Returns the medium's language that users read whose locales are `locales`, the first first.
-
-    Returns "en" if the medium has no texts.
-    """
+def languages(medium):
+    """Returns the names of the languages that the medium has texts in."""
     folders = (pathlib.Path(medium) / _RESOURCES).glob("*.lproj")
-    languages = sorted(folder.stem for folder in folders)
+    return sorted(folder.stem for folder in folders)
+
+
+def language(medium, locales):
+    """Returns the language in which a user reads the medium's texts.
+
+    `locales` are the user's, the preferred one first. If the medium has texts for none of them,
+    returns its first language, or "en" if it has no texts at all.
+    """
+    offered = languages(medium)
     for wanted in locales:
-        best = max(languages, key=lambda offered: _fitness(offered, wanted), default="")
+        best = max(offered, key=lambda name: _fitness(name, wanted), default="")
         if best and _fitness(best, wanted):
             return best
-    return languages[0] if languages else "en"
+    return offered[0] if offered else "en"
 
 
 def read(medium, language):

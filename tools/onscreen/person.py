@@ -33,7 +33,7 @@ def _words(role, name):
 
 
 class Person:
-    """A context manager that starts a program on a desktop, and ends it at the end.
+    """A context manager that starts a program on a desktop, and ends the program when it is left.
 
     Its methods use the program as a person does.
     """
@@ -67,11 +67,11 @@ class Person:
                         _words(role, name))
 
     def sees(self, role, name=None):
-        """Returns whether such a control is on the screen now."""
+        """Returns whether a control of that role and name is on the screen now."""
         return self._look(role, name) is not None
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
-        """Waits until no such control is on the screen."""
+        """Waits until no control of that role and name is on the screen."""
         wait_for(lambda: self._certainly_gone(role, name), seconds,
                  f"{_words(role, name)} to disappear")
 
@@ -125,9 +125,9 @@ class Person:
         wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
 
     def open_menu(self, button=None):
-        """Opens the menu of that button, or of the button with the focus.
+        """Opens the menu of the button named `button`; without a name, of the one with the focus.
 
-        The accessibility bus does not show the menu, so it must be used with the keyboard.
+        The accessibility bus does not show the menu, so only the keyboard can use it.
         """
         windows = self._window_count()
         if button:
@@ -138,7 +138,7 @@ class Person:
                  f"the menu of {repr(button) if button else 'the focused button'} to open")
 
     def choose_from_menu(self, button, item):
-        """Opens a button's menu and chooses its `item`th entry."""
+        """Opens a button's menu and chooses the menu's `item`th entry."""
         self.open_menu(button)
         self.choose_from_open_menu(item)
 
@@ -187,7 +187,7 @@ class Person:
         """Returns the seconds that the program takes to answer a small request.
 
         Leaves out the time that the program and this process wait for a processor. Returns None
-        when the program has ended and does not answer.
+        when the program has ended.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -222,7 +222,7 @@ class Person:
         return None
 
     def _certainly_gone(self, role, name):
-        """Returns whether such a control is surely gone.
+        """Returns whether it is certain that no control of that role and name is on the screen.
 
         A busy program does not answer, which does not mean that the control is gone.
         """
@@ -242,7 +242,7 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` with `control` and everything visible below it, until it returns False.
+        """Calls `visit` with `control` and everything visible below it, until `visit` returns False.
 
         Goes depth first and skips objects that vanish. Enters tables only if `tables` is set.
         """

@@ -10,7 +10,7 @@ _libc = ctypes.CDLL(None, use_errno=True)
 
 
 class Missing(Exception):
-    """A program is not installed. The text says which one and how to get it."""
+    """A program is not installed or does not start. The text says which one."""
 
 
 def _die_with_parent():

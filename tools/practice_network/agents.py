@@ -59,7 +59,10 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """Forwards requests to a broadcast address to all agents, which listen only at their own."""
+        """Forwards each request that is sent to the broadcast address `address` to all agents.
+
+        The agents themselves listen only at their own addresses.
+        """
         listener = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
         listener.bind((address, PORT))
 
@@ -79,7 +82,7 @@ class Agents:
 
 
 def _relay(address, request, sender, seconds=5):
-    """Asks the agent at `address` and sends its answer on, from the same address."""
+    """Asks the agent at `address`, and sends its answer to `sender` from that address."""
     with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as own:
         own.settimeout(seconds)
         try:

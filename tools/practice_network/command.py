@@ -52,7 +52,7 @@ and one table for each device:
     note = "2nd floor"             the device's location
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
     domain = "annex.local"         default "local"; other domains must end in ".local"
-    port = 631                     default: the type's usual port
+    port = 631                     default: the type's usual port, or 9100
     addresses = ["127.0.1.9"]      or how many addresses the network chooses; default 1
     activeif = 2                   the number that the device answers; default 2, for wireless.
                                    "silent": receives the request and never answers. "closed": has
@@ -73,8 +73,8 @@ is an entry as in the file:
     practice-network ctl plug INTERFACE               brings the interface back
     practice-network ctl stop-daemon | start-daemon | restart-daemon      controls Avahi
     practice-network ctl settle                       waits until all devices are published
-Python tests do the same with PracticeNetwork from tools/practice_network. Both find the network
-through the environment variable ONRAMP_PRACTICE_SOCKET.
+PracticeNetwork in tools/practice_network offers these commands to Python tests. ctl and
+PracticeNetwork find the network through the environment variable ONRAMP_PRACTICE_SOCKET.
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
 do by default. Abstract sockets and TCP connections do not cross into the namespace. XDG_RUNTIME_DIR

@@ -19,8 +19,8 @@ class PracticeNetwork:
 
     A device is identified by its name. Entries are those of the description file: `maker`, `model`,
     `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation
-    returns when the network has carried it out. Avahi then takes another second to publish a
-    change; settle() waits for that. A refused operation raises ControlError and changes nothing.
+    returns when the network has carried it out. Avahi then takes another second to publish a new
+    device; settle() waits for that. A refused operation raises ControlError.
     """
 
     def __init__(self, path=None):
@@ -30,7 +30,7 @@ class PracticeNetwork:
                                "start one with: practice-network DESCRIPTION")
 
     def add(self, name, **entries):
-        """Switches on a known device, or adds a new one made from `entries`."""
+        """Switches on a known device, changed by `entries`, or adds a new one made from them."""
         self._ask("add", name, entries)
 
     def remove(self, name):

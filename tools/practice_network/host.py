@@ -52,7 +52,7 @@ publish-workstation=no
 
 
 class HostError(Exception):
-    """A part of the host did not start. The text says which part and why."""
+    """A command failed, or a part of the host did not start. The text says which one and why."""
 
 
 def run(*command):

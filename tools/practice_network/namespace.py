@@ -26,7 +26,7 @@ NETWORK_FAILED = 125
 
 
 def why_not_enclosed():
-    """Returns None if this process can create such namespaces, else the reason why not."""
+    """Returns None if this process can create these namespaces, else the reason why not."""
     probe = subprocess.run([*ENCLOSE, "mount", "-t", "tmpfs", "none", "/run"],
                            capture_output=True, text=True)
     if probe.returncode:
@@ -132,7 +132,7 @@ def _own_run(user):
         copy.write_bytes(cookies)
         os.chown(copy, *user)
         variables["XAUTHORITY"] = str(copy)
-    # The sockets that these two name were in /run.
+    # These variables name sockets that were in the old /run.
     gone = ("DBUS_SESSION_BUS_ADDRESS", "WAYLAND_DISPLAY")
     return {key: value for key, value in os.environ.items() if key not in gone} | variables
 

@@ -128,7 +128,7 @@ class Network:
                 self._publish(after)
 
     def list(self):
-        """Returns a dictionary per device: its entries and Avahi's word for its state, "state"."""
+        """Returns a dictionary per device: its entries and its "state", such as "established"."""
         return [{key: value for key, value in dataclasses.asdict(device).items()
                  if value is not None}
                 | {"txt": dict(device.txt), "state": self._state(device)}

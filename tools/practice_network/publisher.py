@@ -96,9 +96,10 @@ class Publisher:
             entry.addresses.Free()
 
     def await_probed(self, device, seconds=5):
-        """Waits until Avahi has probed for the device's name. Its records must not change before.
+        """Waits until Avahi has probed for the device's name, or `seconds` have passed.
 
-        On loopback Avahi hears its own probes, and mistakes one with an older text for a rival's.
+        The device's records must not change during the probes. On loopback Avahi hears its own
+        probes, and mistakes one with an older text for a rival's.
         """
         deadline = time.monotonic() + seconds
         while self.state(device) == "probing" and time.monotonic() < deadline:

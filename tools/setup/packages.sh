@@ -1,4 +1,4 @@
-# Sourced by the scripts at the root. Installs the packages of a list that this machine lacks.
+# Sourced by the scripts at the root. Installs those packages of a list that the machine lacks.
 
 install_packages() {
   local list=$1 missing

@@ -16,15 +16,19 @@ class Unsuitable(Exception):
 
 
 class Medium:
-    """A medium's folder with the application on it."""
+    """A medium's folder with the application on it, and its texts in one language.
 
-    def __init__(self, folder):
+    The language is `language`, or the one in which the user reads the medium.
+    """
+
+    def __init__(self, folder, language=None):
         self.folder = pathlib.Path(folder)
         application = self._application()
         self.program = application / _PROGRAM
         about = _read(application / "Contents/Info.plist")
         self._resources = _read(self.folder / about.get("CommonResourcePath", _RESOURCES))
-        self.language = messages.language(self.folder, self._locales())
+        self.locale = language or self._locales()[0]
+        self.language = messages.language(self.folder, [language] if language else self._locales())
         self.text = messages.read(self.folder, self.language)
         # The name of the menu's button comes from the application, not from the medium.
         self.gear = messages.read_table(

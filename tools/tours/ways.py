@@ -1,6 +1,7 @@
 """Routes through the wizard, with a picture of each page."""
 
 import contextlib
+import subprocess
 
 from onscreen.processes import wait_for
 
@@ -53,7 +54,7 @@ class Tour:
         with self._start() as person:
             if self._first_page(person) != _ALERT:
                 return False
-            person.picture(self._pictures / "alert.png")
+            self._picture(person, "alert")
             print("The medium does not support this system version, so the wizard shows only the "
                   "alert.")
             return True
@@ -68,7 +69,7 @@ class Tour:
             return
         with self._start("--system-version", version) as person:
             person.see("push button", self._text.get("BTN_CLOSE", "Close"))
-            person.picture(self._pictures / "alert.png")
+            self._picture(person, "alert")
             person.press("Return")
             _expect(person.wait_for_end() == 0 and not self._files(),
                     "after the alert, the wizard did not end cleanly, or it wrote files")
@@ -81,7 +82,7 @@ class Tour:
             cable = next(name for role, name, _ in person.everything()
                          if role == "radio button" and name != self._text["INST_TXT_WIFI"])
             person.click("radio button", cable)
-            person.picture(self._pictures / "usb-3-cable.png")
+            self._picture(person, "usb-3-cable")
             person.click("push button", self._text["BTN_NEXT"])
             self._see_package_open(person, 2 if chosen else 1)
 
@@ -96,28 +97,28 @@ class Tour:
         with self._start() as person:
             self._to_connection_page(person, model, "wireless")
             person.press("Return")
-            self._wait_for_search(person, "wireless-3-search.png")
+            self._wait_for_search(person, "wireless-3-search")
             person.see("table cell", model)
-            person.picture(self._pictures / "wireless-4-devices.png")
+            self._picture(person, "wireless-4-devices")
 
             self._let_devices(self._network.remove)
             person.open_menu(self._medium.gear)
-            person.picture(self._pictures / "wireless-5-gear.png")
+            self._picture(person, "wireless-5-gear")
             person.press("Escape")
             person.choose_from_menu(self._medium.gear, GEAR_REFRESH)
-            self._wait_for_search(person, "wireless-6-search.png")
+            self._wait_for_search(person, "wireless-6-search")
             person.see("label", self._text.get("INST_TXT_ALERT_DEVICENOTFOUND", "Device not found"))
-            person.picture(self._pictures / "wireless-7-not-found.png")
+            self._picture(person, "wireless-7-not-found")
             person.press("Return")
             person.see_gone("alert")
-            person.picture(self._pictures / "wireless-8-nothing.png")
+            self._picture(person, "wireless-8-nothing")
 
             self._let_devices(self._network.add)
             self._network.settle()
             person.choose_from_menu(self._medium.gear, GEAR_REFRESH)
             self._wait_for_search(person)
             person.click("table cell", _second_of(model))
-            person.picture(self._pictures / "wireless-9-choice.png")
+            self._picture(person, "wireless-9-choice")
             person.click("push button", self._text["BTN_NEXT"])
             self._see_package_open(person, 2)
 
@@ -133,19 +134,27 @@ class Tour:
         for device in self._network.list():
             do(device["name"])
 
+    def _picture(self, person, name):
+        """Saves a picture of the screen, and returns its path."""
+        path = self._pictures / f"{self._medium.language}-{name}.png"
+        person.picture(path)
+        return path
+
     @contextlib.contextmanager
     def _start(self, *arguments):
         self._desktop.forget()
-        with Person(self._desktop, self._medium.program, [*self._options, *arguments]) as person:
+        with Person(self._desktop, self._medium.program, [*self._options, *arguments],
+                    env={"LC_ALL": self._medium.locale, "LANG": self._medium.locale}) as person:
             try:
                 yield person
             except TimeoutError as error:
-                place = self._pictures / "last.png"
-                person.picture(place)
+                place = self._picture(person, "last")
                 raise WentWrong(f"{error}. {place} shows the screen at that time.") from error
+            except subprocess.CalledProcessError as error:
+                raise WentWrong(f"the wizard's window is not there any more: {error}") from error
 
     def _first_page(self, person):
-        """Waits for the wizard's first page, or for the alert. Returns which of them it shows."""
+        """Waits for the wizard's first page or alert. Returns the key of the text that it is known by."""
         def shown():
             _expect(person.is_running(), f"no page appeared: the wizard ended with status "
                     f"{person.process.returncode}, and {self._what_was_opened()}")
@@ -169,16 +178,16 @@ class Tour:
         on_list = self._first_page(person) == "INST_TXT_MODEL"
         if on_list:
             choose_model(person, model)
-            person.picture(self._pictures / f"{way}-1-models.png")
+            self._picture(person, f"{way}-1-models")
             person.press("Return")
             person.see("label", title)
-        person.picture(self._pictures / f"{way}-2-connection.png")
+        self._picture(person, f"{way}-2-connection")
         return on_list
 
     def _wait_for_search(self, person, picture=None):
         person.see("label", self._text["INST_WAIT"])
         if picture:
-            person.picture(self._pictures / picture)
+            self._picture(person, picture)
         person.see_gone("label", self._text["INST_WAIT"], _LONGEST_SEARCH)
 
     def _see_package_open(self, person, files):

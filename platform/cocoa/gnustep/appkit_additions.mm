@@ -77,7 +77,8 @@ id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows every program.
+// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows the programs of the
+// desktop.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];

@@ -38,7 +38,8 @@ void setLastTime(id self, SEL selector, unsigned long time) {
   }
 }
 
-// This runs after the application object was created, because GNUstep loads its X11 backend then.
+// Runs after the application object has been created, because GNUstep loads its X11 backend when it
+// creates that object.
 + (void)replace:(NSNotification*)notification {
   Class const server = NSClassFromString(@"XGServer");
   if (!server) return;

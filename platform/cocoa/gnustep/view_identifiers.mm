@@ -57,7 +57,7 @@ void dealloc(id self, SEL selector) {
   }
 }
 
-// The setters for accessibility do nothing, because GNUstep does not support it.
+// The setters for accessibility do nothing, because GNUstep does not support accessibility.
 
 - (void)setAccessibilityLabel:(NSString*)label {
 }

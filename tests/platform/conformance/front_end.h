@@ -9,7 +9,7 @@ namespace onramp::conformance {
 /// The application's window.
 [[nodiscard]] const Window& window();
 
-/// Clicks the button titled `title` in an alert or a sheet, as a user would, once such a button is
+/// Clicks the button titled `title` in an alert or a sheet, as a user would, once that button is
 /// visible. Returns at once. Each front end has its own definition.
 void clickSoon(const std::string& title);
 

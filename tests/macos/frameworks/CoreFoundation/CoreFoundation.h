@@ -1,5 +1,5 @@
 // Stands in for the part of Core Foundation that the macOS backends call, so that they compile and
-// run where the framework is missing. Its tests show how the backends use objects, not how
+// run where the framework is missing. The tests show how the backends use objects, not how
 // macOS behaves. The sanitizers report an object that is released too often or never. The functions
 // are lambdas, which take only one line each.
 #pragma once
