@@ -3,11 +3,22 @@
 #include <QApplication>
 #include <QFontMetrics>
 #include <QSize>
+#include <QTextDocument>
 #include <utility>
 
 #include "base/array_controller.h"
 
 namespace onramp::qt {
+
+namespace {
+
+// Returns the tool tip that shows `text` in full when its column is too narrow. Qt would show a
+// device's name that looks like markup as rich text, which can load pictures.
+QString toolTip(const QString& text) {
+  return Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text) : text;
+}
+
+}  // namespace
 
 ListModel::ListModel(QStringList columns, QStringList spokenColumns, QObject* parent)
     : QAbstractTableModel(parent),
@@ -49,8 +60,9 @@ int ListModel::columnCount(const QModelIndex& parent) const {
 QVariant ListModel::data(const QModelIndex& index, int role) const {
   switch (role) {
     case Qt::DisplayRole:
-    case Qt::ToolTipRole:  // shows a text in full when its column is too narrow
       return text(index.row(), columns_.at(index.column()));
+    case Qt::ToolTipRole:
+      return toolTip(text(index.row(), columns_.at(index.column())));
     case Qt::AccessibleTextRole:
       return index.column() == 0 ? spokenName(index.row()) : QVariant();
     case Qt::SizeHintRole:  // a single column is as wide as its view and elides longer texts

@@ -8,6 +8,7 @@
 #include <QMenu>
 #include <QProgressBar>
 #include <QScreen>
+#include <QTextDocumentFragment>
 #include <QToolButton>
 #include <QTreeView>
 #include <cstdlib>
@@ -137,7 +138,8 @@ class Layout : public testing::TestWithParam<int> {
 
   static void listDevices(ChooseDeviceView& page) {
     const std::string names[] = {"Kestrel Photo Printer beside the Window on the Second Floor 001",
-                                 "会議室の複合機二階の窓際にある大型", "Büro 🖨️ links"};
+                                 "会議室の複合機二階の窓際にある大型",
+                                 "<b>Büro</b> 🖨️ links"};
     for (int i = 40; i > 0; --i) {
       page.setServiceToList(
           Dictionary{{KSDevice::kDisplayName, names[i % 3] + std::to_string(i)},
@@ -174,6 +176,11 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   devices->progressON(true);
   expectEverythingFits();
   expectMenuFits(*window->findChild<QToolButton*>()->menu());
+
+  const QModelIndex first = window->findChild<QTreeView*>("deviceListView")->model()->index(0, 0);
+  const QString tip = first.data(Qt::ToolTipRole).toString();
+  EXPECT_EQ(QTextDocumentFragment::fromHtml(tip).toPlainText(), first.data().toString())
+      << "the tool tip reads markup in a device's name";
 }
 
 INSTANTIATE_TEST_SUITE_P(Points, Layout, testing::Values(10, 18));
