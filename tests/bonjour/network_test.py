@@ -231,7 +231,7 @@ class NetworkTest(unittest.TestCase):
             self.add("Merlin")
             search.wait_for("update", "Merlin")
             self.assertEqual(search.events("update", "Ghost"), [])
-            # The daemon gives up after five seconds, and is asked again.
+            # The daemon stops resolving after five seconds. The program must ask it again.
             time.sleep(6)
             self.add("Ghost")
             search.wait_for("update", "Ghost")
