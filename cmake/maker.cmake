@@ -33,25 +33,29 @@ if(NOT onramp_kind STREQUAL "OBJECT")
     "${PROJECT_SOURCE_DIR}/maker.json shows the form.")
 endif()
 
-# The values become C++ string literals and XML texts, so no form allows quotation marks, backslashes
-# or angle brackets.
-set(plain "^[^\"\\<>]+$")
+# The values become C++ string literals and XML texts, so no form allows quotation marks, backslashes,
+# angle brackets or line breaks.
+set(plain "^[^\"\\<>\n\r]+$")
 onramp_maker_setting(ONRAMP_MAKER_NAME name "${plain}" "\"Kestrel Imaging\"")
 onramp_maker_setting(ONRAMP_BUNDLE_NAME bundleName "${plain}" "\"Onramp OSX\"")
 onramp_maker_setting(ONRAMP_BUNDLE_IDENTIFIER bundleIdentifier "^[A-Za-z0-9-]+(\\.[A-Za-z0-9-]+)+$"
   "\"com.kestrelimaging.onramp\"")
-onramp_maker_setting(ONRAMP_SUPPORT_SITE supportSite "^https?://[A-Za-z0-9.:-]+(/[A-Za-z0-9._~/-]*[^/])?$"
+onramp_maker_setting(ONRAMP_SUPPORT_SITE supportSite "^https?://[A-Za-z0-9.:-]+(/[A-Za-z0-9._~/-]*[A-Za-z0-9._~-])?$"
   "\"http://support.kestrel.example\", without a closing slash")
 onramp_maker_setting(ONRAMP_SNMP_COMMUNITY snmpCommunity "^[A-Za-z0-9._-]+$" "\"corridor\"")
-onramp_maker_setting(ONRAMP_ACTIVE_IF_OBJECT activeIFObject "^[012](\\.[0-9][0-9]?[0-9]?[0-9]?[0-9]?)+$"
+onramp_maker_setting(ONRAMP_ACTIVE_IF_OBJECT activeIFObject "^[012](\\.(0|[1-9][0-9]?[0-9]?[0-9]?[0-9]?))+$"
   "\"1.3.6.1.4.1.4242.2.4.4.1240.1.2.0\", with numbers up to 65535")
-onramp_maker_setting(ONRAMP_ACTIVE_IF_WIRELESS activeIFWireless "^-?[0-9][0-9]?[0-9]?[0-9]?$" "2, a number of up to 4 digits")
+onramp_maker_setting(ONRAMP_ACTIVE_IF_WIRELESS activeIFWireless "^-?(0|[1-9][0-9]?[0-9]?[0-9]?)$" "2, a number of up to 4 digits")
 string(REPLACE "." ";" numbers ${ONRAMP_ACTIVE_IF_OBJECT})
 foreach(number IN LISTS numbers)
   if(number GREATER 65535)
     message(FATAL_ERROR "${ONRAMP_MAKER}: \"activeIFObject\" has the number ${number}; the greatest is 65535.")
   endif()
 endforeach()
+list(LENGTH numbers length)
+if(length LESS 3 OR length GREATER 64)
+  message(FATAL_ERROR "${ONRAMP_MAKER}: \"activeIFObject\" has ${length} numbers; it may have 3 to 64.")
+endif()
 string(REPLACE "." ", " ONRAMP_ACTIVE_IF_NUMBERS ${ONRAMP_ACTIVE_IF_OBJECT})
 
 onramp_maker_setting(ONRAMP_SERVICE_TYPES serviceTypes "^\\[" "[\"_ipp._tcp\", \"_scanner._tcp\"]")

@@ -33,7 +33,7 @@ void AddNetworkInterfaceListChangeCallbackSCF() {
                                                            kSCCompAnyRegex, kSCEntNetIPv4)) {
     setNotificationKeys(store, {}, {*pattern});
   }
-  // A null source is accepted and adds nothing.
+  // Even a null source is added, which does nothing.
   addSourceToMainLoop(createRunLoopSource(store, 0));
 }
 

@@ -1,6 +1,8 @@
 #include "platform/avahi/resolve.h"
 
 #include <algorithm>
+#include <cerrno>
+#include <cstdint>
 #include <utility>
 
 namespace onramp::avahi {
@@ -38,6 +40,7 @@ std::optional<Server> serverIn(sd_bus_message* message) {
   const void* text = nullptr;
   std::size_t size = 0;
   while (sd_bus_message_read_array(message, 'y', &text, &size) > 0) {
+    if (size > UINT8_MAX) return std::nullopt;
     const auto* const bytes = static_cast<const std::byte*>(text);
     server.txt.insert(server.txt.begin(), bytes, bytes + size);
     server.txt.insert(server.txt.begin(), static_cast<std::byte>(size));
@@ -73,6 +76,8 @@ void Resolve::begin() {
   service_.emplace(
       daemon_, "ServiceResolver",
       [name = name_](sd_bus_message* call) {
+        // The daemon would look for the type itself in place of a service without a name.
+        if (name.name.empty() || name.domain.empty()) return -EINVAL;
         return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
                                      name.name.c_str(), name.type.c_str(), name.domain.c_str(),
                                      kAnyProtocol, kNoAddress);

@@ -46,10 +46,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   }
 
   bool searchForServices(const std::string& domain, const std::string& type) override {
+    forgetSearch();
     domain_ = toCFString(domain);
     type_ = toCFString(type);
-    isFailed_ = false;
-    ++search_;
     return domain_ && type_ && start();
   }
 

@@ -231,6 +231,10 @@ class NetworkTest(unittest.TestCase):
             self.add("Merlin")
             search.wait_for("update", "Merlin")
             self.assertEqual(search.events("update", "Ghost"), [])
+            # The daemon stops resolving after five seconds. The program must ask it again.
+            time.sleep(6)
+            self.add("Ghost")
+            search.wait_for("update", "Ghost")
             self.assertEqual(search.end(), 0)
 
 

@@ -21,6 +21,7 @@ struct Store {
   std::string failing;  ///< "create", "key" or "copy"
   int error = 0;
   DynamicStoreCallback callback;  ///< of the latest session that has one
+  bool hasAddedNull = false;      ///< whether the latest source was null
 
   void change(Dictionary newContents) {
     contents = std::move(newContents);
@@ -72,7 +73,9 @@ DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int) {
   return store ? std::make_shared<DynamicStoreSource>() : nullptr;
 }
 
-void addSourceToMainLoop(const DynamicStoreSourceRef&) {}
+void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
+  script().hasAddedNull = source == nullptr;
+}
 
 int lastDynamicStoreError() {
   return script().error;
@@ -135,7 +138,9 @@ TEST_F(Netconfig, OnlyTheListReportsFailuresAndTheCacheBecomesEmpty) {
   store.change({});
   EXPECT_EQ(local_address_cache_copy(), nullptr);
   EXPECT_EQ(local_address_for_destination("192.168.1.20"), std::nullopt);
+  store.failing = "create";
   AddNetworkInterfaceListChangeCallbackSCF();
+  EXPECT_TRUE(store.hasAddedNull);
 }
 
 TEST_F(Netconfig, DestinationIsReachedFromTheFirstInterfaceInItsSubnet) {

@@ -192,6 +192,10 @@ class Information(unittest.TestCase):
         self.assertTrue((RESOURCES / f"cocoa/{self.information['NSMainNibFile']}.xib").exists())
         target = re.search(r"CMAKE_OSX_DEPLOYMENT_TARGET ([\d.]+)", text_of("CMakeLists.txt"))[1]
         self.assertEqual(target, self.information["LSMinimumSystemVersion"])
+        for key in ("CFBundleAllowMixedLocalizations", "NSHighResolutionCapable",
+                    "NSRequiresAquaSystemAppearance", "UIDesignRequiresCompatibility"):
+            self.assertIs(True, self.information.get(key), key)
+        self.assertEqual("NSApplication", self.information["NSPrincipalClass"])
 
     def test_gives_a_reason_for_every_permission_in_every_language(self):
         asked = {key for key in self.information if key.endswith("UsageDescription")}

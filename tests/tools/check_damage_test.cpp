@@ -96,8 +96,8 @@ class DamagedMedium {
   std::minstd_rand random_;
 };
 
-// Returns the page that the wizard shows, a space, and what the wizard opens before it
-// waits for the user.
+// Returns the name of the page that the wizard shows at the start, followed by " opens " and a name
+// for each thing that the wizard opens at once. Returns " refused" when it shows an alert instead.
 std::string startOfTheWizard() {
   recording::FrontEnd& screen = recording::FrontEnd::instance();
   screen.reset();

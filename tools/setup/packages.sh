@@ -1,4 +1,4 @@
-# Sourced by the scripts at the root. Installs those packages of a list that the machine lacks.
+# Sourced by the scripts at the root. Installs every package in a list, unless this machine has it.
 
 install_packages() {
   local list=$1 missing
