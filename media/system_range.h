@@ -34,8 +34,8 @@ enum class SystemSupport : std::uint32_t {
 [[nodiscard]] bool isBound(const Dictionary& bound);
 
 /// Whether `version` is above `maximum`. The maximum's "Major" and "Minor" are inclusive, but its
-/// "BugFix" is exclusive: it is the first bug-fix release above the maximum. A "BugFix" of "x" or
-/// "X" allows every bug-fix release of that minor version.
+/// "BugFix" is exclusive: it is the first bug-fix release of that minor version that is too new. A
+/// "BugFix" of "x" or "X" allows every bug-fix release of that minor version.
 [[nodiscard]] bool isNewerThan(const Dictionary& maximum, const SystemVersion& version);
 
 /// Whether `version` is below `minimum`.

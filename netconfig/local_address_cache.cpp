@@ -33,7 +33,7 @@ void AddNetworkInterfaceListChangeCallbackSCF() {
                                                            kSCCompAnyRegex, kSCEntNetIPv4)) {
     setNotificationKeys(store, {}, {*pattern});
   }
-  // Even a null source is added, which does nothing.
+  // The source may be null. Adding it then does nothing.
   addSourceToMainLoop(createRunLoopSource(store, 0));
 }
 

@@ -34,8 +34,8 @@ int KSSysConfigCopyCurrentLocalAddressList(local_address_list* out_list);
 [[nodiscard]] const std::string* local_address_list_value(const local_address_list& list,
                                                           std::size_t index, std::string_view key);
 
-/// Return local_address_list_value() for kSCPropNetIPv4Addresses, kSCPropNetIPv4SubnetMasks and
-/// kSCPropNetIPv4BroadcastAddresses, in this order.
+/// The next three functions return local_address_list_value() for kSCPropNetIPv4Addresses,
+/// kSCPropNetIPv4SubnetMasks and kSCPropNetIPv4BroadcastAddresses, respectively.
 [[nodiscard]] const std::string* local_address_at(const local_address_list& list,
                                                   std::size_t index);
 [[nodiscard]] const std::string* local_subnet_mask_at(const local_address_list& list,

@@ -21,8 +21,8 @@ namespace onramp {
 /// Requests that the wireless set-up tool be launched. Carries no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Requests a wait for the device search. Carries the length of a pause in seconds, an int, under
-/// kWaitTime.
+/// Requests a wait for the device search. Under kWaitTime, carries an int: the length in seconds of
+/// each pause of the wait (see app/search_wait.h).
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
@@ -77,7 +77,8 @@ class ChooseDeviceView final : public Page,
   void progressON(bool on);
 
   /// Called by the search. addKSDevice() and updateKSDevice() call setServiceToList() if
-  /// doesMatchedModel() and then doesWiFi(), which may block for seconds, return true.
+  /// doesMatchedModel() and doesWiFi() return true. doesWiFi() comes second, because it may block
+  /// for seconds.
   /// removeKSDevice() calls removeServiceFromList() if doesMatchedModel() returns true.
   void addKSDevice(const Dictionary& device) override;
   void updateKSDevice(const Dictionary& device) override;

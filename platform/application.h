@@ -10,8 +10,8 @@
 namespace onramp {
 
 /// The interface of the controller. Through this interface, the application reports events to the
-/// controller and asks for decisions. An application has one controller, for which the main
-/// interface file is loaded.
+/// controller and asks for decisions. An application has one controller. It is the owner
+/// of the main interface file.
 class ApplicationDelegate : public InterfaceOwner {
  public:
   /// Gives the controller the objects of the main interface file. The application calls

@@ -19,8 +19,8 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the sample below which the fraction `part`, 0 to 1, of the samples lies. There must be
-  /// at least one sample.
+  /// Returns the quantile `part`, from 0 (the least sample) to 1 (the greatest), rounded down to a
+  /// sample. There must be at least one sample.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());

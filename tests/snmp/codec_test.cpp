@@ -91,7 +91,7 @@ TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255Bytes) {
     snmp_oid target{room, room, arcs};
     ByteReader in(bytes);
     EXPECT_EQ(ber_get_oid(in, &target, 2), SNMP_ERR_CODEC);
-    EXPECT_EQ(arcs[room], 9) << "nothing is written past the room";
+    EXPECT_EQ(arcs[room], 9) << "no arc is written beyond the capacity";
   }
 }
 
@@ -174,7 +174,7 @@ TEST(Decoding, LaysStringsEndToEndWithinTheirRoom) {
     EXPECT_EQ(m.octets[3].bytes, m.strings.data() + 7);
     EXPECT_EQ(m.octets[3].capacity, room - 7);
     EXPECT_EQ(m.varbinds[3].index, 3U);
-    const auto last = static_cast<std::uint16_t>(room - 9);  // the last string's own place
+    const auto last = static_cast<std::uint16_t>(room - 9);  // the bytes left after the first nine
     m.reset();
     m.octets[3] = {last, last, m.strings.data() + 9};
     EXPECT_EQ(snmp_decode_message(m.message, reply), SNMP_ERR_CODEC) << room;
@@ -187,7 +187,8 @@ TEST(Decoding, ChecksTheListsLengthAndEveryBindingsRoomAndForm) {
                     list = head + "a2 1A" + pdu + "30";
   // The number of bindings is -1 for a refused message.
   const std::tuple<const char*, std::vector<std::uint8_t>, std::int64_t> cases[] = {
-      {"message and PDU too short", hex("30 00" + head + "a2 01" + pdu + "30 0F" + bindings), 2},
+      {"stated lengths of message and PDU too small",
+       hex("30 00" + head + "a2 01" + pdu + "30 0F" + bindings), 2},
       {"long forms", hex("30 82 FF FF" + head + "a2 81 7F" + pdu + "30 81 00"), 0},
       {"list ends inside a binding", hex("30 21" + list + "0E" + bindings), 2},
       {"list ends after a binding", hex("30 21" + list + "07" + bindings), 1},
@@ -211,7 +212,7 @@ TEST(Decoding, ChecksTheListsLengthAndEveryBindingsRoomAndForm) {
       {"no value", replyWith("30 00 06 01 2B"), -1},
       {"empty unknown type", replyWith("30 00 06 01 2B 82 00" + bindings.substr(0, 20)), 2},
       {"unknown type", replyWith("30 00 06 01 2B 47 01 05" + bindings.substr(0, 20)), -1},
-      {"too many", replyWith(bindings + bindings), -1},
+      {"more bindings than fit", replyWith(bindings + bindings), -1},
   };
   for (const auto& [what, bytes, count] : cases) {
     Message m(2, 4);

@@ -1,5 +1,6 @@
-"""Compares onramp-devices with the wizard's own chooser and net-snmp, on a practice network with one
-device per verdict. Arguments: the program, chooser_probe, a medium with the application on it."""
+"""Compares onramp-devices with net-snmp and with the wizard's own chooser, on a practice network that
+has a device for nearly every verdict. Arguments: the program, chooser_probe, a medium with the
+application on it."""
 
 import json
 import os
@@ -55,7 +56,8 @@ def tlv(tag, *parts):
 
 
 def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
-    """Returns a function that makes a request's reply from these parts. `number` changes its identifier."""
+    """Returns a function that makes a request's reply from these parts. A `number` other than 0
+    makes the reply's request identifier differ from the request's."""
     def answer(request):
         time.sleep(seconds)
         at = request.index(b"corridor") + 12
@@ -171,7 +173,7 @@ class Everybody(unittest.TestCase):
             found = by_name(output).get("listed")
             if found and found["verdict"]["id"] == "listed":
                 return
-        self.fail("the device that is on the list was not found")
+        self.fail('the device "listed" did not get its verdict')
 
     def test_resolves_a_uri(self):
         result = run(PROGRAM, "uri", "dnssd://two%20models._pdl-datastream._tcp.local./?bidi")

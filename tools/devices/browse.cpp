@@ -156,7 +156,7 @@ int Session::run() {
     progress_.print(jsonOf(all));
     return 0;
   }
-  // Shows the devices whose verdict was open until the end of the search.
+  // Shows the devices whose verdict was open until now, and those that have gone.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));

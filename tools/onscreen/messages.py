@@ -16,7 +16,8 @@ class _Texts(dict):
 
 
 def _fitness(offered, wanted):
-    """Returns how well a language fits. 0 means that users of `wanted` do not read it."""
+    """Returns how well the language `offered` suits a user of `wanted`: from 3, the same language, to
+    0, which the user does not read."""
     offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
                        for name in (offered, wanted))
     if offered == wanted:

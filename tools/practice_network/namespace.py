@@ -87,11 +87,12 @@ def inside(options):
         if pid == command.pid:
             return _status(os.waitstatus_to_exitcode(status))
         if pid == devices.pid:
-            return _fail("the process with the devices ended")
+            return _fail("the process that ran the made-up devices has ended")
 
 
 def devices(options):
-    """Runs the devices, in a process on the command's host or on a second host."""
+    """The process of the devices, on the command's host or on a second host: starts the devices and
+    serves requests. Returns an exit status only on failure."""
     try:
         settings, described = description.load(options["description"])
         if options["hosts"] == 2:
@@ -117,7 +118,7 @@ def devices(options):
 
 
 def _own_run(user):
-    """Takes over /run. Returns an environment with what desktop programs need from /run."""
+    """Takes over /run. Returns the command's environment variables, which lead to the new /run."""
     variables = {SOCKET_VARIABLE: str(RUN / "socket"), "DBUS_SYSTEM_BUS_ADDRESS": BUS_ADDRESS,
                  "XDG_RUNTIME_DIR": str(RUN / "user")}
     authority = pathlib.Path(os.environ.get("XAUTHORITY", "/nowhere"))
