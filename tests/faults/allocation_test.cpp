@@ -22,7 +22,8 @@ std::ptrdiff_t liveAllocations = 0;
 
 }  // namespace
 
-void* operator new(std::size_t size) {
+// GCC inlines only some of these functions otherwise, and then calls their pairs mismatched.
+[[gnu::noinline]] void* operator new(std::size_t size) {
   if (allocationsUntilFailure != 0 && --allocationsUntilFailure == 0) throw std::bad_alloc();
   void* const memory = std::malloc(size == 0 ? 1 : size);  // NOLINT(cppcoreguidelines-*)
   if (!memory) throw std::bad_alloc();
@@ -30,7 +31,15 @@ void* operator new(std::size_t size) {
   return memory;
 }
 
-void operator delete(void* memory) noexcept {
+[[gnu::noinline]] void* operator new(std::size_t size, const std::nothrow_t& /*tag*/) noexcept {
+  try {
+    return operator new(size);
+  } catch (const std::bad_alloc&) {
+    return nullptr;
+  }
+}
+
+[[gnu::noinline]] void operator delete(void* memory) noexcept {
   if (memory) --liveAllocations;
   std::free(memory);  // NOLINT(cppcoreguidelines-*)
 }
