@@ -7,6 +7,7 @@
 
 #include "platform/application.h"
 #import "platform/cocoa/action.h"
+#include "platform/cocoa/event_loop.h"
 #import "platform/cocoa/focus.h"
 #import "platform/cocoa/native.h"
 
@@ -58,9 +59,9 @@ void dropWaitingInput() {
   }
 }
 
-// Posts an empty event, because a modal loop checks whether it was stopped only after it has
-// handled an event.
-void wakeEventLoop() {
+}  // namespace
+
+void cocoa::wakeEventLoop() {
   [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
                                       location:NSZeroPoint
                                  modifierFlags:0
@@ -72,8 +73,6 @@ void wakeEventLoop() {
                                          data2:0]
            atStart:NO];
 }
-
-}  // namespace
 
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
   const NSTimeInterval seconds = std::chrono::duration<double>(delay).count();
@@ -129,7 +128,7 @@ void abortModal() {
     isModalAborted = true;
     if (![NSApp modalWindow]) return;  // the window is not shown yet
     [NSApp stopModalWithCode:NSModalResponseAbort];
-    wakeEventLoop();
+    cocoa::wakeEventLoop();
   });
 }
 

@@ -13,7 +13,7 @@ namespace onramp {
 namespace {
 
 // Returns an absolute path without its trailing slashes. Returns an empty text for a relative path,
-// because the XDG Base Directory Specification says that relative paths must be ignored.
+// because a program must ignore relative paths in the XDG base directory variables.
 std::string absolutePath(std::string_view path) {
   while (path.size() > 1 && path.ends_with('/'))
     path.remove_suffix(1);

@@ -15,7 +15,7 @@ WORDS = (SILENT, CLOSED, MISSING, TEXT)
 
 DEFAULT_TYPE = "_pdl-datastream._tcp"
 DEFAULT_PORTS = {DEFAULT_TYPE: 9100, "_printer._tcp": 515, "_ipp._tcp": 631, "_scanner._tcp": 9500}
-# The TXT keys of maker and model: for scanners, and for printers (Bonjour Printing Specification).
+# The TXT keys of maker and model: for scanners, and for printers.
 SCANNER_KEYS = ("mfg", "mdl")
 PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 

@@ -1,5 +1,6 @@
 #import <AppKit/AppKit.h>
 
+#include "platform/cocoa/event_loop.h"
 #import "platform/cocoa/text.h"
 #include "platform/run_loop.h"
 #include "tests/platform/conformance/front_end.h"
@@ -26,18 +27,7 @@ void clickSoon(const std::string& title) {
     NSView* const panel = [[NSApp modalWindow] contentView];
     if (NSButton* const button = buttonIn(panel, cocoa::toNSString(title))) {
       [button performClick:nil];
-      // A modal loop that has been stopped ends with the next event, which a real click would
-      // bring.
-      [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
-                                          location:NSZeroPoint
-                                     modifierFlags:0
-                                         timestamp:0
-                                      windowNumber:0
-                                           context:nil
-                                           subtype:0
-                                             data1:0
-                                             data2:0]
-               atStart:NO];
+      cocoa::wakeEventLoop();  // as the event of a real click does
     } else {
       clickSoon(title);
     }
