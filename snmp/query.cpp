@@ -14,7 +14,7 @@ constexpr int kAttemptsPerAddress = 3;
 constexpr int kCallsPerAttempt = 2;
 constexpr std::chrono::milliseconds kPauseBetweenAttempts{20};
 
-std::array<std::uint16_t, kActiveIFObject.size()> active_if_arcs = kActiveIFObject;
+auto active_if_arcs = kActiveIFObject;
 
 std::array<mib_entry, 1> active_if_entries = {
     {{kTagInteger, {active_if_arcs.size(), active_if_arcs.size(), active_if_arcs.data()}}}};

@@ -32,7 +32,7 @@ class Records {
   struct Record {
     std::int32_t interface;
     std::int32_t protocol;
-    Data data;  ///< as on the wire, with names uncompressed
+    Data data;  ///< the address, as on the wire
     friend bool operator==(const Record&, const Record&) = default;
   };
 

@@ -17,12 +17,6 @@ constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 // all.
 constexpr unsigned kNoAddress = 8;
 
-struct Server {
-  std::string host;
-  std::uint16_t port = 0;
-  Data txt;
-};
-
 // Reads the arguments of a service resolver's Found signal. Joins the strings of the TXT record,
 // which the signal has in reverse order, to the record's data (RFC 1035 section 3.3.14). The data
 // of a record without strings is one empty string. Returns nothing when the signal is malformed or
@@ -54,7 +48,7 @@ std::optional<Server> serverIn(sd_bus_message* message) {
 Resolve::Resolve(Daemon& daemon, const Instance& service,
                  std::optional<std::chrono::milliseconds> timeLimit, Report report)
     : daemon_(daemon),
-      name_(service),
+      instance_(service),
       report_(std::move(report)),
       check_(
           daemon.loop(), [this] { check(); }, SD_EVENT_PRIORITY_IDLE),
@@ -70,28 +64,25 @@ Resolve::Resolve(Daemon& daemon, const Instance& service,
 void Resolve::begin() {
   losses_ = daemon_.losses();
   graceForIPv4_.stop();
+  isGraceOver_ = false;
   ipv4_.reset();
   ipv6_.reset();
-  host_.clear();
+  server_.reset();
   service_.emplace(
       daemon_, "ServiceResolver",
-      [name = name_](sd_bus_message* call) {
+      [this](sd_bus_message* call) {
         // The daemon would look for the type itself in place of a service without a name.
-        if (name.name.empty() || name.domain.empty()) return -EINVAL;
+        if (instance_.name.empty() || instance_.domain.empty()) return -EINVAL;
         return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
-                                     name.name.c_str(), name.type.c_str(), name.domain.c_str(),
-                                     kAnyProtocol, kNoAddress);
+                                     instance_.name.c_str(), instance_.type.c_str(),
+                                     instance_.domain.c_str(), kAnyProtocol, kNoAddress);
       },
       [this](Query::Event event, sd_bus_message* message) { happened(event, message); });
 }
 
 // When the daemon gives up after some seconds, the query asks again by itself.
 void Resolve::happened(Query::Event event, sd_bus_message* message) {
-  if (auto server = event == Query::Event::kFound ? serverIn(message) : std::nullopt) {
-    host_ = std::move(server->host);
-    port_ = server->port;
-    txt_ = std::move(server->txt);
-  }
+  if (event == Query::Event::kFound) server_ = serverIn(message);
   checkSoon();
 }
 
@@ -100,23 +91,22 @@ void Resolve::checkSoon() {
 }
 
 void Resolve::ask(std::optional<Records>& addresses, RecordType type) {
-  addresses.emplace(daemon_, host_, type, [this] { checkSoon(); });
+  addresses.emplace(daemon_, server_->host, type, [this] { checkSoon(); });
 }
 
 void Resolve::check() {
   if (!report_) return;
   if (losses_ != daemon_.losses()) begin();
-  if (service_ && !host_.empty()) {
+  if (service_ && server_) {
     service_.reset();
-    isGraceOver_ = false;
     ask(ipv4_, RecordType::kIPv4);
   }
   const Records* const addresses = knownAddresses();
   if (!addresses) return;
 
-  Resolution resolution{{}, txt_};
+  Resolution resolution{{}, server_->txt};
   for (const Records::Record& record : addresses->all()) {
-    const auto address = socketAddress(record, port_);
+    const auto address = socketAddress(record, server_->port);
     auto& list = resolution.addressing;
     // The daemon reports the same address once for each interface and protocol.
     if (address && std::find(list.begin(), list.end(), *address) == list.end()) {

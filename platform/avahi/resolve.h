@@ -20,6 +20,13 @@ struct Resolution {
   Data txt;
 };
 
+/// Where a service is offered, and its TXT record's data.
+struct Server {
+  std::string host;  ///< a domain name with escapes and without a closing dot
+  std::uint16_t port = 0;
+  Data txt;
+};
+
 /// Looks up the host, the port, the TXT record and the addresses of one service on any interface
 /// and protocol. The resolve continues until all of these are known or its time is up. When the
 /// daemon goes away, the resolve starts again once the daemon is back.
@@ -46,21 +53,19 @@ class Resolve {
   void end(std::optional<Resolution> resolution);
 
   Daemon& daemon_;
-  Instance name_;
+  Instance instance_;
   Report report_;
   Timer check_;  ///< runs after a change, once all messages have been read
   Timer timeUp_;
   Timer graceForIPv4_;
   bool isGraceOver_ = false;
-  unsigned losses_ = 0;  ///< the daemon's losses() when the resolve last began
+  unsigned losses_ = 0;           ///< the daemon's losses() when the resolve last began
+  std::optional<Server> server_;  ///< nothing until the daemon has named the host
   // The daemon limits the number of questions that a client has open, so the question about the
   // service is closed as soon as it is answered.
   std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;
-  std::string host_;  ///< empty until the daemon has named it
-  std::uint16_t port_ = 0;
-  Data txt_;
 };
 
 }  // namespace onramp::avahi

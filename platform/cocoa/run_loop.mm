@@ -98,8 +98,7 @@ void performOnMainThread(std::function<void()> action) {
 // AppKit may end a modal loop without being asked, for example when the user presses a key that
 // cancels. The loop is then run again.
 void runModalForWindow(const Window& window) {
-  // Showing the window may already run an action that ends the loop.
-  isModalAborted = false;
+  // From here on, an action may end the loop. Showing the window may already run one.
   ++modalLoops;
   // AppKit does not show windows of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
@@ -112,6 +111,7 @@ void runModalForWindow(const Window& window) {
   while (modal && !isModalAborted)
     [NSApp runModalForWindow:modal];
   --modalLoops;
+  isModalAborted = false;
   isAborting = false;
   dropWaitingInput();
   [closeButton setEnabled:YES];

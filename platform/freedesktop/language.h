@@ -9,9 +9,8 @@ namespace onramp {
 /// The parts of a language identifier, in any of its spellings: "zh_CN", "zh-Hans-CN",
 /// "zh_CN.UTF-8" or, as on old media, "German".
 struct Language {
-  std::string code;  ///< ISO 639, in lower case; empty when the identifier is malformed
-  std::string
-      script;  ///< ISO 15924, such as "Hans"; for Chinese, a missing one follows from the region
+  std::string code;    ///< ISO 639, in lower case; empty when the identifier is malformed
+  std::string script;  ///< ISO 15924, such as "Hans"; for Chinese, may follow from the region
   std::string region;  ///< ISO 3166, in upper case; empty when not given
 
   [[nodiscard]] static Language parse(std::string_view identifier);

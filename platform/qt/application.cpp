@@ -16,7 +16,6 @@
 #include "base/maker.h"
 #include "platform/bundle.h"
 #include "platform/qt/accessibility.h"
-#include "platform/qt/loops.h"
 #include "platform/qt/menus.h"
 #include "platform/qt/native.h"
 #include "platform/qt/style.h"
@@ -149,7 +148,8 @@ int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
 }
 
 void terminateApplication() {
-  qt::endAllLoops();
+  beginTermination();
+  QCoreApplication::exit(0);
 }
 
 void hideApplication() {

@@ -9,7 +9,6 @@
 #include <vector>
 
 #include "platform/qt/focus.h"
-#include "platform/qt/loops.h"
 #include "platform/qt/native.h"
 #include "platform/termination.h"
 
@@ -23,24 +22,11 @@ std::vector<QEventLoop*>& modalLoops() {
   return loops;
 }
 
-bool isModal() {
-  return !modalLoops().empty();
-}
-
 // True from abortModal() until the modal loop has returned. Each posted action may occupy the main
 // thread for seconds, so posted actions are held back until the modal loop has returned.
 std::atomic<bool> isAborting = false;
 
 }  // namespace
-
-namespace qt {
-
-void endAllLoops() {
-  beginTermination();
-  QCoreApplication::exit(0);
-}
-
-}  // namespace qt
 
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action) {
   QTimer::singleShot(delay, Qt::PreciseTimer, qApp, [action = std::move(action)] {
@@ -53,7 +39,7 @@ void performOnMainThread(std::function<void()> action) {
       qApp,
       [action = std::move(action)]() mutable {
         if (isTerminating()) return;
-        if (isAborting && isModal()) {
+        if (isAborting && !modalLoops().empty()) {
           performOnMainThread(std::move(action));
         } else {
           action();

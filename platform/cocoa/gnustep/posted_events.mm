@@ -3,7 +3,6 @@
 // message has posted until other input arrives.
 
 #include <sys/eventfd.h>
-#include <unistd.h>
 
 #include <cstdint>
 
@@ -51,16 +50,15 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  const std::uint64_t one = 1;
-  if (write(_descriptor, &one, sizeof one) < 0) return;  // the loop is being woken already
+  eventfd_write(_descriptor, 1);  // a failure means that the loop is being woken already
 }
 
 - (void)receivedEvent:(void*)data
                  type:(RunLoopEventType)type
                 extra:(void*)extra
               forMode:(NSString*)mode {
-  std::uint64_t posted = 0;
-  if (read(_descriptor, &posted, sizeof posted) < 0) return;
+  eventfd_t posted = 0;
+  eventfd_read(_descriptor, &posted);
 }
 
 @end
