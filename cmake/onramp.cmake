@@ -52,15 +52,14 @@ function(onramp_test name)
 endfunction()
 
 # onramp_namespace_test(NAME …): as onramp_test, but the test runs as root in a new network namespace
-# and is skipped where none can be created. ctest runs the test through tests/in_namespace,
-# which CMake calls an emulator. SOURCE_FOLDER is defined as the folder of the test's sources.
+# and is skipped where none can be created. ctest runs the test through tests/in_namespace, which CMake
+# calls an emulator.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})
     set_target_properties(${name} PROPERTIES
       CROSSCOMPILING_EMULATOR ${PROJECT_SOURCE_DIR}/tests/in_namespace)
     set_tests_properties(${name} PROPERTIES SKIP_RETURN_CODE 77 LABELS network)
-    target_compile_definitions(${name} PRIVATE SOURCE_FOLDER="${CMAKE_CURRENT_SOURCE_DIR}")
   endif()
 endfunction()
 

@@ -52,9 +52,9 @@ def main():
                 result = measure(build, env, program)
                 if round_ > 0:  # the first round fills the file cache
                     runs[name].append(result)
-    empty_time = statistics.median(r[0] for r in runs["empty window"])
-    plain_time, plain_memory = (statistics.median(r[i] for r in runs["plain page"])
-                                for i in (0, 1))
+    (empty_time, empty_memory), (plain_time, plain_memory) = (
+        (statistics.median(r[i] for r in runs[name]) for i in (0, 1))
+        for name in ("empty window", "plain page"))
     hundred_time = statistics.median(r[0] for r in runs["100 models"])
     print(f"medians of {ROUNDS} rounds; noise is the spread of the middle half")
     for name, results in runs.items():
@@ -63,7 +63,8 @@ def main():
         noise = (times[-len(times) // 4] - times[len(times) // 4]) / time
         print(f"{name:13} {time:7.1f} ms (noise {noise:4.0%})  {time / empty_time:5.2f} × empty  "
               f"{time / plain_time:5.2f} × plain  {time / hundred_time:5.2f} × 100 models   "
-              f"peak {memory:6.1f} MiB ({memory - plain_memory:+.1f} more than plain)")
+              f"peak {memory:6.1f} MiB ({memory - empty_memory:+.1f} beside empty, "
+              f"{memory - plain_memory:+.1f} beside plain)")
 
 
 main()

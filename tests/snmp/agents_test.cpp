@@ -26,7 +26,6 @@ TEST(Agents, AreHeardForTwoSecondsAndOtherSendersAreIgnored) {
   const auto start = steady_clock::now();
   EXPECT_EQ(ask("127.0.1.8"), std::nullopt) << "after 4 s";
   EXPECT_GE(steady_clock::now() - start, milliseconds(2000));
-  EXPECT_EQ(ask("127.0.1.2"), 1) << "the late answer does no harm";
 }
 
 // A closed port takes three pauses of 20 ms. Six waits of two seconds for an answer take longer.

@@ -4,7 +4,6 @@ The last argument of each test program is a medium's folder with the application
 ONRAMP_GNUSTEP in the environment, that application is the Cocoa front end under GNUstep.
 """
 
-import os
 import pathlib
 import plistlib
 import sys
@@ -21,12 +20,7 @@ from onscreen.desktop import Desktop  # noqa: E402
 
 # The Cocoa front end under GNUstep has no accessibility bus, no keys for menus, no names for lists and
 # no options.
-ON_GNUSTEP = "ONRAMP_GNUSTEP" in os.environ
-if ON_GNUSTEP:
-    sys.path.append(str(TOOLS.parent / "tests/cocoa"))
-    from gnustep_person import GNUstepPerson as Person
-else:
-    from onscreen.person import Person
+from tours.person import ON_GNUSTEP, Person  # noqa: E402
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TEXT = messages.read(BUILT, "en")

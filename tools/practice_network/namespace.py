@@ -11,6 +11,7 @@ import sys
 
 from practice_network import description
 from practice_network.agents import AgentError
+from practice_network.command import BAD_INPUT, NETWORK_FAILED
 from practice_network.control import SOCKET_VARIABLE, serve
 from practice_network.description import DescriptionError
 from practice_network.host import (BUS_ADDRESS, RUN, Host, HostError, log, loop_back,
@@ -21,8 +22,6 @@ from practice_network.publisher import PublishError, connect
 ENCLOSE = ["unshare", "--net", "--mount", "--pid", "--fork", "--kill-child", "--mount-proc"]
 LAUNCHER = str(pathlib.Path(__file__).resolve().parent.parent / "practice-network")
 CABLES = ("practice0", "practice1")
-BAD_INPUT = 2
-NETWORK_FAILED = 125
 
 
 def why_not_enclosed():
