@@ -53,7 +53,7 @@ def main():
                 if round_ > 0:  # the first round fills the file cache
                     runs[name].append(result)
     (empty_time, empty_memory), (plain_time, plain_memory) = (
-        (statistics.median(r[i] for r in runs[name]) for i in (0, 1))
+        [statistics.median(column) for column in zip(*runs[name])]
         for name in ("empty window", "plain page"))
     hundred_time = statistics.median(r[0] for r in runs["100 models"])
     print(f"medians of {ROUNDS} rounds; noise is the spread of the middle half")

@@ -7,15 +7,16 @@ import time
 
 from replies import reply
 
-SEVEN = reply(99, 7)
+IDENTIFIER = b"\x63"
+SEVEN = reply(IDENTIFIER, 7)
 TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
 NO_BINDINGS = SEVEN[:27] + b"\0"
 
 # Each kind's datagrams, with the seconds since the request. A search listens for 5 to 8 seconds.
 REPLIES = {
-    "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(99, 7, status=2)), (0, TEXT),
-                (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN), (9, reply(99, 9))],
-    "flood": [(0, reply(99, number)) for number in range(300)],
+    "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)), (0, TEXT),
+                (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN), (9, reply(IDENTIFIER, 9))],
+    "flood": [(0, reply(IDENTIFIER, number)) for number in range(300)],
 }
 
 device = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
@@ -23,6 +24,6 @@ device.bind(("", 161))
 _, asker = device.recvfrom(1500)
 asked = time.monotonic()
 kind = sys.argv[1]
-for seconds, datagram in REPLIES.get(kind) or [(0, reply(99, int(kind)))]:
+for seconds, datagram in REPLIES.get(kind) or [(0, reply(IDENTIFIER, int(kind)))]:
     time.sleep(max(0, asked + seconds - time.monotonic()))
     device.sendto(datagram, asker)
