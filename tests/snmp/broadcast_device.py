@@ -14,8 +14,9 @@ NO_BINDINGS = SEVEN[:27] + b"\0"
 
 # Each kind's datagrams, with the seconds since the request. A search listens for 5 to 8 seconds.
 REPLIES = {
-    "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)), (0, TEXT),
-                (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN), (9, reply(IDENTIFIER, 9))],
+    "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)),
+                (0, TEXT), (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN),
+                (9, reply(IDENTIFIER, 9))],
     "flood": [(0, reply(IDENTIFIER, number)) for number in range(300)],
 }
 
