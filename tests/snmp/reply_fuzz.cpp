@@ -30,7 +30,7 @@ void require(bool holds, const char* what) {
 void query() {
   const auto arcs =
       std::make_unique<std::array<std::uint16_t, kActiveIFObject.size()>>(kActiveIFObject);
-  mib_entry entry{kTagInteger, {arcs->size(), arcs->size(), arcs->data()}};
+  mib_entry entry{kTagInteger, {kActiveIFObject.size(), kActiveIFObject.size(), arcs->data()}};
   mib_table table{&entry, 1, active_interface_table.handlers};
   snmp_request_counter = 7;
   bool noReply = false;
