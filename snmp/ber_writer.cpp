@@ -32,20 +32,22 @@ snmp_status ber_put_octets(ber_writer& out, std::span<const std::uint8_t> bytes,
   return out.put(bytes) || ber_put_header(out, tag, end) ? SNMP_ERR_CODEC : SNMP_OK;
 }
 
+// This function and ber_put_oid write through a copy of the writer, which the compiler keeps in
+// registers. It cannot keep `out` there, because a byte that is written might be a part of `out`.
 snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag) {
-  const std::size_t end = out.size();
+  ber_writer own = out;
+  const std::size_t end = own.size();
   const auto number = static_cast<std::int32_t>(value);
-  std::uint64_t written = 0;
-  bool complete = false;
-  for (unsigned shift = 0; !complete; shift += 8) {
-    const std::int32_t rest = number >> shift;
-    const auto byte = static_cast<std::uint8_t>(rest);
-    if (out.put(byte)) return SNMP_ERR_CODEC;
-    written |= std::uint64_t{byte} << shift;
-    complete = rest == static_cast<std::int8_t>(byte);
+  std::int32_t rest = number;
+  for (; rest != static_cast<std::int8_t>(rest); rest >>= 8) {
+    if (own.put(static_cast<std::uint8_t>(rest))) return SNMP_ERR_CODEC;
   }
-  if (number < 0) value = written;
-  return ber_put_header(out, tag, end);
+  if (own.put(static_cast<std::uint8_t>(rest))) return SNMP_ERR_CODEC;
+  const std::size_t bits = 8 * (own.size() - end);
+  if (ber_put_header(own, tag, end)) return SNMP_ERR_CODEC;
+  if (number < 0) value = static_cast<std::uint32_t>(number) & ((std::uint64_t{1} << bits) - 1);
+  out = own;
+  return SNMP_OK;
 }
 
 snmp_status ber_put_int(ber_writer& out, std::int64_t& value, std::uint8_t tag) {
@@ -69,16 +71,18 @@ snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag)
 snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid) {
   const std::span<const std::uint16_t> arcs(oid.arcs, oid.count);
   if (arcs.size() < 2) return SNMP_ERR_CODEC;
-  const std::size_t end = out.size();
+  ber_writer own = out;
+  const std::size_t end = own.size();
   for (std::size_t i = arcs.size() - 1; i >= 2; --i) {
-    if (put_arc(out, arcs[i])) return SNMP_ERR_CODEC;
+    if (put_arc(own, arcs[i])) return SNMP_ERR_CODEC;
   }
   const int first = arcs[0] * 40 + arcs[1];
-  if (first > UINT8_MAX || out.put(static_cast<std::uint8_t>(first)) ||
-      out.size() - end > kLongestOid) {
+  if (first > UINT8_MAX || own.put(static_cast<std::uint8_t>(first)) ||
+      own.size() - end > kLongestOid || ber_put_header(own, kTagObjectIdentifier, end)) {
     return SNMP_ERR_CODEC;
   }
-  return ber_put_header(out, kTagObjectIdentifier, end);
+  out = own;
+  return SNMP_OK;
 }
 
 snmp_status ber_put_null(ber_writer& out) {
