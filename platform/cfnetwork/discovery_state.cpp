@@ -2,7 +2,7 @@
 
 namespace onramp {
 
-// Returns nothing at all times, because macOS restarts its responder whenever the responder ends.
+// There is never a problem, because macOS restarts its responder whenever the responder ends.
 std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }

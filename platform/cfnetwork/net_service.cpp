@@ -16,7 +16,7 @@ using corefoundation::toString;
 
 class CFService;
 
-// The existing handles, by the services that they wrap.
+// Returns the handles that exist, each under the service that it wraps.
 std::map<CFNetServiceRef, std::weak_ptr<CFService>>& liveServices() {
   static std::map<CFNetServiceRef, std::weak_ptr<CFService>> services;
   return services;
@@ -98,7 +98,7 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  bool isResolved_ = false;  ///< the framework may keep what an earlier resolve found
+  bool isResolved_ = false;  ///< false while the framework may hold an earlier result
 };
 
 }  // namespace

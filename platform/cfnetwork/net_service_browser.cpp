@@ -93,9 +93,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     }
   }
 
-  // Counts the sightings of a service. The framework may report one for each network interface,
-  // each with a different object. Returns the object of the first sighting when the service is
-  // found or gone, and null otherwise.
+  // Counts the sightings of a service. The framework may report a sighting on each network
+  // interface, each with a different object. Returns the object of the first sighting when the
+  // service is found or gone, and null otherwise.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
       return found.service->name() == service->name() && found.service->type() == service->type() &&
@@ -112,9 +112,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     return gone;
   }
 
-  // A search fails, for instance, when the responder goes away. All services are reported as gone,
-  // because the next search will find them again. Stopping the failed search may cause another
-  // error, which is ignored.
+  // Called when the search has failed, for instance because the responder has gone away. All
+  // services are reported as gone, because the next search will find them again. Stopping the
+  // failed search may cause another error, which is ignored.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;
     isFailed_ = true;

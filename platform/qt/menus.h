@@ -5,8 +5,8 @@ class QWidget;
 
 namespace onramp::qt {
 
-/// Makes the standard items of the application menu work. The property "action" of an item is the
-/// name of the AppKit method that does what the item does, such as "terminate:". An unknown name
+/// Makes the standard items of the application menu work. An item's property "action" names the
+/// AppKit method that does on macOS what the item shall do, such as "terminate:". An unknown name
 /// has no effect.
 void connectStandardMenuItems(QWidget* window);
 
