@@ -71,7 +71,7 @@ class NetServiceBrowser {
   /// Ends the browser for good. The client is not called again.
   virtual void invalidate() = 0;
 
-  /// Ends the running search, if there is one. Its services are not reported as gone.
+  /// Ends the running search, if there is one. The search's services are not reported as gone.
   virtual void stopSearch() = 0;
 };
 

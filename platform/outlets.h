@@ -101,8 +101,8 @@ class RadioMatrix : public Control {
   /// Selects the button in this place and deselects all others.
   void selectCell(int row, int column) const;
 
-  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty,
-  /// and 0 or -1 when no button is selected.
+  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty.
+  /// When no button is selected, the result is 0 or -1, depending on the front end.
   [[nodiscard]] int selectedRow() const;
 };
 

@@ -9,8 +9,10 @@ namespace onramp {
 /// The parts of a language identifier, in any of its spellings: "zh_CN", "zh-Hans-CN",
 /// "zh_CN.UTF-8" or, as on old media, "German".
 struct Language {
-  std::string code;    ///< ISO 639, in lower case; empty when the identifier is malformed
-  std::string script;  ///< ISO 15924, such as "Hans"; for Chinese without one, from the region
+  std::string code;  ///< ISO 639, in lower case; empty when the identifier is malformed
+  /// ISO 15924, such as "Hans"; empty when not given. Chinese without a script gets the script that
+  /// is usual in its region.
+  std::string script;
   std::string region;  ///< ISO 3166, in upper case; empty when not given
 
   /// Splits `identifier` into its parts.

@@ -6,8 +6,8 @@ class QWidget;
 namespace onramp::qt {
 
 /// Makes the standard items of the application menu work. An item's property "action" names the
-/// AppKit method that does on macOS what the item shall do, such as "terminate:". An unknown name
-/// has no effect.
+/// AppKit method that carries out the item's command on macOS, such as "terminate:". An unknown
+/// name has no effect.
 void connectStandardMenuItems(QWidget* window);
 
 /// Gives the application menu the product's name from the bundle's information dictionary. Alt and
