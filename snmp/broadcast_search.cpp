@@ -42,7 +42,7 @@ std::optional<DatagramSocket> openBroadcastSocket() {
   return socket;
 }
 
-// Makes one receive attempt. Returns the result of a valid reply, otherwise nothing.
+// Waits for one datagram and receives it. Returns the values of a valid reply, otherwise nothing.
 std::optional<Dictionary> receiveResult(DatagramSocket& socket, snmp_table_request& request) {
   snmp_packet reply{};
   if (!socket.waitReadable(kReceiveWait)) return std::nullopt;
