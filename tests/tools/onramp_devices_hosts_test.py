@@ -1,4 +1,4 @@
-"""Runs "onramp-devices hosts" in a new network namespace; see tests/in_namespace.
+"""Runs "onramp-devices hosts". tests/in_namespace runs this test in a new network namespace.
 Arguments: the program, and the script that sets up a network to search."""
 
 import socket

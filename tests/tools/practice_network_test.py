@@ -1,4 +1,4 @@
-"""Tests the practice network with the usual tools for mDNS and SNMP."""
+"""Tests the practice network with avahi-browse and snmpget."""
 
 import os
 import pathlib
@@ -42,7 +42,7 @@ def run(*command, **options):
 
 
 def browse(service_type):
-    """Returns name → (address, port, TXT entries) for all announced devices."""
+    """Returns a dictionary of all announced devices: name → (address, port, set of TXT entries)."""
     output = run("avahi-browse", "-rptk", service_type).stdout
     rows = [line.split(";", 9) for line in output.splitlines() if line.startswith("=")]
     unescape = lambda text: re.sub(rb"\\(\d{3})", lambda match: bytes([int(match[1])]),
@@ -52,7 +52,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Runs inside a practice network of DEVICES, as its command."""
+    """Tests that run inside a practice network with DEVICES, as the network's command."""
 
     def setUp(self):
         self.network = PracticeNetwork()

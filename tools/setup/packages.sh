@@ -1,4 +1,6 @@
-# Sourced by the scripts at the root. Installs every package in a list, unless this machine has it.
+# Sourced by the scripts `run` and `test`.
+
+# Installs the packages of a list that this machine lacks. The argument is the list's file.
 
 install_packages() {
   local list=$1 missing
