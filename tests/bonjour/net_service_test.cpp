@@ -52,7 +52,7 @@ TEST_F(NetServiceTest, ABrowseThatCannotStartLeavesNoBrowser) {
   KSNetServiceBrowseCallBack(nullptr, 0, service, {}, nullptr);
   ServiceClientCallbacks empty{};
   KSNetServiceBrowseCallBack(nullptr, 0, service, {}, &empty);
-  EXPECT_TRUE(events.empty()) << "an error finds nothing, and nobody may be listening";
+  EXPECT_TRUE(events.empty()) << "neither an error nor a missing callback has an effect";
 }
 
 TEST_F(NetServiceTest, AResolveHasNoTimeLimitAndIsRetriedUntilItSucceeds) {
@@ -74,7 +74,7 @@ TEST_F(NetServiceTest, AResolveHasNoTimeLimitAndIsRetriedUntilItSucceeds) {
   EXPECT_EQ(KSNetServiceCancelResolve(nullptr), 1);
 }
 
-TEST_F(NetServiceTest, OnlyIPv4AddressesAreListedInTheirOrderWithDuplicates) {
+TEST_F(NetServiceTest, IPv4AddressesAreListedInOrderWithDuplicatesAndIPv6AddressesAreNot) {
   EXPECT_EQ(KSNetServiceCopyIPv4Addresses(nullptr), std::nullopt);
   Network::fill(service, {ipv6Address()}, {});
   EXPECT_EQ(KSNetServiceCopyIPv4Addresses(service), std::nullopt);
