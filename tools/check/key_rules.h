@@ -10,7 +10,10 @@
 
 namespace onramp::check {
 
+/// The kind of value that a key must have.
 enum class Kind { kText, kPath, kBoolean, kNumberOrText, kDictionary, kAny };
+
+/// How a missing key is reported: as an error, as a warning, or not at all.
 enum class Need { kRequired, kAdvised, kOptional };
 
 /// A key that the wizard reads from a dictionary.

@@ -127,8 +127,8 @@ Dictionary withoutOtherVersions(const Dictionary& package) {
   return Dictionary(std::move(pairs));
 }
 
-// Applies `rules` to the dictionary that `outer`, located at `place`, has under `key`. Does nothing
-// without that dictionary.
+// Applies `rules` to the dictionary under `key` in `outer`, if there is one. `place` is the
+// location of `outer`.
 void checkInner(const Dictionary& outer, DictionaryPlace place, std::string_view key,
                 std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report) {
   const auto inner = outer.dictionary(key);

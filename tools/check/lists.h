@@ -14,11 +14,11 @@ namespace onramp::check {
 struct Lists {
   std::string informationPath;  ///< of the application's Info.plist
   std::optional<Dictionary> information;
-  std::string resourcesPath;
+  std::string resourcesPath;  ///< of the resource dictionary, usually CDCommonInfo.plist
   std::optional<Dictionary> resources;
-  std::string descriptionPath;
+  std::string descriptionPath;  ///< of the medium description, usually CDInfo.plist
   std::optional<Dictionary> description;
-  std::string modelsPath;
+  std::string modelsPath;  ///< of the model information, usually ModelInfo.plist
   std::optional<Dictionary> models;
 
   /// Returns the names of the medium's models in the order in which the wizard shows them.

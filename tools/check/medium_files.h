@@ -11,7 +11,7 @@
 
 namespace onramp::check {
 
-/// Says what the wizard uses a file or folder for. Findings about the file quote it.
+/// The wizard's use of a file or folder. Findings about the file quote these texts.
 struct PathUse {
   Place place{};         ///< where its path is written; no key if the path is fixed in the wizard
   std::string what{};    ///< the file's role, such as "the medium description"

@@ -103,7 +103,7 @@ class ModelCheck {
   }
 
   // `meant` is the almost equal name that only the model information has. `nearest` is the most
-  // similar of all its names.
+  // similar of all names in the model information.
   void undescribed(const std::string& name, const std::optional<std::string>& meant,
                    const std::optional<std::string>& nearest) {
     add(name,
@@ -162,8 +162,9 @@ class ModelCheck {
     }
   }
 
-  // Compares the model's first word, the maker, with the first word of the vendor's name. Reports a
-  // spelling of the maker that differs only in capital letters, once.
+  // Compares the maker, which is the first word of the model's name, with the first word of the
+  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but
+  // reports it once.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));

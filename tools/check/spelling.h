@@ -12,7 +12,7 @@ namespace onramp::check {
 /// Finds the known word that was probably meant by a misspelt word. If the two differ only in
 /// capital letters, spaces and punctuation, a hash table finds the known word. Otherwise the
 /// misspelt word is compared with every known word. One object makes a limited number of
-/// comparisons, because the work for two long lists would take too long. After that, nearest() uses
+/// comparisons, because comparing two long lists would take too long. After that, nearest() uses
 /// only the hash table.
 class Spelling {
  public:

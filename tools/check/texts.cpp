@@ -241,7 +241,7 @@ class TextCheck {
     report_.findings.push_back(std::move(finding));
   }
 
-  // Reports languages of the message bundle in which the application has no texts of its own. The
+  // Reports languages of the message bundle in which the application has no texts. The
   // message bundle cannot supply these.
   void checkApplicationLanguages() {
     if (!lists_.information) return;

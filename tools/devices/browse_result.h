@@ -15,6 +15,7 @@ struct Delay {
   std::size_t hidden = 0;   ///< how many of those the wizard's search misses
 };
 
+/// A device, and the verdict on it.
 struct JudgedDevice {
   const Device* device = nullptr;  ///< not owned
   Verdict verdict{};
@@ -22,9 +23,10 @@ struct JudgedDevice {
   Delay delay{};
 };
 
+/// The result of a search.
 struct BrowseResult {
   const Medium* medium = nullptr;  ///< not owned
-  double seconds = 0;
+  double seconds = 0;              ///< how long the search took
   bool isInterrupted = false;
   std::vector<JudgedDevice> devices{};  ///< in the order in which they were found
   std::vector<Verdict> network{};       ///< problems of the network as a whole

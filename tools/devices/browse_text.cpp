@@ -33,7 +33,7 @@ struct Columns {
   std::size_t model;
 };
 
-// Divides the width that mark and address leave between name and model.
+// Returns the columns for name and model. They share the width that mark and address do not use.
 Columns columnsFor(const TextStyle& style) {
   const std::size_t width = style.width == 0 ? 100 : std::max(style.width, kNarrowest);
   const std::size_t rest = width - kMarkColumns - kAddressColumns - 3;

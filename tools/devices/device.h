@@ -28,7 +28,7 @@ struct Device {
   std::optional<Answer> answer;     ///< nothing until the device has been asked
 };
 
-/// The parts of a medium that the wizard's search depends on.
+/// The parts of a medium on which the wizard's search depends.
 struct Medium {
   std::string path;                 ///< as the user gave it
   std::string type;                 ///< the one service type that the wizard looks for

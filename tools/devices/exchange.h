@@ -21,7 +21,7 @@ struct Exchange {
     kRefused,       ///< the host reported that no program uses the port
     kLate,          ///< the reply came after the time that the wizard waits for it
     kNone,          ///< no reply came
-    kUnsent,        ///< nothing was sent, for want of a valid address, a socket or a route
+    kUnsent,        ///< nothing was sent, because there was no valid address, socket or route
   };
 
   std::string address{};
@@ -29,11 +29,11 @@ struct Exchange {
   std::vector<std::uint8_t> request{};
   std::vector<std::uint8_t> reply{};    ///< empty when none came
   std::optional<double> seconds{};      ///< from the request to the reply
-  std::uint64_t errorStatus = 0;        ///< of kError (RFC 1157 section 4.1.1)
-  std::optional<std::int64_t> value{};  ///< of kValue
-  unsigned type = 0;                    ///< of kOtherType: the value's tag
-  /// Whether the reply named an object other than that of the request. In the wizard, the object
-  /// from the reply would replace the one that later devices are asked for.
+  std::uint64_t errorStatus = 0;        ///< for kError; see RFC 1157 section 4.1.1
+  std::optional<std::int64_t> value{};  ///< for kValue
+  unsigned type = 0;                    ///< for kOtherType; the value's tag
+  /// Whether the reply named an object other than that of the request. If so, the wizard would ask
+  /// all later devices for the object that the reply names.
   bool changedQuestion = false;
 };
 
@@ -41,7 +41,7 @@ struct Exchange {
 struct Answer {
   bool isWireless = false;  ///< as the wizard decides
   bool isComplete = false;  ///< false when `stopped` was set before the end
-  double seconds = 0;       ///< how long the wizard's window would not react
+  double seconds = 0;       ///< how long the wizard's window would not respond
   std::vector<Exchange> exchanges;
 
   /// Returns the exchange that best explains the answer: the last one with a value or, if none has

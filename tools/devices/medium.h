@@ -8,8 +8,8 @@
 
 namespace onramp::devices {
 
-/// Makes the application on the medium in the folder `path` the main bundle. Then reads the parts
-/// of the medium that the wizard's search depends on, with the wizard's own code. `wanted` names
+/// Makes the application on the medium in the folder `path` the main bundle. Then uses the wizard's
+/// own code to read the parts of the medium on which the wizard's search depends. `wanted` names
 /// the models to search for; if it is empty, the search is for all models. On failure, prints a
 /// message on standard error and returns nothing. It is a failure when the folder has no
 /// application, when the medium names no service type or no models, and when it lacks a model of

@@ -10,8 +10,8 @@
 
 namespace onramp::devices {
 
-/// Asks many devices at once, each on a thread of its own. Each device gets the same requests as
-/// from the wizard, which asks one device after another.
+/// Asks many devices at once, each on a separate thread. Each device gets the same requests as from
+/// the wizard, although the wizard asks one device after another.
 class Questions {
  public:
   using Answered = std::function<void(Answer answer)>;

@@ -48,5 +48,5 @@ def wait_for(condition, seconds, what):
         if value:
             return value
         if time.monotonic() > deadline:
-            raise TimeoutError(f"waited {seconds} s for {what}, in vain")
+            raise TimeoutError(f"gave up after waiting {seconds} s for {what}")
         time.sleep(0.02)

@@ -56,7 +56,7 @@ class Network:
 
     def _plug(self, interface, plugged):
         if interface not in self._host.interfaces:
-            raise DescriptionError(f'interface "{interface}": is unknown; the interfaces are '
+            raise DescriptionError(f'interface "{interface}" is unknown; the interfaces are '
                                    + ", ".join(self._host.interfaces))
         self._host.plug(interface, plugged)
 
@@ -98,10 +98,10 @@ class Network:
         """Changes a device, and publishes only what the entries change."""
         before = self._devices.get(name)
         if not before:
-            raise DescriptionError(f'device "{name}": is unknown; "list" shows the known devices')
+            raise DescriptionError(f'device "{name}" is unknown; "list" shows the known devices')
         after = description.change(before, entries, f'device "{name}"')
         if after.name != name and after.name in self._devices:
-            raise DescriptionError(f'device "{after.name}": exists already; choose another name')
+            raise DescriptionError(f'device "{after.name}" exists already; choose another name')
         after = self._with_addresses(after, name)
         if after.name != name:
             self._devices = {after.name if key == name else key: value
