@@ -9,7 +9,7 @@ import tempfile
 
 from .processes import Missing, start, stop, wait_for
 
-_SIZE = "2732x1536"  # twice 1366 × 768, the smallest screen that the wizard must fit
+_SIZE = "2732x1536"  # twice 1366 × 768, the smallest screen that the wizard must fit on
 
 
 def _free_display():

@@ -64,7 +64,10 @@ class Person:
     # Looking at the screen.
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
-        """Waits until a control of that role and name is on the screen, and returns it."""
+        """Waits until a control of that role and name is on the screen, and returns it.
+
+        Raises TimeoutError after `seconds`, and RuntimeError when the program has ended.
+        """
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
                         _words(role, name))
 

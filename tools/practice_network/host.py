@@ -62,9 +62,8 @@ def run(*command):
 
 
 def take_over_run():
-    """Mounts an empty /run in the mount namespace of this process."""
-    # The services that this machine has for its own Avahi must not appear among the made-up
-    # devices.
+    """Mounts an empty /run, and hides this machine's own Avahi services, in this process's namespace."""
+    # These services would appear among the made-up devices.
     if pathlib.Path("/etc/avahi/services").is_dir():
         run("mount", "-t", "tmpfs", "none", "/etc/avahi/services")
     run("mount", "-t", "tmpfs", "-o", "mode=755", "none", "/run")

@@ -63,7 +63,7 @@ def enclose(options):
 def inside(options):
     """Runs as the first process in the namespaces. Starts the network and then the command, and
     returns the exit status."""
-    # SIG_IGN would not do, because the command would inherit it.
+    # SIG_IGN is unsuitable, because the command would inherit it.
     signal.signal(signal.SIGINT, lambda *_: None)
     try:
         environment = _own_run(options["user"])
