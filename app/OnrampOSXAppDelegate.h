@@ -83,8 +83,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] std::shared_ptr<Page> loadView(const std::string& name);
 
   /// Removes the page that is shown, then shows `page`. When `page` is null, loads a new page from
-  /// the interface file `name` and shows that page. If it cannot be loaded, the window shows no
-  /// page.
+  /// the interface file `name` and shows that page. If the page cannot be loaded, the window shows
+  /// no page.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
   /// Shows a new model list.
@@ -95,10 +95,11 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// the medium.
   void showConnectionTypeView(ConnectionType type);
 
-  /// The effect depends on the page that is shown. On the chooser, searches again. On the
-  /// connection page, shows the chooser if it lists a device, and starts the wireless set-up tool
-  /// if it lists none. On the connection page after the wizard itself has started the tool, and on
-  /// any other page, shows the chooser and searches.
+  /// What this function does depends on the page that is shown:
+  /// - on the chooser, it searches again;
+  /// - on the connection page, as long as the wizard itself has not started the wireless set-up
+  ///   tool, it shows the chooser when the chooser lists a device, and otherwise starts the tool;
+  /// - in every other case, it shows the chooser and searches.
   void showChooseDeviceView();
 
   /// Shows `image` stretched over the window's background. Does nothing without an image.
@@ -140,8 +141,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
-  /// Compares the running system's version with the medium's maximum first, then with its minimum.
-  /// Skips a bound whose "Major" is 0.
+  /// Compares the running system's version with the medium's maximum and then with its minimum.
+  /// Skips a bound whose "Major" is 0. Returns kNewerThanMaximum or kOlderThanMinimum for the first
+  /// bound that the version violates, and otherwise kSupported.
   [[nodiscard]] SystemSupport installationCheck() const;
 
   /// The medium's minimum version as text, such as "10.6.0".
@@ -153,7 +155,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // hand_off.cpp: the files that hand the choices to the installer package.
 
-  /// The medium's vendor name without its spaces; empty when the medium names no vendor.
+  /// Returns the medium's vendor name without its spaces, or an empty text when the medium names no
+  /// vendor.
   [[nodiscard]] static std::string setVenderName();
 
   /// Returns the path of the package-options file, which tells the package what else to install. If
@@ -223,7 +226,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// notification's user info, or with 0 when there is no such number.
   void showProgressAtChooseDeviceViewByRefresh(const Notification& notification);
 
-  /// Tells the user in a sheet that no device was found.
+  /// Tells the user in a sheet that no device was found, and returns at once.
   void showListAlertSheet();
 
   /// Opens the support page if `returnCode` is kAlertOtherReturn, which stands for the sheet's

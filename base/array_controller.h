@@ -50,8 +50,8 @@ class ArrayController {
   void setSelectedObject(const Dictionary& entry);
 
   /// choose() selects an entry as setSelectionIndex() does, and chooseObject() as
-  /// setSelectedObject() does. Both also record that the user has made a selection. The bound table
-  /// calls choose().
+  /// setSelectedObject() does. Both also record that the user has made a selection, even when they
+  /// clear the selection. The bound table calls choose().
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 

@@ -15,10 +15,10 @@ struct FileURL {
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
 
-/// The dictionary "PkgInfo" of the medium resource dictionary may name one package for each range
-/// of system versions. Returns the key of the package for system `version`, or nothing when no key
-/// covers that version. `version` is in binary-coded decimal: 0x1068 is 10.6.8. If "PkgInfo" has
-/// the key "PkgName", the wizard uses that key instead.
+/// The dictionary "PkgInfo" of the medium resource dictionary may name a separate package for each
+/// range of system versions. Returns the key that names the package for `version`, or nothing when
+/// no key covers `version`. `version` is in binary-coded decimal: 0x1068 is 10.6.8. If "PkgInfo"
+/// has the key "PkgName", the wizard uses only that key.
 [[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
 /// Where the installer package and the wireless set-up tool are on the medium, and which systems

@@ -29,8 +29,8 @@ enum class SystemSupport : std::uint32_t {
 // The functions that follow take bounds in the form that KSInstallerInfo returns. A key that is
 // missing counts as 0.
 
-/// Whether `bound` sets a limit: whether its "Major" is not 0. isNewerThan() and isOlderThan() do
-/// not check this.
+/// Whether `bound` sets a limit, that is, whether its "Major" is not 0. isNewerThan() and
+/// isOlderThan() do not check this.
 [[nodiscard]] bool isBound(const Dictionary& bound);
 
 /// Whether `version` is above `maximum`. The maximum's "Major" and "Minor" are inclusive. Its
@@ -41,7 +41,7 @@ enum class SystemSupport : std::uint32_t {
 /// Whether `version` is below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
-/// Compares `version` with both bounds, with the maximum first. Skips a bound that sets no limit.
+/// Compares `version` with `maximum` and then with `minimum`. Skips a bound that sets no limit.
 [[nodiscard]] SystemSupport systemSupport(const SystemVersion& version, const Dictionary& minimum,
                                           const Dictionary& maximum);
 

@@ -27,16 +27,16 @@ inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceW
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
 /// The page that lists the devices found on the network. A device is listed if its model is looked
-/// for and the device reports that it is using its wireless interface. The page is created once.
-/// While another page is shown, it keeps its list, and a running search goes on. A running search
-/// shares ownership of the page until stopBrowsing() is called.
+/// for and the device reports that it is using its wireless interface. The page object is created
+/// once. While the window shows another page, this object keeps its list, and a running search goes
+/// on. A running search shares ownership of the object until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
  public:
   // Keys of a list entry.
   static constexpr std::string_view kDevice = "device";        ///< string, the device's name
-  static constexpr std::string_view kInterface = "interface";  ///< string, kind of connection
+  static constexpr std::string_view kInterface = "interface";  ///< string, localized "Network"
   static constexpr std::string_view kLocation = "location";  ///< string, the first address, if any
   static constexpr std::string_view kKSDevice = "ksdevice";  ///< dictionary, the device record
 
@@ -84,7 +84,7 @@ class ChooseDeviceView final : public Page,
   void updateKSDevice(const Dictionary& device) override;
   void removeKSDevice(const Dictionary& device) override;
 
-  /// Whether setSearchModelList() has set the device's model as one to look for.
+  /// Whether the device's model is one of those that setSearchModelList() has set.
   [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
 
   /// Whether the device answers that it is using its wireless interface; false when the record has
@@ -96,8 +96,8 @@ class ChooseDeviceView final : public Page,
   /// selected.
   void setServiceToList(const Dictionary& device);
 
-  /// Removes the entry that addKSDevice() would add for the same `device` record. Does nothing when
-  /// the list has no such entry.
+  /// Removes the entry that setServiceToList() would add for `device`. Does nothing when the list
+  /// has no such entry.
   void removeServiceFromList(const Dictionary& device);
 
  private:
