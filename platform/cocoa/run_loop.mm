@@ -128,7 +128,7 @@ void abortModal() {
       return;
     }
     isModalAborted = true;
-    if (![NSApp modalWindow]) return;  // AppKit's loop has not started
+    if (![NSApp modalWindow]) return;  // AppKit's loop has not started yet
     [NSApp stopModalWithCode:NSModalResponseAbort];
     cocoa::wakeEventLoop();
   });
