@@ -36,8 +36,8 @@ PRINTER = "_pdl-datastream._tcp"
 # Hide is never clicked, because the desktop has no task bar that could bring the window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
-# The active interfaces that the devices report. With each of them, a device answers at once, so the
-# wizard never waits.
+# What a device reports as its active interface. With each of these values, the device answers at
+# once, so the wizard never waits for an answer.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
 
 
