@@ -9,10 +9,10 @@
 namespace onramp {
 
 /// Encodes `message` (RFC 1157 section 4) at the start of `out_buffer` and stores the size of the
-/// encoding in `out_length`. Sets the `encoded_length` of every binding. Replaces negative integers
-/// in the message as ber_put_int() does. So when a message with the integer -1 is encoded twice,
-/// the second encoding contains 255. A binding is written without a value if its `type` is none of
-/// 1, 2, 4, 5, 6 and 64 to 68.
+/// encoding in `out_length`. Sets the `encoded_length` of each encoded binding. Replaces negative
+/// integers in the message as ber_put_int() does. So when a message with the integer -1 is encoded
+/// twice, the second encoding contains 255. A binding is written without a value if its `type` is
+/// none of 1, 2, 4, 5, 6 and 64 to 68.
 ///
 /// Returns SNMP_ERR_CODEC when the message does not fit in the buffer or is longer than 65,535
 /// bytes, when `varbind_count` exceeds the size of the array, when an object identifier cannot be
