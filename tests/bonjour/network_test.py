@@ -59,7 +59,7 @@ class NetworkTest(unittest.TestCase):
                                 stdout=subprocess.PIPE).stdout
         self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
 
-    def test_names_of_all_kinds_lead_to_their_devices_and_back(self):
+    def test_devices_with_names_of_all_kinds_are_found_by_name_and_by_uri(self):
         names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
                  "Osprey #2", "x" * 63]
         for name in names:
@@ -124,7 +124,7 @@ class NetworkTest(unittest.TestCase):
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],
                                          ["found", "update", "gone", "remove"])
 
-    def test_a_device_on_two_interfaces_leaves_with_the_last_one(self):
+    def test_a_device_on_two_interfaces_is_gone_only_when_both_are_unplugged(self):
         for interface in ("practice0", "practice1"):
             self.addCleanup(self.network.plug, interface)
         uri = "dnssd://Kestrel._ipp._tcp.local."
@@ -185,7 +185,7 @@ class NetworkTest(unittest.TestCase):
             with self.subTest(limit=limit), Search(PROBE, TYPE) as search:
                 search.wait(lambda: names <= {event[2] for event in search.events("update")})
 
-    def test_the_daemon_may_be_absent_and_come_and_go(self):
+    def test_the_daemon_may_be_absent_at_the_start_and_restart_later(self):
         self.avahi.kill()
         with Search(PROBE, TYPE) as search:
             for count in (1, 2, 3):

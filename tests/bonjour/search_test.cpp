@@ -140,7 +140,7 @@ TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
   EXPECT_THAT(recorder->events, ElementsAre(Event{"add", nullptr}, Event{"resolved", nullptr}));
 }
 
-TEST_F(BrowserTest, StoppingForgetsEverythingWithoutEventsAndARestartBeginsEmpty) {
+TEST_F(BrowserTest, StoppingEmptiesTheTableWithoutEventsAndARestartBeginsEmpty) {
   network.found(onOne);
   browser->stopBrowsing();
   EXPECT_FALSE(Network::isResolving(onOne));

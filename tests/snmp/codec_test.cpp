@@ -96,7 +96,7 @@ TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255Bytes) {
   }
 }
 
-TEST(Primitives, UnusedByTheProgramKeepTheirContracts) {
+TEST(UnusedPrimitives, KeepTheirContracts) {
   std::uint16_t a[] = {1, 3, 6}, b[] = {1, 3, 7};
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {3, 3, b}), -1);
   EXPECT_EQ(snmp_oid_compare({3, 3, b}, {3, 3, a}), 1);

@@ -250,7 +250,7 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   }
 }
 
-TEST_F(GetSet, SetSendsTheSlotsWithTheBindingsIndexesUnlessTheyAreTooLong) {
+TEST_F(GetSet, SetSendsTheSlotOfEachBindingUnlessTheStringsAreTooLong) {
   for (const std::uint16_t length : std::vector<std::uint16_t>{1, 17, 700}) {
     give(0, 700, length);
     give(1, 700, length);

@@ -125,7 +125,7 @@ class Everybody(unittest.TestCase):
         self.assertGreater(devices["no-answer"]["delay"]["seconds"], 11)
         self.assertGreater(devices["late"]["answer"]["exchanges"][0]["seconds"], 2.4)
 
-    def test_the_list_equals_the_wizards_for_every_model(self):
+    def test_lists_the_same_devices_as_the_wizard_for_every_model(self):
         with open(pathlib.Path(MEDIUM, "MacResources", "CDInfo.plist"), "rb") as file:
             models = list(plistlib.load(file)["ContainedModel"])
         searches = [[model] for model in models] + [models]
@@ -144,7 +144,7 @@ class Everybody(unittest.TestCase):
         self.assertEqual(devices[models.index("Kestrel Model 200")]["listed"]["verdict"]["id"],
                          "other-model")
 
-    def test_asks_as_net_snmp_does(self):
+    def test_ask_agrees_with_snmpget_about_every_reply(self):
         asked = []
         for number, (answer, *expected) in enumerate(REPLIES):
             address = f"127.0.8.{number + 1}"

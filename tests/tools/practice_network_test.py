@@ -116,7 +116,7 @@ class FromOutside(unittest.TestCase):
         path.write_text(text)
         return str(path)
 
-    def test_described_devices_are_there_for_the_command(self):
+    def test_the_command_runs_among_the_described_devices(self):
         result = run(TOOL, self.describe(DEVICES), sys.executable, "-B", __file__, "FromInside")
         self.assertEqual(result.returncode, 0, result.stderr)
 
@@ -125,14 +125,14 @@ class FromOutside(unittest.TestCase):
         self.assertEqual((result.stdout.count('"established"'), result.stdout.count('"withdrawn"')),
                          (19, 1), result.stderr)
 
-    def test_the_exit_status_is_the_commands(self):
+    def test_the_exit_status_is_that_of_the_command(self):
         description = self.describe("")
         for command, status in ((["sh", "-c", "exit 5"], 5), (["sh", "-c", "kill -9 $$"], 137),
                                 (["/no/such/program"], 127)):
             with self.subTest(command):
                 self.assertEqual(run(TOOL, description, *command).returncode, status)
 
-    def test_nothing_is_left_when_the_tool_is_ended(self):
+    def test_no_process_is_left_when_the_tool_is_ended(self):
         for number, status in ((signal.SIGKILL, -9), (signal.SIGTERM, 143)):
             with self.subTest(number):
                 tool = subprocess.Popen(
