@@ -8,6 +8,8 @@ set(CMAKE_OBJCXX_STANDARD 20)
 set(CMAKE_OBJCXX_STANDARD_REQUIRED ON)
 set(CMAKE_OBJCXX_EXTENSIONS OFF)
 
+# gnustep_flags(VARIABLE KIND) sets VARIABLE to the list of flags that gnustep-config prints for the
+# option KIND.
 function(gnustep_flags variable kind)
   execute_process(COMMAND ${ONRAMP_GNUSTEP_CONFIG} ${kind} OUTPUT_VARIABLE flags
     OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)

@@ -1,6 +1,5 @@
-# Says what is installed: the application, the companions, an example medium and the documents. From
-# the installed files, cpack makes a Debian package and the media kit, a tarball that can be used
-# without installation.
+# Installs the application, the companions, an example medium and the documents. From these files,
+# cpack makes a Debian package and the media kit, a tarball that can be used without installation.
 #
 # LIBDIR/onramp holds the example medium with the application on it, and the scripts of tools/. The
 # commands in BINDIR that are scripts are links to these scripts.

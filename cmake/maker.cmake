@@ -9,8 +9,8 @@ endif()
 set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${ONRAMP_MAKER})
 file(READ ${ONRAMP_MAKER} onramp_maker)
 
-# onramp_maker_check(KEY VALUE FORM EXAMPLE) ends the build with a message unless VALUE, the value
-# of KEY, matches the regular expression FORM. The message shows EXAMPLE.
+# onramp_maker_check(KEY VALUE FORM EXAMPLE) ends the configuration with a message if VALUE, the
+# value of KEY, does not match the regular expression FORM. The message shows EXAMPLE.
 function(onramp_maker_check key value form example)
   if(NOT value MATCHES "${form}")
     message(FATAL_ERROR "${ONRAMP_MAKER}: \"${key}\" is missing or malformed. It must look like ${example}.")

@@ -1,5 +1,5 @@
-# Defines the target medium, which assembles a medium in ONRAMP_MEDIUM from the example medium's
-# files and the application's bundle. Also installs the bundle, on the installed example medium.
+# The target medium assembles a medium in ONRAMP_MEDIUM from the example medium's files and the
+# application's bundle. The installed example medium gets the bundle, too.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")

@@ -1,5 +1,6 @@
-# Sourced by the scripts `run` and `test`. CMake refuses a build folder that was made for another
-# source tree. This happens when the tree is copied or moved together with its build folders.
+# The scripts `run` and `test` source this file. CMake refuses a build folder that was made for
+# another source tree. There are such folders when a tree was copied or moved together with its
+# build folders.
 
 # Removes build/PRESET if it was made for another source tree. The argument is the preset's name.
 forget_build_of_another_tree() {

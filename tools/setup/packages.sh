@@ -1,6 +1,6 @@
-# Sourced by the scripts `run` and `test`.
+# The scripts `run` and `test` source this file.
 
-# Installs the packages of a list that this machine lacks. The argument is the list's file.
+# Installs those packages in a list that this machine lacks. The argument is the file with the list.
 
 install_packages() {
   local list=$1 missing
