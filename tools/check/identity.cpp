@@ -45,7 +45,7 @@ void checkDeclared(const Lists& lists, const std::string& type, Report& report) 
                              .place = {.file = lists.informationPath, .key = {kDeclared}},
                              .found = "no " + quoted(bare),
                              .expected = "the medium's service type, without its closing dot",
-                             .effect = "on macOS 11 and later, " + std::string(kNoDevice),
+                             .effect = "on macOS 15 and later, " + std::string(kNoDevice),
                              .remedy = "add the type"});
 }
 

@@ -9,12 +9,12 @@ namespace onramp::check {
 
 /// A text that the wizard shows, and the room for it in the interface files for macOS.
 struct ShownText {
-  std::string_view key{};
-  std::string_view where{};
-  double width = 0;  ///< of a line, in points; 0 where any text fits
-  double size = 13;  ///< of the letters, in points
-  int lines = 1;
-  std::size_t mostPlaceholders = 0;  ///< of "%@"; if not 0, at least one is needed
+  std::string_view key{};            ///< in the message bundle
+  std::string_view where{};          ///< the place where the text is shown, in words
+  double width = 0;                  ///< of a line, in points; 0 where any text fits
+  double size = 13;                  ///< of the letters, in points
+  int lines = 1;                     ///< how many lines there is room for
+  std::size_t mostPlaceholders = 0;  ///< how many "%@" it may have; if not 0, it needs one
   bool hasFallback = false;          ///< if missing, an English text is shown, not the key
 };
 
