@@ -22,9 +22,9 @@ PACKAGES = {"unshare": "util-linux", "setpriv": "util-linux", "nsenter": "util-l
 
 HELP = """
 Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns the exit
-status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespaces of the
-kernel. No packet leaves this machine, and no hardware is needed. The network ends with COMMAND or
-with this tool, however they end.
+status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespaces of the kernel. No
+packet leaves this machine, and no hardware is needed. The network ends when COMMAND or this tool
+ends, in whatever way.
 
 This command runs the wizard with twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
@@ -77,12 +77,12 @@ PracticeNetwork in tools/practice_network offers these commands to Python tests.
 PracticeNetwork find the network through the environment variable ONRAMP_PRACTICE_SOCKET.
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
-do by default. Abstract sockets and TCP connections to the X server do not work inside. XDG_RUNTIME_DIR
-is a new, empty folder. The session bus, Wayland and the accessibility bus of your desktop cannot be
+do by default. Abstract sockets and TCP connections to the X server do not work inside.
+XDG_RUNTIME_DIR is a new, empty folder. The session bus, Wayland and the accessibility bus of your desktop cannot be
 reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
-exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description, 77
-if this machine cannot create namespaces, 125 if the network did not start, 126 or 127 if COMMAND
+exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description,
+77 if this machine cannot create namespaces, 125 if the network did not start, 126 or 127 if COMMAND
 could not be run.
 """
 
