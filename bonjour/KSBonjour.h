@@ -44,8 +44,8 @@ class KSBonjourObserver {
 };
 
 /// Browses for services of one type, resolves each service that it finds, and keeps these services
-/// in a table. A service that is found several times has one entry, which counts the finds. All
-/// functions must be called on the main thread.
+/// in a table. A service that is found several times has one entry, with a count. All functions
+/// must be called on the main thread.
 class KSBonjour {
  public:
   /// Creates an idle browser for `type`. If `type` is nothing, startBrowsing() only stops the

@@ -5,12 +5,12 @@ Usage: discovery_bench.py [BUILD]
 
 BUILD is the folder of a release build (default: build/release).
 
-Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each
-measured time is from the start of a program until it prints the line about the last service that it
+Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each time is
+that from the start of a program until the program prints the line about the last service that it
 resolves. The warm part has one host, whose Avahi daemon has all services in its cache. The cold
 part has two hosts joined by virtual cables. In that part, the Avahi daemon of the searching host is
-restarted before every search, so that its cache is empty. The warm part ends with the processor
-time of a search that is left idle.
+restarted before every search, so that its cache is empty. The warm part also prints the processor
+time of a search that keeps running after it has found everything.
 """
 
 import pathlib

@@ -1,5 +1,5 @@
-// Tests how the backends for macOS use the objects of C frameworks. The frameworks in frameworks/
-// are stand-ins.
+// Tests how the backends for macOS use the objects of C frameworks. The folder frameworks/ has
+// stand-ins for the frameworks.
 
 #include <CoreServices/CoreServices.h>
 #include <SystemConfiguration/SystemConfiguration.h>
