@@ -79,7 +79,8 @@ class ber_writer {
 [[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
 /// Puts an object identifier. Refuses an identifier with fewer than two arcs or with more than 255
-/// bytes of content. Also refuses one in which 40 times the first arc plus the second exceeds 255.
+/// bytes of content. Also refuses an identifier in which 40 times the first arc plus the second
+/// exceeds 255.
 [[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
 [[nodiscard]] snmp_status ber_put_null(ber_writer& out);

@@ -47,10 +47,10 @@ extern std::int64_t snmp_request_counter_ext;
 [[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
 
 /// Sends `message` to the SNMP port of `address`, a dotted IPv4 text, and decodes the reply into
-/// `message`. Sends nothing if `address` is null or another text. Blocks for at most kSendWait plus
-/// kReceiveWait. The wait ends early when the host reports that no program uses the port.
-/// `message.community` keeps its value, because the reply's community does not outlive the call.
-/// The reply's identifier is stored in `message.request_id` but not checked.
+/// `message`. Sends nothing if `address` is null or not an IPv4 address. Blocks for at most
+/// kSendWait plus kReceiveWait. The wait ends early when the host reports that no program uses the
+/// port. `message.community` keeps its value, because the reply's community does not outlive the
+/// call. The reply's identifier is stored in `message.request_id` but not checked.
 ///
 /// Returns SNMP_OK for a valid reply, SNMP_ERR_CODEC when the message cannot be encoded and when no
 /// valid reply comes in time, and SNMP_ERR_TRANSPORT when no socket can be opened. With

@@ -21,8 +21,8 @@ void describeModels(const Lists& lists, Report& report);
 /// each of them.
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
-/// Checks that the wireless set-up tool exists, has a program and a name, and bears the maker's
-/// name in every language.
+/// Checks that the wireless set-up tool exists and has a program and a name, and that every
+/// translation of the name contains the maker's name.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
 /// Checks the application's program file, and its list of the countries that have the online

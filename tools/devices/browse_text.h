@@ -30,8 +30,8 @@ struct TextStyle {
 /// Returns the last lines of the output: delays, network problems and the numbers of devices.
 [[nodiscard]] std::string summaryOf(const BrowseResult& result, const TextStyle& style);
 
-/// Returns a request and its reply as trees and in hexadecimal, indented by `indent` spaces. Leaves
-/// out either if it has no bytes.
+/// Returns a request and its reply as trees and in hexadecimal, indented by `indent` spaces. A
+/// request or reply without bytes is left out.
 [[nodiscard]] std::string packetsOf(const Exchange& exchange, std::size_t indent);
 
 /// Returns an exchange as one line without a line feed, such as "127.0.1.5: 2 after 0.4 ms".

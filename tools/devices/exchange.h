@@ -50,9 +50,9 @@ struct Answer {
   [[nodiscard]] const Exchange* telling() const;
 };
 
-/// Asks the device at `addresses`, an array of strings, exactly as the wizard does, and as often.
-/// Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does not change
-/// active_interface_table. May be called on any thread.
+/// Asks the device at `addresses`, an array of strings, exactly as the wizard does, repetitions
+/// included. Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does
+/// not change active_interface_table. May be called on any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 
 /// Returns the name of an error status (RFC 1157 section 4.1.1), such as "noSuchName", or "error
