@@ -1,7 +1,7 @@
 """Plays a device that answers the first request on port 161: broadcast_device.py KIND
 
-KIND is the number to answer, or "stutter" or "flood" for a device that answers many times, partly with
-malformed replies."""
+KIND is the number to answer, or "stutter" or "flood" for a device that answers many times,
+partly with malformed replies."""
 
 import socket
 import sys

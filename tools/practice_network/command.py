@@ -78,8 +78,8 @@ PracticeNetwork find the network through the environment variable ONRAMP_PRACTIC
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
 do by default. Abstract sockets and TCP connections to the X server do not work inside.
-XDG_RUNTIME_DIR is a new, empty folder. The session bus, Wayland and the accessibility bus of your desktop cannot be
-reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
+XDG_RUNTIME_DIR is a new, empty folder. The session bus, Wayland and the accessibility bus of your
+desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
 exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description,
 77 if this machine cannot create namespaces, 125 if the network did not start, 126 or 127 if COMMAND

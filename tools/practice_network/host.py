@@ -62,7 +62,8 @@ def run(*command):
 
 
 def take_over_run():
-    """Mounts an empty /run, and hides this machine's own Avahi services, in this process's namespace."""
+    """Mounts an empty /run in this process's mount namespace, and hides this machine's Avahi services.
+    """
     # These services would appear among the made-up devices.
     if pathlib.Path("/etc/avahi/services").is_dir():
         run("mount", "-t", "tmpfs", "none", "/etc/avahi/services")
