@@ -138,7 +138,7 @@ MISTAKES = [
     (rename(DESCRIPTION, "PKG_WebLink", "PKG_WebLnk", "InstallPKG"), "key-misspelt", "PKG_WebLink"),
     (put(MODELS, "Model", MODEL, "Interfaces", "USB", "NO"), "value-kind", '"NO"', "<false/>"),
     (put(MODELS, "Model", MODEL, "x"), "value-kind", "a dictionary", "USB only"),
-    (cut_binary, "list-unreadable", "cut off", "opens at once"),
+    (cut_binary, "list-unreadable", "trailer", "opens at once"),
     (replace(MODELS, "</dict>", "</array>"), "list-unreadable", '"</dict>" is expected'),
     (replace(MODELS, "<true/>", "<treu/>"), "list-unreadable", "<treu>", "line 12"),
     (replace(MODELS, "<true/>", ""), "list-unreadable", "no value follows"),

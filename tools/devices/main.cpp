@@ -32,7 +32,7 @@ const std::string kHostsExamples = R"(
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
   CLI::App* const command = app.add_subcommand(
-      "browse", "Show the announced devices, and why the wizard lists each or not");
+      "browse", "Show the announced devices, and explain which of them the wizard lists");
   command->footer("Examples:" + kBrowseExamples);
   command->add_option("-m,--medium", options.medium, "The folder that contains the application")
       ->required()
