@@ -29,16 +29,16 @@ class Wizard : public testing::Test {
   }
   void TearDown() override { screen.reset(); }
 
-  /// Writes a medium with a package and two models: "All" (USB, wired, wireless) and "Cable" (USB
-  /// only). `more` holds further entries of Common.plist.
+  /// Writes the property lists of a medium with a package and two models: "All" (USB, wired,
+  /// wireless) and "Cable" (USB only). `more` holds further entries of Common.plist.
   void describeTwoModels(const Dictionary& more = {}) const {
     describe({{"All", recording::model(true, true, true)},
               {"Cable", recording::model(true, false, false)}},
              more);
   }
 
-  /// Writes a medium with a package and `models`: pairs of a name and what recording::model()
-  /// returns.
+  /// Writes the property lists of a medium with a package and `models`. Each model is a pair of a
+  /// name and a result of recording::model().
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
     names.reserve(models.size());

@@ -15,7 +15,7 @@
 
 namespace onramp::recording {
 
-/// One object of the user interface, in the state that the program has given it.
+/// One object of the user interface, with the values that the program has set.
 struct Object {
   OutletKind kind = OutletKind::kView;
   std::string name;
@@ -83,15 +83,15 @@ class FrontEnd {
   std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
   std::vector<ShownAlert> alerts;
   std::vector<std::pair<AlertSheet, std::function<void(int)>>> sheets;  ///< with their handlers
-  std::vector<unsigned> pauses;     ///< seconds of every pause off the main thread
+  std::vector<unsigned> pauses;     ///< the length of every sleepOffMainThread(), in seconds
   std::vector<double> delays;       ///< the delay of every timer, in seconds
   std::vector<std::string> opened;  ///< every path and address that was to be opened
   bool terminated = false;
 
   // What a test sets up.
-  std::set<std::string> missingInterfaces;
+  std::set<std::string> missingInterfaces;     ///< the interface files that cannot be loaded
   std::function<void(int pause)> duringPause;  ///< called on the main thread; pauses count from 1
-  std::function<void()> duringOpening;         ///< called while the desktop is asked to open
+  std::function<void()> duringOpening;  ///< called whenever the desktop is asked to open something
 
  private:
   Object& addMenuObject(OutletKind kind, const std::string& text);

@@ -17,7 +17,7 @@ class Network {
   /// Returns to the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
-  /// Makes a service object like those that browse events carry.
+  /// Makes a service like those that a browser passes to its client.
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
                                              const std::string& domain = "local.");
 
