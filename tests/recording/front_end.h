@@ -23,18 +23,18 @@ struct Object {
   bool enabled = true;
   bool animating = false;
   bool resizeIndicator = true;
-  std::string text;                                  ///< of a text field, a window, a menu item
+  std::string text;  ///< a text field's text, or any other object's title
   std::map<std::pair<int, int>, std::string> cells;  ///< titles by row and column
   int selectedRow = -1;
   int selectedColumn = -1;
   std::string imagePath;
   ImageScaling scaling = ImageScaling::kProportionallyDown;
   ArrayController* content = nullptr;
-  std::map<std::string, std::string> headers;  ///< of a table's columns, by their identifiers
+  std::map<std::string, std::string> headers;  ///< the titles of a table's columns, by identifier
   std::set<std::string> fixedColumns;          ///< the columns that the user cannot edit
   bool columnsCanMove = true;
   bool columnsCanBeSelected = true;
-  std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
+  std::vector<std::pair<std::string, std::function<void()>>> items;  ///< a pop-up button's items
   Object* superview = nullptr;
   std::vector<Object*> subviews;
   std::string action;
