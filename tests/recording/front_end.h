@@ -23,7 +23,8 @@ struct Object {
   bool enabled = true;
   bool animating = false;
   bool resizeIndicator = true;
-  std::string text;  ///< a text field's text, or any other object's title
+  /// The text of a text field, or the title of a window, button or menu item.
+  std::string text;
   std::map<std::pair<int, int>, std::string> cells;  ///< titles by row and column
   int selectedRow = -1;
   int selectedColumn = -1;
@@ -50,13 +51,13 @@ struct ShownAlert {
 };
 
 /// A front end without a screen, and a desktop that opens nothing. It records what the program
-/// shows and asks for, and plays the user and the clock. Time passes only in runTimers(). The
-/// pauses in the wait for a device search take no time.
+/// shows and asks for, and plays the user and the clock. Time passes only in runTimers().
+/// sleepOffMainThread() does not sleep; it records the pause and calls `duringPause`.
 class FrontEnd {
  public:
   static FrontEnd& instance();
 
-  /// Returns to the state of a new process.
+  /// Returns to the state of a new process, but keeps the objects of pages that still exist.
   void reset();
 
   /// Launches the application for `delegate` as the platform does, up to the point where it waits
@@ -89,9 +90,11 @@ class FrontEnd {
   bool terminated = false;
 
   // What a test sets up.
-  std::set<std::string> missingInterfaces;     ///< the interface files that cannot be loaded
-  std::function<void(int pause)> duringPause;  ///< called on the main thread; pauses count from 1
-  std::function<void()> duringOpening;  ///< called whenever the desktop is asked to open something
+  std::set<std::string> missingInterfaces;  ///< the interface files that cannot be loaded
+  /// Called on the main thread during each pause, with the number of the pause, which starts at 1.
+  std::function<void(int pause)> duringPause;
+  /// Called when the program opens a file or an address.
+  std::function<void()> duringOpening;
 
  private:
   Object& addMenuObject(OutletKind kind, const std::string& text);
