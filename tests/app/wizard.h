@@ -80,7 +80,8 @@ class Wizard : public testing::Test {
     screen.object("deviceListPopupButton").items.at(index).second();
   }
 
-  /// Lets a wireless device of the maker Kestrel appear on the network at 192.0.2.`host`.
+  /// Lets a wireless device of the maker Kestrel appear on the network at 192.0.2.`host`. Only a
+  /// search that is running finds the device.
   void appear(const std::string& name, const std::string& model, unsigned char host) const {
     const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
     agents.answers["192.0.2." + std::to_string(host)] = {2};

@@ -50,9 +50,10 @@ struct ShownAlert {
   std::string buttonTitle;
 };
 
-/// A front end without a screen, and a desktop that opens nothing. It records what the program
-/// shows and asks for, and plays the user and the clock. Time passes only in runTimers().
-/// sleepOffMainThread() does not sleep; it records the pause and calls `duringPause`.
+/// A front end without a screen, and a desktop that opens nothing but reports success. The front
+/// end records what the program shows and asks for, and plays the user and the clock. Alerts return
+/// at once. Time passes only in runTimers(). sleepOffMainThread() does not sleep; it records the
+/// pause and calls `duringPause`.
 class FrontEnd {
  public:
   static FrontEnd& instance();
