@@ -5,7 +5,7 @@
 namespace onramp::qt {
 
 /// Gives a window the size that its contents need, and prevents the user from resizing it. The
-/// window grows with its contents, up to the size of the screen, and never shrinks.
+/// window grows with its contents, up to the size of the screen, but does not shrink with them.
 class ContentSize final : public QObject {
   Q_OBJECT
 

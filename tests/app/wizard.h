@@ -18,8 +18,8 @@ namespace onramp {
 inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
-/// Runs the wizard from a temporary medium on a scripted network. Its functions see and use the
-/// wizard as a person does.
+/// Runs the wizard from a temporary medium on a scripted network. Its functions prepare the medium
+/// and the network, and see and use the wizard as a person does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {
@@ -29,15 +29,15 @@ class Wizard : public testing::Test {
   }
   void TearDown() override { screen.reset(); }
 
-  /// Writes a medium with a package and two models: "All" (USB, wired, wireless) and "Cable" (USB
-  /// only). `more` holds further entries of Common.plist.
+  /// Describes a medium with a package and two models: "All" (USB, wired, wireless) and "Cable"
+  /// (USB only). `more` holds further entries of Common.plist.
   void describeTwoModels(const Dictionary& more = {}) const {
     describe({{"All", recording::model(true, true, true)},
               {"Cable", recording::model(true, false, false)}},
              more);
   }
 
-  /// Writes a medium with a package and `models`: pairs of a name and what recording::model()
+  /// Describes a medium with a package and `models`: pairs of a name and what recording::model()
   /// returns.
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;

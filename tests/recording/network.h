@@ -40,10 +40,10 @@ class Network {
   /// "Office._ipp._tcp.local.". Such a resolve of any other service fails.
   std::map<std::string, std::vector<Data>> answers;
 
-  bool searchesStart = true;                 ///< when false, no search can be started
-  std::string domain;                        ///< of the latest search
-  std::vector<double> timeouts;              ///< of every resolve
-  bool cancelled = false;                    ///< whether the latest resolve was cancelled
+  bool searchesStart = true;     ///< when false, no search can be started
+  std::string domain;            ///< of the latest search
+  std::vector<double> timeouts;  ///< of every resolve
+  bool cancelled = false;        ///< whether cancel() was called after the latest resolve began
   std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 
