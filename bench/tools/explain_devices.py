@@ -2,8 +2,8 @@
 """Compares onramp-devices with avahi-browse on a large network.
 
 In each round, measures the time until onramp-devices has explained every device, and the time in
-which avahi-browse resolves the same devices. Adds the time of the slowest SNMP answer to the second
-time, and prints the ratio of the two.
+which avahi-browse resolves the same devices. Prints the ratio of the first time to the sum of the
+second time and the time of the slowest SNMP answer.
 
     bench/tools/explain_devices.py [--devices 500] [--rounds 5]
 """

@@ -6,9 +6,9 @@ Usage: find_devices.py [MEDIUM]
 MEDIUM is a built medium (default: build/medium of this source tree).
 
 The wizard's time is that from the key press that starts a search until the list has 1 or 50
-wireless devices. The other time is that of avahi-browse, until it has resolved the same devices,
-plus the times of one snmpget for each device. Neither time includes the pauses in which the wizard
-waits for its search.
+wireless devices. The tools' time is the time until avahi-browse has resolved the same devices, plus
+the time of one snmpget for each device. Neither time includes the pauses in which the wizard waits
+for its search.
 """
 
 import os

@@ -101,8 +101,8 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts the daemon with `settings` in place of those in its configuration. The settings'
-        names have "_" in place of "-"."""
+        """Starts the daemon. `settings` replace those in its configuration file; their names have
+        "_" in place of "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

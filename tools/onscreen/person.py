@@ -51,7 +51,7 @@ class Person:
         gi.require_version("Atspi", "2.0")
         from gi.repository import Atspi, GLib
         self._atspi = Atspi
-        self.errors = GLib.Error, AttributeError  # raised when a control that is gone is used
+        self.errors = GLib.Error, AttributeError  # raised by the use of a control that no longer exists
         self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 

@@ -59,7 +59,7 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """Starts to forward each request for `address`, a broadcast address, to every agent.
+        """From now on, forwards each request for `address`, a broadcast address, to every agent.
 
         The agents do not receive broadcasts, because they listen only at their own addresses.
         """

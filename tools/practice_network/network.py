@@ -164,7 +164,7 @@ class Network:
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())
                 if behaviour != description.CLOSED}
         if isinstance(device.addresses, int):
-            # The network's first addresses are left to the hosts.
+            # The network's first addresses are reserved for the hosts.
             hosts = itertools.islice(self._subnet.hosts(), 256 if self._subnet.is_loopback else 9,
                                      None)
             avoided = used if device.is_closed() else used | self._addresses_of_others(name)

@@ -12,8 +12,8 @@ ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
 # The flags mean: unique, no probes, several records for one name. Probes are unnecessary, because
-# nobody else uses these host names. They would also do harm: on loopback, Avahi receives its own
-# probes, and if it has replaced the record meanwhile, it takes the probe for a conflict.
+# nobody else uses these host names. They would also do harm. On loopback, Avahi receives its own
+# probes. If it has replaced the record since it sent a probe, it treats this probe as a conflict.
 ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
 ADDRESS_SECONDS = dbus.UInt32(120)  # RFC 6762, section 10
 CLASS_IN, TYPE_A, TYPE_AAAA = dbus.UInt16(1), dbus.UInt16(1), dbus.UInt16(28)
@@ -100,7 +100,7 @@ class Publisher:
         """Waits until Avahi has finished probing for the device's name, for at most `seconds`.
 
         The device's records must not change during the probes. On loopback, Avahi receives its own
-        probes. If a probe has an older text than the record, Avahi takes it for a conflict.
+        probes. If a probe has an older text than the record, Avahi treats the probe as a conflict.
         """
         deadline = time.monotonic() + seconds
         while self.state(device) == "probing" and time.monotonic() < deadline:
