@@ -196,7 +196,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// - 1: the wizard reappears. After an automatic start, it shows the connection page, with the
   ///   wireless choice selected;
   /// - 2: the application terminates;
-  /// - any other status, or a tool that cannot be run: the wizard shows the chooser and searches.
+  /// - any other status, or none: the wizard reappears, shows the chooser and searches.
   /// launchWLANToolAutomatically() is for a search that found no device, and
   /// launchWLANToolManually() for the user's request.
   void launchWLANToolAutomatically();
