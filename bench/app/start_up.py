@@ -33,7 +33,8 @@ def measure(build, env, program):
 
 
 def medium_with(folder, count):
-    """Returns the wizard on a medium whose last model differs, so that the wizard must read all."""
+    """Makes a medium of `count` models and returns its wizard. The last model differs from the
+    others, so that the wizard has to read all of them to choose the first page."""
     models = {f"Kestrel Model {i:05}": media.model(usb=True, wired=i + 1 < count, wireless=True)
               for i in range(count)}
     medium = media.make(pathlib.Path(folder) / str(count), ROOT / "build/medium", models)
@@ -51,7 +52,7 @@ def run_all(build, rounds):
         for round_ in range(rounds + 1):
             for name, program in programs.items():
                 result = measure(build, env, program)
-                if round_ > 0:  # the first round fills the file cache
+                if round_ > 0:  # the first round only fills the file cache
                     runs[name].append(result)
     return {name: list(zip(*results)) for name, results in runs.items()}
 

@@ -5,8 +5,8 @@ Measures 1 to 500 services on dual-stack networks with one interface and with tw
 time is from the start of a program until it prints the line about the last service that it
 resolves. The warm part has one host, whose Avahi daemon has all services in its cache. The cold
 part has two hosts joined by virtual cables. In that part, the Avahi daemon of the searching host is
-restarted before every search, so that its cache is empty. The warm part ends with the processor
-time of a search that is left idle.
+restarted before every search, so that its cache is empty. The warm part also prints the processor
+time of a search that keeps running after it has found everything.
 """
 
 import argparse
@@ -37,7 +37,8 @@ IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """Returns the time from the start of `command` until it has named `count` services."""
+    """Returns the seconds from the start of `command` until it has named `count` services.
+    `name_of` returns the service that an output line names, or None."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:
@@ -66,7 +67,8 @@ def grow_to(network, count):
         network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
                     model="Model 100")
     network.settle()
-    # New services repeat their announcements for a while, which would fill an empty cache.
+    # For a while, Avahi repeats the announcements of new services. These would fill the empty
+    # cache.
     time.sleep(14 + 0.1 * count)
 
 
@@ -86,7 +88,7 @@ def compare(state, interfaces, probe, quick, report):
                 if state == "cold":
                     empty_cache()
                 seconds = program(*arguments)
-                if round_number:  # The first round is a warm-up.
+                if round_number:  # The first round is only a warm-up.
                     samples[program].append(seconds)
         report.add(Case(f"Discovery, {'full' if state == 'warm' else 'empty'} cache, {interfaces} "
                         f"interface{'s' * (interfaces > 1)}", f"{count} service{'s' * (count > 1)}",

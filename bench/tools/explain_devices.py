@@ -24,7 +24,7 @@ COUNTS, QUICK_COUNTS = (1, 20, 100, 500), (1, 500)
 ROUNDS, QUICK_ROUNDS = 7, 5
 TYPE = "_pdl-datastream._tcp"
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
-ANSWERING = 50  # the other devices refuse requests, so they need no agent
+ANSWERING = 50  # the other devices have the setting activeif = "closed", so they have no agent
 AGENTS = [f"127.0.5.{number + 1}" for number in range(ANSWERING)]
 
 

@@ -30,7 +30,8 @@ TYPE = "_pdl-datastream._tcp"
 
 
 def time_of_tools(count):
-    """Returns the time until avahi-browse has resolved the devices and snmpget has asked each."""
+    """Returns the seconds until avahi-browse has resolved `count` devices and snmpget has asked
+    each of them."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
                     stderr=subprocess.DEVNULL, text=True)

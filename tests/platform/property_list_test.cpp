@@ -71,7 +71,7 @@ TEST(AtomicWriting, AFailureLeavesTheOldFileAndNothingElse) {
   const Dictionary before{{"k", "before"}};
   ASSERT_TRUE(writeDictionaryAtomically(before, folder / "list"));
   EXPECT_EQ(statusOfWriterPastItsLimit(folder / "list", surviveFailedWrites), 0)
-      << "the process was killed, or reported success";
+      << "the writer survives and reports the failure";
   EXPECT_EQ(loadDictionary(folder / "list"), before);
   EXPECT_THAT(folder.names(), testing::ElementsAre("list"));
 }
@@ -83,7 +83,8 @@ TEST(AtomicWriting, AKilledWriterKeepsTheOldFileAndRemovalDeletesItsLeftovers) {
   for (const std::string& name : {std::string("list"), longest}) {
     ASSERT_TRUE(writeDictionaryAtomically(before, folder / name));
     EXPECT_TRUE(WIFSIGNALED(statusOfWriterPastItsLimit(folder / name, [] {})));
-    EXPECT_EQ(folder.names().size(), 2U) << "the list and the unfinished new one";
+    EXPECT_EQ(folder.names().size(), 2U)
+        << "there are the list and the killed writer's temporary file";
     EXPECT_EQ(loadDictionary(folder / name), before);
     removeDictionary(folder / name);
     EXPECT_THAT(folder.names(), testing::IsEmpty());
