@@ -5,7 +5,7 @@ In each round, measures the time until onramp-devices has explained every device
 which avahi-browse resolves the same devices. Prints the ratio of the first time to the sum of the
 second time and the time of the slowest SNMP answer.
 
-    bench/tools/explain_devices.py [--devices 500] [--rounds 5]
+    bench/tools/explain_devices.py [--devices 500] [--rounds 5] [--build build/release]
 """
 
 import argparse
