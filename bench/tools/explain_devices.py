@@ -1,8 +1,9 @@
 #!/usr/bin/python3
 """Compares onramp-devices with avahi-browse on a small and on a large network.
 
-Measures the time until onramp-devices has explained every device, beside the time that avahi-browse
-takes to resolve the same devices plus the time of the slowest SNMP answer.
+In each round, measures the time until onramp-devices has explained every device, and the time in
+which avahi-browse resolves the same devices. The peer's time is the latter plus the time of the
+slowest SNMP answer.
 """
 
 import os

@@ -1,10 +1,11 @@
 #!/usr/bin/python3
 """Compares the wizard's search with avahi-browse and snmpget on the same practice network.
 
-Measures the time from the key press that starts a search until the list has all wireless devices.
-Compares it with the time that avahi-browse takes to resolve the same devices plus the time of one
-snmpget for each device. Neither time includes the pauses of the wizard's wait. The search ends
-after its first pause, so a network is left out if a search does not find all of its devices.
+The wizard's time is that from the key press that starts a search until the list has all wireless
+devices. The tools' time is the time until avahi-browse has resolved the same devices, plus the time
+of one snmpget for each device. Neither time includes the pauses in which the wizard waits for its
+search. The search ends after its first pause, so a network is left out if a search does not find all
+of its devices.
 """
 
 import os
