@@ -1,4 +1,4 @@
-# Compiler options for all targets, and a function for each kind of target.
+# Compiler options for all targets, and functions that add libraries, backends and tests.
 
 add_library(onramp_options INTERFACE)
 target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})

@@ -22,7 +22,7 @@ PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
 
 class DescriptionError(Exception):
-    """Raised for a bad description. The text names the file, the device and the remedy."""
+    """Raised for a bad description or request. The text says what is wrong."""
 
 
 @dataclasses.dataclass(frozen=True)

@@ -22,7 +22,8 @@ GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 
 
 
 class PublishError(Exception):
-    """Raised when Avahi refuses a request or is not running. The text says which."""
+    """Raised when Avahi does not start, and when it does not publish a device in time. The text
+    says which."""
 
 
 def connect(bus_address, seconds=10):
