@@ -83,12 +83,14 @@ constexpr std::array kTypeRules{
 };
 
 constexpr std::array kOptionRules{
-    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets the value unchanged"},
-    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "the value counts as true"},
+    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional,
+            "the package does not get the intended value"},
+    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional,
+            "an absent key counts as false, a value of another kind as true"},
     KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value unchanged"},
+            "the package does not get the intended value"},
     KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value unchanged"},
+            "the package does not get the intended value"},
     KeyRule{"PKG_FontSet", Kind::kAny, Need::kOptional, "the fonts are not installed"},
 };
 
@@ -97,10 +99,10 @@ constexpr std::array kModelInformationRules{
 };
 
 constexpr std::array kModelRules{
-    KeyRule{
-        "KSCID", Kind::kText, Need::kRequired,
-        "the model offers no connection at all: the package opens as soon as the model is chosen",
-        ": the model's identifier at the support centre"},
+    KeyRule{"KSCID", Kind::kText, Need::kRequired,
+            "without \"KSCID\", the model offers no connection at all: the package opens as soon "
+            "as the model is chosen",
+            ": the model's identifier at the support centre"},
     KeyRule{"Interfaces", Kind::kDictionary, Need::kAdvised, "the model has USB only"},
 };
 

@@ -16,8 +16,8 @@ void writeText(std::ostream& out, const Report& report, std::size_t width);
 /// are not UTF-8 become replacement characters.
 void writeJSON(std::ostream& out, const Report& report);
 
-/// Writes a line for every text that the wizard shows: the text's key, the room for it, and the
-/// place where it is shown.
+/// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
+/// room for it, how often "%@" has to occur in it, and the place where it is shown.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check
