@@ -99,7 +99,7 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  bool isResolved_ = false;  ///< by the last resolve; the framework may keep an earlier result
+  bool isResolved_ = false;  ///< the framework may keep the result of an earlier resolve
 };
 
 }  // namespace

@@ -94,10 +94,10 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     }
   }
 
-  // Updates the number of the service's sightings. The framework may report a sighting for each
-  // network interface, and may pass a different object each time. If this sighting is the first
-  // one, or if the last one has ended, returns the object that the first sighting passed. Returns
-  // null otherwise.
+  // Updates the number of the service's sightings. `isSeen` is false when a sighting has ended. The
+  // framework may report a sighting for each network interface, and may pass a different object
+  // each time. If this sighting is the first one, or if the last one has ended, returns the object
+  // that the first sighting passed. Returns null otherwise.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
       return found.service->name() == service->name() && found.service->type() == service->type() &&
@@ -147,7 +147,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Client client_;
   void* info_;
   Reference<CFNetServiceBrowserRef> browser_;
-  Reference<CFStringRef> domain_;  ///< null when no search is running
+  Reference<CFStringRef> domain_;  ///< null unless a search was asked for
   Reference<CFStringRef> type_;
   std::vector<Found> found_;
   unsigned long search_ = 0;  ///< the search's number; earlier searches are not retried

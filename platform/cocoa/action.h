@@ -5,7 +5,7 @@
 #include <functional>
 
 /// Holds a function. An object of this class can be the target of a control, a menu item, a timer
-/// or performSelectorOnMainThread:, which then call the function through perform:.
+/// or performSelectorOnMainThread:. Each of them calls the function through perform:.
 @interface OnrampAction : NSObject {
   std::function<void()> _function;
 }

@@ -41,7 +41,7 @@
 }
 
 // Lets the user quit only if the controller lets the window close. Does not ask the controller
-// after terminateApplication().
+// after a call of terminateApplication().
 - (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
   if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
   NSBeep();

@@ -30,7 +30,8 @@ class Reader {
   }
 
  private:
-  // The two Boolean objects are singletons. The kind of any other number follows from its C type.
+  // Only two Boolean objects exist, so comparing pointers recognises a Boolean. The C type of any
+  // other object tells whether the number is real.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);
@@ -45,8 +46,8 @@ class Reader {
   }
 
   // Several containers may share one string or data object, but each value gets a copy. So the
-  // limit on the size of a file also limits the total size of the copies. A string counts by its
-  // UTF-16 units.
+  // total size of the copies has the same limit as the size of a file. A string counts by its
+  // UTF-16 units. Returns false when the limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;
     if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;

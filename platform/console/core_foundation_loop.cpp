@@ -38,7 +38,7 @@ bool hasEnded = false;  // main thread only
 void runMainLoop() {
   hasEnded = false;
   // CFRunLoopRunInMode() returns after it has handled a source, after 0.1 seconds, or at once if
-  // the loop has neither sources nor timers. So it is called until an action has called
+  // the loop has neither sources nor timers. So this function calls it until an action has called
   // endMainLoop().
   while (!hasEnded)
     CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);

@@ -1,11 +1,12 @@
 #!/usr/bin/python3
 """Random walks over the wizard's real window while devices come and go.
 
-Usage: walk.py [--seed N] [--count N] MEDIUM
+Usage: walk.py [--seed S] [--count N] MEDIUM
 
-Walk number i, counted from 0, uses the seed N + i, so `--seed N+i --count 1` repeats it. A walk fails
-when the program exits with an error, when the main loop hangs, when the window cannot be closed at the
-end, or when a file for the package is incomplete. A failed walk prints its seed and its steps.
+The seeds of the N walks are S, S + 1 and so on, so `--seed S --count 1` repeats the walk with the seed S.
+A walk fails, for example, when the program exits with an error, when the main loop hangs, when the window
+cannot be closed at the end, or when a file for the package is incomplete. A failed walk prints its seed
+and its steps.
 """
 
 import argparse
@@ -36,8 +37,8 @@ PRINTER = "_pdl-datastream._tcp"
 # Hide is never clicked, because the desktop has no task bar that could bring the window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
-# The active interfaces that the devices report. With each of them, a device answers at once, so the
-# wizard never waits.
+# What a device reports as its active interface. With each of these values, the device answers at
+# once, so the wizard never waits for an answer.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
 
 
