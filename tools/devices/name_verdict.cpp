@@ -107,10 +107,13 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
   const std::string model = device.record.string(KSDevice::kUSBModel).value_or("");
   const auto keys = identityKeysOf(device.type);
   if (!keys) {
-    return Verdict{.id = "other-type",
-                   .why = "announced as " + device.type +
-                          ", a type under which the wizard reads no maker and model",
-                   .remedy = "switch on the device's " + medium.type + " service"};
+    return Verdict{
+        .id = "other-type",
+        .why = "announced as " + device.type +
+               ", a type under which the wizard reads no maker and model",
+        .remedy = device.type == medium.type
+                      ? "write another of the device's types into the medium's BonjourNetwork"
+                      : "switch on the device's " + medium.type + " service"};
   }
   if (model.empty()) return missingKey(device, keys->model, kModelKeys);
   if (maker.empty()) return missingKey(device, keys->manufacturer, kMakerKeys);

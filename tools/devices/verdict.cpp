@@ -23,7 +23,15 @@ std::string joined(const std::vector<std::string>& texts) {
   return all;
 }
 
+// Judges a device that the wizard does not list although it has sent the value `value`.
 Verdict judgeValue(std::int64_t value) {
+  if (value == kActiveIFWireless) {
+    return {.id = "no-answer",
+            .why = "reports wireless, but then leaves the wizard's last question without an answer",
+            .remedy =
+                "search again; if that does not help, look for lost packets between the device "
+                "and this computer"};
+  }
   const bool isCable = value == 1;
   return {.id = isCable ? "on-cable" : "other-interface",
           .why = (isCable ? "on cable: reports interface " : "reports interface ") +
