@@ -20,6 +20,7 @@ constexpr const char* kPackageAtOnce =
 constexpr const char* kNoModels =
     "the medium has no models, so the package opens at once, without any page";
 constexpr const char* kNoPackage = "nothing opens when the wizard ends";
+constexpr const char* kNoVersionPackage = "nothing opens on the systems that use this key";
 
 constexpr std::array kInformationRules{
     KeyRule{"CommonResourcePath", Kind::kPath, Need::kRequired, kNoModels},
@@ -46,12 +47,12 @@ constexpr std::array kResourceRules{
 constexpr std::array kPackageRules{
     KeyRule{"PkgLocation", Kind::kPath, Need::kRequired, kNoPackage},
     KeyRule{"PkgName", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"104", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"105", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"106", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"107", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"108", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"109", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"104", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"105", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"106", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"107", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"108", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"109", Kind::kText, Need::kOptional, kNoVersionPackage},
 };
 
 constexpr std::array kMinimumRules{
