@@ -21,16 +21,16 @@ inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< b
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
 /// Returns the model information of the medium that the wizard is on: the dictionary in the file
-/// that "ModelInfo" names. Returns nothing when this file cannot be read.
+/// that "ModelInfo" names. Returns nothing when there is no such dictionary.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 
 /// Returns the record of the model `name` according to the medium's model information.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
 /// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
-/// in it supports USB only and has an empty identifier. A listed model supports USB, but no
-/// network, unless its entry says otherwise. The record of a listed model without an identifier
-/// ("KSCID") holds nothing but the name. Without a name, the record is empty.
+/// there supports USB only and has an empty identifier. A listed model supports USB, but no
+/// network, unless its entry says otherwise. If the entry of a listed model has no identifier
+/// ("KSCID"), the record holds only the name. When `name` is nothing, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);
 

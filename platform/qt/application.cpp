@@ -46,10 +46,9 @@ void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
   parser.setApplicationDescription(
       QStringLiteral("Sets up a new device from the medium that this application is on."));
-  const QCommandLineOption version(
-      QStringLiteral("system-version"),
-      QStringLiteral("The system version that the wizard assumes is running."),
-      QStringLiteral("X.Y.Z"));
+  const QCommandLineOption version(QStringLiteral("system-version"),
+                                   QStringLiteral("Treat the system as this version of macOS."),
+                                   QStringLiteral("X.Y.Z"));
   parser.addOption(version);
   const QCommandLineOption help = parser.addHelpOption();
   const QCommandLineOption ownVersion = parser.addVersionOption();
@@ -80,8 +79,9 @@ bool asksForInformation(int argc, char** argv) {
   });
 }
 
-// Reports a missing display and ends the process. Qt itself would abort the process. Drops all
-// other messages unless QT_DEBUG_PLUGINS is set.
+// On a fatal message, which Qt sends when there is no display, reports the missing display and ends
+// the process. Qt itself would abort the process. Drops all other messages unless QT_DEBUG_PLUGINS
+// is set.
 void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
   if (type == QtFatalMsg) {
     std::fprintf(stderr,

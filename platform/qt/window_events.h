@@ -10,8 +10,9 @@ class ApplicationDelegate;
 
 namespace qt {
 
-/// Lets the delegate decide whether a window may close, and lets some keys click buttons of the
-/// window or open its menu.
+/// Lets the delegate decide whether a window may close, and handles some keys. Escape clicks the
+/// button whose key equivalent is "Escape". Return and Enter do what performReturn() does. F10 does
+/// what openMenu() does.
 class WindowEvents final : public QObject {
   Q_OBJECT
 
@@ -31,8 +32,8 @@ class WindowEvents final : public QObject {
   /// Returns whether the key did anything.
   bool performKey(int key);
 
-  /// Clicks the button that has the focus, or else the default button. Returns whether a button was
-  /// clicked.
+  /// Clicks the button that has the focus. If no button has the focus, clicks the button whose key
+  /// equivalent is "Return". Returns whether a button was clicked.
   bool performReturn();
 
   /// Selects the first menu of the menu bar, so that the arrow keys work in the menu bar. Returns

@@ -16,8 +16,9 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// Launches the wizard with a list of `models` and goes to the connection page of the first.
-  /// The models must differ in their cables, because the wizard otherwise skips the list.
+  /// Launches the wizard on a medium with `models` and goes to the connection page of the first
+  /// model. The models must differ in their support of USB or wired Ethernet, because the wizard
+  /// otherwise skips the list.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
                               {"Cable", model(true, false, false)}}) {
@@ -42,7 +43,7 @@ class Navigation : public Wizard {
   }
 };
 
-TEST_F(Navigation, AModelChosenByCableIsHandedOverBeforeThePackageOpens) {
+TEST_F(Navigation, AModelConnectedByCableIsHandedOverBeforeThePackageOpens) {
   goToConnectionPage();
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
   EXPECT_EQ(connectionPage(), expectedConnectionPage("wiredLan.png", kUSBAndWired));

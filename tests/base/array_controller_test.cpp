@@ -15,7 +15,7 @@ Dictionary entry(const std::string& name, const std::string& number = "") {
   return Dictionary{{"name", name}, {"number", number}};
 }
 
-// Returns the names of all entries, with the selected one in brackets.
+// Returns the names and numbers of all entries, with those of the selected entry in brackets.
 std::string shown(const ArrayController& list) {
   std::string text;
   for (std::size_t i = 0; i < list.arrangedObjects().size(); ++i) {
@@ -76,7 +76,7 @@ TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
   EXPECT_EQ(list.selectionIndex(), std::nullopt);
 }
 
-// The thread sanitizer checks this test.
+// Under the thread sanitizer, this test fails if arrangedCount() is not safe on another thread.
 TEST(ArrayController, LetsAnotherThreadWaitForAnEntry) {
   ArrayController list;
   std::size_t seen = 0;

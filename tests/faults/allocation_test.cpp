@@ -37,8 +37,8 @@ void failEveryAllocation(const Work& work) {
   EXPECT_FALSE(seen.empty()) << "nothing was allocated";
 }
 
-TEST(AllocationFailure, AParserOfForeignBytesReturnsAllOrThrows) {
-  // Longer than the texts that std::string stores without allocating.
+TEST(AllocationFailure, AParserReturnsItsWholeResultOrThrows) {
+  // This text is too long for std::string to store without an allocation.
   const std::string text(40, 'x');
   const auto values = "<array><string>" + text + "</string><data>AAAA</data><real>1.5</real>" +
                       "<dict><key>" + text + "</key><integer>7</integer></dict></array>";
