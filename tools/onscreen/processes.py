@@ -13,6 +13,14 @@ class Missing(Exception):
     """A program is not installed or does not start. The text says which one."""
 
 
+class InVain(TimeoutError):
+    """A wait in vain. `what` says for what."""
+
+    def __init__(self, seconds, what):
+        super().__init__(f"waited {seconds} s for {what}, in vain")
+        self.what = what
+
+
 def _die_with_parent():
     _libc.prctl(_PR_SET_PDEATHSIG, signal.SIGKILL)
 
@@ -24,6 +32,8 @@ def start(arguments, package=None, **options):
     except FileNotFoundError as error:
         hint = f"; install it with: apt-get install {package}" if package else ""
         raise Missing(f"{arguments[0]} was not found{hint}") from error
+    except OSError as error:
+        raise Missing(f"{arguments[0]} cannot be started: {error.strerror}") from error
 
 
 def stop(process):
@@ -40,7 +50,7 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls condition() until it returns a true value, and returns that.
 
-    Raises TimeoutError when there is none within `seconds`.
+    Raises InVain when there is none within `seconds`.
     """
     deadline = time.monotonic() + seconds
     while True:
@@ -48,5 +58,5 @@ def wait_for(condition, seconds, what):
         if value:
             return value
         if time.monotonic() > deadline:
-            raise TimeoutError(f"waited {seconds} s for {what}, in vain")
+            raise InVain(seconds, what)
         time.sleep(0.02)
