@@ -9,8 +9,9 @@
 
 namespace onramp {
 
-/// The owner of an interface file. The file binds titles to the owner's texts and names the owner's
-/// actions that clicks perform. The owner must outlive all objects that are created from the file.
+/// The owner of an interface file. The file binds titles to the owner's texts, and names the
+/// owner's action that each click performs. The owner must outlive all objects that are created
+/// from the file.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;
@@ -50,7 +51,8 @@ class Interface {
   [[nodiscard]] std::string viewClass() const;
 
   /// Returns the object that the file calls `name`, or an empty handle when no object of the
-  /// handle's kind has that name.
+  /// handle's kind has that name. On macOS, finds no menus and no menu items, and only the window
+  /// called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));
