@@ -48,8 +48,9 @@ class Tour:
         with self._visit() as visit:
             self._first = visit.first_page()
             if self._first is None:
+                mistakes = " See the mistakes that onramp-check found." * bool(self._facts.findings)
                 self._album.note("There is no page, because no model on the medium supports "
-                                 "wireless: the package opens at once.")
+                                 f"wireless, so the package opens at once.{mistakes}")
                 visit.see_package_open(1, "At once")
             elif self._first == ALERT:
                 visit.picture("0-refused", "The alert, instead of a first page")

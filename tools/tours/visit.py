@@ -138,17 +138,18 @@ class Visit:
         for file in written:
             self._album.file(f"{way}: {file.name}",
                              file.read_text(encoding="utf-8", errors="replace"))
-        self._album.note(f"{way}, the wizard {self.opened_in_words()}.")
         if len(written) != files:
-            self._album.problem(f"the wizard wrote {len(written)} files for the package instead of "
-                                f"{files}")
-        missing = [path for path in self._opened() if not (self._medium.folder / path).exists()]
-        if not self._opened():
-            self._album.problem("no package opens, because the medium names none for this system "
-                                "(PkgInfo)")
-        elif missing:
-            self._album.problem(f"the medium has no {missing[0]}, so no package opens, and users "
-                                "see nothing")
+            self._album.problem(f"{way}, the wizard wrote {len(written)} files for the package instead "
+                                f"of {files}")
+        opened = self._opened()
+        missing = [path for path in opened if not (self._medium.folder / path).exists()]
+        if missing:
+            self._album.problem(f"{way}, users see nothing, because {missing[0]} is not on the medium")
+        elif opened:
+            self._album.note(f"{way}, the wizard {self.opened_in_words()}.")
+        else:
+            self._album.problem(f"{way}, users see nothing, because the medium names no package for "
+                                f"this system. {self._medium.facts.about('PkgInfo')}")
 
     def left_nothing(self):
         """Waits for the wizard to end. Returns whether it ended well, without files."""
