@@ -68,10 +68,6 @@ class Facts:
                 chosen[model.kind] = model
         return list(chosen.values())
 
-    def first_wireless(self):
-        """Returns a list of the first model that supports wireless, if there is one."""
-        return [model for model in self.kinds() if model.wireless][:1]
-
     def about(self, key):
         """Returns what is wrong with the value of a key, in sentences; "" if nothing is."""
         said = [f"{finding['file']}: {key}: {finding['found']}. {finding['effect']}"

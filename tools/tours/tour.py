@@ -5,6 +5,7 @@ from .search import Devices, find_devices, matches_devices, search_in_vain, seco
 from .visit import ALERT, CONNECTION, MODELS, Visit, WentWrong
 
 
+_MODELS_AT_ONCE = 3  # of which devices are made up when the wizard lists the devices of all models
 _UNMATCHED = ("No device can announce the name of this model, because the name is not a maker, a space "
               "and a model.")
 
@@ -89,7 +90,14 @@ class Tour:
     # The pages.
 
     def _models(self):
-        kinds = self._facts.kinds() if self._first == MODELS else self._facts.first_wireless()
+        wireless = [model for model in self._facts.models if model.wireless]
+        if self._first == CONNECTION:
+            self._make_devices([model.name for model in wireless[:_MODELS_AT_ONCE]])
+            model = next((one for one in wireless if matches_devices(one.name)), wireless[0])
+            title = f"All models ({model.connections()})"
+            self._section(title, "all-models", lambda: self._walk(model))
+            return
+        kinds = self._facts.kinds()
         self._make_devices([model.name for model in kinds if model.wireless])
         names = file_names([model.name for model in kinds])
         for model in kinds:
@@ -131,7 +139,7 @@ class Tour:
             visit.next()
             visit.see_package_open(files, "By cable")
         if self._devices and model.name in self._searched:
-            self._walk_wireless(model, files)
+            self._walk_wireless(model)
         else:
             self._album.note(f"{self._no_devices or _UNMATCHED} So the tour leaves out the wireless "
                              "way.")
@@ -152,7 +160,7 @@ class Tour:
             visit.next()
         visit.see(CONNECTION)
 
-    def _walk_wireless(self, model, files):
+    def _walk_wireless(self, model):
         is_first = model.name == self._searched[0]
         with self._visit() as visit:
             self._go_to_list(visit, model)
@@ -166,7 +174,7 @@ class Tour:
             visit.person.click("table cell", second_of(model.name))
             visit.picture("9-choice", "A device is chosen")
             visit.next()
-            visit.see_package_open(files, "By wireless")
+            visit.see_package_open(2, "By wireless")
 
     # The alerts.
 
