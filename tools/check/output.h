@@ -16,8 +16,12 @@ void writeText(std::ostream& out, const Report& report, std::size_t width);
 /// become replacement characters.
 void writeJSON(std::ostream& out, const Report& report);
 
-/// Writes a line for every text that the wizard shows: its key, the room that it has and where it
-/// is shown.
+/// Writes a line for every key that the wizard reads from a medium's lists: its list, the kind of
+/// its value, whether it is needed, and its path.
+void writeKeys(std::ostream& out);
+
+/// Writes a line for every text that the wizard shows: its key, the room that it has, what is
+/// shown when it is missing, and where it is shown.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check
