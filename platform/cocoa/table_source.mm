@@ -22,7 +22,7 @@ NSButton* defaultButton(NSView* view) {
   return nil;
 }
 
-// Returns whether `start` occurs in `text` at the start of a word, ignoring case.
+// Returns whether a word in `text` starts with `start`. Ignores case.
 bool hasWordThatStarts(NSString* text, NSString* start) {
   NSCharacterSet* const letters = [NSCharacterSet alphanumericCharacterSet];
   NSRange rest = NSMakeRange(0, [text length]);
@@ -77,9 +77,9 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   [self showSelection];
 }
 
-// Widens all columns but the first one to fit their texts, and keeps the user from making them
-// narrower. If the table is too narrow for all columns, narrows the first one, which holds the
-// names.
+// Widens every column except the first one to fit its texts, and prevents the user from making it
+// narrower than that. If the table is then too narrow for all columns, narrows the first one, which
+// shows the names, but not below its minimum width.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -105,8 +105,8 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   if (row >= 0) _controller->choose(static_cast<std::size_t>(row));
 }
 
-// The button is clicked once the table has handled the double-click, because the button's action
-// may remove the table.
+// Clicks the button after the table has handled the double-click, because the button's action may
+// remove the table.
 - (void)goOn:(id)sender {
   if ([_table clickedRow] < 0) return;
   [defaultButton([[_table window] contentView]) performSelector:@selector(performClick:)
@@ -141,8 +141,9 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// Finds a row by the start of any word of its name. The search continues at row 0 after the last
-// row. Returns -1 when no row up to `endRow` matches.
+// Returns the first row from `startRow` on with a name in which a word starts with `typed`. After
+// the last row, the search continues with row 0. Returns -1 when no row up to and including
+// `endRow` matches.
 - (NSInteger)tableView:(NSTableView*)table
     nextTypeSelectMatchFromRow:(NSInteger)startRow
                          toRow:(NSInteger)endRow
@@ -158,7 +159,7 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   return -1;
 }
 
-// Passes the user's selection to the controller. If the user deselects the row, it is selected
+// Passes the user's selection to the controller. If the user deselects the row, selects the row
 // again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;

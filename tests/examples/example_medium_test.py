@@ -1,4 +1,4 @@
-"""Checks the example medium in ways that onramp-check does not."""
+"""Checks texts of the example medium, and runs its set-up tool. onramp-check does neither."""
 
 import os
 import plistlib
@@ -17,7 +17,7 @@ from onscreen import messages  # noqa: E402
 
 
 class Messages(unittest.TestCase):
-    def test_descriptions_call_the_next_button_by_its_title(self):
+    def test_every_description_calls_the_next_button_by_its_title(self):
         for language in LANGUAGES:
             table = messages.read(MEDIUM, language)
             for key in ("INST_TXT_MODEL_DESC", "INST_TXT_CONNECTIONTYPE_DESC"):
@@ -25,7 +25,7 @@ class Messages(unittest.TestCase):
 
 
 class Medium(unittest.TestCase):
-    def test_the_set_up_tool_exits_with_the_status_that_it_is_given(self):
+    def test_the_set_up_tool_exits_with_the_status_in_the_variable_or_with_64(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
         for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):

@@ -38,7 +38,7 @@ struct Object {
   Object* superview = nullptr;
   std::vector<Object*> subviews;
   std::string action;
-  InterfaceOwner* owner = nullptr;  ///< the owner that its interface file was loaded for
+  InterfaceOwner* owner = nullptr;  ///< the owner of the object's interface file
 
   [[nodiscard]] NativeObject* native() { return reinterpret_cast<NativeObject*>(this); }
 };
@@ -63,10 +63,10 @@ class FrontEnd {
   /// for the user. The delegate must exist until the next reset().
   void launch(ApplicationDelegate& delegate);
 
-  /// The most recently loaded object with that name. The process is aborted when there is none.
+  /// Returns the most recently loaded object with that name. Aborts the process when there is none.
   [[nodiscard]] Object& object(const std::string& name);
 
-  /// Clicks a button as the user would. Nothing happens when it is hidden or disabled.
+  /// Clicks a button as the user would. Does nothing when the button is hidden or disabled.
   void click(const std::string& buttonName);
 
   /// Runs the scheduled timers, the earliest first, until none is left or the application has

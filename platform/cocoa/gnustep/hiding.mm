@@ -1,6 +1,6 @@
 // Hides and unhides the application as AppKit does. GNUstep would replace each window with an icon,
-// because the application has no icon that the user could click. A window that is brought back
-// before its icon is on the screen does not always get the keyboard focus.
+// because the application has no icon that the user could click. If a window came back before its
+// icon was on the screen, the window would not always get the keyboard focus.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -24,7 +24,8 @@ NSMutableArray* hiddenWindows() {
   return windows;
 }
 
-// When the user hides the application from the menu, GNUstep's icons are needed to bring it back.
+// A call with a sender comes from the menu. The user then needs GNUstep's icons to bring the
+// application back.
 void hide(id self, SEL selector, id sender) {
   if (sender) {
     originalHide(self, selector, sender);
