@@ -1,7 +1,6 @@
 """Compares what the documents for makers list with what the sources have, in both directions.
 Argument: onramp-check."""
 
-import json
 import re
 import subprocess
 import sys
@@ -54,7 +53,7 @@ class Book(unittest.TestCase):
 
     def test_has_every_setting_and_picture(self):
         self.assertEqual([row[0] for row in rows(BOOK, "Key in maker.json")],
-                         list(json.loads(text_of("maker.json"))))
+                         re.findall(r'^ *"(\w+)":', text_of("maker.json"), re.MULTILINE))
         pictures = re.findall(r'\{"(\w+\.png)", (\d+), (\d+)', text_of("tools/check/pictures.cpp"))
         self.assertEqual([(name, f"{width} × {height}") for name, width, height in pictures],
                          [(file.split("/")[-1], size) for file, size, *_ in rows(BOOK, r"File \| Pixels")])
@@ -63,7 +62,6 @@ class Book(unittest.TestCase):
         sources = text_of("tools/devices/*.cpp")
         verdicts = {name for names in re.findall(r'\.id = (.*?),\s*\.|differs\(("[^"]+")', sources)
                     for name in re.findall(r'"([^"]+)"', "".join(names))}
-        self.assertGreater(len(verdicts), 20)
         manual = text_of("tools/devices/onramp-devices.1").partition(".SH VERDICTS")[2].partition(".SH")[0]
         self.assertEqual(verdicts, set(re.findall(r"\\fB(.*?)\\fR", manual.replace("\\-", "-"))))
         named = re.findall(r"`((?!onramp|practice)[a-z][a-z\d-]+)`", text_of("docs/support.md"))
