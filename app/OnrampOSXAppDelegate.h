@@ -168,7 +168,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// file's folder if it is missing. Ignores failures.
   [[nodiscard]] static std::string instmodelPlistURL();
 
-  /// Builds and writes the package-options file. Ignores failures.
+  /// Writes the package-options file: the options under "InstallPKG" in the medium description, and
+  /// the five standard options that docs/mastering-a-medium.md describes. Ignores failures.
   static void copyCDInfo();
 
   /// Returns the model file's contents for a device that is connected by a USB or Ethernet cable.
@@ -191,10 +192,14 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// time to open.
   void quitMe();
 
-  /// Hide the application, run the wireless set-up tool and act on its exit status. Both functions
-  /// return before the tool starts. launchWLANToolAutomatically() is called after a search that
-  /// found no device, and launchWLANToolManually() at the user's request. Only a tool that was
-  /// started automatically can send the user back to the connection page.
+  /// Hide the application and return. Half a second later, the wireless set-up tool runs. Its exit
+  /// status decides what follows:
+  /// - 1: the wizard reappears. After an automatic start, it shows the connection page, with the
+  ///   wireless choice selected;
+  /// - 2: the application terminates;
+  /// - any other status, or a tool that cannot be run: the wizard shows the chooser and searches.
+  /// launchWLANToolAutomatically() is for a search that found no device, and
+  /// launchWLANToolManually() for the user's request.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 

@@ -11,9 +11,8 @@ namespace onramp {
 [[nodiscard]] std::optional<std::string> KSSCcurrentAddressWithInterfaceName(
     const std::string& interface_name);
 
-/// Returns the name of the primary interface, which is the one that the preferred default route
-/// uses. Returns nothing when there is no default route or when the system's configuration cannot
-/// be read.
+/// Returns the name of the primary interface, the one with the preferred default route. Returns
+/// nothing when there is no default route or when the system's configuration cannot be read.
 [[nodiscard]] std::optional<std::string> KSSCCopyCurrentInterfaceName();
 
 }  // namespace onramp

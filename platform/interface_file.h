@@ -9,8 +9,9 @@
 
 namespace onramp {
 
-/// The owner of an interface file. The file binds titles to the owner's texts and names the owner's
-/// actions that clicks perform. The owner must outlive all objects that are created from the file.
+/// The owner of an interface file. The file binds titles to the owner's texts, and names the
+/// owner's action that each click performs. The owner must outlive all objects that are created
+/// from the file.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;

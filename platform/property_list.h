@@ -29,8 +29,9 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 [[nodiscard]] std::optional<Dictionary> loadDictionary(const std::string& path);
 
 /// Writes `dictionary` to `path` as an XML property list. The write is atomic: a temporary file in
-/// the same folder is completed and then renamed. Returns false on failure. In that case a file
-/// that was at `path` is unchanged.
+/// the same folder is completed and then renamed. Returns false on failure, for example when the
+/// folder is missing. In that case a file that was at `path` is unchanged. What becomes of
+/// characters that XML does not allow depends on the backend.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
 /// Removes the file or the folder tree at `path`, and the temporary files of processes that were

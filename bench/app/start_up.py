@@ -29,7 +29,8 @@ def measure(build, env, program):
 
 
 def medium_with(folder, count):
-    """Returns the wizard on a medium whose last model differs, so that the wizard must read all."""
+    """Makes a medium of `count` models and returns its wizard. The last model differs from the
+    others, so that the wizard has to read all of them to choose the first page."""
     models = {f"Kestrel Model {i:05}": media.model(usb=True, wired=i + 1 < count, wireless=True)
               for i in range(count)}
     medium = media.make(pathlib.Path(folder) / str(count), ROOT / "build/medium", models)
@@ -50,7 +51,7 @@ def main():
         for round_ in range(ROUNDS + 1):
             for name, program in programs.items():
                 result = measure(build, env, program)
-                if round_ > 0:  # the first round fills the file cache
+                if round_ > 0:  # the first round only fills the file cache
                     runs[name].append(result)
     (empty_time, empty_memory), (plain_time, plain_memory) = (
         [statistics.median(column) for column in zip(*runs[name])]

@@ -5,12 +5,12 @@ Usage: discovery_bench.py [BUILD]
 
 BUILD is the folder of a release build (default: build/release).
 
-Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each
-measured time is from the start of a program until it prints the line about the last service that it
+Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each time is
+that from the start of a program until the program prints the line about the last service that it
 resolves. The warm part has one host, whose Avahi daemon has all services in its cache. The cold
 part has two hosts joined by virtual cables. In that part, the Avahi daemon of the searching host is
-restarted before every search, so that its cache is empty. The warm part ends with the processor
-time of a search that is left idle.
+restarted before every search, so that its cache is empty. The warm part also prints the processor
+time of a search that keeps running after it has found everything.
 """
 
 import pathlib
@@ -35,7 +35,8 @@ IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """Returns the time from the start of `command` until it has named `count` services."""
+    """Returns the seconds from the start of `command` until it has named `count` services.
+    `name_of` returns the service that an output line names, or None."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:
@@ -64,7 +65,8 @@ def grow_to(network, count):
         network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
                     model="Model 100")
     network.settle()
-    # New services repeat their announcements for a while, which would fill an empty cache.
+    # For a while, Avahi repeats the announcements of new services. These would fill the empty
+    # cache.
     time.sleep(14 + 0.1 * count)
 
 
@@ -84,7 +86,7 @@ def compare(state, interfaces, probe):
                 if state == "cold":
                     empty_cache()
                 seconds = program(*arguments)
-                if round_number:  # The first round is a warm-up.
+                if round_number:  # The first round is only a warm-up.
                     samples[program].append(seconds)
         ratios = [one / other for one, other in zip(samples[ours], samples[peer])]
         low, middle, high = statistics.quantiles(ratios)
@@ -110,7 +112,7 @@ def idle(interfaces, probe):
 
 
 def run_inside(state, interfaces, probe):
-    """Starts this program again on a practice network and returns its exit status."""
+    """Runs this program on a practice network, with --inside, and returns the exit status."""
     with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:
         description.write(f"[network]\ninterfaces = {interfaces}\n")
         description.flush()

@@ -1,6 +1,6 @@
-// Encodes the request for the SNMP object ActiveIF and decodes the reply, alternating between the
-// wizard's codec and the net-snmp library. Prints the time per message, the ratio of the times, and
-// the allocations per message.
+// Encodes the request for the SNMP object ActiveIF and decodes the reply, in turn with the wizard's
+// codec and with the net-snmp library. Prints the time for each message, the ratio of the times,
+// and the number of allocations for each message.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -21,10 +21,10 @@ long allocations = 0;
 
 }  // namespace
 
-// These functions count the calls of malloc and calloc in this process, including those inside
-// net-snmp.
+// These functions replace malloc and calloc in the whole process, net-snmp included, and count the
+// calls.
 extern "C" {
-// The C library's own names for its allocation functions.
+// The C library's own allocation functions.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
 void* __libc_calloc(std::size_t count, std::size_t size);  // NOLINT(bugprone-reserved-identifier)
 

@@ -4,10 +4,10 @@
 #include <chrono>
 #include <vector>
 
-/// The times of one operation that is measured repeatedly, in nanoseconds.
+/// The times of an operation, in nanoseconds.
 class Samples {
  public:
-  /// Runs `work` `times` times and keeps the mean time as one sample.
+  /// Runs `work` `times` times, and adds the mean time as one sample.
   template <typename Work>
   void measure(int times, Work work) {
     const auto start = std::chrono::steady_clock::now();
@@ -19,8 +19,8 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the quantile `part`, from 0 (the least sample) to 1 (the greatest), rounded down to a
-  /// sample. There must be at least one sample.
+  /// Returns the sample at the quantile `part`, from 0 (the least sample) to 1 (the greatest).
+  /// Between two samples, returns the lesser one. There must be at least one sample.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());

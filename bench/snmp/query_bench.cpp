@@ -1,5 +1,5 @@
-// Compares a whole query, from the request to the result, with a bare UDP exchange that asks the
-// same agent for the same object. The queries and the bare exchanges alternate.
+// Compares the time of a query, from the request to the result, with the time of a bare UDP
+// exchange that asks the same agent for the same object. Queries and bare exchanges alternate.
 
 #include <array>
 #include <cstdio>

@@ -1,5 +1,6 @@
 #!/usr/bin/python3
-"""Compares the times that onramp-check takes for a medium of 1,000 models and for larger media.
+"""Compares the time that onramp-check takes for a medium of 1,000 models with the times for larger
+media.
 
 Usage: check_media.py [BUILD]
 

@@ -1,9 +1,9 @@
 #!/usr/bin/env python3
 """Compares onramp-devices with avahi-browse on a large network.
 
-Measures the time until onramp-devices has explained every device. Divides it by the time that
-avahi-browse takes to resolve the same devices plus the time of the slowest SNMP answer. Prints this
-ratio for each round.
+In each round, measures the time until onramp-devices has explained every device, and the time in
+which avahi-browse resolves the same devices. Adds the time of the slowest SNMP answer to the second
+time, and prints the ratio of the two.
 
     bench/tools/explain_devices.py [--devices 500] [--rounds 5]
 """
@@ -19,7 +19,7 @@ import time
 SOURCE = pathlib.Path(__file__).resolve().parents[2]
 TYPE = "_pdl-datastream._tcp"
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
-ANSWERING = 50  # the other devices refuse requests, so they need no agent
+ANSWERING = 50  # the other devices have the setting activeif = "closed", so they have no agent
 AGENTS = [f"127.0.5.{number + 1}" for number in range(ANSWERING)]
 
 

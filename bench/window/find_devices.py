@@ -5,9 +5,10 @@ Usage: find_devices.py [MEDIUM]
 
 MEDIUM is a built medium (default: build/medium of this source tree).
 
-Measures the time from the key press that starts a search until the list has 1 or 50 wireless
-devices. Compares it with the time that avahi-browse takes to resolve the same devices plus the time
-of one snmpget for each device. Neither time includes the pauses of the wizard's wait.
+The wizard's time is that from the key press that starts a search until the list has 1 or 50
+wireless devices. The other time is that of avahi-browse, until it has resolved the same devices,
+plus the times of one snmpget for each device. Neither time includes the pauses in which the wizard
+waits for its search.
 """
 
 import os
@@ -36,7 +37,8 @@ GEAR, GEAR_REFRESH = "Actions", 2
 
 
 def time_of_tools(count):
-    """Returns the time until avahi-browse has resolved the devices and snmpget has asked each."""
+    """Returns the seconds until avahi-browse has resolved `count` devices and snmpget has asked
+    each of them."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
                     stderr=subprocess.DEVNULL, text=True)
@@ -55,7 +57,8 @@ def time_of_tools(count):
 
 
 def time_of_wizard(person, text, count):
-    """Returns the time from a refresh, which empties the list, until the list has `count` rows."""
+    """Returns the seconds from a refresh, which empties the list, until the list has `count` rows
+    again."""
     person.see_gone("label", text["INST_WAIT"], 60)
     table = person.see("tree").get_table_iface()
     person.open_menu(GEAR)

@@ -46,7 +46,7 @@ class Reader {
   }
 
   // Several containers may share one string or data object, but each value gets a copy. So the
-  // limit on the size of a file also limits the total size of the copies. A string counts by its
+  // total size of the copies has the same limit as the size of a file. A string counts by its
   // UTF-16 units. Returns false when the limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;

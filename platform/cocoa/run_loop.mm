@@ -25,8 +25,9 @@ NSArray* allModes() {
 int modalLoops = 0;
 bool isModalAborted = false;
 
-// True from abortModal() until the modal loop has returned. During this time, posted actions do not
-// run, because each of them might occupy the main thread for seconds and so delay the return.
+// True from abortModal() until the modal loop has returned or the main thread has found that no
+// loop is running. During this time, posted actions do not run, because each of them might occupy
+// the main thread for seconds and so delay the return.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while

@@ -72,7 +72,8 @@ TEST_F(Chooser, ShowsItsTextsAndItsMenu) {
       titles.push_back(title);
     return titles;
   };
-  EXPECT_THAT(commands(), ElementsAre("Gear", "Setup...", "again")) << "the tool's file name";
+  EXPECT_THAT(commands(), ElementsAre("Gear", "Setup...", "again"))
+      << "a tool without a display name has its file name";
   medium.addSetUpTool(0);
   load();
   EXPECT_THAT(commands(), ElementsAre("Gear", "Wireless Setup...", "again"));

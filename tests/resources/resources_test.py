@@ -1,8 +1,8 @@
 """Checks the application's resources, because the program and macOS ignore most mistakes in them.
 
 The sources look up outlets, actions, bound titles, columns and menu items. The interface files of both
-front ends must have them all. The interface files for macOS must have every element that Xcode writes,
-and the information dictionary every entry that current versions of macOS need.
+front ends must have them all. The interface files for macOS must have the frames, cells and fonts that
+Xcode writes, and the information dictionary must have the entries that current versions of macOS need.
 """
 
 import plistlib

@@ -1,11 +1,12 @@
 #!/usr/bin/python3
 """Random walks over the wizard's real window while devices come and go.
 
-Usage: walk.py [--seed N] [--count N] MEDIUM
+Usage: walk.py [--seed S] [--count N] MEDIUM
 
-Walk number i, counted from 0, uses the seed N + i, so `--seed N+i --count 1` repeats it. A walk fails
-when the program exits with an error, when the main loop hangs, when the window cannot be closed at the
-end, or when a file for the package is incomplete. A failed walk prints its seed and its steps.
+The seeds of the N walks are S, S + 1 and so on, so `--seed S --count 1` repeats the walk with the seed S.
+A walk fails, for example, when the program exits with an error, when the main loop hangs, when the window
+cannot be closed at the end, or when a file for the package is incomplete. A failed walk prints its seed
+and its steps.
 """
 
 import argparse

@@ -80,7 +80,7 @@ class WirelessWays(WayTest):
                 "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
                 "IP address": address}})
 
-    def test_keyboard_alone_or_accessible_tree_alone_chooses_a_device_despite_closed_ones(self):
+    def test_keyboard_alone_or_accessible_tree_alone_chooses_a_device_despite_closed_ports(self):
         for number in (1, 2, 3):
             self.add(f"closed {number} of {self.kind}", activeif="closed")
         self.add("Büro – 会議室", addresses=["127.0.90.1"], note="2nd floor")

@@ -1,5 +1,5 @@
-// Adds features of AppKit that GNUstep lacks. Features that need more code have files of their own
-// beside this one.
+// Makes small changes and additions to GNUstep, so that it behaves like AppKit. Larger ones have
+// files of their own beside this one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
@@ -74,7 +74,7 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
 }
 
 // Prevents GNUstep from starting its daemon for notifications between applications. The application
-// would fail to launch if the daemon were slow to answer, and it exchanges no such notifications.
+// exchanges no such notifications, and would fail to launch if the daemon were slow to answer.
 id noDistributedCenter(id, SEL) {
   return nil;
 }
@@ -96,8 +96,8 @@ BOOL openURL(id, SEL, NSURL* url) {
 }  // namespace
 
 /// Stands for an accessibility relation between controls in an interface file. GNUstep creates an
-/// object for each element of the file, and rejects the whole file if it lacks the class of one
-/// element.
+/// object for each element of the file, and rejects the whole file if the class of one element is
+/// missing.
 @interface IBAccessibilityConnection : NSObject
 @end
 

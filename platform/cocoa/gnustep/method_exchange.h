@@ -14,7 +14,7 @@ Implementation* replaceMethod(Class owner, SEL selector, Implementation* replace
 }
 
 /// Adds an instance method to the class `owner`. If the class already has a method with that
-/// selector, replaces the method. The method takes one BOOL and returns nothing.
+/// selector, replaces the method. The method takes one BOOL and has no result.
 inline void addMethod(Class owner, SEL selector, void (*implementation)(id, SEL, BOOL)) {
   class_replaceMethod(owner, selector, reinterpret_cast<IMP>(implementation), "v@:c");
 }

@@ -1,4 +1,4 @@
-// Gives each view its identifier from the interface file, which GNUstep ignores.
+// Gives each view its identifier from the interface file. GNUstep ignores these identifiers.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
