@@ -97,8 +97,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// What this function does depends on the page that is shown:
   /// - on the chooser, it searches again;
-  /// - on the connection page, as long as the wizard itself has not started the wireless set-up
-  ///   tool, it shows the chooser when the chooser lists a device, and otherwise starts the tool;
+  /// - on the connection page, while mIsWLANTool is false, it shows the chooser when the chooser
+  ///   lists a device, and otherwise starts the wireless set-up tool;
   /// - in every other case, it shows the chooser and searches.
   void showChooseDeviceView();
 
@@ -107,8 +107,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Set the buttons' titles for a page, and show or hide each button. Every page has Next and
   /// Cancel. The connection page also has Back if the user has chosen a model, and the chooser has
-  /// Back unless the wizard itself has started the set-up tool. These functions neither enable nor
-  /// disable a button.
+  /// Back while mIsWLANTool is false. These functions neither enable nor disable a button.
   void setModelListViewButton();
   void setConnentionTypeViewButton();
   void setChooseDeviceViewButton();
@@ -197,7 +196,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// - 1: the wizard reappears. After an automatic start, it shows the connection page, with the
   ///   wireless choice selected;
   /// - 2: the application terminates;
-  /// - any other status, or a tool that cannot be run: the wizard shows the chooser and searches.
+  /// - any other status, or none: the wizard reappears, shows the chooser and searches.
   /// launchWLANToolAutomatically() is for a search that found no device, and
   /// launchWLANToolManually() for the user's request.
   void launchWLANToolAutomatically();

@@ -28,10 +28,10 @@ class KSDeviceObserver {
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
-/// Searches the network for devices that offer the medium's service type, and reports each device
-/// when its service is resolved. A running search and its browser keep each other alive, so the
-/// owner must call stopBrowsing() before it drops its reference. All functions must be called on
-/// the main thread.
+/// Searches the network for devices that offer the medium's service type. Reports each device when
+/// its service is resolved and when it is reported gone. Ignores services that lack a name, type or
+/// domain. A running search and its browser keep each other alive, so the owner must call
+/// stopBrowsing() before it drops its reference. All functions must be called on the main thread.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:

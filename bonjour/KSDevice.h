@@ -9,8 +9,9 @@
 namespace onramp {
 
 /// Makes device records. A record is a dictionary that describes a device, as one of the device's
-/// network services announces it. A text or list that the service lacks is empty. The model name of
-/// a null service is one space.
+/// network services announces it. A text or list that the service lacks is empty. The model name is
+/// empty if the service lacks the manufacturer or the model. The model name of a null service is
+/// one space.
 class KSDevice {
  public:
   KSDevice() = delete;

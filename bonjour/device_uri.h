@@ -26,7 +26,8 @@ struct ServiceInstance {
 /// name may be empty, and the name may contain percent escapes. The result's domain is always
 /// "local.". Returns nothing when the text is not of this form, when the text after the type does
 /// not contain "local.", or when percentUnescaped() refuses the name. The type ends at the first
-/// "_tcp." or, if there is none, at the first "_udp.". So a name that contains either is misread.
+/// "_tcp." or, if there is none, at the first "_udp.". So a name that contains one of them may be
+/// misread.
 [[nodiscard]] std::optional<ServiceInstance> serviceInstanceOf(std::string_view uri);
 
 /// Returns the host in a URL's authority part (RFC 3986 section 3.2). An IPv6 address loses its

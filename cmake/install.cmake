@@ -1,7 +1,7 @@
 # Installs the application, the companions, an example medium and the documents. From these files,
 # cpack makes a Debian package and the media kit, a tarball that can be used without installation.
 #
-# LIBDIR/onramp holds the example medium with the application on it, and the scripts of tools/. The
+# LIBDIR/onramp holds the example medium with the application on it, and scripts from tools/. The
 # commands in BINDIR that are scripts are links to these scripts.
 
 set(ONRAMP_ZSH_COMPLETIONS ${CMAKE_INSTALL_DATADIR}/zsh/site-functions CACHE STRING
@@ -94,7 +94,7 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_DEBIAN_PACKAGE_DEPENDS "python3:any (>= 3.11), xdg-utils")
 set(CPACK_DEBIAN_PACKAGE_RECOMMENDS avahi-daemon)
-# Only the practice network and the tour need these packages. Both say which ones are missing.
+# Only the practice network and the tour need these packages.
 set(CPACK_DEBIAN_PACKAGE_SUGGESTS "at-spi2-core, dbus, gir1.2-atspi-2.0, imagemagick, iproute2, openbox, python3-dbus, python3-gi, snmpd, x11-utils, xdotool, xvfb")
 set(CPACK_PACKAGE_DESCRIPTION "A maker of printers and scanners puts the wizard Onramp on its installation
 medium. The wizard lets a user choose the model, the connection and, on a

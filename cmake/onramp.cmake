@@ -1,10 +1,11 @@
-# Compiler options for all targets, and a function for each kind of target.
+# Compiler options for all targets, and functions that add libraries, backends and tests.
 
 add_library(onramp_options INTERFACE)
 target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})
 target_compile_options(onramp_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
-  # GCC 12 takes string concatenation in the standard library for an overlapping copy.
+  # GCC 12 wrongly warns that string concatenation in the standard library copies overlapping
+  # memory.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
   # macOS deprecates its C functions for network services and for the system's version, but has no
   # newer C functions.
@@ -56,7 +57,7 @@ endfunction()
 
 # onramp_namespace_test(NAME …) does what onramp_test does, but the test runs as root in a new
 # network namespace. It is skipped where no namespace can be created. ctest starts the test through
-# tests/in_namespace, which CMake takes for an emulator.
+# tests/in_namespace, which CMake's property for emulators names.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})

@@ -36,9 +36,10 @@ namespace onramp {
 /// unknown type is not skipped but read as the next binding, so decoding usually fails. The same
 /// applies to a NULL that has content.
 ///
-/// Returns SNMP_ERR_CODEC for malformed or missing bytes, when the reply has more bindings than the
-/// array, and when the record for a name or value is missing or too small. Parts that were decoded
-/// before the error stay in `message`.
+/// Returns SNMP_ERR_CODEC for bytes that the functions of snmp/ber_reader.h refuse, such as an
+/// integer of more than four bytes, and for bytes that are not such a message. Also returns it when
+/// the reply has more bindings than the array, and when the record for a name or value is missing
+/// or too small. Parts that were decoded before the error stay in `message`.
 [[nodiscard]] snmp_status snmp_decode_message(snmp_message& message,
                                               std::span<const std::uint8_t> bytes);
 

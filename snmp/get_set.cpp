@@ -13,7 +13,7 @@ namespace {
 constexpr std::size_t kStringStride = 16;
 
 // Holds the strings of a request, and later the strings of its reply. Either may have up to
-// kReplySize bytes. The destructor sets the bindings' pointers to this storage to null.
+// kReplySize bytes. The destructor clears the pointers that bindings have to this storage.
 class string_storage {
  public:
   explicit string_storage(std::span<snmp_varbind> bindings)

@@ -36,7 +36,8 @@ struct snmp_result_slot {
 /// each binding's `index`, which is the index of the binding's slot in `results`. The binding takes
 /// its type from the slot. If the type is 4, the binding also takes its value from the slot;
 /// otherwise it keeps its own value. Copies the values in the reply to the slots and returns a
-/// status as snmp_get() does.
+/// status as snmp_get() does. The reply's first value goes to the first slot, the second to the
+/// second, and so on, whatever `index` was.
 ///
 /// A string here is a value of type 4, 64 or 68. The strings are copied to a buffer of kReplySize
 /// bytes, where each starts at a multiple of 16. The `octets_value` of a binding with a string is

@@ -39,7 +39,7 @@ struct mib_table {
   const mib_value_handler* handlers = nullptr;
 };
 
-/// The keys that every result has, in addition to the names of the table's handlers.
+/// The two keys that every result has. The other keys are names of the table's handlers.
 constexpr const char* kConnectionKey = "Connection";  ///< string, always "Network"
 constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's address
 

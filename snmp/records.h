@@ -47,7 +47,7 @@ struct snmp_varbind {
   snmp_octets* octets_value = nullptr;  ///< for types 4, 64 and 68
   snmp_oid* oid_value = nullptr;        ///< for type 6
   std::uint16_t encoded_length = 0;     ///< set by the encoder: size of name and value together
-  std::uint32_t index = 0;              ///< set by the decoder: position in the reply, from 0
+  std::uint32_t index = 0;  ///< set by the decoder: position in the reply, from 0; see snmp_set()
 };
 
 /// One SNMPv1 message (RFC 1157 section 4). It owns none of the memory that it points to.

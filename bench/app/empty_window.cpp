@@ -1,4 +1,4 @@
-// Shows an empty window of the wizard's size. No program with a window can do less.
+// Shows an empty window of the wizard's size, with which start_up.py compares the wizard.
 
 #include <QApplication>
 #include <QMainWindow>

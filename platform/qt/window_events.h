@@ -10,9 +10,9 @@ class ApplicationDelegate;
 
 namespace qt {
 
-/// Lets the delegate decide whether a window may close, and handles three keys. Escape clicks the
-/// button whose key equivalent is "Escape". Return does what performReturn() does. F10 does what
-/// openMenu() does.
+/// Lets the delegate decide whether a window may close, and handles some keys. Escape clicks the
+/// button whose key equivalent is "Escape". Return and Enter do what performReturn() does. F10 does
+/// what openMenu() does.
 class WindowEvents final : public QObject {
   Q_OBJECT
 

@@ -18,8 +18,8 @@ namespace onramp {
 inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
-/// Runs the wizard from a temporary medium on a scripted network. Its functions see and use the
-/// wizard as a person does.
+/// Runs the wizard from a temporary medium on a scripted network. Its functions prepare the medium
+/// and the network, and see and use the wizard as a person does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {

@@ -22,8 +22,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   const std::string escaped = onramp::percentEscaped(text);
   const bool utf8 = onramp::isUTF8(text);
   if (onramp::percentUnescaped(escaped).has_value() != utf8) std::abort();
-  // Dots are not escaped in a URI. So a part of a name that contains a dot or ends with "_tcp" may
-  // be read as part of the service type.
+  // Dots are not escaped in a URI. So the end of such a name may be read as part of the service
+  // type.
   const bool ambiguous = text.find('.') != std::string::npos || text.ends_with("_tcp");
   if (utf8 && !ambiguous) {
     const onramp::ServiceInstance whole{text, "_ipp._tcp.", "local."};

@@ -16,7 +16,7 @@ PATIENCE = 30  # the seconds after which a missing event counts as a failure
 
 
 def enclose(description):
-    """Returns if this program already runs on a practice network.
+    """Does nothing if this program already runs on a practice network.
 
     Otherwise replaces the process by one that runs the program on a practice network of two hosts.
     `description` is the network's description file.
@@ -101,8 +101,8 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts the daemon with `settings` in place of those in its configuration. The settings'
-        names have "_" in place of "-"."""
+        """Starts the daemon. `settings` replace those in its configuration file; their names have
+        "_" in place of "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="
@@ -133,9 +133,9 @@ class Avahi:
 
 
 def announce_pointer(service_type, target_labels, seconds=4500):
-    """Announces a PTR record (RFC 6762 section 8.3), and no other record, for an instance of
-    `service_type`. `target_labels` are the labels of the instance's name. `seconds` is the record's
-    time to live; 0 withdraws the record."""
+    """Announces a PTR record (RFC 6762 section 8.3), and no other record, that points from
+    `service_type` in the domain "local" to a name. `target_labels` are the labels of that name.
+    `seconds` is the record's time to live; 0 withdraws the record."""
     name = _labels(*service_type.encode().split(b"."), b"local")
     target = _labels(*target_labels)
     packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name

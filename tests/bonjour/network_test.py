@@ -59,7 +59,7 @@ class NetworkTest(unittest.TestCase):
                                 stdout=subprocess.PIPE).stdout
         self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
 
-    def test_devices_with_names_of_all_kinds_are_found_by_name_and_by_uri(self):
+    def test_devices_with_unusual_names_are_found_and_those_without_dots_also_by_uri(self):
         names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
                  "Osprey #2", "x" * 63]
         for name in names:

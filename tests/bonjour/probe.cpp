@@ -1,4 +1,4 @@
-// Makes a search or a look-up on the real network, and prints a line for each event: the seconds
+// Makes a search or a look-up on the network, and prints a line for each event: the seconds
 // since the start, a word for the event, and details. Tests and benchmarks run this program on a
 // practice network. A search ends at the end of the standard input.
 //

@@ -260,7 +260,7 @@ TEST_F(SearchTest, AnObserverMayDestroyTheSearch) {
   EXPECT_THAT(network.browsers, IsEmpty());
 }
 
-TEST(Device, UnknownTextsAreEmptyAndNeverAbsent) {
+TEST(Device, NoKeyOfTheRecordIsEverAbsent) {
   const Dictionary none = KSDevice::initWithService(nullptr, std::nullopt);
   EXPECT_EQ(none.size(), 8u);
   EXPECT_EQ(none.string(KSDevice::kModelName), " ");

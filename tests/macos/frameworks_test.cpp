@@ -1,5 +1,5 @@
-// Tests how the backends for macOS use the objects of C frameworks. The folder frameworks/ has
-// stand-ins for the frameworks.
+// Tests how corefoundation, cfnetwork and systemconfiguration use the frameworks' objects. The
+// folder frameworks/ has stand-ins for the frameworks.
 
 #include <CoreServices/CoreServices.h>
 #include <SystemConfiguration/SystemConfiguration.h>
@@ -155,7 +155,7 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient)
 
   EXPECT_TRUE(service->resolveWithTimeout(std::chrono::seconds(5)));
   EXPECT_TRUE(service->addressing().empty() && !service->txtData())
-      << "these belonged to the last resolve";
+      << "these belonged to the previous resolve";
   seen.service = std::move(service);
   error.error = kNetServiceErrorTimeout;
   native->client(native, &error, native->info);

@@ -67,7 +67,7 @@ const char* const kLoopback = "127.0.0.1,|255.0.0.0,||";
 // loopback interface, and the primary interface.
 const std::tuple<const char*, std::vector<const char*>, std::vector<std::string>, const char*>
     kScenarios[] = {
-        {"addresses of every kind, and a subnet's route",
+        {"addresses of several kinds, and a route that is no default route",
          {"addr add 192.0.2.1/24 brd + dev near", "addr add 192.0.2.7/24 brd + dev near",
           "addr add 10.0.0.1/8 brd 10.9.9.9 dev left", "addr add 10.1.0.1 peer 10.1.0.2 dev left",
           "addr add 10.1.0.1 peer 10.1.0.3 dev left", "addr add 203.0.113.4/31 dev right",
@@ -82,7 +82,7 @@ const std::tuple<const char*, std::vector<const char*>, std::vector<std::string>
           "addr add 198.51.100.1/24 dev left", "link set right down"},
          {"192.0.2.1,|255.255.255.0,|192.0.2.255,|"},
          "near.7"},
-        {"the first route with the lowest metric wins",
+        {"the first usable default route with the lowest metric wins",
          {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
           "route add unreachable default metric 5", "route add default via 192.0.2.254 metric 600",
           "route append default via 198.51.100.254 metric 9",
@@ -126,7 +126,7 @@ TEST_F(Kernel, ListsTheAddressesAndThePrimaryInterface) {
   EXPECT_THAT(none, ::testing::Pointee(Array{}));
 }
 
-// Only one test may install the callback, because it stays until the process ends.
+// Only one test may install the cache's callback, which stays until the process ends.
 TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   AddNetworkInterfaceListChangeCallbackSCF();
   std::vector<std::string> expected = {kLoopback};

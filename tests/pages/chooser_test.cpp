@@ -122,7 +122,7 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
       // An address that leaves one request unanswered is tried three times, even if it answers
-      // later requests.
+      // later requests. If this is so for every address, the last try of the last address decides.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},

@@ -43,7 +43,7 @@ class Network {
   bool searchesStart = true;                 ///< when false, no search can be started
   std::string domain;                        ///< the domain of the latest search
   std::vector<double> timeouts;              ///< the time limit of every resolve, in seconds
-  bool cancelled = false;                    ///< whether the latest resolve was cancelled
+  bool cancelled = false;                    ///< cancel() was called after the latest resolve began
   std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 

@@ -29,7 +29,7 @@ TEST(Agents, AreHeardForTwoSecondsAndOtherSendersAreIgnored) {
   EXPECT_GE(steady_clock::now() - start, milliseconds(2000));
 }
 
-// For a closed port, there are three pauses of 20 ms. Six waits of two seconds would take longer.
+// A closed port costs three pauses of 20 ms, and no waits of two seconds.
 TEST(ClosedPorts, AreNoticedAtOnceAndLeaveNoDescriptorOpen) {
   using std::filesystem::directory_iterator;
   const auto open = [] {

@@ -282,7 +282,7 @@ TEST(NetSnmpReads, TheProgramsRequest) {
   EXPECT_EQ(readByNetSnmp(m.encode()), "163 7");
 }
 
-TEST(NetSnmpReads, EveryTypeOfValue) {
+TEST(NetSnmpReads, EveryTypeOfValueOfSnmpv1) {
   const std::uint16_t arcs[] = {1, 3, 127, 128, 16383, 16384, 65535};
   const std::uint8_t types[] = {2, 65, 66, 67, 2, 4, 64, 68, 6, 5};
   Message m(std::size(types), std::size(arcs));

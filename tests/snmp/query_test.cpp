@@ -148,7 +148,7 @@ TEST_F(Query, ReturnsTheStatusOfTheExchange) {
 
   snmp_request_counter = 6;
   EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT)
-      << "the reply is to an earlier request";
+      << "the reply is to another request";
   agents.socketsOpen = false;
   EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork), SNMP_ERR_TRANSPORT);
   EXPECT_EQ(snmp_request_to_address(nullptr, "192.0.2.1"), SNMP_ERR_TRANSPORT);

@@ -22,7 +22,7 @@ PROGRAM, PROBE, MEDIUM = map(os.path.abspath, sys.argv[1:4])
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
 MAKER_AND_MODEL = 'maker = "Kestrel"\nmodel = "Model 100"\n'
 
-# For each verdict, the entries of a device that gets this verdict. The verdict is also the device's
+# For most verdicts, the entries of a device that gets the verdict. The verdict is also the device's
 # name.
 DEVICES = {
     "listed": MAKER_AND_MODEL,

@@ -20,6 +20,7 @@ constexpr const char* kNothing = "the wizard ends at once, without any page, and
 constexpr const char* kNoModels =
     "the medium has no models, so the package opens at once, without any page";
 constexpr const char* kNoPackage = "nothing opens when the wizard ends";
+constexpr const char* kNoVersionPackage = "nothing opens on the systems that use this key";
 
 constexpr std::array kInformationRules{
     KeyRule{"CommonResourcePath", Kind::kPath, Need::kRequired, kNothing},
@@ -46,12 +47,12 @@ constexpr std::array kResourceRules{
 constexpr std::array kPackageRules{
     KeyRule{"PkgLocation", Kind::kPath, Need::kRequired, kNoPackage},
     KeyRule{"PkgName", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"104", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"105", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"106", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"107", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"108", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"109", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"104", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"105", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"106", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"107", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"108", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"109", Kind::kText, Need::kOptional, kNoVersionPackage},
 };
 
 constexpr std::array kMinimumRules{
@@ -83,12 +84,14 @@ constexpr std::array kTypeRules{
 };
 
 constexpr std::array kOptionRules{
-    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets the value unchanged"},
-    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "the value counts as true"},
+    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional,
+            "the package does not get the intended value"},
+    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional,
+            "an absent key counts as false, a value of another kind as true"},
     KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value unchanged"},
+            "the package does not get the intended value"},
     KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value unchanged"},
+            "the package does not get the intended value"},
     KeyRule{"PKG_FontSet", Kind::kAny, Need::kOptional, "the fonts are not installed"},
 };
 
@@ -97,10 +100,10 @@ constexpr std::array kModelInformationRules{
 };
 
 constexpr std::array kModelRules{
-    KeyRule{
-        "KSCID", Kind::kText, Need::kRequired,
-        "the model offers no connection at all: the package opens as soon as the model is chosen",
-        ": the model's identifier at the support centre"},
+    KeyRule{"KSCID", Kind::kText, Need::kRequired,
+            "without \"KSCID\", the model offers no connection at all: the package opens as soon "
+            "as the model is chosen",
+            ": the model's identifier at the support centre"},
     KeyRule{"Interfaces", Kind::kDictionary, Need::kAdvised, "the model has USB only"},
 };
 

@@ -29,7 +29,7 @@ Exit status: 0 when no error was found, 1 when an error or, with --strict, a
 warning was found, 2 when the medium could not be read, the output could not be
 written or the command line is wrong.)";
 
-// Returns `status`. If standard output could not be written, prints a message and returns
+// Returns `status` if standard output could be written. Otherwise prints a message and returns
 // kUnreadable.
 int finish(int status) {
   if (std::cout.flush()) return status;

@@ -20,8 +20,9 @@ void writeJSON(std::ostream& out, const Report& report);
 /// kind of its value, whether a medium needs it, and the path of keys.
 void writeKeys(std::ostream& out);
 
-/// Writes a line for every text that the wizard shows: the text's key, the room for it, what is
-/// shown if the medium lacks it, and the place where it is shown.
+/// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
+/// room for it, what is shown if the medium lacks it, how often "%@" has to occur in it, and the
+/// place where it is shown.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check

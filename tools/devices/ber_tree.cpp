@@ -104,7 +104,8 @@ std::string contentText(std::uint8_t tag, Bytes content) {
   }
 }
 
-// An element's position: its depth, and its index among its parent's elements.
+// An element's position: its depth, its index among its parent's elements, and whether its parent
+// is a PDU.
 struct Where {
   std::size_t depth = 0;
   std::size_t place = 0;

@@ -8,7 +8,7 @@
 namespace onramp::devices {
 
 /// The delay that a device causes in the wizard by answering slowly or not at all. All members are
-/// 0 for a device that answers within a second.
+/// 0 when the delay is shorter than a second.
 struct Delay {
   double seconds = 0;       ///< how long the wizard's window does not respond
   std::size_t delayed = 0;  ///< how many listed devices appear later because of it

@@ -14,7 +14,7 @@ struct Verdict {
   std::string id;  ///< such as "on-cable"; programs rely on it
   bool isListed = false;
   std::string why{};     ///< a sentence without its full stop
-  std::string remedy{};  ///< what to do; empty when nothing needs to be done
+  std::string remedy{};  ///< what to do; may be empty
 };
 
 /// Returns whether the wizard would ask the device which interface it uses: the device is resolved

@@ -27,9 +27,9 @@ def _free_display():
 class Desktop:
     """A context manager that starts a desktop, and stops its programs at the end.
 
-    Programs on the desktop find a substitute for xdg-open, which records files and addresses and
-    does not open them. A process can use only one desktop, because its accessibility library keeps
-    the first desktop's bus.
+    Programs on the desktop find a substitute for xdg-open that only records files and addresses. A
+    process can use only one desktop, because its accessibility library keeps the first desktop's
+    bus. There is no window manager if `window_manager` is false.
     """
 
     def __init__(self, window_manager=True):

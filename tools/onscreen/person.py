@@ -8,8 +8,8 @@ import time
 from .processes import start, stop, wait_for
 
 _LOOK_SECONDS = 20
-# Whenever a table's cell is looked at, Qt creates an object that it never frees. So tables are
-# searched only when a cell is wanted.
+# Whenever a table's cell is looked at, Qt creates an object that it never frees. So a search for one
+# control enters tables only if the control is part of a table.
 _TABLES = ("list", "table", "tree", "tree table")
 _IN_TABLES = ("list item", "table cell", "table column header")
 _COLUMNS = 3
@@ -37,7 +37,7 @@ class Person:
     """A person who uses one program. Creating the object starts the program on a desktop, and
     leaving the object's context ends it.
 
-    The methods use the program as a person does.
+    Most methods use the program as a person does.
     """
 
     follows_desktop = True  # whether the program uses the desktop's text size, scale and colours
@@ -51,7 +51,7 @@ class Person:
         gi.require_version("Atspi", "2.0")
         from gi.repository import Atspi, GLib
         self._atspi = Atspi
-        self.errors = GLib.Error, AttributeError  # raised when a control that is gone is used
+        self.errors = GLib.Error, AttributeError  # raised by the use of a control that no longer exists
         self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 

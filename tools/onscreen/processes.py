@@ -18,7 +18,8 @@ def _die_with_parent():
 
 
 def start(arguments, package=None, **options):
-    """Starts a program. `package` is the Debian package that contains it, for the error's text."""
+    """Starts a program. If it is missing, the error names `package`, the Debian package that
+    contains it."""
     try:
         return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)
     except FileNotFoundError as error:
@@ -40,7 +41,7 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises TimeoutError after `seconds`. `what` says in the error's text what was waited for.
+    Raises TimeoutError after `seconds`. `what` describes the awaited event in the error's text.
     """
     deadline = time.monotonic() + seconds
     while True:

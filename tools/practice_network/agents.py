@@ -59,7 +59,8 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """Starts to forward each request for `address`, a broadcast address, to every agent.
+        """From now on, forwards each request for `address`, a broadcast address, to every agent
+        that answers.
 
         The agents do not receive broadcasts, because they listen only at their own addresses.
         """
@@ -136,8 +137,8 @@ class _Agent:
         return self._log.read_text(errors="replace") if self._log.exists() else ""
 
     def close(self):
-        # The script of a slow answer keeps the agent's socket open, so this ends the agent's whole
-        # process group.
+        # The script of a slow answer keeps the agent's socket open, so the agent's whole process group
+        # has to end.
         if self._process.poll() is None:
             os.killpg(self._process.pid, signal.SIGKILL)
             self._process.wait()

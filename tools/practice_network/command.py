@@ -78,12 +78,12 @@ PracticeNetwork find the network through the environment variable ONRAMP_PRACTIC
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
 do by default. Abstract sockets and TCP connections to the X server do not work inside.
-XDG_RUNTIME_DIR is a new, empty folder. The session bus, Wayland and the accessibility bus of your
+XDG_RUNTIME_DIR is a new folder. The session bus, Wayland and the accessibility bus of your
 desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
-exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description,
-77 if this machine cannot create namespaces, 125 if the network did not start, 126 or 127 if COMMAND
-could not be run.
+exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description or
+command line, 77 if this machine cannot create namespaces, 125 if the network did not start or ended
+before COMMAND, 126 or 127 if COMMAND could not be run.
 """
 
 
@@ -108,9 +108,9 @@ def _run(program, arguments):
               "       practice-network ctl REQUEST [ARGUMENT ...]",
         description=textwrap.dedent(HELP), epilog=DETAILS)
     parser.add_argument("--hosts", type=int, choices=(1, 2), default=1,
-                        help="2: devices and COMMAND are on two hosts joined by a cable, "
-                             "192.0.2.0/24. Each host has its own Avahi; ctl controls the Avahi "
-                             "of the devices")
+                        help="2: devices and COMMAND are on two hosts in the network "
+                             "192.0.2.0/24, joined by a cable for each interface. Each host has "
+                             "its own Avahi; ctl controls the Avahi of the devices")
     parser.add_argument("--invoker", help=argparse.SUPPRESS)
     parser.add_argument("description", metavar="DESCRIPTION")
     parser.add_argument("command", metavar="COMMAND", nargs=argparse.REMAINDER)
@@ -132,8 +132,8 @@ def _enclose(options):
             return _complain(f"{name} is missing; install it: apt-get install {package}",
                              NETWORK_FAILED)
     if not importlib.util.find_spec("dbus"):
-        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3 and install "
-                         "it: apt-get install python3-dbus", NETWORK_FAILED)
+        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3, and install "
+                         "the module: apt-get install python3-dbus", NETWORK_FAILED)
 
     from practice_network import namespace
     reason = namespace.why_not_enclosed()

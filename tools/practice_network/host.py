@@ -52,7 +52,8 @@ publish-workstation=no
 
 
 class HostError(Exception):
-    """Raised when a command fails or a daemon does not start. The text names it and the reason."""
+    """Raised when a command fails or a daemon does not start. The text names the program and the
+    reason."""
 
 
 def run(*command):
@@ -130,7 +131,8 @@ class Host:
         run("ip", "address", "replace", address, "dev", self.interfaces[0])
 
     def plug(self, interface, plugged):
-        """Brings both ends of the interface's cable up if `plugged` is true, otherwise down."""
+        """Brings the interface up if `plugged` is true, otherwise down. With two hosts, does the same
+        at the other end of the cable."""
         for enter in ((), IN_FIRST_HOST):
             if plugged:
                 _bring_up(interface, self.interfaces.index(interface), enter)

@@ -14,8 +14,8 @@ from practice_network.publisher import Publisher, PublishError
 
 
 class Network:
-    """All known devices. Those that are present, which means switched on, are published and answer
-    SNMP requests."""
+    """All known devices. Those that are present, which means switched on, are published, and their
+    agents run."""
 
     def __init__(self, host, subnet):
         self._host = host
@@ -48,7 +48,7 @@ class Network:
                     self._publish(device)
 
     def unplug(self, interface):
-        """Takes an interface down on both hosts. plug() brings it back."""
+        """Takes an interface down for the devices and for the command. plug() brings it back."""
         self._plug(interface, False)
 
     def plug(self, interface):
@@ -95,7 +95,7 @@ class Network:
         self.set(name, {"name": new_name})
 
     def set(self, name, entries):
-        """Changes a device, and publishes only what the entries change."""
+        """Changes a device, and publishes what the entries change."""
         before = self._devices.get(name)
         if not before:
             raise DescriptionError(f'device "{name}" is unknown; "list" shows the known devices')
@@ -164,7 +164,7 @@ class Network:
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())
                 if behaviour != description.CLOSED}
         if isinstance(device.addresses, int):
-            # The network's first addresses are left to the hosts.
+            # The network's first addresses are reserved for the hosts.
             hosts = itertools.islice(self._subnet.hosts(), 256 if self._subnet.is_loopback else 9,
                                      None)
             avoided = used if device.is_closed() else used | self._addresses_of_others(name)

@@ -12,8 +12,8 @@ ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
 # The flags mean: unique, no probes, several records for one name. Probes are unnecessary, because
-# nobody else uses these host names. They would also do harm: on loopback, Avahi receives its own
-# probes, and if it has replaced the record meanwhile, it takes the probe for a conflict.
+# nobody else uses these host names. They would also do harm. On loopback, Avahi receives its own
+# probes. If it has replaced the record since it sent a probe, it treats this probe as a conflict.
 ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
 ADDRESS_SECONDS = dbus.UInt32(120)  # RFC 6762, section 10
 CLASS_IN, TYPE_A, TYPE_AAAA = dbus.UInt16(1), dbus.UInt16(1), dbus.UInt16(28)
@@ -22,7 +22,8 @@ GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 
 
 
 class PublishError(Exception):
-    """Raised when Avahi refuses a request or is not running. The text says which."""
+    """Raised when Avahi does not start, and when it does not publish a device in time. The text
+    says which."""
 
 
 def connect(bus_address, seconds=10):
@@ -100,7 +101,7 @@ class Publisher:
         """Waits until Avahi has finished probing for the device's name, for at most `seconds`.
 
         The device's records must not change during the probes. On loopback, Avahi receives its own
-        probes. If a probe has an older text than the record, Avahi takes it for a conflict.
+        probes. If a probe has an older text than the record, Avahi treats the probe as a conflict.
         """
         deadline = time.monotonic() + seconds
         while self.state(device) == "probing" and time.monotonic() < deadline:

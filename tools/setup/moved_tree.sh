@@ -1,6 +1,5 @@
 # The scripts `run` and `test` source this file. CMake refuses a build folder that was made for
-# another source tree. There are such folders when a tree was copied or moved together with its
-# build folders.
+# another source tree. A copied or moved tree may contain such folders.
 
 # Removes build/PRESET if it was made for another source tree. The argument is the preset's name.
 forget_build_of_another_tree() {

@@ -1,5 +1,5 @@
-// A stand-in for the network services of CFNetwork; CoreFoundation/CoreFoundation.h says what it is
-// for.
+// A stand-in for the network services of CFNetwork; CoreFoundation/CoreFoundation.h says what the
+// stand-ins are for.
 #pragma once
 
 #include <CoreFoundation/CoreFoundation.h>

@@ -1,4 +1,5 @@
-// A stand-in for the dynamic store; CoreFoundation/CoreFoundation.h says what it is for.
+// A stand-in for the dynamic store; CoreFoundation/CoreFoundation.h says what the stand-ins are
+// for.
 #pragma once
 
 #include <CoreFoundation/CoreFoundation.h>
