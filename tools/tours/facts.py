@@ -70,6 +70,11 @@ class Facts:
 
     def about(self, key):
         """Returns what is wrong with the value of a key, in sentences; "" if nothing is."""
-        said = [f"{finding['file']}: {key}: {finding['found']}. {finding['effect']}"
+        said = [f"{finding['file']}: {key}: {finding['found']}. Effect: {finding['effect']}."
                 for finding in self.findings if key in finding["key"]]
         return " ".join(said)
+
+    def without_tool(self):
+        """Returns what users see because there is no wireless set-up tool; "" if there is one."""
+        return next((finding["effect"] for finding in self.findings
+                     if finding["id"] in ("tool-none", "tool-no-bundle")), "")

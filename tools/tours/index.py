@@ -42,10 +42,12 @@ def write(folder, medium, findings, albums):
 def _findings(findings):
     if not findings:
         return ["<p>onramp-check finds no mistakes on this medium.</p>"]
-    lines = [f"<details open><summary>onramp-check finds {len(findings)} mistakes on this medium.</summary>"]
+    lines = [f"<details open><summary>onramp-check finds {len(findings)} "
+             f"mistake{'s'[len(findings) == 1:]} on this medium.</summary>"]
     for finding in findings:
         place = ": ".join([finding["file"], *finding["key"]])
-        said = f"{finding['severity']}: {finding['found']}. {finding['effect']} {finding['remedy']}"
+        said = (f"{finding['severity']}: {finding['found']}. Effect: {finding['effect']}. "
+                f"Remedy: {finding['remedy']}.")
         lines.append(f'<p class="wrong"><b>{_text(place)}</b><br>{_text(said)}</p>')
     return [*lines, "</details>"]
 

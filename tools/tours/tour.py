@@ -7,7 +7,7 @@ from .visit import ALERT, CONNECTION, MODELS, Visit, WentWrong
 
 _MODELS_AT_ONCE = 3  # of which devices are made up when the wizard lists the devices of all models
 _UNMATCHED = ("No device can announce the name of this model, because the name is not a maker, a space "
-              "and a model.")
+              "and a model. The tour leaves out the wireless way.")
 
 
 class Tour:
@@ -85,7 +85,8 @@ class Tour:
             if self._first in (CONNECTION, MODELS):
                 self._open_menu(visit)
             else:
-                self._album.problem(f"macOS {oldest} is refused, too: {self._medium.facts.about('SystemMax')}")
+                self._album.problem(f"macOS {oldest} is refused, too, so there is no page. "
+                                    + self._facts.about("SystemMax"))
 
     # The pages.
 
@@ -110,10 +111,11 @@ class Tour:
         self._devices = None
         self._no_devices = ""
         if not self._network:
-            self._no_devices = "There is no network of made-up devices here."
+            self._no_devices = ("There is no network of made-up devices here, so the tour leaves "
+                                "out the wireless way.")
         elif not self._medium.service_type:
             self._no_devices = ("The medium names no service type (BonjourNetwork), so the wizard "
-                                "finds no device.")
+                                "finds no device. The tour leaves out the wireless way.")
         elif not self._searched:
             self._no_devices = _UNMATCHED
         else:
@@ -141,8 +143,7 @@ class Tour:
         if self._devices and model.name in self._searched:
             self._walk_wireless(model)
         else:
-            self._album.note(f"{self._no_devices or _UNMATCHED} So the tour leaves out the wireless "
-                             "way.")
+            self._album.note(self._no_devices or _UNMATCHED)
 
     def _go_to_list(self, visit, model, pictures=False):
         """Goes to the model list and chooses the model there, if the medium has a list."""
@@ -170,6 +171,8 @@ class Tour:
             visit.picture("5-devices", "The devices that were found")
             if not is_first:
                 return
+            if effect := self._facts.without_tool():
+                self._album.note(f"The medium has no wireless set-up tool. Effect: {effect}.")
             search_in_vain(visit, self._devices, self._medium.gear)
             visit.person.click("table cell", second_of(model.name))
             visit.picture("9-choice", "A device is chosen")
