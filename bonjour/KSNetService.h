@@ -81,7 +81,8 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
                                                       const std::string& type,
                                                       const std::string& domain);
 
-/// Returns the URI of `service`, or nothing for a null service.
+/// Returns the URI of `service`, or nothing for a null service. A name, type or domain that the
+/// service lacks counts as empty.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyDeviceURI(const NetServiceRef& service);
 
 /// These two functions return the USB model and the USB manufacturer from the service's TXT record.

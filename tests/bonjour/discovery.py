@@ -16,7 +16,7 @@ PATIENCE = 30  # the seconds after which a missing event counts as a failure
 
 
 def enclose(description):
-    """Returns if this program already runs on a practice network.
+    """Does nothing if this program already runs on a practice network.
 
     Otherwise replaces the process by one that runs the program on a practice network of two hosts.
     `description` is the network's description file.

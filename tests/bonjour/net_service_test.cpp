@@ -148,7 +148,7 @@ TEST_F(NetServiceTest, ADeviceURILeadsBackToItsDevice) {
             "dnssd://%28%29%3B%3A%40%26%3D%2B%2C%2F%3F!*'$~%23%5B%5D.t.d.");
 }
 
-TEST_F(NetServiceTest, ADeviceURIOfNoReachableDeviceGivesNoAddresses) {
+TEST_F(NetServiceTest, AURIThatLeadsToNoDeviceGivesNoAddresses) {
   network.answers = {{"Kestrel._ipp._tcp.local.", {ipv6Address()}}};
   std::optional<std::vector<std::string>> addresses;
   for (const char* uri :

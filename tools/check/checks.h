@@ -21,19 +21,20 @@ void describeModels(const Lists& lists, Report& report);
 /// each of them.
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
-/// Checks that the wireless set-up tool exists and has a program and a name, and that every
-/// translation of the name contains the maker's name.
+/// Checks that the wireless set-up tool exists and has a program and a name. If the name contains
+/// the maker's name, checks that every translation does, too.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
-/// Checks the application's program file, and its list of the countries that have the online
-/// service.
+/// Checks the application's program file. If the medium offers the online service, also checks the
+/// application's list of the countries that have the service.
 void checkApplication(const MediumFiles& files, const Lists& lists);
 
 /// Checks the values that the wizard passes to the network and to other programs: the service type,
-/// the vendor's name and the series code. Checks that the application declares the service type.
+/// the vendor's name and the series code. Checks that the application declares the service type,
+/// unless the type itself is wrong.
 void checkIdentity(const Lists& lists, Report& report);
 
-/// Checks the texts of every language.
+/// Checks the texts of every language, and reports how many texts each language has.
 void checkTexts(const MediumFiles& files, const Lists& lists);
 
 /// Checks the pictures of the connections and the application's background picture.

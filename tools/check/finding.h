@@ -9,7 +9,7 @@
 namespace onramp::check {
 
 enum class Severity {
-  kError,    ///< users will see something wrong
+  kError,    ///< users will probably see something wrong
   kWarning,  ///< this may be intended, but often is not
 };
 

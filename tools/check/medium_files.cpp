@@ -178,7 +178,7 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
   }
   if (finding.remedy.empty()) {
     finding.remedy = finding.place.line ? "correct that line or the one before it"
-                                        : "replace the file by an undamaged copy";
+                                        : "replace the file with an undamaged copy";
   }
   report_.findings.push_back(std::move(finding));
 }

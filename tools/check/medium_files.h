@@ -38,9 +38,9 @@ class MediumFiles {
   /// nothing.
   bool exists(const std::string& relative, const PathUse& use) const;
 
-  /// Returns the property list at `relative`. Reports each key that a dictionary in the list has
-  /// twice. When exists() returns false or the wizard cannot read the list, reports why and returns
-  /// nothing.
+  /// Returns the property list at `relative`. If it is an XML list, reports each key that its
+  /// dictionary already has, except keys inside arrays. When exists() returns false or the wizard
+  /// cannot read the list, reports why and returns nothing.
   [[nodiscard]] std::optional<Dictionary> list(const std::string& relative,
                                                const PathUse& use) const;
 

@@ -127,7 +127,7 @@ class ModelCheck {
 
   // Reports a name that no device can announce, and a name with suspicious spaces. A device
   // announces maker and model as two texts, which the wizard joins with a space. Each text has at
-  // most 255 bytes, including the key in front, "usb_MFG=" or "usb_MDL=".
+  // most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
     const std::size_t space = name.find(' ');

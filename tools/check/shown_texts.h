@@ -7,7 +7,8 @@
 
 namespace onramp::check {
 
-/// A text that the wizard shows, and the room for it in the interface files for macOS.
+/// A text of the message bundle that the wizard shows, and the room for it in the interface files
+/// for macOS.
 struct ShownText {
   std::string_view key{};            ///< in the message bundle
   std::string_view where{};          ///< the place where the text is shown, in words
@@ -18,7 +19,7 @@ struct ShownText {
   bool hasFallback = false;          ///< if missing, an English text is shown, not the key
 };
 
-/// Returns all texts that the wizard shows, in the order of their keys.
+/// Returns all texts that the wizard shows from the message bundle, in the order of their keys.
 [[nodiscard]] std::span<const ShownText> shownTexts();
 
 /// Returns the approximate width in points of the UTF-8 text `text` in letters of `size` points.

@@ -210,8 +210,8 @@ class TextCheck {
     constexpr const char* kKey = "CFBundleDevelopmentRegion";
     const std::string path = kBundle + "/Contents/Info.plist";
     const std::string effect = serves(languages_, "en")
-                                   ? "users without texts in their language see one that "
-                                     "their system picks, usually English"
+                                   ? "users without texts in their language see another language "
+                                     "that their system picks, usually English"
                                    : "users without texts in their language may see keys such as "
                                      "\"INST_TXT_MODEL\" instead of texts";
     const auto information =

@@ -124,12 +124,14 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
     checkTranslations(files, *relative, *name, resources.string(medium::kVenderName).value_or(""));
     return;
   }
-  files.report().findings.push_back({.id = "tool-unnamed",
-                                     .place = {.file = list},
-                                     .found = "no name under \"CFBundleDisplayName\"",
-                                     .expected = "the tool's name, a string",
-                                     .effect = "an entry without a name in the device list's menu",
-                                     .remedy = "write the name"});
+  files.report().findings.push_back(
+      {.id = "tool-unnamed",
+       .place = {.file = list},
+       .found = "no name under \"CFBundleDisplayName\"",
+       .expected = "the tool's name, a string",
+       .effect =
+           "the tool's file name in the device list's menu, unless a translation gives a name",
+       .remedy = "write the name"});
 }
 
 void checkApplication(const MediumFiles& files, const Lists& lists) {

@@ -132,8 +132,8 @@ def _enclose(options):
             return _complain(f"{name} is missing; install it: apt-get install {package}",
                              NETWORK_FAILED)
     if not importlib.util.find_spec("dbus"):
-        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3 and install "
-                         "it: apt-get install python3-dbus", NETWORK_FAILED)
+        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3, and install "
+                         "the module: apt-get install python3-dbus", NETWORK_FAILED)
 
     from practice_network import namespace
     reason = namespace.why_not_enclosed()

@@ -237,10 +237,10 @@ READERS = {
     "model": (_text, "a text"),
     "note": (_text, "a text"),
     "type": (_types, 'a service type such as "_ipp._tcp", or a list of different ones'),
-    "domain": (_domain, 'a domain such as "annex.local"'),
+    "domain": (_domain, 'a domain that ends in "local", such as "annex.local"'),
     "port": (lambda value: _whole(value, 1, 65535), "a whole number from 1 to 65535"),
-    "addresses": (_addresses, 'a number from 1 to 32, or a list of different addresses such as '
-                              '["127.0.1.9"]'),
+    "addresses": (_addresses, 'a number from 1 to 32, or a list of different addresses of single '
+                              'hosts, such as ["127.0.1.9"]'),
     "activeif": (_activeif, 'a whole number, "silent", "closed", "missing" or "text", '
                             "or a list of these with one for each address"),
     "delay": (_delay, "a number of seconds from 0 to 3600"),
@@ -251,5 +251,5 @@ READERS = {
 SETTING_READERS = {
     "ipv6": (_truth, "true or false"),
     "interfaces": (lambda value: _whole(value, 1, 2), "1 or 2"),
-    "domains": (_domains, 'a list of domains such as ["annex.local"]'),
+    "domains": (_domains, 'a list of domains that end in "local", such as ["annex.local"]'),
 }
