@@ -87,11 +87,15 @@ def _seconds_until_listed(person, table, count, began):
     emptied = False
     last, changed = table.get_n_rows(), began
     for look in itertools.count():
+        looks_at_all = look % LOOKS_AT_ALL == 0
+        searching = looks_at_all and person.is_searching()
         rows = table.get_n_rows()
-        emptied = emptied or rows < last or rows == 0
-        if rows != last:
-            last, changed = rows, time.monotonic()
-        if emptied and (rows == count or look % LOOKS_AT_ALL == 0 and not person.is_searching()):
+        if rows != last or searching and not emptied:
+            changed = time.monotonic()
+        # A list that is filled again at once is not seen empty.
+        emptied = emptied or searching or rows < last or rows == 0
+        last = rows
+        if emptied and (rows == count or looks_at_all and not searching):
             return changed - began
         if time.monotonic() - began > WAIT_SECONDS:
             raise TimeoutError("the search did not end")
