@@ -6,8 +6,9 @@
 // file, which has the same name with ".question" appended. The application's loop removes the
 // question file and writes the answer: a JSON array of all visible controls. Each is an object with
 // role, name, states and frame (x, y, width and height in pixels from the screen's upper left
-// corner). Roles and states have their AT-SPI names. The first object stands for the application.
-// It has the role "application" and the number of mouse presses handled so far.
+// corner). Roles and states have their AT-SPI names, except the state "cut off" of a text that
+// lacks room. The first object stands for the application. It has the role "application" and the
+// number of mouse presses handled so far.
 
 #include <unistd.h>
 
@@ -20,6 +21,7 @@
 namespace {
 
 constexpr NSTimeInterval kInterval = 0.02;  // seconds
+constexpr CGFloat kUnlimited = 1e6;
 
 using SendEvent = void(id, SEL, NSEvent*);
 
@@ -74,14 +76,23 @@ class Reader {
     if ([view isKindOfClass:[NSPopUpButton class]]) {
       add(@"button menu", nameOf(static_cast<NSPopUpButton*>(view)), states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSButton class]]) {
+      checkRoom([static_cast<NSButton*>(view) cell], [view bounds], states);
       add(@"push button", [static_cast<NSButton*>(view) title], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSTextField class]]) {
+      checkRoom([static_cast<NSTextField*>(view) cell], [view visibleRect], states);
       add(@"label", [static_cast<NSTextField*>(view) stringValue], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSTextView class]]) {
       add(@"label", [static_cast<NSTextView*>(view) string], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSProgressIndicator class]]) {
       add(@"progress bar", @"", states, view, [view bounds]);
     }
+  }
+
+  // The wizard's own texts must not be cut off. GNUstep lays out its panels itself.
+  void checkRoom(NSCell* cell, NSRect room, NSMutableArray* states) {
+    const NSSize needed = [cell cellSizeForBounds:NSMakeRect(0, 0, NSWidth(room), kUnlimited)];
+    const bool fits = needed.width <= NSWidth(room) && needed.height <= NSHeight(room);
+    if (!fits && ![window_ isKindOfClass:[NSPanel class]]) [states addObject:@"cut off"];
   }
 
   // Reports each row as one list item or, in a table with headers, as one cell per column.
@@ -120,6 +131,7 @@ class Reader {
       NSMutableArray* const states = [NSMutableArray array];
       if ([matrix isEnabled] && [cell isEnabled]) [states addObject:@"enabled"];
       if ([cell state] == NSOnState) [states addObject:@"checked"];
+      checkRoom(cell, [matrix cellFrameAtRow:row column:0], states);
       if ([window_ firstResponder] == matrix && [matrix selectedRow] == row) {
         [states addObject:@"focused"];
       }

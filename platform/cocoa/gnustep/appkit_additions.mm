@@ -70,6 +70,14 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
                              arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
+// GNUstep would return the size of the text on a single line.
+NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
+  if (![self isKindOfClass:[NSTextFieldCell class]]) return [self cellSize];
+  return [[self attributedStringValue] boundingRectWithSize:bounds.size
+                                                    options:NSStringDrawingUsesLineFragmentOrigin]
+      .size;
+}
+
 // The application exchanges no notifications with other applications. GNUstep would start a daemon
 // for such notifications, and the application would fail to launch if that daemon were slow to
 // answer.
@@ -121,6 +129,7 @@ BOOL openURL(id, SEL, NSURL* url) {
         @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:), beginSheet);
     originalPerformKey =
         replaceMethod([NSButton class], @selector(performKeyEquivalent:), performKeyEquivalent);
+    replaceMethod([NSCell class], @selector(cellSizeForBounds:), cellSizeForBounds);
     replaceMethod([NSWorkspace class], @selector(openURL:), openURL);
     replaceMethod(object_getClass([NSDistributedNotificationCenter class]),
                   @selector(defaultCenter), noDistributedCenter);
