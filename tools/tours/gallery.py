@@ -12,6 +12,7 @@ from .ways import GEAR_REFRESH, choose_model
 
 LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
 DEVICES = 40
+_ROWS = 8  # enough to show every kind of name
 _PATIENCE = 120
 _SEARCHES = 10
 _LARGE, _USUAL = 18, 10  # points
@@ -41,12 +42,10 @@ def settings(scheme, points):
 def all_looks(follows_desktop):
     """Returns (language, scale in per cent, scheme, points) for every set of pictures.
 
-    The front end for macOS has one size and one colour scheme under GNUstep, which finds no texts for
-    zh_CN.
+    The front end for macOS has one size and one colour scheme under GNUstep.
     """
     if not follows_desktop:
-        return [(language, 100, "light", _USUAL) for language in (*LANGUAGES, crowded.LANGUAGE)
-                if language != "zh_CN"]
+        return [(language, 100, "light", _USUAL) for language in (*LANGUAGES, crowded.LANGUAGE)]
     looks = [(language, scale, scheme, _USUAL) for language in LANGUAGES for scale in (100, 200)
              for scheme in ("light", "dark")]
     looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
@@ -112,6 +111,7 @@ class Gallery:
             self._search(person)
             # The devices are listed while the wait goes on.
             person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
+            wait_for(lambda: len(person.rows()) >= _ROWS, _PATIENCE, f"{_ROWS} devices in the list")
             self._take(person, "4-devices")
             if Person.follows_desktop:
                 person.press("Tab")  # from the list to the gear button
