@@ -26,9 +26,10 @@ class ModelListView;
 /// the user.
 enum class ToolStart { kAutomatic, kManual };
 
-/// The wizard's only controller. It owns the state, decides which page is shown and passes the
-/// user's choices to the installer package. Each group of functions has its own source file. All
-/// functions must be called on the main thread, except waitDeviceSearchTask() and listedDevices().
+/// The wizard's only controller. It owns the pages, remembers the user's choices, decides which
+/// page is shown and passes the choices to the installer package. The functions are grouped by the
+/// source file that defines them. All functions must be called on the main thread, except
+/// waitDeviceSearchTask() and listedDevices().
 class OnrampOSXAppDelegate final : public ApplicationDelegate {
  public:
   OnrampOSXAppDelegate();
@@ -48,8 +49,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// terminates the application.
   void applicationWillFinishLaunching() override;
 
-  /// Shows the first page, or opens the package and quits when no model on the medium supports
-  /// wireless.
+  /// Shows the first page. When no model on the medium supports wireless, opens the installer
+  /// package and quits instead.
   void applicationDidFinishLaunching() override;
   [[nodiscard]] bool applicationShouldTerminateAfterLastWindowClosed() override { return true; }
 
@@ -64,15 +65,15 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Whether any of `models` supports wireless.
   [[nodiscard]] static bool isSupportWiFi(const std::vector<std::string>& models);
 
-  /// Returns the connection type of a model; `usb` and `ethernet` say whether it supports USB and
-  /// wired Ethernet.
+  /// Returns the connection type of a model. `usb` and `ethernet` say whether the model supports
+  /// USB and wired Ethernet.
   [[nodiscard]] static ConnectionType isIFType(bool usb, bool ethernet);
 
-  /// Returns the type of the model called `model`; kNeither without a name.
+  /// Returns the type of the model called `model`, or kNeither when `model` is nothing.
   [[nodiscard]] static ConnectionType isIFType(const std::optional<std::string>& model);
 
-  /// Returns the type that all of `models` share; kNeither when any two differ, or when there are
-  /// none.
+  /// Returns the type that all of `models` share. Returns kNeither when any two models differ, or
+  /// when there are no models.
   [[nodiscard]] static ConnectionType checkIF(const std::vector<std::string>& models);
 
   // navigation.cpp: pages and buttons.
@@ -82,33 +83,38 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] std::shared_ptr<Page> loadView(const std::string& name);
 
   /// Removes the page that is shown, then shows `page`. When `page` is null, loads a new page from
-  /// the interface file `name` instead. The window shows no page when that page cannot be loaded.
+  /// the interface file `name` and shows that page. If the page cannot be loaded, the window shows
+  /// no page.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
-  /// showModelListView() shows a new model list; showConnectionTypeView() shows a new connection
-  /// page for `type`. The latter also tells the chooser, a ChooseDeviceView, which models to look
-  /// for: the model that the user chose, or else all models on the medium.
+  /// Shows a new model list.
   void showModelListView();
+
+  /// Shows a new connection page for `type`. Also tells the chooser, a ChooseDeviceView, which
+  /// models to look for: the model that the user has chosen or, if there is none, all models on
+  /// the medium.
   void showConnectionTypeView(ConnectionType type);
 
-  /// On the chooser, searches again. On the connection page, shows the chooser if it lists a
-  /// device, and otherwise starts the wireless set-up tool. On any other page, and on the
-  /// connection page after the wizard has started the tool, shows the chooser and searches.
+  /// What this function does depends on the page that is shown:
+  /// - on the chooser, it searches again;
+  /// - on the connection page, as long as the wizard itself has not started the wireless set-up
+  ///   tool, it shows the chooser when the chooser lists a device, and otherwise starts the tool;
+  /// - in every other case, it shows the chooser and searches.
   void showChooseDeviceView();
 
   /// Shows `image` stretched over the window's background. Does nothing without an image.
   void setBackGroundView(const std::optional<Image>& image);
 
-  /// Set the titles of a page's buttons and show or hide each button. Every page has Next and
-  /// Cancel. The connection page also has Back if the user chose a model, and the chooser has Back
-  /// unless the wizard itself has started the set-up tool. These functions neither enable nor
+  /// Set the buttons' titles for a page, and show or hide each button. Every page has Next and
+  /// Cancel. The connection page also has Back if the user has chosen a model, and the chooser has
+  /// Back unless the wizard itself has started the set-up tool. These functions neither enable nor
   /// disable a button.
   void setModelListViewButton();
   void setConnentionTypeViewButton();
   void setChooseDeviceViewButton();
 
-  /// Set the text under `titleKey`, which is a button's title, to the localized "Cancel", "Back"
-  /// and "Next", in this order.
+  /// Each function sets the title of one button to the localized word in the function's name.
+  /// `titleKey` is the key of boundTexts() to which the button's title is bound.
   void setCancelButton(std::string_view titleKey);
   void setBackButton(std::string_view titleKey);
   void setNextButton(std::string_view titleKey);
@@ -116,8 +122,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void performAction(std::string_view action) override;
 
   // The buttons' actions. The rightmost button is Next. The button to its left is Back, or Cancel
-  // on a page without Back. The other two buttons always quit. Every button quits when none of the
-  // three pages is shown.
+  // on a page without Back. The other two buttons always quit. When none of the three pages is
+  // shown, every button quits.
   void rightMostButtonClicked();
   void rightButtonClicked();
   void leftButtonClicked();
@@ -128,38 +134,44 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// The components of the running system's version; empty when the version is unknown.
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
-  /// Compare the running system's version with the medium's maximum and minimum, by the rules of
-  /// isNewerThan() and isOlderThan(), and return kSupported when the version is within the bound.
-  /// Unlike installationCheck(), these functions do not skip a bound whose "Major" is 0.
+  /// Compare the running system's version with one bound of the medium's range.
+  /// supportedOSMaxCheck() returns kNewerThanMaximum if isNewerThan() is true, and
+  /// supportedOSMinCheck() returns kOlderThanMinimum if isOlderThan() is true. Otherwise both
+  /// return kSupported. Unlike installationCheck(), they do not skip a bound whose "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
-  /// Checks the maximum first, then the minimum. Skips a bound whose "Major" is 0.
+  /// Compares the running system's version with the medium's maximum and then with its minimum.
+  /// Skips a bound whose "Major" is 0. Returns kNewerThanMaximum or kOlderThanMinimum for the first
+  /// bound that the version violates, and otherwise kSupported.
   [[nodiscard]] SystemSupport installationCheck() const;
 
-  /// The minimum version as text, such as "10.6.0".
+  /// The medium's minimum version as text, such as "10.6.0".
   [[nodiscard]] std::string supportSystemMinString() const;
 
   /// Shows an alert that says why the system is not supported, and returns when the user has
-  /// dismissed it. Does nothing for a supported system.
+  /// dismissed the alert. Does nothing for a supported system. `parent` is not used.
   void showSystemNotSpecifiedAlert(const Window& parent, SystemSupport type) const;
 
   // hand_off.cpp: the files that hand the choices to the installer package.
 
-  /// The medium's vendor name without its spaces; empty when the medium names no vendor.
+  /// Returns the medium's vendor name without its spaces, or an empty text when the medium names no
+  /// vendor.
   [[nodiscard]] static std::string setVenderName();
 
-  /// Return the paths of the package-options file, which tells the package what else to install,
-  /// and of the model file, which names the device's model and connection. Each function creates
-  /// the file's folder if the folder is missing, and ignores failures. InstallPKGInfoURL() makes a
-  /// folder that it creates writable for every user.
+  /// Returns the path of the package-options file, which tells the package what else to install. If
+  /// the file's folder is missing, creates it and makes it writable for every user. Ignores
+  /// failures.
   [[nodiscard]] static std::string InstallPKGInfoURL();
+
+  /// Returns the path of the model file, which names the device's model and connection. Creates the
+  /// file's folder if it is missing. Ignores failures.
   [[nodiscard]] static std::string instmodelPlistURL();
 
   /// Builds and writes the package-options file. Ignores failures.
   static void copyCDInfo();
 
-  /// Returns the model file's contents for a device that is connected by cable: USB or Ethernet.
+  /// Returns the model file's contents for a device that is connected by a USB or Ethernet cable.
   [[nodiscard]] static Dictionary instmodelPlistNotWiFi(const std::string& model);
 
   /// Returns the model file's contents for a wireless device with the KSDevice record `property`.
@@ -175,12 +187,14 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// package for the system, or when the package cannot be opened.
   bool launchPackage();
 
-  /// Terminates the application after one second, which gives the package time to open.
+  /// Returns at once, and terminates the application one second later. The delay gives the package
+  /// time to open.
   void quitMe();
 
   /// Hide the application, run the wireless set-up tool and act on its exit status. Both functions
-  /// return before the tool starts. launchWLANToolAutomatically() is for a search that found no
-  /// device. Only after this function can the tool send the user back to the connection page.
+  /// return before the tool starts. launchWLANToolAutomatically() is called after a search that
+  /// found no device, and launchWLANToolManually() at the user's request. Only a tool that was
+  /// started automatically can send the user back to the connection page.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 
@@ -194,26 +208,25 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop for kMostPauses pauses of length `pause`. If the chooser lists a device
-  /// at the end of a pause, the wait ends there. Afterwards ends the search. During the wait,
-  /// `page`, unless it is null, shows its waiting state, and the user can neither click a button
-  /// nor close the window.
+  /// Waits in a modal loop for kMostPauses pauses of length `pause`, or until the chooser lists a
+  /// device at the end of a pause. Then ends the search. During the wait, the user can neither
+  /// click a button nor close the window, and `page` shows its spinner. `page` may be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Sleeps for kMostPauses pauses of length `pause`. Stops early if a device is listed at the end
-  /// of a pause, and when the application terminates. Afterwards ends the modal loop. Must not be
-  /// called on the main thread.
+  /// Sleeps for kMostPauses pauses of length `pause`, until a device is listed at the end of a
+  /// pause, or until the application terminates. Then ends the modal loop. Must not be called on
+  /// the main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 
-  /// Waits as showProgress() does, with the chooser as the page. Afterwards enables Next if a
-  /// device is listed; otherwise disables Next and says in a sheet that no device was found.
+  /// Calls showProgress() with the chooser as the page. Afterwards enables Next if a device is
+  /// listed. Otherwise disables Next and says in a sheet that no device was found.
   void showProgressAtChooseDeviceView(std::chrono::seconds pause);
 
-  /// Calls showProgressAtChooseDeviceView() with the pause that the notification carries under
-  /// kWaitTime. If it carries none, the pauses have length 0.
+  /// Calls showProgressAtChooseDeviceView() with the number of seconds under kWaitTime in the
+  /// notification's user info, or with 0 when there is no such number.
   void showProgressAtChooseDeviceViewByRefresh(const Notification& notification);
 
-  /// Tells the user in a sheet that no device was found.
+  /// Tells the user in a sheet that no device was found, and returns at once.
   void showListAlertSheet();
 
   /// Opens the support page if `returnCode` is kAlertOtherReturn, which stands for the sheet's
@@ -226,7 +239,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// The chooser, or null when its interface file was not usable.
   [[nodiscard]] ChooseDeviceView* chooser() const;
 
-  /// The number of devices that the chooser lists. Callable from any thread.
+  /// The number of devices that the chooser lists, or 0 when there is no chooser. Callable from any
+  /// thread.
   [[nodiscard]] std::size_t listedDevices() const;
 
   /// Returns the page shown if it is a PageClass, otherwise null.
@@ -265,8 +279,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   Dictionary mKSCD;
   std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses from the model list
   std::uint32_t mContainedModelCount = 0;
-  /// Whether the wizard itself has started the set-up tool, and the tool has not sent the user
-  /// back.
+  /// True from the wizard's own start of the set-up tool until the tool sends the user back.
   bool mIsWLANTool = false;
   std::shared_ptr<Page> mChooseDeviceViewController;
   std::shared_ptr<Page> mShownPage;  ///< the page whose view is in `mainView`

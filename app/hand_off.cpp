@@ -56,7 +56,7 @@ bool fontSetOption(const Dictionary& options) {
   return language == "ja" || language == "ko" || language == "zh";
 }
 
-// In the records, an empty text stands for an unknown value.
+// In the records of the medium and of devices, an empty text stands for an unknown value.
 std::optional<std::string> knownText(const Dictionary& record, std::string_view key) {
   std::optional<std::string> text = record.string(key);
   return text && !text->empty() ? text : std::nullopt;

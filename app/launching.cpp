@@ -21,8 +21,8 @@ namespace {
 // The time between opening the package and terminating the application.
 constexpr std::chrono::milliseconds kQuitDelay{1000};
 
-// The time between hiding the application and running the set-up tool, which blocks the main
-// thread. The window gets this time to disappear.
+// The time between hiding the application and running the set-up tool. The main thread is blocked
+// while the tool runs, so the window has to disappear before that.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
 // Exit statuses of the set-up tool. Any other status leads to a new search, and so does a tool that

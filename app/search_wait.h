@@ -4,10 +4,10 @@
 
 namespace onramp {
 
-// How long the wizard waits for the device search. A wait consists of pauses, after each of which
-// the wizard checks whether a device is listed.
+// How long the wizard waits for the device search. A wait consists of pauses. After each pause, the
+// wizard checks whether a device is listed, and ends the wait if one is.
 
-/// The number of pauses in a wait that finds no device. A wait ends early once a device is listed.
+/// The number of pauses in a wait that finds no device.
 inline constexpr int kMostPauses = 5;
 
 /// The length of each pause when the user has clicked Next on the connection page.

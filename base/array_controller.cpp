@@ -29,7 +29,7 @@ void ArrayController::removeObject(const Dictionary& entry) {
   std::size_t kept = 0;
   std::optional<std::size_t> selection;
   for (std::size_t i = 0; i < entries_.size(); ++i) {
-    if (selection_ == i) selection = kept;  // if this entry is removed, its successor moves here
+    if (selection_ == i) selection = kept;  // if entry i is removed, its successor moves to `kept`
     if (entries_[i] == entry) {
       if (selection_ == i) hasChoice_ = false;
       continue;

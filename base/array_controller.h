@@ -11,13 +11,14 @@
 
 namespace onramp {
 
-/// Holds the entries of a list, their order and the selection, and updates the table that shows
-/// them. All functions except arrangedCount() must be called on the main thread.
+/// Holds a list's entries, their order and the selection. A table that shows the list is bound to
+/// it and is told of every change. All functions except arrangedCount() must be called on the main
+/// thread.
 class ArrayController {
  public:
-  /// Sets the key whose values rearrange() sorts by. An entry with no string under `key` sorts as
-  /// if the string were empty. With an empty `key`, which is the default, rearrange() does not
-  /// change the order.
+  /// Makes rearrange() sort the entries by their strings under `key`. An entry that has no string
+  /// under `key` sorts as if the string were empty. With an empty `key`, which is the default,
+  /// rearrange() does not change the order.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
   /// Appends `entries` without sorting the list. If the list was empty, its first new entry becomes
@@ -25,16 +26,18 @@ class ArrayController {
   void addObjects(std::vector<Dictionary> entries);
 
   /// Removes every entry equal to `entry`. If the selected entry is removed, the next remaining
-  /// entry becomes selected, or the last entry when no entry follows. Nothing is selected in an
-  /// empty list. Does nothing when no entry is equal to `entry`.
+  /// entry becomes selected; if no entry follows, the last entry becomes selected. If the list
+  /// becomes empty, the selection is cleared. Does nothing when no entry is equal to `entry`.
   void removeObject(const Dictionary& entry);
 
+  /// Removes all entries, and thereby clears the selection.
   void removeAllObjects();
 
-  /// Sorts the entries by their strings under the sort key, in ascending byte order. Entries with
-  /// equal strings keep their order. The selected entry stays selected.
+  /// Sorts the entries by their strings under the key of setSortKey(), in ascending byte order.
+  /// Entries with equal strings keep their order. The selected entry stays selected.
   void rearrange();
 
+  /// The entries in the list's order.
   [[nodiscard]] const std::vector<Dictionary>& arrangedObjects() const { return entries_; }
 
   /// The number of entries. Callable from any thread.
@@ -46,13 +49,15 @@ class ArrayController {
   /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
   void setSelectedObject(const Dictionary& entry);
 
-  /// Select an entry as setSelectionIndex() and setSelectedObject() do, and record that the user
-  /// made the selection. The bound table calls choose().
+  /// choose() selects an entry as setSelectionIndex() does, and chooseObject() as
+  /// setSelectedObject() does. Both also record that the user has made a selection, even when they
+  /// clear the selection. The bound table calls choose().
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 
-  /// Whether the user has made a selection: true after choose() and chooseObject(), false after the
-  /// selected entry has been removed and after removeAllObjects().
+  /// Whether the user has made a selection. The result is false at first, true after choose() and
+  /// chooseObject(), and false again once the selected entry has been removed or removeAllObjects()
+  /// has been called.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
   /// Return the index of the selected entry, and the entry itself. Both return nothing when no
@@ -61,9 +66,9 @@ class ArrayController {
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 
   /// Binds a table to the list. `onChange` is called now, after every change of the entries, and
-  /// after every call of rearrange() and removeAllObjects(). `onSelect` is called after every other
-  /// call that sets the selection. A later call replaces both functions. Empty functions unbind the
-  /// table.
+  /// after every call of rearrange() and removeAllObjects(). `onSelect` is called after every call
+  /// of setSelectionIndex(), setSelectedObject(), choose() and chooseObject(). A later call of
+  /// bind() replaces both functions. Empty functions unbind the table.
   void bind(std::function<void()> onChange, std::function<void()> onSelect);
 
  private:

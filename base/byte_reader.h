@@ -10,8 +10,8 @@ namespace onramp {
 
 /// Reads untrusted bytes, such as those from the network or the medium, from front to back and
 /// never past their end. A read of more bytes than remain returns nothing and does not move the
-/// reader. A copy of a reader moves independently, so it can be used to look ahead. The bytes must
-/// outlive the reader, its copies and the views that they return.
+/// reader. A copy of a reader moves independently of the original, so a copy can be used to look
+/// ahead. The bytes must outlive the reader, its copies and the views that they return.
 class ByteReader {
  public:
   explicit ByteReader(std::span<const std::byte> bytes) : rest_(bytes) {}
@@ -44,8 +44,7 @@ class ByteReader {
     return std::string_view(reinterpret_cast<const char*>(taken->data()), taken->size());
   }
 
-  /// Reads an unsigned big-endian number of `size` bytes. Also returns nothing when `size` is above
-  /// 8.
+  /// Reads an unsigned big-endian number of `size` bytes. Returns nothing when `size` is above 8.
   [[nodiscard]] std::optional<std::uint64_t> number(std::size_t size) {
     if (size > sizeof(std::uint64_t)) return std::nullopt;
     const auto bytes = take(size);

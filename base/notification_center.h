@@ -19,26 +19,28 @@ struct Notification {
   UserInfo userInfo;
 };
 
-/// Delivers every posted notification to the observers of its name, synchronously and in the order
-/// in which the observers were added. All functions must be called on the main thread.
+/// Passes every posted notification to the handlers that observe its name. The handlers are called
+/// synchronously, in the order in which they were added. All functions must be called on the main
+/// thread.
 class NotificationCenter {
  public:
   using Handler = std::function<void(const Notification&)>;
 
-  /// The centre that the whole process shares.
+  /// Returns the centre that the whole process shares.
   [[nodiscard]] static NotificationCenter& defaultCenter();
 
-  /// Calls `handler` for every notification called `name`, whoever posts it, until `observer` is
-  /// removed. `observer` only identifies the observation and is never dereferenced.
+  /// Calls `handler` for every notification called `name`, whoever posts it, until removeObserver()
+  /// is called for `observer`. `observer` is never dereferenced. An observer may have several
+  /// handlers.
   void addObserver(const void* observer, std::string_view name, Handler handler);
 
-  /// Removes all observations of `observer`. An observer that is removed before a delivery reaches
-  /// it is not called.
+  /// Removes all handlers of `observer`. A notification that is being delivered does not reach the
+  /// removed handlers any more.
   void removeObserver(const void* observer);
 
-  /// Calls the handlers that observe the notification's name. Handlers may add and remove observers
-  /// and post further notifications. An observer added during a delivery does not get that
-  /// notification.
+  /// Calls all handlers that were added for the notification's name. A handler may add and remove
+  /// observers and post further notifications. A handler that is added during a delivery does not
+  /// get the notification that is being delivered.
   void post(const Notification& notification);
 
  private:

@@ -44,8 +44,8 @@ class Dictionary {
   [[nodiscard]] const Value* find(std::string_view key) const;
 
   /// Return the value under `key` if it is of the type that the function is named after. Otherwise
-  /// array() returns null and the other two return nothing. The pointer to the array is valid as
-  /// long as a pointer that find() returns.
+  /// array() returns null, and string() and dictionary() return nothing. The pointer that array()
+  /// returns is valid for as long as one that find() returns.
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;
@@ -101,8 +101,8 @@ class Value {
     return std::get_if<Kind>(&storage_);
   }
 
-  /// Returns a boolean itself, and for a number whether it is not zero. Returns nothing for all
-  /// other types.
+  /// Converts the value to a boolean. A number is true unless it is zero. A value that is neither a
+  /// boolean nor a number gives nothing.
   [[nodiscard]] std::optional<bool> boolean() const;
 
   /// Converts the value to an integer. A boolean gives 0 or 1. A real number is truncated towards

@@ -15,10 +15,10 @@ struct FileURL {
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
 
-/// Returns the key, within the medium resource dictionary's "PkgInfo" dictionary, that names the
-/// package for system version `version`. Returns nothing when no key covers that version. `version`
-/// is in binary-coded decimal: 0x1068 is 10.6.8. "PkgName" takes precedence over the keys that this
-/// function returns.
+/// The dictionary "PkgInfo" of the medium resource dictionary may name a separate package for each
+/// range of system versions. Returns the key that names the package for `version`, or nothing when
+/// no key covers `version`. `version` is in binary-coded decimal: 0x1068 is 10.6.8. If "PkgInfo"
+/// has the key "PkgName", the wizard uses only that key.
 [[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
 /// Where the installer package and the wireless set-up tool are on the medium, and which systems
@@ -28,11 +28,11 @@ class KSInstallerInfo {
   /// Reads the medium that the wizard is on.
   KSInstallerInfo();
 
-  /// Sets all values from the medium resource dictionary `common`, or to their defaults when
-  /// `common` is nothing.
+  /// Sets all values from the medium resource dictionary `common`. When `common` is nothing, sets
+  /// them to their defaults.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
-  // Each sets only the values that it is named after, from the dictionary or to their defaults.
+  // These functions do what setCDCommonInfoValue() does, each for the values in its name only.
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);

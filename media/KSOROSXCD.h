@@ -11,7 +11,7 @@ namespace onramp {
 
 /// Makes a record of the medium: the models that the medium serves, whether it has a printer
 /// package and a scanner package, its series code at the support centre, and the service type by
-/// which devices of these models are found.
+/// which devices are found on the network.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.
@@ -25,10 +25,10 @@ inline constexpr std::string_view kBonjourServiceType =
 /// Returns the record of the medium that the wizard is on. Every call reads the medium again.
 [[nodiscard]] Dictionary initWithCDInfo();
 
-/// Returns the record for the dictionary `info`, which is in the file that "CDInfo" names, and the
-/// medium resource dictionary `CDCommonInfo`. A value that is absent or of the wrong type gets its
-/// default: no models, true for a package, an empty text. Without `info`, all values get their
-/// defaults, even the service type, which comes from `CDCommonInfo`.
+/// Makes the record from two dictionaries. `info` is the dictionary in the file that "CDInfo"
+/// names, and `CDCommonInfo` is the medium resource dictionary, which gives only the service type.
+/// A value that is absent or of the wrong type gets its default: no models, true for a package, an
+/// empty text. Without `info`, all values get their defaults, even the service type.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
@@ -38,8 +38,8 @@ inline constexpr std::string_view kBonjourServiceType =
 
 }  // namespace KSOROSXCD
 
-/// Returns the strings under kContainedModels, in the record's order. Returns no models when the
-/// record has no such array.
+/// Returns the model names under kContainedModels of `record`, in the record's order. Returns no
+/// names when the record has no such array.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

@@ -28,9 +28,9 @@ inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< b
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
 /// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
-/// in it supports USB only and has an empty identifier. A listed model supports USB, but no
-/// network, unless its entry says otherwise. The record of a listed model without an identifier
-/// ("KSCID") holds nothing but the name. Without a name, the record is empty.
+/// there supports USB only and has an empty identifier. A listed model supports USB, but no
+/// network, unless its entry says otherwise. If the entry of a listed model has no identifier
+/// ("KSCID"), the record holds only the name. When `name` is nothing, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);
 

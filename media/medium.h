@@ -23,8 +23,9 @@ inline constexpr std::string_view kVenderName = "VenderName";
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
 /// at `bundlePath`. Without a relative path, returns that folder. `bundlePath` must not end in "/".
-/// When it contains no "/", returns the relative path itself, or an empty text when there is none.
-/// Drops slashes at the result's end, as withoutClosingSlash() does. Does not access the disk.
+/// When `bundlePath` contains no "/", returns the relative path itself, or an empty text when there
+/// is none. Drops slashes at the result's end, as withoutClosingSlash() does. Does not access the
+/// disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 
@@ -41,8 +42,8 @@ inline constexpr std::string_view kVenderName = "VenderName";
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 
-/// Returns the vendor name in `resources` without its spaces; empty when `resources` has no vendor
-/// name.
+/// Returns the vendor name in `resources` without its spaces, or an empty text when `resources` has
+/// no vendor name.
 [[nodiscard]] std::string vendorName(const std::optional<Dictionary>& resources);
 
 }  // namespace onramp::medium

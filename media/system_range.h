@@ -15,8 +15,8 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-/// Returns the version with these components. A component that is missing, such as the third of
-/// 10.9, counts as 0, and so does one that does not begin with a number.
+/// Returns the version with these components. A missing component, such as the third one of 10.9,
+/// counts as 0, and so does a component that does not begin with a number.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
 /// How a system compares with the range that the medium supports.
@@ -29,20 +29,19 @@ enum class SystemSupport : std::uint32_t {
 // The functions that follow take bounds in the form that KSInstallerInfo returns. A key that is
 // missing counts as 0.
 
-/// Whether `bound` sets a limit: whether its "Major" is not 0. isNewerThan() and isOlderThan() do
-/// not check this.
+/// Whether `bound` sets a limit, that is, whether its "Major" is not 0. isNewerThan() and
+/// isOlderThan() do not check this.
 [[nodiscard]] bool isBound(const Dictionary& bound);
 
-/// Whether `version` is above `maximum`. The maximum's "Major" and "Minor" are inclusive, but its
-/// "BugFix" is exclusive: it is the first bug-fix release of that minor version that is too new. A
-/// "BugFix" of "x" or "X" allows every bug-fix release of that minor version.
+/// Whether `version` is above `maximum`. The maximum's "Major" and "Minor" are inclusive. Its
+/// "BugFix" is exclusive: the bug-fix release with this number is itself too new. A "BugFix" of "x"
+/// or "X" allows every bug-fix release of the maximum's minor version.
 [[nodiscard]] bool isNewerThan(const Dictionary& maximum, const SystemVersion& version);
 
 /// Whether `version` is below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
-/// How `version` compares with both bounds. The maximum is checked first. A bound that sets no
-/// limit is skipped.
+/// Compares `version` with `maximum` and then with `minimum`. Skips a bound that sets no limit.
 [[nodiscard]] SystemSupport systemSupport(const SystemVersion& version, const Dictionary& minimum,
                                           const Dictionary& maximum);
 

@@ -15,8 +15,9 @@ namespace onramp {
 
 namespace {
 
-// Returns the set-up tool's display name in the user's language. If the tool has none, returns the
-// tool's file name without the extension. Returns an empty text when the medium cannot be read.
+// Returns the set-up tool's display name in the user's language. If the tool has no display name,
+// returns its file name without the extension. Returns an empty text when the medium cannot be
+// read.
 std::string setupToolName() {
   const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
   if (!tool) return "";
@@ -101,7 +102,8 @@ void ChooseDeviceView::stopBrowsing() {
   if (!mBonjourSearch) return;
   mBonjourSearch->stopBrowsing();
   mBonjourSearch->removeKSDeviceObserver(this);
-  // The search may have called this function, so it is destroyed only after the current event.
+  // The search object may be the caller of this function, so it is destroyed only after the current
+  // event.
   performOnMainThread([search = std::exchange(mBonjourSearch, nullptr)] {});
 }
 
@@ -158,8 +160,8 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // The first row is selected until the user makes a choice. Later reports do not change that
-  // choice.
+  // The first row is selected until the user chooses a row. From then on, reports of devices leave
+  // the user's choice alone.
   if (isChoice) {
     deviceArrayController.chooseObject(entry);
   } else if (!deviceArrayController.hasChoice()) {

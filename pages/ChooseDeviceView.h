@@ -21,22 +21,22 @@ namespace onramp {
 /// Requests that the wireless set-up tool be launched. Carries no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Requests a wait for the device search. Under kWaitTime, carries an int: the length in seconds of
-/// each pause of the wait (see app/search_wait.h).
+/// Requests a wait for the device search. The user info holds an int under kWaitTime: the length in
+/// seconds of each pause of the wait (see app/search_wait.h).
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
-/// The page that lists the devices found on the network. A device is listed if its model is one of
-/// those being looked for and the device reports that it is on wireless. The page is created once,
-/// and it keeps its list and a running search while another page is shown. A running search shares
-/// ownership of the page until stopBrowsing() is called.
+/// The page that lists the devices found on the network. A device is listed if its model is looked
+/// for and the device reports that it is using its wireless interface. The page object is created
+/// once. While the window shows another page, this object keeps its list, and a running search goes
+/// on. A running search shares ownership of the object until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
  public:
   // Keys of a list entry.
   static constexpr std::string_view kDevice = "device";        ///< string, the device's name
-  static constexpr std::string_view kInterface = "interface";  ///< string, kind of connection
+  static constexpr std::string_view kInterface = "interface";  ///< string, localized "Network"
   static constexpr std::string_view kLocation = "location";  ///< string, the first address, if any
   static constexpr std::string_view kKSDevice = "ksdevice";  ///< dictionary, the device record
 
@@ -73,30 +73,31 @@ class ChooseDeviceView final : public Page,
   /// Enables or disables the pop-up button with the page's commands.
   void deviceListPopupButtonEnable(bool enable);
 
-  /// Shows or hides the waiting state.
+  /// Shows or hides the spinner and the text beside it, which asks the user to wait.
   void progressON(bool on);
 
-  /// Called by the search. addKSDevice() and updateKSDevice() call setServiceToList() if
-  /// doesMatchedModel() and doesWiFi() return true. doesWiFi() comes second, because it may block
-  /// for seconds.
-  /// removeKSDevice() calls removeServiceFromList() if doesMatchedModel() returns true.
+  /// The search calls these three functions. addKSDevice() and updateKSDevice() call
+  /// setServiceToList() if doesMatchedModel() and doesWiFi() return true. doesWiFi() is called
+  /// second, because it may block for seconds. removeKSDevice() calls removeServiceFromList() if
+  /// doesMatchedModel() returns true.
   void addKSDevice(const Dictionary& device) override;
   void updateKSDevice(const Dictionary& device) override;
   void removeKSDevice(const Dictionary& device) override;
 
-  /// Whether the device is of a model being looked for. Always false when no models have been set.
+  /// Whether the device's model is one of those that setSearchModelList() has set.
   [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
 
-  /// Whether the device answers that it is on wireless; false when the record has no addresses.
-  /// Blocks for about 12 seconds for each address that does not answer.
+  /// Whether the device answers that it is using its wireless interface; false when the record has
+  /// no addresses. Blocks for about 12 seconds for each address that does not answer.
   [[nodiscard]] static bool doesWiFi(const Dictionary& device);
 
   /// Adds the device's entry to the list, replacing an equal entry if there is one. The entry that
-  /// the user has chosen stays selected.
+  /// the user has chosen stays selected. Until the user chooses an entry, the first one is
+  /// selected.
   void setServiceToList(const Dictionary& device);
 
-  /// Removes the entry that equals the one made from the record `device`. Does nothing when there
-  /// is no such entry.
+  /// Removes the entry that setServiceToList() would add for `device`. Does nothing when the list
+  /// has no such entry.
   void removeServiceFromList(const Dictionary& device);
 
  private:

@@ -29,7 +29,8 @@ class ConnectionTypeView final : public Page {
   /// Selects the choice in `row`. The only `column` is 0.
   void setChooseButton(int row, int column);
 
-  /// Shows or hides the waiting state, in which the choice cannot be changed.
+  /// Shows or hides the spinner and the text beside it, which asks the user to wait. While they are
+  /// shown, the user cannot change the choice.
   void progressON(bool on);
 
   /// The full path of the medium's image folder.

@@ -22,13 +22,15 @@ class Page {
   [[nodiscard]] View view() const { return interface_->view(); }
 
  protected:
+  /// Returns the object that the interface file calls `name`, or an empty handle when no object of
+  /// the handle's kind has that name.
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return interface_->outlet<Handle>(name);
   }
 
-  /// Destroys the view. A page whose members are bound to the view must call this function in its
-  /// destructor, because the members are destroyed before the base class.
+  /// Destroys the view. A page with a list that is bound to a table must call this function in its
+  /// destructor. Otherwise the list would be destroyed before the table.
   void destroyView() { interface_.reset(); }
 
  private:
@@ -39,7 +41,8 @@ class Page {
 /// the file is missing or unreadable, or holds no view.
 [[nodiscard]] std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner);
 
-/// Shows or hides a page's waiting state: a turning spinner and the text beside it.
+/// Shows or hides `progress`, a spinner, and `text`, which asks the user to wait. The spinner turns
+/// while it is shown.
 void showWaiting(const ProgressIndicator& progress, const TextField& text, bool on);
 
 }  // namespace onramp

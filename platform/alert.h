@@ -16,6 +16,7 @@ inline constexpr int kAlertOtherReturn = -1;
 void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
                       const std::string& buttonTitle);
 
+/// The texts of a sheet with two buttons.
 struct AlertSheet {
   std::string title;
   std::string message;

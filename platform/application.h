@@ -9,14 +9,15 @@
 
 namespace onramp {
 
-/// The interface of the controller. Through this interface, the application reports events to the
-/// controller and asks for decisions. An application has one controller. It is the owner
-/// of the main interface file.
+/// The interface through which the application reports events to its controller and asks the
+/// controller for decisions. An application has one controller, which is also the owner of the main
+/// interface file.
 class ApplicationDelegate : public InterfaceOwner {
  public:
-  /// Gives the controller the objects of the main interface file. The application calls
-  /// awakeFromNib() next.
+  /// Gives the controller the objects of the main interface file.
   virtual void setOutlets(const Interface& mainInterface) = 0;
+
+  /// Called once, after setOutlets() and before the main loop starts.
   virtual void awakeFromNib() = 0;
 
   /// The two functions below are called, in this order, when the main loop starts. The second one
@@ -43,8 +44,8 @@ int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
 /// Terminates the application. The main loop and any modal loop inside it stop, and no further
-/// timer or event is handled. On some systems the process ends inside this function. On the others
-/// the function returns, and the caller must stop what it is doing.
+/// timer or event is handled. On some systems the process ends inside this function. On other
+/// systems the function returns, and the caller must stop what it is doing.
 void terminateApplication();
 
 /// hideApplication() takes all windows off the screen. unhideApplication() brings those windows
@@ -52,8 +53,8 @@ void terminateApplication();
 void hideApplication();
 void unhideApplication();
 
-/// Asks the system to make this the active application, even if the user is working in another one.
-/// The system may refuse.
+/// Asks the system to make this the active application, even if the user is working in another
+/// application. The system may refuse.
 void activateIgnoringOtherApps();
 
 /// Returns the main menu, or an empty handle when there is none.

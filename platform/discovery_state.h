@@ -6,8 +6,8 @@
 
 namespace onramp {
 
-// Information about service discovery for diagnostic programs. The wizard does not use it. Main
-// thread only.
+// Information about service discovery for diagnostic programs. The wizard does not use this header.
+// All functions must be called on the main thread.
 
 /// Returns the reason, in English, why the system's service discovery cannot be used. Returns
 /// nothing when no such reason is known. May block until the system answers. A search may be
@@ -15,10 +15,10 @@ namespace onramp {
 /// works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
-/// Reports that a search of a NetServiceBrowser sees a service on one network interface and
-/// protocol, or no longer sees it there. The browser itself merges all sightings of a service. When
-/// the search ends or discovery stops working, the services that were seen until then are not
-/// reported as gone.
+/// Reports that a NetServiceBrowser's search sees a service on one network interface and protocol,
+/// or no longer sees the service there. The browser's client, in contrast, is told only of a
+/// service's first sighting and of the loss of the last one. When the search ends or discovery
+/// stops working, the services that were seen until then are not reported as gone.
 struct ServiceSighting {
   std::string name;       ///< as NetService::name()
   std::string type;       ///< as NetService::type()

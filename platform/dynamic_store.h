@@ -11,9 +11,9 @@
 
 /// Access to the system's dynamic configuration store. The store describes the current state of the
 /// computer's network as dictionaries under keys such as "State:/Network/Interface/en0/IPv4". Each
-/// function here except addSourceToMainLoop() corresponds to one in the SystemConfiguration
-/// framework of macOS. One backend uses that framework. The other one obtains the entries described
-/// below from the Linux kernel.
+/// function here except addSourceToMainLoop() corresponds to a function of the SystemConfiguration
+/// framework of macOS. The backend for macOS uses that framework. The backend for Linux obtains the
+/// entries described below from the kernel.
 ///
 /// Callers can rely on two kinds of entries, both in the domain kSCDynamicStoreDomainState:
 /// - the IPv4 entity of an interface. It exists for every interface that is up, can pass traffic
@@ -34,7 +34,7 @@ inline constexpr std::string_view kSCPropNetIPv4BroadcastAddresses = "BroadcastA
 inline constexpr std::string_view kSCPropNetIPv4SubnetMasks = "SubnetMasks";
 inline constexpr std::string_view kSCDynamicStorePropNetPrimaryInterface = "PrimaryInterface";
 
-/// The error codes that both backends use. The framework has others as well.
+/// The error codes that both backends use. The framework has further codes.
 inline constexpr int kSCStatusOK = 0;
 inline constexpr int kSCStatusFailed = 1001;
 inline constexpr int kSCStatusInvalidArgument = 1002;

@@ -9,9 +9,9 @@
 
 namespace onramp {
 
-/// The owner of an interface file, which is the object for which the file is loaded. The file binds
-/// titles to the owner's texts and sends clicks to the owner's actions. The owner must outlive
-/// everything that is loaded for it.
+/// The owner of an interface file. The file binds titles to the owner's texts, and names the
+/// owner's action that each click performs. The owner must outlive all objects that are created
+/// from the file.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;
@@ -19,7 +19,8 @@ class InterfaceOwner {
   InterfaceOwner& operator=(const InterfaceOwner&) = delete;
   virtual ~InterfaceOwner() = default;
 
-  /// Performs the action that the interface file calls `action`. An unknown name has no effect.
+  /// Performs the action that the interface file calls `action`. Does nothing when the owner has no
+  /// such action.
   virtual void performAction(std::string_view action) = 0;
 
   /// Returns the texts to which the interface file binds titles.

@@ -64,14 +64,14 @@ class NetServiceBrowser {
   /// Starts to look for `type`, such as "_ipp._tcp.", in `domain`, such as "local.". An empty
   /// domain means all domains that the computer is configured to browse, "local." included. Returns
   /// false when the search cannot start, for example because another search of this browser is
-  /// running. A responder that is not running is not a failure: the search starts by itself once
-  /// the responder is running, and starts again after the responder has restarted.
+  /// running. The search starts even if the responder is not running. It then finds services once
+  /// the responder runs, and it starts again by itself after the responder has restarted.
   virtual bool searchForServices(const std::string& domain, const std::string& type) = 0;
 
   /// Ends the browser for good. The client is not called again.
   virtual void invalidate() = 0;
 
-  /// Ends the running search, if there is one. Its services are not reported as gone.
+  /// Ends the running search, if there is one. The search's services are not reported as gone.
   virtual void stopSearch() = 0;
 };
 

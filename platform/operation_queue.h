@@ -7,8 +7,8 @@
 
 namespace onramp {
 
-/// Runs operations off the main thread, each on its own thread. The destructor waits for all of
-/// them, so whatever an operation refers to must exist until the queue is destroyed.
+/// Runs operations off the main thread, each on its own thread. The destructor waits for the end of
+/// all operations, so whatever an operation refers to must exist until the queue is destroyed.
 class OperationQueue {
  public:
   OperationQueue() = default;

@@ -10,7 +10,7 @@ namespace onramp {
 
 class ArrayController;
 
-/// The object to which an Outlet refers. Only the linked front end knows its type.
+/// The object to which an Outlet refers. Only the linked front end knows the object's type.
 struct NativeObject;
 
 enum class OutletKind {
@@ -57,7 +57,7 @@ class View : public Outlet {
   /// none.
   [[nodiscard]] View firstSubview() const;
 
-  /// Puts `view` inside this one and makes it fill this one. Gives the keyboard focus to the first
+  /// Puts `view` inside this view and makes `view` fill it. Gives the keyboard focus to the first
   /// list in `view`, or to the first control if there is no list. The owner of `view` does not
   /// change.
   void addSubview(const View& view) const;
@@ -83,8 +83,8 @@ class TextField : public View {
   void setStringValue(const std::string& text) const;
 };
 
-/// A push button. The interface file binds its title and names the owner's action that a click
-/// performs.
+/// A push button. The interface file binds the button's title to a text of the file's owner, and
+/// names the owner's action that a click performs.
 class Button : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kButton;
@@ -98,11 +98,11 @@ class RadioMatrix : public Control {
   using Control::Control;
 
   void setTitle(int row, int column, const std::string& title) const;
-  /// Selects the button in this place, and thereby deselects every other one.
+  /// Selects the button in this place and deselects all others.
   void selectCell(int row, int column) const;
 
-  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty,
-  /// and 0 or -1 when no button is selected.
+  /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty.
+  /// When no button is selected, the result is 0 or -1, depending on the front end.
   [[nodiscard]] int selectedRow() const;
 };
 
@@ -130,7 +130,7 @@ class ImageView : public View {
   void setImageScaling(ImageScaling scaling) const;
 };
 
-/// A spinner, which does not show how much of the work is done.
+/// A spinner. It shows that the program is busy, but not how much of the work is done.
 class ProgressIndicator : public View {
  public:
   static constexpr OutletKind kKind = OutletKind::kProgressIndicator;
@@ -187,8 +187,11 @@ class Window : public Outlet {
 
   /// Centres the window on its screen.
   void center() const;
+  /// Makes this the window that receives what the user types.
   void makeKeyWindow() const;
+  /// Shows the window, if it is hidden, and puts it in front of other windows.
   void orderFront() const;
+  /// Does what orderFront() and makeKeyWindow() do.
   void makeKeyAndOrderFront() const;
 
   /// Takes the window off the screen without asking the delegate's windowShouldClose().

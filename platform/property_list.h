@@ -16,8 +16,8 @@ namespace onramp {
 /// list, where a shared object of a binary list counts once for each reference to it.
 inline constexpr std::size_t kMostPropertyListBytes = std::size_t{16} << 20;
 
-/// The maximum number of objects in a list. Containers count. In some backends, the keys of
-/// dictionaries count as well. A shared object counts once for each reference to it.
+/// The maximum number of objects in a list. Containers count as objects, and in some backends so do
+/// the keys of dictionaries. A shared object counts once for each reference to it.
 inline constexpr std::uint64_t kMostPropertyListObjects = std::uint64_t{1} << 18;
 
 /// The maximum nesting depth of containers.

@@ -4,12 +4,13 @@
 
 namespace onramp {
 
-/// Both return whether a stream is a terminal that understands escape sequences. The stream is
-/// standard output for the first function and standard error for the second one.
+/// Returns whether standard output is a terminal that understands escape sequences.
 [[nodiscard]] bool isOutputTerminal();
+
+/// Returns whether standard error is a terminal that understands escape sequences.
 [[nodiscard]] bool isErrorTerminal();
 
-/// Returns the width, in columns, of the terminal that standard output goes to, or 80 when the
+/// Returns the width, in columns, of the terminal to which standard output goes, or 80 when the
 /// width is unknown.
 [[nodiscard]] std::size_t terminalWidth();
 

@@ -2,8 +2,8 @@
 
 namespace onramp {
 
-// Connects a front end, which knows when the application terminates, with the threads that sleep in
-// sleepOffMainThread(). Both functions are callable from any thread.
+// With these functions, a front end tells the threads that sleep in sleepOffMainThread() that the
+// application terminates. Both are callable from any thread.
 
 /// Returns whether beginTermination() has been called.
 [[nodiscard]] bool isTerminating();

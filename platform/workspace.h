@@ -10,7 +10,7 @@ namespace onramp {
 bool openFile(const std::string& path);
 
 /// Asks the desktop to open `url` in the user's browser. Does not wait for the browser. Returns
-/// false when openFile() would, and also when the backend rejects the form of `url`.
+/// false in the same cases as openFile(), and when the backend rejects the form of `url`.
 bool openURL(const std::string& url);
 
 }  // namespace onramp

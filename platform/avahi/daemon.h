@@ -23,8 +23,8 @@ class Query;
 class Daemon {
  public:
   /// Returns the connection that runs on the main thread's loop, and creates it if there is none.
-  /// The connection exists for as long as somebody holds it. Returns null when the system provides
-  /// no descriptor or thread.
+  /// The connection exists for as long as a pointer that this function returned. Returns null when
+  /// the system provides no descriptor or thread.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 
   /// Creates a connection that runs only inside runUntil(). Returns null when the system provides

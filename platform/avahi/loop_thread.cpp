@@ -54,8 +54,8 @@ void LoopThread::runSoon() {
   });
 }
 
-// Runs on `thread_`. After it has asked the main thread, it waits only for the main thread's
-// answer.
+// Runs on `thread_`. Once the main thread has been asked to run the loop, this function waits only
+// for the main thread's answer.
 void LoopThread::wait() {
   bool isAsking = false;
   while (!isEnding_) {

@@ -56,9 +56,10 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   bool isScheduled_ = false;
   unsigned long search_ = 0;  ///< counts searches; late events of earlier ones are ignored
   std::string type_;
-  std::map<Instance, NetServiceRef> services_;  ///< so that a removal passes the same object
-  std::shared_ptr<Daemon> daemon_;              ///< held while a search runs
-  std::map<std::string, Browse> browses_;       ///< by domain
+  /// The services that have been found. When one is gone, the client gets the same object again.
+  std::map<Instance, NetServiceRef> services_;
+  std::shared_ptr<Daemon> daemon_;         ///< held while a search runs
+  std::map<std::string, Browse> browses_;  ///< by domain
   Sightings<std::string> domains_;
   std::unique_ptr<Query> domainQuery_;
 };

@@ -13,10 +13,10 @@ namespace onramp::avahi {
 inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
-/// A question to the daemon that stays open for as long as this object exists. In the daemon it is
-/// a browser or resolver object of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms
-/// before it starts an object that was made with a method of an earlier version. The *Prepare
-/// methods of 0.8 avoid this pause.)
+/// A question to the daemon that stays open for as long as this object exists. In the daemon, a
+/// browser or resolver object of version 0.8 of Avahi's D-Bus interface stands for the question.
+/// (The daemon waits 10 ms before it starts an object that was made with a method of an earlier
+/// version. The *Prepare methods of 0.8 avoid this pause.)
 class Query {
  public:
   enum class Event {
@@ -31,8 +31,8 @@ class Query {
   /// Appends the arguments of the *Prepare method to `call`. Returns a negative number on failure.
   using Arguments = std::function<int(sd_bus_message* call)>;
 
-  /// `kind` is the object's kind in the daemon, such as "RecordBrowser". The text is not copied, so
-  /// it must outlive the query, and so must `daemon`.
+  /// `kind` is the kind of the object in the daemon, such as "RecordBrowser". `daemon` and the text
+  /// `kind`, which is not copied, must outlive the query.
   Query(Daemon& daemon, const char* kind, Arguments arguments, Handler handler);
   Query(const Query&) = delete;
   Query& operator=(const Query&) = delete;

@@ -13,8 +13,8 @@ namespace {
 // enough time for the daemon to repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 
-// Tells a service resolver not to look up an address. It would find only one, and Records finds
-// all.
+// Tells a service resolver not to look up an address. The resolver would find only one address,
+// whereas Records finds all of them.
 constexpr unsigned kNoAddress = 8;
 
 // Reads the arguments of a service resolver's Found signal. Joins the strings of the TXT record,
@@ -71,7 +71,7 @@ void Resolve::begin() {
   service_.emplace(
       daemon_, "ServiceResolver",
       [this](sd_bus_message* call) {
-        // The daemon would look for the type itself in place of a service without a name.
+        // Without a name, the daemon would look up the type itself in place of a service.
         if (instance_.name.empty() || instance_.domain.empty()) return -EINVAL;
         return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
                                      instance_.name.c_str(), instance_.type.c_str(),

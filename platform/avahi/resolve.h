@@ -20,7 +20,7 @@ struct Resolution {
   Data txt;
 };
 
-/// Where a service is offered, and its TXT record's data.
+/// The host and the port that offer a service, and the data of the service's TXT record.
 struct Server {
   std::string host;  ///< a domain name with escapes and without a closing dot
   std::uint16_t port = 0;

@@ -2,12 +2,13 @@
 
 namespace onramp {
 
-// Returns nothing at all times, because macOS restarts its responder whenever the responder ends.
+// Always returns nothing, because macOS restarts mDNSResponder, its program for service discovery,
+// whenever that program ends.
 std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }
 
-// The parameter is passed by value, because a backend that receives sightings stores it.
+// Takes the function by value, because the other backend stores the function.
 // NOLINTNEXTLINE(performance-unnecessary-value-param)
 void watchSightings(std::function<void(const ServiceSighting&)>) {}
 

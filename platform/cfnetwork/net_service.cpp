@@ -16,7 +16,7 @@ using corefoundation::toString;
 
 class CFService;
 
-// The existing handles, by the services that they wrap.
+// Returns the existing handles. The key of a handle is the framework's object that the handle owns.
 std::map<CFNetServiceRef, std::weak_ptr<CFService>>& liveServices() {
   static std::map<CFNetServiceRef, std::weak_ptr<CFService>> services;
   return services;
@@ -88,7 +88,8 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   void cancel() override { CFNetServiceCancel(service_.get()); }
 
  private:
-  // `self` keeps this object alive, because the client may release the last other handle.
+  // `self` keeps the object alive during the call, because the client may release every other
+  // handle to it.
   static void resolved(CFNetServiceRef, CFStreamError* error, void* info) {
     const auto self = static_cast<CFService*>(info)->shared_from_this();
     self->isResolved_ = !error || error->error == 0;
@@ -98,7 +99,7 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  bool isResolved_ = false;  ///< the framework may keep what an earlier resolve found
+  bool isResolved_ = false;  ///< the framework may keep the result of an earlier resolve
 };
 
 }  // namespace

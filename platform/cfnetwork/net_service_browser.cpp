@@ -75,7 +75,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     ++search_;
   }
 
-  // `self` keeps this object alive, because the client may release the last other handle.
+  // `self` keeps the object alive during the call, because the client may release every other
+  // handle to it.
   static void browsed(CFNetServiceBrowserRef, CFOptionFlags flags, CFTypeRef found,
                       CFStreamError* error, void* info) {
     const auto self = static_cast<CFBrowser*>(info)->shared_from_this();
@@ -83,8 +84,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
       self->failed({error->error});
       return;
     }
-    // `found` is a service, because this browser never searches for domains. CFTypeRef is a pointer
-    // to const, but CFNetServiceRef is not.
+    // `found` is a service, because this browser never searches for domains. The cast removes
+    // const, because CFTypeRef is a pointer to const and CFNetServiceRef is not.
     const NetServiceRef service =
         cfnetwork::handleOf(static_cast<CFNetServiceRef>(const_cast<void*>(found)));
     if (!service) return;
@@ -93,9 +94,10 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     }
   }
 
-  // Counts the sightings of a service. The framework may report one for each network interface,
-  // each with a different object. Returns the object of the first sighting when the service is
-  // found or gone, and null otherwise.
+  // Updates the number of the service's sightings. `isSeen` is false when a sighting has ended. The
+  // framework may report a sighting for each network interface, and may pass a different object
+  // each time. If this sighting is the first one, or if the last one has ended, returns the object
+  // that the first sighting passed. Returns null otherwise.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
       return found.service->name() == service->name() && found.service->type() == service->type() &&
@@ -112,9 +114,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     return gone;
   }
 
-  // A search fails, for instance, when the responder goes away. All services are reported as gone,
-  // because the next search will find them again. Stopping the failed search may cause another
-  // error, which is ignored.
+  // Reports all services as gone, reports the error, and starts the search again after a pause. A
+  // search fails, for instance, when the responder ends. The new search will find the services
+  // again. Stopping the failed search may cause another error, which this function ignores.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;
     isFailed_ = true;
@@ -145,10 +147,10 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Client client_;
   void* info_;
   Reference<CFNetServiceBrowserRef> browser_;
-  Reference<CFStringRef> domain_;  ///< of the running search; null when there is none
+  Reference<CFStringRef> domain_;  ///< null unless a search was asked for
   Reference<CFStringRef> type_;
   std::vector<Found> found_;
-  unsigned long search_ = 0;  ///< counts searches; retries of earlier ones are ignored
+  unsigned long search_ = 0;  ///< the search's number; earlier searches are not retried
   bool isFailed_ = false;     ///< a retry is pending
 };
 

@@ -10,8 +10,8 @@
   return action;
 }
 
-// Keeps this object alive during the call, because the function may release the last other
-// reference to it.
+// The function may release the last reference to this object, so the object retains itself during
+// the call.
 - (void)perform:(id)sender {
   [[self retain] autorelease];
   _function();

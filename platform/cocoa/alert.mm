@@ -7,7 +7,8 @@
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
-/// Receives a sheet's return code, passes it to the function and releases itself.
+/// The delegate of one sheet. When the sheet ends, translates the sheet's return code, calls the
+/// function with the result and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }
@@ -25,7 +26,7 @@
          returnCode:(NSInteger)returnCode
         contextInfo:(void*)contextInfo {
   [self autorelease];
-  // The sheet may also be ended by other code, with a return code that belongs to no button.
+  // Code outside this file may also end the sheet, with a return code that belongs to no button.
   _didEnd(returnCode == NSAlertSecondButtonReturn ? onramp::kAlertOtherReturn
                                                   : onramp::kAlertDefaultReturn);
 }
@@ -53,7 +54,7 @@ void runCriticalAlert(const std::string& messageText, const std::string& informa
   const Retained<NSAlert> alert = makeAlert(messageText, informativeText);
   [alert.get() setAlertStyle:NSCriticalAlertStyle];
   [alert.get() addButtonWithTitle:toNSString(buttonTitle)];
-  // An alert at launch is shown before the application is active. It would otherwise open behind
+  // At launch, the application is not active yet. Without this call, the alert would open behind
   // the Finder's windows.
   [NSApp activateIgnoringOtherApps:YES];
   [alert.get() runModal];

@@ -7,7 +7,8 @@
 #import "platform/cocoa/retained.h"
 #include "platform/termination.h"
 
-/// Forwards the application's and the window's events and questions to the controller.
+/// The delegate of the application and of its window. Passes their events and questions to the
+/// controller.
 @interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
   onramp::ApplicationDelegate* _delegate;
   onramp::Window _window;
@@ -39,7 +40,8 @@
   return _delegate->applicationShouldTerminateAfterLastWindowClosed();
 }
 
-// The user may quit only when the window may be closed. terminateApplication() always works.
+// Lets the user quit only if the controller lets the window close. Does not ask the controller
+// after a call of terminateApplication().
 - (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
   if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
   NSBeep();
@@ -64,7 +66,7 @@ namespace onramp {
 
 using cocoa::Retained;
 
-// The arguments are not passed on, because AppKit reads its options from the process itself.
+// This function ignores the arguments, because AppKit reads them from the process.
 int runApplication(int, char**, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate) {
   @autoreleasepool {

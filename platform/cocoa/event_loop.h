@@ -2,8 +2,9 @@
 
 namespace onramp::cocoa {
 
-/// Posts an empty event, because a modal loop checks whether it was stopped only after it has
-/// handled an event.
+/// Posts an empty event to the application. AppKit checks only after an event whether a modal loop
+/// was asked to stop, so the loop might otherwise run until the next click or key. Main thread
+/// only.
 void wakeEventLoop();
 
 }  // namespace onramp::cocoa

@@ -4,8 +4,9 @@
 
 #include "platform/interface_file.h"
 
-/// Represents an InterfaceOwner to AppKit, which requires an object as the owner of an interface
-/// file. A binding to any key of this object shows the InterfaceOwner's text under that key.
+/// Represents an InterfaceOwner to AppKit, which accepts only an Objective-C object as the owner of
+/// an interface file. If the file binds a control to a key of this object, the control shows the
+/// InterfaceOwner's text under that key.
 @interface OnrampFileOwner : NSObject {
   onramp::InterfaceOwner* _owner;
   NSMutableSet* _boundKeys;
@@ -15,8 +16,10 @@
 /// `owner` must outlive this object.
 - (instancetype)initWithOwner:(onramp::InterfaceOwner&)owner;
 
-/// The window that the file connects to the outlet "window"; nil when the file connects none.
+/// Returns the window that the file connects to the outlet "window", or nil when the file connects
+/// none.
 - (NSWindow*)window;
+/// AppKit calls this function when it loads the file.
 - (void)setWindow:(NSWindow*)window;
 
 @end

@@ -24,13 +24,14 @@
   return _window;
 }
 
-// The window is not retained, because the Interface that loaded the file owns the window.
+// Does not retain the window, because the Interface that loaded the file owns the window.
 - (void)setWindow:(NSWindow*)window {
   _window = window;
 }
 
-// A binding first asks for the value of its key. From then on, this object notifies the binding of
-// every change.
+// A binding calls this function for the current text under its key. The first call for a key also
+// makes this object report every later change of that text, and each binding to the key then calls
+// this function again.
 - (id)valueForUndefinedKey:(NSString*)key {
   const std::string name = onramp::cocoa::toStdString(key);
   if (![_boundKeys containsObject:key]) {

@@ -5,8 +5,8 @@
 namespace onramp::cocoa {
 
 /// Gives the keyboard focus to the first list in `view`, or to the first control if there is no
-/// list. Searches the subviews in their order. Leaves the focus as it is if no control accepts the
-/// focus.
+/// list. Skips lists and controls that do not accept the focus. Does nothing if none of them
+/// accepts the focus, or if `view` is in no window.
 void focusFirstControl(NSView* view);
 
 }  // namespace onramp::cocoa

@@ -67,7 +67,8 @@ NSView* findView(NSView* view, NSString* identifier, Class kind) {
   return nil;
 }
 
-// Makes a page's title a heading for assistive programs. AppKit has no constant for this role.
+// Makes each page title a heading for assistive programs. A page title is a text field whose
+// identifier ends in "Title". AppKit has no constant for the role of a heading.
 void describe(NSView* view) {
   if ([view isKindOfClass:[NSTextField class]] && [[view identifier] hasSuffix:@"Title"]) {
     [NSAccessibilityUnignoredDescendant(view) setAccessibilityRole:@"AXHeading"];
@@ -76,8 +77,8 @@ void describe(NSView* view) {
     describe(subview);
 }
 
-// Translates the tool tips and makes each one the accessibility label of its view. Only controls
-// without a title have tool tips.
+// Translates the tool tips. Each translation also becomes the accessibility label of its view,
+// because only controls without a title have tool tips.
 void localize(NSView* view, const std::string& interfaceName) {
   if (const std::string key = toStdString([view toolTip]); !key.empty()) {
     NSString* const text = toNSString(Bundle::main().localizedString(key, key, interfaceName));
@@ -88,8 +89,8 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// Connects buttons to the owner's actions. In the file, such a button sends its action to the first
-// responder, so it has an action but no target.
+// Makes a click on a button perform the owner's action. The interface file sends these actions to
+// the first responder, so a loaded button with such an action has no target.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {
@@ -108,8 +109,8 @@ void connectActions(NSView* view, InterfaceOwner& owner,
     connectActions(subview, owner, actions);
 }
 
-// Returns the file's top-level objects, or nil when the file is missing or damaged. The loader
-// reports such a failure by an exception or by its result.
+// Returns the file's top-level objects, or nil when the file is missing or damaged. AppKit reports
+// a failure with an exception or with the result NO.
 NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
   NSArray* topLevelObjects = nil;
   @try {
@@ -144,8 +145,8 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {
-    // Makes AppKit ask the delegate whether the application may quit during a modal loop or a
-    // sheet.
+    // Without this call, AppKit would refuse to quit during a modal loop or a sheet. With it,
+    // AppKit asks the delegate.
     [window setPreventsApplicationTerminationWhenModal:NO];
     localize([window contentView], name);
     connectActions([window contentView], owner, tree -> actions);
@@ -157,12 +158,13 @@ View Interface::view() const {
   return View(cocoa::toNative(rootView(tree_->topLevelObjects.get())));
 }
 
-// The view's identifier names the page's class, because AppKit does not know page classes.
+// The file stores the page's class in the root view's identifier, because AppKit does not know page
+// classes.
 std::string Interface::viewClass() const {
   return toStdString([rootView(tree_->topLevelObjects.get()) identifier]);
 }
 
-// Finds a view by its identifier, and the window through the owner's outlet.
+// Finds a view by its identifier, and the window through the outlet of the file's owner.
 NativeObject* Interface::find(std::string_view name, OutletKind kind) const {
   NSWindow* const window = [tree_->owner.get() window];
   if (kind == OutletKind::kWindow) return name == kWindowOutlet ? cocoa::toNative(window) : nullptr;

@@ -1,7 +1,7 @@
 // Makes macOS ask for access to the local network while the user reads the first page. Since macOS
-// 15 a program needs the user's consent, and the system asks for it when the program first uses the
-// network. If the system asked only when the search begins, the search might end before the user
-// has answered.
+// 15, a program needs the user's consent to this access, and the system asks for the consent when
+// the program first uses the local network. Without this file, the wizard would first use the local
+// network in the device search, which might end before the user has answered.
 
 #import <AppKit/AppKit.h>
 
@@ -11,7 +11,8 @@ constexpr NSTimeInterval kBrowseDuration = 1;  // seconds
 
 }  // namespace
 
-/// Browses for a moment when the wizard's window becomes the main window for the first time.
+/// Starts a search for services when the application's first window becomes the main window, and
+/// stops the search a second later. Ignores what the search finds.
 @interface OnrampLocalNetwork : NSObject
 @end
 
@@ -26,8 +27,8 @@ constexpr NSTimeInterval kBrowseDuration = 1;  // seconds
 
 + (void)ask:(NSNotification*)notification {
   [[NSNotificationCenter defaultCenter] removeObserver:self];
-  // For a type that is not listed in the information dictionary, macOS refuses to browse and does
-  // not ask the user.
+  // macOS searches only for the service types that the information dictionary lists. For any other
+  // type, macOS refuses without asking the user.
   NSArray* const types = [[NSBundle mainBundle] objectForInfoDictionaryKey:@"NSBonjourServices"];
   if ([types count] == 0) return;
   NSNetServiceBrowser* const browser = [[[NSNetServiceBrowser alloc] init] autorelease];

@@ -8,13 +8,13 @@
 
 namespace onramp::cocoa {
 
-/// Converts a property-list object to a dictionary. Leaves out members that are not property-list
-/// objects or whose keys are not strings. Returns nothing when `object` is not a dictionary or
+/// Converts an NSDictionary to a Dictionary. Leaves out members that are not property-list objects
+/// or whose keys are not strings. Returns nothing when `object` is nil, is not an NSDictionary or
 /// exceeds the limits in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
-/// Converts `value` to a property-list object. A text that is not valid UTF-8 becomes an empty
-/// string.
+/// Converts `value` to an autoreleased property-list object. A text that is not valid UTF-8 becomes
+/// an empty string.
 [[nodiscard]] id toPropertyList(const Value& value);
 
 }  // namespace onramp::cocoa

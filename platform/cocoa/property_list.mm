@@ -11,7 +11,7 @@ namespace onramp {
 
 namespace {
 
-// Converts a property list to a value. Returns nothing when the list exceeds the limits in
+// Converts one property list to a value. read() returns nothing when the list exceeds the limits in
 // platform/property_list.h or `object` is not a property-list object.
 class Reader {
  public:
@@ -30,7 +30,8 @@ class Reader {
   }
 
  private:
-  // The two Boolean objects are singletons. The kind of any other number follows from its C type.
+  // Only two Boolean objects exist, so comparing pointers recognises a Boolean. The C type of any
+  // other object tells whether the number is real.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);
@@ -44,8 +45,9 @@ class Reader {
     return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
   }
 
-  // Several containers may share one text or data object, but each value gets a copy. The total
-  // size of the copies is limited like the size of a file.
+  // Several containers may share one string or data object, but each value gets a copy. So the
+  // total size of the copies has the same limit as the size of a file. A string counts by its
+  // UTF-16 units. Returns false when the limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;
     if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;
@@ -63,7 +65,7 @@ class Reader {
     return Value(Data(bytes, bytes + [data length]));
   }
 
-  // Leaves out objects that do not belong in a property list. Some versions of macOS have put an
+  // Leaves out members that are not property-list objects, because some versions of macOS put an
   // NSURL into the information dictionary of a bundle.
   std::optional<Value> array(NSArray* array, std::size_t depth) {
     Array values;
@@ -119,9 +121,9 @@ struct ToPropertyList {
   }
 };
 
-// Returns the bytes of a regular file, or nil when the file is of another kind, exceeds the size
-// limit or cannot be read. Links are resolved first, because attributesOfItemAtPath: does not
-// follow them.
+// Returns the bytes of the file at `path`. Returns nil when the file is not a regular file, exceeds
+// the size limit or cannot be read. Links are resolved first, because attributesOfItemAtPath: does
+// not follow them.
 NSData* contents(NSString* path) {
   NSString* const file = [path stringByResolvingSymlinksInPath];
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file

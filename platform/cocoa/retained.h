@@ -12,10 +12,11 @@ class Retained {
  public:
   Retained() = default;
 
-  /// Retains `object`.
+  /// Retains `object`, which may be nil.
   explicit Retained(Class* object) : object_([object retain]) {}
 
-  /// Takes over the reference that alloc, new or copy returned.
+  /// Takes over the reference that alloc, new or copy returned to the caller, without retaining
+  /// `object`.
   [[nodiscard]] static Retained adopt(Class* object) {
     Retained owner;
     owner.object_ = object;
@@ -30,6 +31,7 @@ class Retained {
   }
   ~Retained() { [object_ release]; }
 
+  /// Returns the object, or nil when there is none. The caller does not own the result.
   [[nodiscard]] Class* get() const { return object_; }
 
  private:

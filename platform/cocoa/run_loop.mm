@@ -25,13 +25,14 @@ NSArray* allModes() {
 int modalLoops = 0;
 bool isModalAborted = false;
 
-// True from abortModal() until the modal loop has returned. Each posted action may occupy the main
-// thread for seconds, so posted actions are held back until the modal loop has returned.
+// True from abortModal() until the modal loop has returned or the main thread has found that no
+// loop is running. During this time, posted actions do not run, because each of them might occupy
+// the main thread for seconds and so delay the return.
 std::atomic<bool> isAborting = false;
 
-// Returns an object that runs `action` only once, even if its timer fires again inside a loop that
-// the action runs. The action is destroyed on the thread that ran it, even if another thread
-// releases the object last.
+// Returns an object that runs `action` only once, even if a timer calls the object again while
+// `action` runs a modal loop. The object destroys `action` on the thread that ran it, because any
+// thread may release the object.
 OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
@@ -47,8 +48,9 @@ void post(std::function<void()> action) {
   }
 }
 
-// Drops the clicks and keys that arrived while the main thread was busy, because they were meant
-// for the page that was shown then. Timers and actions do not run in the mode used here.
+// Drops the clicks and keys that arrived while the main thread was busy. They were meant for the
+// page that was on the screen at that time. No timer or posted action runs in the loop mode used
+// here.
 void dropWaitingInput() {
   const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
                            NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;
@@ -95,10 +97,11 @@ void performOnMainThread(std::function<void()> action) {
   });
 }
 
-// AppKit may end a modal loop without being asked, for example when the user presses a key that
-// cancels. The loop is then run again.
+// AppKit may also end its loop without a call of abortModal(), for example when the user presses a
+// key that cancels. This function then starts the loop again.
 void runModalForWindow(const Window& window) {
-  // From here on, an action may end the loop. Showing the window may already run one.
+  // The loop counts as running before the window is shown, because showing the window may run a
+  // posted action, and that action may call abortModal().
   ++modalLoops;
   // AppKit does not show windows of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
@@ -126,7 +129,7 @@ void abortModal() {
       return;
     }
     isModalAborted = true;
-    if (![NSApp modalWindow]) return;  // the window is not shown yet
+    if (![NSApp modalWindow]) return;  // AppKit's loop has not started yet
     [NSApp stopModalWithCode:NSModalResponseAbort];
     cocoa::wakeEventLoop();
   });

@@ -14,7 +14,7 @@ class ArrayController;
   BOOL _isShowingSelection;
 }
 
-/// Retains `table`; `controller` must outlive this object.
+/// Retains `table`. `controller` must outlive this object.
 - (instancetype)initWithTable:(NSTableView*)table controller:(onramp::ArrayController&)controller;
 
 /// Call this when the controller's entries have changed.

@@ -24,7 +24,7 @@ NSButton* defaultButton(NSView* view) {
   return nil;
 }
 
-// Returns whether `start` occurs in `text` at the start of a word, ignoring case.
+// Returns whether a word in `text` starts with `start`. Ignores case.
 bool hasWordThatStarts(NSString* text, NSString* start) {
   NSCharacterSet* const letters = [NSCharacterSet alphanumericCharacterSet];
   NSRange rest = NSMakeRange(0, [text length]);
@@ -90,9 +90,9 @@ CGFloat leastNameWidth(NSCell* cell) {
   [self showSelection];
 }
 
-// Widens all columns but the first one to fit their texts, and keeps the user from making them
-// narrower. The first column, which holds the names, gets narrower if the table has no room for
-// all columns. The window gets wider if the first column would become too narrow.
+// Widens every column except the first one to fit its texts, and prevents the user from making it
+// narrower than that. If the table is then too narrow for all columns, narrows the first one, which
+// shows the names, but not below its minimum width. Below that, the window gets wider.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -121,8 +121,8 @@ CGFloat leastNameWidth(NSCell* cell) {
   if (row >= 0) _controller->choose(static_cast<std::size_t>(row));
 }
 
-// The button is clicked once the table has handled the double-click, because the button's action
-// may remove the table.
+// Clicks the button after the table has handled the double-click, because the button's action may
+// remove the table.
 - (void)goOn:(id)sender {
   if ([_table clickedRow] < 0) return;
   [defaultButton([[_table window] contentView]) performSelector:@selector(performClick:)
@@ -157,8 +157,9 @@ CGFloat leastNameWidth(NSCell* cell) {
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// Finds a row by the start of any word of its name. The search continues at row 0 after the last
-// row. Returns -1 when no row up to `endRow` matches.
+// Returns the first row from `startRow` on with a name in which a word starts with `typed`. After
+// the last row, the search continues with row 0. Returns -1 when no row up to and including
+// `endRow` matches.
 - (NSInteger)tableView:(NSTableView*)table
     nextTypeSelectMatchFromRow:(NSInteger)startRow
                          toRow:(NSInteger)endRow
@@ -174,7 +175,7 @@ CGFloat leastNameWidth(NSCell* cell) {
   return -1;
 }
 
-// Passes the user's selection to the controller. If the user deselects the row, it is selected
+// Passes the user's selection to the controller. If the user deselects the row, selects the row
 // again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;

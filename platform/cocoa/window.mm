@@ -23,8 +23,8 @@ void Window::orderFront() const {
 void Window::makeKeyAndOrderFront() const {
   NSWindow* const window = nativeOf<NSWindow>(*this);
   [window makeKeyAndOrderFront:nil];
-  // Since macOS 14 the system may refuse to activate the application. The window must appear in
-  // front of the active application's windows even then.
+  // Since macOS 14, the system may refuse to activate the application. Even then, the window must
+  // appear in front of the active application's windows.
   if (![NSApp isActive]) [window orderFrontRegardless];
 }
 

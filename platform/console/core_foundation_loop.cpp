@@ -15,8 +15,8 @@ namespace {
 using corefoundation::Reference;
 using Action = std::function<void()>;
 
-// Adds a timer to the main run loop. The timer runs `action` once and then frees it. Does nothing
-// when the system cannot create the timer.
+// Adds a timer to the main run loop. After `seconds`, the timer runs `action` once and then
+// destroys it. Does nothing when the system cannot create the timer. Callable from any thread.
 void addTimer(double seconds, Action action) {
   const auto release = [](const void* info) {
     std::unique_ptr<const Action>(static_cast<const Action*>(info));
@@ -37,8 +37,9 @@ bool hasEnded = false;  // main thread only
 
 void runMainLoop() {
   hasEnded = false;
-  // CFRunLoopRunInMode() returns when it has handled a source, after 0.1 seconds, or at once while
-  // the loop has no sources or timers. It is called again until endMainLoop() has been called.
+  // CFRunLoopRunInMode() returns after it has handled a source, after 0.1 seconds, or at once if
+  // the loop has neither sources nor timers. So this function calls it until an action has called
+  // endMainLoop().
   while (!hasEnded)
     CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);
 }

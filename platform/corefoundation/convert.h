@@ -13,18 +13,19 @@ namespace onramp::corefoundation {
 /// Converts `text` to a string object. Returns null when `text` is not valid UTF-8.
 [[nodiscard]] Reference<CFStringRef> toCFString(std::string_view text);
 
-/// Converts `texts` to an array of string objects. Texts that are not valid UTF-8 are left out.
+/// Converts `texts` to an array of string objects. Leaves out texts that are not valid UTF-8.
 [[nodiscard]] Reference<CFArrayRef> toCFArray(const std::vector<std::string>& texts);
 
-/// Returns the text of a string object in UTF-8. Returns nothing when `object` is null or not a
+/// Returns the text of a string object in UTF-8. Returns nothing when `object` is null or is not a
 /// string.
 [[nodiscard]] std::optional<std::string> toString(CFTypeRef object);
 
-/// Copies the bytes of `data`, which must not be null.
+/// Returns a copy of the bytes of `data`, which must not be null.
 [[nodiscard]] Data toData(CFDataRef data);
 
-/// Converts an object to a value. The object may be a string, an array or a dictionary. Members of
-/// other kinds are left out. Returns nothing when `object` is null or of another kind.
+/// Converts a string, an array or a dictionary to a value. Leaves out members of any other kind,
+/// and members whose keys are not strings. Returns nothing when `object` is null or is of any other
+/// kind.
 [[nodiscard]] std::optional<Value> toValue(CFTypeRef object);
 
 }  // namespace onramp::corefoundation

@@ -12,10 +12,11 @@ class Reference {
  public:
   Reference() = default;
 
-  /// Takes over the reference that a function named Create or Copy returned.
+  /// Takes over the reference to `object` that a function with "Create" or "Copy" in its name
+  /// returned. Does not retain `object`, which may be null.
   explicit Reference(Ref object) : object_(object) {}
 
-  /// Retains an object that somebody else owns.
+  /// Retains `object`, which may be null. For an object that somebody else owns.
   [[nodiscard]] static Reference retaining(Ref object) {
     if (object) CFRetain(object);
     return Reference(object);
@@ -32,6 +33,7 @@ class Reference {
     if (object_) CFRelease(object_);
   }
 
+  /// Returns the object, or null when there is none. The caller does not own the result.
   [[nodiscard]] Ref get() const { return object_; }
   explicit operator bool() const { return object_ != nullptr; }
 

@@ -54,8 +54,8 @@ std::string_view offeredAs(std::string_view code) {
   return code == "nb" ? "no" : code;
 }
 
-// Returns how well an offered language matches a preferred one. A higher number is a better match,
-// and 0 is none.
+// Returns how well an offered language matches a preferred language. A higher number means a better
+// match, and 0 means no match.
 int fitness(const Language& offered, const Language& preferred) {
   if (offered.code.empty() || offeredAs(offered.code) != offeredAs(preferred.code)) return 0;
   if (!offered.script.empty() && !preferred.script.empty() && offered.script != preferred.script) {

@@ -9,8 +9,8 @@ namespace onramp {
 void setMainBundlePath(std::string path);
 
 /// Returns the path of the running application's bundle, without a trailing "/". Unless
-/// setMainBundlePath() has chosen another one, the bundle is the folder that holds
-/// Contents/<system>/<executable>. For an executable that is located elsewhere, the bundle is the
+/// setMainBundlePath() has set another path, the bundle is the folder that holds
+/// Contents/<system>/<executable>. For an executable in any other place, the bundle is the
 /// executable's own folder.
 [[nodiscard]] std::string mainBundlePath();
 

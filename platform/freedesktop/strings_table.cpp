@@ -53,9 +53,11 @@ class Parser {
     }
     if (!problem_.reason.empty()) return std::nullopt;
     if (braces && !take('}')) refuse("\"}\" expected", lastEnd_);
-    if (!skipBlanks() || !rest_.empty()) refuse("a \"}\" without a \"{\"", at());
+    if (!skipBlanks() || !rest_.empty()) {
+      refuse(braces ? "text after the closing \"}\"" : "a \"}\" without a \"{\"", at());
+    }
     if (!problem_.reason.empty()) return std::nullopt;
-    std::reverse(pairs.begin(), pairs.end());  // a dictionary keeps a key's first value
+    std::reverse(pairs.begin(), pairs.end());  // the dictionary keeps the first pair of each key
     return Dictionary(std::move(pairs));
   }
 
@@ -104,7 +106,7 @@ class Parser {
     return true;
   }
 
-  // Reads a word, with or without quotation marks. If there is no word here, reports `expected` as
+  // Reads a word, with or without quotation marks. If no word begins here, reports `expected` as
   // the problem and returns nothing.
   std::optional<std::string> word(const char* expected) {
     const std::size_t start = at();

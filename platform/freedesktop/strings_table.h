@@ -15,10 +15,10 @@ namespace onramp {
 [[nodiscard]] std::optional<Dictionary> loadStringsTable(const std::string& path);
 
 /// Parses the text of a strings file. The file consists of pairs `"key" = "text";` in the grammar
-/// of old-style property lists, and may contain comments. A key that stands without a text is its
-/// own text. When a key occurs more than once, its last text counts. Returns nothing when any part
-/// of the input violates the grammar, or when there are more pairs than a property list may have
-/// objects. The second form then sets `problem` to the place and the reason.
+/// of old-style property lists, and may contain comments. A key without a text is its own text.
+/// When a key occurs more than once, its last text counts. Returns nothing when any part of the
+/// input violates the grammar, or when there are more pairs than a property list may have objects.
+/// In this case, the function with the parameter `problem` stores the place and the reason there.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);
 

@@ -71,7 +71,7 @@ class BinaryWalk {
     if (!isNumberSize(offsetSize) || !isNumberSize(referenceSize) ||
         objects > kMostPropertyListObjects || table < kHeader.size() ||
         table > bytes_.size() - kTrailerSize) {
-      return refuse("a binary list whose trailer (its last 32 bytes) is cut off or damaged",
+      return refuse("a binary list whose trailer (its last 32 bytes) is damaged or exceeds a limit",
                     bytes_.size() - kTrailerSize);
     }
     referenceSize_ = static_cast<std::size_t>(referenceSize);
@@ -177,7 +177,7 @@ class BinaryWalk {
   }
 
   // Refuses every UTF-16 text that contains a null character, because libplist ends the process
-  // when a key is such a text.
+  // when a key contains one.
   static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
     ByteReader text = object;
     if (!measureBytes(units, 2, object, cost)) return false;

@@ -25,8 +25,9 @@ template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
 // libplist's functions for numbers do not distinguish -1 from 2^64-1, and its functions for dates
-// keep only 32 bits. A binary list that holds a single number or date keeps every bit. These
-// constants are the first bytes of an integer of 8 bytes, an integer of 16 bytes and a date.
+// keep only 32 bits. Numbers and dates are therefore converted by means of a binary list that holds
+// nothing else and keeps every bit. The constants kInteger8, kInteger16 and kDate8 are the first
+// bytes of an integer of 8 bytes, an integer of 16 bytes and a date in such a list.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;

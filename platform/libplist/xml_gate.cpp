@@ -14,9 +14,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// The limit on those steps of libplist whose number grows quadratically. Keys cause such steps,
-// because libplist hashes the keys of a dictionary into a fixed number of chains. Entities cause
-// them as well, because libplist moves the rest of a text at each entity in the text.
+// The limit on those steps of libplist whose number grows quadratically with the size of the list.
+// The keys of a dictionary cause such steps, because libplist hashes them into a fixed number of
+// chains. So do entities, because libplist moves the rest of a text at each entity in the text.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {

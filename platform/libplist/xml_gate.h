@@ -11,8 +11,8 @@ namespace onramp::libplist {
 /// reads correctly. Spaces replace the leading zeros of integers, because libplist would read an
 /// integer with leading zeros as octal. Returns nothing when `text` exceeds the limits in
 /// platform/property_list.h or contains markup that libplist might parse differently from this
-/// check. A document type with an internal part is an example of such markup. When the result is
-/// nothing, `problem` gives the place and the reason.
+/// check, such as a document type with an internal part. When the result is nothing, `problem`
+/// gives the place and the reason.
 [[nodiscard]] std::optional<std::string> admittedXML(std::string text, ParseProblem& problem);
 
 }  // namespace onramp::libplist

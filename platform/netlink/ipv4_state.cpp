@@ -25,8 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// The maximum number of times that a dump, the list of a whole table, is requested. The kernel
-// marks a dump as interrupted when the table changes in the meantime.
+// A dump is the kernel's list of a whole table. If the table changes during a dump, the kernel
+// marks the dump as interrupted. It is then requested again, up to this number of times.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;
@@ -128,7 +128,7 @@ std::map<int, Interface> interfacesOf(const Objects& addresses) {
   return interfaces;
 }
 
-// Returns the index of the interface of the preferred route, or nothing when no route is usable.
+// Returns the interface index of the preferred route, or nothing when no route is usable.
 std::optional<int> primaryIndex(const Objects& routes) {
   std::optional<int> index;
   std::uint32_t lowest = 0;

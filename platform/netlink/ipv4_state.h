@@ -13,8 +13,8 @@ namespace onramp::netlink {
 /// cannot be read.
 ///
 /// A default route of the main table is usable if it has a next hop that is not dead. The preferred
-/// default route is the first usable one with the lowest metric. Its interface is that of its first
-/// such hop.
+/// default route is the first usable one with the lowest metric. The interface of this route's
+/// first hop that is not dead is the primary interface.
 [[nodiscard]] std::optional<Dictionary> readIPv4State(nl_sock* socket, bool withGlobal);
 
 }  // namespace onramp::netlink

@@ -13,7 +13,7 @@ namespace onramp {
 
 namespace {
 
-constexpr int kExitOfSignals = 128;  // a shell adds this to the signal's number
+constexpr int kExitOfSignals = 128;  // shells add this to the signal's number
 
 }  // namespace
 

@@ -80,8 +80,9 @@ bool asksForInformation(int argc, char** argv) {
   });
 }
 
-// Reports a missing display and ends the process. Qt itself would abort the process. Drops all
-// other messages unless QT_DEBUG_PLUGINS is set.
+// On a fatal message, which Qt sends when there is no display, reports the missing display and ends
+// the process. Qt itself would abort the process. Drops all other messages unless QT_DEBUG_PLUGINS
+// is set.
 void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
   if (type == QtFatalMsg) {
     std::fprintf(stderr,

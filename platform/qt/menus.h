@@ -5,9 +5,10 @@ class QWidget;
 
 namespace onramp::qt {
 
-/// Makes the standard items of the application menu work. The property "action" of an item is the
-/// name of the AppKit method that does what the item does, such as "terminate:". An unknown name
-/// has no effect.
+/// Connects the standard menu items of `window` to what they do on a desktop: "Hide" minimises the
+/// window, "Show All" restores it, and "Quit" closes it. Disables "Hide Others", because only the
+/// desktop can hide other programs. An item's property "action" names the AppKit method that
+/// carries out the item's command on macOS, such as "terminate:". An unknown name has no effect.
 void connectStandardMenuItems(QWidget* window);
 
 /// Gives the application menu the product's name from the bundle's information dictionary. Alt and

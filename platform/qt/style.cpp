@@ -14,7 +14,7 @@ constexpr int kRingWidth = 2;
 constexpr qreal kCornerRadius = 3;
 constexpr int kRoomBesideTitle = 10;
 constexpr int kRoomAboveTitle = 3;
-constexpr int kLeastGrayDistance = 150;  ///< grey levels of 255 between a title and its button
+constexpr int kLeastGrayDistance = 150;  ///< from a title to its button, in grey levels
 constexpr int kLeastDisabledDistance = 40;
 
 void drawRing(QPainter& painter, const QRect& around, const QColor& color) {

@@ -6,7 +6,7 @@
 namespace onramp::qt {
 
 /// Qt's style "Fusion" with a filled default button and a ring around the focused control. Fusion
-/// itself draws the same outline around both.
+/// itself draws the same outline around the default button and the focused control.
 class Style final : public QProxyStyle {
   Q_OBJECT
 

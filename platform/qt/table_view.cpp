@@ -54,10 +54,10 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// Passes the row that the user selected to the controller, or selects the controller's row again
-// when the user deselected it. When an assistive program deselects the old row before it selects
-// another one, the old row is selected again. Both rows are selected for a moment, and only `added`
-// tells which one is meant.
+// Tells the controller which row the user has selected. If the user has deselected the controller's
+// row, selects that row again. This also happens when an assistive program deselects the old row
+// before it selects another one. Both rows are then selected for a moment, and only `added` tells
+// which row is meant.
 void takeSelection(QAbstractItemView* view, ArrayController& controller,
                    const QItemSelection& added) {
   if (!view->selectionModel()->hasSelection()) {

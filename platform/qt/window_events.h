@@ -31,8 +31,8 @@ class WindowEvents final : public QObject {
   /// Returns whether the key did anything.
   bool performKey(int key);
 
-  /// Clicks the button that has the focus, or else the default button. Returns whether a button was
-  /// clicked.
+  /// Clicks the button that has the focus. If no button has the focus, clicks the button whose key
+  /// equivalent is "Return". Returns whether a button was clicked.
   bool performReturn();
 
   /// Selects the first menu of the menu bar, so that the arrow keys work in the menu bar. Returns

@@ -35,7 +35,8 @@ void changed(SCDynamicStoreRef, CFArrayRef changedKeys, void* callback) {
   (*static_cast<const DynamicStoreCallback*>(callback))(keys);
 }
 
-// The session owns a copy of the callback until the framework destroys the session.
+// The framework calls this function when it creates the session. The session then owns the copy,
+// and the framework calls releaseCallback() when it destroys the session.
 const void* copyCallback(const void* callback) {
   return std::make_unique<DynamicStoreCallback>(*static_cast<const DynamicStoreCallback*>(callback))
       .release();

@@ -1,16 +1,18 @@
 #!/usr/bin/python3
 """Packs PNG pictures of an icon into an .icns file.
 
-Usage: icns.py ICON.icns 16.png 32.png …, each a square picture
+Usage: icns.py ICON.icns PICTURE.png…
+
+Every PICTURE is square.
 """
 
 import pathlib
 import struct
 import sys
 
-# The types that hold PNG data, by the picture's size in pixels. Some sizes have two types: one for
-# an icon of that many points, and one for an icon of half as many points on a display of twice the
-# density.
+# The types of the entries that hold a picture, by the length of its side in pixels. Some pictures
+# get two entries: one as an icon of that many points, and one as an icon of half as many points on
+# a display of twice the density.
 TYPES = {16: ["icp4"], 32: ["icp5", "ic11"], 64: ["ic12"], 128: ["ic07"], 256: ["ic08", "ic13"],
          512: ["ic09", "ic14"], 1024: ["ic10"]}
 
@@ -21,7 +23,8 @@ def main(icon, *pictures):
         data = pathlib.Path(picture).read_bytes()
         width, height = struct.unpack(">II", data[16:24])
         if data[:8] != b"\x89PNG\r\n\x1a\n" or width != height or width not in TYPES:
-            sys.exit(f"icns.py: {picture}: not a square PNG of {', '.join(map(str, TYPES))} pixels")
+            sys.exit(f"icns.py: {picture}: not a square PNG picture with a side of "
+                     f"{', '.join(map(str, TYPES))} pixels")
         for kind in TYPES[width]:
             entries += kind.encode("ascii") + struct.pack(">I", 8 + len(data)) + data
     pathlib.Path(icon).write_bytes(b"icns" + struct.pack(">I", 8 + len(entries)) + entries)

@@ -72,7 +72,7 @@ TEST_F(HandOff, ADeviceWithoutUsableDataIsHandedOverLikeACableConnection) {
   EXPECT_EQ(form("All", whole), fallback) << "the medium names no service type";
 }
 
-TEST_F(HandOff, TheSharedFolderIsWritableByEveryoneAndTheUsersIsNot) {
+TEST_F(HandOff, TheSharedFolderIsWritableByEveryoneButTheUsersFolderIsNot) {
   describeTwoModels();
   const auto permissions = [](const std::string& path) { return fs::status(path).permissions(); };
   const std::string shared = fs::path(medium.optionsFilePath()).parent_path();
@@ -87,7 +87,8 @@ TEST_F(HandOff, TheSharedFolderIsWritableByEveryoneAndTheUsersIsNot) {
 
   fs::permissions(shared, fs::perms::owner_all);
   (void)OnrampOSXAppDelegate::InstallPKGInfoURL();
-  EXPECT_EQ(permissions(shared), fs::perms::owner_all) << "the folder existed before";
+  EXPECT_EQ(permissions(shared), fs::perms::owner_all)
+      << "a folder that exists keeps its permissions";
 }
 
 TEST_F(HandOff, TheVendorNameHasNoSpacesAndIsLowerCaseInFileNames) {
@@ -118,7 +119,7 @@ TEST_F(HandOff, ThePackageIsOpenedEvenWhenNothingCanBeWritten) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(HandOff, ASeriesCodeThatMakesNoValidAddressHasNoSupportPage) {
+TEST_F(HandOff, ThereIsNoSupportPageForASeriesCodeThatCannotBePartOfAURL) {
   const std::pair<const char*, const char*> cases[] = {
       {"KS7", "KS7"},         {"a%20b", "a%20b"}, {"a#b", "a#b"},
       {"two words", nullptr}, {"50%", nullptr},   {"50%2", nullptr},

@@ -18,8 +18,9 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// Launches the wizard with a list of `models` and goes to the connection page of the first.
-  /// The models must differ in their cables, because the wizard otherwise skips the list.
+  /// Launches the wizard on a medium with `models` and goes to the connection page of the first
+  /// model. The models must differ in their support of USB or wired Ethernet, because the wizard
+  /// otherwise skips the list.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
                               {"Cable", model(true, false, false)}}) {
@@ -44,7 +45,7 @@ class Navigation : public Wizard {
   }
 };
 
-TEST_F(Navigation, AModelChosenByCableIsHandedOverBeforeThePackageOpens) {
+TEST_F(Navigation, AModelConnectedByCableIsHandedOverBeforeThePackageOpens) {
   goToConnectionPage();
   EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
   EXPECT_EQ(connectionPage(), expectedConnectionPage("wiredLan.png", kUSBAndWired));
@@ -257,8 +258,8 @@ TEST_F(Navigation, QuittingDuringTheWaitEndsTheWaitAtOnce) {
   EXPECT_EQ(medium.setUpToolArguments(), "");
 }
 
-// While this object exists, no thread can be started, because the default stack size is larger than
-// any address space.
+// While an object of this class exists, no thread can be started, because the default stack size is
+// larger than any address space.
 class NoThreads {
  public:
   NoThreads() {
@@ -280,7 +281,7 @@ class NoThreads {
   pthread_attr_t before_{};
 };
 
-TEST_F(Navigation, WhenNoThreadCanStartTheMainLoopMakesThePauses) {
+TEST_F(Navigation, TheMainLoopMakesThePausesWhenNoThreadCanStart) {
   goToConnectionPage();
   const NoThreads noThreads;
   performOnMainThread([&] { screen.runTimers(); });

@@ -15,7 +15,7 @@ namespace {
 using recording::model;
 using StartUp = Wizard;
 
-TEST_F(StartUp, ListsTheModelsInByteOrderWhenTheirCablesDiffer) {
+TEST_F(StartUp, ListsTheModelsInByteOrderWhenTheirConnectionsDiffer) {
   describe({{"abc", model(true, true, true)}, {"ABD", model(true, false, true)}});
   launch();
   EXPECT_EQ(page(), "ModelListView");
@@ -28,11 +28,12 @@ TEST_F(StartUp, ListsTheModelsInByteOrderWhenTheirCablesDiffer) {
   EXPECT_EQ(screen.log.back(), "key and front");
 }
 
-TEST_F(StartUp, SkipsTheListWhenAllModelsShareTheirCables) {
+TEST_F(StartUp, SkipsTheListWhenAllModelsHaveTheSameWiredConnections) {
   const std::string wired =
       expectedConnectionPage("wiredLan.png", "INST_TXT_USB\nINST_TXT_ETHERNET");
   const std::string usb = expectedConnectionPage("usb.png", "INST_TXT_USB");
-  // The page is empty when the model list is shown.
+  // Each case has the medium's models and the expected connection page, which is empty if the
+  // wizard shows the model list.
   const std::pair<std::vector<Dictionary::Pair>, std::string> cases[] = {
       {{{"A", model(true, false, true)}}, usb},
       {{{"A", model(true, true, false)}, {"B", model(true, true, true)}}, wired},
@@ -189,7 +190,8 @@ Dictionary version(Value major, Value minor, Value bugFix) {
 
 TEST_F(StartUp, ChecksTheSystemFirst) {
   const Dictionary none = version("0", "0", "0");
-  // The last text is a part of the alert. It is empty for a supported system.
+  // Each case has the running system's version, the minimum, the maximum and a part of the expected
+  // alert. This part is empty if the system is supported.
   const std::tuple<const char*, Dictionary, Dictionary, std::string> cases[] = {
       {"10.5.8", version(10, 6, 0), none, "Mac OS X 10.6 or"},
       {"10.6.0", version("10", "6", "0"), none, ""},
@@ -215,7 +217,7 @@ TEST_F(StartUp, ChecksTheSystemFirst) {
     leaveFile(medium.modelFilePath());
     launch();
     EXPECT_EQ(std::filesystem::exists(medium.modelFilePath()), !alert.empty())
-        << "only a supported system loses the files of earlier runs";
+        << "the files of earlier runs are removed only on a supported system";
     EXPECT_EQ(page(), alert.empty() ? "ModelListView" : "");
     ASSERT_EQ(screen.alerts.size(), alert.empty() ? 0U : 1U);
     if (alert.empty()) continue;

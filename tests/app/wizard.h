@@ -18,8 +18,8 @@ namespace onramp {
 inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
-/// Runs the wizard from a temporary medium on a scripted network, and sees and uses it as a person
-/// does.
+/// Runs the wizard from a temporary medium on a scripted network. Its functions see and use the
+/// wizard as a person does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {
@@ -37,6 +37,8 @@ class Wizard : public testing::Test {
              more);
   }
 
+  /// Writes a medium with a package and `models`: pairs of a name and what recording::model()
+  /// returns.
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
     names.reserve(models.size());
@@ -97,8 +99,8 @@ class Wizard : public testing::Test {
     return rows;
   }
 
-  /// Returns the visible buttons from left to right: "[title]" for an enabled one, "(title)" for a
-  /// disabled one.
+  /// Returns the visible buttons from left to right: "[title]" for an enabled button, "(title)" for
+  /// a disabled button.
   [[nodiscard]] std::string buttons() const {
     std::string shown;
     for (const char* name : {"leftMostButton", "leftButton", "rightButton", "rightMostButton"}) {

@@ -76,7 +76,7 @@ TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
   EXPECT_EQ(list.selectionIndex(), std::nullopt);
 }
 
-// The thread sanitizer checks this test.
+// Under the thread sanitizer, this test fails if arrangedCount() is not safe on another thread.
 TEST(ArrayController, LetsAnotherThreadWaitForAnEntry) {
   ArrayController list;
   std::size_t seen = 0;

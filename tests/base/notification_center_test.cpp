@@ -29,7 +29,8 @@ TEST(NotificationCenter, CallsObserversInOrderEvenWhenHandlersAddAndRemoveThem) 
   center.post({"x", nullptr, {{"text", std::string("first")}}});
   EXPECT_EQ(log, "first( cy ) cx ");
   center.post({"x", nullptr, {}});
-  EXPECT_EQ(log, "first( cy ) cx cx cx ") << "the observer added by a handler is called";
+  EXPECT_EQ(log, "first( cy ) cx cx cx ")
+      << "a later notification reaches the handler that was added";
 }
 
 }  // namespace

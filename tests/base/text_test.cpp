@@ -22,7 +22,7 @@ std::string readAndWritten(std::string_view bytes) {
   return text;
 }
 
-TEST(UTF8, IsReadByCharacterAndRefusedByteByByte) {
+TEST(UTF8, IsReadByCharacterAndMalformedBytesAreRefusedOneByOne) {
   for (const char* const whole :
        {"", "a\x7F", "\u0080\u07FF", "\u0800\uD7FF\uE000\uFFFF", "\U00010000\U0010FFFF"}) {
     EXPECT_EQ(readAndWritten(whole), whole);

@@ -1,14 +1,16 @@
-// Tells another program which controls are on the screen, because GNUstep has no accessibility
-// interface. The test build links this file into the application. gnustep_person.py is the other
-// half of the protocol.
+// Tells a test which controls are on the screen, because GNUstep has no accessibility interface. A
+// build with tests links this file into the application. The other half of the protocol is in
+// gnustep_person.py.
 //
-// ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the other program creates a question
-// file, which has the same name with ".question" appended. The application's loop removes the
-// question file and writes the answer: a JSON array of all visible controls. Each is an object with
-// role, name, states and frame (x, y, width and height in pixels from the screen's upper left
-// corner). Roles and states have their AT-SPI names, except the state "cut off" of a text that
-// lacks room. The first object stands for the application. It has the role "application" and the
-// number of mouse presses handled so far.
+// The environment variable ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the test
+// creates a question file, whose name is that of the answer file with ".question" appended. The
+// application's main loop removes the question file and writes the answer file. The answer is a
+// JSON array with an object for each visible control. The object has the keys "role", "name",
+// "states", "x", "y", "width" and "height". Roles and states have their AT-SPI names, except the
+// state "cut off" of a text that lacks room. Lengths are in pixels, and x and y start at the
+// screen's upper left corner. The first object stands for the application. Its role is
+// "application". Instead of a frame, it has the key "presses": the number of mouse presses that the
+// application has handled so far.
 
 #include <unistd.h>
 
@@ -95,7 +97,8 @@ class Reader {
     if (!fits && ![window_ isKindOfClass:[NSPanel class]]) [states addObject:@"cut off"];
   }
 
-  // Reports each row as one list item or, in a table with headers, as one cell per column.
+  // In a table without headers, reports each row as a list item. In a table with headers, reports
+  // each cell.
   void readTable(NSTableView* table) {
     NSString* const role = [table headerView] ? @"table cell" : @"list item";
     const NSRange rows = [table rowsInRect:[table visibleRect]];

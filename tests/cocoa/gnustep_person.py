@@ -1,7 +1,8 @@
 """A person at the screen of the Cocoa front end under GNUstep.
 
-GNUstep has no AT-SPI. Instead, this module asks the program through a file, and the program writes
-down its visible controls with their AT-SPI roles. See accessibility.mm for the protocol.
+GNUstep does not support AT-SPI. Instead, this module asks the program by creating a question file. The
+program writes its visible controls, with their AT-SPI roles, into an answer file. accessibility.mm
+describes the protocol.
 """
 
 import itertools
@@ -22,10 +23,10 @@ _MENU_BAR_ITEM = "Onramp OSX"
 
 
 class GNUstepPerson(Person):
-    """Starts a program on a desktop and uses it. Use it in a `with` statement."""
+    """Starts a program on a desktop and uses its window. A `with` statement ends the program."""
 
     follows_desktop = False
-    errors = ()  # using a control that has vanished raises nothing
+    errors = ()  # the use of a control that is gone raises no error
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
@@ -35,7 +36,7 @@ class GNUstepPerson(Person):
         variables = {
             "ONRAMP_ACCESSIBILITY_FILE": str(self._answer),
             "GNUSTEP_CONFIG_FILE": str(self._configure(folder)),
-            # GNUstep reads strings tables in the locale's encoding; ours are in UTF-8.
+            # GNUstep reads string tables in the locale's encoding. Our tables are in UTF-8.
             "LC_CTYPE": "C.UTF-8",
         } | self._options_as_environment(list(arguments))
         self.process = start([str(program)], env=desktop.env | variables | (env or {}))
@@ -57,9 +58,10 @@ class GNUstepPerson(Person):
         self._point_at(control)
         before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
-        # The button stays down until GNUstep has noticed the press. Otherwise, GNUstep sees it
-        # released from the start. Presses inside an open menu are never counted, because the menu
-        # grabs the mouse.
+        # The mouse button stays down until GNUstep has noticed the press. Otherwise, GNUstep would
+        # find the mouse button up when it handles the press. The application cannot count a press
+        # inside an open menu, because the menu grabs the mouse, so the wait for that press is
+        # short.
         patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
         deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:
@@ -70,7 +72,7 @@ class GNUstepPerson(Person):
         return self._read()[0]["presses"] if self.is_running() else 0
 
     def open_menu(self, button=None):
-        """Opens a button's menu, which the held mouse button keeps open."""
+        """Opens a button's menu and holds the mouse button down, which keeps the menu open."""
         self._point_at(self.see("button menu", button))
         self.desktop.run(["xdotool", "mousedown", "1"])
         wait_for(self._menu_entries, _LOOK_SECONDS, f"the menu of {button!r}")
@@ -79,9 +81,9 @@ class GNUstepPerson(Person):
         nudge = itertools.cycle((0, 1))
 
         def noticed():
-            # The menu's window moves after it has opened, so every try looks up the entries again.
-            # The pointer moves at every try, because GNUstep ignores a pointer that has not moved
-            # since the menu became ready.
+            # The menu's window moves after the menu has opened, so every try looks up the entries
+            # again. Every try also moves the pointer, because GNUstep ignores a pointer that has
+            # not moved since the menu became ready.
             entries = self._menu_entries()
             if not entries:
                 return False
@@ -92,7 +94,7 @@ class GNUstepPerson(Person):
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):
-        """Returns the entries of the open menu, or None. Leaves out the menu bar's own entry."""
+        """Returns the entries of the open menu, without that of the menu bar, or None."""
         items = [control for control in self._read() if control["role"] == "menu item"]
         return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
 
@@ -105,7 +107,10 @@ class GNUstepPerson(Person):
         return self._at_rest(role, name)
 
     def _at_rest(self, role, name):
-        """Returns the control once it stands still. The window manager moves a new window."""
+        """Returns the control after two looks have found it in the same place.
+
+        The window manager moves a new window. If the control is gone, returns the last look's result.
+        """
         seen = None
         while True:
             now = self._look(role, name)
@@ -122,7 +127,11 @@ class GNUstepPerson(Person):
         self._read()
 
     def _read(self):
-        """Returns the visible controls. Blocks while the program's loop is blocked."""
+        """Returns the visible controls, after an entry for the application.
+
+        Waits while the program's main loop is busy. Returns only the entry for the application if
+        the program has ended.
+        """
         self._answer.unlink(missing_ok=True)
         self._question.touch()
         wait_for(lambda: self._answer.exists() or not self.is_running(), _ANSWER_SECONDS,
@@ -149,7 +158,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """Returns variables that replace the options, which the Cocoa front end does not have."""
+        """Returns environment variables that replace options, because the Cocoa front end has none."""
         if not arguments:
             return {}
         option, value = arguments

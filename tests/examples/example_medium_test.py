@@ -1,4 +1,7 @@
-"""Checks the example medium against the sources, in ways that onramp-check does not."""
+"""Compares the example medium's texts with the sources, and runs its set-up tool.
+
+onramp-check does neither.
+"""
 
 import ast
 import os
@@ -27,7 +30,7 @@ def sources():
 
 
 class Messages(unittest.TestCase):
-    def test_fallbacks_in_the_sources_have_the_placeholders_of_the_texts(self):
+    def test_each_fallback_in_the_sources_has_as_many_placeholders_as_the_text(self):
         calls = re.findall(rf"localized\(\s*{KEY},\s*((?:{TEXT}\s*)+)\)", sources())
         fallbacks = {key: ast.literal_eval(f"({text})") for key, text in calls}
         self.assertIn("INST_TXT_ALERT_OSMIN", fallbacks)
@@ -35,7 +38,7 @@ class Messages(unittest.TestCase):
         self.assertEqual({key: english[key].count("%@") for key in fallbacks},
                          {key: text.count("%@") for key, text in fallbacks.items()})
 
-    def test_descriptions_call_the_next_button_by_its_title(self):
+    def test_every_description_calls_the_next_button_by_its_title(self):
         for language in LANGUAGES:
             table = messages.read(MEDIUM, language)
             for key in ("INST_TXT_MODEL_DESC", "INST_TXT_CONNECTIONTYPE_DESC"):
@@ -43,7 +46,7 @@ class Messages(unittest.TestCase):
 
 
 class Medium(unittest.TestCase):
-    def test_the_set_up_tool_exits_with_the_status_that_it_is_given(self):
+    def test_the_set_up_tool_exits_with_the_status_in_the_variable_or_with_64(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
         for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):

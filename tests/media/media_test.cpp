@@ -43,7 +43,7 @@ TEST(MediumDescription, HasADefaultForEveryMissingOrMistypedEntry) {
                             {"KSC Series Code", ""},
                             {"bonjour service type for browsing", ""}};
   EXPECT_EQ(KSOROSXCD::initWithCDInfoPlist(std::nullopt, common), defaults)
-      << "without a description, the service type is not read either";
+      << "without the medium's description, even the service type has its default";
   EXPECT_EQ(KSOROSXCD::initWithCDInfoPlist(Dictionary(), std::nullopt), defaults);
 }
 
@@ -65,7 +65,7 @@ TEST(ModelRecord, IsReadFromTheModelInformation) {
   EXPECT_EQ(KSOROSXModel::initWithName("Other", info), record("Other", "", true, false, false));
   EXPECT_EQ(KSOROSXModel::initWithName("Odd", std::nullopt), record("Odd", "", true, false, false));
   EXPECT_EQ(KSOROSXModel::initWithName("Nameless", info), (Dictionary{{"name", "Nameless"}}))
-      << "the record ends at the missing identifier";
+      << "the record of a model without an identifier has only the name";
   EXPECT_EQ(KSOROSXModel::initWithName(std::nullopt, info), Dictionary());
 }
 
@@ -114,7 +114,7 @@ TEST(InstallerInformation, HasADefaultForEveryMissingPart) {
   EXPECT_EQ(sparse.supportSystemMax(), unbounded);
   EXPECT_EQ(sparse.supportSystemMin(), minimum);
   EXPECT_EQ(sparse.WLANtoolURL(), FileURL{medium.path("").substr(0, medium.path("").size() - 1)})
-      << "without a tool, the folder of the application";
+      << "without a tool, the path is that of the application's folder";
 }
 
 }  // namespace

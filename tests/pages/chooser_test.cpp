@@ -43,7 +43,7 @@ class Chooser : public Wizard {
     Wizard::TearDown();
   }
 
-  /// Returns the rows from the top. The selected one ends with a star.
+  /// Returns the rows from the top. The selected row ends with a star.
   [[nodiscard]] std::vector<std::string> rows() const {
     std::vector<std::string> rows = deviceRows();
     const auto selected = screen.object("deviceListView").content->selectionIndex();
@@ -98,7 +98,8 @@ TEST_F(Chooser, ListsOnlyDevicesOfTheModelsLookedFor) {
     const Dictionary found = device("D", {"192.0.2.1"}, maker, model);
     page->updateKSDevice(found);
     EXPECT_EQ(page->deviceArrayControllerCnt(), listed ? 1U : 0U) << maker << '|' << model;
-    EXPECT_EQ(agents.asked.size(), listed ? 1U : 0U) << "others are not asked";
+    EXPECT_EQ(agents.asked.size(), listed ? 1U : 0U)
+        << "only a device of a model looked for is asked";
     page->removeKSDevice(found);
     EXPECT_THAT(rows(), IsEmpty());
   }
@@ -108,7 +109,8 @@ TEST_F(Chooser, ListsOnlyDevicesOfTheModelsLookedFor) {
 }
 
 TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
-  // The answers of each address, the number of requests to it, and whether the device is listed.
+  // Each case has the answers of each address, the number of requests to each address, and whether
+  // the device is listed.
   const std::tuple<std::vector<std::vector<int>>, std::vector<std::size_t>, bool> cases[] = {
       {{}, {}, false},
       {{{kWireless}}, {1}, true},
@@ -120,7 +122,8 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWireless}, {kWired}}, {6, 1, 0}, true},
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
-      // An address that leaves a request unanswered gets all its attempts before the next address.
+      // An address that leaves one request unanswered is tried three times, even if it answers
+      // later requests.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},
@@ -161,7 +164,8 @@ TEST_F(Chooser, AnUpdateWithAnotherAddressKeepsTheOldEntry) {
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*", "D 192.0.2.2"));
   page->removeKSDevice(device("D", {"192.0.2.2"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
-  // The listed entry's record has two addresses, so it is not equal to a record with one.
+  // The record of the listed entry has two addresses, so a record with only one of them is not
+  // equal.
   page->removeKSDevice(device("D", {"192.0.2.1"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
 }

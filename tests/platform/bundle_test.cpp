@@ -73,7 +73,7 @@ TEST_F(BundleOnMedium, UsesTheUsersLanguageAndReadsTheFilesEachTime) {
                Dictionary{{"CFBundleDevelopmentRegion", "zh_CN"}});
   EXPECT_EQ(text("k"), "简体");
   resource("ko.lproj/Localizable.strings", "k = ");
-  EXPECT_EQ(text("k"), "fallback") << "the table cannot be read";
+  EXPECT_EQ(text("k"), "fallback") << "a table that cannot be read has no texts";
   resource("ko.lproj/Localizable.strings", "k = korean;");
   EXPECT_EQ(text("k"), "korean");
   EXPECT_EQ(Bundle::open(medium.path("Some.bundle"))->localizedString("k", "v", "Other"), "v");

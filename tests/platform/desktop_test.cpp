@@ -138,7 +138,8 @@ TEST(Desktop, ReportsTheSystemVersionThatIsSet) {
   }
   setSystemVersion("10.6.8");
   medium.setEnvironment("ONRAMP_SYSTEM_VERSION", "10.9.5");
-  EXPECT_EQ(productVersion(), "10.6.8") << "the front end's choice takes precedence";
+  EXPECT_EQ(productVersion(), "10.6.8")
+      << "setSystemVersion() takes precedence over the environment";
   setSystemVersion("");
   EXPECT_EQ(productVersion(), "10.9.5");
 }

@@ -9,9 +9,8 @@
 
 namespace onramp {
 
-/// Calls `action` in another process and returns that process's wait status. The status is
-/// 0 if `action` returned true. When `usage` is not null, it receives the resources that the
-/// process used.
+/// Calls `action` in a child process and returns the child's wait status, which is 0 if `action`
+/// returned true. When `usage` is not null, stores there the resources that the child used.
 inline int inProcess(const std::function<bool()>& action, rusage* usage = nullptr) {
   const pid_t process = fork();
   if (process == 0) _exit(action() ? 0 : 1);

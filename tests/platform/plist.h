@@ -5,7 +5,7 @@
 namespace onramp {
 
 /// Returns an XML property list whose root dictionary has the key "k". `value` is the XML of the
-/// key's value, which further keys and values may follow.
+/// key's value. It may continue with further keys and values.
 inline std::string plistWith(const std::string& value) {
   return "<plist version=\"1.0\"><dict><key>k</key>" + value + "</dict></plist>";
 }

@@ -20,7 +20,7 @@ std::string bigEndian(std::size_t number, int bytes = 4) {
   return text;
 }
 
-// Returns a binary list of `objects` whose root is the first one.
+// Returns a binary list of `objects`, whose root is the first object.
 std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
                    int referenceSize = 4) {
   std::string bytes = "bplist00";
@@ -45,8 +45,8 @@ std::string dictionaryOver(std::size_t count,
   return binary(objects);
 }
 
-// Returns a binary list of `depth` nested arrays. Each contains the next one `times` times. The
-// last contains a text `times` times.
+// Returns a binary list of `depth` nested arrays. Each array contains the next array `times` times.
+// The last array contains a text `times` times.
 std::string arrays(std::size_t depth, std::size_t times) {
   return dictionaryOver(depth + 1, [&](std::size_t i) {
     return i == depth + 2 ? std::string("\x51t")
@@ -83,7 +83,7 @@ TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
                       })},
       {"a list that holds itself",
        dictionaryOver(2, [](std::size_t i) { return "\xA1" + bigEndian(5 - i); })}};
-  // The file is loaded in another process, so that the memory that loading takes can be measured.
+  // Each file is loaded in a process of its own, whose peak memory shows what the loading costs.
   rusage usage{};
   const auto load = [&](const std::string& bytes) {
     const std::string path = folder.holding("list", bytes);

@@ -1,5 +1,5 @@
-"""Another implementation of property lists. "write XML BINARY" writes a list with every kind of value
-to both files. "check FILE" compares the list in FILE with the one that "write" writes."""
+"""Reads and writes property lists with Python's own library. "write XML BINARY" writes a list with every
+kind of value to the two files. "check FILE" fails with a message unless FILE holds the same list."""
 
 import datetime
 import math

@@ -83,7 +83,8 @@ TEST(AtomicWriting, AKilledWriterKeepsTheOldFileAndRemovalDeletesItsLeftovers) {
   for (const std::string& name : {std::string("list"), longest}) {
     ASSERT_TRUE(writeDictionaryAtomically(before, folder / name));
     EXPECT_TRUE(WIFSIGNALED(statusOfWriterPastItsLimit(folder / name, [] {})));
-    EXPECT_EQ(folder.names().size(), 2U) << "the list and the unfinished new one";
+    EXPECT_EQ(folder.names().size(), 2U)
+        << "there are the list and the killed writer's temporary file";
     EXPECT_EQ(loadDictionary(folder / name), before);
     removeDictionary(folder / name);
     EXPECT_THAT(folder.names(), testing::IsEmpty());

@@ -104,7 +104,8 @@ class Layout : public testing::TestWithParam<int> {
     }
   }
 
-  // Expects that the menu looks the same when it is wider, so that none of its texts is elided.
+  // Expects that the menu's texts look the same in a wider menu. A text that is elided in the usual
+  // menu would look different.
   static void expectMenuFits(QMenu& menu) {
     const QSize size = menu.sizeHint();
     menu.resize(size);
@@ -118,8 +119,8 @@ class Layout : public testing::TestWithParam<int> {
   }
 
   void expectEverythingFits() const {
-    // Sizes need a few rounds to settle, because a wider text makes the window wider, which moves
-    // the other controls.
+    // Sizes need a few rounds to settle, because a wider text makes the window wider, and a wider
+    // window moves the other controls.
     for (int round = 0; round < 5; ++round)
       QApplication::processEvents();
     const QSize screen = window->screen()->availableSize() - QSize(0, kTitleBarHeight);
@@ -163,7 +164,7 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   delegate->replaceMainView("", connections);
   connections->setConnectionType(ConnectionType::kUSBAndEthernet);
   connections->progressON(true);
-  // The chooser has every button that a page can show.
+  // Shows the chooser's buttons, because no page has more buttons.
   delegate->setChooseDeviceViewButton();
   expectEverythingFits();
 
@@ -180,7 +181,7 @@ TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
   const QModelIndex first = window->findChild<QTreeView*>("deviceListView")->model()->index(0, 0);
   const QString tip = first.data(Qt::ToolTipRole).toString();
   EXPECT_EQ(QTextDocumentFragment::fromHtml(tip).toPlainText(), first.data().toString())
-      << "the tool tip reads markup in a device's name";
+      << "the tool tip shows a device's name literally, even if the name looks like markup";
 }
 
 INSTANTIATE_TEST_SUITE_P(Points, Layout, testing::Values(10, 18));

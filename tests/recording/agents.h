@@ -27,20 +27,22 @@ class Agents {
   /// Returns to the initial state, in which no address answers.
   void reset() { *this = Agents(); }
 
-  /// The values that each dotted address answers with, in order. The last value answers all further
-  /// requests too.
+  /// For each dotted address, the values with which its agent answers, in order. The agent answers
+  /// all further requests with the last value.
   std::map<std::string, std::vector<int>> answers;
 
-  /// When set, returns the reply to every request, whatever its address. When it returns nothing,
-  /// the request stays unanswered.
+  /// If this function is set, it returns the reply to every request, and `answers` is not used.
+  /// When it returns nothing, the request stays unanswered.
   std::function<std::optional<Bytes>(const Bytes& request)> reply;
 
-  bool socketsOpen = true;
+  bool socketsOpen = true;                      ///< when false, no socket can be opened
   std::vector<std::string> asked;               ///< the address of every request so far
   std::uint16_t port = 0;                       ///< of the latest request
   std::size_t room = 0;                         ///< of the buffer for the latest reply, in bytes
   std::vector<std::chrono::nanoseconds> waits;  ///< the time limit of every wait
 
+  /// Removes and returns the next value of `address` in `answers`, but does not remove the last
+  /// value. Returns kSilent when the address has no values.
   [[nodiscard]] int nextAnswer(const std::string& address);
 };
 

@@ -18,7 +18,7 @@ FrontEnd& FrontEnd::instance() {
 
 void FrontEnd::reset() {
   mainInterface_.reset();
-  const std::vector<Object*> others = std::move(loaded);  // still belong to a page
+  const std::vector<Object*> others = std::move(loaded);  // objects of pages that still exist
   *this = FrontEnd();
   loaded = others;
   resetLoop();

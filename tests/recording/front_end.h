@@ -23,7 +23,8 @@ struct Object {
   bool enabled = true;
   bool animating = false;
   bool resizeIndicator = true;
-  std::string text;                                  ///< of a text field, a window, a menu item
+  /// The text of a text field, or the title of a window, button or menu item.
+  std::string text;
   std::map<std::pair<int, int>, std::string> cells;  ///< titles by row and column
   int selectedRow = -1;
   int selectedColumn = -1;
@@ -38,7 +39,7 @@ struct Object {
   Object* superview = nullptr;
   std::vector<Object*> subviews;
   std::string action;
-  InterfaceOwner* owner = nullptr;  ///< the owner that its interface file was loaded for
+  InterfaceOwner* owner = nullptr;  ///< the owner of the object's interface file
 
   [[nodiscard]] NativeObject* native() { return reinterpret_cast<NativeObject*>(this); }
 };
@@ -50,23 +51,23 @@ struct ShownAlert {
 };
 
 /// A front end without a screen, and a desktop that opens nothing. It records what the program
-/// shows and asks for, and plays the user and the clock. Time passes only in runTimers(). The
-/// pauses in the wait for a device search take no time.
+/// shows and asks for, and plays the user and the clock. Time passes only in runTimers().
+/// sleepOffMainThread() does not sleep; it records the pause and calls `duringPause`.
 class FrontEnd {
  public:
   static FrontEnd& instance();
 
-  /// Returns to the state of a new process.
+  /// Returns to the state of a new process, but keeps the objects of pages that still exist.
   void reset();
 
   /// Launches the application for `delegate` as the platform does, up to the point where it waits
   /// for the user. The delegate must exist until the next reset().
   void launch(ApplicationDelegate& delegate);
 
-  /// The most recently loaded object with that name. The process is aborted when there is none.
+  /// Returns the most recently loaded object with that name. Aborts the process when there is none.
   [[nodiscard]] Object& object(const std::string& name);
 
-  /// Clicks a button as the user would. Nothing happens when it is hidden or disabled.
+  /// Clicks a button as the user would. Does nothing when the button is hidden or disabled.
   void click(const std::string& buttonName);
 
   /// Runs the scheduled timers, the earliest first, until none is left or the application has
@@ -90,8 +91,10 @@ class FrontEnd {
 
   // What a test sets up.
   std::set<std::string> missingInterfaces;
-  std::function<void(int pause)> duringPause;  ///< called on the main thread; pauses count from 1
-  std::function<void()> duringOpening;         ///< called while the desktop is asked to open
+  /// Called on the main thread during each pause, with the number of the pause, which starts at 1.
+  std::function<void(int pause)> duringPause;
+  /// Called when the program opens a file or an address.
+  std::function<void()> duringOpening;
 
  private:
   Object& addMenuObject(OutletKind kind, const std::string& text);

@@ -11,8 +11,9 @@ void resetLoop();
 /// Ends the loop and wakes every waiting thread.
 void endLoop();
 
-/// Runs posted actions until `done` returns true, `most` has passed or the loop has ended. Returns
-/// what `done` returned last.
+/// Runs posted actions until `done` returns true. When no action is left, waits for one. Gives up
+/// when `most` has passed during the wait, when the loop has ended or when abortModal() has been
+/// called. Returns what `done` returned last.
 bool runPosted(const std::function<bool()>& done, std::chrono::duration<double> most);
 
 }  // namespace onramp::recording

@@ -11,8 +11,8 @@
 
 namespace onramp::recording {
 
-/// A temporary folder with a medium, which holds the application's main bundle, and with
-/// application-support folders. The destructor removes the folder and restores the environment
+/// A temporary folder that holds a medium and the application-support folders. The medium holds the
+/// running application's bundle. The destructor removes the folder and restores the environment
 /// variables that this object has set.
 class MediumFolder {
  public:
@@ -30,6 +30,7 @@ class MediumFolder {
   /// Write a file on the medium. The file's folder is created if it is missing.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
+  /// Lets the user run the file `relative` on the medium.
   void makeExecutable(const std::string& relative) const;
 
   /// Writes the medium's three property lists. Adds the entries "CDInfo", "ModelInfo" and
@@ -43,8 +44,9 @@ class MediumFolder {
   /// Returns the arguments of the tool's last run, or an empty text when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// The first two return the contents of the two files for the package, or nothing when a file
-  /// cannot be read. The others return the paths of these files.
+  /// optionsFile() and modelFile() return the contents of the two files that the wizard writes for
+  /// the package, or nothing when a file cannot be read. The other two functions return the files'
+  /// paths.
   [[nodiscard]] auto optionsFile() const { return loadDictionary(optionsFilePath()); }
   [[nodiscard]] auto modelFile() const { return loadDictionary(modelFilePath()); }
   [[nodiscard]] std::string optionsFilePath() const {

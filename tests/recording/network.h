@@ -14,7 +14,7 @@ class Network {
  public:
   static Network& instance();
 
-  /// Returns to the initial state. Earlier browsers and services get no more events.
+  /// Returns to the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
   /// Makes a service object like those that browse events carry.
@@ -25,7 +25,8 @@ class Network {
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// End the service's running resolve. They do nothing when there is none.
+  /// End the service's running resolve: resolves() with these results, and failsToResolve() with
+  /// kNetServiceErrorTimeout. Both do nothing when no resolve is running.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);
 
@@ -35,22 +36,23 @@ class Network {
   static void fill(const NetServiceRef& service, std::vector<Data> addresses,
                    std::optional<Data> txt);
 
-  /// The addresses that a blocking resolve finds, by "name.typedomain". A blocking resolve of any
-  /// other service fails.
+  /// The addresses that a resolve without a client finds. A key is a service's full name, such as
+  /// "Office._ipp._tcp.local.". Such a resolve of any other service fails.
   std::map<std::string, std::vector<Data>> answers;
 
-  bool searchesStart = true;
+  bool searchesStart = true;                 ///< when false, no search can be started
   std::string domain;                        ///< of the latest search
   std::vector<double> timeouts;              ///< of every resolve
   bool cancelled = false;                    ///< whether the latest resolve was cancelled
   std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 
-/// Socket addresses in the BSD layout.
+/// Return a socket address in the layout that NetService::addressing() describes. ipv6Address()
+/// returns that of the loopback interface.
 [[nodiscard]] Data ipv4Address(unsigned char a, unsigned char b, unsigned char c, unsigned char d);
 [[nodiscard]] Data ipv6Address();
 
-/// TXT data that holds `strings`.
+/// Returns the data of a TXT record that holds `strings`.
 [[nodiscard]] Data txtData(const std::vector<std::string>& strings);
 
 }  // namespace onramp::recording

@@ -12,7 +12,7 @@ namespace {
 using recording::FrontEnd;
 using recording::Object;
 
-// Returns the object of a handle. For an empty handle, returns a spare object, which nobody reads.
+// Returns the object of a handle. For an empty handle, returns a spare object in its initial state.
 Object& object(const Outlet& outlet) {
   static Object spare;
   if (outlet) return *reinterpret_cast<Object*>(outlet.native());

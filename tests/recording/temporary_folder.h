@@ -25,12 +25,13 @@ class TemporaryFolder {
 
   [[nodiscard]] std::string operator/(const std::string& name) const { return path_ + "/" + name; }
 
-  /// Writes a file `name` with these bytes and returns its path.
+  /// Writes `bytes` to the file `name` in the folder and returns the file's path.
   [[nodiscard]] std::string holding(const std::string& name, const std::string& bytes) const {
     std::ofstream(*this / name, std::ios::binary) << bytes;
     return *this / name;
   }
 
+  /// Returns the names of the folder's entries, in no particular order.
   [[nodiscard]] std::vector<std::string> names() const {
     std::vector<std::string> names;
     for (const auto& entry : std::filesystem::directory_iterator(path_))

@@ -1,6 +1,9 @@
-"""Checks that both front ends' interface files have every outlet, action, bound title, column and menu
-item that the sources look up, and that the macOS application's files have what Xcode writes and what
-current systems need. At run time, the program and macOS ignore most mistakes without a message."""
+"""Checks the application's resources, because the program and macOS ignore most mistakes in them.
+
+The sources look up outlets, actions, bound titles, columns and menu items. The interface files of both
+front ends must have them all. The interface files for macOS must have the frames, cells and fonts that
+Xcode writes, and the information dictionary must have the entries that current versions of macOS need.
+"""
 
 import plistlib
 import re
@@ -21,10 +24,10 @@ REFERENCES = ("destination", "target", "headerView", "selectedItem", "firstRespo
 VIEWS = ("customView", "textField", "button", "imageView", "matrix", "popUpButton",
          "progressIndicator", "scrollView", "clipView", "scroller", "tableView", "tableHeaderView")
 
-# The texts that the system shows when it asks the user for permission.
+# The keys of the texts that macOS shows when it asks the user for permission.
 REASONS = {"NSLocalNetworkUsageDescription", "NSRemovableVolumesUsageDescription"}
 
-# The kinds of outlets by the class names of Qt's interface files and the tags of Cocoa's.
+# The kind of outlet for each class in Qt's interface files and for each tag in Cocoa's.
 QT = {"QLabel": "TextField", "QPushButton": "Button", "QToolButton": "PopUpButton",
       "QListView": "TableView", "QTreeView": "TableView", "QMainWindow": "Window",
       "QWidget": "View", "ImageView": "ImageView", "Spinner": "ProgressIndicator",
@@ -61,7 +64,7 @@ def wanted_columns(page):
 
 
 def recorded_outlets(interface):
-    """Returns the outlets that the recording front end has for an interface file."""
+    """Returns the names and kinds of the outlets that the recording front end has for `interface`."""
     text = text_of("tests/recording/interfaces.cpp")
     parts = re.search(rf'\{{"{interface}",\s*\{{(.*?)\}}\}}[,}}]', text, re.DOTALL)[1]
     return {name: kind for kind, name in re.findall(r'\{k(\w+), "(\w+)"', parts)}
@@ -126,7 +129,7 @@ class InterfaceFiles(unittest.TestCase):
                 columns = set() if page == "ConnectionTypeView" else wanted_columns(page)
                 self.assertEqual(columns, file.columns, f"{made.__name__} {page}")
 
-    def test_every_button_does_its_action_and_shows_its_title(self):
+    def test_every_button_performs_its_action_and_shows_its_title(self):
         buttons = {name for name, kind in wanted_outlets("MainMenu").items() if kind == "Button"}
         actions = {name: f"{name}Clicked" for name in buttons}
         titles = {name: f"{name}Title" for name in (*buttons, "window")}
@@ -138,7 +141,7 @@ class InterfaceFiles(unittest.TestCase):
             file = made("MainMenu")
             self.assertEqual((actions, titles), (file.actions, file.titles), made.__name__)
 
-    def test_every_menu_item_that_is_renamed_has_the_title_looked_for(self):
+    def test_every_menu_item_that_the_wizard_renames_is_in_the_menu(self):
         wanted = set(re.findall(r'\{"([\w ]+)", "APP_MENU_\w+"\}', START_UP)
                      + re.findall(r'itemWithTitle\("([^"]+)"\)', START_UP))
         self.assertEqual(6, len(wanted))
@@ -152,7 +155,7 @@ class CocoaFiles(unittest.TestCase):
                       for path in sorted((RESOURCES / "cocoa").glob("*.xib"))]
         self.assertEqual(4, len(self.files))
 
-    def test_ids_are_unique_and_every_reference_resolves(self):
+    def test_ids_are_unique_and_every_reference_names_an_element(self):
         for root in self.files:
             ids = Counter(element.get("id") for element in root.iter() if element.get("id"))
             self.assertEqual([], [name for name, count in ids.items() if count > 1])
@@ -170,10 +173,10 @@ class CocoaFiles(unittest.TestCase):
                     self.assertIsNotNone(element.find("autoresizingMask"), name)
                 if element.tag in ("textField", "button", "imageView", "popUpButton"):
                     self.assertIsNotNone(element.find("*[@key='cell']"), name)
-                if element.tag == "font":  # GNUstep uses its own size for a missing one
+                if element.tag == "font":  # GNUstep replaces a missing size with its own
                     self.assertTrue(element.get("metaFont") and element.get("size"), name)
 
-    def test_scroll_views_and_tables_have_scrollers_a_style_and_an_optional_selection(self):
+    def test_scroll_views_have_both_scrollers_and_tables_are_plain_and_may_have_no_selection(self):
         for root in self.files:
             for scroll in root.iter("scrollView"):
                 self.assertEqual(["horizontalScroller", "verticalScroller"],
@@ -187,7 +190,7 @@ class Information(unittest.TestCase):
     def setUp(self):
         self.information = plistlib.loads(INFORMATION.read_bytes())
 
-    def test_has_what_current_systems_look_for(self):
+    def test_has_the_entries_that_current_versions_of_macos_need(self):
         self.assertRegex(self.information["CFBundleIdentifier"], r"^[a-z]+(\.[a-z]+){2}$")
         self.assertTrue((RESOURCES / f"cocoa/{self.information['NSMainNibFile']}.xib").exists())
         target = re.search(r"CMAKE_OSX_DEPLOYMENT_TARGET ([\d.]+)", text_of("CMakeLists.txt"))[1]
@@ -211,7 +214,7 @@ class Information(unittest.TestCase):
         self.assertEqual(4, len(understood))
         self.assertEqual(understood, set(self.information["NSBonjourServices"]))
 
-    def test_is_released_with_the_hardened_runtime_and_no_entitlements(self):
+    def test_the_release_has_the_hardened_runtime_and_no_entitlements(self):
         self.assertRegex(text_of("tools/release-macos"), r"codesign .*--timestamp --options runtime")
         self.assertEqual([], [*RESOURCES.rglob("*.entitlements")])
 

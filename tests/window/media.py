@@ -1,4 +1,4 @@
-"""Makes media for tests, each in its own folder."""
+"""Makes media for tests."""
 
 import pathlib
 import plistlib
@@ -17,9 +17,10 @@ def model(usb=False, wired=False, wireless=False):
 
 
 def make(folder, built, models, tool_status=0, **resources):
-    """Makes a medium with the application, messages and pictures of the one in `built`.
+    """Makes a medium in `folder`, with the application, messages and pictures of the medium `built`.
 
-    The set-up tool writes its arguments to the file "tool" and exits with `tool_status`.
+    `resources` are additional entries of CDCommonInfo.plist. The set-up tool writes its arguments to
+    the file "tool" in the folder and exits with `tool_status`. Returns the folder's path.
     """
     folder, built = pathlib.Path(folder), pathlib.Path(built)
     shutil.copytree(built / "Onramp OSX.app", folder / "Onramp OSX.app")
@@ -49,7 +50,7 @@ def make(folder, built, models, tool_status=0, **resources):
 
 
 def make_tool(folder, status):
-    """Writes a set-up tool that exits with `status`, in place of an earlier one."""
+    """Writes a set-up tool that exits with `status`, or replaces the set-up tool on the medium."""
     tool = folder / "Setup.app/Contents/Linux/setup"
     tool.parent.mkdir(exist_ok=True)
     tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {status}\n")

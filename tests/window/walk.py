@@ -1,11 +1,12 @@
 #!/usr/bin/python3
 """Random walks over the wizard's real window while devices come and go.
 
-Usage: walk.py [--seed N] [--count N] MEDIUM
+Usage: walk.py [--seed S] [--count N] MEDIUM
 
-Walk number i, counted from 0, uses seed N + i, so that it can be repeated. A walk fails when the
-program exits with an error, when the main loop hangs, when the window cannot be closed at the end,
-or when a file for the package is incomplete. A failed walk prints its seed and its steps.
+The seeds of the N walks are S, S + 1 and so on, so `--seed S --count 1` repeats the walk with the seed S.
+A walk fails, for example, when the program exits with an error, when the main loop hangs, when the window
+cannot be closed at the end, or when a file for the package is incomplete. A failed walk prints its seed
+and its steps.
 """
 
 import argparse
@@ -27,16 +28,17 @@ from practice_network import PracticeNetwork
 AT_A_TIME = 4
 STEPS = 14
 PATIENCE = 60
-HANG = 10  # seconds without an answer; the devices answer at once, so nothing takes so long
+HANG = 10  # seconds; the devices answer at once, so the main loop is never busy for so long
 CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu item")
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
 PRINTER = "_pdl-datastream._tcp"
-# With equal weights, most walks would end early. Hide is never clicked, because no task bar can
-# bring a hidden window back.
+# A control that is not listed has the weight 1. With equal weights, most walks would end early.
+# Hide is never clicked, because the desktop has no task bar that could bring the window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
-# With any of these values a device answers at once, so that the wizard never waits for an answer.
+# What a device reports as its active interface. With each of these values, the device answers at
+# once, so the wizard never waits for an answer.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
 
 
@@ -80,7 +82,7 @@ class Walk:
             try:
                 step(person)
             except person.errors:
-                pass  # The control has vanished meanwhile.
+                pass  # The control is gone.
             self.listen(person, self.dice.choice((0, 0.1, 1)))
             self.check_files()
             if not person.is_running():
@@ -113,15 +115,15 @@ class Walk:
                              activeif=self.dice.choice(ANSWERS))
             self.devices[name] = True
         elif self.dice.random() < 0.5:
-            # The device leaves the service type that the wizard browses for, or returns to it. It
-            # keeps answering, because the wizard may be about to ask it.
+            # Changes the device's service type to one that the wizard does not browse for, or back.
+            # The device still answers questions, because the wizard may be about to ask it.
             self.devices[name] = not self.devices[name]
             self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
         else:
             self.network.set(name, note=f"after step {len(self.steps)}")
 
     def listen(self, person, seconds):
-        """Waits for `seconds`, during which the wizard must keep answering."""
+        """Waits for `seconds`. Raises Wrong if the main loop hangs during that time."""
         until = time.monotonic() + seconds
         while True:
             silent = person.round_trip()
@@ -134,12 +136,12 @@ class Walk:
             time.sleep(0.05)
 
     def leave(self, person):
-        """Closes the window, which works once the search has ended. Escape closes sheets and menus."""
+        """Ends the program. Tries repeatedly, because a window cannot be closed during a search."""
         until = time.monotonic() + PATIENCE
         while person.is_running():
             if time.monotonic() > until:
                 raise Wrong("the window cannot be closed")
-            person.press("Escape")
+            person.press("Escape")  # closes a sheet or a menu
             person.close_window()
             time.sleep(0.3)
         if person.wait_for_end() != 0:
@@ -153,9 +155,9 @@ class Walk:
                 except FileNotFoundError:
                     continue
                 except Exception as error:
-                    raise Wrong(f"{file.name} is incomplete: {error}") from error
+                    raise Wrong(f"{file.name} cannot be read: {error}") from error
                 if not {"Model", "Interface"} <= content.keys() and "PKG_FontSet" not in content:
-                    raise Wrong(f"{file.name} is incomplete: {content}")
+                    raise Wrong(f"{file.name} lacks keys: {content}")
 
 
 def take_walks(seeds):
@@ -184,7 +186,7 @@ def main():
                                   *sys.argv, BUILT])
     shares = [range(options.seed + first, options.seed + options.count, AT_A_TIME)
               for first in range(AT_A_TIME)]
-    sys.argv.append(str(BUILT))  # way.py takes it from there in each process
+    sys.argv.append(str(BUILT))  # where way.py looks for it in each process
     with multiprocessing.get_context("spawn").Pool(AT_A_TIME) as pool:
         return all(pool.map(take_walks, shares))
 

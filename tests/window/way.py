@@ -1,4 +1,4 @@
-"""The common part of the tests that go through the wizard from start to end.
+"""Shared code of the tests that go through the wizard from start to end.
 
 The last argument of each test program is a medium's folder with the application on it. With
 ONRAMP_GNUSTEP in the environment, that application is the Cocoa front end under GNUstep.
@@ -18,8 +18,8 @@ import media  # noqa: E402
 from onscreen import messages  # noqa: E402
 from onscreen.desktop import Desktop  # noqa: E402
 
-# The Cocoa front end under GNUstep has no accessibility bus, no keys for menus, no names for lists and
-# no options.
+# ON_GNUSTEP tells tests to avoid what the Cocoa front end under GNUstep lacks: the accessibility
+# bus, keys for menus, names of lists, and options.
 from tours.person import ON_GNUSTEP, Person  # noqa: E402
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
@@ -31,7 +31,7 @@ OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": Fa
 
 
 class WayTest(unittest.TestCase):
-    """Gives each test a person on a desktop and its own medium."""
+    """Starts the wizard for a test, on a new medium, with a person who uses it."""
 
     @classmethod
     def setUpClass(cls):
@@ -55,7 +55,7 @@ class WayTest(unittest.TestCase):
             person.press("F10")
 
     def files(self):
-        """Returns the contents of the files for the package by short names, such as "instmodel"."""
+        """Returns the contents of the files for the package under short names, such as "instmodel"."""
         found = {}
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
             for path in folder.rglob("com.kestrelimaging.*"):

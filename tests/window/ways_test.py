@@ -1,6 +1,8 @@
 """Tests that go through the wizard in its real window from start to end.
 
-Usage: ways_test.py [unittest options] MEDIUM, a medium's folder with the application on it.
+Usage: ways_test.py [unittest options] MEDIUM
+
+MEDIUM is the folder of a medium with the application on it.
 """
 
 import subprocess
@@ -33,11 +35,11 @@ class Ways(WayTest):
         person.press("Return")
         self.assert_installer_opened(person, {"Model": "B", "Interface": "Default"})
 
-    def test_no_wireless_model_shows_no_window(self):
+    def test_without_a_wireless_model_the_package_opens_at_once(self):
         person = self.start({"Cable": model(usb=True, wired=True)})
         self.assert_installer_opened(person, None)
 
-    def test_escape_and_the_close_button_quit(self):
+    def test_escape_the_close_button_and_cancel_quit(self):
         for leave in (lambda p: p.press("Escape"), lambda p: p.close_window(),
                       lambda p: p.click("push button", TEXT["BTN_CANCEL"])):
             with self.subTest(leave=leave):
@@ -46,7 +48,7 @@ class Ways(WayTest):
                 leave(person)
                 self.assert_quit_without_a_trace(person)
 
-    def test_a_system_beyond_the_range_gets_an_explanation(self):
+    def test_on_a_system_above_the_mediums_range_an_alert_says_why_and_the_wizard_quits(self):
         person = self.start(TWO_MODELS, ["--system-version", "11.0.0"],
                             SystemMax={"Major": "10", "Minor": "15", "BugFix": "x"})
         person.see("label", TEXT["INST_TXT_ALERT_OS"])
@@ -65,8 +67,8 @@ class Ways(WayTest):
         person.click("menu item", german["APP_MENU_QUIT"])
         self.assert_quit_without_a_trace(person)
 
-    @unittest.skipIf(ON_GNUSTEP, "lists have no names there")
-    def test_lists_are_named_searched_by_any_word_and_take_a_double_click(self):
+    @unittest.skipIf(ON_GNUSTEP, "lists have no names under GNUstep")
+    def test_a_list_has_a_name_finds_any_word_and_accepts_a_double_click(self):
         person = self.start({"Kestrel Photo 1": model(usb=True, wireless=True),
                              "Kestrel Scan 2": model(usb=True, wired=True, wireless=True)})
         person.see("list", TEXT["INST_TXT_MODEL"])
@@ -81,7 +83,7 @@ class Ways(WayTest):
         self.assert_installer_opened(person, {"Model": "Kestrel Photo 1", "Interface": "Default"})
 
     @unittest.skipIf(ON_GNUSTEP, "the Cocoa front end has no options")
-    def test_without_a_display_only_information_is_given(self):
+    def test_without_a_display_only_help_and_version_work(self):
         program = BUILT / "Onramp OSX.app/Contents/Linux/Onramp OSX"
         for arguments, status, start in ((["--help"], 0, "Usage: "), (["-v"], 0, "Onramp OSX "),
                                          ([], 2, "Onramp OSX: there is no display")):

@@ -1,8 +1,9 @@
 """Tests that choose wireless in the wizard's real window, on a practice network.
 
-Usage: wireless_test.py [TEST] MEDIUM, a medium's folder with the application on it.
-Every test has its own process, desktop and devices. Several tests run at a time, because a search
-is mostly waiting.
+Usage: wireless_test.py [TEST] MEDIUM
+
+MEDIUM is the folder of a medium with the application on it. Every test has its own process, desktop and
+devices. Several tests run at a time, because each of them mostly waits.
 """
 
 import concurrent.futures
@@ -38,7 +39,7 @@ class WirelessWays(WayTest):
         self.addCleanup(self.network.remove, name)
 
     def add_devices(self, *names):
-        """Adds devices that answer "wireless", waits for them and returns their full names."""
+        """Adds devices that use wireless, waits until all are announced, and returns their names."""
         whole = [f"{name} of {self.kind}" for name in names]
         for name in whole:
             self.add(name)
@@ -79,7 +80,7 @@ class WirelessWays(WayTest):
                 "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
                 "IP address": address}})
 
-    def test_keyboard_or_accessible_tree_alone_is_enough_beside_closed_devices(self):
+    def test_keyboard_alone_or_accessible_tree_alone_chooses_a_device_despite_closed_ports(self):
         for number in (1, 2, 3):
             self.add(f"closed {number} of {self.kind}", activeif="closed")
         self.add("Büro – 会議室", addresses=["127.0.90.1"], note="2nd floor")
@@ -100,7 +101,8 @@ class WirelessWays(WayTest):
         self.see_chooser(person, text)
         self.assertEqual(person.rows(), [
             ("Büro – 会議室", text["INST_TXT_CONNECTION_NETWORK"], "127.0.90.1")])
-        # A wait in vain would have started the set-up tool, after which there is no way back.
+        # If the search had found no device in time, the wizard would have run the set-up tool and
+        # then hidden Back.
         self.assertTrue(person.sees("push button", text["BTN_BACK"]))
         if not ON_GNUSTEP:
             person.press("Tab")
@@ -117,7 +119,7 @@ class WirelessWays(WayTest):
         person.act("table cell", "Büro – 会議室")
         person.act("push button", text["BTN_NEXT"])
 
-    def test_other_exit_status_searches_again_and_so_does_the_person(self):
+    def test_status_3_of_the_tool_and_refresh_in_the_menu_search_again(self):
         person = self.search(tool_status=3)
         self.see_tool_run()
         person.see("label", TEXT["INST_TXT_DEVLIST"])
@@ -169,7 +171,7 @@ class WirelessWays(WayTest):
         self.assertEqual(person.wait_for_end(), 0)
         self.assertEqual(self.files()["instmodel"]["Network"]["Bonjour"]["name"], names[-1])
 
-    def test_the_tool_from_the_menu_decides_which_page_follows(self):
+    def test_the_exit_status_of_the_tool_from_the_menu_decides_what_follows(self):
         name, = self.add_devices("One")
         person = self.search(tool_status=1)
         self.see_chooser(person)
@@ -189,7 +191,7 @@ class WirelessWays(WayTest):
 
 
 def run_all():
-    """Runs every test in its own process and returns whether all passed."""
+    """Runs every test in its own process and returns whether all tests passed."""
     names = unittest.defaultTestLoader.getTestCaseNames(WirelessWays)
     with concurrent.futures.ThreadPoolExecutor(AT_A_TIME) as pool:
         runs = pool.map(lambda name: subprocess.run(

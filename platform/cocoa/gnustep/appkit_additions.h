@@ -4,8 +4,8 @@
 
 #import <AppKit/AppKit.h>
 
-// Declares the AppKit methods that the front end uses and GNUstep lacks. The build includes this
-// header before every Objective-C++ source.
+// Declares the AppKit methods that the front end uses and GNUstep's headers lack. The build
+// includes this header before every Objective-C++ source.
 
 @interface NSView (OnrampIdentification)
 - (NSString*)identifier;

@@ -1,4 +1,5 @@
-// Small features of AppKit that GNUstep lacks and that need no separate files.
+// Makes small changes and additions to GNUstep, so that it behaves like AppKit. Larger ones have
+// files of their own beside this one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
@@ -12,18 +13,19 @@ using PerformKey = BOOL(id, SEL, NSEvent*);
 BeginSheet* originalBeginSheet = nullptr;
 PerformKey* originalPerformKey = nullptr;
 
-// GNUstep would let a hidden button respond to its key equivalent. AppKit does not.
+// Makes hidden buttons ignore their key equivalents, as in AppKit.
 BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
   return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
 }
 
-// Stands in for two setters that GNUstep lacks. They do nothing, because GNUstep shows no resize
-// indicator on a window of fixed size and lets no window prevent termination.
+// Implements two setters that GNUstep lacks. Both have nothing to do: GNUstep shows no resize
+// indicator on a window of fixed size, and no GNUstep window prevents termination.
 void ignore(id, SEL, BOOL) {}
 
 }  // namespace
 
-/// A sheet that opens in the next iteration of the main loop.
+/// A sheet that is to open in the next iteration of the main loop. Retains the alert and the
+/// window.
 @interface OnrampWaitingSheet : NSObject {
  @public
   NSAlert* _alert;
@@ -36,7 +38,8 @@ void ignore(id, SEL, BOOL) {}
 
 @implementation OnrampWaitingSheet
 
-// The timer fires again inside the sheet's loop if that loop runs in another mode.
+// The sheet's own loop may call this function a second time, because beginSheet() registers the
+// call for two loop modes.
 - (void)begin {
   if (_hasBegun) return;
   _hasBegun = YES;
@@ -55,8 +58,8 @@ void ignore(id, SEL, BOOL) {}
 
 namespace {
 
-// Opens the sheet later, because GNUstep would run it in a modal loop before it returns to the
-// caller.
+// Opens the sheet after the caller has returned, as in AppKit. GNUstep's own function runs a modal
+// loop until the sheet ends, and only then returns.
 void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) {
   OnrampWaitingSheet* const sheet = [[[OnrampWaitingSheet alloc] init] autorelease];
   sheet->_alert = [self retain];
@@ -78,15 +81,13 @@ NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
       .size;
 }
 
-// The application exchanges no notifications with other applications. GNUstep would start a daemon
-// for such notifications, and the application would fail to launch if that daemon were slow to
-// answer.
+// Prevents GNUstep from starting its daemon for notifications between applications. The application
+// exchanges no such notifications, and would fail to launch if the daemon were slow to answer.
 id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// GNUstep's workspace knows only GNUstep programs. The desktop's xdg-open knows the programs of the
-// desktop.
+// Opens `url` with xdg-open, because GNUstep's own function knows only GNUstep programs.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
@@ -103,8 +104,8 @@ BOOL openURL(id, SEL, NSURL* url) {
 }  // namespace
 
 /// Stands for an accessibility relation between controls in an interface file. GNUstep creates an
-/// object for each element of the file, and rejects the whole file if it lacks the class of one
-/// element.
+/// object for each element of the file, and rejects the whole file if the class of one element is
+/// missing.
 @interface IBAccessibilityConnection : NSObject
 @end
 

@@ -1,4 +1,5 @@
-// Makes GNUstep read bundles that are laid out as on macOS, with everything in a folder "Contents".
+// Makes GNUstep read bundles that are laid out as on macOS, where the folder "Contents" holds
+// everything.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -24,8 +25,9 @@ NSString* contentsOf(NSString* bundlePath) {
   return isFolder(contents) ? contents : bundlePath;
 }
 
-// Returns the folder of the first of the user's languages, or nil when the bundle lacks that
-// folder. GNUstep looks for "zh_CN.lproj" only under names such as "SimplifiedChinese.lproj".
+// Returns the folder of the user's most preferred language, or nil when the bundle lacks that
+// folder. GNUstep's own search misses "zh_CN.lproj", because it looks for names such as
+// "SimplifiedChinese.lproj" instead.
 NSString* firstLanguageFolder(NSString* rootPath, NSString* subPath) {
   NSArray* const languages =
       [[NSUserDefaults standardUserDefaults] stringArrayForKey:@"NSLanguages"];
@@ -43,7 +45,7 @@ NSArray* resourcePaths(id self, SEL selector, NSString* rootPath, NSString* subP
   NSString* const first = localization ? nil : firstLanguageFolder(contents, subPath);
   if (!first || [paths count] == 0) return paths;
   NSMutableArray* const all = [NSMutableArray arrayWithArray:paths];
-  [all insertObject:first atIndex:1];  // after the folder for resources in no language
+  [all insertObject:first atIndex:1];  // after the folder for resources of no language
   return all;
 }
 
@@ -61,7 +63,7 @@ NSString* executablePath(id self, SEL selector) {
   return originalExecutablePath(self, selector);
 }
 
-// Returns the bundle that holds the running program in its folder Contents/Linux.
+// Returns the bundle of the running program, which is in the bundle's folder Contents/Linux.
 NSBundle* mainBundle(id, SEL) {
   static NSBundle* bundle = nil;
   if (!bundle) {

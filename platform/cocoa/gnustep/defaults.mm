@@ -7,8 +7,9 @@ namespace {
 // The defaults domain that GNUstep searches first.
 NSString* const kFirstDomain = @"GSPrimaryDomain";
 
-// Returns the codes of the user's languages. GNUstep would look for folders named after languages,
-// such as "German.lproj", but the folders of our bundles are named after codes, such as "de.lproj".
+// Returns the codes of the user's languages, the most preferred one first, and then "en". By
+// default, GNUstep looks for folders that are named after languages, such as "German.lproj". The
+// folders of our bundles are named after codes, such as "de.lproj".
 NSArray* languageCodes() {
   NSDictionary* const environment = [[NSProcessInfo processInfo] environment];
   NSMutableArray* const codes = [NSMutableArray array];

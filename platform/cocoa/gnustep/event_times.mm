@@ -1,7 +1,7 @@
-// Keeps GNUstep's time of the last event correct. Every request for the keyboard focus carries this
-// time, and the window manager refuses a request that looks old. GNUstep also takes the time from
-// "_NET_WM_PING" messages, in which the number need not be a time. The window manager Openbox, for
-// example, sends a count that starts at one.
+// GNUstep stores the time of the last event. This file prevents that time from going back. Every
+// request for the keyboard focus carries the stored time, and the window manager refuses a request
+// whose time looks old. GNUstep also stores the number in each "_NET_WM_PING" message, which need
+// not be a time. The window manager Openbox, for example, sends a count that starts at one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -10,7 +10,8 @@ namespace {
 
 using SetTime = void(id, SEL, unsigned long);
 
-// Times are milliseconds in 32 bits. A step back of at least this size is a wrap-around.
+// Times are milliseconds in 32 bits, and start at 0 again after the largest number. A step back of
+// at least this size is such a restart.
 constexpr unsigned long kGreatestStepBack = 0xF0000000UL;
 
 SetTime* originalSetLastTime = nullptr;
@@ -38,8 +39,8 @@ void setLastTime(id self, SEL selector, unsigned long time) {
   }
 }
 
-// Runs after the application object has been created, because GNUstep loads its X11 backend when it
-// creates that object.
+// Runs when the application object exists, because GNUstep loads its X11 backend, which has the
+// class XGServer, only when it creates that object.
 + (void)replace:(NSNotification*)notification {
   Class const server = NSClassFromString(@"XGServer");
   if (!server) return;

@@ -1,6 +1,7 @@
-// Hides and unhides the application as AppKit does. GNUstep would replace each window with an icon,
-// because the application has no icon that the user could click. A window that is brought back
-// before its icon is on the screen does not always get the keyboard focus.
+// Hides and unhides the application as AppKit does, when the program asks for it. GNUstep would
+// replace each window with an icon, because the application has no icon that the user could click.
+// If a window came back before its icon was on the screen, the window would not always get the
+// keyboard focus.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -24,7 +25,8 @@ NSMutableArray* hiddenWindows() {
   return windows;
 }
 
-// When the user hides the application from the menu, GNUstep's icons are needed to bring it back.
+// A call with a sender comes from the menu. The user then needs GNUstep's icons to bring the
+// application back.
 void hide(id self, SEL selector, id sender) {
   if (sender) {
     originalHide(self, selector, sender);

@@ -1,6 +1,6 @@
-// Makes a posted event wake the main loop, as on macOS. A GNUstep loop fires its timers and
-// performs its messages before it waits for input, and does not notice an event that a timer or
-// message has posted until other input arrives.
+// Makes a posted event wake the main loop, as on macOS. A GNUstep loop runs its timers and delayed
+// messages and then waits for input. If a timer or message has posted an event, the loop does not
+// notice the event until some input arrives.
 
 #include <sys/eventfd.h>
 
@@ -9,7 +9,8 @@
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
 
-/// An input source of the main loop that has input after an event was posted.
+/// An input source of the main loop. Every posted event gives the source input, which wakes the
+/// loop.
 @interface OnrampPostedEvents : NSObject <RunLoopEvents> {
   int _descriptor;
 }
@@ -50,7 +51,7 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  eventfd_write(_descriptor, 1);  // a failure means that the loop is being woken already
+  eventfd_write(_descriptor, 1);  // fails when so many posts wait that the loop wakes anyway
 }
 
 - (void)receivedEvent:(void*)data

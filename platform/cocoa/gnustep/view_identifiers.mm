@@ -1,5 +1,4 @@
-// Gives views the identifiers that their interface file contains, because GNUstep ignores the
-// identifiers.
+// Gives each view its identifier from the interface file. GNUstep ignores these identifiers.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -13,7 +12,8 @@ InitWithCoder* originalViewInit = nullptr;
 InitWithCoder* originalCustomViewInit = nullptr;
 Dealloc* originalDealloc = nullptr;
 
-// Returns the table of identifiers by view. A view's entry is removed when the view is deallocated.
+// Returns the table that maps each view to its identifier. When a view is deallocated, dealloc()
+// removes the view from the table.
 NSMapTable* identifiers() {
   static NSMapTable* const table =
       NSCreateMapTable(NSNonOwnedPointerMapKeyCallBacks, NSObjectMapValueCallBacks, 64);
@@ -31,7 +31,7 @@ id viewInit(id self, SEL selector, NSCoder* coder) {
   return identified(originalViewInit(self, selector, coder), coder);
 }
 
-// Decoding an NSCustomView returns a view of the custom class in its place.
+// When an NSCustomView is decoded, the result is not `self` but a view of the custom class.
 id customViewInit(id self, SEL selector, NSCoder* coder) {
   return identified(originalCustomViewInit(self, selector, coder), coder);
 }

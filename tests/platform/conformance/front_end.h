@@ -10,7 +10,7 @@ namespace onramp::conformance {
 [[nodiscard]] const Window& window();
 
 /// Clicks the button titled `title` in an alert or a sheet, as a user would, once that button is
-/// visible. Returns at once. Each front end has its own definition.
+/// visible. Returns at once. Each front end defines this function for itself.
 void clickSoon(const std::string& title);
 
 }  // namespace onramp::conformance

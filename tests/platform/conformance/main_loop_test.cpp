@@ -51,7 +51,7 @@ TEST_F(MainLoop, PerformsActionsOfAnyThreadInOrderWhileAModalLoopRuns) {
               ElementsAre("before the loop", "first", "second", "third", "posted by an action"));
 }
 
-TEST_F(MainLoop, EndsAModalLoopBeforeTheWaitingActions) {
+TEST_F(MainLoop, EndsAModalLoopBeforeTheWaitingActionsRun) {
   performOnMainThread([&] {
     noting("takes long")();
     std::thread(abortModal).join();

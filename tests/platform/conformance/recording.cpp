@@ -3,8 +3,8 @@
 #include "tests/platform/conformance/front_end.h"
 #include "tests/recording/front_end.h"
 
-// Only the main-loop tests run on the recording front end. Its timers and alerts do nothing until a
-// test plays the clock and the user, so the other tests do not apply.
+// Only the tests named MainLoop run on the recording front end. Its timers and alerts do nothing
+// until a test plays the clock and the user, so the other tests do not apply.
 
 namespace onramp::conformance {
 

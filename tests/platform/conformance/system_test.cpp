@@ -27,12 +27,12 @@ std::string program(const TemporaryFolder& folder, const std::string& name,
   return path;
 }
 
-TEST(UserLocale, IsTheOneThatCTestSets) {
+TEST(UserLocale, IsTakenFromTheEnvironmentThatCTestSets) {
   EXPECT_EQ(localeLanguageCode() + localeCountryCode(), "zhCN");
   EXPECT_EQ(preferredLanguages().at(0), "zh_CN");
 }
 
-TEST(Folders, AreAbsoluteAndTheUsersIsCreated) {
+TEST(Folders, AreAbsoluteAndTheUsersFolderIsCreated) {
   const std::string user = applicationSupportFolder(FolderDomain::kUser);
   EXPECT_TRUE(fs::is_directory(user)) << user;
   for (const std::string& folder : {user, applicationSupportFolder(FolderDomain::kLocal)})
