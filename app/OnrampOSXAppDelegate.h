@@ -97,8 +97,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// What this function does depends on the page that is shown:
   /// - on the chooser, it searches again;
-  /// - on the connection page, as long as the wizard itself has not started the wireless set-up
-  ///   tool, it shows the chooser when the chooser lists a device, and otherwise starts the tool;
+  /// - on the connection page, while mIsWLANTool is false, it shows the chooser when the chooser
+  ///   lists a device, and otherwise starts the wireless set-up tool;
   /// - in every other case, it shows the chooser and searches.
   void showChooseDeviceView();
 
@@ -107,8 +107,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Set the buttons' titles for a page, and show or hide each button. Every page has Next and
   /// Cancel. The connection page also has Back if the user has chosen a model, and the chooser has
-  /// Back unless the wizard itself has started the set-up tool. These functions neither enable nor
-  /// disable a button.
+  /// Back while mIsWLANTool is false. These functions neither enable nor disable a button.
   void setModelListViewButton();
   void setConnentionTypeViewButton();
   void setChooseDeviceViewButton();
@@ -168,7 +167,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// file's folder if it is missing. Ignores failures.
   [[nodiscard]] static std::string instmodelPlistURL();
 
-  /// Builds and writes the package-options file. Ignores failures.
+  /// Writes the package-options file: the options under "InstallPKG" in the medium description, and
+  /// the five standard options that docs/mastering-a-medium.md describes. Ignores failures.
   static void copyCDInfo();
 
   /// Returns the model file's contents for a device that is connected by a USB or Ethernet cable.
@@ -191,10 +191,14 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// time to open.
   void quitMe();
 
-  /// Hide the application, run the wireless set-up tool and act on its exit status. Both functions
-  /// return before the tool starts. launchWLANToolAutomatically() is called after a search that
-  /// found no device, and launchWLANToolManually() at the user's request. Only a tool that was
-  /// started automatically can send the user back to the connection page.
+  /// Hide the application and return. Half a second later, the wireless set-up tool runs. Its exit
+  /// status decides what follows:
+  /// - 1: the wizard reappears. After an automatic start, it shows the connection page, with the
+  ///   wireless choice selected;
+  /// - 2: the application terminates;
+  /// - any other status, or none: the wizard reappears, shows the chooser and searches.
+  /// launchWLANToolAutomatically() is for a search that found no device, and
+  /// launchWLANToolManually() for the user's request.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 

@@ -45,7 +45,7 @@ class Dictionary {
 
   /// Return the value under `key` if it is of the type that the function is named after. Otherwise
   /// array() returns null, and string() and dictionary() return nothing. The pointer that array()
-  /// returns is valid for as long as one that find() returns.
+  /// returns is valid for as long as a pointer from find().
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;

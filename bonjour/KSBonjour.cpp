@@ -27,8 +27,8 @@ void postResolved(const NetServiceRef& service) {
   post(kResolvedNotification, {{std::string(kServiceInfo), service}});
 }
 
-// Returns the callbacks of all browses and resolves of the process. Every new browser sets them to
-// postAdd, postRemove and postResolved.
+// Returns the callbacks that all browsers of the process share. Each new browser sets them, always
+// to the same three functions.
 ServiceClientCallbacks& clientCallbacks() {
   static ServiceClientCallbacks callbacks;
   return callbacks;
@@ -63,7 +63,7 @@ void KSBonjour::removeKSBonjourObserver(const KSBonjourObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// An observer may remove itself when it is called, so each loop uses a copy of the array.
+// An observer may remove itself when it is called, so each of these loops uses a copy of the array.
 
 void KSBonjour::notifyAddToKSBonjourObserver(const NetServiceRef& service) const {
   for (const auto& observer : std::vector(_aryObserver))
@@ -125,13 +125,13 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   }
   const auto stored = _services->find(*key);
   Entry& entry = stored->second;
-  // The notification may hold an older object for this service than the table does.
+  // The table's object for this service may be newer than the one in the notification.
   const NetServiceRef storedService = entry.service;
   const bool wasValid = std::exchange(entry.isValid, false);
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
-    // Only the first removal after an addition or a resolve lowers the count. So an entry that was
-    // added three times or more survives removals in quick succession. This is intended.
+    // Only the first removal after an addition or a resolve lowers the count. By design, an entry
+    // that was added at least three times therefore survives several removals in quick succession.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {
@@ -154,8 +154,9 @@ std::string KSBonjour::keyForService(const std::string& name, const std::string&
   return name + '.' + type + domain;
 }
 
-// Returns the key under which `service` belongs in this browser's table. Returns nothing when the
-// service is null, lacks a part of the key or is of another type, and when the browser is stopped.
+// Returns the key of `service` in this browser's table. Returns nothing when the service is null,
+// has no name, type or domain, or is of another type than the browser's, and when the browser is
+// stopped.
 std::optional<std::string> KSBonjour::ownKeyOf(const NetServiceRef& service) const {
   if (!service || !_services) return std::nullopt;
   const auto name = service->name();

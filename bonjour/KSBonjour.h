@@ -12,10 +12,10 @@
 
 namespace onramp {
 
-// The notifications that browsers exchange on the default notification centre. They are posted
-// without an object. All carry a NetServiceRef under kServiceInfo. kAddNotification and
-// kRemoveNotification also carry the browse flags, an unsigned long: the first under kAddFlagInfo,
-// the second under kRemoveFlagsInfo.
+// The notifications that all browsers post on the default notification centre, without an object,
+// and observe there. Each carries a NetServiceRef under kServiceInfo. kAddNotification also carries
+// the browse flags, an unsigned long, under kAddFlagInfo; kRemoveNotification carries them under
+// kRemoveFlagsInfo.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
 inline constexpr std::string_view kRemoveNotification = "removeNotificationInternal";
 inline constexpr std::string_view kResolvedNotification = "resolveNotificationInternal";
@@ -24,7 +24,7 @@ inline constexpr std::string_view kAddFlagInfo = "flag";
 inline constexpr std::string_view kRemoveFlagsInfo = "flags";
 
 /// Receives the events of a browser. A running browser also forwards the events of all other
-/// browsers, so the services may be of any type.
+/// browsers, so a service may be of another type than the browser's.
 class KSBonjourObserver {
  public:
   KSBonjourObserver() = default;
@@ -34,21 +34,22 @@ class KSBonjourObserver {
 
   /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service is reported gone, after the browser's table has been updated. A service
-  /// that was added more than once may still be in the table. `service` is the table's object, or
-  /// null when the table did not contain the service.
+  /// Called when a service is reported gone, after the browser's table has been updated. If the
+  /// service was added more than once, it may still be in the table. `service` is the object that
+  /// was in the table, or null when the table did not contain the service.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
   /// Called when a service's addresses and TXT record are known, after the browser's table has been
   /// updated.
   virtual void resolvedBonjourService(const NetServiceRef& service) = 0;
 };
 
-/// Browses for services of one type, resolves each service found and keeps a table of them. A
-/// service that is reported several times has one entry, which counts the reports. All functions
+/// Browses for services of one type, resolves each service that it finds, and keeps these services
+/// in a table. A service that is found several times has one entry, with a count. All functions
 /// must be called on the main thread.
 class KSBonjour {
  public:
-  /// Creates an idle browser for `type`. A browser without a type never starts to browse.
+  /// Creates an idle browser for `type`. If `type` is nothing, startBrowsing() only stops the
+  /// browser.
   [[nodiscard]] static std::shared_ptr<KSBonjour> initWithType(std::optional<std::string> type);
 
   KSBonjour(const KSBonjour&) = delete;
@@ -57,31 +58,30 @@ class KSBonjour {
 
   [[nodiscard]] const std::optional<std::string>& type() const { return _type; }
 
-  /// Observers are retained and called in the order in which they were added. They may remove
-  /// themselves or destroy the browser.
+  /// The browser keeps its observers alive and calls them in the order in which they were added.
+  /// When called, an observer may remove itself or destroy the browser.
   void addKSBonjourObserver(std::shared_ptr<KSBonjourObserver> observer);
   void removeKSBonjourObserver(const KSBonjourObserver* observer);
 
-  // Each calls the corresponding function of every observer.
+  // Each of these functions calls the corresponding function of every observer.
   void notifyAddToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyRemoveToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyResolvedToKSBonjourObserver(const NetServiceRef& service) const;
 
-  /// Starts browsing with an empty table. Stops first if the browser is running. When the browse
-  /// cannot start, the browser finds nothing itself but still forwards the events of other
-  /// browsers.
+  /// Starts to browse all configured domains, with an empty table. Stops first if the browser is
+  /// running. If the browse cannot start, the browser still forwards the events of other browsers.
   void startBrowsing();
 
   /// Ends the browse and forgets the table, without calling observers. Does nothing when the
   /// browser is idle.
   void stopBrowsing();
 
-  // Handlers of the three notifications.
+  // The handlers of the three notifications.
   void addKSNetService(const Notification& notification);
   void removeKSNetService(const Notification& notification);
   void resolvedKSNetService(const Notification& notification);
 
-  /// The table's key for a service, such as "Office Printer._ipp._tcp.local.".
+  /// Returns the table's key for a service, such as "Office Printer._ipp._tcp.local.".
   [[nodiscard]] static std::string keyForService(const std::string& name, const std::string& type,
                                                  const std::string& domain);
 
@@ -99,7 +99,7 @@ class KSBonjour {
  private:
   struct Entry {
     NetServiceRef service;
-    int referenceCount = 0;    ///< additions, less the removals that counted
+    int referenceCount = 0;    ///< additions, less those removals that lower the count
     bool didResolved = false;  ///< whether the service has been resolved since its last addition
     bool isValid = true;       ///< false from a removal until the next addition or resolve
   };

@@ -69,11 +69,11 @@ void KSBonjourSearch::startBrowsing() {
   _aryKSBonjour.push_back(browser);
 }
 
-// Stopped browsers stay in the array. They have no table, so no service is found in them.
+// Stopped browsers stay in the array, where they do no harm because they have no table.
 void KSBonjourSearch::stopBrowsing() {
   NotificationCenter::defaultCenter().removeObserver(this);
-  // The browsers may hold the last references to this object, so `self` keeps the object alive
-  // until this function returns.
+  // The browsers may hold the last references to this search, so `self` keeps it alive until this
+  // function returns.
   const auto self = weak_from_this().lock();
   for (const auto& browser : _aryKSBonjour) {
     browser->stopBrowsing();
@@ -102,8 +102,7 @@ void KSBonjourSearch::resolvedBonjourService(const NetServiceRef& service) {
     return b->isServiceContained(id.name, id.type, id.domain) &&
            b->didServiceResolved(id.name, id.type, id.domain);
   });
-  // The browser that reports the service has already stored it as resolved, so this is usually an
-  // update.
+  // The browser has already stored the service as resolved, so `known` is nearly always true.
   if (known) {
     notifyUpdateToKSDeviceObserver(record);
   } else {

@@ -10,7 +10,7 @@
 
 namespace onramp {
 
-/// Receives the devices of a search, each as a KSDevice record.
+/// Receives the devices that a search finds, each as a record made by KSDevice.
 class KSDeviceObserver {
  public:
   KSDeviceObserver() = default;
@@ -18,19 +18,20 @@ class KSDeviceObserver {
   KSDeviceObserver& operator=(const KSDeviceObserver&) = delete;
   virtual ~KSDeviceObserver() = default;
 
-  /// Called when a device that is in no browser's table is resolved.
+  /// Called when a device is resolved and no browser's table contains it.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device that is in a browser's table is resolved, and when a device is reported
-  /// gone but is still in a browser's table. The search usually reports a new device by this
-  /// function, so an observer must add a device that it does not know.
+  /// Called when a device is resolved or reported gone while a browser's table contains it. A
+  /// browser stores a resolved service before it reports the service. So the search reports even a
+  /// new device by this function, and an observer must add any device that it does not know.
   virtual void updateKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is gone from the tables of all browsers.
+  /// Called when a device is reported gone and no browser's table contains it any longer.
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
-/// Searches the network for devices of the medium's service type and reports each device when it is
-/// resolved. A running search and its browsers keep each other alive, so stopBrowsing() must be
-/// called before the search can be destroyed. All functions must be called on the main thread.
+/// Searches the network for devices that offer the medium's service type. Reports each device when
+/// its service is resolved and when it is reported gone. Ignores services that lack a name, type or
+/// domain. A running search and its browser keep each other alive, so the owner must call
+/// stopBrowsing() before it drops its reference. All functions must be called on the main thread.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:
@@ -40,25 +41,25 @@ class KSBonjourSearch final : public KSBonjourObserver,
   KSBonjourSearch& operator=(const KSBonjourSearch&) = delete;
   ~KSBonjourSearch() override;
 
-  /// Observers are retained and called in the order in which they were added. They may remove
-  /// themselves or destroy the search.
+  /// The search keeps its observers alive and calls them in the order in which they were added.
+  /// When called, an observer may remove itself or destroy the search.
   void addKSDeviceObserver(std::shared_ptr<KSDeviceObserver> observer);
   void removeKSDeviceObserver(const KSDeviceObserver* observer);
 
-  // Each calls the corresponding function of every observer.
+  // Each of these functions calls the corresponding function of every observer.
   void notifyAddToKSDeviceObserver(const Dictionary& device) const;
   void notifyUpdateToKSDeviceObserver(const Dictionary& device) const;
   void notifyRemoveToKSDeviceObserver(const Dictionary& device) const;
 
-  /// Stops the running search, if there is one, then searches for the service type that the medium
-  /// names.
+  /// Stops the running search, if there is one. Then searches for the service type that the medium
+  /// names, or for nothing when the medium names none.
   void startBrowsing();
 
-  /// Ends the search without calling observers.
+  /// Ends the search without calling observers. Does nothing when no search is running.
   void stopBrowsing();
 
-  /// Returns the type of each browser whose table has a service with this name and domain, in the
-  /// order of the browsers. Returns no types when an argument is nothing.
+  /// Returns the types, as strings, of all browsers whose tables have a service with this name and
+  /// domain. Returns an empty array when an argument is nothing.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

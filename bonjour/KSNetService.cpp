@@ -10,9 +10,8 @@ namespace onramp {
 
 namespace {
 
-// The offsets of the address family and of an IPv4 address, and the number of the family, in the
-// socket addresses that NetService::addressing() returns. These have the BSD layout on every
-// system.
+// NetService::addressing() returns socket addresses in the BSD layout on every system. These are
+// the offsets of the address family and of an IPv4 address, and the number of the IPv4 family.
 constexpr std::size_t kFamilyOffset = 1;
 constexpr std::size_t kIPv4Offset = 4;
 constexpr std::size_t kIPv4Size = 4;

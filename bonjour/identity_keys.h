@@ -6,11 +6,11 @@
 
 namespace onramp {
 
-/// The service types whose TXT records name the device's maker and model.
+/// The service types whose TXT keys for the device's maker and model are known.
 inline constexpr std::array<std::string_view, 4> kIdentifyingTypes{
     "_pdl-datastream._tcp.", "_printer._tcp.", "_ipp._tcp.", "_scanner._tcp."};
 
-/// The keys of the maker and of the model in a service's TXT record.
+/// The keys under which a service's TXT record holds the device's maker and model.
 struct IdentityKeys {
   std::string_view manufacturer;
   std::string_view model;

@@ -7,9 +7,9 @@
 
 namespace onramp {
 
-/// Returns the resolved service's IPv6 addresses as texts, in the order of
-/// NetService::addressing(). Returns an empty list when the service has none or is null. The wizard
-/// itself uses IPv4 addresses only.
+/// Returns the IPv6 addresses of `service` as texts, in the order of NetService::addressing().
+/// Returns an empty list when the service is null, unresolved or has no IPv6 address. Only
+/// onramp-devices uses this function; the wizard uses IPv4 addresses.
 [[nodiscard]] std::vector<std::string> ipv6AddressesOf(const NetServiceRef& service);
 
 }  // namespace onramp

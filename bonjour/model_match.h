@@ -7,11 +7,11 @@
 
 namespace onramp {
 
-/// Returns the name that the medium uses for the model of a device record: the USB manufacturer and
-/// the USB model, joined by one space even if either is empty.
+/// Returns the model name of a device as the medium spells it: the record's USB manufacturer and
+/// USB model, joined by one space even if either is empty.
 [[nodiscard]] std::string modelTextOf(const Dictionary& device);
 
-/// Whether the result of modelTextOf() for the device is exactly equal to one of `models`.
+/// Returns whether `models` contains exactly the text that modelTextOf() returns for the device.
 [[nodiscard]] bool isOneOf(const std::vector<std::string>& models, const Dictionary& device);
 
 }  // namespace onramp

@@ -12,14 +12,13 @@ namespace onramp {
 /// The attributes of a DNS-SD TXT record (RFC 6763 section 6).
 class TxtRecord {
  public:
-  /// Parses the record's data in wire format: a sequence of strings, each preceded by a length
-  /// byte. Returns nothing when a string runs past the end of the data. Skips strings without a
-  /// key.
+  /// Parses a record's data in wire format: a sequence of strings, each preceded by a length byte.
+  /// Skips strings without a key. Returns nothing when a string runs past the end of the data.
   [[nodiscard]] static std::optional<TxtRecord> parse(std::span<const std::byte> data);
 
-  /// Returns the value of the first attribute called `key`, ignoring the case of the letters A to
-  /// Z. The value may contain zero bytes. Returns nothing when there is no such attribute, or when
-  /// the first one has no "=".
+  /// Returns the value of the first attribute whose key is `key`, where the letters A to Z may be
+  /// in either case. The value may contain zero bytes. Returns nothing when no attribute has the
+  /// key, or when the first that has it lacks a "=".
   [[nodiscard]] std::optional<std::string> value(std::string_view key) const;
 
  private:

@@ -1,5 +1,5 @@
-# Sets ONRAMP_BACKENDS to the backends that the wizard is linked with, one for each part of the seam (the
-# headers in platform/).
+# Sets ONRAMP_BACKENDS to the backends with which the wizard is linked. Together they implement those
+# headers in platform/ that the wizard uses.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)

@@ -1,4 +1,4 @@
-# Read by cpack once for each kind of package.
+# cpack reads this file once for each kind of package.
 if(CPACK_GENERATOR STREQUAL "TGZ")
   set(CPACK_PACKAGE_FILE_NAME ${CPACK_ONRAMP_KIT})
   set(CPACK_PACKAGING_INSTALL_PREFIX /)

@@ -1,5 +1,5 @@
-# Finds GNUstep, which stands in for Cocoa on Linux, and defines the target GNUstep::AppKit. Makes clang
-# the Objective-C++ compiler, because Debian's g++ 12 rejects `for (x in y)`.
+# Finds GNUstep, which replaces Cocoa on Linux, and defines the target GNUstep::AppKit. Makes clang
+# the compiler for Objective-C++, because Debian's g++ 12 rejects `for (x in y)`.
 
 find_program(ONRAMP_GNUSTEP_CONFIG gnustep-config REQUIRED)
 find_program(CMAKE_OBJCXX_COMPILER NAMES clang++ clang++-14 REQUIRED)
@@ -8,11 +8,14 @@ set(CMAKE_OBJCXX_STANDARD 20)
 set(CMAKE_OBJCXX_STANDARD_REQUIRED ON)
 set(CMAKE_OBJCXX_EXTENSIONS OFF)
 
+# gnustep_flags(VARIABLE KIND) sets VARIABLE to the list of flags that gnustep-config prints for the
+# option KIND.
 function(gnustep_flags variable kind)
   execute_process(COMMAND ${ONRAMP_GNUSTEP_CONFIG} ${kind} OUTPUT_VARIABLE flags
     OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
   separate_arguments(flags NATIVE_COMMAND "${flags}")
-  # Removes flags that CMake sets itself, and suppresses warnings in GNUstep's headers.
+  # The first command removes flags that CMake sets itself. The second suppresses warnings in
+  # GNUstep's headers.
   list(FILTER flags EXCLUDE REGEX "^(-M.*|-Wall|-Wno-import|-g|-O2|-shared-libgcc|-I\\.)$")
   list(TRANSFORM flags REPLACE "^-I" "-isystem")
   set(${variable} ${flags} PARENT_SCOPE)

@@ -1,8 +1,8 @@
-# Installs what a maker needs: the application, the companions, an example medium and the documents.
-# Then cpack makes a Debian package and a media kit, which is a tarball that needs no installation.
+# Installs the application, the companions, an example medium and the documents. From these files,
+# cpack makes a Debian package and the media kit, a tarball that can be used without installation.
 #
-# LIBDIR/onramp holds the runnable example medium, with the application, and the scripts of tools/. A
-# command in BINDIR that is a script is a link to the script there.
+# LIBDIR/onramp holds the example medium with the application on it, and scripts from tools/. The
+# commands in BINDIR that are scripts are links to these scripts.
 
 set(ONRAMP_ZSH_COMPLETIONS ${CMAKE_INSTALL_DATADIR}/zsh/site-functions CACHE STRING
   "Where zsh looks for completions; on Debian it is share/zsh/vendor-completions for packages")
@@ -16,8 +16,8 @@ set(packaging ${PROJECT_SOURCE_DIR}/packaging)
 set(generated ${PROJECT_BINARY_DIR}/packaging)
 file(MAKE_DIRECTORY ${generated})
 
-# install_compressed(FILE FOLDER): installs FILE with the ending ".gz". The same FILE always gives the
-# same bytes.
+# install_compressed(FILE FOLDER) compresses FILE and installs the result, whose name ends in ".gz",
+# in FOLDER. The same FILE always gives the same bytes.
 function(install_compressed file folder)
   get_filename_component(name ${file} NAME)
   set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${file})
@@ -41,7 +41,8 @@ foreach(modules IN ITEMS onscreen practice_network tours)
 endforeach()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/examples/medium DESTINATION ${home} USE_SOURCE_PERMISSIONS)
 install(FILES ${PROJECT_SOURCE_DIR}/examples/practice-network.toml DESTINATION ${home}/examples)
-# The practice network reads this file, so that its devices answer as the maker's devices do.
+# The practice network reads the maker's settings, so that its devices answer as the maker's devices
+# do.
 install(FILES ${ONRAMP_MAKER} RENAME maker.json DESTINATION ${home})
 
 foreach(tool IN ITEMS check devices)
@@ -59,7 +60,7 @@ install(FILES ${PROJECT_SOURCE_DIR}/resources/Onramp.png RENAME onramp.png
 install(FILES ${PROJECT_SOURCE_DIR}/resources/art/icon.svg RENAME onramp.svg
   DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps)
 
-# The metadata and the changelog get their date from SOURCE_DATE_EPOCH if it is set.
+# string(TIMESTAMP) uses the time in the environment variable SOURCE_DATE_EPOCH if it is set.
 string(TIMESTAMP day "%Y-%m-%d" UTC)
 string(TIMESTAMP moment "%a, %d %b %Y %H:%M:%S +0000" UTC)
 configure_file(${packaging}/onramp.metainfo.xml.in ${generated}/example.onramp.preview.metainfo.xml @ONLY)
@@ -92,7 +93,7 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_DEBIAN_PACKAGE_DEPENDS "python3:any (>= 3.11), xdg-utils")
 set(CPACK_DEBIAN_PACKAGE_RECOMMENDS avahi-daemon)
-# The practice network, and the tour on a virtual display, say which of these packages are missing.
+# Only the practice network and the tour need these packages.
 set(CPACK_DEBIAN_PACKAGE_SUGGESTS "at-spi2-core, dbus, gir1.2-atspi-2.0, imagemagick, iproute2, openbox, python3-dbus, python3-gi, snmpd, x11-utils, xdotool, xvfb")
 set(CPACK_PACKAGE_DESCRIPTION "A maker of printers and scanners puts the wizard Onramp on its installation
 medium. The wizard lets a user choose the model, the connection and, on a

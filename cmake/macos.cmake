@@ -1,5 +1,5 @@
-# Builds the application for macOS, assembles a medium with it in ONRAMP_MEDIUM, and makes a disc image
-# of that medium.
+# Builds the application for macOS. The target medium assembles a medium with the application in
+# ONRAMP_MEDIUM. The target dmg makes a disc image of that medium.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_application "${ONRAMP_MEDIUM}/Onramp OSX.app")
@@ -10,8 +10,8 @@ set_target_properties(onramp PROPERTIES
   MACOSX_BUNDLE_INFO_PLIST ${PROJECT_BINARY_DIR}/Info.plist
   RUNTIME_OUTPUT_DIRECTORY ${ONRAMP_MEDIUM})
 
-# onramp_resource(FILE [FOLDER]): puts FILE into the bundle's Resources folder, or into its subfolder
-# FOLDER.
+# onramp_resource(FILE [FOLDER]) puts FILE into the folder Resources of the application's bundle, or
+# into the subfolder FOLDER of Resources.
 function(onramp_resource file)
   target_sources(onramp PRIVATE ${file})
   set_source_files_properties(${file} PROPERTIES MACOSX_PACKAGE_LOCATION "Resources/${ARGV1}")
@@ -42,8 +42,8 @@ foreach(interface IN LISTS interfaces)
   onramp_resource(${compiled})
 endforeach()
 
-# Old folders are removed first, so that files deleted from the example medium do not stay. The bundle
-# is signed last, because a later change would invalidate the signature.
+# The old folders are removed first, because they may have files that the example medium no longer
+# has. The bundle is signed last, because a later change would make the signature invalid.
 add_custom_target(medium ALL
   COMMAND ${CMAKE_COMMAND} -E rm -rf ${ONRAMP_MEDIUM}/MacResources ${ONRAMP_MEDIUM}/Packages
     ${ONRAMP_MEDIUM}/Utilities

@@ -9,15 +9,16 @@ endif()
 set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${ONRAMP_MAKER})
 file(READ ${ONRAMP_MAKER} onramp_maker)
 
-# onramp_maker_check(KEY VALUE FORM EXAMPLE): fails unless VALUE matches the regular expression FORM.
+# onramp_maker_check(KEY VALUE FORM EXAMPLE) ends the configuration with a message if VALUE, the
+# value of KEY, does not match the regular expression FORM. The message shows EXAMPLE.
 function(onramp_maker_check key value form example)
   if(NOT value MATCHES "${form}")
     message(FATAL_ERROR "${ONRAMP_MAKER}: \"${key}\" is missing or malformed. It must look like ${example}.")
   endif()
 endfunction()
 
-# onramp_maker_setting(VARIABLE KEY FORM EXAMPLE): sets VARIABLE to the value of KEY, which must match
-# FORM.
+# onramp_maker_setting(VARIABLE KEY FORM EXAMPLE) sets VARIABLE to the value of KEY, and checks the
+# value with onramp_maker_check().
 function(onramp_maker_setting variable key form example)
   string(JSON value ERROR_VARIABLE problem GET "${onramp_maker}" ${key})
   if(problem)
@@ -33,8 +34,8 @@ if(NOT onramp_kind STREQUAL "OBJECT")
     "${PROJECT_SOURCE_DIR}/maker.json shows the form.")
 endif()
 
-# The values become C++ string literals and XML texts, so no form allows quotation marks, backslashes,
-# angle brackets or line breaks.
+# The values become C++ string literals and XML texts. So no FORM of a text allows
+# quotation marks, backslashes, angle brackets or line breaks.
 set(plain "^[^\"\\<>\n\r]+$")
 onramp_maker_setting(ONRAMP_MAKER_NAME name "${plain}" "\"Kestrel Imaging\"")
 onramp_maker_setting(ONRAMP_BUNDLE_NAME bundleName "${plain}" "\"Onramp OSX\"")

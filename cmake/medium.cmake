@@ -1,5 +1,5 @@
-# Assembles a medium that the application can run from, in ONRAMP_MEDIUM: the example medium's files
-# and the application's bundle. Installs the bundle into the installed example medium.
+# The target medium assembles a medium in ONRAMP_MEDIUM from the example medium's files and the
+# application's bundle. The installed example medium gets the bundle, too.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
@@ -18,7 +18,8 @@ foreach(folder IN LISTS onramp_languages)
     ${onramp_contents}/Resources/${language})
 endforeach()
 
-# Old folders are removed first, so that files deleted from the example medium do not stay.
+# The old folders are removed first, because they may have files that the example medium no longer
+# has.
 add_custom_target(medium ALL
   COMMAND ${CMAKE_COMMAND} -E rm -rf ${ONRAMP_MEDIUM}/MacResources ${ONRAMP_MEDIUM}/Packages
     ${ONRAMP_MEDIUM}/Utilities ${onramp_contents}/Resources

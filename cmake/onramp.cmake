@@ -1,15 +1,17 @@
-# Common compiler options, and a function for each kind of target.
+# Compiler options for all targets, and functions that add libraries, backends and tests.
 
 add_library(onramp_options INTERFACE)
 target_include_directories(onramp_options INTERFACE ${PROJECT_SOURCE_DIR})
 target_compile_options(onramp_options INTERFACE
   -Wall -Wextra -Wpedantic -Wconversion -Wshadow -Werror
-  # GCC 12 mistakes string concatenation in the standard library for an overlapping copy.
+  # GCC 12 wrongly warns that string concatenation in the standard library copies overlapping
+  # memory.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
-  # macOS deprecates its C functions for network services and for its own version, but has no newer ones.
+  # macOS deprecates its C functions for network services and for the system's version, but has no
+  # newer C functions.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
-# These options are global, so that every object file is instrumented, including code from
+# These options are global, so that every object file is instrumented, and with it the code from
 # third-party headers.
 if(ONRAMP_SANITIZE)
   add_compile_options(-fsanitize=${ONRAMP_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
@@ -19,8 +21,8 @@ if(ONRAMP_FUZZ)
   add_compile_options(-fsanitize=fuzzer-no-link)
 endif()
 
-# onramp_library(NAME SOURCES… [LINK libraries…]): a room's static library. Its files are compiled one
-# by one even in unity builds, so that a program needs backends only for the files that it uses.
+# onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room. Its files are
+# not joined in unity builds. So a program needs only the backends for those files that it uses.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
@@ -30,16 +32,18 @@ function(onramp_library name)
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 
-# onramp_backend(NAME SOURCES… [LINK libraries…]): an implementation of the seam or of a part of it. It
-# is an object library: the rooms' libraries need its symbols but follow it on the linker's command
-# line, and the linker would take nothing from a static library that precedes them.
+# onramp_backend(NAME SOURCES… [LINK libraries…]) adds a backend, which implements a part of the
+# seam. A backend is an object library, because it precedes the rooms' libraries on the linker's
+# command line. From a static library in that place, the linker would not take the symbols that the
+# rooms need.
 function(onramp_backend name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 
-# onramp_test(NAME SOURCES… [LINK libraries…]): a GoogleTest program, run by ctest as one test.
+# onramp_test(NAME SOURCES… [LINK libraries…]) adds a GoogleTest program, which ctest runs as one
+# test.
 function(onramp_test name)
   if(NOT ONRAMP_TESTS)
     return()
@@ -51,9 +55,9 @@ function(onramp_test name)
   set_tests_properties(${name} PROPERTIES TIMEOUT 300)
 endfunction()
 
-# onramp_namespace_test(NAME …): as onramp_test, but the test runs as root in a new network namespace
-# and is skipped where none can be created. ctest runs the test through tests/in_namespace, which CMake
-# calls an emulator.
+# onramp_namespace_test(NAME …) does what onramp_test does, but the test runs as root in a new
+# network namespace. It is skipped where no namespace can be created. ctest starts the test through
+# tests/in_namespace, which CMake's property for emulators names.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})
@@ -63,9 +67,9 @@ function(onramp_namespace_test name)
   endif()
 endfunction()
 
-# onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]): a libFuzzer program. ctest runs it
-# briefly on the seeds in the folder corpus/NAME, or corpus/CORPUS, beside its source. New inputs go to
-# the build folder.
+# onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]) adds a libFuzzer program. ctest runs
+# the program briefly, with seeds from the folder corpus/NAME beside its source, or from
+# corpus/CORPUS. New inputs are stored in the build folder.
 function(onramp_fuzz name)
   if(NOT ONRAMP_FUZZ)
     return()

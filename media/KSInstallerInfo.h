@@ -38,7 +38,8 @@ class KSInstallerInfo {
   void loadWLANToolURL(const std::optional<Dictionary>& common);
 
   /// The package to open, which may not exist. Nothing when the medium resource dictionary could
-  /// not be read, or when its "PkgInfo" gives no folder or no package name for the running system.
+  /// not be read, or when its "PkgInfo" is missing or gives no folder or no package name for the
+  /// running system.
   [[nodiscard]] const std::optional<FileURL>& pkgURL() const { return mPkgURL; }
 
   /// The path of the set-up tool's application bundle, which may not exist. When the medium

@@ -21,7 +21,7 @@ inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< b
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
 /// Returns the model information of the medium that the wizard is on: the dictionary in the file
-/// that "ModelInfo" names. Returns nothing when this file cannot be read.
+/// that "ModelInfo" names. Returns nothing when there is no such dictionary.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 
 /// Returns the record of the model `name` according to the medium's model information.

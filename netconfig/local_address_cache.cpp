@@ -33,7 +33,7 @@ void AddNetworkInterfaceListChangeCallbackSCF() {
                                                            kSCCompAnyRegex, kSCEntNetIPv4)) {
     setNotificationKeys(store, {}, {*pattern});
   }
-  // The source may be null. Adding it then does nothing.
+  // After an earlier failure, the source is null, and adding it does nothing.
   addSourceToMainLoop(createRunLoopSource(store, 0));
 }
 

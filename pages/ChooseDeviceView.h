@@ -88,7 +88,7 @@ class ChooseDeviceView final : public Page,
   [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
 
   /// Whether the device answers that it is using its wireless interface; false when the record has
-  /// no addresses. Blocks for about 12 seconds for each address that does not answer.
+  /// no addresses. Blocks for about 12 seconds for each address from which nothing comes back.
   [[nodiscard]] static bool doesWiFi(const Dictionary& device);
 
   /// Adds the device's entry to the list, replacing an equal entry if there is one. The entry that

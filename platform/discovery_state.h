@@ -24,8 +24,8 @@ struct ServiceSighting {
   std::string type;       ///< as NetService::type()
   std::string domain;     ///< as NetService::domain()
   std::string interface;  ///< the network interface's name, or its number if the interface is gone
-  bool isIPv6 = false;    ///< seen by IPv6; otherwise by IPv4
-  bool isGone = false;
+  bool isIPv6 = false;    ///< true for a sighting by IPv6, false for one by IPv4
+  bool isGone = false;    ///< true when the service is no longer seen there
 };
 
 /// Sets the function that is called on the main thread for each sighting in any search. Replaces

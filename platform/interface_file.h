@@ -51,7 +51,8 @@ class Interface {
   [[nodiscard]] std::string viewClass() const;
 
   /// Returns the object that the file calls `name`, or an empty handle when no object of the
-  /// handle's kind has that name.
+  /// handle's kind has that name. On macOS, finds no menus and no menu items, and only the window
+  /// called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

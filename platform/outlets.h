@@ -80,6 +80,7 @@ class TextField : public View {
   static constexpr OutletKind kKind = OutletKind::kTextField;
   using View::View;
 
+  /// Shows `text` as it is, even if it looks like markup.
   void setStringValue(const std::string& text) const;
 };
 
@@ -97,8 +98,10 @@ class RadioMatrix : public Control {
   static constexpr OutletKind kKind = OutletKind::kRadioMatrix;
   using Control::Control;
 
+  /// Sets the title of the button in this place, counted from 0. Does nothing when there is no such
+  /// button.
   void setTitle(int row, int column, const std::string& title) const;
-  /// Selects the button in this place and deselects all others.
+  /// Selects the button in this place, which must exist, and deselects all others.
   void selectCell(int row, int column) const;
 
   /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty.
@@ -136,6 +139,7 @@ class ProgressIndicator : public View {
   static constexpr OutletKind kKind = OutletKind::kProgressIndicator;
   using View::View;
 
+  /// Start and stop the spinner's turning.
   void startAnimation() const;
   void stopAnimation() const;
 };
@@ -152,8 +156,10 @@ class TableView : public Control {
   /// only once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 
+  /// Set whether the user may move columns, and whether the user may select a column by its header.
   void setAllowsColumnReordering(bool allows) const;
   void setAllowsColumnSelection(bool allows) const;
+  /// Shows `title` above a column. Does nothing when the table has no such column.
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
   /// Does nothing in a front end whose tables never accept edits.
   void setColumnEditable(std::string_view identifier, bool editable) const;

@@ -8,9 +8,9 @@ namespace onramp {
 
 namespace {
 
-// Reads one arc. Each byte holds seven bits of the arc, and the first byte holds the most
-// significant ones. All bytes but the last have the top bit set. Returns nothing when the arc does
-// not fit in 16 bits or its last byte is missing.
+// Reads one arc. Each byte holds seven bits of the arc, the most significant bits first. All bytes
+// but the last have the top bit set. Returns nothing when the arc does not fit in 16 bits or its
+// last byte is missing.
 std::optional<std::uint16_t> next_arc(ByteReader& content) {
   std::uint32_t arc = 0;
   while (const auto byte = content.byte()) {

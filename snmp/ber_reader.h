@@ -9,11 +9,12 @@
 
 namespace onramp {
 
-// Functions that read one part of a BER encoding (X.690 section 8, as restricted by RFC 1157). Each
-// moves the reader past that part and returns SNMP_OK. Each returns SNMP_ERR_CODEC for malformed or
-// missing bytes and for what it refuses; the reader may then stand anywhere in the part.
+// Each of these functions reads one part of a BER encoding (X.690 section 8, as restricted by RFC
+// 1157). On success, the function moves `in` past that part and returns SNMP_OK. To refuse the
+// input, it returns SNMP_ERR_CODEC. `in` may then stand anywhere in the part. Every function
+// refuses malformed and missing bytes.
 
-/// Reads a tag of one byte. Refuses a longer tag without moving the reader.
+/// Reads a tag of one byte. Refuses a longer tag without moving `in`.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
   constexpr std::uint8_t kHighTagNumber = 0x1F;
   ByteReader ahead = in;
@@ -41,7 +42,7 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads an integer of `length` bytes, 1 to 4, as an unsigned number. Refuses any other length.
+/// Reads an integer of `length` bytes as an unsigned number. Refuses a length other than 1 to 4.
 [[nodiscard]] inline snmp_status ber_get_uint(ByteReader& in, std::uint64_t& value,
                                               std::uint16_t length) {
   if (length < 1 || length > 4) return SNMP_ERR_CODEC;
@@ -51,9 +52,9 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads an integer of `length` bytes, 1 to 4. Refuses any other length. An integer of one or two
-/// bytes is sign-extended to 64 bits, and an integer of three bytes to 32 bits. An integer of four
-/// bytes is not extended. In every case the low 32 bits hold the signed value.
+/// Reads an integer of `length` bytes as a signed number. Refuses a length other than 1 to 4. Only
+/// the low 32 bits of `value` are sure to hold the number: one or two bytes are sign-extended to 64
+/// bits, three bytes to 32 bits, and four bytes not at all.
 [[nodiscard]] inline snmp_status ber_get_int(ByteReader& in, std::int64_t& value,
                                              std::uint16_t length) {
   std::uint64_t bits = 0;
@@ -66,22 +67,24 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads an object identifier of `length` content bytes into `target`. On entry `target->count` is
-/// the number of arcs that fit; on return it is the number of arcs read, which is 0 when `length`
-/// is 0. The first byte alone gives the first two arcs: the byte divided by 40, and the remainder.
+/// Reads an object identifier of `length` content bytes into `target`. On entry, `target->count` is
+/// the number of arcs that fit. On return, it is the number of arcs read, which is 0 when `length`
+/// is 0. The first byte encodes the first two arcs: the byte divided by 40, and the remainder.
 /// Refuses a null target, more arcs than fit, an arc above 65,535, and content that ends inside an
 /// arc. A refusal leaves `count` unchanged, but some arcs may have been stored.
 [[nodiscard]] snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length);
 
-/// Reads a string of `length` bytes and copies it to `target`. Refuses a string longer than
-/// `target->capacity`, and a string that is not empty when `target` is null.
+/// Reads a string of `length` bytes, copies it to `target->bytes` and sets `target->length`.
+/// Refuses a string longer than `target->capacity`. If `target` is null, refuses every string but
+/// the empty one.
 [[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
-// No part of the program uses the next function. It completes this set of functions.
+// The program does not use ber_get_octets_ref(), which is here for completeness.
 
-/// Like ber_get_octets, but makes `target->bytes` point into the input instead of copying. Strings
-/// of any length fit. `capacity` becomes 0, because the input must not be written to. An empty
-/// string changes nothing but `length`.
+/// Reads a string of `length` bytes and makes `target->bytes` point to it in the input, which must
+/// outlive `target`. Sets `target->capacity` to 0, because the input must not be written to. For an
+/// empty string, changes only `target->length`. If `target` is null, refuses every string but the
+/// empty one.
 [[nodiscard]] snmp_status ber_get_octets_ref(ByteReader& in, snmp_octets* target,
                                              std::uint16_t length);
 

@@ -9,8 +9,9 @@
 
 namespace onramp {
 
-/// Writes from a buffer's end towards its start and never outside the buffer. An element's content
-/// is written before its header, so the content's length is known when the header is written.
+/// Writes bytes into a buffer, from the buffer's end towards its start. Because an element's
+/// content is written before its header, the content's length is known when the header is written.
+/// The buffer must outlive the writer.
 class ber_writer {
  public:
   explicit ber_writer(std::span<std::uint8_t> room) : room_(room), left_(room.size()) {}
@@ -18,7 +19,7 @@ class ber_writer {
   /// The number of bytes written so far.
   [[nodiscard]] std::size_t size() const { return room_.size() - left_; }
 
-  /// Puts one byte in front of those written so far. Returns SNMP_ERR_CODEC, and writes nothing,
+  /// Puts `byte` in front of the bytes written so far. Returns SNMP_ERR_CODEC, and writes nothing,
   /// when the buffer is full.
   [[nodiscard]] snmp_status put(std::uint8_t byte) {
     if (left_ == 0) return SNMP_ERR_CODEC;
@@ -26,7 +27,7 @@ class ber_writer {
     return SNMP_OK;
   }
 
-  /// Puts `bytes` in front of those written so far. Returns SNMP_ERR_CODEC, and writes nothing,
+  /// Puts `bytes` in front of the bytes written so far. Returns SNMP_ERR_CODEC, and writes nothing,
   /// when the buffer has too little room.
   [[nodiscard]] snmp_status put(std::span<const std::uint8_t> bytes);
 
@@ -35,13 +36,13 @@ class ber_writer {
   std::size_t left_;
 };
 
-// Functions that write one part of a BER encoding (X.690 section 8). Each puts that part in front
-// of the bytes written so far and returns SNMP_OK. Each returns SNMP_ERR_CODEC when the buffer has
-// too little room or the value cannot be encoded; some bytes of the part may then have been
-// written.
+// Each of these functions puts one part of a BER encoding (X.690 section 8) in front of the bytes
+// written so far and returns SNMP_OK. When the buffer has too little room, and to refuse a value
+// that cannot be encoded, the function returns SNMP_ERR_CODEC. Some bytes of the part may then have
+// been written.
 
-/// Puts a length field of one, two or three bytes (short form, 0x81, 0x82). Refuses a length above
-/// 65,535.
+/// Puts a length field of one, two or three bytes: the short form, or the long form that starts
+/// with 0x81 or 0x82. Refuses a length above 65,535.
 [[nodiscard]] inline snmp_status ber_put_length(ber_writer& out, std::size_t length) {
   if (length > UINT16_MAX || out.put(static_cast<std::uint8_t>(length))) return SNMP_ERR_CODEC;
   if (length < 0x80) return SNMP_OK;
@@ -65,20 +66,21 @@ class ber_writer {
   return ber_put_octets(out, std::span<const std::uint8_t>(octets.bytes, octets.length), tag);
 }
 
-/// Puts the low 32 bits of `value` as a signed number in as few bytes as possible, 1 to 4. If this
-/// number is negative, replaces `value` by what ber_get_uint reads from those bytes: -1 becomes
-/// 255.
+/// Puts the low 32 bits of `value` as a signed number in as few bytes as possible, 1 to 4. If the
+/// number is negative, also sets `value` to the number that ber_get_uint() would read from these
+/// bytes. For example, -1 becomes 255.
 [[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag);
 [[nodiscard]] snmp_status ber_put_int(ber_writer& out, std::int64_t& value, std::uint8_t tag);
 
-/// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks. A
-/// number of 2^31 or more takes 5 bytes, of which the first is zero. Without the zero byte, such a
-/// number would be negative, because the content is encoded like that of an INTEGER (RFC 1155
-/// section 6, X.690 section 8.3).
+/// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks, in as
+/// few bytes as possible, 1 to 5. These types are encoded like an INTEGER, which is signed (RFC
+/// 1155 section 6, X.690 section 8.3). So a zero byte comes first whenever the next byte has its
+/// top bit set.
 [[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
-/// Puts an object identifier. Refuses an identifier with fewer than two arcs, one whose content is
-/// longer than 255 bytes, and one for which 40 times the first arc plus the second is above 255.
+/// Puts an object identifier. Refuses an identifier with fewer than two arcs or with more than 255
+/// bytes of content. Also refuses an identifier in which 40 times the first arc plus the second
+/// exceeds 255.
 [[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
 [[nodiscard]] snmp_status ber_put_null(ber_writer& out);

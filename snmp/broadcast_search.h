@@ -5,17 +5,17 @@
 
 namespace onramp {
 
-/// Sends a request for the objects of `table` to the first broadcast address of every local IPv4
-/// interface, one interface at a time. Leaves out interfaces without a broadcast address, and the
-/// interface whose first address is 127.0.0.1. Returns the results of all valid replies in order of
-/// arrival, at most 256 per interface. Each result is a dictionary like that of snmp_query_table. A
-/// device that replies twice has two results, because neither the request identifier nor the sender
-/// of a reply is checked. An interface on which nothing can be sent has no results. No part of the
-/// program calls this function.
+/// Broadcasts a request for the objects of `table` on each local IPv4 interface in turn, to the
+/// interface's first broadcast address. Skips an interface that lacks an address or a broadcast
+/// address, and one whose first address is 127.0.0.1. Returns the dictionaries that
+/// snmp_table_request::result() makes from valid replies without an error status, in order of
+/// arrival, at most 256 for each interface. A device that replies twice has two dictionaries,
+/// because neither a reply's request identifier nor its sender is checked. A failure to send is not
+/// reported; the interface then has no results. The program does not call this function.
 ///
-/// Blocks for up to 2 seconds per interface to send, then for 5 to 8 seconds to receive, or until
-/// 256 attempts to receive a datagram have been made. Returns an empty array at once when no
-/// interface remains, or when the interfaces cannot be read.
+/// For each interface, blocks for up to 2 seconds to send, and then for 5 to 8 seconds to receive.
+/// Receiving ends sooner after 256 attempts. Returns an empty array at once when all interfaces are
+/// skipped or the list of interfaces cannot be read.
 [[nodiscard]] Array snmp_broadcast_search(mib_table& table);
 
 }  // namespace onramp

@@ -40,7 +40,8 @@ snmp_status get_community(ByteReader& in, snmp_message& message) {
   return SNMP_OK;
 }
 
-// `earlier` is the total size of the reply's strings before this one. All strings share one buffer.
+// Appends the string to the buffer that all strings of the reply share. `earlier` is the total size
+// of the strings before it, and is increased by `length`.
 snmp_status get_string(ByteReader& in, snmp_octets* target, std::uint16_t length,
                        std::size_t& earlier) {
   if (target) {

@@ -58,7 +58,7 @@ snmp_status put_pdu(ber_writer& out, snmp_message& message) {
 
 }  // namespace
 
-// Encodes the message from its end to its start; see ber_writer.
+// The message is encoded from its end to its start, as ber_writer requires.
 snmp_status snmp_encode_message(snmp_message& message, std::span<std::uint8_t> out_buffer,
                                 std::uint16_t& out_length) {
   if (message.varbind_count > message.varbinds.size()) return SNMP_ERR_CODEC;

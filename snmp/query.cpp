@@ -21,9 +21,9 @@ std::array<mib_entry, 1> active_if_entries = {
 
 constexpr std::array<mib_value_handler, 1> kActiveIFHandlers = {{{kActiveIFKey, decode_active_if}}};
 
-// Compares as many bytes as the storage of the entry's name has arcs. An arc takes two bytes, so
-// only the first half of the name is compared. A reply is decoded into the table's own names, so
-// the result is always true for a reply.
+// Compares only the first half of the two names: `capacity` is a number of arcs but is used here as
+// a number of bytes, and an arc takes two bytes. The names in a reply always match, because a reply
+// is decoded into the table's own names.
 bool names_match(const snmp_oid& entry, const snmp_oid& name) {
   return name.capacity >= entry.capacity && std::memcmp(entry.arcs, name.arcs, entry.capacity) == 0;
 }
@@ -116,7 +116,7 @@ bool snmp_active_interface_is_wireless(const Array& addresses) {
 bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask) {
   std::int64_t active_interface = 0;
   for (const Value& address : addresses) {
-    bool no_reply = false;  // never cleared, so one unanswered request costs all three attempts
+    bool no_reply = false;  // stays true, so one unanswered request costs all three attempts
     for (int attempt = 0; attempt < kAttemptsPerAddress; ++attempt) {
       const auto* const text = address.as<std::string>();
       const auto result = ask_twice([&] { return ask(text ? text->c_str() : nullptr, no_reply); });

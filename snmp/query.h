@@ -14,18 +14,19 @@
 
 namespace onramp {
 
-/// One object to ask for.
+/// One object to ask for. `expected_type` is not checked; the handler decides whether to accept the
+/// type of the value that comes.
 struct mib_entry {
   std::uint64_t expected_type = kTagInteger;
   snmp_oid oid;  ///< the name asked for; the reply's name is decoded into the same storage
 };
 
-/// Stores the value of a reply's binding in `result` under `name`. Returns 0, or another number to
-/// refuse the value. The last argument is always 0.
+/// Stores the value of a reply's binding in `result` under `name` and returns 0. To refuse the
+/// value, returns another number. The last argument is always 0.
 using mib_decode = snmp_status (*)(Dictionary& result, const char* name,
                                    const snmp_varbind& binding, std::uint64_t reserved);
 
-/// Tells how to store the value of the mib_entry that has the same index in the table.
+/// Says how to store the value of one mib_entry. Both have the same index in their arrays.
 struct mib_value_handler {
   const char* name = nullptr;   ///< the value's key in the result
   mib_decode decode = nullptr;  ///< null when the value is not stored
@@ -38,15 +39,15 @@ struct mib_table {
   const mib_value_handler* handlers = nullptr;
 };
 
-/// Keys of a result in addition to those of its table's handlers.
+/// The two keys that every result has. The other keys are names of the table's handlers.
 constexpr const char* kConnectionKey = "Connection";  ///< string, always "Network"
 constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's address
 
 constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
 /// The table that asks for kActiveIFObject. The name in each reply overwrites the name in this
-/// table, and later requests ask for the new name. After a reply with a shorter name, only names of
-/// at most that length fit.
+/// table, and later requests ask for the new name. After a reply with a shorter name, the table has
+/// room only for names of at most that length.
 extern mib_table active_interface_table;
 
 /// Stores an INTEGER under `name` as a 32-bit number and returns 0. Returns 1 for a value of any
@@ -54,8 +55,8 @@ extern mib_table active_interface_table;
 [[nodiscard]] snmp_status decode_active_if(Dictionary& dictionary, const char* name,
                                            const snmp_varbind& binding, std::uint64_t reserved);
 
-/// A get request for the objects of a table, with the storage for its replies. The table must
-/// outlive the request.
+/// A get request for the objects of a table, with storage for the reply. The table must outlive the
+/// request.
 class snmp_table_request {
  public:
   explicit snmp_table_request(mib_table& table);
@@ -63,16 +64,16 @@ class snmp_table_request {
   snmp_table_request& operator=(const snmp_table_request&) = delete;
   ~snmp_table_request() = default;
 
-  /// The message to send, and to decode the reply into. The caller sets its `request_id`.
+  /// The message to send. The reply is decoded into the same message. The caller sets `request_id`.
   [[nodiscard]] snmp_message& message() { return message_; }
 
-  /// Forgets the previous reply's values, so that another reply can be decoded into the message.
+  /// Prepares the message for decoding another reply. Forgets the values of the previous one.
   void clear_values();
 
-  /// Returns the values that the handlers store from the reply in the message, plus kConnectionKey
-  /// and, under kIPAddressKey, `address`. If a handler refuses a value, all values stored before it
-  /// are dropped. Returns nothing when the value of the last entry is refused, and when the table
-  /// has no entries.
+  /// Returns the values that the handlers accept from the reply in the message. Adds
+  /// kConnectionKey, and `address` under kIPAddressKey. If a handler refuses a value, the values
+  /// stored before it are dropped. Returns nothing when the value of the last entry is refused, and
+  /// when the table has no entries.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
  private:
@@ -84,39 +85,42 @@ class snmp_table_request {
 };
 
 /// Asks the device at `address`, a dotted IPv4 text, for the objects of `table`. Returns nothing
-/// when `table` or `address` is null, when the reply has an error status, when
-/// snmp_table_request::result() returns nothing for the reply, and when no valid reply comes.
-/// `out_no_reply` is set to true in the last case only and is never cleared. A reply's error status
-/// and index are stored in the last two arguments, which may be null. Blocks as snmp_exchange does.
+/// when `table` or `address` is null, when the request fails, when the reply has an error status,
+/// and when snmp_table_request::result() returns nothing for the reply. A request fails when it
+/// cannot be sent or gets no valid reply; only then is `out_no_reply` set to true. It is never set
+/// to false. The error status and index of a reply are stored in the last two arguments, each of
+/// which may be null. Blocks as snmp_exchange() does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
                                                          std::int32_t* out_error_index);
 
-/// Does what snmp_query_table does, but asks a second time when the first request gives no result.
+/// Does what snmp_query_table() does, and asks a second time when the first request gives no
+/// result.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table_retry(mib_table* table,
                                                                const char* address,
                                                                bool& out_no_reply,
                                                                std::int32_t* out_error_status,
                                                                std::int32_t* out_error_index);
 
-/// Returns whether the device with these addresses, which are strings, reports that it is using its
-/// wireless interface. Tries the addresses in order. The first address that answers every request
-/// decides the result. An address that leaves a request unanswered is tried three times, 20 ms
-/// apart, with up to two requests per try. If no address decides, the last try of the last address
-/// does. A try without a result counts as the value 0 of ActiveIF, and so does an empty array of
-/// addresses.
+/// Returns whether a device reports that it is using its wireless interface. `addresses` holds the
+/// device's addresses as strings, which are tried in order. A try makes one request, and a second
+/// one if the first gives no result. The first address that answers every request of its first try
+/// decides the result. Any other address is tried three times, with a pause of 20 ms after each
+/// try. If no address decides, the last try of the last address does. A try without a result counts
+/// as the value 0 of ActiveIF. Returns false when there are no addresses.
 ///
-/// Blocks for about 12 seconds for an address from which nothing comes back, not even a refusal.
+/// Blocks for about 12 seconds for each address from which nothing comes back, not even the host's
+/// report that no program uses the port.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
 /// Makes one request to the device at `address`, which is null when the entry in the array of
-/// addresses is not a string. Returns what snmp_query_table returns, and sets `no_reply` when that
-/// function sets `out_no_reply`.
+/// addresses is not a string. Returns the result of snmp_query_table(), and sets `no_reply` to true
+/// when that function sets `out_no_reply`.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
-/// Does what the other function of this name does, but makes its requests through `ask`, so that a
-/// caller can record them.
+/// Does what snmp_active_interface_is_wireless() above does, but makes each request by calling
+/// `ask`. So a caller can record the requests.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);
 
 }  // namespace onramp

@@ -24,14 +24,15 @@ constexpr std::uint64_t kPduGetNext = 1;
 constexpr std::uint64_t kPduResponse = 2;
 constexpr std::uint64_t kPduSet = 3;
 
-/// An object identifier in the caller's storage. Arcs above 65,535 cannot be represented.
+/// An object identifier, whose arcs are in the caller's storage. Arcs above 65,535 cannot be
+/// represented.
 struct snmp_oid {
-  std::uint16_t count = 0;     ///< arcs in use; on entry to a decoder, how many arcs fit
+  std::uint16_t count = 0;     ///< the number of arcs in use; before decoding, the number that fit
   std::uint16_t capacity = 0;  ///< size of the storage, in arcs
   std::uint16_t* arcs = nullptr;
 };
 
-/// A byte string in the caller's storage, which starts at `bytes` and has `capacity` bytes.
+/// A byte string in the caller's storage, which starts at `bytes` and is `capacity` bytes long.
 struct snmp_octets {
   std::uint16_t length = 0;
   std::uint16_t capacity = 0;
@@ -41,19 +42,19 @@ struct snmp_octets {
 /// One variable binding. Only the value field that belongs to `type` is used.
 struct snmp_varbind {
   std::uint64_t type = kTagNull;
-  snmp_oid* name = nullptr;             ///< a reply's name is decoded into this same record
+  snmp_oid* name = nullptr;             ///< the name to ask for; a reply's name replaces it
   std::int64_t int_value = 0;           ///< for types 1, 2 and 65 to 67; the low 32 bits are used
   snmp_octets* octets_value = nullptr;  ///< for types 4, 64 and 68
   snmp_oid* oid_value = nullptr;        ///< for type 6
   std::uint16_t encoded_length = 0;     ///< set by the encoder: size of name and value together
-  std::uint32_t index = 0;              ///< set by the decoder: position in the reply, from 0
+  std::uint32_t index = 0;  ///< set by the decoder: position in the reply, from 0; see snmp_set()
 };
 
 /// One SNMPv1 message (RFC 1157 section 4). It owns none of the memory that it points to.
 struct snmp_message {
   std::uint64_t version = 0;
   std::uint16_t community_length = 0;
-  const char* community = nullptr;  ///< points into the reply after decoding
+  const char* community = nullptr;  ///< not zero-terminated; after decoding, points into the reply
   std::uint64_t pdu_type = kPduGet;
   std::uint64_t request_id = 0;
   std::uint64_t error_status = 0;
@@ -63,13 +64,13 @@ struct snmp_message {
 };
 
 /// Makes `message` an SNMPv1 request with the community kCommunity of snmp/protocol.h. Sets
-/// `varbind_count` and gives that many bindings the type NULL, or all bindings when the array has
-/// fewer. `request_id` and `pdu_type` are unchanged.
+/// `varbind_count`, and gives the type NULL to that many bindings, or to all if the array has
+/// fewer. Leaves `request_id` and `pdu_type` unchanged.
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
 /// Compares two object identifiers arc by arc. At the first difference, returns -1 when the arc of
 /// `first` is less, and 1 when it is greater. Without a difference, returns -1 when `first` is
-/// shorter, and 0 otherwise, even when `second` is shorter. No part of the program uses this
+/// shorter. Otherwise returns 0, even when `second` is shorter. The program does not use this
 /// function.
 [[nodiscard]] int snmp_oid_compare(const snmp_oid& first, const snmp_oid& second);
 

@@ -8,7 +8,7 @@ using snmp_status = unsigned;
 
 constexpr snmp_status SNMP_OK = 0;
 constexpr snmp_status SNMP_ERR_TRANSPORT =
-    1;  ///< no socket, message or address, or another request's reply
+    1;  ///< no socket, no message, no usable address, or a reply to another request
 constexpr snmp_status SNMP_ERR_CODEC = 5;  ///< malformed or missing data, or too little room
 
 }  // namespace onramp

@@ -12,42 +12,45 @@
 
 namespace onramp {
 
-/// The maximum size of a reply datagram, and of all strings in one reply together.
+/// The largest size of a reply datagram in bytes. All strings of a reply together have this limit,
+/// too.
 constexpr std::uint16_t kReplySize = 1500;
 
-/// A buffer for one encoded message, slightly larger than kReplySize.
+/// A buffer for one encoded message.
 using snmp_packet = std::array<std::uint8_t, 1536>;
 
-/// The longest wait until a request can be sent, and until its reply arrives.
+/// The longest waits: until a request can be sent, and until its reply arrives.
 constexpr std::chrono::seconds kSendWait{2};
 constexpr std::chrono::seconds kReceiveWait{2};
 
-/// Modes of snmp_exchange. Every mode other than kModeNoNetwork works like kModeNetwork.
+/// Modes of snmp_exchange(). Every mode other than kModeNoNetwork works like kModeNetwork.
 constexpr std::uint32_t kModeNetwork = 4;
 constexpr std::uint32_t kModeNoNetwork = 6;
 
-/// The next request identifiers: the first is used by snmp_next_request_id, the second by snmp_get
-/// and snmp_set. Neither is locked, so requests must be made from one thread at a time.
+/// The identifiers of the next requests. snmp_next_request_id() uses the first counter; snmp_get()
+/// and snmp_set() use the second. Neither counter is locked, so only one thread at a time may make
+/// requests.
 extern std::int32_t snmp_request_counter;
 extern std::int64_t snmp_request_counter_ext;
 
 /// Returns snmp_request_counter, for use as a message's `request_id`, and increases it by 1.
 [[nodiscard]] std::uint64_t snmp_next_request_id();
 
-/// Replaces each dot-separated part of `text` by the decimal number that the part starts with, or
-/// by 0. This removes leading zeros, which would mark a part as octal. Returns nothing for a null
-/// or empty text, and when the result is longer than 31 characters.
+/// Returns `text` with each of its dot-separated parts replaced by the decimal number at the start
+/// of the part, or by 0 if there is none. This removes leading zeros, which would mark a part as
+/// octal. Returns nothing for a null or empty text, and when the result would be longer than 31
+/// characters.
 [[nodiscard]] std::optional<std::string> snmp_normalize_ipv4(const char* text);
 
-/// Returns the endpoint of the SNMP agent at `address`, a dotted IPv4 text. Any other text gives
-/// the address 255.255.255.255.
+/// Returns the endpoint of the SNMP agent at `address`, a dotted IPv4 text. For any other text, the
+/// endpoint's address is 255.255.255.255.
 [[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
 
 /// Sends `message` to the SNMP port of `address`, a dotted IPv4 text, and decodes the reply into
-/// `message`. Sends nothing if `address` is null or any other text. Blocks for at most kSendWait
-/// plus kReceiveWait; the wait ends at once when the host refuses the request. `message.community`
-/// keeps its value, because the reply's community does not outlive the call. The reply's identifier
-/// is stored in `message.request_id` and is not checked.
+/// `message`. Sends nothing if `address` is null or not an IPv4 address. Blocks for at most
+/// kSendWait plus kReceiveWait. The wait ends early when the host reports that no program uses the
+/// port. `message.community` keeps its value, because the reply's community does not outlive the
+/// call. The reply's identifier is stored in `message.request_id` but not checked.
 ///
 /// Returns SNMP_OK for a valid reply, SNMP_ERR_CODEC when the message cannot be encoded and when no
 /// valid reply comes in time, and SNMP_ERR_TRANSPORT when no socket can be opened. With
@@ -55,9 +58,10 @@ extern std::int64_t snmp_request_counter_ext;
 [[nodiscard]] snmp_status snmp_exchange(snmp_message& message, const char* address,
                                         std::uint32_t mode);
 
-/// Normalizes `address` by snmp_normalize_ipv4() and makes one exchange with the next identifier of
-/// snmp_request_counter. Returns SNMP_ERR_TRANSPORT for a null message, for an address that cannot
-/// be normalized, and for a reply to another request. Otherwise returns what snmp_exchange returns.
+/// Normalizes `address` with snmp_normalize_ipv4(), sets the request identifier with
+/// snmp_next_request_id() and makes one exchange. Returns SNMP_ERR_TRANSPORT for a null message,
+/// for an address that cannot be normalized, and for a reply whose identifier differs. Otherwise
+/// returns the status of snmp_exchange().
 [[nodiscard]] snmp_status snmp_request_to_address(snmp_message* message, const char* address);
 
 }  // namespace onramp

@@ -6,14 +6,16 @@
 
 namespace onramp {
 
-/// Returns how many columns a UTF-8 text takes on a terminal.
+/// Returns the number of columns that the UTF-8 text `text` takes on a terminal.
 [[nodiscard]] std::size_t columnsOf(std::string_view text);
 
-/// Returns `text` in exactly `columns` columns: padded with spaces, or cut and ended with "…".
+/// Returns `text`, in UTF-8, in exactly `columns` columns. A shorter text is padded with spaces. A
+/// longer one is cut and ends with "…".
 [[nodiscard]] std::string fitted(std::string_view text, std::size_t columns);
 
 /// Returns `text` broken at spaces into lines of at most `width` columns. Each line starts with
-/// `indent` spaces and ends with a line feed. A longer word gets its own line.
+/// `indent` spaces, which count as columns, and ends with a line feed. A word that is too wide gets
+/// its own line.
 [[nodiscard]] std::string wrapped(std::string_view text, std::size_t width, std::size_t indent);
 
 }  // namespace onramp

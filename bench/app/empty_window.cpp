@@ -1,5 +1,4 @@
-// Shows an empty window of the wizard's size, which is the least that a program with a window can
-// do.
+// Shows an empty window of the wizard's size, with which start_up.py compares the wizard.
 
 #include <QApplication>
 #include <QMainWindow>

@@ -1,4 +1,5 @@
-// Shows the wizard's first page, written directly with Qt: title, text, list, menu and buttons.
+// Shows a page like the wizard's first page, written directly with Qt: title, text, list, menu and
+// buttons.
 
 #include <QApplication>
 #include <QLabel>
@@ -15,7 +16,7 @@ namespace {
 
 constexpr int kModels = 100;
 
-// The result has no owner here, because Qt deletes a child together with its parent.
+// Returns an object without an owner. Qt deletes the object together with its parent.
 template <typename Child, typename... Arguments>
 Child* make(Arguments&&... arguments) {
   return std::make_unique<Child>(std::forward<Arguments>(arguments)...).release();

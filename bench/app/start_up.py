@@ -1,70 +1,84 @@
 #!/usr/bin/python3
 """Compares the start-up of the wizard, an empty window and the wizard's first page in plain Qt.
 
-Usage: start_up.py [BUILD]
-
-BUILD is the folder of a release build (default: build/release).
+Each time is from the start of a program until something is drawn, on media of 10 to 10,000 models.
+The memory is the peak shortly afterwards.
 """
 
 import pathlib
-import statistics
 import subprocess
 import sys
 import tempfile
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
-sys.path[:0] = [str(ROOT / "tools"), str(ROOT / "tests/window")]
+sys.dont_write_bytecode = True
+sys.path[:0] = [str(ROOT / "bench"), str(ROOT / "tools"), str(ROOT / "tests/window")]
 
 import media  # noqa: E402
 from onscreen.desktop import Desktop  # noqa: E402
+from report.cases import Case, Report, parser, require  # noqa: E402
 
-ROUNDS = 15
+ROUNDS, QUICK_ROUNDS = 15, 7
+COUNTS = (10, 100, 1000, 10000)
+EMPTY, PLAIN = "empty Qt window", "the page in plain Qt"
+TIME, MEMORY = "Time from start to first page", "Peak memory at the first page"
 
 
 def measure(build, env, program):
+    """Returns a start's time in seconds and its peak memory in MiB."""
     line = subprocess.run([build / "bench/app/time_to_window", program], env=env, check=True,
                           stdout=subprocess.PIPE, text=True).stdout
     milliseconds, kibibytes = line.split()
-    return float(milliseconds), int(kibibytes) / 1024
+    return float(milliseconds) / 1000, int(kibibytes) / 1024
 
 
 def medium_with(folder, count):
-    """Returns the wizard on a medium whose last model differs, so that the wizard must read all."""
+    """Makes a medium of `count` models and returns its wizard. The last model differs from the
+    others, so that the wizard has to read all of them to choose the first page."""
     models = {f"Kestrel Model {i:05}": media.model(usb=True, wired=i + 1 < count, wireless=True)
               for i in range(count)}
     medium = media.make(pathlib.Path(folder) / str(count), ROOT / "build/medium", models)
     return medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
 
 
-def main():
-    build = pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/release").resolve()
+def run_all(build, rounds):
+    """Returns the times and the memories of each program, by the program's name."""
     with Desktop(window_manager=False) as desktop, tempfile.TemporaryDirectory() as folder:
         env = desktop.env | {"LANG": "en_US.UTF-8"}
         del env["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"]
-        programs = {"empty window": build / "bench/app/empty_window",
-                    "plain page": build / "bench/app/plain_page",
-                    "100 models": medium_with(folder, 100),
-                    "1,000 models": medium_with(folder, 1000),
-                    "5,000 models": medium_with(folder, 5000)}
+        programs = {EMPTY: build / "bench/app/empty_window", PLAIN: build / "bench/app/plain_page"}
+        programs |= {count: medium_with(folder, count) for count in COUNTS}
         runs = {name: [] for name in programs}
-        for round_ in range(ROUNDS + 1):
+        for round_ in range(rounds + 1):
             for name, program in programs.items():
                 result = measure(build, env, program)
-                if round_ > 0:  # the first round fills the file cache
+                if round_ > 0:  # the first round only fills the file cache
                     runs[name].append(result)
-    (empty_time, empty_memory), (plain_time, plain_memory) = (
-        [statistics.median(column) for column in zip(*runs[name])]
-        for name in ("empty window", "plain page"))
-    hundred_time = statistics.median(r[0] for r in runs["100 models"])
-    print(f"medians of {ROUNDS} rounds; noise is the spread of the middle half")
-    for name, results in runs.items():
-        times = sorted(r[0] for r in results)
-        time, memory = statistics.median(times), statistics.median(r[1] for r in results)
-        noise = (times[-len(times) // 4] - times[len(times) // 4]) / time
-        print(f"{name:13} {time:7.1f} ms (noise {noise:4.0%})  {time / empty_time:5.2f} × empty  "
-              f"{time / plain_time:5.2f} × plain  {time / hundred_time:5.2f} × 100 models   "
-              f"peak {memory:6.1f} MiB ({memory - empty_memory:+.1f} beside empty, "
-              f"{memory - plain_memory:+.1f} beside plain)")
+    return {name: list(zip(*results)) for name, results in runs.items()}
 
 
-main()
+def main():
+    arguments = parser(__doc__)
+    arguments.add_argument("--build", type=pathlib.Path, default=ROOT / "build/release")
+    options = arguments.parse_args()
+    build = options.build.resolve()
+    helpers = ("time_to_window", "empty_window", "plain_page")
+    require([*(build / "bench/app" / name for name in helpers),
+             ROOT / "build/medium/Onramp OSX.app"],
+            "build it: cmake --preset release && cmake --build --preset release")
+    runs = run_all(build, QUICK_ROUNDS if options.quick else ROUNDS)
+    report = Report(options.json)
+    for count in COUNTS:
+        report.add(Case(TIME, f"{count:,} models", EMPTY, "s", runs[count][0], runs[EMPTY][0],
+                        axis="models", size=count))
+    report.add(Case(TIME, "100 models", PLAIN, "s", runs[100][0], runs[PLAIN][0]))
+    report.add(Case(TIME, f"{COUNTS[-1]:,} models", "100 models", "s", runs[COUNTS[-1]][0],
+                    runs[100][0]))
+    for count in COUNTS:
+        report.add(Case(MEMORY, f"{count:,} models", EMPTY, "MiB", runs[count][1], runs[EMPTY][1],
+                        axis="models", size=count))
+    report.add(Case(MEMORY, "100 models", PLAIN, "MiB", runs[100][1], runs[PLAIN][1]))
+
+
+if __name__ == "__main__":
+    main()

@@ -1,41 +1,44 @@
 #!/usr/bin/python3
 """Compares the wizard's discovery with avahi-browse on the same network in the same run.
 
-Usage: discovery_bench.py [BUILD]
-
-BUILD is the folder of a release build (default: build/release).
-
-Measures 1, 20 and 200 services on dual-stack networks with one interface and with two. Each
-measured time is from the start of a program until it prints the line about the last service that it
+Measures 1 to 500 services on dual-stack networks with one interface and with two. Each measured
+time is from the start of a program until it prints the line about the last service that it
 resolves. The warm part has one host, whose Avahi daemon has all services in its cache. The cold
 part has two hosts joined by virtual cables. In that part, the Avahi daemon of the searching host is
-restarted before every search, so that its cache is empty. The warm part ends with the processor
-time of a search that is left idle.
+restarted before every search, so that its cache is empty. The warm part also prints the processor
+time of a search that keeps running after it has found everything.
 """
 
+import argparse
 import pathlib
 import resource
-import statistics
 import subprocess
 import sys
 import tempfile
 import time
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
-sys.path[:0] = [str(ROOT / "tests/bonjour"), str(ROOT / "tools")]
+sys.dont_write_bytecode = True
+sys.path[:0] = [str(ROOT / "bench"), str(ROOT / "tests/bonjour"), str(ROOT / "tools")]
 
 import discovery  # noqa: E402
 from practice_network.control import PracticeNetwork  # noqa: E402
+from report.cases import Case, Report, parser, require  # noqa: E402
 
 TYPE = "_ipp._tcp"
-COUNTS = (1, 20, 200)
-ROUNDS = {"warm": 15, "cold": 5}
 HOSTS = {"warm": 1, "cold": 2}
+COUNTS = {"warm": (1, 20, 200, 500), "cold": (1, 20, 200)}
+ROUNDS = {"warm": 15, "cold": 7}
+INTERFACES = (1, 2)
+QUICK_COUNTS = {"warm": (1, 20, 200), "cold": (20,)}
+QUICK_ROUNDS = {"warm": 9, "cold": 3}
+QUICK_INTERFACES = (1,)
 IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """Returns the time from the start of `command` until it has named `count` services."""
+    """Returns the seconds from the start of `command` until it has named `count` services.
+    `name_of` returns the service that an output line names, or None."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:
@@ -64,7 +67,8 @@ def grow_to(network, count):
         network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
                     model="Model 100")
     network.settle()
-    # New services repeat their announcements for a while, which would fill an empty cache.
+    # For a while, Avahi repeats the announcements of new services. These would fill the empty
+    # cache.
     time.sleep(14 + 0.1 * count)
 
 
@@ -74,27 +78,25 @@ def empty_cache():
     time.sleep(3)
 
 
-def compare(state, interfaces, probe):
+def compare(state, interfaces, probe, quick, report):
     network = PracticeNetwork()
-    for count in COUNTS:
+    for count in (QUICK_COUNTS if quick else COUNTS)[state]:
         grow_to(network, count)
         samples = {peer: [], ours: []}
-        for round_number in range(ROUNDS[state] + 1):
+        for round_number in range((QUICK_ROUNDS if quick else ROUNDS)[state] + 1):
             for program, arguments in ((peer, (count,)), (ours, (count, probe))):
                 if state == "cold":
                     empty_cache()
                 seconds = program(*arguments)
-                if round_number:  # The first round is a warm-up.
+                if round_number:  # The first round is only a warm-up.
                     samples[program].append(seconds)
-        ratios = [one / other for one, other in zip(samples[ours], samples[peer])]
-        low, middle, high = statistics.quantiles(ratios)
-        print(f"{state}, {interfaces} interface(s), {count:3} services: "
-              f"{statistics.median(samples[ours]):.3f} s, avahi-browse "
-              f"{statistics.median(samples[peer]):.3f} s, ratio {middle:.2f} "
-              f"(quartiles {low:.2f} to {high:.2f})", flush=True)
+        report.add(Case(f"Discovery, {'full' if state == 'warm' else 'empty'} cache, {interfaces} "
+                        f"interface{'s' * (interfaces > 1)}", f"{count} service{'s' * (count > 1)}",
+                        "avahi-browse -rp", "s", samples[ours], samples[peer], axis="devices",
+                        size=count))
 
 
-def idle(interfaces, probe):
+def idle(interfaces, probe, report):
     def processor_seconds():
         usage = resource.getrusage(resource.RUSAGE_CHILDREN)
         return usage.ru_utime + usage.ru_stime
@@ -104,12 +106,12 @@ def idle(interfaces, probe):
         search.wait_for("update", "Kestrel 1")
         time.sleep(IDLE_SECONDS)
         search.end()
-        print(f"search of {COUNTS[-1]} services, left idle for {IDLE_SECONDS} s, "
-              f"{interfaces} interface(s): {processor_seconds() - before:.3f} s of processor time, "
-              "including start and discovery", flush=True)
+        report.remark(f"search of {COUNTS['warm'][-1]} services, left idle for {IDLE_SECONDS} s, "
+                      f"{interfaces} interface(s): {processor_seconds() - before:.3f} s of "
+                      "processor time, including start and discovery")
 
 
-def run_inside(state, interfaces, probe):
+def run_inside(state, interfaces, arguments):
     """Starts this program again on a practice network and returns its exit status."""
     with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:
         description.write(f"[network]\ninterfaces = {interfaces}\n")
@@ -117,25 +119,27 @@ def run_inside(state, interfaces, probe):
         return subprocess.run([sys.executable, "-B", discovery.PRACTICE_NETWORK,
                                "--hosts", str(HOSTS[state]), description.name,
                                sys.executable, "-B", __file__, "--inside", state, str(interfaces),
-                               probe], check=False).returncode
+                               *arguments], check=False).returncode
 
 
 def main():
-    match sys.argv[1:]:
-        case ["--inside", state, interfaces, probe]:
-            compare(state, interfaces, probe)
-            if state == "warm":
-                idle(interfaces, probe)
-            return 0
-    build = pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/release").resolve()
-    probe = build / "tests/bonjour/bonjour_probe"
-    if not probe.exists():
-        print(f"{probe} is missing; build it: cmake --preset release && "
-              "cmake --build --preset release --target bonjour_probe", file=sys.stderr)
-        return 2
+    arguments = parser(__doc__)
+    arguments.add_argument("--build", type=pathlib.Path, default=ROOT / "build/release")
+    arguments.add_argument("--inside", nargs=2, help=argparse.SUPPRESS)
+    options = arguments.parse_args()
+    probe = options.build.resolve() / "tests/bonjour/bonjour_probe"
+    require([probe], "build it: cmake --preset release && "
+                     "cmake --build --preset release --target bonjour_probe")
+    if options.inside:
+        state, interfaces = options.inside[0], int(options.inside[1])
+        report = Report(options.json)
+        compare(state, interfaces, probe, options.quick, report)
+        if state == "warm" and not options.json:
+            idle(interfaces, probe, report)
+        return 0
     for state in HOSTS:
-        for interfaces in (1, 2):
-            if status := run_inside(state, interfaces, probe):
+        for interfaces in QUICK_INTERFACES if options.quick else INTERFACES:
+            if status := run_inside(state, interfaces, sys.argv[1:]):
                 return status
     return 0
 

@@ -1,6 +1,7 @@
-// Encodes the request for the SNMP object ActiveIF and decodes the reply, alternating between the
-// wizard's codec and the net-snmp library. Prints the time per message, the ratio of the times, and
-// the allocations per message.
+// Encodes the request for the SNMP object ActiveIF and decodes the reply, in turn with the wizard's
+// codec and with the net-snmp library. Prints the time for each message, the ratio of the times,
+// and the number of allocations for each message. With --json, prints the times as bench/compare
+// reads them.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -21,10 +22,10 @@ long allocations = 0;
 
 }  // namespace
 
-// These functions count the calls of malloc and calloc in this process, including those inside
-// net-snmp.
+// These functions replace malloc and calloc in the whole process, net-snmp included, and count the
+// calls.
 extern "C" {
-// The C library's own names for its allocation functions.
+// The C library's own allocation functions.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
 void* __libc_calloc(std::size_t count, std::size_t size);  // NOLINT(bugprone-reserved-identifier)
 
@@ -136,7 +137,7 @@ void report(const char* what, const Samples& ours, const Samples& peer, double o
 
 }  // namespace
 
-int main() {
+int main(int argc, char** argv) {
   Ours request;
   Ours device;
   Ours answer;
@@ -161,6 +162,11 @@ int main() {
     peerBuild.measure(kMessagesPerRound, [&] { peer.build(); });
     ourParse.measure(kMessagesPerRound, [&] { answer.parse(reply); });
     peerParse.measure(kMessagesPerRound, [&] { peer.parse(reply); });
+  }
+  if (wantsJson(argc, argv)) {
+    printJson("SNMP message", "encoding", "net-snmp's library", ourBuild, peerBuild);
+    printJson("SNMP message", "decoding", "net-snmp's library", ourParse, peerParse);
+    return 0;
   }
   std::printf("Medians of %d rounds of %d messages of %zu bytes [5 %%, 95 %%]\n", kRounds,
               kMessagesPerRound, a.size());

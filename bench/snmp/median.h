@@ -2,12 +2,14 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstdio>
+#include <cstring>
 #include <vector>
 
-/// The times of one operation that is measured repeatedly, in nanoseconds.
+/// The times of an operation, in nanoseconds.
 class Samples {
  public:
-  /// Runs `work` `times` times and keeps the mean time as one sample.
+  /// Runs `work` `times` times, and adds the mean time as one sample.
   template <typename Work>
   void measure(int times, Work work) {
     const auto start = std::chrono::steady_clock::now();
@@ -17,10 +19,20 @@ class Samples {
     samples_.push_back(took.count() / times);
   }
 
+  /// Prints the samples in seconds as a JSON array, in the order in which they were taken.
+  void printJson() const {
+    const char* separator = "[";
+    for (const double sample : samples_) {
+      std::printf("%s%.4g", separator, sample / 1e9);
+      separator = ", ";
+    }
+    std::printf("]");
+  }
+
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the quantile `part`, from 0 (the least sample) to 1 (the greatest), rounded down to a
-  /// sample. There must be at least one sample.
+  /// Returns the sample at the quantile `part`, from 0 (the least sample) to 1 (the greatest).
+  /// Between two samples, returns the lesser one. There must be at least one sample.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());
@@ -30,3 +42,20 @@ class Samples {
  private:
   std::vector<double> samples_;
 };
+
+/// Whether `argv` asks for JSON.
+inline bool wantsJson(int argc, char** argv) {
+  return argc > 1 && std::strcmp(argv[argc - 1], "--json") == 0;
+}
+
+/// Prints a benchmark's samples beside those of a peer as a line of JSON, in the form of
+/// bench/report/cases.py.
+inline void printJson(const char* benchmark, const char* name, const char* peerName,
+                      const Samples& ours, const Samples& peer) {
+  std::printf(R"({"benchmark": "%s", "name": "%s", "peer_name": "%s", "unit": "s", "ours": )",
+              benchmark, name, peerName);
+  ours.printJson();
+  std::printf(R"(, "peer": )");
+  peer.printJson();
+  std::printf("}\n");
+}

@@ -1,5 +1,6 @@
-// Compares a whole query, from the request to the result, with a bare UDP exchange that asks the
-// same agent for the same object. The queries and the bare exchanges alternate.
+// Compares the time of a query, from the request to the result, with the time of a bare UDP
+// exchange that asks the same agent for the same object. Queries and bare exchanges alternate.
+// With --json as the last argument, prints the times as bench/compare reads them.
 
 #include <array>
 #include <cstdio>
@@ -25,7 +26,8 @@ constexpr int kWarmUp = 100;
 }  // namespace
 
 int main(int argc, char** argv) {
-  const std::string address = argc > 1 ? argv[1] : "127.0.1.1";
+  const bool asJson = wantsJson(argc, argv);
+  const std::string address = argc > (asJson ? 2 : 1) ? argv[1] : "127.0.1.1";
   const auto agent = onramp::parseIPv4(address);
   onramp::snmp_table_request request(onramp::active_interface_table);
   onramp::snmp_packet packet{};
@@ -52,6 +54,10 @@ int main(int argc, char** argv) {
         giveUp("the agent does not answer the bare request");
       }
     });
+  }
+  if (asJson) {
+    printJson("SNMP query on loopback", "one device", "the bare exchange", query, bare);
+    return 0;
   }
   const auto microseconds = [](double nanoseconds) { return nanoseconds / 1000; };
   std::printf("Medians of %d on loopback [5 %%, 95 %%]\n", kQueries);

@@ -1,23 +1,25 @@
 #!/usr/bin/python3
-"""Compares the times that onramp-check takes for a medium of 1,000 models and for larger media.
-
-Usage: check_media.py [BUILD]
-
-BUILD is the folder of a release build (default: build/release).
-"""
+"""Compares the times that onramp-check takes for media of 10 to 10,000 models with the time that
+the same number of models would take at the cost of 1,000."""
 
 import pathlib
 import plistlib
 import shutil
-import statistics
 import subprocess
 import sys
 import tempfile
 import time
 
 ROOT = pathlib.Path(__file__).resolve().parents[2]
-ROUNDS = 7
-COUNTS = (1000, 2500, 5000, 10000)
+sys.dont_write_bytecode = True
+sys.path.insert(0, str(ROOT / "bench"))
+
+from report.cases import Case, Report, parser, require  # noqa: E402
+
+ROUNDS, QUICK_ROUNDS = 7, 5
+BASE = 1000
+COUNTS = (10, 100, BASE, 2500, 5000, 10000)
+QUICK_COUNTS = (10, 100, BASE, 10000)
 
 
 def make(folder, count, every_name_differs):
@@ -39,22 +41,29 @@ def seconds(program, medium):
 
 
 def main():
-    build = pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/release").resolve()
-    program = build / "tools/onramp-check"
+    arguments = parser(__doc__)
+    arguments.add_argument("--build", type=pathlib.Path, default=ROOT / "build/release")
+    options = arguments.parse_args()
+    program = options.build.resolve() / "tools/onramp-check"
+    require([program], "build it: cmake --preset release && "
+                       "cmake --build --preset release --target onramp-check")
+    report = Report(options.json)
+    counts, rounds = (QUICK_COUNTS, QUICK_ROUNDS) if options.quick else (COUNTS, ROUNDS)
     with tempfile.TemporaryDirectory() as folder:
         for differs in (False, True):
             media = {count: make(pathlib.Path(folder) / f"{count}-{differs}", count, differs)
-                     for count in COUNTS}
-            times = {count: [] for count in COUNTS}
-            for _ in range(ROUNDS):
+                     for count in counts}
+            times = {count: [] for count in counts}
+            for _ in range(rounds):
                 for count, medium in media.items():
                     times[count].append(seconds(program, medium))
-            print("every name misspelt" if differs else "clean lists")
-            base = statistics.median(times[COUNTS[0]]) / COUNTS[0]
+            kind = "every name misspelt" if differs else "clean lists"
             for count, runs in times.items():
-                median = statistics.median(runs)
-                print(f"{count:6} models {median:7.3f} s (fastest {min(runs):.3f})"
-                      f"  per model {median / count / base:5.2f} × that of {COUNTS[0]}")
+                report.add(Case(f"onramp-check, {kind}", f"{count:,} models",
+                                f"at the cost of {BASE:,}", "s", runs,
+                                [one * count / BASE for one in times[BASE]], axis="models",
+                                size=count))
 
 
-main()
+if __name__ == "__main__":
+    main()

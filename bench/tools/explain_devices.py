@@ -1,14 +1,12 @@
-#!/usr/bin/env python3
-"""Compares onramp-devices with avahi-browse on a large network.
+#!/usr/bin/python3
+"""Compares onramp-devices with avahi-browse on a small and on a large network.
 
-Measures the time until onramp-devices has explained every device. Divides it by the time that
-avahi-browse takes to resolve the same devices plus the time of the slowest SNMP answer. Prints this
-ratio for each round.
-
-    bench/tools/explain_devices.py [--devices 500] [--rounds 5]
+In each round, measures the time until onramp-devices has explained every device, and the time in
+which avahi-browse resolves the same devices. The peer's time is the latter plus the time of the
+slowest SNMP answer.
 """
 
-import argparse
+import os
 import pathlib
 import shutil
 import subprocess
@@ -17,35 +15,49 @@ import tempfile
 import time
 
 SOURCE = pathlib.Path(__file__).resolve().parents[2]
+sys.dont_write_bytecode = True
+sys.path[:0] = [str(SOURCE / "bench"), str(SOURCE / "tools")]
+
+from practice_network import PracticeNetwork  # noqa: E402
+from report.cases import Case, Report, parser, require  # noqa: E402
+
+COUNTS, QUICK_COUNTS = (1, 20, 100, 500), (1, 500)
+ROUNDS, QUICK_ROUNDS = 7, 5
 TYPE = "_pdl-datastream._tcp"
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
-ANSWERING = 50  # the other devices refuse requests, so they need no agent
+ANSWERING = 50  # the other devices have the setting activeif = "closed", so they have no agent
 AGENTS = [f"127.0.5.{number + 1}" for number in range(ANSWERING)]
 
 
-def description(count):
-    lines = []
-    for number in range(count):
+def add_devices(network, numbers):
+    for number in numbers:
         answers = number < ANSWERING
-        addresses = f'["{AGENTS[number]}"]' if answers else '["127.0.6.1"]'
-        lines.append(f'[[device]]\nname = "Device {number}"\nmaker = "Kestrel"\n'
-                     f'model = "Model 100"\naddresses = {addresses}\n'
-                     f'activeif = {1 + number % 2 if answers else chr(34) + "closed" + chr(34)}\n')
-    return "".join(lines)
+        network.add(f"Device {number}", maker="Kestrel", model="Model 100",
+                    addresses=[AGENTS[number] if answers else "127.0.6.1"],
+                    activeif=1 + number % 2 if answers else "closed")
+    network.settle(120)
 
 
 def avahi_seconds(count):
     start = time.perf_counter()
-    output = subprocess.run(["avahi-browse", "-rpt", TYPE], capture_output=True, text=True).stdout
+    process = subprocess.Popen(["avahi-browse", "-rp", TYPE], stdout=subprocess.PIPE,
+                               stderr=subprocess.DEVNULL, text=True)
+    resolved = set()
+    for line in process.stdout:
+        if line.startswith("="):
+            resolved.add(line.split(";")[3])
+        if len(resolved) == count:
+            break
     seconds = time.perf_counter() - start
-    resolved = {line.split(";")[3] for line in output.splitlines() if line.startswith("=")}
+    process.kill()
+    process.wait()
     assert len(resolved) == count, f"avahi-browse resolved {len(resolved)} of {count}"
     return seconds
 
 
-def slowest_answer():
+def slowest_answer(count):
     slowest = 0
-    for address in AGENTS:
+    for address in AGENTS[:count]:
         start = time.perf_counter()
         subprocess.run(["snmpget", "-v1", "-c", "corridor", address, OBJECT], capture_output=True,
                        check=True)
@@ -69,39 +81,50 @@ def explained_seconds(program, medium, count):
     return seconds
 
 
-def measure(program, medium, count, rounds):
-    answer = slowest_answer()
-    avahi_seconds(count)
-    for _ in range(rounds):
-        peer, ours = avahi_seconds(count), explained_seconds(program, medium, count)
-        print(f"{count} devices: avahi-browse {peer:.2f} s, slowest answer {answer:.3f} s, "
-              f"explained {ours:.2f} s: {ours / (peer + answer):.2f} x", flush=True)
+def measure(program, medium, counts, rounds, report):
+    network = PracticeNetwork()
+    there = 0
+    for count in counts:
+        add_devices(network, range(there, count))
+        there = count
+        avahi_seconds(count)
+        answer = slowest_answer(count)
+        ours, peer = [], []
+        for _ in range(rounds):
+            peer.append(avahi_seconds(count) + answer)
+            ours.append(explained_seconds(program, medium, count))
+        report.add(Case("Explanation of every device", f"{count} device{'s' * (count > 1)}",
+                        "avahi-browse and an answer", "s", ours, peer, axis="devices", size=count))
+
+
+def make_medium(folder, build):
+    medium = pathlib.Path(folder, "medium")
+    shutil.copytree(SOURCE / "examples" / "medium", medium)
+    contents = medium / "Onramp OSX.app" / "Contents"
+    contents.mkdir(parents=True)
+    shutil.copy(build / "Info.plist", contents)
+    return medium
 
 
 def main():
-    parser = argparse.ArgumentParser()
-    parser.add_argument("--devices", type=int, default=500)
-    parser.add_argument("--rounds", type=int, default=5)
-    parser.add_argument("--build", default=SOURCE / "build" / "release")
-    parser.add_argument("--inside", help=argparse.SUPPRESS)
-    options = parser.parse_args()
-    build = pathlib.Path(options.build).resolve()
-    if options.inside:
-        measure(str(build / "tools" / "onramp-devices"), options.inside, options.devices,
-                options.rounds)
-        return
+    arguments = parser(__doc__)
+    arguments.add_argument("--devices", type=int, help="only a network of this size")
+    arguments.add_argument("--rounds", type=int)
+    arguments.add_argument("--build", type=pathlib.Path, default=SOURCE / "build/release")
+    options = arguments.parse_args()
+    build = options.build.resolve()
+    program = build / "tools/onramp-devices"
+    require([program, build / "Info.plist"],
+            "build it: cmake --preset release && "
+            "cmake --build --preset release --target onramp-devices")
+    if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
+        os.execv(sys.executable, [sys.executable, str(SOURCE / "tools/practice-network"),
+                                  "/dev/null", sys.executable, *sys.argv])
+    counts, rounds = (QUICK_COUNTS, QUICK_ROUNDS) if options.quick else (COUNTS, ROUNDS)
     with tempfile.TemporaryDirectory() as folder:
-        medium = pathlib.Path(folder, "medium")
-        shutil.copytree(SOURCE / "examples" / "medium", medium)
-        contents = medium / "Onramp OSX.app" / "Contents"
-        contents.mkdir(parents=True)
-        shutil.copy(build / "Info.plist", contents)
-        devices = pathlib.Path(folder, "devices.toml")
-        devices.write_text(description(options.devices))
-        sys.exit(subprocess.run(
-            [SOURCE / "tools" / "practice-network", devices, sys.executable, "-B", __file__,
-             "--devices", str(options.devices), "--rounds", str(options.rounds),
-             "--build", build, "--inside", medium]).returncode)
+        measure(str(program), make_medium(folder, build),
+                (options.devices,) if options.devices else counts, options.rounds or rounds,
+                Report(options.json))
 
 
 if __name__ == "__main__":

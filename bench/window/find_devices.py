@@ -1,42 +1,38 @@
 #!/usr/bin/python3
 """Compares the wizard's search with avahi-browse and snmpget on the same practice network.
 
-Usage: find_devices.py [MEDIUM]
-
-MEDIUM is a built medium (default: build/medium of this source tree).
-
-Measures the time from the key press that starts a search until the list has 1 or 50 wireless
-devices. Compares it with the time that avahi-browse takes to resolve the same devices plus the time
-of one snmpget for each device. Neither time includes the pauses of the wizard's wait.
+The wizard's time is that from the key press that starts a search until the list has all wireless
+devices. The tools' time is the time until avahi-browse has resolved the same devices, plus the time
+of one snmpget for each device. Neither time includes the pauses in which the wizard waits for its
+search. The search ends after its first pause, so a network is left out if a search does not find all
+of its devices.
 """
 
 import os
 import pathlib
-import statistics
 import subprocess
-import sys
 import tempfile
 import time
 
-ROOT = pathlib.Path(__file__).resolve().parents[2]
-sys.path[:0] = [str(ROOT / "tools"), str(ROOT / "tests/window")]
+from chooser import MAKER, MODEL, ROOT, Chooser, enter_network, require_medium
 
-import media  # noqa: E402
-from onscreen import messages  # noqa: E402
-from onscreen.desktop import Desktop  # noqa: E402
-from onscreen.person import Person  # noqa: E402
-from onscreen.processes import start, stop  # noqa: E402
-from practice_network import PracticeNetwork  # noqa: E402
-from practice_network.agents import COMMUNITY, OBJECT  # noqa: E402
+import media
+from onscreen import messages
+from onscreen.desktop import Desktop
+from onscreen.processes import start, stop
+from practice_network import PracticeNetwork
+from practice_network.agents import COMMUNITY, OBJECT
+from report.cases import Case, Report, parser
 
-ROUNDS = 7
-COUNTS = (1, 50)
+COUNTS, QUICK_COUNTS = (1, 10, 50, 100, 200), (1, 50, 100)
+ROUNDS, QUICK_ROUNDS = 9, 5
+PATIENCE = 10  # seconds; a search of a wizard that finds anything ends earlier
 TYPE = "_pdl-datastream._tcp"
-GEAR, GEAR_REFRESH = "Actions", 2
 
 
 def time_of_tools(count):
-    """Returns the time until avahi-browse has resolved the devices and snmpget has asked each."""
+    """Returns the seconds until avahi-browse has resolved `count` devices and snmpget has asked
+    each of them."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
                     stderr=subprocess.DEVNULL, text=True)
@@ -54,58 +50,61 @@ def time_of_tools(count):
     return passed
 
 
-def time_of_wizard(person, text, count):
-    """Returns the time from a refresh, which empties the list, until the list has `count` rows."""
-    person.see_gone("label", text["INST_WAIT"], 60)
-    table = person.see("tree").get_table_iface()
-    person.open_menu(GEAR)
-    person.press(*["Down"] * GEAR_REFRESH)
-    began = time.monotonic()
-    key = subprocess.Popen(["xdotool", "key", "Return"], env=person.desktop.env)
+def time_of_wizard(person, count):
+    """Returns the time from a refresh, which empties the list, until the list has `count` rows.
+
+    Returns None if the search ends with fewer.
+    """
+    person.wait()
+    table = person.table()
+    began = person.refresh()
     emptied = False
     while not emptied or table.get_n_rows() < count:
         emptied = emptied or table.get_n_rows() < count
-        if time.monotonic() - began > 20:
-            raise TimeoutError(f"the list has {table.get_n_rows()} rows instead of {count}")
-    passed = time.monotonic() - began
-    key.wait()
-    return passed
+        if time.monotonic() - began > PATIENCE:
+            return None
+        time.sleep(0.002)  # each look takes some of the wizard's time
+    return time.monotonic() - began
 
 
-def rounds(desktop, medium, text, count):
-    program = medium / "Onramp OSX.app/Contents/Linux/Onramp OSX"
-    times = {"wizard": [], "tools": []}
-    with Person(desktop, program, env={"LANG": "en_US.UTF-8"}) as person:
-        person.see("radio button", text["INST_TXT_WIFI"])
-        person.press("Return")
-        person.see("label", text["INST_TXT_DEVLIST"], 60)
-        for _ in range(ROUNDS):
-            times["wizard"].append(time_of_wizard(person, text, count))
-            times["tools"].append(time_of_tools(count))
+def rounds(desktop, medium, text, count, number):
+    """Returns the times of the wizard and of the tools, or None if a search was incomplete."""
+    times = [], []
+    with Chooser(desktop, medium, text) as person:
+        person.go_there()
+        for _ in range(number):
+            passed = time_of_wizard(person, count)
+            if passed is None:
+                return None
+            times[0].append(passed)
+            times[1].append(time_of_tools(count))
     return times
 
 
-def main(built):
-    network = PracticeNetwork()
-    text = messages.read(built, "en")
+def main():
+    arguments = parser(__doc__)
+    arguments.add_argument("--medium", type=pathlib.Path, default=ROOT / "build/medium")
+    options = arguments.parse_args()
+    built = require_medium(options.medium)
+    enter_network()
+    network, report, text = PracticeNetwork(), Report(options.json), messages.read(built, "en")
+    counts, number = (QUICK_COUNTS, QUICK_ROUNDS) if options.quick else (COUNTS, ROUNDS)
     with Desktop() as desktop, tempfile.TemporaryDirectory() as folder:
         medium = media.make(pathlib.Path(folder) / "medium", built,
-                            {"Kestrel Model 100": media.model(usb=True, wireless=True)})
+                            {f"{MAKER} {MODEL}": media.model(usb=True, wireless=True)})
         there = 0
-        for count in COUNTS:
+        for count in counts:
             for there in range(there + 1, count + 1):
-                network.add(f"Device {there}", maker="Kestrel", model="Model 100")
-            network.settle()
-            times = rounds(desktop, medium, text, count)
-            wizard, tools = (statistics.median(times[who]) for who in ("wizard", "tools"))
-            spread = ", ".join(f"{who} {min(times[who]):.3f} to {max(times[who]):.3f} s"
-                               for who in times)
-            print(f"{count:2} device(s): wizard {wizard:.3f} s, tools {tools:.3f} s, "
-                  f"{wizard / tools:.2f} × the tools ({ROUNDS} rounds: {spread})", flush=True)
+                network.add(f"Device {there}", maker=MAKER, model=MODEL)
+            network.settle(60)
+            times = rounds(desktop, medium, text, count, number)
+            if times is None:
+                report.remark(f"{count} devices: the search ended before all were listed")
+                break
+            report.add(Case("List of wireless devices", f"{count} device{'s' * (count > 1)}",
+                            "avahi-browse -rp and an snmpget each", "s", *times, axis="devices",
+                            size=count))
 
 
 if __name__ == "__main__":
-    if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
-        os.execv(sys.executable, [sys.executable, str(ROOT / "tools/practice-network"), "/dev/null",
-                                  sys.executable, *sys.argv])
-    main(pathlib.Path(sys.argv[1] if len(sys.argv) > 1 else ROOT / "build/medium").resolve())
+    main()

@@ -23,8 +23,8 @@ class Query;
 class Daemon {
  public:
   /// Returns the connection that runs on the main thread's loop, and creates it if there is none.
-  /// The connection exists for as long as a pointer that this function returned. Returns null when
-  /// the system provides no descriptor or thread.
+  /// The callers share the ownership of the connection. Returns null when the system provides no
+  /// descriptor or thread.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 
   /// Creates a connection that runs only inside runUntil(). Returns null when the system provides
@@ -74,7 +74,7 @@ class Daemon {
   EventLoop loop_;
   Timer retry_;
   std::vector<Query*> queries_;
-  std::map<std::string, Query*> listeners_;  ///< by the path of the query's object in the daemon
+  std::map<std::string, Query*> listeners_;  ///< under the path of the query's object
   unsigned losses_ = 0;
   bool isPresent_ = false;    ///< the daemon is on the bus
   bool isConnected_ = false;  ///< `bus_` is set and works

@@ -64,7 +64,7 @@ class Service final : public NetService, public std::enable_shared_from_this<Ser
   bool isScheduled_ = false;
   std::shared_ptr<Daemon> daemon_;  ///< held while a resolve runs
   std::unique_ptr<Resolve> resolve_;
-  // The number of the newest resolve. A late report from an earlier one is ignored.
+  // The number of the newest resolve. A late report from an earlier resolve is ignored.
   unsigned long resolves_ = 0;
 };
 

@@ -59,7 +59,7 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   /// The services that have been found. When one is gone, the client gets the same object again.
   std::map<Instance, NetServiceRef> services_;
   std::shared_ptr<Daemon> daemon_;         ///< held while a search runs
-  std::map<std::string, Browse> browses_;  ///< by domain
+  std::map<std::string, Browse> browses_;  ///< the searches, by domain
   Sightings<std::string> domains_;
   std::unique_ptr<Query> domainQuery_;
 };

@@ -21,7 +21,8 @@ using Node = std::unique_ptr<std::remove_pointer_t<plist_t>, NodeFree>;
 [[nodiscard]] Value valueOf(plist_t node);
 
 /// Converts `value` to a node that XML can express. Characters that XML does not allow become the
-/// replacement character, and dates are limited to the years 1 to 9999.
+/// replacement character. Dates are rounded down to whole seconds and limited to the years 1 to
+/// 9999.
 [[nodiscard]] Node nodeOf(const Value& value);
 
 }  // namespace onramp::libplist

@@ -26,7 +26,8 @@ namespace onramp::netlink {
 namespace {
 
 // A dump is the kernel's list of a whole table. If the table changes during a dump, the kernel
-// marks the dump as interrupted. It is then requested again, up to this number of times.
+// marks the dump as interrupted, and the dump is requested again. This is the maximum number of
+// requests.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;

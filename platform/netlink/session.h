@@ -28,6 +28,7 @@ class Selection {
   [[nodiscard]] static std::optional<Selection> of(const std::vector<std::string>& keys,
                                                    const std::vector<std::string>& patterns);
 
+  /// Returns whether `key` is selected.
   [[nodiscard]] bool has(const std::string& key) const;
 
   /// Returns whether the global IPv4 entity is selected.

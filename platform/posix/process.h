@@ -10,7 +10,7 @@ namespace onramp {
 
 enum class Session {
   kOwn,     ///< a new session: the started program survives the end of the caller's terminal
-  kShared,  ///< the caller's session: the started program ends with the terminal
+  kShared,  ///< the caller's session: the started program may end with the terminal
 };
 
 /// Starts the program at `executable` with no signal blocked or ignored. Returns the ID of the new

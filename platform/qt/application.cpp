@@ -46,10 +46,9 @@ void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
   parser.setApplicationDescription(
       QStringLiteral("Sets up a new device from the medium that this application is on."));
-  const QCommandLineOption version(
-      QStringLiteral("system-version"),
-      QStringLiteral("The system version that the wizard assumes is running."),
-      QStringLiteral("X.Y.Z"));
+  const QCommandLineOption version(QStringLiteral("system-version"),
+                                   QStringLiteral("Treat the system as this version of macOS."),
+                                   QStringLiteral("X.Y.Z"));
   parser.addOption(version);
   const QCommandLineOption help = parser.addHelpOption();
   const QCommandLineOption ownVersion = parser.addVersionOption();

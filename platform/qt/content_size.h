@@ -4,8 +4,9 @@
 
 namespace onramp::qt {
 
-/// Gives a window the size that its contents need, and prevents the user from resizing it. The
-/// window grows with its contents, up to the size of the screen, and never shrinks.
+/// Gives a window the size that its contents need, and prevents the user from resizing or
+/// maximising the window. The window grows with its contents, up to the size of the screen. It
+/// keeps its size when the contents need less room.
 class ContentSize final : public QObject {
   Q_OBJECT
 

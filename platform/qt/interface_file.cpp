@@ -94,7 +94,7 @@ void enlargeFonts(QWidget& root) {
   }
 }
 
-// Translates the texts that the interface file itself contains into the user's language.
+// Translates the accessible names and tool tips in the interface file into the user's language.
 void localize(QWidget& root, const std::string& interfaceName) {
   const auto translated = [&](const QString& text) {
     const std::string key = text.toStdString();

@@ -12,9 +12,9 @@ namespace onramp::qt {
 
 namespace {
 
-// Returns the tool tip that shows `text` in full when its column is too narrow. A text that looks
-// like markup, such as a device's name, is escaped. Otherwise Qt would show it as rich text, which
-// can load pictures.
+// Returns the tool tip, which shows `text` in full even when its column is too narrow. A text that
+// looks like markup, as a device's name may, is escaped. Otherwise Qt would show the text as rich
+// text, which can load pictures.
 QString toolTip(const QString& text) {
   return Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text) : text;
 }

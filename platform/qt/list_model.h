@@ -27,6 +27,7 @@ class ListModel final : public QAbstractTableModel {
   /// Call this when the controller's entries have changed.
   void reload();
 
+  /// Sets the title of a column. Does nothing when there is no such column.
   void setHeader(const QString& identifier, const QString& title);
 
   [[nodiscard]] int rowCount(const QModelIndex& parent = {}) const override;

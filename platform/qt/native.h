@@ -10,7 +10,7 @@
 
 namespace onramp::qt {
 
-// The properties of widgets that this front end adds to those of Qt.
+// Some of the properties of widgets that this front end adds to those of Qt.
 inline constexpr const char* kViewClass = "viewClass";  ///< text: a page's class, set on its root
 inline constexpr const char* kHeading = "heading";      ///< true for a label that is a title
 inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: columns that name a row

@@ -14,9 +14,11 @@ class Spinner final : public QProgressBar {
  public:
   using QProgressBar::QProgressBar;
 
+  /// Start and stop the turning.
   void start();
   void stop();
 
+  /// Emitted by stop().
   Q_SIGNAL void stopped();
 
  protected:

@@ -13,9 +13,10 @@ class TypeAhead {
  public:
   /// Call this when the user has typed `text`. Texts that are typed in quick succession are joined.
   /// Selects the first matching row from the current row on; after the last row, the search
-  /// continues at the first one. If the user types the same text again after a pause, the
-  /// search starts at the next row. It also starts there if the user repeats a letter quickly and
-  /// no row matches the joined text. Does nothing when no row matches.
+  /// continues at the first one. If the user types the same text again after a pause, the search
+  /// starts at the row after the current one. If the user types one letter several times quickly
+  /// and no row matches the joined letters, searches for the single letter from the row after the
+  /// current one. Does nothing when no row matches.
   void type(QAbstractItemView& view, const QString& text);
 
  private:

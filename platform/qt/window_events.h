@@ -10,8 +10,9 @@ class ApplicationDelegate;
 
 namespace qt {
 
-/// Lets the delegate decide whether a window may close, and lets some keys click buttons of the
-/// window or open its menu.
+/// Lets the delegate decide whether a window may close, and handles some keys. Escape clicks the
+/// button whose key equivalent is "Escape". Return and Enter do what performReturn() does. F10 does
+/// what openMenu() does.
 class WindowEvents final : public QObject {
   Q_OBJECT
 

@@ -18,8 +18,8 @@ namespace onramp {
 inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
-/// Runs the wizard from a temporary medium on a scripted network. Its functions see and use the
-/// wizard as a person does.
+/// Runs the wizard from a temporary medium on a scripted network. Its functions prepare the medium
+/// and the network, and see and use the wizard as a person does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {
@@ -29,16 +29,16 @@ class Wizard : public testing::Test {
   }
   void TearDown() override { screen.reset(); }
 
-  /// Writes a medium with a package and two models: "All" (USB, wired, wireless) and "Cable" (USB
-  /// only). `more` holds further entries of Common.plist.
+  /// Writes the property lists of a medium with a package and two models: "All" (USB, wired,
+  /// wireless) and "Cable" (USB only). `more` holds further entries of Common.plist.
   void describeTwoModels(const Dictionary& more = {}) const {
     describe({{"All", recording::model(true, true, true)},
               {"Cable", recording::model(true, false, false)}},
              more);
   }
 
-  /// Writes a medium with a package and `models`: pairs of a name and what recording::model()
-  /// returns.
+  /// Writes the property lists of a medium with a package and `models`. Each model is a pair of a
+  /// name and a result of recording::model().
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
     names.reserve(models.size());
@@ -80,7 +80,8 @@ class Wizard : public testing::Test {
     screen.object("deviceListPopupButton").items.at(index).second();
   }
 
-  /// Lets a wireless device of the maker Kestrel appear on the network at 192.0.2.`host`.
+  /// Lets a wireless device of the maker Kestrel appear on the network at 192.0.2.`host`. Only a
+  /// search that is running finds the device.
   void appear(const std::string& name, const std::string& model, unsigned char host) const {
     const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
     agents.answers["192.0.2." + std::to_string(host)] = {2};

@@ -15,7 +15,7 @@ Dictionary entry(const std::string& name, const std::string& number = "") {
   return Dictionary{{"name", name}, {"number", number}};
 }
 
-// Returns the names of all entries, with the selected one in brackets.
+// Returns the names and numbers of all entries, with those of the selected entry in brackets.
 std::string shown(const ArrayController& list) {
   std::string text;
   for (std::size_t i = 0; i < list.arrangedObjects().size(); ++i) {

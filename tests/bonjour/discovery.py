@@ -1,4 +1,4 @@
-"""Helpers that the tests and benchmarks of discovery share."""
+"""Helpers for the tests and benchmarks of device discovery."""
 
 import os
 import pathlib
@@ -12,11 +12,15 @@ import time
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
 PRACTICE_NETWORK = ROOT / "tools" / "practice-network"
-PATIENCE = 30  # Seconds after which a missing event counts as a failure.
+PATIENCE = 30  # the seconds after which a missing event counts as a failure
 
 
 def enclose(description):
-    """Restarts this program on a practice network of two hosts, unless it already runs on one."""
+    """Does nothing if this program already runs on a practice network.
+
+    Otherwise replaces the process by one that runs the program on a practice network of two hosts.
+    `description` is the network's description file.
+    """
     if "ONRAMP_PRACTICE_SOCKET" in os.environ:
         return
     os.execv(sys.executable, [sys.executable, "-B", str(PRACTICE_NETWORK), "--hosts", "2",
@@ -24,7 +28,8 @@ def enclose(description):
 
 
 class Search:
-    """A running `bonjour_probe search`. Each line is an event: time, word, name and details."""
+    """A running `bonjour_probe search`. An event is the list of fields in a line of its output: the
+    time, a word such as "found", the device's name, and details."""
 
     def __init__(self, probe, service_type, **options):
         self._process = subprocess.Popen([probe, "search", service_type + "."], text=True,
@@ -51,19 +56,20 @@ class Search:
                 if word in (None, event[1]) and name in (None, event[2])]
 
     def wait(self, condition):
-        """Returns `condition()` once it is true. Raises after PATIENCE seconds."""
+        """Waits until `condition()` is true, and returns its value. Raises AssertionError after
+        PATIENCE seconds."""
         with self._news:
             if not self._news.wait_for(condition, PATIENCE):
                 raise AssertionError(f"the expected event is not among these: {self._events}")
             return condition()
 
     def wait_for(self, word, name, count=1):
-        """Waits for `count` events of that kind and returns the fields of the latest one."""
+        """Waits for `count` events with this word and name, and returns the latest one."""
         return self.wait(lambda: len(self.events(word, name)) >= count and
                          self.events(word, name)[-1])
 
     def end(self, patience=PATIENCE):
-        """Closes the program's input, which ends it, and returns its exit status."""
+        """Ends the program by closing its input, and returns its exit status."""
         if not self._process.stdin.closed:
             self._process.stdin.close()
         status = self._process.wait(patience)
@@ -73,7 +79,7 @@ class Search:
 
 
 class Avahi:
-    """This host's Avahi daemon, which tests kill, freeze and restart."""
+    """The Avahi daemon of this host, for tests that kill, freeze and restart it."""
 
     configuration = pathlib.Path("/run/practice-network/avahi-daemon.conf")
     pid_file = pathlib.Path("/run/avahi-daemon/pid")
@@ -81,7 +87,7 @@ class Avahi:
     def kill(self):
         process = pathlib.Path("/proc", str(self._pid()))
         os.kill(self._pid(), signal.SIGKILL)
-        # A new daemon does not start until the old process is gone.
+        # A new daemon does not start while the old process exists.
         deadline = time.monotonic() + PATIENCE
         while process.exists():
             if time.monotonic() > deadline:
@@ -95,7 +101,8 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts the daemon with changed `settings`, whose names have "_" in place of "-"."""
+        """Starts the daemon. `settings` replace those in its configuration file; their names have
+        "_" in place of "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="
@@ -111,7 +118,7 @@ class Avahi:
         self.start(**settings)
 
     def wait_for_interfaces(self, service_type, names):
-        """Waits until services of that type are seen on exactly the interfaces `names`."""
+        """Waits until Avahi sees services of the type on exactly the interfaces in `names`."""
         deadline = time.monotonic() + PATIENCE
         seen = None
         while seen != names:
@@ -126,8 +133,9 @@ class Avahi:
 
 
 def announce_pointer(service_type, target_labels, seconds=4500):
-    """Announces (RFC 6762 section 8.3) that `service_type` has an instance with those labels.
-    Announces no other record of the instance. With 0 `seconds` to live, withdraws the instance."""
+    """Announces a PTR record (RFC 6762 section 8.3), and no other record, that points from
+    `service_type` in the domain "local" to a name. `target_labels` are the labels of that name.
+    `seconds` is the record's time to live; 0 withdraws the record."""
     name = _labels(*service_type.encode().split(b"."), b"local")
     target = _labels(*target_labels)
     packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name

@@ -1,7 +1,8 @@
-"""Tests discovery against real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM.
+"""Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM
 
-The tests run on two hosts that are joined by two cables, with IPv4 and IPv6. Avahi announces the
-other host's devices. Another mDNS implementation, zeroconf, announces one device of this host."""
+The tests run on one of two hosts, which two cables join, with IPv4 and IPv6. On the other host,
+Avahi announces devices. On this host, one test announces a device with another mDNS implementation,
+zeroconf."""
 
 import os
 import pathlib
@@ -26,14 +27,15 @@ ETH_P_ALL = 3
 
 
 def packets():
-    """Returns a socket that receives every packet on every interface."""
+    """Returns a socket that receives every packet on all interfaces of this host."""
     opened = socket.socket(socket.AF_PACKET, socket.SOCK_DGRAM, socket.htons(ETH_P_ALL))
     opened.settimeout(discovery.PATIENCE)
     return opened
 
 
 def asked(seen, last):
-    """Returns the destinations of SNMP requests, up to the first request to `last`."""
+    """Waits for an SNMP request to `last`. Returns the destinations of all SNMP requests up to
+    it."""
     addresses = []
     while last not in addresses:
         packet = seen.recv(100)
@@ -57,7 +59,7 @@ class NetworkTest(unittest.TestCase):
                                 stdout=subprocess.PIPE).stdout
         self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
 
-    def test_names_of_all_kinds_lead_to_their_devices_and_back(self):
+    def test_devices_with_unusual_names_are_found_and_those_without_dots_also_by_uri(self):
         names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
                  "Osprey #2", "x" * 63]
         for name in names:
@@ -66,7 +68,7 @@ class NetworkTest(unittest.TestCase):
             for name in names:
                 _, _, _, model, _, uri, address = search.wait_for("update", name)
                 self.assertEqual(model, "Kestrel Model 100")
-                if "." in name:  # A URI does not escape dots, so the name may be misread.
+                if "." in name:  # Dots are not escaped in a URI, so the name may be misread.
                     continue
                 self.assert_leads_to(uri, address)
 
@@ -81,7 +83,7 @@ class NetworkTest(unittest.TestCase):
 
     def test_a_second_mdns_implementation_is_understood(self):
         def service(model):
-            # Of two equal keys, the first one counts.
+            # The value of the first "usb_MDL" counts.
             texts = (b"usb_MFG=Harrier", b"note=Attic", b"usb_MDL=" + model, b"usb_MDL=Other")
             return ServiceInfo(f"{TYPE}.local.", f"Harrier (2).{TYPE}.local.", port=631,
                                addresses=[socket.inet_aton("192.0.2.1")], server="second.local.",
@@ -94,7 +96,7 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Harrier (2)")[3:7:3],
                              ["Harrier Jet 7", "192.0.2.1"])
             responder.update_service(service(b"Jet 8"))
-            # A running search never notices the change. Avahi notices the change after a while.
+            # Avahi notices the change after a while, but a running search never does.
             model = None
             deadline = time.monotonic() + discovery.PATIENCE
             while model != "Harrier Jet 8" and time.monotonic() < deadline:
@@ -115,14 +117,14 @@ class NetworkTest(unittest.TestCase):
                         self.assertEqual(search.wait_for("update", "Dual")[6], "192.0.2.66")
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
-                        # A new device is announced only after its name has been checked. By then,
-                        # all sightings of the removed device have ended.
+                        # Avahi announces a new device only after it has checked the device's name.
+                        # By then, all sightings of the removed device have ended.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],
                                          ["found", "update", "gone", "remove"])
 
-    def test_a_device_on_two_interfaces_leaves_with_the_last_one(self):
+    def test_a_device_on_two_interfaces_is_gone_only_when_both_are_unplugged(self):
         for interface in ("practice0", "practice1"):
             self.addCleanup(self.network.plug, interface)
         uri = "dnssd://Kestrel._ipp._tcp.local."
@@ -130,7 +132,7 @@ class NetworkTest(unittest.TestCase):
             address = search.wait_for("update", "Kestrel")[6]
             for lost, left in (("practice0", "practice1"), ("practice1", "practice0")):
                 self.network.unplug(lost)
-                # This host's daemon notices the loss a little later.
+                # The daemon of this host notices the loss a little later.
                 self.avahi.wait_for_interfaces(TYPE, {left})
                 self.assert_leads_to(uri, address)
                 self.assertEqual(search.events("gone"), [])
@@ -183,7 +185,7 @@ class NetworkTest(unittest.TestCase):
             with self.subTest(limit=limit), Search(PROBE, TYPE) as search:
                 search.wait(lambda: names <= {event[2] for event in search.events("update")})
 
-    def test_the_daemon_may_be_absent_and_come_and_go(self):
+    def test_the_daemon_may_be_absent_at_the_start_and_restart_later(self):
         self.avahi.kill()
         with Search(PROBE, TYPE) as search:
             for count in (1, 2, 3):
@@ -215,7 +217,7 @@ class NetworkTest(unittest.TestCase):
             search.wait_for("update", "Kestrel")
             self.avahi.freeze()
             self.addCleanup(self.avahi.thaw)
-            # Calls to Avahi and to the bus time out after 25 seconds. The probe must end sooner.
+            # Calls on the message bus time out after 25 seconds. The probe must end sooner.
             self.assertEqual(subprocess.run(
                 [PROBE, "addresses", "dnssd://Kestrel._ipp._tcp.local.", "1"], check=False,
                 stdout=subprocess.DEVNULL, timeout=20).returncode, 1)
@@ -231,7 +233,8 @@ class NetworkTest(unittest.TestCase):
             self.add("Merlin")
             search.wait_for("update", "Merlin")
             self.assertEqual(search.events("update", "Ghost"), [])
-            # The daemon stops resolving after five seconds. The program must ask it again.
+            # The daemon gives up resolving after five seconds. The program must ask the daemon
+            # again.
             time.sleep(6)
             self.add("Ghost")
             search.wait_for("update", "Ghost")

@@ -1,6 +1,6 @@
-// Runs a search or a look-up on the real network and prints its events, one on each line: the
-// seconds since the start, the event and its details. Tests and benchmarks run this program on a
-// practice network. A search ends when the standard input is closed.
+// Makes a search or a look-up on the network, and prints a line for each event: the seconds
+// since the start, a word for the event, and details. Tests and benchmarks run this program on a
+// practice network. A search ends at the end of the standard input.
 //
 //   bonjour_probe search TYPE            searches for services of TYPE with KSBonjourSearch
 //   bonjour_probe addresses URI SECONDS  looks up the addresses of the device that URI names

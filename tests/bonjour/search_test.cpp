@@ -99,8 +99,8 @@ TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // Only the first of the three removals counted, so it takes two more to remove the service. They
-  // count only after the next resolve.
+  // Only the first of the three removals counted. After the next resolve, it takes two more
+  // removals to remove the service.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());
@@ -140,7 +140,7 @@ TEST_F(BrowserTest, StartedBrowsersForwardEachOthersServices) {
   EXPECT_THAT(recorder->events, ElementsAre(Event{"add", nullptr}, Event{"resolved", nullptr}));
 }
 
-TEST_F(BrowserTest, StoppingForgetsEverythingWithoutEventsAndARestartBeginsEmpty) {
+TEST_F(BrowserTest, StoppingEmptiesTheTableWithoutEventsAndARestartBeginsEmpty) {
   network.found(onOne);
   browser->stopBrowsing();
   EXPECT_FALSE(Network::isResolving(onOne));
@@ -224,7 +224,7 @@ TEST_F(SearchTest, ADeviceIsReportedWhenItIsResolvedAndWhenItLeaves) {
   EXPECT_EQ(*recorder->last.array(KSDevice::kBonjourServiceType), Array());
 }
 
-TEST_F(SearchTest, AResolvedServiceThatNoBrowserHasFoundIsAnAddition) {
+TEST_F(SearchTest, AResolvedServiceThatNoBrowserHasFoundIsReportedAsAdded) {
   search->resolvedBonjourService(Network::service("Kestrel", "_scanner._tcp."));
   search->resolvedBonjourService(nullptr);
   EXPECT_THAT(recorder->events, ElementsAre("add Kestrel"));
@@ -260,7 +260,7 @@ TEST_F(SearchTest, AnObserverMayDestroyTheSearch) {
   EXPECT_THAT(network.browsers, IsEmpty());
 }
 
-TEST(Device, UnknownTextsAreEmptyAndNeverAbsent) {
+TEST(Device, NoKeyOfTheRecordIsEverAbsent) {
   const Dictionary none = KSDevice::initWithService(nullptr, std::nullopt);
   EXPECT_EQ(none.size(), 8u);
   EXPECT_EQ(none.string(KSDevice::kModelName), " ");

@@ -1,5 +1,5 @@
-// Reads every input as a TXT record. Then writes up to 250 bytes of the input as an attribute's
-// value and expects to read the same value back.
+// Reads each input as a TXT record. Then makes a record with up to 250 bytes of the input as an
+// attribute's value, and expects to read the same value from the record.
 
 #include <cstdint>
 #include <cstdlib>

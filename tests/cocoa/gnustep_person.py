@@ -109,7 +109,8 @@ class GNUstepPerson(Person):
     def _at_rest(self, role, name):
         """Returns the control after two looks have found it in the same place.
 
-        The window manager moves a new window. If the control is gone, returns the last look's result.
+        The first look may be too early, because the window manager moves a new window. If a look does
+        not find the control, returns the result of the look before.
         """
         seen = None
         while True:

@@ -17,12 +17,13 @@
 
 namespace {
 
-std::size_t allocationsUntilFailure = 0;  // 0 when no allocation is to fail
+std::size_t allocationsUntilFailure = 0;  // 0 means that no allocation fails
 std::ptrdiff_t liveAllocations = 0;
 
 }  // namespace
 
-// GCC inlines only some of these functions otherwise, and then calls their pairs mismatched.
+// Without noinline, GCC inlines only some of these functions, and then warns that new and delete do
+// not match.
 [[gnu::noinline]] void* operator new(std::size_t size) {
   if (allocationsUntilFailure != 0 && --allocationsUntilFailure == 0) throw std::bad_alloc();
   void* const memory = std::malloc(size == 0 ? 1 : size);  // NOLINT(cppcoreguidelines-*)
@@ -51,9 +52,10 @@ void operator delete(void* memory, std::size_t /*size*/) noexcept {
 namespace onramp {
 namespace {
 
-// Runs `work` once with its first allocation failing, once with its second, and so on until none
-// fails. A failed run must free everything. A run that survives its failure must return what a run
-// without a failure returns. After each failed run, `afterFailure` is called.
+// Runs `work` repeatedly. The first allocation fails in the first run, the second allocation in the
+// second run, and so on, until a run makes no allocation that fails. Each run must either throw
+// std::bad_alloc, or return the same result as a run without a failure. No run may lose memory.
+// After each run that throws, `afterFailure` is called.
 template <typename Work, typename AfterFailure>
 void failEveryAllocation(const Work& work, const AfterFailure& afterFailure) {
   const auto expected = work();
@@ -82,8 +84,8 @@ void failEveryAllocation(const Work& work) {
   failEveryAllocation(work, [] {});
 }
 
-TEST(AllocationFailure, AParserOfForeignBytesReturnsAllOrThrows) {
-  // Longer than the texts that std::string stores without allocating.
+TEST(AllocationFailure, AParserReturnsItsWholeResultOrThrows) {
+  // This text is too long for std::string to store without an allocation.
   const std::string text(40, 'x');
   const auto values = "<array><string>" + text + "</string><data>AAAA</data><real>1.5</real>" +
                       "<dict><key>" + text + "</key><integer>7</integer></dict></array>";
@@ -117,7 +119,7 @@ TEST(AllocationFailure, AParserOfForeignBytesReturnsAllOrThrows) {
   });
 }
 
-TEST(AllocationFailure, AWriterLeavesTheOldFileOrTheNewOne) {
+TEST(AllocationFailure, AFailedWriteLeavesTheOldFileOrTheNewOne) {
   const TemporaryFolder folder;
   const std::string path = folder / "list";
   const Dictionary old{{"k", "before"}};

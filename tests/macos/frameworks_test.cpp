@@ -1,4 +1,5 @@
-// Tests how the macOS backends use the frameworks' objects, with stand-ins for the frameworks.
+// Tests how corefoundation, cfnetwork and systemconfiguration use the frameworks' objects. The
+// folder frameworks/ has stand-ins for the frameworks.
 
 #include <CoreServices/CoreServices.h>
 #include <SystemConfiguration/SystemConfiguration.h>
@@ -59,7 +60,8 @@ struct Seen {
   }
 };
 
-// Passes an event to the browser's client, as the framework does while the browser is scheduled.
+// Passes an event to the client of the latest browser, as the framework does while the browser is
+// scheduled.
 void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
   standin::Browser& browser = *standin::Browser::last;
   ASSERT_TRUE(browser.isScheduled && browser.client);
@@ -67,7 +69,7 @@ void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
   browser.client(&browser, flags, found, &error, browser.info);
 }
 
-TEST(CFNetworkBrowser, ReportsAServiceWithItsFirstSightingAndItsLast) {
+TEST(CFNetworkBrowser, ReportsAServiceAtItsFirstSightingAndAfterItsLast) {
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
   seen.browser->schedule();
@@ -103,8 +105,8 @@ TEST(CFNetworkBrowser, ReportsItsServicesGoneAfterAnErrorAndSearchesAgain) {
   for (int round = 1; round <= 2; ++round) {
     deliver(0, service.get(), 0);
     deliver(0, nullptr, -72000);
-    deliver(0, nullptr, -72005);        // the error that stopping causes
-    EXPECT_EQ(seen.events, 3 * round);  // found, gone, the first error
+    deliver(0, nullptr, -72005);        // stopping the search causes this error
+    EXPECT_EQ(seen.events, 3 * round);  // in each round: found, gone, the first error
     EXPECT_EQ(seen.code, -72000);
     EXPECT_FALSE(native.isRunning);
     frontEnd.runTimers();
@@ -152,7 +154,8 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient)
   EXPECT_EQ(service->txtData(), bytesOf("\3a=1"));
 
   EXPECT_TRUE(service->resolveWithTimeout(std::chrono::seconds(5)));
-  EXPECT_TRUE(service->addressing().empty() && !service->txtData()) << "the last resolve's";
+  EXPECT_TRUE(service->addressing().empty() && !service->txtData())
+      << "these belonged to the previous resolve";
   seen.service = std::move(service);
   error.error = kNetServiceErrorTimeout;
   native->client(native, &error, native->info);

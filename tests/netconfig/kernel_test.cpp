@@ -1,4 +1,5 @@
-// Runs as root in a new network namespace; see tests/in_namespace.
+// Compares the results with the network configuration of the kernel. Runs as root in a new network
+// namespace; see tests/in_namespace.
 
 #include <gmock/gmock.h>
 
@@ -41,7 +42,8 @@ std::vector<std::string> entriesOf(const local_address_list& list) {
 
 class Kernel : public ::testing::Test {
  protected:
-  // Makes two pairs of connected interfaces. All four ends are up and in this namespace.
+  // Makes two pairs of connected interfaces, near and far, left and right. All are up and in this
+  // namespace.
   void SetUp() override {
     recording::resetLoop();
     ip("link set lo up");
@@ -61,11 +63,11 @@ class Kernel : public ::testing::Test {
 
 const char* const kLoopback = "127.0.0.1,|255.0.0.0,||";
 
-// For each scenario: its name, the commands, the entries in addition to the loopback interface's,
-// and the primary interface.
+// Each scenario has a name, the commands that set it up, the expected entries without that of the
+// loopback interface, and the primary interface.
 const std::tuple<const char*, std::vector<const char*>, std::vector<std::string>, const char*>
     kScenarios[] = {
-        {"addresses of every kind, and a subnet's route",
+        {"addresses of several kinds, and a route that is no default route",
          {"addr add 192.0.2.1/24 brd + dev near", "addr add 192.0.2.7/24 brd + dev near",
           "addr add 10.0.0.1/8 brd 10.9.9.9 dev left", "addr add 10.1.0.1 peer 10.1.0.2 dev left",
           "addr add 10.1.0.1 peer 10.1.0.3 dev left", "addr add 203.0.113.4/31 dev right",
@@ -80,7 +82,7 @@ const std::tuple<const char*, std::vector<const char*>, std::vector<std::string>
           "addr add 198.51.100.1/24 dev left", "link set right down"},
          {"192.0.2.1,|255.255.255.0,|192.0.2.255,|"},
          "near.7"},
-        {"the first route with the lowest metric wins",
+        {"the first usable default route with the lowest metric wins",
          {"addr add 192.0.2.1/24 dev near", "addr add 198.51.100.1/24 dev left",
           "route add unreachable default metric 5", "route add default via 192.0.2.254 metric 600",
           "route append default via 198.51.100.254 metric 9",
@@ -124,7 +126,7 @@ TEST_F(Kernel, ListsTheAddressesAndThePrimaryInterface) {
   EXPECT_THAT(none, ::testing::Pointee(Array{}));
 }
 
-// Only one test may add the callback, because it stays until the process ends.
+// Only one test may install the cache's callback, which stays until the process ends.
 TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   AddNetworkInterfaceListChangeCallbackSCF();
   std::vector<std::string> expected = {kLoopback};

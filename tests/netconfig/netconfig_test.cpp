@@ -1,4 +1,5 @@
-// Tests the rules that no real network shows. kernel_test.cpp tests the other rules.
+// Tests rules that cannot be tested with the kernel's configuration. kernel_test.cpp tests the
+// others.
 
 #include <gtest/gtest.h>
 
@@ -15,12 +16,12 @@
 namespace onramp {
 namespace {
 
-/// A dynamic store whose contents and failures a test sets.
+/// A simulated dynamic store. The test sets its contents and makes it fail.
 struct Store {
   Dictionary contents;
-  std::string failing;  ///< "create", "key" or "copy"
+  std::string failing;  ///< the step that fails: "create", "key" or "copy"
   int error = 0;
-  DynamicStoreCallback callback;  ///< of the latest session that has one
+  DynamicStoreCallback callback;  ///< the one that was passed last
   bool hasAddedNull = false;      ///< whether the latest source was null
 
   void change(Dictionary newContents) {
@@ -91,7 +92,7 @@ class Netconfig : public ::testing::Test {
  protected:
   void SetUp() override {
     store = Store{};
-    AddNetworkInterfaceListChangeCallbackSCF();  // stays until the process ends
+    AddNetworkInterfaceListChangeCallbackSCF();  // the callback stays until the process ends
   }
 
   Store& store = script();
@@ -121,7 +122,7 @@ TEST_F(Netconfig, ListHoldsTheAddressArraysOfEveryInterface) {
   EXPECT_EQ(list, before);
 }
 
-TEST_F(Netconfig, OnlyTheListReportsFailuresAndTheCacheBecomesEmpty) {
+TEST_F(Netconfig, FailuresEmptyTheCacheAndOnlyTheListReportsThem) {
   store.contents = {{"State:global/IPv4", Dictionary{{"PrimaryInterface", "en0"}}}};
   EXPECT_EQ(KSSCCopyCurrentInterfaceName(), "en0");
   for (const char* const step : {"copy", "key", "create"}) {
@@ -169,7 +170,7 @@ TEST_F(Netconfig, DestinationIsReachedFromTheFirstInterfaceInItsSubnet) {
   }
 }
 
-TEST_F(Netconfig, MissingAddressesAndInterfaceNamesAreNotReturned) {
+TEST_F(Netconfig, NothingIsReturnedForAMissingAddressOrInterfaceName) {
   store.contents = {{"State:en1/IPv4", Dictionary{{"Addresses", Array{}}}},
                     {"State:en2/IPv4", "no dictionary"}};
   for (const char* name : {"en1", "en2"})

@@ -72,7 +72,8 @@ TEST_F(Chooser, ShowsItsTextsAndItsMenu) {
       titles.push_back(title);
     return titles;
   };
-  EXPECT_THAT(commands(), ElementsAre("Gear", "Setup...", "again")) << "the tool's file name";
+  EXPECT_THAT(commands(), ElementsAre("Gear", "Setup...", "again"))
+      << "a tool without a display name has its file name";
   medium.addSetUpTool(0);
   load();
   EXPECT_THAT(commands(), ElementsAre("Gear", "Wireless Setup...", "again"));
@@ -123,7 +124,7 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
       // An address that leaves one request unanswered is tried three times, even if it answers
-      // later requests.
+      // later requests. If this is so for every address, the last try of the last address decides.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},

@@ -80,7 +80,7 @@ TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   medium.setEnvironment("PATH", medium.path("bin") + ":" + std::getenv("PATH"));
   ASSERT_EQ(mkfifo(gate.c_str(), 0600), 0);
   const auto throughTheGate = [&] {
-    EXPECT_FALSE(std::filesystem::exists(opened)) << "the call waited for the opener";
+    EXPECT_FALSE(std::filesystem::exists(opened)) << "the call does not wait for the opener";
     std::ofstream(gate) << "go";
     for (int i = 0; i < 1000 && !std::filesystem::exists(opened); ++i)
       std::this_thread::sleep_for(std::chrono::milliseconds(10));

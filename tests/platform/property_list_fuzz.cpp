@@ -5,7 +5,7 @@
 #include "platform/libplist/parse.h"
 
 // Reads the input, writes it and reads it back. From then on, writing and reading must change
-// nothing. The first writing may change texts, because it replaces characters that XML cannot hold.
+// nothing. The first writing may change texts and dates, because XML cannot hold all of them.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
   using namespace onramp;
   const auto value =

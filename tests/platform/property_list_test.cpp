@@ -71,7 +71,7 @@ TEST(AtomicWriting, AFailureLeavesTheOldFileAndNothingElse) {
   const Dictionary before{{"k", "before"}};
   ASSERT_TRUE(writeDictionaryAtomically(before, folder / "list"));
   EXPECT_EQ(statusOfWriterPastItsLimit(folder / "list", surviveFailedWrites), 0)
-      << "the process was killed, or reported success";
+      << "the writer survives and reports the failure";
   EXPECT_EQ(loadDictionary(folder / "list"), before);
   EXPECT_THAT(folder.names(), testing::ElementsAre("list"));
 }

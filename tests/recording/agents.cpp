@@ -12,7 +12,7 @@ using recording::Agents;
 
 struct DatagramSocket::Native {
   DatagramEndpoint peer;
-  std::optional<Agents::Bytes> reply;  ///< to the latest request, until received
+  std::optional<Agents::Bytes> reply;  ///< the reply that the program has not received yet
   bool refused = false;                ///< the peer's host refused the request
 };
 

@@ -35,10 +35,10 @@ class Agents {
   /// When it returns nothing, the request stays unanswered.
   std::function<std::optional<Bytes>(const Bytes& request)> reply;
 
-  bool socketsOpen = true;                      ///< when false, no socket can be opened
-  std::vector<std::string> asked;               ///< the address of every request so far
-  std::uint16_t port = 0;                       ///< of the latest request
-  std::size_t room = 0;                         ///< of the buffer for the latest reply, in bytes
+  bool socketsOpen = true;         ///< when false, no socket can be opened
+  std::vector<std::string> asked;  ///< the address of every request so far
+  std::uint16_t port = 0;          ///< the port of the latest request
+  std::size_t room = 0;            ///< the size of the program's reply buffer, in bytes
   std::vector<std::chrono::nanoseconds> waits;  ///< the time limit of every wait
 
   /// Removes and returns the next value of `address` in `answers`, but does not remove the last

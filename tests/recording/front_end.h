@@ -15,7 +15,7 @@
 
 namespace onramp::recording {
 
-/// One object of the user interface, in the state that the program has given it.
+/// One object of the user interface, with the values that the program has set.
 struct Object {
   OutletKind kind = OutletKind::kView;
   std::string name;
@@ -31,11 +31,11 @@ struct Object {
   std::string imagePath;
   ImageScaling scaling = ImageScaling::kProportionallyDown;
   ArrayController* content = nullptr;
-  std::map<std::string, std::string> headers;  ///< of a table's columns, by their identifiers
+  std::map<std::string, std::string> headers;  ///< the titles of a table's columns, by identifier
   std::set<std::string> fixedColumns;          ///< the columns that the user cannot edit
   bool columnsCanMove = true;
   bool columnsCanBeSelected = true;
-  std::vector<std::pair<std::string, std::function<void()>>> items;  ///< of a pop-up button
+  std::vector<std::pair<std::string, std::function<void()>>> items;  ///< a pop-up button's items
   Object* superview = nullptr;
   std::vector<Object*> subviews;
   std::string action;
@@ -50,9 +50,10 @@ struct ShownAlert {
   std::string buttonTitle;
 };
 
-/// A front end without a screen, and a desktop that opens nothing. It records what the program
-/// shows and asks for, and plays the user and the clock. Time passes only in runTimers().
-/// sleepOffMainThread() does not sleep; it records the pause and calls `duringPause`.
+/// A front end without a screen, and a desktop that opens nothing but reports success. The front
+/// end records what the program shows and asks for, and plays the user and the clock. Alerts return
+/// at once. Time passes only in runTimers(). sleepOffMainThread() does not sleep; it records the
+/// pause and calls `duringPause`.
 class FrontEnd {
  public:
   static FrontEnd& instance();
@@ -84,13 +85,13 @@ class FrontEnd {
   std::vector<std::string> log;  ///< "terminate", "hide", "front", … in order
   std::vector<ShownAlert> alerts;
   std::vector<std::pair<AlertSheet, std::function<void(int)>>> sheets;  ///< with their handlers
-  std::vector<unsigned> pauses;     ///< seconds of every pause off the main thread
+  std::vector<unsigned> pauses;     ///< the length of every sleepOffMainThread(), in seconds
   std::vector<double> delays;       ///< the delay of every timer, in seconds
   std::vector<std::string> opened;  ///< every path and address that was to be opened
   bool terminated = false;
 
   // What a test sets up.
-  std::set<std::string> missingInterfaces;
+  std::set<std::string> missingInterfaces;  ///< the interface files that cannot be loaded
   /// Called on the main thread during each pause, with the number of the pause, which starts at 1.
   std::function<void(int pause)> duringPause;
   /// Called when the program opens a file or an address.

@@ -41,7 +41,8 @@ namespace {
 
 using Part = std::pair<OutletKind, const char*>;
 
-// The outlets in the interface files. tests/resources compares them with the files and the program.
+// Returns the outlets in an interface file. A test in tests/resources compares this table with the
+// interface files and with the program's code.
 const std::vector<Part>& partsOf(const std::string& interfaceName) {
   using enum OutletKind;
   static std::map<std::string, std::vector<Part>> parts = {

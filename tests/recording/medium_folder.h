@@ -16,7 +16,8 @@ namespace onramp::recording {
 /// variables that this object has set.
 class MediumFolder {
  public:
-  /// Makes a medium with an application bundle and nothing else.
+  /// Makes a medium with an application bundle and nothing else. Sets the environment variables for
+  /// the application-support folders, for English texts and for macOS 10.9.5.
   MediumFolder();
   MediumFolder(const MediumFolder&) = delete;
   MediumFolder& operator=(const MediumFolder&) = delete;

@@ -17,7 +17,7 @@ class Network {
   /// Returns to the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
-  /// Makes a service object like those that browse events carry.
+  /// Makes a service like those that a browser passes to its client.
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
                                              const std::string& domain = "local.");
 
@@ -41,9 +41,9 @@ class Network {
   std::map<std::string, std::vector<Data>> answers;
 
   bool searchesStart = true;                 ///< when false, no search can be started
-  std::string domain;                        ///< of the latest search
-  std::vector<double> timeouts;              ///< of every resolve
-  bool cancelled = false;                    ///< whether the latest resolve was cancelled
+  std::string domain;                        ///< the domain of the latest search
+  std::vector<double> timeouts;              ///< the time limit of every resolve, in seconds
+  bool cancelled = false;                    ///< cancel() was called after the latest resolve began
   std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 

@@ -1,7 +1,8 @@
-"""Runs a command on a loopback network with SNMP agents: agents.py COMMAND [ARGUMENT ...].
+"""Runs a command on a loopback network with SNMP agents: agents.py COMMAND [ARGUMENT ...]
 
-It must run as root in a new network namespace; see tests/in_namespace. At 127.0.2.1, other senders
-answer before the agent does. The exit status is the command's."""
+Must run as root in a new network namespace; see tests/in_namespace. The agents at 127.0.1.1 and
+127.0.2.1 answer at once, the one at 127.0.1.8 after four seconds. Requests to 127.0.2.1 are first
+answered by two other sockets. The exit status is that of the command."""
 
 import socket
 import subprocess
@@ -19,7 +20,8 @@ def bound_to(address, port=161):
 
 
 def serve(address, number, seconds=0, strangers=()):
-    """Starts an agent that answers `number` after `seconds`. The `strangers` answer 1 just before it."""
+    """Starts an agent that answers `number` after `seconds`. Just before, each socket in
+    `strangers` answers 1."""
     agent = bound_to(address)
 
     def answer():

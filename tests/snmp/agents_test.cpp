@@ -1,4 +1,4 @@
-// Queries the agents of agents.py over real sockets. agents.py runs this program.
+// Queries the agents of agents.py over real sockets. agents.py starts them and runs this program.
 
 #include <gtest/gtest.h>
 
@@ -14,7 +14,8 @@ namespace {
 using std::chrono::milliseconds;
 using std::chrono::steady_clock;
 
-// Returns the device's ActiveIF, or nothing when the device did not answer.
+// Returns the value of ActiveIF from the agent at `address`, or nothing when the agent does not
+// answer.
 std::optional<std::int64_t> ask(const char* address) {
   bool noReply = false;
   const auto result = snmp_query_table(&active_interface_table, address, noReply, nullptr, nullptr);
@@ -22,14 +23,14 @@ std::optional<std::int64_t> ask(const char* address) {
 }
 
 TEST(Agents, AreHeardForTwoSecondsAndOtherSendersAreIgnored) {
-  EXPECT_EQ(ask("127.0.2.1"), 2) << "other senders answer 1 before";
+  EXPECT_EQ(ask("127.0.2.1"), 2) << "other senders answer 1 before the agent answers 2";
   const auto start = steady_clock::now();
-  EXPECT_EQ(ask("127.0.1.8"), std::nullopt) << "after 4 s";
+  EXPECT_EQ(ask("127.0.1.8"), std::nullopt) << "the agent answers after 4 s";
   EXPECT_GE(steady_clock::now() - start, milliseconds(2000));
 }
 
-// A closed port takes three pauses of 20 ms. Six waits of two seconds for an answer take longer.
-TEST(Agents, OnClosedPortsAreNoticedAtOnceAndLeaveNoDescriptorOpen) {
+// A closed port costs three pauses of 20 ms, and no waits of two seconds.
+TEST(ClosedPorts, AreNoticedAtOnceAndLeaveNoDescriptorOpen) {
   using std::filesystem::directory_iterator;
   const auto open = [] {
     return std::distance(directory_iterator("/proc/self/fd"), directory_iterator());

@@ -1,5 +1,7 @@
-"""broadcast_device.py KIND: a device that answers the first request on port 161. KIND is the number
-to answer, or "stutter" or "flood", which send replies that no proper agent sends."""
+"""Plays a device that answers the first request on port 161: broadcast_device.py KIND
+
+KIND is the number to answer, or "stutter" or "flood" for a device that answers many times.
+Some replies of "stutter" are malformed."""
 
 import socket
 import sys
@@ -12,7 +14,8 @@ SEVEN = reply(IDENTIFIER, 7)
 TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
 NO_BINDINGS = SEVEN[:27] + b"\0"
 
-# Each kind's datagrams, with the seconds since the request. A search listens for 5 to 8 seconds.
+# The datagrams that these two kinds send, with the seconds since the request. A search listens for
+# 5 to 8 seconds, so it must miss the last datagram of "stutter".
 REPLIES = {
     "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)),
                 (0, TEXT), (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN),

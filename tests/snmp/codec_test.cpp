@@ -24,7 +24,8 @@ std::vector<std::uint8_t> written(Put put) {
 }
 
 TEST(Integers, TakeTheFewestBytesAndAreSignExtendedByTheirSize) {
-  // The last number is the value read as unsigned, and also the value after ber_put_int().
+  // Each row has the number, its encoding, and the results of ber_get_int() and ber_get_uint().
+  // ber_put_int() sets its argument to the last one, too.
   const std::tuple<std::int64_t, const char*, std::int64_t, std::uint64_t> cases[] = {
       {127, "02 01 7F", 127, 127},
       {128, "02 02 00 80", 128, 128},
@@ -80,7 +81,7 @@ TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255Bytes) {
     return written([&](ber_writer& out) { return ber_put_oid(out, {count, count, arcs.data()}); });
   };
   EXPECT_EQ(put({6, 15}), hex("06 01 FF"));
-  EXPECT_TRUE(put({6, 16}).empty()) << "6 x 40 + 16 exceeds a byte";
+  EXPECT_TRUE(put({6, 16}).empty()) << "6 x 40 + 16 does not fit in a byte";
   EXPECT_TRUE(put({1}).empty());
   EXPECT_EQ(put(std::vector<std::uint16_t>(256, 1)).size(), 258U);
   EXPECT_TRUE(put(std::vector<std::uint16_t>(257, 1)).empty());
@@ -91,11 +92,11 @@ TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255Bytes) {
     snmp_oid target{room, room, arcs};
     ByteReader in(bytes);
     EXPECT_EQ(ber_get_oid(in, &target, 2), SNMP_ERR_CODEC);
-    EXPECT_EQ(arcs[room], 9) << "no arc is written beyond the capacity";
+    EXPECT_EQ(arcs[room], 9) << "no arc is written past the storage";
   }
 }
 
-TEST(Primitives, UnusedByTheProgramKeepTheirContracts) {
+TEST(UnusedPrimitives, KeepTheirContracts) {
   std::uint16_t a[] = {1, 3, 6}, b[] = {1, 3, 7};
   EXPECT_EQ(snmp_oid_compare({3, 3, a}, {3, 3, b}), -1);
   EXPECT_EQ(snmp_oid_compare({3, 3, b}, {3, 3, a}), 1);
@@ -129,12 +130,13 @@ TEST(Decoding, ReadsARealReplyInPlaceAndRefusesATruncatedOne) {
   EXPECT_EQ(m.message.error_status, 2U);
   EXPECT_EQ(m.message.error_index, 1U);
   EXPECT_EQ(m.names[0].count, 6);
-  EXPECT_EQ(snmp_decode_message(m.message, reply), SNMP_ERR_CODEC) << "6 arcs fit, not 14";
+  EXPECT_EQ(snmp_decode_message(m.message, reply), SNMP_ERR_CODEC)
+      << "the name has 14 arcs, but only 6 fit";
 }
 
 TEST(Decoding, AcceptsEveryFormOfValue) {
   const std::pair<const char*, const char*> cases[] = {
-      // the resulting type, number, count of arcs, and string
+      // The second text has the type, the number, the count of arcs, and the string.
       {"01 01 FF", "1 -1 4 cleared"},
       {"02 02 80 00", "2 -32768 4 cleared"},
       {"41 03 80 00 01", "65 4286578689 4 cleared"},
@@ -162,7 +164,7 @@ TEST(Decoding, AcceptsEveryFormOfValue) {
   }
 }
 
-TEST(Decoding, LaysStringsEndToEndWithinTheirRoom) {
+TEST(Decoding, StoresStringsEndToEndAndNotPastTheirBuffer) {
   const auto reply = replyWith(
       "30 00 06 01 2B 04 03 61 62 63  30 00 06 01 2B 02 01 05  30 00 06 01 2B 40 04 64 65 66 67"
       "30 00 06 01 2B 44 02 78 79");
@@ -181,11 +183,11 @@ TEST(Decoding, LaysStringsEndToEndWithinTheirRoom) {
   }
 }
 
-TEST(Decoding, ChecksTheListsLengthAndEveryBindingsRoomAndForm) {
+TEST(Decoding, RefusesWhatIsMalformedOrDoesNotFitAndAcceptsTheRest) {
   const std::string head = "02 01 00 04 00", pdu = "02 01 07 02 01 00 02 01 00",
                     bindings = "30 00 06 01 2B 05 00 30 00 06 01 2B 02 01 02",
                     list = head + "a2 1A" + pdu + "30";
-  // The number of bindings is -1 for a refused message.
+  // Each row ends with the number of decoded bindings, or -1 if the message is refused.
   const std::tuple<const char*, std::vector<std::uint8_t>, std::int64_t> cases[] = {
       {"stated lengths of message and PDU too small",
        hex("30 00" + head + "a2 01" + pdu + "30 0F" + bindings), 2},
@@ -236,14 +238,14 @@ TEST(Encoding, RefusesMessagesThatExceedTheBufferOr16BitLengths) {
   EXPECT_EQ(longest, 65535U);
   m.octets[0].length = 0;
   m.message.varbind_count = 2;
-  EXPECT_TRUE(m.encode().empty()) << "one binding more than the array has";
+  EXPECT_TRUE(m.encode().empty()) << "the array has only one binding";
   m.message.varbind_count = 1;
   m.varbinds[0].octets_value = nullptr;
   EXPECT_TRUE(m.encode().empty());
 }
 
-// Returns what net-snmp reads in a message: the PDU's type, the request identifier, and every
-// binding's type and value.
+// Returns the parts of a message as net-snmp reads them: the PDU's type, the request identifier,
+// and the type and value of each binding.
 std::string readByNetSnmp(std::vector<std::uint8_t> bytes) {
   netsnmp_session session{};
   snmp_sess_init(&session);
@@ -280,7 +282,7 @@ TEST(NetSnmpReads, TheProgramsRequest) {
   EXPECT_EQ(readByNetSnmp(m.encode()), "163 7");
 }
 
-TEST(NetSnmpReads, EveryTypeOfValue) {
+TEST(NetSnmpReads, EveryTypeOfValueOfSnmpv1) {
   const std::uint16_t arcs[] = {1, 3, 127, 128, 16383, 16384, 65535};
   const std::uint8_t types[] = {2, 65, 66, 67, 2, 4, 64, 68, 6, 5};
   Message m(std::size(types), std::size(arcs));

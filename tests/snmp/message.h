@@ -9,7 +9,7 @@
 
 namespace onramp {
 
-/// Returns the bytes that `text` spells in hexadecimal. Spaces are ignored.
+/// Returns the bytes that `text` has in hexadecimal. Spaces are ignored.
 inline std::vector<std::uint8_t> hex(std::string_view text) {
   std::vector<std::uint8_t> bytes;
   int digits = 0;
@@ -22,14 +22,15 @@ inline std::vector<std::uint8_t> hex(std::string_view text) {
   return bytes;
 }
 
-/// Returns net-snmp's reply to request 7 for ActiveIF. The value is 2.
+/// Returns a reply that net-snmp sent to request 7 for ActiveIF. The value is 2.
 inline std::vector<std::uint8_t> realReply() {
   return hex(
       "30 30 02 01 00 04 08 63 6f 72 72 69 64 6f 72 a2 21 02 01 07 02 01 00 02 01 00 30 16 30 14 "
       "06 0f 2b 06 01 04 01 a1 12 02 04 04 89 58 01 02 00 02 01 02");
 }
 
-/// Returns a reply to request 7 with `bindings`, at most 255 bytes in hexadecimal.
+/// Returns a reply to request 7 with `bindings`, at most 255 bytes, as hexadecimal text. Some of
+/// the declared lengths in the reply are 0.
 inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8_t errorStatus = 0,
                                            std::uint8_t errorIndex = 0) {
   const auto list = hex(bindings);
@@ -41,8 +42,9 @@ inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8
   return reply;
 }
 
-/// A request with `bindings` NULL bindings, all named 1.3.1.1…. Its storage is in heap blocks
-/// without spare room, so that the sanitizers report an access past the end.
+/// A request with `bindings` NULL bindings, all named 1.3.1.1…, and the storage for a reply. Each
+/// name has room for `arcsEach` arcs, and all strings together for `stringBytes` bytes. The heap
+/// blocks have no spare room, so that the sanitizers report an access past the end.
 struct Message {
   explicit Message(std::size_t bindings, std::uint16_t arcsEach = 14,
                    std::uint16_t stringBytes = 1500)

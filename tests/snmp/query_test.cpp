@@ -1,4 +1,4 @@
-// Queries agents that the tests script; see tests/recording/agents.h.
+// Queries simulated agents; see tests/recording/agents.h.
 
 #include "snmp/query.h"
 
@@ -26,7 +26,7 @@ class Query : public testing::Test {
  protected:
   void SetUp() override {
     agents.reset();
-    snmp_request_counter = 7;  // the identifier in replyWith()'s replies
+    snmp_request_counter = 7;  // the identifier in the replies of replyWith()
   }
   void TearDown() override {
     snmp_oid& name = active_interface_table.entries[0].oid;
@@ -41,7 +41,8 @@ class Query : public testing::Test {
   Agents& agents = Agents::instance();
 };
 
-// Returns a query's results as text: the numbers, the no-reply flag, the error status and index.
+// Makes a query and returns its results as text: the numbers or "nothing", "no reply" if that flag
+// is set, the error status and the error index.
 std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
   bool noReply = false;
   std::int32_t status = -1;
@@ -56,7 +57,7 @@ std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
          " " + std::to_string(index);
 }
 
-// Returns a binding of the name 1.3 to `value`. Both texts are hexadecimal.
+// Returns a binding with the name 1.3 and the value `value`. Both texts are hexadecimal.
 std::string binding(const std::string& value) {
   return "30 00 06 01 2B " + value;
 }
@@ -99,7 +100,7 @@ TEST_F(Query, BuildsTheResultFromTheValuesThatATableAsksFor) {
   EXPECT_EQ(ask(replyWith("")), "nothing 0 0");
 }
 
-TEST_F(Query, SendsTheNextIdentifierAndWaitsTwoSecondsAtMost) {
+TEST_F(Query, SendsTheNextIdentifierAndWaitsAtMostTwoSeconds) {
   EXPECT_EQ(kFirstIdentifier, 0);
   agents.answers["127.0.1.2"] = {2};
   bool noReply = false;
@@ -113,7 +114,7 @@ TEST_F(Query, SendsTheNextIdentifierAndWaitsTwoSecondsAtMost) {
   EXPECT_THAT(agents.waits, ElementsAre(std::chrono::seconds(2), std::chrono::seconds(2)));
 }
 
-TEST_F(Query, DistinguishesSilenceFromAnImpossibleRequest) {
+TEST_F(Query, ReportsAFailedRequestAsNoReplyButNotANullArgument) {
   EXPECT_EQ(outcome(&active_interface_table), kNoReply);
   agents.answers["192.0.2.1"] = {Agents::kRefused};
   EXPECT_EQ(outcome(&active_interface_table), kNoReply);
@@ -131,7 +132,7 @@ TEST_F(Query, AsksForTheNameOfTheLatestReply) {
   EXPECT_EQ(active_interface_table.entries[0].oid.count, 6);
   snmp_request_counter = 7;
   reply(realReply());
-  EXPECT_EQ(outcome(&active_interface_table), kNoReply) << "6 arcs fit, not 14";
+  EXPECT_EQ(outcome(&active_interface_table), kNoReply) << "the name has 14 arcs, but only 6 fit";
 }
 
 TEST_F(Query, ReturnsTheStatusOfTheExchange) {
@@ -143,17 +144,18 @@ TEST_F(Query, ReturnsTheStatusOfTheExchange) {
   EXPECT_EQ(snmp_exchange(m.message, "somewhere", 0), SNMP_OK) << "all other modes send";
   EXPECT_THAT(agents.asked, ElementsAre("255.255.255.255"));
   EXPECT_EQ(std::string(m.message.community, m.message.community_length), "corridor")
-      << "not the reply's community";
+      << "the community is not that of the reply";
 
   snmp_request_counter = 6;
   EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT)
-      << "answers an earlier request";
+      << "the reply is to another request";
   agents.socketsOpen = false;
   EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork), SNMP_ERR_TRANSPORT);
   EXPECT_EQ(snmp_request_to_address(nullptr, "192.0.2.1"), SNMP_ERR_TRANSPORT);
   m.varbinds[0].name = nullptr;
   snmp_request_counter = INT32_MAX;
-  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_CODEC) << "no name";
+  EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_CODEC)
+      << "a binding has no name";
   EXPECT_EQ(snmp_request_counter, INT32_MIN);
 }
 
@@ -175,12 +177,13 @@ TEST(Addresses, AreNormalizedPartByPart) {
 constexpr std::size_t kPduTagAt = 15;  // the offset of the PDU's tag in a short message
 const std::int64_t kFirstExtendedIdentifier = snmp_request_counter_ext;
 
-// Has two slots for strings, each followed by "##", and one slot for a number.
+// Has two slots for strings and one for a number. "##" follows each string's storage, so that a
+// test sees whether something was written past the end.
 class GetSet : public testing::Test {
  protected:
   void SetUp() override {
     agents.reset();
-    // Returns the request unless the test sets another reply.
+    // The agent sends the request back unless the test sets `reply`.
     agents.reply = [this](const Agents::Bytes& request) {
       sent = request;
       return reply.empty() ? request : reply;
@@ -200,7 +203,7 @@ class GetSet : public testing::Test {
     m.message.pdu_type = kind;
     return snmp_get(m.message, std::span(slots).first(count), "192.0.2.1", kModeNetwork);
   }
-  // Binding i uses slot number indexes[i].
+  // Binding i uses the slot with the number indexes[i].
   snmp_status set(const std::vector<std::uint32_t>& indexes) {
     snmp_message_init(m.message, indexes.size());
     for (std::size_t i = 0; i < indexes.size(); ++i)
@@ -221,8 +224,8 @@ class GetSet : public testing::Test {
 
 TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
-  // The reply, the second slot's capacity, and the contents of that slot afterwards. A refused
-  // reply leaves the contents as they were.
+  // Each row has the reply's bindings, the capacity of the second slot, and its contents
+  // afterwards. A refused reply does not change the contents.
   const std::tuple<const char*, std::string, std::uint16_t, std::string> cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},
@@ -247,7 +250,7 @@ TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   }
 }
 
-TEST_F(GetSet, SendTheSlotsThatTheIndexesNameIfTheyFitTheStorage) {
+TEST_F(GetSet, SetSendsTheSlotOfEachBindingUnlessTheStringsAreTooLong) {
   for (const std::uint16_t length : std::vector<std::uint16_t>{1, 17, 700}) {
     give(0, 700, length);
     give(1, 700, length);
@@ -271,7 +274,7 @@ TEST_F(GetSet, SendTheSlotsThatTheIndexesNameIfTheyFitTheStorage) {
   m.reset();
   m.octets[0].length = 4;
   m.varbinds[2].int_value = 70000;
-  EXPECT_EQ(set({0, 1, 2}), SNMP_OK) << "an address and a number come from the bindings";
+  EXPECT_EQ(set({0, 1, 2}), SNMP_OK) << "the address and the number come from the bindings";
   EXPECT_EQ(slots[2].int_value, 70000);
 }
 

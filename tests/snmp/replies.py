@@ -1,4 +1,4 @@
-"""SNMPv1 replies of devices, as bytes."""
+"""Makes the SNMPv1 replies of devices."""
 
 _ACTIVE_IF = bytes.fromhex("06 0f 2b 06 01 04 01 a1 12 02 04 04 89 58 01 02 00")
 
@@ -8,8 +8,8 @@ def _element(tag, *parts):
 
 
 def reply(identifier, number, status=0):
-    """Returns a reply to the request with that identifier, in bytes. The value of ActiveIF is
-    `number`, from 0 to 32767."""
+    """Returns the bytes of a reply to the request with the identifier `identifier`, also in bytes.
+    `number`, from 0 to 32767, is the value of ActiveIF."""
     value = _element(2, number.to_bytes(2, "big"))
     pdu = _element(0xA2, _element(2, identifier), _element(2, bytes([status])), _element(2, b"\0"),
                    _element(0x30, _element(0x30, _ACTIVE_IF, value)))

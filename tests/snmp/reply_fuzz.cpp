@@ -1,6 +1,6 @@
-// Uses every input as an agent's reply to a query, a get and a set. Nothing may be written past the
-// storage that the caller provides. The storage has no spare room, so the sanitizers report such a
-// write. A message that can be decoded is also encoded and decoded again.
+// Uses each input as an agent's reply to a query, a get and a set. Nothing may be written past the
+// storage that the caller provides. That storage has no spare room, so the sanitizers report a
+// write past its end. If the input can be decoded, the message is also encoded and decoded again.
 
 #include <algorithm>
 #include <array>
@@ -54,11 +54,12 @@ void exchangeStrings(bool set) {
   }
   (set ? snmp_set : snmp_get)(m.message, slots, kAddress, kModeNetwork);
   for (std::size_t i = 0; i < kSlots; ++i)
-    require(octets[i].length <= texts[i].size(), "a string fits its slot");
+    require(octets[i].length <= texts[i].size(), "a string fits in its slot");
 }
 
-// Whether the decoder can read what the encoder writes for `binding`. It cannot for unknown types,
-// which are written without a value, and for unsigned numbers of 2^31 or more, which take 5 bytes.
+// Returns whether the decoder can read `binding` after the encoder has written it. The decoder
+// cannot read unknown types, which are written without a value, and unsigned numbers of 2^31 or
+// more, which take 5 bytes.
 bool isReadable(const snmp_varbind& binding) {
   const std::uint64_t type = binding.type;
   if (type >= kTagCounter && type <= kTagTimeTicks)
@@ -78,12 +79,15 @@ void encodeAndDecode(std::span<const std::uint8_t> bytes) {
   if (written.empty()) return;  // an object identifier that cannot be encoded
 
   Message second(kBindings);
-  require(!second.decode(written) && second.message.varbind_count == count, "it can be read back");
+  require(!second.decode(written) && second.message.varbind_count == count,
+          "an encoded message can be decoded");
   for (std::size_t i = 0; i < count; ++i) {
     const snmp_varbind& one = bindings[i];
     const snmp_varbind& other = second.message.varbinds[i];
-    require(one.type == other.type && one.name->count == other.name->count, "type and name stay");
-    require(one.octets_value->length == other.octets_value->length, "a string's length stays");
+    require(one.type == other.type && one.name->count == other.name->count,
+            "the type and the name's length stay the same");
+    require(one.octets_value->length == other.octets_value->length,
+            "the string's length stays the same");
   }
 }
 

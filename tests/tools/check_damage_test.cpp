@@ -20,7 +20,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// A copy of the example medium, which a test damages at random, in one place at a time.
+/// A copy of the example medium, for damage in one random place at a time.
 class DamagedMedium {
  public:
   DamagedMedium() {
@@ -38,8 +38,8 @@ class DamagedMedium {
 
   [[nodiscard]] std::string path() const { return root_.string(); }
 
-  /// Damages one file, with `number` as the seed of all random choices, and returns a description.
-  /// mend() restores the file.
+  /// Damages one file and returns a description of the damage. `number` is the seed of all random
+  /// choices. mend() restores the file.
   std::string damage(unsigned number) {
     random_.seed(number);
     const fs::path file = files_[below(files_.size())];
@@ -68,8 +68,8 @@ class DamagedMedium {
     std::ofstream(file, std::ios::binary) << bytes;
   }
 
-  // Returns a copy in which one random key below `dictionary` is removed, renamed or given another
-  // kind of value. Appends a description to `what`.
+  // Returns a copy of `dictionary` in which one random key, at any depth, is removed, renamed or
+  // given a value of another kind. Appends a description of the change to `what`.
   Dictionary damagedCopy(const Dictionary& dictionary, std::string& what) {
     std::vector<Dictionary::Pair> pairs(dictionary.begin(), dictionary.end());
     if (pairs.empty()) return dictionary;
@@ -96,8 +96,8 @@ class DamagedMedium {
   std::minstd_rand random_;
 };
 
-// Returns the name of the page that the wizard shows at the start, followed by " opens " and a name
-// for each thing that the wizard opens at once. Returns " refused" when it shows an alert instead.
+// Starts the wizard and returns the name of the first page. " opens " and a path follow for each
+// file that the wizard opens at once. If the wizard shows an alert, returns " refused".
 std::string startOfTheWizard() {
   recording::FrontEnd& screen = recording::FrontEnd::instance();
   screen.reset();
@@ -112,8 +112,8 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the page that `report` predicts. No page is shown on an unsupported system, whatever the
-// models are.
+// Returns the name of the first page that `report` predicts. If the wizard refuses the system,
+// there is no page.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";

@@ -1,5 +1,5 @@
-// Searches the real network for SECONDS with the wizard's device chooser. Then prints the names of
-// the listed devices, one on each line.
+// Searches the network for SECONDS with the wizard's own device chooser. Then prints the names of
+// the devices in the chooser's list, one on each line.
 //
 //   chooser_probe APPLICATION SECONDS MODEL…
 

@@ -1,4 +1,5 @@
-"""Installs a build into a new folder and uses it there. Arguments: cmake, and the build's folder."""
+"""Installs a build into a new folder and uses the installed programs. Arguments: cmake, and the
+build's folder."""
 
 import os
 import pathlib

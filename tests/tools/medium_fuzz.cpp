@@ -1,5 +1,5 @@
-// Uses every input as one file of the example medium. Its first byte chooses the file. The wizard's
-// own records of the medium and the report of onramp-check must then agree.
+// Puts each input in place of one file of the example medium. The input's first byte chooses the
+// file. Then the wizard's own records of the medium and the report of onramp-check must agree.
 
 #include <array>
 #include <cstdint>
@@ -21,7 +21,7 @@ namespace {
 using namespace onramp;  // NOLINT(google-build-using-namespace)
 namespace fs = std::filesystem;
 
-// The letters a, b, c … choose these files.
+// The first byte 'a' chooses the first file, 'b' the second, and so on.
 constexpr std::array<const char*, 6> kFiles = {
     "Onramp OSX.app/Contents/Info.plist",
     "MacResources/CDCommonInfo.plist",
@@ -35,7 +35,7 @@ constexpr const char* kTexts = "MacResources/CDCommonMessage.bundle/Contents/Res
 struct ExampleMedium : recording::MediumFolder {
   ExampleMedium() {
     fs::copy(ONRAMP_EXAMPLE_MEDIUM, path(""), fs::copy_options::recursive);
-    for (const char* language : {"ja", "ko", "zh_CN"})  // two languages are enough, and faster
+    for (const char* language : {"ja", "ko", "zh_CN"})  // reading only two languages is faster
       fs::remove_all(path(std::string(kTexts) + language + ".lproj"));
     write(kFiles[0], Dictionary{{"CFBundleName", "Onramp OSX"},
                                 {"CommonResourcePath", "MacResources/CDCommonInfo.plist"}});

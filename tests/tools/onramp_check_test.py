@@ -1,5 +1,6 @@
-"""Makes one mistake at a time in a copy of a medium and reads what onramp-check reports.
-Arguments: the program, and the example medium with the application on it."""
+"""Makes one mistake at a time in a copy of the example medium, and compares the findings of
+onramp-check with the expected ones. Arguments: the program, and the example medium with the
+application on it."""
 
 import json
 import os
@@ -38,7 +39,8 @@ def run(*arguments, **options):
                           check=False, **options)
 
 
-# Most of these functions return a breaker: a function that makes one mistake in a medium's folder.
+# Most of the next functions return a breaker: a function that makes one mistake in a medium. Its
+# argument is the medium's folder.
 
 def edit(path, change, form=plistlib.FMT_XML):
     def breaker(folder):
@@ -121,7 +123,7 @@ def maximum(major, minor, bug_fix):
     return put(COMMON, "SystemMax", {"Major": major, "Minor": minor, "BugFix": bug_fix})
 
 
-# For each mistake: its breaker, the identifier of the only finding, and parts of the report on it.
+# Each row has the breaker of a mistake, the identifier of the only finding, and parts of its texts.
 MISTAKES = [
     # Property lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
@@ -136,7 +138,7 @@ MISTAKES = [
     (rename(DESCRIPTION, "PKG_WebLink", "PKG_WebLnk", "InstallPKG"), "key-misspelt", "PKG_WebLink"),
     (put(MODELS, "Model", MODEL, "Interfaces", "USB", "NO"), "value-kind", '"NO"', "<false/>"),
     (put(MODELS, "Model", MODEL, "x"), "value-kind", "a dictionary", "USB only"),
-    (cut_binary, "list-unreadable", "cut off", "opens at once"),
+    (cut_binary, "list-unreadable", "trailer", "opens at once"),
     (replace(MODELS, "</dict>", "</array>"), "list-unreadable", '"</dict>" is expected'),
     (replace(MODELS, "<true/>", "<treu/>"), "list-unreadable", "<treu>", "line 12"),
     (replace(MODELS, "<true/>", ""), "list-unreadable", "no value follows"),

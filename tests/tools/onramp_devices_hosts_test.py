@@ -1,4 +1,4 @@
-"""Runs "onramp-devices hosts" in a new network namespace; see tests/in_namespace.
+"""Runs "onramp-devices hosts". tests/in_namespace runs this test in a new network namespace.
 Arguments: the program, and the script that sets up a network to search."""
 
 import socket
@@ -54,7 +54,7 @@ class Hosts(unittest.TestCase):
         self.assertEqual(sorted(devices[256:]),
                          [answer("192.0.2.11", 1), answer("192.0.2.12", 2)] + [answer("192.0.2.13", 7)] * 3)
 
-    def test_tells_when_its_output_cannot_be_written(self):
+    def test_reports_that_its_output_cannot_be_written(self):
         with open("/dev/full", "w", encoding="utf-8") as full:
             result = run("-n", stdout=full)
         self.assertEqual(result.returncode, 2)

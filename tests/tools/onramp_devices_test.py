@@ -1,6 +1,6 @@
-"""Compares onramp-devices with net-snmp and with the wizard's own chooser, on a practice network that
-has a device for nearly every verdict. Arguments: the program, chooser_probe, a medium with the
-application on it."""
+"""Compares onramp-devices with net-snmp's snmpget and with the wizard's own device chooser, on a
+practice network that has a device for nearly every verdict. Arguments: the program, chooser_probe,
+and a medium with the application on it."""
 
 import json
 import os
@@ -21,7 +21,8 @@ PROGRAM, PROBE, MEDIUM = map(os.path.abspath, sys.argv[1:4])
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
 MAKER_AND_MODEL = 'maker = "Kestrel"\nmodel = "Model 100"\n'
 
-# Verdict → the entries of a device that gets it. The device's name is the verdict.
+# For most verdicts, the entries of a device that gets the verdict. The verdict is also the device's
+# name.
 DEVICES = {
     "listed": MAKER_AND_MODEL,
     "on-cable": MAKER_AND_MODEL + "activeif = 1",
@@ -53,8 +54,8 @@ def tlv(tag, *parts):
 
 
 def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
-    """Returns a function that makes a request's reply from these parts. A `number` other than 0
-    makes the reply's request identifier differ from the request's."""
+    """Returns a function that turns a request into a reply with these parts. If `number` is not 0,
+    the reply's identifier differs from the request's. `seconds` delay the reply."""
     def answer(request):
         time.sleep(seconds)
         at = request.index(b"corridor") + 12
@@ -66,7 +67,8 @@ def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, second
     return answer
 
 
-# The reply, or nothing for a closed port → the outcome, the value, and what snmpget prints.
+# Each row has the reply (None for a closed port), the outcome and the value in JSON, and a text
+# that snmpget prints.
 REPLIES = [
     *((reply(tlv(2, bytes((n & 255,)))), "value", n, f"INTEGER: {n}") for n in (2, 1, -1)),
     *((reply(value), "other-type", None, text) for value, text in (
@@ -123,11 +125,11 @@ class Everybody(unittest.TestCase):
         self.assertGreater(devices["no-answer"]["delay"]["seconds"], 11)
         self.assertGreater(devices["late"]["answer"]["exchanges"][0]["seconds"], 2.4)
 
-    def test_the_list_equals_the_wizards_for_every_model(self):
+    def test_lists_the_same_devices_as_the_wizard_for_every_model(self):
         with open(pathlib.Path(MEDIUM, "MacResources", "CDInfo.plist"), "rb") as file:
             models = list(plistlib.load(file)["ContainedModel"])
         searches = [[model] for model in models] + [models]
-        for seconds in ("6", "40"):  # a busy machine needs the longer search
+        for seconds in ("6", "40"):  # the second search is for a busy machine
             explained = [start(*browse("-s", seconds, *(f"--model={model}" for model in wanted)))
                          for wanted in searches]
             shown = [start(PROBE, f"{MEDIUM}/Onramp OSX.app", seconds, *wanted) for wanted in searches]
@@ -142,7 +144,7 @@ class Everybody(unittest.TestCase):
         self.assertEqual(devices[models.index("Kestrel Model 200")]["listed"]["verdict"]["id"],
                          "other-model")
 
-    def test_asks_as_net_snmp_does(self):
+    def test_ask_agrees_with_snmpget_about_every_reply(self):
         asked = []
         for number, (answer, *expected) in enumerate(REPLIES):
             address = f"127.0.8.{number + 1}"

@@ -1,4 +1,4 @@
-"""Tests the practice network with the usual tools for mDNS and SNMP."""
+"""Tests the practice network with avahi-browse and snmpget."""
 
 import os
 import pathlib
@@ -42,7 +42,7 @@ def run(*command, **options):
 
 
 def browse(service_type):
-    """Returns name → (address, port, TXT entries) for all announced devices."""
+    """Returns the services of the type as a dictionary: name → (address, port, set of TXT entries)."""
     output = run("avahi-browse", "-rptk", service_type).stdout
     rows = [line.split(";", 9) for line in output.splitlines() if line.startswith("=")]
     unescape = lambda text: re.sub(rb"\\(\d{3})", lambda match: bytes([int(match[1])]),
@@ -52,7 +52,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Runs inside a practice network of DEVICES, as its command."""
+    """Tests that run inside a practice network with DEVICES, as the network's command."""
 
     def setUp(self):
         self.network = PracticeNetwork()
@@ -116,7 +116,7 @@ class FromOutside(unittest.TestCase):
         path.write_text(text)
         return str(path)
 
-    def test_described_devices_are_there_for_the_command(self):
+    def test_the_command_runs_among_the_described_devices(self):
         result = run(TOOL, self.describe(DEVICES), sys.executable, "-B", __file__, "FromInside")
         self.assertEqual(result.returncode, 0, result.stderr)
 
@@ -125,14 +125,14 @@ class FromOutside(unittest.TestCase):
         self.assertEqual((result.stdout.count('"established"'), result.stdout.count('"withdrawn"')),
                          (19, 1), result.stderr)
 
-    def test_the_exit_status_is_the_commands(self):
+    def test_the_exit_status_is_that_of_the_command(self):
         description = self.describe("")
         for command, status in ((["sh", "-c", "exit 5"], 5), (["sh", "-c", "kill -9 $$"], 137),
                                 (["/no/such/program"], 127)):
             with self.subTest(command):
                 self.assertEqual(run(TOOL, description, *command).returncode, status)
 
-    def test_nothing_is_left_when_the_tool_is_ended(self):
+    def test_no_process_is_left_when_the_tool_is_ended(self):
         for number, status in ((signal.SIGKILL, -9), (signal.SIGTERM, 143)):
             with self.subTest(number):
                 tool = subprocess.Popen(

@@ -4,12 +4,14 @@
 
 namespace onramp::check {
 
-/// The application's usual name, assumed for a medium without an application.
+/// The usual name of the wizard's application. checkMedium() assumes it for a medium without an
+/// application.
 inline constexpr const char* kUsualName = "Onramp OSX.app";
 
-/// Returns the name of the application at the top of the medium in the folder `root`. If there are
-/// several, returns the first one in alphabetical order that looks like the wizard, or the first of
-/// all if none does. Returns an empty string when there is no application.
+/// Returns the name of the application in `root`, the medium's top folder. If there are several,
+/// takes the first in alphabetical order whose name is kUsualName or whose Info.plist has
+/// "CommonResourcePath". Without such an application, takes the first of all. Returns an empty
+/// string when there is no application.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
 }  // namespace onramp::check

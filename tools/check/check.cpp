@@ -20,13 +20,13 @@ Report checkMedium(const std::string& root) {
       folder + "/" + (report.application.empty() ? kUsualName : report.application);
   setMainBundlePath(application);
   if (report.application.empty()) {
-    report.findings.push_back(
-        {.id = "application-missing",
-         .place = {.file = kUsualName},
-         .found = "no application at the medium's top",
-         .expected = "the wizard, beside \"MacResources\"",
-         .effect = "there is nothing to double-click",
-         .remedy = "copy the application there; until then, its usual settings are assumed"});
+    report.findings.push_back({.id = "application-missing",
+                               .place = {.file = kUsualName},
+                               .found = "no application at the medium's top",
+                               .expected = "the wizard, beside \"MacResources\"",
+                               .effect = "there is nothing to double-click",
+                               .remedy = "copy the application to the medium's top; until then, "
+                                         "its usual settings are assumed here"});
   }
   const MediumFiles files(folder, application, report);
   const Lists lists = readLists(files);

@@ -9,28 +9,29 @@
 namespace onramp::check {
 
 enum class Severity {
-  kError,    ///< users will see something wrong
+  kError,    ///< users will probably see something wrong
   kWarning,  ///< this may be intended, but often is not
 };
 
 /// Where a mistake was found.
 struct Place {
-  std::string file{};                 ///< relative to the medium
-  std::vector<std::string> key{};     ///< the path of keys in a property list or strings table
+  std::string file{};  ///< relative to the medium
+  std::vector<std::string>
+      key{};  ///< the keys that lead to the value in a property list or strings table
   std::optional<std::size_t> line{};  ///< from 1
   std::optional<std::size_t> byte{};  ///< from 0, in a file that is not text
 };
 
-/// One mistake on a medium. The texts are phrases without a full stop. writeText() leaves out empty
-/// ones.
+/// One mistake on a medium. `found`, `expected`, `effect` and `remedy` are phrases without a full
+/// stop. writeText() leaves out those that are empty.
 struct Finding {
-  std::string id{};  ///< names the rule; stable, for programs
+  std::string id{};  ///< the broken rule's name, such as "key-missing"; programs rely on it
   Severity severity = Severity::kError;
   Place place{};
   std::string found{};
   std::string expected{};
   std::string nearest{};  ///< the known spelling that was probably meant
-  std::string effect{};   ///< what users will see because of it
+  std::string effect{};   ///< what users will see because of the mistake
   std::string remedy{};
 };
 

@@ -45,8 +45,8 @@ void checkDeclared(const Lists& lists, const std::string& type, Report& report) 
                              .place = {.file = lists.informationPath, .key = {kDeclared}},
                              .found = "no " + quoted(bare),
                              .expected = "the medium's service type, without its closing dot",
-                             .effect = "on macOS 11 and later, " + std::string(kNoDevice),
-                             .remedy = "add it"});
+                             .effect = "on macOS 15 and later, " + std::string(kNoDevice),
+                             .remedy = "add the type"});
 }
 
 void checkServiceType(const Lists& lists, Report& report) {
@@ -122,7 +122,7 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.id = "vendor-letters";
     finding.severity = Severity::kWarning;
     finding.found = quoted(*written) + ", with characters outside ASCII";
-    finding.expected = "letters from A to Z, digits, spaces";
+    finding.expected = "only the letters A to Z, digits and spaces";
     finding.effect = "a folder and files whose names some programs encode differently";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));

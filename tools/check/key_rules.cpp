@@ -64,7 +64,7 @@ const char* expectationOf(Kind kind) {
   return "any value";
 }
 
-// Returns how to correct a value that is not of the kind `kind`.
+// Returns the remedy for a value that should be of the kind `kind`.
 std::string remedyFor(Kind kind, const Value& value) {
   if (kind != Kind::kBoolean) return std::string("write ") + expectationOf(kind);
   const auto* const text = value.as<std::string>();
@@ -97,8 +97,8 @@ class KeyCheck {
                                     .severity = Severity::kWarning,
                                     .place = place_.of(key),
                                     .found = "a key that the wizard does not read",
-                                    .effect = "none: the key is ignored",
-                                    .remedy = "remove it"});
+                                    .effect = "none, because the wizard ignores the key",
+                                    .remedy = "remove the key"});
       }
     }
   }

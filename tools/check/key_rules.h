@@ -10,7 +10,10 @@
 
 namespace onramp::check {
 
+/// The kind of value that a key must have.
 enum class Kind { kText, kPath, kBoolean, kNumberOrText, kDictionary, kAny };
+
+/// How a missing key is reported: as an error, as a warning, or not at all.
 enum class Need { kRequired, kAdvised, kOptional };
 
 /// A key that the wizard reads from a dictionary.
@@ -18,11 +21,12 @@ struct KeyRule {
   std::string_view key;
   Kind kind;
   Need need;
-  const char* otherwise;  ///< what users see when the key is absent or its value is of another kind
-  const char* meaning = "";  ///< of the value, where its kind alone does not explain it
+  const char* otherwise;     ///< the effect of an absent key and of a value of another kind
+  const char* meaning = "";  ///< says more about the expected value than its kind does
 };
 
-/// The location of a dictionary: its file and the path of keys that leads to it.
+/// The location of a dictionary: its file, and the keys that lead to it from the outermost
+/// dictionary.
 struct DictionaryPlace {
   std::string file;
   std::vector<std::string> path;
@@ -30,17 +34,16 @@ struct DictionaryPlace {
   [[nodiscard]] Place of(std::string_view key) const;
 };
 
-/// What to do with a key that no rule names.
+/// Says whether a key that no rule names is reported.
 enum class OtherKeys { kReported, kAllowed };
 
 /// Reports keys of `dictionary` that are unknown, misspelt or missing, and values of the wrong
-/// kind. An unknown key that is spelled almost like an absent known key is reported as a
-/// misspelling of it, even where other keys are allowed.
+/// kind. A key is misspelt if it is unknown and spelled almost like a known key that is absent.
+/// Misspelt keys are reported even where other keys are allowed.
 void checkKeys(const Dictionary& dictionary, const DictionaryPlace& place,
                std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report);
 
-/// Returns the value's kind in words, followed by the value itself if it is a boolean, a number or
-/// a text.
+/// Returns the value's kind in words. For a boolean, a number or a text, the value itself follows.
 [[nodiscard]] std::string described(const Value& value);
 
 }  // namespace onramp::check

@@ -16,9 +16,11 @@ namespace onramp::check {
 namespace {
 
 constexpr const char* kPackageAtOnce =
-    "no page: every model counts as one without wireless, so the package opens at once";
-constexpr const char* kNoModels = "no page: the medium has no models, so the package opens at once";
+    "every model counts as one without wireless, so the package opens at once, without any page";
+constexpr const char* kNoModels =
+    "the medium has no models, so the package opens at once, without any page";
 constexpr const char* kNoPackage = "nothing opens when the wizard ends";
+constexpr const char* kNoVersionPackage = "nothing opens on the systems that use this key";
 
 constexpr std::array kInformationRules{
     KeyRule{"CommonResourcePath", Kind::kPath, Need::kRequired, kNoModels},
@@ -35,8 +37,9 @@ constexpr std::array kResourceRules{
             "every older system is accepted"},
     KeyRule{medium::kSystemMax, Kind::kDictionary, Need::kOptional,
             "every newer system is accepted"},
-    KeyRule{medium::kVenderName, Kind::kText, Need::kRequired,
-            "the package does not find the wizard's files: their names lack the maker's name"},
+    KeyRule{
+        medium::kVenderName, Kind::kText, Need::kRequired,
+        "the package does not find the wizard's files, because their names lack the maker's name"},
     KeyRule{medium::kWLANtool, Kind::kPath, Need::kOptional,
             "no set-up tool runs after a search that finds no wireless device"},
 };
@@ -44,12 +47,12 @@ constexpr std::array kResourceRules{
 constexpr std::array kPackageRules{
     KeyRule{"PkgLocation", Kind::kPath, Need::kRequired, kNoPackage},
     KeyRule{"PkgName", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"104", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"105", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"106", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"107", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"108", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"109", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"104", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"105", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"106", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"107", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"108", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"109", Kind::kText, Need::kOptional, kNoVersionPackage},
 };
 
 constexpr std::array kMinimumRules{
@@ -61,9 +64,9 @@ constexpr std::array kMinimumRules{
 constexpr std::array kMaximumRules{
     KeyRule{"Major", Kind::kNumberOrText, Need::kRequired, "every newer system is accepted"},
     KeyRule{"Minor", Kind::kNumberOrText, Need::kRequired,
-            "the value counts as 0: every later minor version is refused"},
+            "the value counts as 0, so every later minor version is refused"},
     KeyRule{"BugFix", Kind::kNumberOrText, Need::kRequired,
-            "the value counts as 0: all of that minor version is refused"},
+            "the value counts as 0, so all of that minor version is refused"},
 };
 
 constexpr std::array kDescriptionRules{
@@ -81,12 +84,14 @@ constexpr std::array kTypeRules{
 };
 
 constexpr std::array kOptionRules{
-    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional, "the package gets the value unchanged"},
-    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional, "the value counts as true"},
+    KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional,
+            "the package does not get the intended value"},
+    KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional,
+            "an absent key counts as false, a value of another kind as true"},
     KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value unchanged"},
+            "the package does not get the intended value"},
     KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional,
-            "the package gets the value unchanged"},
+            "the package does not get the intended value"},
     KeyRule{"PKG_FontSet", Kind::kAny, Need::kOptional, "the fonts are not installed"},
 };
 
@@ -96,7 +101,8 @@ constexpr std::array kModelInformationRules{
 
 constexpr std::array kModelRules{
     KeyRule{"KSCID", Kind::kText, Need::kRequired,
-            "the model offers no connection at all: the package opens as soon as it is chosen",
+            "without \"KSCID\", the model offers no connection at all: the package opens as soon "
+            "as the model is chosen",
             ": the model's identifier at the support centre"},
     KeyRule{"Interfaces", Kind::kDictionary, Need::kAdvised, "the model has USB only"},
 };
@@ -113,7 +119,7 @@ bool isPackageVersion(const std::string& key) {
   return !key.empty() && std::all_of(key.begin(), key.end(), isASCIIDigit);
 }
 
-// Returns `package` without the keys of unknown versions, which checkPackages() reports.
+// Returns `package` without the version keys that have no rule. checkPackages() reports these.
 Dictionary withoutOtherVersions(const Dictionary& package) {
   std::vector<Dictionary::Pair> pairs;
   for (const auto& pair : package) {
@@ -124,7 +130,8 @@ Dictionary withoutOtherVersions(const Dictionary& package) {
   return Dictionary(std::move(pairs));
 }
 
-// Applies the rules to the dictionary under `key`, if there is one.
+// Applies `rules` to the dictionary under `key` in `outer`, if there is one. `place` is the
+// location of `outer`.
 void checkInner(const Dictionary& outer, DictionaryPlace place, std::string_view key,
                 std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report) {
   const auto inner = outer.dictionary(key);
@@ -157,13 +164,12 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
     const DictionaryPlace place{path, {"Model", name}};
     const auto* const entry = value.as<Dictionary>();
     if (!entry) {
-      report.findings.push_back(
-          {.id = "value-kind",
-           .place = {.file = path, .key = place.path},
-           .found = described(value),
-           .expected = "a dictionary",
-           .effect = "the model has USB only",
-           .remedy = "write the model's dictionary, as other models have it"});
+      report.findings.push_back({.id = "value-kind",
+                                 .place = {.file = path, .key = place.path},
+                                 .found = described(value),
+                                 .expected = "a dictionary",
+                                 .effect = "the model has USB only",
+                                 .remedy = "write a dictionary, as for the other models"});
       continue;
     }
     checkKeys(*entry, place, kModelRules, OtherKeys::kReported, report);
@@ -171,8 +177,8 @@ void checkModels(const Dictionary& models, const std::string& path, Report& repo
   }
 }
 
-// Reads the property list whose path the resource dictionary has under `key`. Sets `path` to that
-// path, if there is one. Returns nothing when the wizard cannot read the list.
+// Reads the property list whose path is in the resource dictionary under `key`, and stores the path
+// in `path`. Returns nothing when there is no path or the wizard cannot read the list.
 std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists,
                                     std::string_view key, const char* what, const char* effect,
                                     std::string& path) {

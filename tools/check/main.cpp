@@ -1,4 +1,4 @@
-// onramp-check: reads a finished medium as the wizard does and reports what is wrong with it.
+// onramp-check reads a finished medium as the wizard does, and reports what is wrong with it.
 
 #include <CLI/CLI.hpp>
 #include <clocale>
@@ -22,14 +22,15 @@ constexpr int kFindings = 1;
 constexpr int kUnreadable = 2;
 
 constexpr const char* kFooter = R"(Examples:
-  onramp-check /Volumes/Setup          print what is wrong with that medium
-  onramp-check --json build/medium     print it as JSON, for a program
+  onramp-check /Volumes/Setup          print what is wrong with the medium
+  onramp-check --json build/medium     print the same as JSON, for a program
 
-Exit status: 0 when no error was found, 1 when an error (with --strict: or a
-warning) was found, 2 when the medium could not be read, the output could not be
+Exit status: 0 when no error was found, 1 when an error or, with --strict, a
+warning was found, 2 when the medium could not be read, the output could not be
 written or the command line is wrong.)";
 
-// Returns `status`, or kUnreadable after a message when standard output could not be written.
+// Returns `status` if standard output could be written. Otherwise prints a message and returns
+// kUnreadable.
 int finish(int status) {
   if (std::cout.flush()) return status;
   std::cerr << "onramp-check: the output could not be written; is its disk full?\n";
@@ -49,7 +50,7 @@ int run(int count, char* arguments[]) {
   bool texts = false;
   app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
-  app.add_flag("--strict", strict, "Exit with status 1 for warnings, too");
+  app.add_flag("--strict", strict, "Exit with status 1 even if there are only warnings");
   app.add_flag("--texts", texts, "Print the keys of the texts that a medium needs");
   try {
     app.parse(count, arguments);
@@ -86,7 +87,7 @@ int run(int count, char* arguments[]) {
 }  // namespace
 
 int main(int count, char* arguments[]) {
-  std::setlocale(LC_CTYPE, "");  // for the width of characters
+  std::setlocale(LC_CTYPE, "");  // columnsOf() needs it
   try {
     return run(count, arguments);
   } catch (const std::exception& error) {

@@ -35,8 +35,8 @@ std::vector<std::string> namesIn(const std::string& folder) {
   return names;
 }
 
-// Returns the components of a relative path with "." and ".." resolved; nothing when the path leads
-// out of its starting folder.
+// Returns the components of a relative path with "." and ".." resolved. Returns nothing when the
+// path leads out of its starting folder.
 std::optional<std::vector<std::string>> components(const std::string& path) {
   std::vector<std::string> parts;
   for (const fs::path& part : fs::path(path)) {
@@ -64,16 +64,18 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
-// `nearest` is the name on the medium that resembles the missing one. `isWritten` tells whether the
-// missing name is written on the medium. If it is not, the wizard's code has the name.
+// `nearest` is a name on the medium that resembles `missing`. `isWritten` says whether `missing` is
+// written in a file on the medium, and not fixed in the wizard.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
                              bool isWritten) {
-  if (!nearest) return isWritten ? "put it there, or correct the path" : "put it there";
+  if (!nearest)
+    return isWritten ? "put it at that path, or correct the path" : "put it at that path";
   const std::string rename = "rename the file to " + quoted(missing);
   return isWritten ? "write " + quoted(*nearest) + ", or " + rename : rename;
 }
 
-// Adds to `finding` why the wizard cannot read the bytes of a file, and where the mistake is.
+// Adds to `finding` the reason why the wizard cannot read `bytes`, a file's contents, and the
+// mistake's line or byte. `isStrings` says whether the file is a strings table.
 void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   ParseProblem problem;
   const auto text = bytes.starts_with("bplist") ? std::nullopt : decodedText(bytes);
@@ -118,7 +120,7 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
     finding.found = use.what + " at " + quoted(relative) + ", which leads out of the medium";
     finding.expected = "a path inside the medium";
     finding.remedy = "put the file on the medium and write its path from the medium's top";
-    finding.effect = "it works only where such a file happens to exist; elsewhere, " + use.effect;
+    finding.effect = "on a computer that lacks this file, " + use.effect;
     report_.findings.push_back(std::move(finding));
     return false;
   }
@@ -176,7 +178,7 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
   }
   if (finding.remedy.empty()) {
     finding.remedy = finding.place.line ? "correct that line or the one before it"
-                                        : "put an undamaged copy of the file there";
+                                        : "replace the file with an undamaged copy";
   }
   report_.findings.push_back(std::move(finding));
 }
@@ -189,12 +191,13 @@ std::optional<Dictionary> MediumFiles::list(const std::string& relative, const P
     return list;
   }
   for (const auto& [key, line] : linesOf(relative).twice) {
-    report_.findings.push_back({.id = "key-twice",
-                                .place = {.file = relative, .key = key, .line = line},
-                                .found = "a key that its dictionary already has",
-                                .expected = "every key once",
-                                .effect = "one of the two values; which one depends on the system",
-                                .remedy = "remove one of them"});
+    report_.findings.push_back(
+        {.id = "key-twice",
+         .place = {.file = relative, .key = key, .line = line},
+         .found = "a key that its dictionary already has",
+         .expected = "every key once",
+         .effect = "the wizard uses one of the two values; which one depends on the system",
+         .remedy = "remove one of the two"});
   }
   return list;
 }

@@ -11,47 +11,50 @@
 
 namespace onramp::check {
 
-/// The use of a file or folder, for findings about it.
+/// The wizard's use of a file or folder. Findings about the file quote these texts.
 struct PathUse {
-  Place place{};       ///< where its path is written; without a key, the wizard itself has the path
-  std::string what{};  ///< what it is, such as "the medium description"
-  std::string effect{};  ///< what users see when it is missing or unusable, a phrase
+  Place place{};         ///< where its path is written; no key if the path is fixed in the wizard
+  std::string what{};    ///< the file's role, such as "the medium description"
+  std::string effect{};  ///< what users see when the file is missing or unusable
 };
 
 /// The files of one medium. Relative paths start at the medium's top folder. exists(), list() and
-/// strings() add what is wrong with a file to the report.
+/// strings() add findings to the report, which must outlive this object.
 class MediumFiles {
  public:
-  /// `root` is the medium's folder. `application` is the path of the application's bundle in it,
-  /// which need not exist.
+  /// `root` is the medium's folder. `application` is the full path of the application's bundle in
+  /// that folder. The bundle need not exist.
   MediumFiles(std::string root, std::string application, Report& report);
 
   [[nodiscard]] const std::string& root() const { return root_; }
   [[nodiscard]] const std::string& application() const { return application_; }
   [[nodiscard]] Report& report() const { return report_; }
 
-  /// Returns the path at which the wizard looks for `relative`.
+  /// Returns the full path at which the wizard looks for `relative`.
   [[nodiscard]] std::string fullPath(const std::string& relative) const;
 
-  /// Returns whether `relative`, capitals included, is the path of a file or folder on the medium.
-  /// Reports the mistake if it is not.
+  /// Returns whether the medium has a file or folder at `relative`. Capital letters must match,
+  /// even where the file system ignores them. Reports a path that leads out of the medium or to
+  /// nothing.
   bool exists(const std::string& relative, const PathUse& use) const;
 
-  /// Returns the property list at `relative`, and reports keys that a dictionary in it has twice.
-  /// When exists() fails or the wizard cannot read the list, reports why and returns nothing.
+  /// Returns the property list at `relative`. If it is an XML list, reports each key that its
+  /// dictionary already has, except keys inside arrays. When exists() returns false or the wizard
+  /// cannot read the list, reports why and returns nothing.
   [[nodiscard]] std::optional<Dictionary> list(const std::string& relative,
                                                const PathUse& use) const;
 
-  /// Returns the strings table at `relative`. When exists() fails or the wizard cannot read the
-  /// table, reports why and returns nothing.
+  /// Returns the strings table at `relative`. When exists() returns false or the wizard cannot read
+  /// the table, reports why and returns nothing.
   [[nodiscard]] std::optional<Dictionary> strings(const std::string& relative,
                                                   const PathUse& use) const;
 
-  /// Returns the sorted names of the entries in the folder at `relative`; none when it cannot be
-  /// read.
+  /// Returns the sorted names of the entries in the folder at `relative`. Returns no names when the
+  /// folder cannot be read.
   [[nodiscard]] std::vector<std::string> names(const std::string& relative) const;
 
-  /// Adds the line number, if it is known, to each finding about a key of an XML property list.
+  /// Adds the line number to each finding in the report about a key of an XML property list, if the
+  /// line is known.
   void addLines() const;
 
  private:
@@ -62,7 +65,8 @@ class MediumFiles {
   std::string root_;
   std::string application_;
   Report& report_;
-  mutable std::map<std::string, XMLLines> lines_;  ///< of the property lists read so far
+  mutable std::map<std::string, XMLLines>
+      lines_;  ///< by the relative path of the property list; filled by linesOf()
 };
 
 }  // namespace onramp::check

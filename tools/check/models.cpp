@@ -39,8 +39,8 @@ class ModelCheck {
  public:
   ModelCheck(const Lists& lists, Report& report) : lists_(lists), report_(report) {}
 
-  // Reports names that only one of the two lists has. Two almost equal names, one from each list,
-  // are one finding.
+  // Reports names that only the medium description has or only the model information has. If two of
+  // these names, one from each list, are almost equal, they make one finding.
   void compareLists() {
     const auto contained = lists_.description->dictionary(kContained);
     const auto described = lists_.models->dictionary("Model");
@@ -71,7 +71,7 @@ class ModelCheck {
            .place = {.file = lists_.descriptionPath, .key = {std::string(kContained)}},
            .found = "no models",
            .expected = "the medium's models as keys",
-           .effect = "no page: the package opens at once",
+           .effect = "the package opens at once, without any page",
            .remedy = "add the models"});
     }
     std::map<std::string, std::string> spellings;
@@ -86,7 +86,7 @@ class ModelCheck {
                           " only in capital letters",
                  .expected = "each model once, spelled as its devices announce it",
                  .effect = "two entries in the list, only one of which finds its devices",
-                 .remedy = "remove the wrong one"});
+                 .remedy = "remove the one that no device announces"});
     }
   }
 
@@ -98,19 +98,21 @@ class ModelCheck {
   }
 
   static std::string sameName(std::string_view key, const std::optional<std::string>& nearest) {
-    return "the same name under " + quoted(std::string(key)) + " there" +
-           (nearest ? ", where the nearest is " + quoted(*nearest) : "");
+    return "the same name under " + quoted(std::string(key)) + " in that list" +
+           (nearest ? ", where the nearest name is " + quoted(*nearest) : "");
   }
 
-  // `meant` is the almost equal name that only the other list has.
+  // `meant` is the almost equal name that only the model information has. `nearest` is the most
+  // similar of all names in the model information.
   void undescribed(const std::string& name, const std::optional<std::string>& meant,
                    const std::optional<std::string>& nearest) {
-    add(name, {.id = "model-undescribed",
-               .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
-               .expected = sameName("Model", meant ? std::nullopt : nearest),
-               .nearest = meant.value_or(""),
-               .effect = "the model has USB only: the package opens as soon as it is chosen",
-               .remedy = meant ? "use one spelling in both lists" : "describe the model there"});
+    add(name,
+        {.id = "model-undescribed",
+         .found = "a model that " + quoted(lists_.modelsPath) + " does not have",
+         .expected = sameName("Model", meant ? std::nullopt : nearest),
+         .nearest = meant.value_or(""),
+         .effect = "the model has USB only: the package opens as soon as the model is chosen",
+         .remedy = meant ? "use one spelling in both lists" : "describe the model in that list"});
   }
 
   void unoffered(const std::string& name, const std::optional<std::string>& nearest) {
@@ -120,12 +122,12 @@ class ModelCheck {
          .found = "a model that " + quoted(lists_.descriptionPath) + " does not have",
          .expected = sameName(kContained, nearest),
          .effect = "the model cannot be chosen",
-         .remedy = "add it there, or remove it from this file"});
+         .remedy = "add the model to that list, or remove it from this one"});
   }
 
-  // Reports a model's name that no device can announce, and one with suspicious spaces. Devices
-  // announce maker and model as two texts, which the wizard joins with a space. Each text has at
-  // most 255 bytes, including the key before it ("usb_MFG=").
+  // Reports a name that no device can announce, and a name with suspicious spaces. A device
+  // announces maker and model as two texts, which the wizard joins with a space. Each text has at
+  // most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
     const std::size_t space = name.find(' ');
@@ -140,12 +142,12 @@ class ModelCheck {
                                      [](char c) { return static_cast<unsigned char>(c) < 0x20; });
     if (space == std::string::npos) {
       impossible("a name without a space", "the USB manufacturer, a space, the USB model",
-                 "write both as the devices announce them");
+                 "write maker and model as the devices announce them");
     } else if (name.size() > kMostBytes) {
       impossible(
           "a name of " + std::to_string(name.size()) + " bytes",
           "at most " + std::to_string(kMostBytes) + " bytes, the most that a device can announce",
-          "write it as the devices announce it");
+          "write the name as the devices announce it");
     } else if (control || !isUTF8(name)) {
       impossible("a name with a control character, such as a line break, or with damaged UTF-8",
                  "printable characters", "write the name as the devices announce it");
@@ -160,26 +162,28 @@ class ModelCheck {
     }
   }
 
-  // Reports each spelling of the maker that differs only in capital letters from the first word of
-  // the vendor's name.
+  // Compares the maker, which is the first word of the model's name, with the first word of the
+  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but
+  // reports it once.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));
     const std::string spelling = vendor ? vendor->substr(0, vendor->find(' ')) : maker;
     if (maker == spelling || asciiLowercased(maker) != asciiLowercased(spelling)) return;
     if (!makers_.insert(maker).second) return;
-    add(name, {.id = "maker-capitals",
-               .severity = Severity::kWarning,
-               .found = "the maker " + quoted(maker) + ", which \"VenderName\" spells " +
-                        quoted(spelling),
-               .expected = "the maker as the devices announce it (usb_MFG), capitals included",
-               .effect = "devices of " + quoted(spelling) + " are not found on the network",
-               .remedy = "use the devices' spelling for all models"});
+    add(name,
+        {.id = "maker-capitals",
+         .severity = Severity::kWarning,
+         .found =
+             "the maker " + quoted(maker) + ", which \"VenderName\" spells " + quoted(spelling),
+         .expected = "the maker as the devices announce it (usb_MFG), capitals included",
+         .effect = "devices that announce the maker as " + quoted(spelling) + " are not found",
+         .remedy = "use the devices' spelling for all models"});
   }
 
   const Lists& lists_;
   Report& report_;
-  std::set<std::string> makers_;  ///< the spellings that are reported already
+  std::set<std::string> makers_;  ///< the spellings that have been reported
 };
 
 }  // namespace

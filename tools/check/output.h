@@ -7,17 +7,17 @@
 
 namespace onramp::check {
 
-/// Writes a line for every finding, then a description of what users will see, then a summary. On a
-/// terminal of `width` columns, the findings are wrapped and have coloured marks. A width of 0
-/// means that the output is not a terminal.
+/// Writes the findings, then a description of what users will see, then a summary. If `width` is
+/// not 0, `out` is a terminal of `width` columns; the findings are then wrapped and have coloured
+/// marks. Otherwise each finding takes one line.
 void writeText(std::ostream& out, const Report& report, std::size_t width);
 
-/// Writes the report as JSON, in the form that onramp-check(1) describes. Bytes that are not UTF-8
-/// become replacement characters.
+/// Writes the report as JSON in the form that the manual page onramp-check(1) describes. Bytes that
+/// are not UTF-8 become replacement characters.
 void writeJSON(std::ostream& out, const Report& report);
 
-/// Writes a line for every text that the wizard shows: its key, the room that it has and where it
-/// is shown.
+/// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
+/// room for it, how often "%@" has to occur in it, and the place where it is shown.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check

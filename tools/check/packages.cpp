@@ -18,8 +18,8 @@ namespace {
 
 using Version = std::array<std::int64_t, 3>;
 
-// Returns the first release of every minor version of 10, and 11.0. A package can change only at
-// these versions.
+// Returns the versions at which the wizard's choice of a package can change: the first releases of
+// 10.0 to 10.16, and 11.0.
 std::set<Version> differentSystems() {
   constexpr std::int64_t kLastMinor = 16;
   std::set<Version> systems{{11, 0, 0}};
@@ -45,8 +45,8 @@ Version boundOf(const Dictionary& bound) {
   return {bound.integerValue("Major"), bound.integerValue("Minor"), bound.integerValue("BugFix")};
 }
 
-// Makes `version` the system's version, and returns the package's key for it by the wizard's own
-// rule; empty when there is none.
+// Makes `version` the system's version. Returns the key under which the wizard then looks for the
+// package, or an empty text when there is none.
 std::string versionKey(const Version& version) {
   setSystemVersion(std::to_string(version[0]) + "." + std::to_string(version[1]) + "." +
                    std::to_string(version[2]));
@@ -90,7 +90,7 @@ class PackageCheck {
            SystemSupport::kSupported;
   }
 
-  // Returns the first version above the range; nothing when the range has no upper end.
+  // Returns the first version above the range. Returns nothing when the range has no upper end.
   [[nodiscard]] std::optional<Version> end() const {
     const Dictionary& maximum = info_.supportSystemMax();
     if (!isBound(maximum)) return std::nullopt;
@@ -104,8 +104,8 @@ class PackageCheck {
     return isBound(minimum) ? boundOf(minimum) : Version{};
   }
 
-  // Returns a range in words, such as "10.13.0 up to, but not including, 13.0". Without `to`, the
-  // range has no upper end.
+  // Returns the range from `from` to `to` in words, such as "10.13.0 up to, but not including,
+  // 13.0". Without `to`, the range has no upper end.
   [[nodiscard]] std::string words(const Version& from, const std::optional<Version>& to) const {
     const std::string first = from == Version{} ? "" : dotted(from);
     if (!to) return first.empty() ? "every system" : first + " and later";
@@ -150,9 +150,9 @@ class PackageCheck {
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }
 
-  // Warns of a maximum whose "BugFix" is a number, because the release that the maximum names is
-  // refused. Does not warn when it names the first release of a major version, which is the usual
-  // way to exclude all of that version.
+  // Warns when the maximum's "BugFix" is a number, because the wizard refuses the release that such
+  // a maximum names. Does not warn when that release is the first of a major version, because this
+  // is the usual way to exclude the whole version.
   void checkNamedMaximum() {
     const Dictionary& maximum = info_.supportSystemMax();
     const auto text = maximum.string("BugFix");
@@ -190,8 +190,8 @@ class PackageCheck {
          .remedy = "widen the range with \"SystemMax\""});
   }
 
-  // Returns the package for one version by the wizard's own rule, as a path from the medium's top
-  // folder; empty when there is none.
+  // Returns the package that the wizard opens on `version`, as a path from the medium's top folder.
+  // Returns an empty text when there is none.
   [[nodiscard]] std::string packageFor(const Version& version) {
     usedKeys_.insert(versionKey(version));
     info_.loadPkgURL(lists_.resources);
@@ -238,7 +238,7 @@ class PackageCheck {
       if (checked_.insert(row.package).second) static_cast<void>(files_.exists(row.package, use));
       return;
     }
-    // readLists() has reported a value of the wrong type and a missing "PkgLocation".
+    // readLists() has already reported a value of the wrong kind and a missing "PkgLocation".
     if (package.find(key) || !package.string("PkgLocation")) return;
     report_.findings.push_back(
         {.id = "package-none",
@@ -288,7 +288,7 @@ class PackageCheck {
                                 .place = placeOf(medium::kPkgInfo, key),
                                 .found = "a key for systems outside the supported range",
                                 .expected = "packages for " + report_.systems,
-                                .effect = "nothing: that package never opens",
+                                .effect = "the package that the key names never opens",
                                 .remedy = "remove the key, or widen the range"});
   }
 

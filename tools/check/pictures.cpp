@@ -27,14 +27,14 @@ constexpr std::array kConnectionPictures{
 };
 constexpr Picture kBackground{"Background.png", 680, 480, "a window without a background picture"};
 
-// The size of a picture, and why it cannot be shown.
+// The size of a picture in pixels, and the reason why the picture cannot be shown.
 struct Decoded {
   std::uint32_t width = 0;
   std::uint32_t height = 0;
   std::string problem{};  ///< empty for an intact picture
 };
 
-// Owns libpng's state for a picture.
+// A PNG picture that libpng reads from memory. `bytes` must outlive the object.
 class Image {
  public:
   explicit Image(const std::string& bytes) {
@@ -85,8 +85,8 @@ void checkPicture(const MediumFiles& files, const std::string& folder, const Pic
     finding.found = "a picture of " + std::to_string(decoded.width) + " × " +
                     std::to_string(decoded.height) + " pixels";
     finding.expected = size;
-    finding.effect = "a picture that is scaled, so it looks blurred or distorted";
-    finding.remedy = "save it at that size";
+    finding.effect = "the picture is scaled and looks blurred or distorted";
+    finding.remedy = "save the picture at that size";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }

@@ -10,7 +10,7 @@
 
 namespace onramp::check {
 
-/// A model as users will get it.
+/// A model, and the connections that the wizard offers for it.
 struct ModelRow {
   std::string name{};
   bool usb = false;
@@ -18,10 +18,10 @@ struct ModelRow {
   bool wireless = false;
 };
 
-/// The package that a range of systems gets.
+/// The package that the wizard opens on a range of systems.
 struct PackageRow {
   std::string systems{};  ///< in words
-  std::string package{};  ///< relative to the medium; empty for none
+  std::string package{};  ///< relative to the medium; empty when nothing opens
 };
 
 /// A language of the message bundle.
@@ -30,10 +30,10 @@ struct LanguageRow {
   std::size_t texts = 0;  ///< how many of the wizard's texts the language has
 };
 
-/// The result of checking a medium.
+/// The result of a check: the findings, and what users of the medium will see.
 struct Report {
   std::string medium{};
-  std::string application{};           ///< the bundle's name; empty when there is none
+  std::string application{};           ///< the name of its bundle; empty when there is none
   std::vector<Finding> findings{};     ///< in the order in which the checks made them
   std::vector<ModelRow> models{};      ///< in the order of the wizard's list
   FirstPage start = FirstPage::kNone;  ///< the page that the wizard begins with

@@ -7,27 +7,27 @@
 
 namespace onramp::check {
 
-/// A text that the wizard shows, by its key in the message bundle. Widths are those of the
-/// interface files for macOS.
+/// A text of the message bundle that the wizard shows, and the room for it in the interface files
+/// for macOS.
 struct ShownText {
-  std::string_view key{};
-  std::string_view where{};
-  double width = 0;  ///< of a line, in points; 0 where there is room enough for any text
-  double size = 13;  ///< of the letters, in points
-  int lines = 1;
-  std::size_t mostPlaceholders = 0;  ///< of "%@": at least one must occur; 0: none may occur
-  bool hasFallback = false;          ///< a missing text is shown in English, not as its key
+  std::string_view key{};            ///< in the message bundle
+  std::string_view where{};          ///< the place where the text is shown, in words
+  double width = 0;                  ///< of a line, in points; 0 where any text fits
+  double size = 13;                  ///< of the letters, in points
+  int lines = 1;                     ///< how many lines there is room for
+  std::size_t mostPlaceholders = 0;  ///< how many "%@" it may have; if not 0, it needs one
+  bool hasFallback = false;          ///< if missing, an English text is shown, not the key
 };
 
-/// Returns all texts that the wizard shows, in the order of their keys.
+/// Returns all texts that the wizard shows from the message bundle, in the order of their keys.
 [[nodiscard]] std::span<const ShownText> shownTexts();
 
-/// Returns the approximate width in points of `text` (UTF-8) in letters of `size` points. The
-/// estimate uses an average width for each class of characters and no font.
+/// Returns the approximate width in points of the UTF-8 text `text` in letters of `size` points.
+/// Instead of a font, the estimate uses an average width for each class of characters.
 [[nodiscard]] double estimatedWidth(std::string_view text, double size);
 
-/// Returns the approximate number of lines of `width` points that `text` takes. The estimate
-/// assumes that a line can break anywhere.
+/// Returns the approximate number of lines that `text` takes in letters of `size` points, if a line
+/// is `width` points wide. The estimate assumes that a line can break anywhere.
 [[nodiscard]] int estimatedLines(std::string_view text, double size, double width);
 
 }  // namespace onramp::check

@@ -8,7 +8,7 @@ namespace onramp::check {
 
 namespace {
 
-// How many pairs of bytes are compared before the search gives up.
+// The number of pairs of bytes after which an object makes no further comparison.
 constexpr std::size_t kMostWork = 20'000'000;
 
 std::string lettersOf(std::string_view word) {

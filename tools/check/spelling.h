@@ -9,16 +9,18 @@
 
 namespace onramp::check {
 
-/// Finds the known word that a misspelt word was probably meant to be. A hash table finds a word
-/// that differs only in capital letters, spaces and punctuation. Any other word is compared with
-/// every known word. The work for all comparisons together is limited, because it would grow with
-/// the product of the two lists' lengths. Beyond the limit, known words are overlooked.
+/// Finds the known word that was probably meant by a misspelt word. If the two differ only in
+/// capital letters, spaces and punctuation, a hash table finds the known word. Otherwise the
+/// misspelt word is compared with every known word. One object makes a limited number of
+/// comparisons, because comparing two long lists would take too long. After that, nearest() uses
+/// only the hash table.
 class Spelling {
  public:
   explicit Spelling(const std::vector<std::string>& known);
 
-  /// Returns the most similar known word, or nothing if none is similar enough. If several are
-  /// equally similar, returns the first of them. A word from the hash table counts as equal.
+  /// Returns the known word that is most similar to `word`, or nothing if none is similar enough. A
+  /// word from the hash table counts as the most similar. If several words are equally similar,
+  /// returns the first of them.
   [[nodiscard]] std::optional<std::string> nearest(std::string_view word);
 
  private:
@@ -27,9 +29,9 @@ class Spelling {
   std::size_t work_ = 0;
 };
 
-/// Returns the least number of insertions, removals and replacements of bytes, and swaps of
-/// neighbouring bytes, that turn `a` into `b`. Ignores the case of ASCII letters. Returns `most` +
-/// 1 when that number is greater than `most`.
+/// Returns the least number of changes that turn `a` into `b`. A change inserts, removes or
+/// replaces one byte, or swaps two neighbouring bytes. ASCII letters that differ only in case are
+/// equal. Returns `most` + 1 when more than `most` changes are needed.
 [[nodiscard]] std::size_t editDistance(std::string_view a, std::string_view b, std::size_t most);
 
 }  // namespace onramp::check

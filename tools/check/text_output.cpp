@@ -15,10 +15,11 @@ namespace {
 constexpr std::string_view kRed = "\033[31m";
 constexpr std::string_view kYellow = "\033[33m";
 constexpr std::string_view kPlain = "\033[0m";
-constexpr std::size_t kConnectionColumns = 24;  // beside a model's name
+constexpr std::size_t kConnectionColumns =
+    24;  // what the line needs in addition to the model's name
 
-// Returns `text` with control characters replaced, so that it stays on one line and cannot control
-// the terminal.
+// Returns `text` with replacement characters for its control characters, so that the text stays on
+// one line and cannot control the terminal.
 std::string printable(std::string_view text) {
   std::string result;
   while (!text.empty()) {
@@ -85,9 +86,9 @@ std::string counted(std::size_t count, const char* word) {
 const char* startInWords(FirstPage page) {
   switch (page) {
     case FirstPage::kNone:
-      return "no page: the package opens at once, because no model supports wireless";
+      return "no page, because no model supports wireless; the package opens at once";
     case FirstPage::kConnectionType:
-      return "the connection page: all models have the same connections by cable";
+      return "the connection page, because all models have the same connections by cable";
     case FirstPage::kModelList:
       break;
   }

@@ -40,8 +40,8 @@ std::string joined(const std::vector<std::string>& words) {
   return text;
 }
 
-// Returns whether one of the `offered` languages is the language `wanted`. A related language that
-// the system would substitute does not count.
+// Returns whether `offered` contains the language `wanted`. A related language does not count, even
+// if the system would use it instead.
 bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
   const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
   if (found.empty()) return false;
@@ -131,8 +131,8 @@ class TextCheck {
                     .severity = Severity::kWarning,
                     .place = {.file = tablePath(language), .key = {key}},
                     .found = "a text that the wizard does not show",
-                    .effect = "none: the text is ignored",
-                    .remedy = "remove it"};
+                    .effect = "none, because the wizard ignores the text",
+                    .remedy = "remove the text"};
     if (nearest && meant.insert(*nearest).second) {
       finding.id = "text-misspelt";
       finding.severity = Severity::kError;
@@ -173,18 +173,18 @@ class TextCheck {
       finding.id = "text-placeholders";
       finding.found = count == 0   ? "no \"%@\""
                       : count == 1 ? "one \"%@\""
-                                   : std::to_string(count) + " times \"%@\"";
-      finding.expected = filled ? "once or twice" : "none";
+                                   : "\"%@\" " + std::to_string(count) + " times";
+      finding.expected = filled ? "\"%@\" once or twice" : "no \"%@\"";
       finding.effect = filled && count == 0 ? "an alert that does not say which version is needed"
                                             : "a literal \"%@\" (" + std::string(shown.where) + ")";
-      finding.remedy = filled ? "write it exactly where a version belongs" : "remove it";
+      finding.remedy = filled ? "write \"%@\" exactly where a version belongs" : "remove \"%@\"";
     } else if (shown.where == "sheet when no device is found" &&
                text.find('%') != std::string::npos) {
       finding.id = "text-percent";
       finding.found = "a \"%\", which macOS takes for the beginning of a placeholder";
       finding.expected = "a text without \"%\"";
       finding.effect = "a damaged text, or a crash, on macOS";
-      finding.remedy = "write it as a word";
+      finding.remedy = "write a word instead";
     } else {
       tooWide(shown, text, finding);
     }
@@ -195,7 +195,7 @@ class TextCheck {
     if (shown.width == 0 || estimatedLines(text, shown.size, shown.width) <= shown.lines) return;
     finding.id = "text-wide";
     finding.severity = Severity::kWarning;
-    finding.found = "a text about " +
+    finding.found = "a text that is about " +
                     std::to_string(std::lround(estimatedWidth(text, shown.size))) +
                     " points wide, by an estimate without fonts";
     const std::string width = std::to_string(std::lround(shown.width)) + " points";
@@ -203,15 +203,15 @@ class TextCheck {
                            ? "at most " + width
                            : "at most " + std::to_string(shown.lines) + " lines of " + width;
     finding.effect = "a text that is probably cut off (" + std::string(shown.where) + ")";
-    finding.remedy = "shorten it, or look at it with the wizard";
+    finding.remedy = "shorten the text, or see in the wizard whether it fits";
   }
 
   void checkDevelopmentRegion() {
     constexpr const char* kKey = "CFBundleDevelopmentRegion";
     const std::string path = kBundle + "/Contents/Info.plist";
     const std::string effect = serves(languages_, "en")
-                                   ? "users without texts in their language see one that "
-                                     "their system picks, usually English"
+                                   ? "users without texts in their language see another language "
+                                     "that their system picks, usually English"
                                    : "users without texts in their language may see keys such as "
                                      "\"INST_TXT_MODEL\" instead of texts";
     const auto information =
@@ -241,8 +241,8 @@ class TextCheck {
     report_.findings.push_back(std::move(finding));
   }
 
-  // Reports languages of the medium in which the application lacks texts. The medium cannot supply
-  // the application's texts.
+  // Reports languages of the message bundle in which the application has no texts. The
+  // message bundle cannot supply these.
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";

@@ -24,7 +24,7 @@ bool isExecutable(const std::string& path) {
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
 }
 
-// Reports a bundle whose program is not named, is missing or cannot be started.
+// Reports a bundle whose program is not named in its Info.plist, is missing or is not executable.
 void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::string& relative,
                   const char* effect) {
   const std::string list = relative + "/Contents/Info.plist";
@@ -53,8 +53,8 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// Reports translations of the tool's name that lack the maker's name. They are probably left over
-// from another maker's medium.
+// Reports translations of the tool's name that lack the maker's name, although the tool's name has
+// it. Such translations are probably left over from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor) {
   const std::string maker = firstWord(vendor);
@@ -99,7 +99,7 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
                                        .found = "no \"WLANtool\"",
                                        .expected = "the wireless set-up tool's path",
                                        .effect = kEffect,
-                                       .remedy = "add it"});
+                                       .remedy = "add \"WLANtool\""});
     return;
   }
   if (!files.exists(*relative, {place, "the wireless set-up tool", kEffect})) return;
@@ -124,12 +124,14 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
     checkTranslations(files, *relative, *name, resources.string(medium::kVenderName).value_or(""));
     return;
   }
-  files.report().findings.push_back({.id = "tool-unnamed",
-                                     .place = {.file = list},
-                                     .found = "no name under \"CFBundleDisplayName\"",
-                                     .expected = "the tool's name, a string",
-                                     .effect = "an entry without a name in the device list's menu",
-                                     .remedy = "write the name"});
+  files.report().findings.push_back(
+      {.id = "tool-unnamed",
+       .place = {.file = list},
+       .found = "no name under \"CFBundleDisplayName\"",
+       .expected = "the tool's name, a string",
+       .effect =
+           "the tool's file name in the device list's menu, unless a translation gives a name",
+       .remedy = "write the name"});
 }
 
 void checkApplication(const MediumFiles& files, const Lists& lists) {

@@ -29,7 +29,7 @@ class Walk {
   struct Element {
     std::string name;
     bool named = false;      ///< this is the value of the key at the end of `path_`
-    bool keyBefore = false;  ///< the last child so far was a key
+    bool keyBefore = false;  ///< the latest child is a key
   };
 
   static void begin(void* self, const XML_Char* name, const XML_Char**) {
@@ -61,7 +61,8 @@ class Walk {
     open_.push_back({std::string(name), named});
   }
 
-  // Handles the beginning of a dictionary's child. Returns whether the child is the value of a key.
+  // Called at the beginning of each child of a dictionary. Returns whether the child is the value
+  // of a key.
   bool inDictionary(std::string_view name) {
     Element& dictionary = open_.back();
     const bool isValue = name != "key" && dictionary.keyBefore;
@@ -84,7 +85,7 @@ class Walk {
     const bool isKey = closed.name == "key" && !open_.empty() && open_.back().name == "dict";
     if (!isKey) return;
     path_.back() = text_;
-    // Paths have no array indexes, so dictionaries in an array would seem to repeat their keys.
+    // `path_` has no array indexes, so dictionaries in an array would seem to repeat their keys.
     if (arrays_ == 0 && !lines_.keys.emplace(path_, keyLine_).second) {
       lines_.twice.emplace_back(path_, keyLine_);
     }

@@ -8,18 +8,20 @@
 
 namespace onramp::check {
 
-/// The line numbers of keys and of mistakes in an XML property list. The wizard's parser keeps no
-/// line numbers, so a second parser finds them. It never decides whether the wizard can read the
-/// list.
+/// The line numbers of keys and of the first mistake in an XML property list. The wizard's parser
+/// keeps no line numbers, so a second parser, Expat, finds them. Only the wizard's parser decides
+/// whether the wizard can read the list.
 struct XMLLines {
-  /// The line on which each path of keys occurs first. Keys inside arrays are left out.
+  /// The line on which a key occurs first. The key's path, from the outermost dictionary to the key
+  /// itself, is the map's key. Keys inside arrays are left out.
   std::map<std::vector<std::string>, std::size_t> keys;
-  std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;  ///< paths that occur again
+  /// The paths and lines of keys that their dictionaries already have.
+  std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;
   std::string problem;          ///< the first mistake; empty when there is none
   std::size_t problemLine = 0;  ///< from 1
 };
 
-/// Parses `xml`, which must be UTF-8.
+/// Parses `xml`, which must be UTF-8. A mistake in `xml` is described in the result.
 [[nodiscard]] XMLLines xmlLines(const std::string& xml);
 
 }  // namespace onramp::check

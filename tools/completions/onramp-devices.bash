@@ -12,7 +12,7 @@ _onramp_devices() {
     uri) options="--seconds --help" ;;
     hosts) options="--no-search --json --help" ;;
   esac
-  if [[ $word == "=" ]]; then  # bash makes "=" a word of its own
+  if [[ $word == "=" ]]; then  # bash splits "--medium=DIR" into three words
     word=
   elif [[ $before == "=" ]]; then
     before=${COMP_WORDS[COMP_CWORD-2]}

@@ -35,7 +35,7 @@ std::string questionText(const std::string& address) {
 
 std::string conclusionOf(const Answer& answer) {
   const Exchange* const told = answer.telling();
-  if (!answer.isComplete) return "interrupted before the device had answered\n";
+  if (!answer.isComplete) return "interrupted before the device answered\n";
   if (answer.isWireless) return "wireless\n";
   if (!told || !told->value) return "no usable answer: not in the wizard's list\n";
   return "not wireless (wireless would be " + std::to_string(kActiveIFWireless) +
@@ -62,7 +62,8 @@ Answer askedAt(const std::string& address, Progress& progress) {
   });
   progress.show("waiting for " + address);
   runMainLoop();
-  // After an interruption the asking ends at once, and the answer so far is reported.
+  // After an interruption, stop() ends the asking, and the second loop waits for the incomplete
+  // answer.
   questions.stop();
   if (questions.pending() != 0) runMainLoop();
   progress.clear();
@@ -74,8 +75,9 @@ Answer askedAt(const std::string& address, Progress& progress) {
 int ask(const AskOptions& options) {
   const auto address = lookUpIPv4Address(options.address);
   if (!address) {
-    std::cerr << "onramp-devices: " << inQuotes(options.address)
-              << " is neither an IPv4 address nor the name of a host that has one\n";
+    std::cerr
+        << "onramp-devices: " << inQuotes(options.address)
+        << " is neither an IPv4 address nor the name of a host that has one; check the spelling\n";
     return kTrouble;
   }
   Progress progress;

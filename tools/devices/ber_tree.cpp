@@ -26,6 +26,7 @@ constexpr std::size_t kMostArcs = 128;
 constexpr std::size_t kBytesPerLine = 16;
 
 // The names of an SNMP message's elements and of its PDU's elements, in order (RFC 1157 section 4).
+// The empty name stands for the PDU, which pduName() names.
 constexpr std::array<std::string_view, 3> kMessageFields{"version", "community", ""};
 constexpr std::array<std::string_view, 4> kPduFields{"request", "error status", "error index",
                                                      "bindings"};
@@ -103,7 +104,8 @@ std::string contentText(std::uint8_t tag, Bytes content) {
   }
 }
 
-// An element's position: its depth, and its index among its parent's elements.
+// An element's position: its depth, its index among its parent's elements, and whether its parent
+// is a PDU.
 struct Where {
   std::size_t depth = 0;
   std::size_t place = 0;

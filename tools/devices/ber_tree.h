@@ -6,13 +6,13 @@
 
 namespace onramp::devices {
 
-/// Returns the elements of an SNMP message as text, one element a line, indented by its depth.
-/// Bytes that form no element are shown in hexadecimal, so the text describes all bytes of any
-/// input.
+/// Returns the elements of an SNMP message as text. Each element is on one line, which is indented
+/// by the element's depth. Bytes that form no element are shown in hexadecimal, so the text
+/// accounts for every byte.
 [[nodiscard]] std::string berTree(std::span<const std::uint8_t> bytes);
 
-/// Returns the bytes in hexadecimal, sixteen a line. Each line starts with the offset and ends with
-/// the characters.
+/// Returns the bytes in hexadecimal, sixteen on each line. A line starts with the offset of its
+/// first byte and ends with its bytes as characters, with "." for bytes other than printable ASCII.
 [[nodiscard]] std::string hexDump(std::span<const std::uint8_t> bytes);
 
 /// Returns the bytes as hexadecimal digits without spaces.

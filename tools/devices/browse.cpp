@@ -84,8 +84,8 @@ void Session::changed(Device& device) {
   }
 }
 
-// Asks a device unless it has been asked with the same record. The wizard, too, asks a device again
-// when its record has changed.
+// Asks a device, unless its record is the same as when it was last asked. The wizard, too, asks a
+// device again when its record has changed.
 void Session::ask(Device& device) {
   Dictionary& asked = asked_[&device];
   if (asked == device.record) return;
@@ -156,7 +156,7 @@ int Session::run() {
     progress_.print(jsonOf(all));
     return 0;
   }
-  // Shows the devices whose verdict was open until now, and those that have gone.
+  // Shows the devices that have no row yet, and those that are gone.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));

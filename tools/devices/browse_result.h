@@ -7,14 +7,15 @@
 
 namespace onramp::devices {
 
-/// How a device that answers slowly, or not at all, affects the devices that the wizard asks after
-/// it.
+/// The delay that a device causes in the wizard by answering slowly or not at all. All members are
+/// 0 when the delay is shorter than a second.
 struct Delay {
-  double seconds = 0;       ///< how long the wizard's window stands still
-  std::size_t delayed = 0;  ///< how many listed devices appear later
+  double seconds = 0;       ///< how long the wizard's window does not respond
+  std::size_t delayed = 0;  ///< how many listed devices appear later because of it
   std::size_t hidden = 0;   ///< how many of those the wizard's search misses
 };
 
+/// A device, and the verdict on it.
 struct JudgedDevice {
   const Device* device = nullptr;  ///< not owned
   Verdict verdict{};
@@ -22,16 +23,17 @@ struct JudgedDevice {
   Delay delay{};
 };
 
+/// The result of a search.
 struct BrowseResult {
   const Medium* medium = nullptr;  ///< not owned
-  double seconds = 0;
+  double seconds = 0;              ///< how long the search took
   bool isInterrupted = false;
   std::vector<JudgedDevice> devices{};  ///< in the order in which they were found
-  std::vector<Verdict> network{};       ///< what is wrong with the network as a whole
+  std::vector<Verdict> network{};       ///< problems of the network as a whole
 };
 
-/// Fills in the delays. The calculation is for the wizard's first search, in which it asks the
-/// devices one by one, in the order in which they were resolved.
+/// Sets the delay that each device causes. Assumes the wizard's first search, in which the wizard
+/// asks one device after another, in the order in which they were resolved.
 void computeDelays(std::vector<JudgedDevice>& devices);
 
 /// Returns the result as JSON, in the form that the manual page describes.

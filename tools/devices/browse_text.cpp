@@ -33,14 +33,14 @@ struct Columns {
   std::size_t model;
 };
 
-// The columns for name and model share the width that is left beside mark and address.
+// Returns the columns for name and model. They share the width that mark and address do not use.
 Columns columnsFor(const TextStyle& style) {
   const std::size_t width = style.width == 0 ? 100 : std::max(style.width, kNarrowest);
   const std::size_t rest = width - kMarkColumns - kAddressColumns - 3;
   return {rest - rest / 2, rest / 2};
 }
 
-// Does not cut the text when the output is not a terminal.
+// Returns `text` in `columns` columns. If the output is not a terminal, a longer text is not cut.
 std::string cell(std::string_view text, std::size_t columns, const TextStyle& style) {
   if (style.width == 0 && columnsOf(text) > columns) return std::string(text);
   return fitted(text, columns);
@@ -60,7 +60,7 @@ std::string paragraph(const std::string& text, const TextStyle& style) {
   return wrapped(text, style.width == 0 ? kUnlimited : style.width, 2);
 }
 
-// Adds a full stop, unless the text ends in a service type with its closing dot.
+// Adds a full stop, unless the text ends with a service type, which has its own dot.
 std::string sentence(const std::string& text) {
   return text.ends_with('.') ? text : text + '.';
 }
@@ -72,7 +72,7 @@ std::string explanation(const Verdict& verdict) {
 
 std::string delayText(const Delay& delay) {
   if (delay.delayed == 0) return "";
-  return "Meanwhile, the wizard's window stands still for " + durationText(delay.seconds) +
+  return "The wizard's window does not respond for " + durationText(delay.seconds) +
          ", which delays " + std::to_string(delay.delayed) + " of the listed devices" +
          (delay.hidden == 0 ? "" : " and hides " + std::to_string(delay.hidden) + " of them") + '.';
 }

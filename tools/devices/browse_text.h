@@ -6,34 +6,35 @@
 
 namespace onramp::devices {
 
-/// How results are shown.
+/// The form of the text output.
 struct TextStyle {
   bool isColoured = false;
   bool isVerbose = false;
   std::size_t width = 0;  ///< columns of the terminal; 0 when the output is not a terminal
 };
 
-/// Returns the style that suits standard output: a terminal, a file or a pipe.
+/// Returns a style with colours and columns if standard output is a terminal, and without them if
+/// it is a file or a pipe.
 [[nodiscard]] TextStyle outputStyle(bool isVerbose);
 
 /// Returns the header line of the table of devices.
 [[nodiscard]] std::string tableHead(const TextStyle& style);
 
-/// Returns a device's row. Below it are the verdict if the wizard does not list the device, the
-/// notes and, in the verbose style, the details.
+/// Returns a device's row in the table, and the lines that follow the row: the verdict, if the
+/// wizard does not list the device, the notes and, in the verbose style, all details.
 [[nodiscard]] std::string rowOf(const JudgedDevice& device, const TextStyle& style);
 
-/// Returns the row of a device that is no longer announced.
+/// Returns the row for a device that is no longer announced.
 [[nodiscard]] std::string goneRow(const Device& device, const TextStyle& style);
 
-/// Returns the summary that ends the output: delays, network problems and the number of devices.
+/// Returns the last lines of the output: delays, network problems and the numbers of devices.
 [[nodiscard]] std::string summaryOf(const BrowseResult& result, const TextStyle& style);
 
-/// Returns a request and its reply, as trees and in hexadecimal, indented by `indent` spaces.
-/// Leaves out a packet without bytes.
+/// Returns a request and its reply as trees and in hexadecimal, indented by `indent` spaces. A
+/// request or reply without bytes is left out.
 [[nodiscard]] std::string packetsOf(const Exchange& exchange, std::size_t indent);
 
-/// Returns an exchange in one line, such as "127.0.1.5: 2 after 0.4 ms".
+/// Returns an exchange as one line without a line feed, such as "127.0.1.5: 2 after 0.4 ms".
 [[nodiscard]] std::string exchangeLine(const Exchange& exchange);
 
 }  // namespace onramp::devices

@@ -36,7 +36,8 @@ struct HostsOptions {
   bool json = false;
 };
 
-// The commands. Each prints its result and returns the exit status.
+// The commands. Each prints its result on standard output, or a message on standard error, and
+// returns the program's exit status.
 
 int browse(const BrowseOptions& options);
 int ask(const AskOptions& options);

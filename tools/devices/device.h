@@ -10,24 +10,25 @@
 
 namespace onramp::devices {
 
-/// Everything known about one announced device. Announcements of different service types belong to
-/// one device if they have the same name and domain. Times are in seconds since the search began.
+/// Everything known about one announced device. A device may announce services of several types.
+/// Services with the same name and domain belong to the same device. Times are in seconds since the
+/// search began.
 struct Device {
   std::string name;
   std::string domain;
-  std::string type;                ///< the type whose announcement is resolved
-  std::vector<std::string> types;  ///< all types under which the device is announced
+  std::string type;                ///< the type of the service that is resolved
+  std::vector<std::string> types;  ///< the types of all its announced services
   double found = 0;
   std::optional<double> resolved;
   std::optional<double> gone;
   Dictionary record;                ///< a KSDevice record; empty until the first resolve
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
-  std::set<std::string> sightings;  ///< interfaces and protocols, such as "eth0 IPv4"
-  std::optional<Answer> answer;     ///< nothing when the device was not asked
+  std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"; empty on macOS
+  std::optional<Answer> answer;     ///< nothing until the device has been asked
 };
 
-/// What the wizard reads from the medium for its search.
+/// The parts of a medium on which the wizard's search depends.
 struct Medium {
   std::string path;                 ///< as the user gave it
   std::string type;                 ///< the one service type that the wizard looks for

@@ -24,7 +24,7 @@ double secondsSince(Clock::time_point start) {
   return std::chrono::duration<double>(Clock::now() - start).count();
 }
 
-// A copy of the wizard's table of objects. Decoding a reply changes only the copy.
+// A copy of active_interface_table, so that decoding a reply changes only the copy.
 class OwnTable {
  public:
   OwnTable() {
@@ -42,7 +42,7 @@ class OwnTable {
 
   [[nodiscard]] mib_table& get() { return table_; }
 
-  /// Returns the objects' current names.
+  /// Returns the names (object identifiers) that the table now holds.
   [[nodiscard]] std::vector<std::vector<std::uint16_t>> names() const {
     std::vector<std::vector<std::uint16_t>> names;
     for (const mib_entry& entry : entries_)
@@ -61,8 +61,8 @@ std::uint64_t nextRequestId() {
   return next++ & 0x7FFFFFFFU;
 }
 
-// A request that has been sent. Its socket stays open after the wait, so that a late reply is
-// noticed.
+// A request that has been sent. The socket stays open after the wait for the reply, so that a late
+// reply is noticed. `exchange` is the index of the request's exchange.
 struct Sent {
   DatagramSocket socket;
   Clock::time_point at;
@@ -105,8 +105,8 @@ bool Questioning::send(snmp_table_request& request, Exchange& exchange) {
   return true;
 }
 
-// Waits for the reply as long as the wizard does, and stores it in `exchange`. Leaves the outcome
-// as it is unless the device's host refuses the request.
+// Waits for the reply as long as the wizard does, and stores it in `exchange`. Sets the outcome
+// only when the device's host reports that no program uses the port.
 void Questioning::await(Sent& sent, Exchange& exchange) {
   const auto deadline = sent.at + kReceiveWait;
   while (!stopped_ && Clock::now() < deadline) {
@@ -140,8 +140,8 @@ void Questioning::collectLateReplies() {
   }
 }
 
-// Interprets the reply as the wizard does, and sets the exchange's outcome. Returns nothing unless
-// the outcome is kValue.
+// Decodes the reply as the wizard does, and sets the exchange's outcome. Returns the reply's values
+// if the outcome is kValue, otherwise nothing.
 std::optional<Dictionary> Questioning::read(snmp_table_request& request, std::uint64_t id,
                                             Exchange& exchange) {
   const auto before = table_.names();
@@ -185,7 +185,7 @@ std::optional<Dictionary> Questioning::once(const char* address, bool& noReply) 
   return result;
 }
 
-// All outcomes but kValue. Those that explain most come first.
+// All outcomes except kValue. Those that say most come first.
 constexpr std::array kTellingOrder{
     Outcome::kError, Outcome::kOtherType, Outcome::kUnreadable, Outcome::kOtherRequest,
     Outcome::kLate,  Outcome::kRefused,   Outcome::kNone,       Outcome::kUnsent};
@@ -193,7 +193,8 @@ constexpr std::array kTellingOrder{
 }  // namespace
 
 const Exchange* Answer::telling() const {
-  // If an address decides with a value, the asking ends there, so that value is the last.
+  // When the value from an address decides, no further request follows, so the last value is the
+  // deciding one.
   const auto last = std::find_if(exchanges.rbegin(), exchanges.rend(),
                                  [](const Exchange& e) { return e.outcome == Outcome::kValue; });
   if (last != exchanges.rend()) return &*last;

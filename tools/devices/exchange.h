@@ -13,47 +13,50 @@ namespace onramp::devices {
 /// One request for a device's active interface, and its reply.
 struct Exchange {
   enum class Outcome {
-    kValue,         ///< an integer
-    kError,         ///< an error status
-    kOtherType,     ///< a value of another type
-    kUnreadable,    ///< bytes that are not a proper reply
-    kOtherRequest,  ///< a reply to another request
+    kValue,         ///< the reply has an integer
+    kError,         ///< the reply has an error status
+    kOtherType,     ///< the reply has no value of type INTEGER
+    kUnreadable,    ///< the reply is malformed
+    kOtherRequest,  ///< the reply has another request's identifier
     kRefused,       ///< the host reported that no program uses the port
-    kLate,          ///< a reply that came after the wizard would have stopped waiting
-    kNone,          ///< no reply
-    kUnsent,        ///< nothing was sent: no valid address, socket or route
+    kLate,          ///< the reply came after the time that the wizard waits for it
+    kNone,          ///< no reply came
+    kUnsent,        ///< nothing was sent, because there was no valid address, socket or route
   };
 
   std::string address{};
   Outcome outcome = Outcome::kNone;
   std::vector<std::uint8_t> request{};
-  std::vector<std::uint8_t> reply{};    ///< empty when there is none
+  std::vector<std::uint8_t> reply{};    ///< empty when none came
   std::optional<double> seconds{};      ///< from the request to the reply
-  std::uint64_t errorStatus = 0;        ///< of kError (RFC 1157 section 4.1.1)
-  std::optional<std::int64_t> value{};  ///< of kValue
-  unsigned type = 0;                    ///< of kOtherType: the value's tag
-  /// The reply named another object, which replaced the one to ask later devices for.
+  std::uint64_t errorStatus = 0;        ///< for kError; see RFC 1157 section 4.1.1
+  std::optional<std::int64_t> value{};  ///< for kValue
+  unsigned type = 0;                    ///< for kOtherType; the value's tag
+  /// Whether the reply named an object other than that of the request. If so, the wizard would ask
+  /// all later devices for the object that the reply names.
   bool changedQuestion = false;
 };
 
 /// The result of asking one device.
 struct Answer {
   bool isWireless = false;  ///< as the wizard decides
-  bool isComplete = false;  ///< false when the asking was stopped
-  double seconds = 0;       ///< how long the wizard's window would stand still
+  bool isComplete = false;  ///< false when `stopped` was set before the end
+  double seconds = 0;       ///< how long the wizard's window would not respond
   std::vector<Exchange> exchanges;
 
-  /// Returns the exchange that best explains the answer; null when there is no exchange.
+  /// Returns the exchange that best explains the answer: the last one with a value or, if none has
+  /// a value, the one whose outcome says most. Returns null when there is no exchange. The answer
+  /// owns the exchange.
   [[nodiscard]] const Exchange* telling() const;
 };
 
-/// Asks the device at `addresses` (strings) exactly as the wizard does, repetitions included. The
-/// answer holds all exchanges. Blocks for about 12 seconds per silent address, or until `stopped`
-/// is set.
-/// Does not change the wizard's own table of objects. Callable from any thread.
+/// Asks the device at `addresses`, an array of strings, exactly as the wizard does, repetitions
+/// included. Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does
+/// not change active_interface_table. May be called on any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 
-/// Returns the name of an error status, such as "noSuchName".
+/// Returns the name of an error status (RFC 1157 section 4.1.1), such as "noSuchName", or "error
+/// status N" for an unknown one.
 [[nodiscard]] std::string errorStatusName(std::uint64_t status);
 
 }  // namespace onramp::devices

@@ -9,8 +9,8 @@ namespace onramp::devices {
 
 namespace {
 
-// The search for this type finds the types that are announced (RFC 6763 section 9). A type such as
-// "_ipp._tcp." is found as a service named "_ipp" whose type begins with "_tcp.".
+// Browsing this type finds the types of all announced services (RFC 6763 section 9). For example,
+// "_ipp._tcp." is found as a service whose name is "_ipp" and whose type starts with "_tcp.".
 constexpr const char* kTypeOfTypes = "_services._dns-sd._udp.";
 
 }  // namespace
@@ -22,7 +22,7 @@ void Finder::start(const std::vector<std::string>& types, bool all) {
   start_ = std::chrono::steady_clock::now();
   for (const std::string& type : types)
     browsers_.push_back(KSBonjour::initWithType(type));
-  // Every browser's observers learn what all browsers see, so observing one browser is enough.
+  // Every browser also reports what the other browsers find, so it is enough to observe one.
   if (!browsers_.empty()) browsers_.front()->addKSBonjourObserver(shared_from_this());
   watchSightings([this](const ServiceSighting& sighting) { sighted(sighting); });
   for (const auto& browser : browsers_)

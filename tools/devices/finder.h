@@ -15,26 +15,28 @@
 
 namespace onramp::devices {
 
-/// Browses several service types at once and combines their announcements into devices. Main thread
-/// only.
+/// Browses several service types at once, and combines the services that it finds into devices. All
+/// functions must be called on the main thread.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Called with a device when it is found under a type, is resolved, or has left a type.
+  /// Called when a service of `device` is found, is resolved or is gone.
   using Changed = std::function<void(Device& device)>;
 
-  /// For a device that is announced under several types, the announcement under `preferred` is
-  /// resolved, or else the first one that was found.
+  /// If a device has services of several types, the finder uses the addresses and TXT record of the
+  /// service whose type is `preferred`, or of the first service that it found if none has that
+  /// type.
   Finder(std::string preferred, Changed changed);
   Finder(const Finder&) = delete;
   Finder& operator=(const Finder&) = delete;
   ~Finder() override = default;
 
-  /// Starts browsing `types`, and with `all` every other type that is announced. Until stop(), the
-  /// finder and its browsers keep each other alive.
+  /// Starts to browse `types` and, if `all` is true, every other type that is announced. The finder
+  /// and its browsers keep each other alive until stop() is called.
   void start(const std::vector<std::string>& types, bool all);
   void stop();
 
-  /// Returns all devices seen so far, in the order of their names. The finder owns them.
+  /// Returns all devices found so far, including those that are gone, in the order of their names.
+  /// The finder owns them.
   [[nodiscard]] std::vector<Device*> devices();
 
   /// Returns the seconds since start().
@@ -57,7 +59,8 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   std::vector<std::shared_ptr<KSBonjour>> browsers_;
   NetServiceBrowserRef typeBrowser_;
   std::map<std::pair<std::string, std::string>, Device> devices_;
-  // Kept apart, because a service is seen before the device that it belongs to is known.
+  // The sightings by name and domain. They are not in `devices_`, because a service may be sighted
+  // before its device is found.
   std::map<std::pair<std::string, std::string>, std::set<std::string>> sightings_;
 };
 

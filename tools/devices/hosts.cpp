@@ -81,8 +81,9 @@ int showHosts(const HostsOptions& options) {
   local_address_list list;
   const std::string primary = KSSCCopyCurrentInterfaceName().value_or("none");
   if (const int status = KSSysConfigCopyCurrentLocalAddressList(&list); status != 0) {
-    std::cerr << "onramp-devices: the system's network configuration could not be read (error "
-              << status << "); memory or open files may be short: close programs and try again\n";
+    std::cerr
+        << "onramp-devices: the system's network configuration could not be read (error " << status
+        << "); memory or file descriptors may be exhausted: close some programs and try again\n";
     return kUnreadableConfiguration;
   }
   if (!options.json) printAddresses(primary, *list);

@@ -9,17 +9,19 @@
 
 namespace onramp::devices {
 
-/// Returns an answer and all its exchanges in the form that the manual page describes.
+/// Returns an answer and all its exchanges in the form that the manual page onramp-devices(1)
+/// describes.
 [[nodiscard]] nlohmann::ordered_json jsonOfAnswer(const Answer& answer);
 
-/// Returns an outcome's name in JSON.
+/// Returns the name that an outcome has in JSON, such as "other-type".
 [[nodiscard]] std::string outcomeName(Exchange::Outcome outcome);
 
-/// Returns the strings of a TXT record, such as "note=Attic", in order. Stops at a string that is
-/// cut off.
+/// Returns the strings, such as "note=Attic", of a TXT record in wire format. Ends before a string
+/// that is cut off.
 [[nodiscard]] std::vector<std::string> txtStrings(const std::optional<Data>& txt);
 
-/// Returns the text of `json`. Bytes that are not UTF-8 become U+FFFD.
+/// Returns `json` as indented text that ends with a line feed. Bytes that are not UTF-8 become
+/// U+FFFD.
 [[nodiscard]] std::string printed(const nlohmann::ordered_json& json);
 
 }  // namespace onramp::devices

@@ -1,4 +1,4 @@
-// onramp-devices: explains which devices the wizard lists, and why it leaves out the others.
+// onramp-devices explains which devices the wizard lists, and why it leaves out the others.
 
 #include <CLI/CLI.hpp>
 #include <clocale>
@@ -14,10 +14,10 @@ namespace {
 
 using namespace onramp::devices;
 
-// The examples of the commands. The program's own help shows all of them.
+// The examples of each command. The program's help shows the examples of all commands.
 const std::string kBrowseExamples = R"(
   onramp-devices browse --medium build/medium
-      shows every announced device, and why the wizard lists it or not
+      shows which devices the wizard lists, and why it leaves out the others
   onramp-devices browse --medium /media/setup --model "Kestrel Model 100" -v
       explains the list of a user who chose that model, and shows all that is known)";
 const std::string kAskExamples = R"(
@@ -31,8 +31,8 @@ const std::string kHostsExamples = R"(
       shows this computer's addresses, and which devices answer a broadcast)";
 
 void addBrowse(CLI::App& app, BrowseOptions& options) {
-  CLI::App* const command =
-      app.add_subcommand("browse", "Show devices, and why the wizard lists them or not");
+  CLI::App* const command = app.add_subcommand(
+      "browse", "Show the announced devices, and explain which of them the wizard lists");
   command->footer("Examples:" + kBrowseExamples);
   command->add_option("-m,--medium", options.medium, "The folder that contains the application")
       ->required()
@@ -73,8 +73,8 @@ void addURI(CLI::App& app, URIOptions& options) {
 }
 
 void addHosts(CLI::App& app, HostsOptions& options) {
-  CLI::App* const command =
-      app.add_subcommand("hosts", "Show own addresses, and the answers to a broadcast");
+  CLI::App* const command = app.add_subcommand(
+      "hosts", "Show this computer's addresses, and the devices that answer a broadcast");
   command->footer("Examples:" + kHostsExamples);
   command->add_flag_callback(
       "-n,--no-search", [&options] { options.search = false; }, "Send no broadcasts");
@@ -111,7 +111,8 @@ int run(int count, char* arguments[]) {
 }  // namespace
 
 int main(int count, char* arguments[]) {
-  // Only for the width of characters; messages and numbers keep the form of the "C" locale.
+  // columnsOf() needs the locale for the width of characters. Messages and numbers keep the form of
+  // the "C" locale.
   std::setlocale(LC_CTYPE, "");
   onramp::surviveFailedWrites();
   try {

@@ -31,7 +31,8 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
   }
   const std::string application = check::findApplication(folder);
   if (application.empty()) {
-    return fail(path, "contains no application; give the folder that contains it");
+    return fail(path,
+                "contains no application; give the folder that contains the wizard's application");
   }
   setMainBundlePath(folder + '/' + application);
   const Dictionary description = KSOROSXCD::initWithCDInfo();

@@ -8,11 +8,12 @@
 
 namespace onramp::devices {
 
-/// Sets the main bundle to the application on the medium in the folder `path`, then reads what the
-/// wizard's search needs, with the wizard's own code. `wanted` names the models to search for; when
-/// it is empty, the search is for all models. Returns nothing, after a message on standard error,
-/// when there is no medium in that folder, the medium lacks a model of `wanted`, or a search with
-/// it cannot find any device.
+/// Makes the application on the medium in the folder `path` the main bundle. Then uses the wizard's
+/// own code to read the parts of the medium on which the wizard's search depends. `wanted` names
+/// the models to search for; if it is empty, the search is for all models. On failure, prints a
+/// message on standard error and returns nothing. It is a failure when `path` is not a folder, when
+/// the folder has no application, when the medium names no service type or no models, and when it
+/// lacks a model of `wanted`.
 [[nodiscard]] std::optional<Medium> readMedium(const std::string& path,
                                                const std::vector<std::string>& wanted);
 

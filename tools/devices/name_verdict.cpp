@@ -16,14 +16,14 @@ namespace onramp::devices {
 
 namespace {
 
-// Keys under which devices announce the maker or the model. For each service type, the wizard reads
-// only one key of each list.
+// TXT keys under which devices announce their maker or their model. The wizard reads only one key
+// of each list; the service type decides which one.
 constexpr std::array<std::string_view, 9> kMakerKeys{
     "usb_MFG", "mfg", "usb_MANUFACTURER", "manufacturer", "mfr", "vendor", "make", "ty", "product"};
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
                                                      "modelName", "ty",  "product"};
 
-// Removes spaces at both ends of the text, and replaces several spaces in a row by one.
+// Returns `text` without spaces at its ends, and with one space in place of several in a row.
 std::string withSingleBlanks(std::string_view text) {
   std::string out;
   for (const char c : text) {
@@ -42,7 +42,7 @@ std::string textUnder(const Device& device, std::string_view key) {
   return text ? text->value(key).value_or("") : "";
 }
 
-// Returns the first of `keys` other than `wanted` under which the device announces a text.
+// Returns the first of `keys`, leaving out `wanted`, under which the device announces a text.
 std::optional<std::string_view> otherKey(const Device& device, std::string_view wanted,
                                          std::span<const std::string_view> keys) {
   for (const std::string_view key : keys) {
@@ -52,16 +52,16 @@ std::optional<std::string_view> otherKey(const Device& device, std::string_view 
   return std::nullopt;
 }
 
-// Returns the verdict on a device that announces nothing under `wanted`, the key for maker or
-// model.
+// Returns the verdict on a device that announces nothing under `wanted`. `keys` is kMakerKeys or
+// kModelKeys, and contains `wanted`.
 Verdict missingKey(const Device& device, std::string_view wanted,
                    std::span<const std::string_view> keys) {
   const std::string key(wanted);
   if (const auto other = otherKey(device, wanted, keys)) {
     return {.id = "other-key",
-            .why = "announces no " + key + "; the name is under another key, " +
+            .why = "announces no " + key + ", but has the name under another key, " +
                    std::string(*other) + " = " + inQuotes(textUnder(device, *other)),
-            .remedy = "the firmware must announce it under " + key + ", too"};
+            .remedy = "the firmware must also announce the name under " + key};
   }
   const bool isModel = keys.data() == kModelKeys.data();
   return {.id = isModel ? "no-model" : "no-maker",
@@ -86,7 +86,7 @@ std::string edgeBlanks(const std::string& announced) {
 
 std::string nearestOf(const std::string& announced, const Medium& medium) {
   const auto nearest = check::Spelling(medium.models).nearest(announced);
-  return nearest ? "; the nearest is " + inQuotes(*nearest) : "";
+  return nearest ? "; the nearest model is " + inQuotes(*nearest) : "";
 }
 
 }  // namespace
@@ -133,7 +133,7 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
   return Verdict{
       .id = "not-on-medium",
       .why = inQuotes(announced) + " is not a model of this medium" + nearestOf(announced, medium),
-      .remedy = "use the medium that is made for this model, or add the model to this one"};
+      .remedy = "use a medium for this model, or add the model to this medium"};
 }
 
 }  // namespace onramp::devices

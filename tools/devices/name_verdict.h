@@ -6,11 +6,11 @@
 
 namespace onramp::devices {
 
-/// Returns why the device's maker and model match none of the medium's models; nothing when they
-/// match one.
+/// Returns the reason why the device's maker and model match none of the medium's models, or
+/// nothing when they match one. The device must be resolved.
 [[nodiscard]] std::optional<Verdict> judgeName(const Device& device, const Medium& medium);
 
-/// Returns the IPv4 addresses in a KSDevice record as text.
+/// Returns the IPv4 addresses in `record`, which KSDevice made, as dotted texts.
 [[nodiscard]] std::vector<std::string> ipv4AddressesOf(const Dictionary& record);
 
 }  // namespace onramp::devices

@@ -18,7 +18,7 @@ namespace {
 constexpr IPv4Address kMulticastDNSGroup{0xE00000FB};
 constexpr std::uint16_t kMulticastDNSPort = 5353;
 
-// A query for all service types (RFC 6763 section 9). After the header comes one question: name
+// A query for all service types (RFC 6763 section 9). The header is followed by one question: name
 // "_services._dns-sd._udp.local", type PTR, class IN.
 constexpr std::array<std::uint8_t, 46> kQuestion{
     0,   0,   0,   0,   0,   1,   0,   0,   0,   0,   0,   0,   9,   '_', 's', 'e',
@@ -50,18 +50,18 @@ std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds) {
   if (const auto problem = discoveryProblem()) {
     return {{.id = "no-daemon",
              .why = "no discovery daemon: " + *problem,
-             .remedy = "start it: systemctl start avahi-daemon"}};
+             .remedy = "start the daemon: systemctl start avahi-daemon"}};
   }
   if (hasFoundDevices) return {};
   if (!canSendMulticast()) {
     if (!hasNetwork()) {
       return {{.id = "no-network",
                .why = "no network: this computer has only loopback addresses",
-               .remedy = "connect it to the devices' network"}};
+               .remedy = "connect the computer to the devices' network"}};
     }
     return {{.id = "multicast-blocked",
              .why = "multicast is blocked: the system does not send to 224.0.0.251, UDP port 5353",
-             .remedy = "let it through the firewall, or add a route for 224.0.0.0/4"}};
+             .remedy = "let multicast through the firewall, or add a route for 224.0.0.0/4"}};
   }
   return {{.id = "nothing-announced",
            .why = "nothing was announced within " + durationText(seconds),

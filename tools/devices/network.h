@@ -6,11 +6,13 @@
 
 namespace onramp::devices {
 
-/// Returns why no device was found: no discovery daemon, no network, multicast blocked, or nothing
-/// announced in the `seconds` of the search. If devices were found, returns only a missing daemon.
+/// Returns the reason why the search found no device: no discovery daemon, no network, multicast
+/// blocked, or nothing announced. `seconds` is how long the search took. If devices were found,
+/// only a missing daemon counts as a problem.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
-/// Returns whether an IPv4 address is in a subnet of this computer. Uses the wizard's own code.
+/// Returns whether `address`, a dotted IPv4 text, is in a subnet of this computer. Returns false
+/// before AddNetworkInterfaceListChangeCallbackSCF() has been called.
 [[nodiscard]] bool isInLocalSubnet(const std::string& address);
 
 }  // namespace onramp::devices

@@ -15,7 +15,8 @@ bool Progress::isShown() {
 void Progress::show(const std::string& text) {
   if (!isShown()) return;
   std::string line = fitted(text, terminalWidth() - 3);
-  // Ends at the text, so that the "^C" of an interruption stays on the line.
+  // The cursor stays at the end of the text, so there is room on the line for the "^C" of an
+  // interruption.
   while (line.ends_with(' '))
     line.pop_back();
   std::cerr << '\r' << line << "\033[K" << std::flush;

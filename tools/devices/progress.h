@@ -4,7 +4,8 @@
 
 namespace onramp::devices {
 
-/// A progress line on the terminal, below the output that has been printed.
+/// A line on standard error that shows the progress, below the output printed so far. It is shown
+/// only if standard error is a terminal.
 class Progress {
  public:
   Progress() = default;
@@ -12,13 +13,14 @@ class Progress {
   Progress& operator=(const Progress&) = delete;
   ~Progress() { clear(); }
 
-  /// Returns whether standard error is a terminal. The line is shown only then.
+  /// Returns whether standard error is a terminal.
   [[nodiscard]] static bool isShown();
 
-  /// Replaces the line's text. Does nothing when isShown() is false.
+  /// Shows the line with `text`, in place of its previous text. Does nothing when isShown() is
+  /// false.
   void show(const std::string& text);
 
-  /// Removes the line.
+  /// Removes the line if it is shown.
   void clear();
 
   /// Removes the line and prints `text` on standard output.

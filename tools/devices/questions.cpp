@@ -20,7 +20,7 @@ void Questions::ask(const Array& addresses, Answered answered) {
       answered(answer);
     });
   };
-  // If the system cannot start another thread, the caller's thread asks the device and is blocked.
+  // If the system cannot start another thread, the caller's thread asks the device.
   if (!queue_.addOperation(operation)) operation();
 }
 

@@ -10,8 +10,8 @@
 
 namespace onramp::devices {
 
-/// Asks many devices at once, each on its own thread. The questions to each device are those of the
-/// wizard, but the wizard asks one device after another.
+/// Asks many devices at once, each on a separate thread. Each device gets the same requests as from
+/// the wizard, although the wizard asks one device after another.
 class Questions {
  public:
   using Answered = std::function<void(Answer answer)>;
@@ -19,16 +19,18 @@ class Questions {
   Questions() = default;
   Questions(const Questions&) = delete;
   Questions& operator=(const Questions&) = delete;
-  /// Calls stop() and waits for the threads, which then end soon.
+  /// Calls stop() and waits for the threads to end, which takes a fraction of a second.
   ~Questions();
 
-  /// Asks the device at `addresses` (strings). Calls `answered` with the answer on the main thread.
+  /// Asks the device at `addresses`, an array of strings, and returns at once. Later calls
+  /// `answered` with the answer on the main thread. If the system cannot start another thread, asks
+  /// the device first and then returns.
   void ask(const Array& addresses, Answered answered);
 
-  /// Stops asking. Devices that are being asked give incomplete answers.
+  /// Stops asking for good. Each device that is being asked gets an incomplete answer.
   void stop() { *stopped_ = true; }
 
-  /// Returns how many devices are being asked.
+  /// Returns the number of devices whose `answered` has not been called yet.
   [[nodiscard]] std::size_t pending() const { return *pending_; }
 
  private:

@@ -6,8 +6,9 @@
 
 namespace onramp::devices {
 
-/// Returns `name` in quotation marks, safe to show on any terminal. A space at either end or after
-/// another space becomes "␣". Bytes that are not printable text become "\xNN".
+/// Returns the UTF-8 text `name` in quotation marks, without anything that could control the
+/// terminal. A space at either end or after another space becomes "␣". A byte that is not part of
+/// printable text becomes "\xNN", where NN is its value in hexadecimal.
 [[nodiscard]] std::string inQuotes(std::string_view name);
 
 /// Returns a duration, given in seconds, as text such as "0.4 ms" or "12.1 s".

@@ -13,9 +13,10 @@ int showURI(const URIOptions& options) {
   const int status =
       KSNetServiceCopyAddressesForDeviceURI(options.uri, &addresses, options.seconds);
   if (status != 0 || !addresses) {
-    std::cerr << "onramp-devices: no IPv4 addresses for " << inQuotes(options.uri) << " within "
+    std::cerr << "onramp-devices: no IPv4 address for " << inQuotes(options.uri)
+              << ": the URI is not supported, or its host did not answer within "
               << durationText(options.seconds)
-              << "; \"onramp-devices browse\" shows which devices are announced\n";
+              << "; \"onramp-devices browse -v\" shows the URIs of the announced devices\n";
     return 1;
   }
   for (const std::string& address : *addresses)

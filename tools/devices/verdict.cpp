@@ -40,7 +40,7 @@ Verdict judgeSilence(const Device& device, const Answer& answer,
                            ", which costs the wizard " + durationText(answer.seconds);
   if (std::none_of(addresses.begin(), addresses.end(), isLocal)) {
     return {.id = "other-subnet",
-            .why = "its address is in none of this computer's subnets; " + cost,
+            .why = "none of its addresses is in a subnet of this computer; " + cost,
             .remedy =
                 "put the device and this computer into the same subnet; "
                 "\"onramp-devices hosts\" shows this computer's addresses"};
@@ -75,14 +75,14 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
       return {.id = "unreadable-reply",
               .why = told->outcome == Outcome::kUnreadable
                          ? "answers with bytes that are not a proper reply"
-                         : "answers a request other than the one that was sent",
+                         : "answers with the identifier of another request",
               .remedy = "\"onramp-devices ask\" shows the bytes; the firmware must be corrected"};
     case Outcome::kLate:
       return {
           .id = "late",
           .why = "answers late, after " + durationText(told->seconds.value_or(0)) +
                  "; the wizard waits " + std::to_string(kReceiveWait.count()) +
-                 " s for each of its questions, " + durationText(answer.seconds) + " in all",
+                 " s for each reply, " + durationText(answer.seconds) + " in all",
           .remedy =
               "wake the device up, for instance by pressing a key on its panel, and search again"};
     case Outcome::kRefused:
@@ -122,7 +122,7 @@ Verdict judge(const Device& device, const Medium& medium,
   }
   if (!isOneOf(medium.wanted, device.record)) {
     return {.id = "other-model",
-            .why = "is a " + inQuotes(modelTextOf(device.record)) + "; the search is for " +
+            .why = "is a " + inQuotes(modelTextOf(device.record)) + ", but the search is for " +
                    (medium.wanted.size() == 1 ? inQuotes(medium.wanted.front()) : "other models"),
             .remedy = "choose the device's own model in the wizard"};
   }
@@ -133,7 +133,7 @@ Verdict judge(const Device& device, const Medium& medium,
             .remedy = "switch on IPv4 in the device; the wizard uses only IPv4 addresses"};
   }
   if (!device.answer || !device.answer->isComplete) {
-    return {.id = "not-asked-yet", .why = "the search ended before the device had answered"};
+    return {.id = "not-asked-yet", .why = "the search ended before the device answered"};
   }
   if (device.answer->isWireless) {
     return {.id = "listed", .isListed = true, .why = "answers that it is on wireless"};
@@ -148,7 +148,8 @@ std::vector<Verdict> notesOn(const Device& device, const Medium&) {
   if (std::any_of(exchanges.begin(), exchanges.end(),
                   [](const Exchange& e) { return e.changedQuestion; })) {
     notes.push_back({.id = "changed-question",
-                     .why = "its reply changed the question that all later devices are asked",
+                     .why = "its reply names another object, and the wizard asks all later devices "
+                            "for that object",
                      .remedy =
                          "switch the device off while others are set up; the fault is in its "
                          "firmware, which must repeat the object's name (OID) from the request"});

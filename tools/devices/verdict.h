@@ -8,25 +8,26 @@
 
 namespace onramp::devices {
 
-/// Why a device is or is not in the wizard's list. If it is not, the verdict names the first
-/// condition that the device fails. Notes and problems of the network have the same form.
+/// The reason why a device is, or is not, in the wizard's list. If it is not, the verdict names the
+/// first condition that the device fails. Notes and problems of the network have the same form.
 struct Verdict {
-  std::string id;  ///< stable, for programs, such as "on-cable"
+  std::string id;  ///< such as "on-cable"; programs rely on it
   bool isListed = false;
   std::string why{};     ///< a sentence without its full stop
-  std::string remedy{};  ///< what to do; empty when nothing needs to be done
+  std::string remedy{};  ///< what to do; may be empty
 };
 
-/// Returns whether the wizard would ask the device which interface it uses.
+/// Returns whether the wizard would ask the device which interface it uses: the device is resolved
+/// under the medium's service type, is a model searched for, and has an IPv4 address.
 [[nodiscard]] bool isAsked(const Device& device, const Medium& medium);
 
-/// Returns the verdict on a device from everything known about it. `isLocal` returns whether an
-/// IPv4 address is in a subnet of this computer.
+/// Returns the verdict on a device. `isLocal` returns whether an IPv4 address is in a subnet of
+/// this computer.
 [[nodiscard]] Verdict judge(const Device& device, const Medium& medium,
                             const std::function<bool(const std::string& address)>& isLocal);
 
-/// Returns notes on the device's effects on other devices. The notes' ids are stable, like those of
-/// verdicts.
+/// Returns notes on how the device's replies change the requests to other devices. There are none
+/// when the device was not asked.
 [[nodiscard]] std::vector<Verdict> notesOn(const Device& device, const Medium& medium);
 
 }  // namespace onramp::devices

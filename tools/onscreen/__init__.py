@@ -1,1 +1,1 @@
-"""Uses the wizard on a screen from outside its process, as a person does."""
+"""Uses a program on a screen from outside its process, as a person does."""

@@ -9,14 +9,14 @@ import tempfile
 
 from .processes import Missing, start, stop, wait_for
 
-_SIZE = "2732x1536"  # the smallest screen that the wizard has to fit on, at twice the density
+_SIZE = "2732x1536"  # twice 1366 × 768, the smallest screen that the wizard must fit on
 
 
 def _free_display():
-    """Returns a display number that no X server uses.
+    """Returns a random display number that no X server uses.
 
-    In another network namespace, an X server does not notice that its number is in use and removes
-    the other server's socket.
+    An X server in another network namespace does not notice that a number is in use, and removes
+    the socket of the server that uses it. So this function looks for the socket.
     """
     while True:
         number = random.randrange(100, 50000)
@@ -25,10 +25,11 @@ def _free_display():
 
 
 class Desktop:
-    """A context manager that starts the desktop, and ends its programs when it is left.
+    """A context manager that starts a desktop, and stops its programs at the end.
 
-    Files and addresses that programs open with xdg-open are recorded instead of opened. A process
-    can use only one desktop, because the accessibility library keeps the first desktop's bus.
+    Programs on the desktop find a substitute for xdg-open that only records files and addresses. A
+    process can use only one desktop, because its accessibility library keeps the first desktop's
+    bus. There is no window manager if `window_manager` is false.
     """
 
     def __init__(self, window_manager=True):
@@ -64,24 +65,25 @@ class Desktop:
         return self._folder / "local"
 
     def opened(self):
-        """Returns the paths and addresses that were opened so far."""
+        """Returns the paths and addresses that were passed to xdg-open so far."""
         record = self._folder / "opened"
         return record.read_text().splitlines() if record.exists() else []
 
     def forget(self):
-        """Removes the application-support files and the record of what was opened."""
+        """Removes the application-support files and the record of opened paths and addresses."""
         for folder in (self.user_folder, self.local_folder):
             shutil.rmtree(folder, ignore_errors=True)
         (self._folder / "opened").unlink(missing_ok=True)
 
     def run(self, arguments, **options):
-        """Runs a program to its end and returns its output."""
+        """Runs a program to its end and returns its output. Raises an error if the program
+        fails."""
         done = subprocess.run(arguments, env=self.env, check=True, stdout=subprocess.PIPE,
                               text=True, **options)
         return done.stdout
 
     def picture(self, path):
-        """Saves a picture of the screen, without the empty desktop around the windows."""
+        """Saves a picture of the windows on the screen, without the empty desktop around them."""
         path.parent.mkdir(parents=True, exist_ok=True)
         self.run(["import", "-silent", "-window", "root", str(path)])
         self.run(["mogrify", "-bordercolor", "black", "-border", "1", "-trim", "+repage",

@@ -1,4 +1,4 @@
-"""Reads the texts that a medium has for the user."""
+"""Reads the texts in a medium's message bundle."""
 
 import pathlib
 import re
@@ -9,15 +9,15 @@ _TRADITIONAL_CHINESE = ("zh_hant", "zh_tw", "zh_hk", "zh_mo")
 
 
 class _Texts(dict):
-    """Texts by their keys. A missing text is replaced by its key, as in the wizard."""
+    """Texts by their keys. For a missing text, gives the key, as the wizard does."""
 
     def __missing__(self, key):
         return key
 
 
 def _fitness(offered, wanted):
-    """Returns how well the language `offered` suits a user of `wanted`: from 3, the same language, to
-    0, which the user does not read."""
+    """Returns how well the language `offered` suits a user who wants `wanted`, from 0 to 3. 3 means
+    the same language, and 0 means a language that the user does not read."""
     offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
                        for name in (offered, wanted))
     if offered == wanted:
@@ -30,16 +30,16 @@ def _fitness(offered, wanted):
 
 
 def languages(medium):
-    """Returns the names of the languages that the medium has texts in."""
+    """Returns the sorted names of the languages in which the medium has texts."""
     folders = (pathlib.Path(medium) / _RESOURCES).glob("*.lproj")
     return sorted(folder.stem for folder in folders)
 
 
 def language(medium, locales):
-    """Returns the language in which a user reads the medium's texts.
+    """Returns the language in which the wizard shows the medium's texts to a user.
 
-    `locales` are the user's, the preferred one first. If the medium has texts for none of them,
-    returns its first language, or "en" if it has no texts at all.
+    `locales` are the user's locales, the preferred one first. If no language of the medium suits
+    any of them, returns the medium's first language, or "en" if it has no texts at all.
     """
     offered = languages(medium)
     for wanted in locales:
@@ -50,12 +50,13 @@ def language(medium, locales):
 
 
 def read(medium, language):
-    """Returns the texts of one language."""
+    """Returns the medium's texts in one language."""
     return read_table(pathlib.Path(medium) / _RESOURCES / f"{language}.lproj/Localizable.strings")
 
 
 def read_table(table):
-    """Returns the texts of a strings file, which may be UTF-8 or UTF-16. A missing file has none."""
+    """Returns the texts of a strings file in UTF-8 or UTF-16. Returns no texts if the file is
+    missing."""
     data = table.read_bytes() if table.exists() else b""
     wide = data[:2] in (b"\xff\xfe", b"\xfe\xff")
     entries = _ENTRY.findall(data.decode("utf-16" if wide else "utf-8"))

@@ -1,4 +1,5 @@
-"""A person at the screen, who finds controls by role and name and uses mouse and keyboard."""
+"""A simulated person at the screen, who finds controls by their accessible roles and names, and
+uses mouse and keyboard."""
 
 import os
 import pathlib
@@ -7,18 +8,18 @@ import time
 from .processes import start, stop, wait_for
 
 _LOOK_SECONDS = 20
-# Each look at a table's cell makes Qt create an object that it never frees. So tables are searched
-# only when a cell is wanted.
+# Whenever a table's cell is looked at, Qt creates an object that it never frees. So a search for one
+# control enters tables only if the control is part of a table.
 _TABLES = ("list", "table", "tree", "tree table")
 _IN_TABLES = ("list item", "table cell", "table column header")
 _COLUMNS = 3
 
 
 def _is(control, role, name):
-    """Returns whether the control matches.
+    """Returns whether the control has the role and the name. The name None matches every control.
 
-    A heading counts as a label, too. The name of a row's first cell may be followed by a comma and
-    the row's address.
+    A heading counts as a label, too. The accessible name of a row's first cell may end with a comma
+    and the row's address, which `name` leaves out.
     """
     own_role = control.get_role_name()
     if own_role != role and (own_role, role) != ("heading", "label"):
@@ -33,12 +34,13 @@ def _words(role, name):
 
 
 class Person:
-    """A context manager that starts a program on a desktop, and ends the program when it is left.
+    """A person who uses one program. Creating the object starts the program on a desktop, and
+    leaving the object's context ends it.
 
-    Its methods use the program as a person does.
+    Most methods use the program as a person does.
     """
 
-    follows_desktop = True  # whether the program takes the desktop's text size, scale and colours
+    follows_desktop = True  # whether the program uses the desktop's text size, scale and colours
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
@@ -49,7 +51,7 @@ class Person:
         gi.require_version("Atspi", "2.0")
         from gi.repository import Atspi, GLib
         self._atspi = Atspi
-        self.errors = GLib.Error, AttributeError  # raised by the use of a control that is gone
+        self.errors = GLib.Error, AttributeError  # raised by the use of a control that no longer exists
         self._overlooked = False
         self.process = start([str(program), *arguments], env=desktop.env | (env or {}))
 
@@ -62,7 +64,10 @@ class Person:
     # Looking at the screen.
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
-        """Waits for a control of that role and name and returns it."""
+        """Waits until a control of that role and name is on the screen, and returns it.
+
+        Raises TimeoutError after `seconds`, and RuntimeError when the program has ended.
+        """
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
                         _words(role, name))
 
@@ -76,14 +81,14 @@ class Person:
                  f"{_words(role, name)} to disappear")
 
     def everything(self):
-        """Returns a list of (role, name, control) for everything on the screen."""
+        """Returns the tuple (role, name, control) of every control on the screen, in a list."""
         found = []
         self._visit(self._application(), lambda c: found.append(
             (c.get_role_name(), c.get_name(), c)))
         return found
 
     def rows(self):
-        """Returns the texts of the table on the screen, row by row."""
+        """Returns the texts of the device table on the screen, as one tuple for each row."""
         cells = [name for role, name, _ in self.everything() if role == "table cell"]
         rows = zip(*(cells[column::_COLUMNS] for column in range(_COLUMNS)))
         return [(row[0].removesuffix(f", {row[-1]}"), *row[1:]) for row in rows]
@@ -93,14 +98,14 @@ class Person:
         return control.get_state_set().contains(getattr(self._atspi.StateType, state.upper()))
 
     def picture(self, path):
-        """Saves a picture of the screen, after a moment for it to settle."""
+        """Saves a picture of the screen after a short pause, in which the screen settles."""
         time.sleep(0.3)
         self.desktop.picture(path)
 
     # Using the mouse and the keyboard.
 
     def click(self, role, name=None):
-        """Clicks the middle of a control once the control is enabled."""
+        """Waits until the control is enabled, and clicks its middle."""
         control = self.see(role, name)
         wait_for(lambda: self.has_state(control, "enabled"), _LOOK_SECONDS,
                  f"{_words(role, name)} to be enabled")
@@ -117,7 +122,8 @@ class Person:
         self.desktop.run(["xdotool", "click", "1"])
 
     def act(self, role, name):
-        """Performs a control's first action over the accessibility bus, without mouse or keys."""
+        """Performs the first action of a control over the accessibility bus, without mouse or
+        keyboard."""
         def acts():
             control = self.see(role, name)
             return self.has_state(control, "enabled") and control.get_action_iface().do_action(0)
@@ -125,9 +131,9 @@ class Person:
         wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
 
     def open_menu(self, button=None):
-        """Opens the menu of the button named `button`; without a name, of the one with the focus.
+        """Opens the menu of the button named `button` or, without a name, of the focused button.
 
-        The accessibility bus does not show the menu, so only the keyboard can use it.
+        The menu is not visible on the accessibility bus, so it can be used only by keyboard.
         """
         windows = self._window_count()
         if button:
@@ -138,7 +144,7 @@ class Person:
                  f"the menu of {repr(button) if button else 'the focused button'} to open")
 
     def choose_from_menu(self, button, item):
-        """Opens a button's menu and chooses the menu's `item`th entry."""
+        """Opens a button's menu and chooses the entry with the number `item`, counted from 1."""
         self.open_menu(button)
         self.choose_from_open_menu(item)
 
@@ -146,7 +152,7 @@ class Person:
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):
-        """Presses keys by their X names, such as "Return" or "alt+F4"."""
+        """Presses one key after another. Keys have their X names, such as "Return" or "alt+F4"."""
         self.desktop.run(["xdotool", "key", "--clearmodifiers", *keys])
 
     def close_window(self):
@@ -168,9 +174,9 @@ class Person:
         return True
 
     def _resting_place(self, control):
-        """Returns the place of a control once it no longer moves.
+        """Waits until the control no longer moves, and returns its extents on the screen.
 
-        The window manager moves a new window some time after it appears.
+        The window manager moves a new window some time after the window appears.
         """
         place = None
 
@@ -184,10 +190,11 @@ class Person:
         return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} to stop moving")
 
     def round_trip(self):
-        """Returns the seconds that the program takes to answer a small request.
+        """Returns the seconds that the program takes to answer a small request on the accessibility
+        bus.
 
-        Leaves out the time that the program and this process wait for a processor. Returns None
-        when the program has ended.
+        The time during which the program and this process wait for a processor does not count.
+        Returns None when the program has ended.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -222,9 +229,9 @@ class Person:
         return None
 
     def _certainly_gone(self, role, name):
-        """Returns whether it is certain that no control of that role and name is on the screen.
+        """Returns whether certainly no control of that role and name is on the screen.
 
-        A busy program does not answer, which does not mean that the control is gone.
+        If the program is too busy to answer, its controls may still be there.
         """
         self._overlooked = False
         found = self.sees(role, name)
@@ -242,9 +249,11 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` with `control` and everything visible below it, until `visit` returns False.
+        """Calls `visit` for `control` and all visible controls below it, until a call returns
+        False.
 
-        Goes depth first and skips objects that vanish. Enters tables only if `tables` is set.
+        Goes depth first, skips controls that disappear, and enters tables only if `tables` is set.
+        Returns False if a call returned False, otherwise True.
         """
         if control is None:
             self._overlooked = True

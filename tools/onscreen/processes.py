@@ -10,7 +10,7 @@ _libc = ctypes.CDLL(None, use_errno=True)
 
 
 class Missing(Exception):
-    """A program is not installed or does not start. The text says which one."""
+    """Raised when a program is not installed or does not start. The text names the program."""
 
 
 def _die_with_parent():
@@ -18,7 +18,8 @@ def _die_with_parent():
 
 
 def start(arguments, package=None, **options):
-    """Starts a program; `package` is the Debian package that contains it."""
+    """Starts a program. If it is missing, the error names `package`, the Debian package that
+    contains it."""
     try:
         return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)
     except FileNotFoundError as error:
@@ -27,7 +28,7 @@ def start(arguments, package=None, **options):
 
 
 def stop(process):
-    """Ends a program that start() returned, by force if it does not end within five seconds."""
+    """Ends a process that start() returned. Kills it if it has not ended after five seconds."""
     if process.poll() is None:
         process.terminate()
         try:
@@ -38,9 +39,9 @@ def stop(process):
 
 
 def wait_for(condition, seconds, what):
-    """Calls condition() until it returns a true value, and returns that.
+    """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises TimeoutError when there is none within `seconds`.
+    Raises TimeoutError after `seconds`. `what` describes the awaited event in the error's text.
     """
     deadline = time.monotonic() + seconds
     while True:
@@ -48,5 +49,5 @@ def wait_for(condition, seconds, what):
         if value:
             return value
         if time.monotonic() > deadline:
-            raise TimeoutError(f"waited {seconds} s for {what}, in vain")
+            raise TimeoutError(f"gave up after waiting {seconds} s for {what}")
         time.sleep(0.02)

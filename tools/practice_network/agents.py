@@ -1,4 +1,4 @@
-"""The SNMP side of the devices: one net-snmp agent for each address that answers."""
+"""The SNMP side of the devices: a net-snmp agent for each address that answers."""
 
 import json
 import os
@@ -16,22 +16,22 @@ MAKER = json.loads(pathlib.Path(os.environ.get("ONRAMP_MAKER")
 COMMUNITY = MAKER["snmpCommunity"]
 OBJECT = MAKER["activeIFObject"]
 PORT = 161
-# With these modules only, an agent starts in some 15 ms and does not listen for sub-agents.
+# With only these modules, an agent starts in about 15 ms and opens no socket for sub-agents.
 MODULES = "override,pass,vacm_conf,vacm_context"
 
 
 class AgentError(Exception):
-    """An agent did not start. The text says why."""
+    """Raised when an agent does not start. The text says why."""
 
 
 def listens(address):
-    """Returns whether a program on this host listens for SNMP requests at that address."""
+    """Returns whether a program on this host listens for SNMP requests at an IPv4 address."""
     number = socket.inet_aton(address)[::-1].hex().upper()
     return f" {number}:{PORT:04X} " in pathlib.Path("/proc/net/udp").read_text()
 
 
 class Agents:
-    """The SNMP agents of all devices that are present."""
+    """The SNMP agents of the devices that are switched on."""
 
     def __init__(self, folder):
         self._folder = pathlib.Path(folder)
@@ -39,7 +39,7 @@ class Agents:
         self._by_device = {}
 
     def start(self, devices):
-        """Starts the agents of all `devices` in parallel and returns when they listen."""
+        """Starts the agents of `devices` in parallel, and returns when all of them listen."""
         awaited = []
         for device in devices:
             handles = self._by_device[device.name] = []
@@ -59,9 +59,10 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """Forwards each request that is sent to the broadcast address `address` to all agents.
+        """From now on, forwards each request for `address`, a broadcast address, to every agent
+        that answers.
 
-        The agents themselves listen only at their own addresses.
+        The agents do not receive broadcasts, because they listen only at their own addresses.
         """
         listener = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
         listener.bind((address, PORT))
@@ -82,7 +83,8 @@ class Agents:
 
 
 def _relay(address, request, sender, seconds=5):
-    """Asks the agent at `address`, and sends its answer to `sender` from that address."""
+    """Sends `request` to the agent at `address`, and sends its answer to `sender` from
+    `address`."""
     with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as own:
         own.settimeout(seconds)
         try:
@@ -94,7 +96,8 @@ def _relay(address, request, sender, seconds=5):
 
 
 class _SilentAgent:
-    """Receives requests and never reads them, so that the sender gets neither answer nor refusal."""
+    """Opens the SNMP port and never reads from it, so a sender gets neither an answer nor a
+    refusal."""
 
     def __init__(self, address):
         self._socket = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
@@ -134,7 +137,8 @@ class _Agent:
         return self._log.read_text(errors="replace") if self._log.exists() else ""
 
     def close(self):
-        # Ends the whole session, because the script of a slow answer keeps the agent's socket open.
+        # The script of a slow answer keeps the agent's socket open, so the agent's whole process group
+        # has to end.
         if self._process.poll() is None:
             os.killpg(self._process.pid, signal.SIGKILL)
             self._process.wait()
@@ -145,7 +149,8 @@ def _override(activeif):
 
 
 def _slow_script(activeif, delay):
-    """Returns a script that net-snmp runs to get the object's name, type and value."""
+    """Returns a script that net-snmp runs for the object. After `delay` seconds, the script prints
+    the object's name, type and value, or nothing if the agent lacks the object."""
     answer = {MISSING: "", TEXT: f".{OBJECT}\nstring\ntwo"}.get(
         activeif, f".{OBJECT}\ninteger\n{activeif}")
     return f"#!/bin/sh\nsleep {delay}\n[ \"$1\" = -g ] && [ \"$2\" = .{OBJECT} ] || exit 0\n" \

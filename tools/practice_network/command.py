@@ -1,4 +1,4 @@
-"""The command line: starts the network, or controls it from the inside with `ctl`."""
+"""The command line: starts the network or, with `ctl`, controls the network from inside."""
 
 import argparse
 import importlib.util
@@ -22,32 +22,32 @@ PACKAGES = {"unshare": "util-linux", "setpriv": "util-linux", "nsenter": "util-l
 
 HELP = """
 Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns the exit
-status of COMMAND. Real Avahi and net-snmp daemons play the devices, inside separate namespaces. No
-packet leaves this machine, and no hardware is needed. When COMMAND or this tool ends, in whatever
-way, the network is gone.
+status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespaces of the kernel. No
+packet leaves this machine, and no hardware is needed. The network ends when COMMAND or this tool
+ends, in whatever way.
 
-This runs the wizard with twenty devices:
+This command runs the wizard with twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
-This starts a shell, in which commands such as these show the devices:
+This command starts a shell on the network. The commands after it show the devices there:
     tools/practice-network examples/practice-network.toml
     avahi-browse -rpt _pdl-datastream._tcp
     snmpget -v1 -c corridor 127.0.1.1 1.3.6.1.4.1.4242.2.4.4.1240.1.2.0
 
-Needs root or sudo; COMMAND runs as you in either case.
+The tool needs root or sudo. COMMAND runs as the user who started the tool.
 """
 
 DETAILS = """
-the description is a TOML file. It has one table for the network, which may be left out:
+the description is a TOML file. One table, which may be left out, is for the network:
     [network]
     ipv6 = true                    false: IPv4 only; default true
     interfaces = 2                 1 or 2; default 1. Both see all devices, as Ethernet and Wi-Fi do
                                    in one network. With --hosts 2 they are practice0 and practice1,
                                    otherwise lo and practice1.
     domains = ["annex.local"]      domains to browse besides "local"; default none
-and one table for each device:
+there is one table for each device:
     [[device]]
-    name = "Kestrel Model 100"     the name in the wizard's list; all other entries are optional
-    maker = "Kestrel"              as in the medium's model names: maker, space, model
+    name = "Kestrel Model 100"     the name in the wizard's list; only this entry is required
+    maker = "Kestrel"              maker and model, which make up the medium's model names
     model = "Model 100"
     note = "2nd floor"             the device's location
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
@@ -62,13 +62,13 @@ and one table for each device:
     present = false                switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
-these commands, run inside the network, add, remove and change devices while COMMAND runs. KEY=VALUE
-is an entry as in the file:
-    practice-network ctl list
+inside the network, these commands show and change the devices while COMMAND runs. KEY=VALUE is an
+entry as in the file:
+    practice-network ctl list                         prints the devices, with their states
     practice-network ctl add NAME [KEY=VALUE ...]     switches on a known device, or adds a new one
-    practice-network ctl set NAME KEY=VALUE ...       such as activeif=silent, delay=3, note=Attic
-    practice-network ctl rename NAME NEW-NAME
-    practice-network ctl remove NAME
+    practice-network ctl set NAME KEY=VALUE ...       changes a device, such as: activeif=silent
+    practice-network ctl rename NAME NEW-NAME         gives a device another name
+    practice-network ctl remove NAME                  switches a device off
     practice-network ctl unplug INTERFACE             takes an interface down
     practice-network ctl plug INTERFACE               brings the interface back
     practice-network ctl stop-daemon | start-daemon | restart-daemon      controls Avahi
@@ -77,13 +77,13 @@ PracticeNetwork in tools/practice_network offers these commands to Python tests.
 PracticeNetwork find the network through the environment variable ONRAMP_PRACTICE_SOCKET.
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
-do by default. Abstract sockets and TCP connections do not cross into the namespace. XDG_RUNTIME_DIR
-is a new, empty folder. The session bus, Wayland and the accessibility bus of your desktop cannot be
-reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
+do by default. Abstract sockets and TCP connections to the X server do not work inside.
+XDG_RUNTIME_DIR is a new folder. The session bus, Wayland and the accessibility bus of your
+desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
-exit status: that of COMMAND, or 128 + n if signal n ended it; 2 for a bad description, 77 if
-namespaces cannot be created here, 125 if the network did not start, 126 or 127 if COMMAND could not
-be run.
+exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description or
+command line, 77 if this machine cannot create namespaces, 125 if the network did not start or ended
+before COMMAND, 126 or 127 if COMMAND could not be run.
 """
 
 
@@ -108,9 +108,9 @@ def _run(program, arguments):
               "       practice-network ctl REQUEST [ARGUMENT ...]",
         description=textwrap.dedent(HELP), epilog=DETAILS)
     parser.add_argument("--hosts", type=int, choices=(1, 2), default=1,
-                        help="2: devices and COMMAND are on two hosts joined by a cable, "
-                             "192.0.2.0/24, each with its own Avahi; ctl controls that of the "
-                             "devices")
+                        help="2: devices and COMMAND are on two hosts in the network "
+                             "192.0.2.0/24, joined by a cable for each interface. Each host has "
+                             "its own Avahi; ctl controls the Avahi of the devices")
     parser.add_argument("--invoker", help=argparse.SUPPRESS)
     parser.add_argument("description", metavar="DESCRIPTION")
     parser.add_argument("command", metavar="COMMAND", nargs=argparse.REMAINDER)
@@ -132,8 +132,8 @@ def _enclose(options):
             return _complain(f"{name} is missing; install it: apt-get install {package}",
                              NETWORK_FAILED)
     if not importlib.util.find_spec("dbus"):
-        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3 and install "
-                         "it: apt-get install python3-dbus", NETWORK_FAILED)
+        return _complain(f"{sys.executable} has no module dbus; use /usr/bin/python3, and install "
+                         "the module: apt-get install python3-dbus", NETWORK_FAILED)
 
     from practice_network import namespace
     reason = namespace.why_not_enclosed()

@@ -1,4 +1,4 @@
-"""Controls a running network over a Unix socket, with one line of JSON per request and answer."""
+"""Controls a running network over a Unix socket. Requests and answers are lines of JSON."""
 
 import json
 import os
@@ -11,16 +11,18 @@ SOCKET_VARIABLE = "ONRAMP_PRACTICE_SOCKET"
 
 
 class ControlError(Exception):
-    """The network refused a request, or there is no network. The text says why."""
+    """Raised when the network refuses a request, and when there is no network. The text says
+    why."""
 
 
 class PracticeNetwork:
-    """The network that this process runs in, for tests and for `practice-network ctl`.
+    """The practice network in which this process runs, for tests and for `practice-network ctl`.
 
-    A device is identified by its name. Entries are those of the description file: `maker`, `model`,
-    `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `txt`. Every operation
-    returns when the network has carried it out. Avahi then takes another second to publish a new
-    device; settle() waits for that. A refused operation raises ControlError.
+    A device is identified by its name. Its entries are those of the description file: `maker`,
+    `model`, `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `present`, `txt`.
+    An operation returns when the network has carried it out. It may take Avahi another second to
+    publish a new device; settle() waits for that. An operation that the network refuses raises
+    ControlError.
     """
 
     def __init__(self, path=None):
@@ -30,13 +32,14 @@ class PracticeNetwork:
                                "start one with: practice-network DESCRIPTION")
 
     def add(self, name, **entries):
-        """Switches on a known device, changed by `entries`, or adds a new one made from them."""
+        """Changes a known device by `entries` and switches it on, or adds a new device with
+        `entries`."""
         self._ask("add", name, entries)
 
     def remove(self, name):
-        """Switches a device off: Avahi announces its departure, and its agents end.
+        """Switches a device off. Avahi announces that the device is gone, and its agents end.
 
-        Browsers see the device leave up to a second later, because mDNS caches keep it that long.
+        Browsers report the device as gone up to a second later, when it leaves their mDNS caches.
         """
         self._ask("remove", name)
 
@@ -44,15 +47,17 @@ class PracticeNetwork:
         self._ask("rename", name, new_name)
 
     def set(self, name, **entries):
-        """Changes a device. A new text or address is published as a change, not as a new device."""
+        """Changes a device. A new text or address is published as a change. After a change of name,
+        type, domain or port, the services are withdrawn and published again."""
         self._ask("set", name, entries)
 
     def list(self):
-        """Returns a dictionary per device: its entries and its "state", such as "established"."""
+        """Returns a dictionary for each device: its entries, and its "state", such as
+        "established"."""
         return self._ask("list")
 
     def unplug(self, interface):
-        """Takes an interface down for the devices and the command; plug() brings it back."""
+        """Takes an interface down for the devices and for the command. plug() brings it back."""
         self._ask("unplug", interface)
 
     def plug(self, interface):
@@ -69,7 +74,8 @@ class PracticeNetwork:
         self.start_daemon()
 
     def settle(self, seconds=30):
-        """Waits until Avahi has published every device that is present."""
+        """Waits until Avahi has published every device that is switched on. Raises ControlError
+        after `seconds`."""
         deadline = time.monotonic() + seconds
         while waiting := [one for one in self.list()
                           if one["present"] and one["state"] != "established"]:
@@ -98,7 +104,7 @@ OPERATIONS = ("add", "remove", "rename", "set", "list", "unplug", "plug", "stop_
 
 
 def serve(network, listener):
-    """Carries out requests, one after another, until the process is ended."""
+    """Carries out requests on `network`, one after another. Never returns."""
     while True:
         connection, _ = listener.accept()
         connection.settimeout(5)
@@ -121,5 +127,5 @@ def _answer(network, line):
         return {"error": f"not a request: {error}"}
     except DescriptionError as error:
         return {"error": str(error)}
-    except Exception as error:  # One failed request must not end the network.
+    except Exception as error:  # A failed request must not end the network.
         return {"error": f"{type(error).__name__}: {error}"}

@@ -1,4 +1,4 @@
-"""Reads the description of the network and its devices, and reports what is wrong with it."""
+"""Reads and checks the description of the network and its devices."""
 
 import dataclasses
 import difflib
@@ -6,7 +6,8 @@ import ipaddress
 import re
 import tomllib
 
-# What an address can do with an SNMP request instead of answering with an integer.
+# The values of `activeif` that are not integers. They say what an address does with an SNMP
+# request.
 SILENT = "silent"    # receives the request and never answers
 CLOSED = "closed"    # has no agent, so the host refuses the packet
 MISSING = "missing"  # has an agent that lacks the object
@@ -15,13 +16,13 @@ WORDS = (SILENT, CLOSED, MISSING, TEXT)
 
 DEFAULT_TYPE = "_pdl-datastream._tcp"
 DEFAULT_PORTS = {DEFAULT_TYPE: 9100, "_printer._tcp": 515, "_ipp._tcp": 631, "_scanner._tcp": 9500}
-# The TXT keys of maker and model: for scanners, and for printers.
+# The TXT keys of maker and model, which differ between scanners and printers.
 SCANNER_KEYS = ("mfg", "mdl")
 PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
 
 class DescriptionError(Exception):
-    """A bad description. The text names the file and the device, and says how to correct it."""
+    """Raised for a bad description or request. The text says what is wrong."""
 
 
 @dataclasses.dataclass(frozen=True)
@@ -51,19 +52,20 @@ class Device:
     txt: tuple[tuple[str, str], ...] = ()
 
     def behaviour(self):
-        """Returns what each address does with a request, in the order of the addresses."""
+        """Returns the value of `activeif` for each address, in the order of the addresses."""
         count = address_count(self.addresses)
         return self.activeif * count if len(self.activeif) == 1 else self.activeif
 
     def is_closed(self):
-        """Returns whether no address has an agent; closed devices can share their addresses."""
+        """Returns whether none of the device's addresses has an agent. Such devices may share
+        addresses."""
         return set(self.activeif) == {CLOSED}
 
     def port_of(self, service_type):
         return self.port or DEFAULT_PORTS.get(service_type, 9100)
 
     def txt_of(self, service_type):
-        """Returns the pairs of the TXT record for one of the device's service types."""
+        """Returns the pairs of key and text in the TXT record of a service type."""
         keys = SCANNER_KEYS if service_type == "_scanner._tcp" else PRINTER_KEYS
         named = ((keys[0], self.maker), (keys[1], self.model), ("note", self.note))
         return tuple((key, value) for key, value in named if value is not None) + self.txt
@@ -74,7 +76,8 @@ def address_count(addresses):
 
 
 def load(path):
-    """Returns the settings and the list of devices of a description file."""
+    """Returns the settings and the list of devices in a description file. Raises
+    DescriptionError."""
     try:
         with open(path, "rb") as file:
             content = tomllib.load(file)
@@ -106,12 +109,13 @@ def load(path):
 
 
 def device(table, place):
-    """Returns the device that `table` describes. `place` begins any error message."""
+    """Returns the device that `table` describes. The text of an error begins with `place`."""
     return change(None, table, place)
 
 
 def change(before, table, place):
-    """Returns `before` changed by the entries of `table`, or a new device when `before` is None."""
+    """Returns a copy of `before` with the entries in `table`, or a new device if `before` is
+    None."""
     values = _read(table, READERS, place)
     if before is None and "name" not in values:
         raise DescriptionError(f"{place}: name is missing; give {READERS['name'][1]}")
@@ -130,7 +134,8 @@ def change(before, table, place):
 
 
 def _read(table, readers, place):
-    """Returns the table's values, each checked and converted by the reader of its key."""
+    """Returns the values of `table`. `readers` has, for each key, the function that checks and
+    converts the value, and a description of valid values."""
     values = {}
     for key, value in table.items():
         if key not in readers:
@@ -232,10 +237,10 @@ READERS = {
     "model": (_text, "a text"),
     "note": (_text, "a text"),
     "type": (_types, 'a service type such as "_ipp._tcp", or a list of different ones'),
-    "domain": (_domain, 'a domain such as "annex.local"'),
+    "domain": (_domain, 'a domain that ends in "local", such as "annex.local"'),
     "port": (lambda value: _whole(value, 1, 65535), "a whole number from 1 to 65535"),
-    "addresses": (_addresses, 'a number from 1 to 32, or a list of different addresses such as '
-                              '["127.0.1.9"]'),
+    "addresses": (_addresses, 'a number from 1 to 32, or a list of different addresses of single '
+                              'hosts, such as ["127.0.1.9"]'),
     "activeif": (_activeif, 'a whole number, "silent", "closed", "missing" or "text", '
                             "or a list of these with one for each address"),
     "delay": (_delay, "a number of seconds from 0 to 3600"),
@@ -246,5 +251,5 @@ READERS = {
 SETTING_READERS = {
     "ipv6": (_truth, "true or false"),
     "interfaces": (lambda value: _whole(value, 1, 2), "1 or 2"),
-    "domains": (_domains, 'a list of domains such as ["annex.local"]'),
+    "domains": (_domains, 'a list of domains that end in "local", such as ["annex.local"]'),
 }

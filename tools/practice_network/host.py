@@ -52,7 +52,8 @@ publish-workstation=no
 
 
 class HostError(Exception):
-    """A command failed, or a part of the host did not start. The text says which one and why."""
+    """Raised when a command fails or a daemon does not start. The text names the program and the
+    reason."""
 
 
 def run(*command):
@@ -62,8 +63,9 @@ def run(*command):
 
 
 def take_over_run():
-    """Mounts an empty /run in this process's mount namespace."""
-    # This machine's own static Avahi services must not appear among the made-up devices.
+    """Mounts an empty /run in this process's mount namespace, and hides this machine's Avahi services.
+    """
+    # These services would appear among the made-up devices.
     if pathlib.Path("/etc/avahi/services").is_dir():
         run("mount", "-t", "tmpfs", "none", "/etc/avahi/services")
     run("mount", "-t", "tmpfs", "-o", "mode=755", "none", "/run")
@@ -71,7 +73,7 @@ def take_over_run():
 
 
 def loop_back(second):
-    """Makes loopback the network of this network namespace.
+    """Makes the loopback interface the network of the devices and the command.
 
     `second` is the name of a second interface to create, or None.
     """
@@ -83,10 +85,10 @@ def loop_back(second):
 
 
 def plug_in_cables(names):
-    """Connects this network namespace to that of the first process by virtual cables.
+    """Connects this network namespace with the one of process 1 by virtual cables.
 
-    All cables are in one network, like the Ethernet and Wi-Fi of a computer. When one is unplugged,
-    the next one carries its traffic.
+    All cables are in one network, like the Ethernet and the Wi-Fi of a computer. When a cable is
+    unplugged, the next cable carries the traffic.
     """
     for number, name in enumerate(names):
         run("ip", "link", "add", name, "type", "veth", "peer", "name", name, "netns", "1")
@@ -99,7 +101,7 @@ def plug_in_cables(names):
 
 
 def _configure(name, address=None, metric=0, enter=()):
-    # No other host can use these addresses, so duplicate detection would only cost a second.
+    # No other host can use these addresses, so looking for duplicates would only cost a second.
     _set_kernel(f"ipv6/conf/{name}/accept_dad", 0, enter)
     if address:
         run(*enter, "ip", "address", "add", address, "brd", "+", "dev", name, "metric", str(metric))
@@ -116,7 +118,7 @@ def _set_kernel(key, value, enter):
 
 
 class Host:
-    """The host made of this process's namespaces. It has a system bus and can start Avahi."""
+    """The host that this process's namespaces form. It has a system bus and can start Avahi."""
 
     def __init__(self, name, interfaces, settings):
         self._name = name
@@ -129,7 +131,8 @@ class Host:
         run("ip", "address", "replace", address, "dev", self.interfaces[0])
 
     def plug(self, interface, plugged):
-        """Brings both ends of an interface's cable up, or down when `plugged` is false."""
+        """Brings the interface up if `plugged` is true, otherwise down. With two hosts, does the same
+        at the other end of the cable."""
         for enter in ((), IN_FIRST_HOST):
             if plugged:
                 _bring_up(interface, self.interfaces.index(interface), enter)
@@ -148,7 +151,7 @@ class Host:
                              "--no-rlimits")
 
     def stop_avahi(self):
-        """Ends the daemon normally, so that it announces the departure of all its services."""
+        """Ends the daemon normally, so that it announces that all its services are gone."""
         if self._avahi:
             self._avahi.terminate()
             self._avahi.wait()
@@ -172,7 +175,7 @@ def log(program):
 
 
 def _start(program, *arguments):
-    # A new session keeps Ctrl-C, which is meant for the command, from reaching the daemon.
+    # Ctrl-C is meant for the command. It does not reach the daemon, which is in another session.
     with open(RUN / f"{program}.log", "ab") as output:
         return subprocess.Popen([program, *arguments], stdin=subprocess.DEVNULL, stdout=output,
                                 stderr=output, start_new_session=True)

@@ -1,4 +1,4 @@
-"""Encloses the network in namespaces, from which nothing leaks and which end with the tool."""
+"""Runs the network in namespaces. Nothing leaks out of them, and they end with the tool."""
 
 import json
 import os
@@ -25,7 +25,8 @@ CABLES = ("practice0", "practice1")
 
 
 def why_not_enclosed():
-    """Returns None if this process can create these namespaces, else the reason why not."""
+    """Returns None if this process can create the namespaces, otherwise the reason why it
+    cannot."""
     probe = subprocess.run([*ENCLOSE, "mount", "-t", "tmpfs", "none", "/run"],
                            capture_output=True, text=True)
     if probe.returncode:
@@ -39,9 +40,9 @@ def why_not_enclosed():
 
 
 def enclose(options):
-    """Runs the network and its command in namespaces; returns the command's exit status."""
-    # Ctrl-C is meant for the command, which gets it from the terminal. SIGTERM and SIGHUP end
-    # everything.
+    """Runs the network and the command in new namespaces. Returns the command's exit status."""
+    # Ctrl-C is meant for the command, which also receives SIGINT from the terminal. SIGTERM and
+    # SIGHUP end everything.
     signal.signal(signal.SIGINT, lambda *_: None)
     process = subprocess.Popen(
         ["setpriv", "--pdeathsig", "KILL", *ENCLOSE,
@@ -60,8 +61,9 @@ def enclose(options):
 
 
 def inside(options):
-    """The first process of the namespaces: starts the network, then the command."""
-    # A handler instead of SIG_IGN, because the command would inherit an ignored signal.
+    """Runs as the first process in the namespaces. Starts the network and then the command, and
+    returns the exit status."""
+    # SIG_IGN is unsuitable, because the command would inherit it.
     signal.signal(signal.SIGINT, lambda *_: None)
     try:
         environment = _own_run(options["user"])
@@ -80,7 +82,7 @@ def inside(options):
     except OSError as error:
         print(f"practice-network: {options['command'][0]}: {error.strerror}", file=sys.stderr)
         return 127 if isinstance(error, FileNotFoundError) else 126
-    # This is the first process of the namespace, so it has to reap all orphans.
+    # The first process in a namespace has to reap all orphans.
     while True:
         pid, status = os.wait()
         if pid == command.pid:
@@ -90,8 +92,8 @@ def inside(options):
 
 
 def devices(options):
-    """The process of the devices, on the command's host or on a second host: starts the devices and
-    serves requests. Returns an exit status only on failure."""
+    """Runs as the process of the devices, on the command's host or on a second host. Starts the
+    devices and carries out requests. Returns only after a failure, with the exit status."""
     try:
         settings, described = description.load(options["description"])
         if options["hosts"] == 2:
@@ -117,7 +119,8 @@ def devices(options):
 
 
 def _own_run(user):
-    """Takes over /run. Returns the command's environment variables, which lead to the new /run."""
+    """Takes over /run. Returns the environment variables for the command, which refer to the new
+    /run."""
     variables = {SOCKET_VARIABLE: str(RUN / "socket"), "DBUS_SYSTEM_BUS_ADDRESS": BUS_ADDRESS,
                  "XDG_RUNTIME_DIR": str(RUN / "user")}
     authority = pathlib.Path(os.environ.get("XAUTHORITY", "/nowhere"))
@@ -132,7 +135,7 @@ def _own_run(user):
         copy.write_bytes(cookies)
         os.chown(copy, *user)
         variables["XAUTHORITY"] = str(copy)
-    # These variables name sockets that were in the old /run.
+    # These variables name sockets that may be in the old /run.
     gone = ("DBUS_SESSION_BUS_ADDRESS", "WAYLAND_DISPLAY")
     return {key: value for key, value in os.environ.items() if key not in gone} | variables
 
@@ -165,7 +168,7 @@ def _start_command(options, environment):
 
 
 def _status(code):
-    """Returns a child's exit status as a shell reports it."""
+    """Returns the exit status that a shell would report for a child's return code."""
     return code if code >= 0 else 128 - code
 
 

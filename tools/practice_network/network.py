@@ -1,4 +1,4 @@
-"""The devices of a running network, and the changes to them."""
+"""The devices of a running network, and the operations that change them."""
 
 import collections
 import dataclasses
@@ -14,7 +14,8 @@ from practice_network.publisher import Publisher, PublishError
 
 
 class Network:
-    """All described devices. Those that are present are published and answer SNMP requests."""
+    """All known devices. Those that are present, which means switched on, are published, and their
+    agents run."""
 
     def __init__(self, host, subnet):
         self._host = host
@@ -22,14 +23,14 @@ class Network:
         self._agents = Agents(RUN / "agents")
         self._publisher = None
         self._devices = {}
-        # A device keeps its host name, so that it publishes the same name each time it appears.
+        # A device has the same host name whenever it is switched on.
         numbers = itertools.count(1)
         self._host_names = collections.defaultdict(lambda: f"device-{next(numbers)}.local")
 
     def load(self, devices):
-        """Takes over all devices of a description and publishes those that are present."""
+        """Takes the devices of a description, and publishes those that are present."""
         self._devices = {device.name: device for device in devices}
-        # Devices with fixed addresses come first, so that no other device is given these addresses.
+        # Devices with fixed addresses come first, so that other devices do not get these addresses.
         for device in sorted(devices, key=lambda one: isinstance(one.addresses, int)):
             self._devices[device.name] = self._with_addresses(device)
         present = [device for device in self._devices.values() if device.present]
@@ -47,7 +48,7 @@ class Network:
                     self._publish(device)
 
     def unplug(self, interface):
-        """Takes an interface down on both hosts; plug() brings it back."""
+        """Takes an interface down for the devices and for the command. plug() brings it back."""
         self._plug(interface, False)
 
     def plug(self, interface):
@@ -55,12 +56,13 @@ class Network:
 
     def _plug(self, interface, plugged):
         if interface not in self._host.interfaces:
-            raise DescriptionError(f'interface "{interface}": is unknown; the interfaces are '
+            raise DescriptionError(f'interface "{interface}" is unknown; the interfaces are '
                                    + ", ".join(self._host.interfaces))
         self._host.plug(interface, plugged)
 
     def settle(self, seconds=30):
-        """Waits until Avahi has established every device that is present."""
+        """Waits until Avahi has published every device that is present. Raises PublishError after
+        `seconds`."""
         deadline = time.monotonic() + seconds
         for device in self._devices.values():
             while device.present and (state := self._state(device)) != "established":
@@ -76,7 +78,8 @@ class Network:
         self._host.stop_avahi()
 
     def add(self, name, entries):
-        """Switches on a known device, changed by `entries`, or adds a new one."""
+        """Changes a known device by `entries` and switches it on, or adds a new device with
+        `entries`."""
         if name in self._devices:
             self.set(name, entries | {"present": True})
             return
@@ -92,13 +95,13 @@ class Network:
         self.set(name, {"name": new_name})
 
     def set(self, name, entries):
-        """Changes a device. Publishes only what the new entries change."""
+        """Changes a device, and publishes what the entries change."""
         before = self._devices.get(name)
         if not before:
-            raise DescriptionError(f'device "{name}": is unknown; "list" shows the known devices')
+            raise DescriptionError(f'device "{name}" is unknown; "list" shows the known devices')
         after = description.change(before, entries, f'device "{name}"')
         if after.name != name and after.name in self._devices:
-            raise DescriptionError(f'device "{after.name}": exists already; choose another name')
+            raise DescriptionError(f'device "{after.name}" exists already; choose another name')
         after = self._with_addresses(after, name)
         if after.name != name:
             self._devices = {after.name if key == name else key: value
@@ -128,7 +131,8 @@ class Network:
                 self._publish(after)
 
     def list(self):
-        """Returns a dictionary per device: its entries and its "state", such as "established"."""
+        """Returns a dictionary for each device: its entries, and its "state", such as
+        "established"."""
         return [{key: value for key, value in dataclasses.asdict(device).items()
                  if value is not None}
                 | {"txt": dict(device.txt), "state": self._state(device)}
@@ -153,13 +157,14 @@ class Network:
         self._agents.stop(device)
 
     def _with_addresses(self, device, known_as=None):
-        """Gives the device its own addresses and adds them to the host. Returns the device."""
+        """Returns the device with addresses, which the network chooses if `addresses` is a number.
+        Adds the addresses to the host. `known_as` is the device's old name if its name changes."""
         name = known_as or device.name
         used = {address for key, other in self._devices.items() if key != name
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())
                 if behaviour != description.CLOSED}
         if isinstance(device.addresses, int):
-            # The first addresses of the network belong to the hosts themselves.
+            # The network's first addresses are reserved for the hosts.
             hosts = itertools.islice(self._subnet.hosts(), 256 if self._subnet.is_loopback else 9,
                                      None)
             avoided = used if device.is_closed() else used | self._addresses_of_others(name)

@@ -1,4 +1,4 @@
-"""The mDNS side of the devices: a real Avahi daemon publishes their host names and services."""
+"""The mDNS side of the devices. A real Avahi daemon publishes their host names and services."""
 
 import dataclasses
 import ipaddress
@@ -11,9 +11,9 @@ AVAHI = "org.freedesktop.Avahi"
 ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
-# Unique, without probes, several records of a name allowed. Nobody else uses these host names, so
-# probes are unnecessary. They would also do harm: a probe that comes back on loopback after its
-# record was replaced looks to Avahi like a conflict.
+# The flags mean: unique, no probes, several records for one name. Probes are unnecessary, because
+# nobody else uses these host names. They would also do harm. On loopback, Avahi receives its own
+# probes. If it has replaced the record since it sent a probe, it treats this probe as a conflict.
 ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
 ADDRESS_SECONDS = dbus.UInt32(120)  # RFC 6762, section 10
 CLASS_IN, TYPE_A, TYPE_AAAA = dbus.UInt16(1), dbus.UInt16(1), dbus.UInt16(28)
@@ -22,11 +22,12 @@ GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 
 
 
 class PublishError(Exception):
-    """Avahi refused a request or is not running. The text says which."""
+    """Raised when Avahi does not start, and when it does not publish a device in time. The text
+    says which."""
 
 
 def connect(bus_address, seconds=10):
-    """Waits until Avahi runs. Returns a connection to its bus and its server object."""
+    """Waits until Avahi runs. Returns a connection to the bus, and Avahi's server object on it."""
     bus = dbus.bus.BusConnection(bus_address)
     deadline = time.monotonic() + seconds
     while True:
@@ -45,7 +46,8 @@ def connect(bus_address, seconds=10):
 
 @dataclasses.dataclass(frozen=True)
 class _Entry:
-    """What is published for a device. Its addresses are a separate group and can change alone."""
+    """The published records of a device. Addresses and services are separate groups, so the
+    addresses can be replaced alone."""
 
     host: str
     addresses: dbus.Interface
@@ -53,7 +55,7 @@ class _Entry:
 
 
 class Publisher:
-    """Publishes devices. Closing the connection withdraws all of them."""
+    """Publishes devices. close() withdraws all of them."""
 
     def __init__(self, bus_address):
         self._bus, self._server = connect(bus_address)
@@ -73,7 +75,7 @@ class Publisher:
         entry.services.Commit()
 
     def publish_addresses(self, device):
-        """Replaces the published addresses by the device's present ones."""
+        """Replaces the published addresses by those in `device`."""
         entry = self._entries[device.name]
         entry.addresses.Reset()
         for address in map(ipaddress.ip_address, device.addresses):
@@ -84,7 +86,7 @@ class Publisher:
         entry.addresses.Commit()
 
     def publish_txt(self, device):
-        """Replaces the published TXT records by the device's present ones."""
+        """Replaces the published TXT records by those of `device`."""
         services = self._entries[device.name].services
         for service_type in device.type:
             services.UpdateServiceTxt(ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name,
@@ -96,17 +98,18 @@ class Publisher:
             entry.addresses.Free()
 
     def await_probed(self, device, seconds=5):
-        """Waits until Avahi has probed for the device's name, or `seconds` have passed.
+        """Waits until Avahi has finished probing for the device's name, for at most `seconds`.
 
-        The device's records must not change during the probes. On loopback Avahi hears its own
-        probes, and mistakes one with an older text for a rival's.
+        The device's records must not change during the probes. On loopback, Avahi receives its own
+        probes. If a probe has an older text than the record, Avahi treats the probe as a conflict.
         """
         deadline = time.monotonic() + seconds
         while self.state(device) == "probing" and time.monotonic() < deadline:
             time.sleep(0.01)
 
     def state(self, device):
-        """Returns "established" when both groups are, otherwise the state of one that is not."""
+        """Returns "established" if both groups of the device are established, otherwise the state
+        of a group that is not."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"

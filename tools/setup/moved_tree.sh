@@ -1,7 +1,7 @@
-# Sourced by the scripts at the root. CMake refuses a build folder that another source tree made, as in a
-# copied or moved tree.
+# The scripts `run` and `test` source this file. CMake refuses a build folder that was made for
+# another source tree. A copied or moved tree may contain such folders.
 
-# Removes the build folder of a preset if another source tree made it.
+# Removes build/PRESET if it was made for another source tree. The argument is the preset's name.
 forget_build_of_another_tree() {
   local cache=build/$1/CMakeCache.txt made_in
   [ -f "$cache" ] || return 0

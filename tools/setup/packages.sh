@@ -1,4 +1,6 @@
-# Sourced by the scripts at the root. Installs every package in a list, unless this machine has it.
+# The scripts `run` and `test` source this file.
+
+# Installs those packages in a list that this machine lacks. The argument is the file with the list.
 
 install_packages() {
   local list=$1 missing

@@ -6,7 +6,7 @@
 
 namespace onramp::conformance {
 
-/// The application's window.
+/// Returns the application's window, or an empty handle on the recording front end.
 [[nodiscard]] const Window& window();
 
 /// Clicks the button titled `title` in an alert or a sheet, as a user would, once that button is

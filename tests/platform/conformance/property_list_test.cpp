@@ -68,7 +68,8 @@ TEST(PropertyList, IsNothingWhenTheFileHoldsAnythingElse) {
   EXPECT_EQ(loadDictionary(folder / "absent"), std::nullopt);
   EXPECT_EQ(loadDictionary(folder / "."), std::nullopt);
   EXPECT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
-  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt) << "the pipe has no writer";
+  EXPECT_EQ(loadDictionary(folder / "pipe"), std::nullopt)
+      << "reading a pipe without a writer does not block";
 }
 
 TEST(PropertyList, IsNothingWhenItsXMLIsNotWellFormed) {
@@ -86,7 +87,7 @@ TEST(PropertyList, IsWrittenWholeOrNotAtAll) {
   std::filesystem::create_directories(folder / "taken/inside");
   EXPECT_FALSE(writeDictionaryAtomically(before, folder / "taken"));
   EXPECT_FALSE(writeDictionaryAtomically(before, folder / "absent/list"));
-  EXPECT_EQ(folder.names().size(), 2U) << "a temporary file was left";
+  EXPECT_EQ(folder.names().size(), 2U) << "a write that fails leaves no temporary file";
   EXPECT_TRUE(writeDictionaryAtomically(before.with("k", "after"), folder / "list"));
   EXPECT_EQ(loadDictionary(folder / "list"), before.with("k", "after"));
   removeDictionary(folder / "list");

@@ -1,7 +1,7 @@
-// Stands in for the part of Core Foundation that the macOS backends call, so that they compile and
-// run where the framework is missing. The tests show how the backends use objects, not how
-// macOS behaves. The sanitizers report an object that is released too often or never. The functions
-// are lambdas, which take only one line each.
+// A stand-in for the part of Core Foundation that platform/corefoundation, cfnetwork and
+// systemconfiguration call. With the stand-ins in this folder, these backends compile and run on
+// Linux. The tests show how the backends use the frameworks' objects, not how macOS behaves. The
+// sanitizers report an object that is released too often or never.
 #pragma once
 
 #include <cstddef>
@@ -37,8 +37,8 @@ struct Object {
   }
 
   Kind kind;
-  std::string bytes;             // of a string or data
-  std::vector<Object*> members;  // owned; a dictionary's keys and values alternate
+  std::string bytes;             // the contents of a string or data
+  std::vector<Object*> members;  // owned; in a dictionary, keys and values alternate
   int references = 1;
 };
 
@@ -77,8 +77,8 @@ inline const auto CFStringCreateWithBytes = [](std::nullptr_t, const UInt8* byte
   std::string text(reinterpret_cast<const char*>(bytes), static_cast<std::size_t>(size));
   return onramp::isUTF8(text) ? new standin::Object(standin::kString, text) : nullptr;
 };
-// The real function counts UTF-16 units. The difference does not matter, because the backends read
-// strings whole.
+// The real function returns the number of UTF-16 units, not of bytes. The difference does not
+// matter, because the backends always read whole strings.
 inline const auto CFStringGetLength = [](CFStringRef text) { return text->bytes.size(); };
 inline const auto CFRangeMake = [](int, std::size_t length) { return length; };
 using CFRange = std::size_t;

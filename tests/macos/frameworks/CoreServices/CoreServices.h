@@ -1,4 +1,5 @@
-// Stands in for CFNetwork's services. CoreFoundation/CoreFoundation.h explains the purpose.
+// A stand-in for the network services of CFNetwork; CoreFoundation/CoreFoundation.h says what the
+// stand-ins are for.
 #pragma once
 
 #include <CoreFoundation/CoreFoundation.h>
@@ -16,8 +17,8 @@ struct CFNetServiceClientContext {
 
 namespace standin {
 
-/// The state that services and browsers share. `isScheduled` is true while the object is scheduled
-/// on the main loop in its common modes.
+/// The members that services and browsers have in common. `isScheduled` is true while the object is
+/// scheduled on the main loop in its common modes.
 template <typename Client>
 struct Scheduled : Object {
   Scheduled() : Object(kOther) {}
@@ -25,7 +26,7 @@ struct Scheduled : Object {
   Client client = nullptr;
   void* info = nullptr;
   bool isScheduled = false;
-  bool isRunning = false;  // a search or a resolve
+  bool isRunning = false;  // whether a search or a resolve is running
 };
 
 struct Service : Scheduled<void (*)(Service*, CFStreamError*, void*)> {

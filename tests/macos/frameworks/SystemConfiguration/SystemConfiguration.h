@@ -1,4 +1,5 @@
-// Stands in for the dynamic store. CoreFoundation/CoreFoundation.h explains the purpose.
+// A stand-in for the dynamic store; CoreFoundation/CoreFoundation.h says what the stand-ins are
+// for.
 #pragma once
 
 #include <CoreFoundation/CoreFoundation.h>
@@ -13,7 +14,7 @@ struct SCDynamicStoreContext {
 
 namespace standin {
 
-/// A session. Its answer to a request holds the keys or patterns of that request.
+/// A session with the store. The answer to a request holds the request's own keys or patterns.
 struct Store : Object {
   Store() : Object(kOther) { last = this; }
   ~Store() override {

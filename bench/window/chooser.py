@@ -1,0 +1,88 @@
+"""The wizard's chooser on a practice network, as the benchmarks of the window use it."""
+
+import os
+import pathlib
+import subprocess
+import sys
+import time
+
+ROOT = pathlib.Path(__file__).resolve().parents[2]
+sys.dont_write_bytecode = True
+sys.path[:0] = [str(ROOT / "bench"), str(ROOT / "tools"), str(ROOT / "tests/window")]
+
+from onscreen.person import Person  # noqa: E402
+from report.cases import require  # noqa: E402
+
+PROGRAM = "Onramp OSX.app/Contents/Linux/Onramp OSX"
+MAKER, MODEL = "Kestrel", "Model 100"
+GEAR, GEAR_REFRESH = "Actions", 2
+WAIT_SECONDS = 90  # for a search to end
+
+
+def require_medium(folder):
+    """Returns the medium's full path. Ends the program with a message when it lacks the wizard."""
+    medium = pathlib.Path(folder).resolve()
+    require([medium / PROGRAM],
+            "build it: cmake --preset release && cmake --build --preset release --target medium")
+    return medium
+
+
+def enter_network(description="/dev/null"):
+    """Starts this program again on a practice network, unless it already runs on one."""
+    if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
+        os.execv(sys.executable, [sys.executable, str(ROOT / "tools/practice-network"),
+                                  str(description), sys.executable, *sys.argv])
+
+
+class Chooser(Person):
+    """A person who goes to the wizard's chooser and searches for devices there.
+
+    `text` has the texts of the medium in English.
+    """
+
+    def __init__(self, desktop, medium, text):
+        super().__init__(desktop, medium / PROGRAM, env={"LANG": "en_US.UTF-8"})
+        self._text = text
+        self._key = None
+
+    def go_there(self):
+        """Chooses wireless on the first page, which must be that of the connections. Returns when the
+        first search has ended."""
+        self.see("radio button", self._text["INST_TXT_WIFI"])
+        self.click("push button", self._text["BTN_NEXT"])
+        self.see("label", self._text["INST_TXT_DEVLIST"], WAIT_SECONDS)
+        self.wait()
+
+    def refresh(self):
+        """Empties the list and starts a search. Returns the time at which the key was pressed.
+
+        Does not wait until the program has got the key.
+        """
+        self.open_menu(GEAR)
+        self.press(*["Down"] * GEAR_REFRESH)
+        began = time.monotonic()
+        self._key = subprocess.Popen(["xdotool", "key", "Return"], env=self.desktop.env)
+        return began
+
+    def wait(self):
+        """Waits until the search has ended that go_there() or refresh() started."""
+        if self._key:
+            self._key.wait()
+            time.sleep(0.2)  # in which the search begins
+        self.see_gone("label", self._text["INST_WAIT"], WAIT_SECONDS)
+
+    def screen_coordinates(self):
+        return self._atspi.CoordType.SCREEN
+
+    def table(self):
+        """Returns the accessible table of the devices. Reading its number of rows makes no cells."""
+        return self.see("tree").get_table_iface()
+
+    def names(self):
+        """Returns the names of the listed devices, even of those that have to be scrolled to."""
+        table = self.table()
+        names = []
+        for row in range(table.get_n_rows()):
+            name, address = (table.get_accessible_at(row, column).get_name() for column in (0, 2))
+            names.append(name.removesuffix(f", {address}"))
+        return names

@@ -1,0 +1,94 @@
+"""Devices that come and go on a practice network."""
+
+import random
+import threading
+import time
+
+from chooser import MAKER, MODEL
+
+REST = 3          # seconds after which a device that left is in no cache
+STEADY = 4        # wireless devices that never leave
+AT_ONCE = 24      # devices that come and go and are there at the same time, at most
+_PAUSES = (0.2, 1.0)  # seconds between two changes of the network, at least and at most
+_BEHAVIOURS = (2, 2, 2, 2, 1, "missing", "text", "closed")
+
+
+class Devices(threading.Thread):
+    """Devices that come and go from start() on, except between rest() and resume()."""
+
+    def __init__(self, network, seed):
+        super().__init__(daemon=True)
+        self._network = network
+        self._dice = random.Random(seed)
+        self._allowed = threading.Lock()
+        self._present = {f"Steady {number}": 2 for number in range(STEADY)}
+        self._left = {}
+        self._number = 0
+        self.changes = []  # (time, name, "came" or "left") of each change
+        self._failure = None
+        for name in self._present:
+            network.add(name, maker=MAKER, model=MODEL)
+        network.settle()
+
+    def run(self):
+        try:
+            while True:
+                with self._allowed:
+                    self._change()
+                time.sleep(self._dice.uniform(*_PAUSES))
+        except Exception as error:
+            self._failure = error
+
+    def rest(self):
+        """Returns once all devices are settled. None comes or goes until resume() is called."""
+        self._allowed.acquire()
+        self._network.settle(60)
+        time.sleep(REST)
+
+    def resume(self):
+        self._allowed.release()
+
+    def raise_failure(self):
+        """Raises what stopped the changes, if anything did."""
+        if self._failure:
+            raise self._failure
+
+    def wireless(self):
+        """Returns the names of the wireless devices that are there. Callable only after rest()."""
+        return sorted(name for name, answer in self._present.items() if answer == 2)
+
+    def bounds(self, moment):
+        """Returns how many rows a search since `moment` must have, and how many it may have."""
+        with self._allowed:
+            changed = [name for when, name, _ in self.changes if when >= moment]
+            there = sum(answer == 2 for name, answer in self._present.items()
+                        if name not in changed)
+        return there, there + len(changed)
+
+    def _change(self):
+        comers = [name for name in self._present if not name.startswith("Steady")]
+        if comers and (len(comers) >= AT_ONCE or self._dice.random() < 0.5):
+            name = self._dice.choice(comers)
+            self._left[name] = self._present.pop(name)
+            self._note(name, "left")
+            self._network.remove(name)
+        elif self._left and self._dice.random() < 0.7:
+            name = self._dice.choice(list(self._left))
+            self._present[name] = self._left.pop(name)
+            self._note(name, "came")
+            self._network.add(name)
+        else:
+            self._number += 1
+            name = f"Comer {self._number}"
+            self._present[name] = self._dice.choice(_BEHAVIOURS)
+            self._note(name, "came")
+            self._network.add(name, maker=MAKER, model=MODEL, activeif=self._present[name])
+
+    def _note(self, name, change):
+        self.changes.append((time.monotonic(), name, change))
+
+    def near(self, silence):
+        """Returns words about the changes from a second before the silence until its end."""
+        return ", ".join(f"{name} {change} at {when - silence.began:+.2f} s"
+                         for when, name, change in self.changes
+                         if -1 < when - silence.began < silence.seconds)

@@ -1,0 +1,92 @@
+"""Listens to a program's main loop from a separate process, and records when it was silent."""
+
+import dataclasses
+import multiprocessing
+import os
+import pathlib
+import time
+
+PERIOD = 0.02  # seconds between two requests
+NOTED = 0.05   # a shorter silence is not recorded
+PATIENCE = 120  # seconds; longer than any silence that is measured
+
+
+@dataclasses.dataclass(frozen=True)
+class Silence:
+    """A time in which the main loop answered no request, without the waits for a processor."""
+
+    began: float      # time.monotonic()
+    seconds: float
+    processor: float  # how much of it the main thread computed, in seconds
+
+    def __str__(self):
+        return (f"{self.seconds:.2f} s, of which {self.processor:.2f} s computing and "
+                f"{max(0, self.seconds - self.processor):.2f} s waiting for an answer")
+
+
+class Ear:
+    """A context manager that listens to the program of a Person, who has seen its window."""
+
+    def __init__(self, person):
+        context = multiprocessing.get_context("spawn")
+        self._heard, writer = context.Pipe(duplex=False)
+        self._silences = []
+        # The process gets the bus's address from the environment, where Person has put it.
+        self._process = context.Process(target=_listen, args=(person.process.pid, writer),
+                                        daemon=True)
+
+    def __enter__(self):
+        self._process.start()
+        return self
+
+    def __exit__(self, *_):
+        self._process.terminate()
+        self._process.join()
+
+    def silences(self, since=0):
+        """Returns the silences that ended so far and began after `since`."""
+        while self._heard.poll():
+            self._silences.append(self._heard.recv())
+        if not self._process.is_alive():
+            raise RuntimeError("the process that listens to the wizard's main loop has ended")
+        return [one for one in self._silences if one.began >= since]
+
+    def longest(self, since=0):
+        """Returns the longest of these silences, or None when there is none of at least NOTED."""
+        return max(self.silences(since), key=lambda one: one.seconds, default=None)
+
+
+def _listen(process, heard):
+    import gi
+    gi.require_version("Atspi", "2.0")
+    from gi.repository import Atspi
+    Atspi.set_timeout(PATIENCE * 1000, PATIENCE * 1000)
+    component = _application(Atspi, process).get_child_at_index(0).get_component_iface()
+    schedules = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (process, os.getpid())]
+    while True:
+        began = time.monotonic()
+        computed_before, waited_before = _schedule(schedules)
+        component.get_extents(Atspi.CoordType.SCREEN)
+        took = time.monotonic() - began
+        if took > NOTED:
+            computed, waited = _schedule(schedules)
+            silent = took - (waited - waited_before)
+            if silent > NOTED:
+                heard.send(Silence(began, silent, computed - computed_before))
+        time.sleep(PERIOD)
+
+
+def _application(atspi, process):
+    screen = atspi.get_desktop(0)
+    for index in range(screen.get_child_count()):
+        application = screen.get_child_at_index(index)
+        if application and application.get_process_id() == process:
+            return application
+    raise RuntimeError(f"process {process} is not on the accessibility bus")
+
+
+def _schedule(files):
+    """Returns how long the first thread computed and how long all waited for a processor, in
+    seconds."""
+    times = [[int(field) / 1e9 for field in file.read_text().split()[:2]] for file in files]
+    return times[0][0], sum(waited for _, waited in times)

@@ -1,0 +1,176 @@
+#!/usr/bin/python3
+"""Tries the wizard on large media, on large networks, and beside a device that swallows questions.
+
+Usage: large.py [--medium MEDIUM] [devices] [models] [silent]
+
+MEDIUM is a built medium (default: build/medium of this source tree).
+
+devices  1,000 models and 500 devices
+models   10,000 models: the list of models, and then a search for all of them
+silent   a device that receives questions and answers none, which stops the window by design
+
+For each, the program prints whether the list is as it must be, the times, the longest silence of
+the main loop, and the peak of the memory. It exits with status 1 if a list is wrong.
+"""
+
+import argparse
+import pathlib
+import sys
+import tempfile
+import time
+
+from chooser import MAKER, ROOT, WAIT_SECONDS, Chooser, enter_network, require_medium
+from ear import Ear
+
+import media
+from onscreen import messages
+from onscreen.desktop import Desktop
+from onscreen.processes import wait_for
+from practice_network import PracticeNetwork
+
+SEARCHES = 3
+PAUSE = 3  # seconds after which a search ends if a device is listed by then
+
+
+class Trial:
+    """A medium with `models` models on a desktop, and the devices that the trial adds."""
+
+    def __init__(self, desktop, built, folder, models, last_differs=False):
+        self._desktop, self._text = desktop, messages.read(built, "en")
+        self._network = PracticeNetwork()
+        self._devices = {}
+        self._medium = media.make(folder, built, {
+            f"{MAKER} Model {number:05}": media.model(
+                usb=True, wired=last_differs and number + 1 < models, wireless=True)
+            for number in range(models)})
+
+    def person(self):
+        return Chooser(self._desktop, self._medium, self._text)
+
+    def add(self, name, number, answer=2):
+        self._devices[name] = answer
+        self._network.add(name, maker=MAKER, model=f"Model {number:05}", activeif=answer)
+
+    def settle(self):
+        self._network.settle(120)
+
+    def remove_all(self):
+        for name in self._devices:
+            self._network.remove(name)
+
+    def search(self, what):
+        """Searches a few times. Returns whether every list had only devices that belong there, each
+        once, and all of them unless the search ended before."""
+        expected = sorted(name for name, answer in self._devices.items() if answer == 2)
+        right = True
+        with self.person() as person:
+            person.go_there()
+            table = person.table()
+            with Ear(person) as ear:
+                for _ in range(SEARCHES):
+                    began = person.refresh()
+                    complete = _seconds_until_listed(table, len(expected), began)
+                    person.wait()
+                    listed = person.names()
+                    right &= len(set(listed)) == len(listed) and set(listed) <= set(expected)
+                    right &= len(listed) == len(expected) or complete >= PAUSE
+                    report(what, f"{len(listed)} of {len(expected)} listed after {complete:.2f} s",
+                           person, ear, began)
+        print(f"{what}: the lists are {'as they must be' if right else 'WRONG'}", flush=True)
+        return right
+
+
+def _seconds_until_listed(table, count, began):
+    """Returns the time since `began` until the list, which is emptied first, had `count` rows or
+    stopped growing."""
+    emptied = False
+    last, changed = None, began
+    while time.monotonic() - changed < 2 * PAUSE or not emptied:
+        rows = table.get_n_rows()
+        emptied = emptied or rows < count
+        if rows != last:
+            last, changed = rows, time.monotonic()
+        if emptied and rows == count or time.monotonic() - began > WAIT_SECONDS:
+            break
+        time.sleep(0.02)  # each look takes some of the wizard's time
+    return changed - began
+
+
+def report(what, figures, person, ear, since=0):
+    status = pathlib.Path(f"/proc/{person.process.pid}/status").read_text()
+    peak = int(status.split("VmHWM:")[1].split()[0]) / 1024
+    time.sleep(0.3)  # in which a silence that lasts until now is heard
+    silence = ear.longest(since)
+    print(f"{what}: {figures}; longest silence {silence or 'less than 0.05 s'}; "
+          f"peak memory {peak:.1f} MiB", flush=True)
+
+
+def try_devices(desktop, built, folder):
+    trial = Trial(desktop, built, folder, models=1000)
+    for number in range(500):
+        trial.add(f"Device {number:03}", 2 * number)
+    trial.settle()
+    right = trial.search("1,000 models, 500 devices")
+    trial.remove_all()
+    return right
+
+
+def try_models(desktop, built, folder):
+    what = "10,000 models"
+    trial = Trial(desktop, built, folder / "list", models=10000, last_differs=True)
+    with trial.person() as person:
+        began = time.monotonic()
+        person.see("push button", "Next", WAIT_SECONDS)
+        shown = time.monotonic() - began
+        with Ear(person) as ear:
+            last = person.see("list").get_child_at_index(9999)
+            since = time.monotonic()
+            person.press("End")
+            wait_for(lambda: person.has_state(last, "selected"), 20,
+                     "the last model to be selected")
+            report(what, f"list of models after {shown:.2f} s, End key to the last model "
+                   f"{time.monotonic() - since:.2f} s", person, ear, since)
+    trial = Trial(desktop, built, folder / "search", models=10000)
+    for number in range(50):
+        trial.add(f"Device {number:03}", 200 * number)
+    trial.settle()
+    right = trial.search(f"{what}, 50 devices")
+    trial.remove_all()
+    return right
+
+
+def try_silent(desktop, built, folder):
+    trial = Trial(desktop, built, folder, models=100)
+    trial.add("Answers", 1)
+    trial.add("Swallows", 2, "silent")
+    trial.settle()
+    right = trial.search("2 devices, one of which swallows questions")
+    trial.remove_all()
+    return right
+
+
+TRIALS = {"devices": try_devices, "models": try_models, "silent": try_silent}
+
+
+def main():
+    parser = argparse.ArgumentParser(
+        usage="large.py [--medium MEDIUM] [devices] [models] [silent]",
+        description=__doc__[__doc__.index("devices  "):],
+        formatter_class=argparse.RawDescriptionHelpFormatter)
+    parser.add_argument("--medium", default=ROOT / "build/medium")
+    parser.add_argument("trials", nargs="*", metavar="TRIAL")
+    options = parser.parse_args()
+    for name in options.trials:
+        if name not in TRIALS:
+            parser.error(f"there is no trial {name!r}; the trials are {', '.join(TRIALS)}")
+    built = require_medium(options.medium)
+    enter_network()
+    right = True
+    with Desktop() as desktop, tempfile.TemporaryDirectory() as folder:
+        for name in options.trials or TRIALS:
+            right &= TRIALS[name](desktop, built, pathlib.Path(folder) / name)
+    return not right
+
+
+if __name__ == "__main__":
+    sys.exit(main())
