@@ -5,11 +5,14 @@ import pathlib
 import tempfile
 
 from onscreen import messages
+from onscreen.desktop import Desktop
 from onscreen.processes import wait_for
 
 from . import crowded
+from .facts import Facts
+from .medium import Medium
 from .person import Person
-from .ways import GEAR_REFRESH, choose_model
+from .visit import GEAR_REFRESH, choose_model
 
 LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
 DEVICES = 40
@@ -53,6 +56,22 @@ def all_looks(follows_desktop):
     looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
     looks += [(crowded.LANGUAGE, 100, "light", points) for points in (_USUAL, _LARGE)]
     return looks + [("en_US", 100, "contrast", _USUAL)]
+
+
+def take_all(folder, pictures, network):
+    """Takes the pictures of the medium in `folder` on a practice network without devices. Returns the
+    exit status."""
+    pictures = pathlib.Path(pictures)
+    for old in pictures.glob("*.png"):
+        old.unlink()
+    with tempfile.TemporaryDirectory() as copies, Desktop() as desktop:
+        copy = crowded.make(folder, pathlib.Path(copies) / "medium")
+        medium = Medium(copy, Facts(copy))
+        model = next(model.name for model in medium.facts.models
+                     if model.wireless and " " in model.name)
+        Gallery(desktop, medium, pictures, network).take(
+            model, medium.service_type, medium.too_old() or medium.too_new())
+    return 0
 
 
 class Gallery:
@@ -106,7 +125,7 @@ class Gallery:
         with self._start() as person:
             person.see("label", self._text["INST_TXT_MODEL"], _PATIENCE)
             self._take(person, "1-models")
-            choose_model(person, model)
+            choose_model(person, self._medium.facts.names(), model)
             person.press("Return")
             person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
             self._take(person, "2-connection")
