@@ -9,6 +9,8 @@ _MODELS_AT_ONCE = 3  # of which devices are made up when the wizard lists the de
 _UNMATCHED = ("No device can announce the name of this model, because the name is not a maker, a space "
               "and a model. The tour leaves out the wireless way.")
 
+_FAILED_BEFORE = "The tour leaves out the wireless way, because it went wrong with an earlier model."
+
 
 class Tour:
     """Takes pictures for `album`. `network` is a practice network without devices, or None.
@@ -141,7 +143,11 @@ class Tour:
             visit.next()
             visit.see_package_open(files, "By cable")
         if self._devices and model.name in self._searched:
-            self._walk_wireless(model)
+            # Searches that fail take minutes, so they are not repeated for the next model.
+            devices, self._devices = self._devices, None
+            self._no_devices = _FAILED_BEFORE
+            self._walk_wireless(model, devices)
+            self._devices = devices
         else:
             self._album.note(self._no_devices or _UNMATCHED)
 
@@ -161,7 +167,7 @@ class Tour:
             visit.next()
         visit.see(CONNECTION)
 
-    def _walk_wireless(self, model):
+    def _walk_wireless(self, model, devices):
         is_first = model.name == self._searched[0]
         with self._visit() as visit:
             self._go_to_list(visit, model)
@@ -173,7 +179,7 @@ class Tour:
                 return
             if effect := self._facts.without_tool():
                 self._album.note(f"The medium has no wireless set-up tool. Effect: {effect}.")
-            search_in_vain(visit, self._devices, self._medium.gear)
+            search_in_vain(visit, devices, self._medium.gear)
             visit.person.click("table cell", second_of(model.name))
             visit.picture("9-choice", "A device is chosen")
             visit.next()
