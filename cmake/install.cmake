@@ -69,8 +69,9 @@ install(FILES ${generated}/example.onramp.preview.metainfo.xml DESTINATION ${CMA
 install_compressed(${generated}/changelog ${documents})
 install(FILES ${packaging}/copyright ${packaging}/media-kit.md ${PROJECT_SOURCE_DIR}/README.md
   DESTINATION ${documents})
-install(FILES ${PROJECT_SOURCE_DIR}/docs/mastering-a-medium.md ${PROJECT_SOURCE_DIR}/docs/support.md
-  ${PROJECT_SOURCE_DIR}/docs/wizard.png DESTINATION ${documents}/docs)
+foreach(document IN ITEMS mastering-a-medium.md texts-and-languages.md support.md wizard.png)
+  install(FILES ${PROJECT_SOURCE_DIR}/docs/${document} DESTINATION ${documents}/docs)
+endforeach()
 
 set(CPACK_GENERATOR DEB TGZ)
 set(CPACK_VERBATIM_VARIABLES ON)

@@ -90,7 +90,8 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
 
 /// Adds `source` to the main run loop in every mode, including the modal one. The loop keeps the
 /// source until the process ends. Does nothing when `source` is null or when a source of the same
-/// session has already been added.
+/// session has already been added. If the system provides no thread, the session's callback is not
+/// called until setNotificationKeys() is called again and succeeds.
 void addSourceToMainLoop(const DynamicStoreSourceRef& source);
 
 /// Returns the error code of the calling thread's last store operation that failed, or kSCStatusOK

@@ -17,6 +17,7 @@ PROGRAM = "Onramp OSX.app/Contents/Linux/Onramp OSX"
 MAKER, MODEL = "Kestrel", "Model 100"
 GEAR, GEAR_REFRESH = "Actions", 2
 WAIT_SECONDS = 90  # for a search to end
+BEGIN_SECONDS = 5  # after which a search has begun, unless a device stops the wizard at once
 
 
 def require_medium(folder):
@@ -43,6 +44,7 @@ class Chooser(Person):
     def __init__(self, desktop, medium, text):
         super().__init__(desktop, medium / PROGRAM, env={"LANG": "en_US.UTF-8"})
         self._text = text
+        self._atspi.set_timeout(WAIT_SECONDS * 1000, WAIT_SECONDS * 1000)
         self._key = None
 
     def go_there(self):
@@ -64,11 +66,17 @@ class Chooser(Person):
         self._key = subprocess.Popen(["xdotool", "key", "Return"], env=self.desktop.env)
         return began
 
+    def is_searching(self):
+        return self.sees("label", self._text["INST_WAIT"])
+
     def wait(self):
-        """Waits until the search has ended that go_there() or refresh() started."""
+        """Waits until the search has ended that go_there() or refresh() has just started."""
         if self._key:
             self._key.wait()
-            time.sleep(0.2)  # in which the search begins
+            until = time.monotonic() + BEGIN_SECONDS
+            while not self.is_searching() and time.monotonic() < until:
+                time.sleep(0.02)
+        self._ask()  # which takes until the wizard answers again
         self.see_gone("label", self._text["INST_WAIT"], WAIT_SECONDS)
 
     def screen_coordinates(self):

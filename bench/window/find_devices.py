@@ -55,7 +55,6 @@ def time_of_wizard(person, count):
 
     Returns None if the search ends with fewer.
     """
-    person.wait()
     table = person.table()
     began = person.refresh()
     emptied = False
@@ -64,7 +63,9 @@ def time_of_wizard(person, count):
         if time.monotonic() - began > PATIENCE:
             return None
         time.sleep(0.002)  # each look takes some of the wizard's time
-    return time.monotonic() - began
+    passed = time.monotonic() - began
+    person.wait()
+    return passed
 
 
 def rounds(desktop, medium, text, count, number):

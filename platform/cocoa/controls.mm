@@ -1,6 +1,7 @@
 #include <utility>
 
 #import "platform/cocoa/action.h"
+#import "platform/cocoa/content_size.h"
 #import "platform/cocoa/native.h"
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
@@ -15,6 +16,7 @@ void RadioMatrix::setTitle(int row, int column, const std::string& title) const 
   NSMatrix* const matrix = nativeOf<NSMatrix>(*this);
   [[matrix cellAtRow:row column:column] setTitle:toNSString(title)];
   [matrix setNeedsDisplay:YES];
+  cocoa::fitWindow([matrix window]);
 }
 
 void RadioMatrix::selectCell(int row, int column) const {

@@ -1,5 +1,6 @@
 #import "platform/cocoa/file_owner.h"
 
+#import "platform/cocoa/content_size.h"
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
@@ -40,6 +41,7 @@
                boundKey = onramp::cocoa::Retained<NSString>(key)](const std::string&) {
           [owner.get() willChangeValueForKey:boundKey.get()];
           [owner.get() didChangeValueForKey:boundKey.get()];
+          onramp::cocoa::fitWindow([owner.get() window]);
         });
   }
   return onramp::cocoa::toNSString(_owner->boundTexts().valueForKey(name));

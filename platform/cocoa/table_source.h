@@ -20,6 +20,9 @@ class ArrayController;
 /// Call this when the controller's entries have changed.
 - (void)reload;
 
+/// Call this when the title of a column has changed.
+- (void)fitColumns;
+
 /// Call this when the controller's selection has changed.
 - (void)showSelection;
 

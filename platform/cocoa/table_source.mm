@@ -4,11 +4,13 @@
 #include <cmath>
 
 #include "base/array_controller.h"
+#import "platform/cocoa/content_size.h"
 #import "platform/cocoa/text.h"
 
 namespace {
 
 constexpr CGFloat kCellPadding = 6;  // points
+constexpr NSUInteger kLeastNameLetters = 24;
 
 // Returns the enabled button in `view` that the Return key presses, or nil when there is none.
 NSButton* defaultButton(NSView* view) {
@@ -42,6 +44,17 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
   NSDictionary* const attributes = [NSDictionary dictionaryWithObject:[cell font]
                                                                forKey:NSFontAttributeName];
   return std::ceil([text sizeWithAttributes:attributes].width) + kCellPadding;
+}
+
+CGFloat headerWidth(NSTableColumn* column) {
+  return std::ceil([[column headerCell] cellSize].width) + kCellPadding;
+}
+
+CGFloat leastNameWidth(NSCell* cell) {
+  NSString* const letters = [@"" stringByPaddingToLength:kLeastNameLetters
+                                              withString:@"n"
+                                         startingAtIndex:0];
+  return textWidth(cell, letters);
 }
 
 }  // namespace
@@ -79,23 +92,26 @@ CGFloat textWidth(NSCell* cell, NSString* text) {
 
 // Widens every column except the first one to fit its texts, and prevents the user from making it
 // narrower than that. If the table is then too narrow for all columns, narrows the first one, which
-// shows the names, but not below its minimum width.
+// shows the names, but not below its minimum width. Below that, the window gets wider.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
   NSTableColumn* const first = [columns objectAtIndex:0];
-  CGFloat room = [[_table enclosingScrollView] contentSize].width - [_table intercellSpacing].width;
+  [first setMinWidth:std::max(leastNameWidth([first dataCell]), headerWidth(first))];
+  CGFloat others = [_table intercellSpacing].width;
   for (NSTableColumn* column in columns) {
     if (column == first) continue;
-    CGFloat width = textWidth([column headerCell], [[column headerCell] stringValue]);
+    CGFloat width = headerWidth(column);
     for (NSInteger row = 0; row < [self numberOfRowsInTableView:_table]; ++row) {
       NSString* const text = [self tableView:_table objectValueForTableColumn:column row:row];
       width = std::max(width, textWidth([column dataCell], text));
     }
     [column setMinWidth:width];
     if (width > [column width]) [column setWidth:width];
-    room -= [column width] + [_table intercellSpacing].width;
+    others += [column width] + [_table intercellSpacing].width;
   }
+  onramp::cocoa::fitWindow([_table window]);
+  const CGFloat room = [[_table enclosingScrollView] contentSize].width - others;
   if (room < [first width]) [first setWidth:std::max(room, [first minWidth])];
 }
 

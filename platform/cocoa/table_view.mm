@@ -34,6 +34,10 @@ void TableView::setColumnHeader(std::string_view identifier, const std::string& 
   [[[table tableColumnWithIdentifier:toNSString(identifier)] headerCell]
       setStringValue:toNSString(title)];
   [[table headerView] setNeedsDisplay:YES];
+  // Before bind(), the table has no source yet.
+  if ([[table delegate] isKindOfClass:[OnrampTableSource class]]) {
+    [static_cast<OnrampTableSource*>([table delegate]) fitColumns];
+  }
 }
 
 void TableView::setColumnEditable(std::string_view identifier, bool editable) const {

@@ -1,3 +1,4 @@
+#import "platform/cocoa/content_size.h"
 #import "platform/cocoa/focus.h"
 #import "platform/cocoa/native.h"
 #import "platform/cocoa/text.h"
@@ -25,6 +26,7 @@ void View::setHidden(bool hidden) const {
   NSView* const view = nativeOf<NSView>(*this);
   const bool appears = [view isHidden] && !hidden;
   [view setHidden:hidden];
+  cocoa::fitWindow([view window]);
   if (NSTextField* const field = nativeOf<NSTextField>(*this); appears && [field window]) {
     announce(field);
   }
@@ -42,6 +44,7 @@ void View::addSubview(const View& inner) const {
   [added setFrame:[view bounds]];
   [added setAutoresizingMask:NSViewWidthSizable | NSViewHeightSizable];
   [view addSubview:added];
+  cocoa::fitWindow([view window]);
   cocoa::focusFirstControl(added);
 }
 
@@ -54,7 +57,9 @@ void Control::setEnabled(bool enabled) const {
 }
 
 void TextField::setStringValue(const std::string& text) const {
-  [nativeOf<NSTextField>(*this) setStringValue:cocoa::toNSString(text)];
+  NSTextField* const field = nativeOf<NSTextField>(*this);
+  [field setStringValue:cocoa::toNSString(text)];
+  cocoa::fitWindow([field window]);
 }
 
 }  // namespace onramp

@@ -5,6 +5,7 @@
 #include <cmath>
 #include <cstdint>
 #include <cstdlib>
+#include <new>
 #include <string>
 #include <string_view>
 
@@ -49,6 +50,13 @@ Node nodeOfObject(const std::string& object) {
   plist_t node = nullptr;
   plist_from_bin(list.data(), static_cast<std::uint32_t>(list.size()), &node);
   return Node(node);
+}
+
+// Returns `node`. Throws std::bad_alloc if it is null, because libplist creates no node only when
+// there is no memory.
+Node created(Node node) {
+  if (!node) throw std::bad_alloc();
+  return node;
 }
 
 // Converts `node` to a binary list that holds nothing else, and returns the bytes after the list's
@@ -160,13 +168,13 @@ struct NodeMaker {
   }
   Node operator()(Date date) const { return dateNode(date); }
   Node operator()(const Array& array) const {
-    Node node(plist_new_array());
+    Node node = created(Node(plist_new_array()));
     for (const Value& item : array)
       plist_array_append_item(node.get(), nodeOf(item).release());
     return node;
   }
   Node operator()(const Dictionary& dictionary) const {
-    Node node(plist_new_dict());
+    Node node = created(Node(plist_new_dict()));
     for (const auto& [key, value] : dictionary)
       plist_dict_set_item(node.get(), writable(key).c_str(), nodeOf(value).release());
     return node;
@@ -208,7 +216,7 @@ Value valueOf(plist_t node) {
 }
 
 Node nodeOf(const Value& value) {
-  return std::visit(NodeMaker(), value.storage());
+  return created(std::visit(NodeMaker(), value.storage()));
 }
 
 }  // namespace onramp::libplist

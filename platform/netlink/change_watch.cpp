@@ -8,6 +8,7 @@
 #include <array>
 #include <cerrno>
 #include <cstdint>
+#include <system_error>
 #include <utility>
 
 namespace onramp::netlink {
@@ -48,8 +49,13 @@ ChangeWatch::~ChangeWatch() {
   thread_.join();
 }
 
-void ChangeWatch::start(std::function<void()> changed) {
-  thread_ = std::thread([this, changed = std::move(changed)] { run(changed); });
+bool ChangeWatch::start(std::function<void()> changed) {
+  try {
+    thread_ = std::thread([this, changed = std::move(changed)] { run(changed); });
+  } catch (const std::system_error&) {
+    return false;
+  }
+  return true;
 }
 
 void ChangeWatch::run(const std::function<void()>& changed) const {

@@ -25,9 +25,9 @@ class ChangeWatch {
   /// Starts to call `changed` on the watch's own thread after every burst of changes, including the
   /// changes since the watch was created. The destructor stops the calls and waits for a call that
   /// is running. If the socket to the kernel fails, the calls stop for good, and nobody is told.
-  /// This function may be called only once. It throws std::system_error when the system provides no
-  /// thread.
-  void start(std::function<void()> changed);
+  /// This function may be called only once. It returns false, and calls nothing, when the system
+  /// provides no thread.
+  [[nodiscard]] bool start(std::function<void()> changed);
 
  private:
   explicit ChangeWatch(Socket socket);

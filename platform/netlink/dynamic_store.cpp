@@ -63,8 +63,7 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
   store->watch = std::move(watch);
   store->notified = std::move(*selection);
   store->known = std::move(*known);
-  store->startWatch();
-  return true;
+  return store->startWatch() || fail(kSCStatusFailed, false);
 }
 
 DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int) {

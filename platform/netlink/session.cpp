@@ -66,8 +66,10 @@ void DynamicStore::tellChanges() {
   if (!changed.empty() && callback) callback(changed);
 }
 
-void DynamicStore::startWatch() const {
-  if (watch && changesArrived) watch->start(changesArrived);
+bool DynamicStore::startWatch() {
+  if (!watch || !changesArrived || watch->start(changesArrived)) return true;
+  watch.reset();
+  return false;
 }
 
 }  // namespace onramp

@@ -66,8 +66,9 @@ struct DynamicStore {
   /// Calls the callback with the keys in `notified` whose values have changed, if there are any.
   void tellChanges();
 
-  /// Starts `watch` so that it calls `changesArrived`, if both are set.
-  void startWatch() const;
+  /// Starts `watch` so that it calls `changesArrived`, if both are set. Removes `watch` and returns
+  /// false when the system provides no thread.
+  bool startWatch();
 };
 
 struct DynamicStoreSource {

@@ -46,7 +46,7 @@ bool writeAll(int descriptor, std::string_view bytes) {
   while (!bytes.empty()) {
     const ssize_t written = write(descriptor, bytes.data(), bytes.size());
     if (written < 0 && errno == EINTR) continue;
-    if (written < 0) return false;
+    if (written <= 0) return false;
     bytes.remove_prefix(static_cast<std::size_t>(written));
   }
   return true;
@@ -105,7 +105,9 @@ bool writeFileAtomically(const std::string& path, std::string_view bytes) {
 
 void removeWithTemporaries(const std::string& path) {
   std::error_code ignored;
-  fs::remove_all(path, ignored);
+  // remove_all() opens even a file, in case it is a folder. It removes nothing when the system
+  // provides no descriptor, so the file is removed first.
+  if (!fs::remove(path, ignored)) fs::remove_all(path, ignored);
   const std::string stem = temporaryStem(path);
   std::vector<fs::path> leftOver;
   std::error_code error;

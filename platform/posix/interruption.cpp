@@ -4,6 +4,7 @@
 #include <signal.h>
 #include <unistd.h>
 
+#include <system_error>
 #include <thread>
 #include <utility>
 
@@ -25,13 +26,18 @@ void onInterruption(std::function<void()> action) {
   // Every thread that starts later inherits this mask. Only the thread that calls sigwait()
   // receives the signals.
   pthread_sigmask(SIG_BLOCK, &signals, nullptr);
-  std::thread([signals, action = std::move(action)]() mutable {
+  const auto wait = [signals, action = std::move(action)]() mutable {
     int number = 0;
     sigwait(&signals, &number);
     performOnMainThread(std::move(action));
     sigwait(&signals, &number);
     _exit(kExitOfSignals + number);
-  }).detach();
+  };
+  try {
+    std::thread(wait).detach();
+  } catch (const std::system_error&) {
+    pthread_sigmask(SIG_UNBLOCK, &signals, nullptr);
+  }
 }
 
 }  // namespace onramp

@@ -5,6 +5,7 @@
 #include <QHeaderView>
 #include <QScrollBar>
 #include <algorithm>
+#include <chrono>
 
 #include "platform/qt/list_model.h"
 
@@ -14,6 +15,10 @@ namespace {
 
 constexpr int kLeastRows = 6;
 constexpr int kLeastNameLetters = 24;
+
+// An adjustment measures every row. Without pauses, a search that finds hundreds of devices would
+// spend a third of its time on adjustments.
+constexpr std::chrono::milliseconds kPauseBetweenAdjustments{50};
 
 }  // namespace
 
@@ -34,6 +39,11 @@ ColumnsWidget::ColumnsWidget(QWidget* parent) : FramedView<QTreeView>(parent) {
   header()->setSectionResizeMode(QHeaderView::Interactive);
   header()->setStretchLastSection(true);
   setTextElideMode(Qt::ElideMiddle);
+  pause_.setSingleShot(true);
+  pause_.setInterval(kPauseBetweenAdjustments);
+  connect(&pause_, &QTimer::timeout, this, [this] {
+    if (isAdjustmentDue_) fitColumns();
+  });
   connect(header(), &QHeaderView::sectionResized, this,
           [this](int column, int, int width) { sectionResized(column, width); });
 }
@@ -50,6 +60,13 @@ int ColumnsWidget::neededWidthOfOthers() const {
 }
 
 void ColumnsWidget::fitColumns() {
+  isAdjustmentDue_ = pause_.isActive();
+  if (isAdjustmentDue_) return;
+  adjustWidths();
+  pause_.start();
+}
+
+void ColumnsWidget::adjustWidths() {
   updateGeometry();
   if (isUsersLayout_ || header()->count() == 0) return;
   for (int column = 1; column < header()->count(); ++column) {
@@ -68,7 +85,7 @@ QSize ColumnsWidget::minimumSizeHint() const {
 
 void ColumnsWidget::resizeEvent(QResizeEvent* event) {
   QTreeView::resizeEvent(event);
-  fitColumns();
+  adjustWidths();
 }
 
 // The user may make the first column too narrow for its texts, but not the others.

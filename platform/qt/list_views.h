@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QListView>
+#include <QTimer>
 #include <QTreeView>
 
 #include "platform/qt/type_ahead.h"
@@ -55,7 +56,8 @@ class ColumnsWidget final : public FramedView<QTreeView> {
  public:
   explicit ColumnsWidget(QWidget* parent = nullptr);
 
-  /// Call this after every change of the contents or of a header.
+  /// Call this after every change of the contents or of a header. The first call adjusts the widths
+  /// at once. Calls soon after it share one more adjustment, which measures all rows again.
   void fitColumns();
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }
@@ -71,8 +73,11 @@ class ColumnsWidget final : public FramedView<QTreeView> {
   /// Returns the total width that the columns after the first one need.
   [[nodiscard]] int neededWidthOfOthers() const;
 
+  void adjustWidths();
   void sectionResized(int column, int width);
 
+  QTimer pause_;  ///< active for a moment after an adjustment
+  bool isAdjustmentDue_ = false;
   TypeAhead typeAhead_;
   bool isUsersLayout_ = false;
 };

@@ -109,16 +109,6 @@ TEST_F(HandOff, TheVendorNameHasNoSpacesAndIsLowerCaseInFileNames) {
   }
 }
 
-TEST_F(HandOff, ThePackageIsOpenedEvenWhenNothingCanBeWritten) {
-  describeTwoModels();
-  medium.setEnvironment("XDG_DATA_HOME", "/proc/nowhere");
-  medium.setEnvironment("XDG_DATA_DIRS", "/proc/nowhere");
-  launch();
-  chooseModel("Cable");
-  screen.click("rightMostButton");
-  expectPackageOpenedAndQuit();
-}
-
 TEST_F(HandOff, ThereIsNoSupportPageForASeriesCodeThatCannotBePartOfAURL) {
   const std::pair<const char*, const char*> cases[] = {
       {"KS7", "KS7"},         {"a%20b", "a%20b"}, {"a#b", "a#b"},

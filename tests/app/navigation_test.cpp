@@ -1,7 +1,5 @@
 #include <gmock/gmock.h>
-#include <pthread.h>
 
-#include "platform/run_loop.h"
 #include "tests/app/wizard.h"
 
 namespace onramp {
@@ -256,39 +254,6 @@ TEST_F(Navigation, QuittingDuringTheWaitEndsTheWaitAtOnce) {
   EXPECT_EQ(screen.pauses.size(), 1U);
   screen.runTimers();
   EXPECT_EQ(medium.setUpToolArguments(), "");
-}
-
-// While an object of this class exists, no thread can be started, because the default stack size is
-// larger than any address space.
-class NoThreads {
- public:
-  NoThreads() {
-    pthread_getattr_default_np(&before_);
-    pthread_attr_t huge;
-    pthread_attr_init(&huge);
-    pthread_attr_setstacksize(&huge, std::size_t{1} << 60);
-    EXPECT_EQ(pthread_setattr_default_np(&huge), 0);
-    pthread_attr_destroy(&huge);
-  }
-  NoThreads(const NoThreads&) = delete;
-  NoThreads& operator=(const NoThreads&) = delete;
-  ~NoThreads() {
-    pthread_setattr_default_np(&before_);
-    pthread_attr_destroy(&before_);
-  }
-
- private:
-  pthread_attr_t before_{};
-};
-
-TEST_F(Navigation, TheMainLoopMakesThePausesWhenNoThreadCanStart) {
-  goToConnectionPage();
-  const NoThreads noThreads;
-  performOnMainThread([&] { screen.runTimers(); });
-  screen.click("rightMostButton");
-  EXPECT_EQ(screen.delays, (std::vector<double>{2, 2, 2, 2, 2, 0.5}));
-  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_BACK][BTN_NEXT]");
-  EXPECT_TRUE(delegate->windowShouldClose(Window()));
 }
 
 }  // namespace

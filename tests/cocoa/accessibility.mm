@@ -6,10 +6,11 @@
 // creates a question file, whose name is that of the answer file with ".question" appended. The
 // application's main loop removes the question file and writes the answer file. The answer is a
 // JSON array with an object for each visible control. The object has the keys "role", "name",
-// "states", "x", "y", "width" and "height". Roles and states have their AT-SPI names. Lengths are
-// in pixels, and x and y start at the screen's upper left corner. The first object stands for the
-// application. Its role is "application". Instead of a frame, it has the key "presses": the number
-// of mouse presses that the application has handled so far.
+// "states", "x", "y", "width" and "height". Roles and states have their AT-SPI names, except the
+// state "cut off" of a text that lacks room. Lengths are in pixels, and x and y start at the
+// screen's upper left corner. The first object stands for the application. Its role is
+// "application". Instead of a frame, it has the key "presses": the number of mouse presses that the
+// application has handled so far.
 
 #include <unistd.h>
 
@@ -22,6 +23,7 @@
 namespace {
 
 constexpr NSTimeInterval kInterval = 0.02;  // seconds
+constexpr CGFloat kUnlimited = 1e6;
 
 using SendEvent = void(id, SEL, NSEvent*);
 
@@ -76,14 +78,23 @@ class Reader {
     if ([view isKindOfClass:[NSPopUpButton class]]) {
       add(@"button menu", nameOf(static_cast<NSPopUpButton*>(view)), states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSButton class]]) {
+      checkRoom([static_cast<NSButton*>(view) cell], [view bounds], states);
       add(@"push button", [static_cast<NSButton*>(view) title], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSTextField class]]) {
+      checkRoom([static_cast<NSTextField*>(view) cell], [view visibleRect], states);
       add(@"label", [static_cast<NSTextField*>(view) stringValue], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSTextView class]]) {
       add(@"label", [static_cast<NSTextView*>(view) string], states, view, [view bounds]);
     } else if ([view isKindOfClass:[NSProgressIndicator class]]) {
       add(@"progress bar", @"", states, view, [view bounds]);
     }
+  }
+
+  // The wizard's own texts must not be cut off. GNUstep lays out its panels itself.
+  void checkRoom(NSCell* cell, NSRect room, NSMutableArray* states) {
+    const NSSize needed = [cell cellSizeForBounds:NSMakeRect(0, 0, NSWidth(room), kUnlimited)];
+    const bool fits = needed.width <= NSWidth(room) && needed.height <= NSHeight(room);
+    if (!fits && ![window_ isKindOfClass:[NSPanel class]]) [states addObject:@"cut off"];
   }
 
   // In a table without headers, reports each row as a list item. In a table with headers, reports
@@ -123,6 +134,7 @@ class Reader {
       NSMutableArray* const states = [NSMutableArray array];
       if ([matrix isEnabled] && [cell isEnabled]) [states addObject:@"enabled"];
       if ([cell state] == NSOnState) [states addObject:@"checked"];
+      checkRoom(cell, [matrix cellFrameAtRow:row column:0], states);
       if ([window_ firstResponder] == matrix && [matrix selectedRow] == row) {
         [states addObject:@"focused"];
       }

@@ -138,9 +138,12 @@ class GNUstepPerson(Person):
         wait_for(lambda: self._answer.exists() or not self.is_running(), _ANSWER_SECONDS,
                  "an answer from the program")
         try:
-            return json.loads(self._answer.read_text(encoding="utf-8"))
+            controls = json.loads(self._answer.read_text(encoding="utf-8"))
         except FileNotFoundError:
             return [{"role": "application", "name": "", "states": [], "presses": 0}]
+        for control in controls:
+            assert "cut off" not in control["states"], f"a text is cut off: {control}"
+        return controls
 
     def _configure(self, folder):
         """Writes a GNUstep configuration with this desktop's folders and returns its path."""

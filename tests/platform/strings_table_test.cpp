@@ -52,7 +52,6 @@ TEST(StringsTable, IsReadInEveryFormThatMediaUse) {
   EXPECT_EQ(loadStringsTable(folder / "xml"), expected);
   const std::pair<const char*, std::string> files[] = {
       {"UTF-8", "\"k\" = \"次\";"},
-      {"UTF-16", std::string("\xFF\xFEk\0=\0\"\0\x21\x6B\"\0;\0", 14)},
       {"binary", std::string("bplist00\xD1\1\2\x51k\x61\x6B\x21\x08\x0B\x0D\0\0\0\0\0\0\1\1"
                              "\0\0\0\0\0\0\0\3\0\0\0\0\0\0\0\0\0\0\0\0\0\0\0\x10",
                              16 + 3 + 32)}};

@@ -13,7 +13,7 @@ CMAKE, BUILD = sys.argv[1:]
 
 
 class Install(unittest.TestCase):
-    def test_the_installed_preview_finds_its_medium_and_the_guide_names_what_is_there(self):
+    def test_the_installed_preview_finds_its_medium_and_the_documents_name_what_is_there(self):
         with tempfile.TemporaryDirectory() as folder:
             subprocess.run([CMAKE, "--install", BUILD, "--prefix", folder], check=True, capture_output=True)
             prefix = pathlib.Path(folder)
@@ -27,6 +27,9 @@ class Install(unittest.TestCase):
             guide = (prefix / "share/doc/onramp/media-kit.md").read_text(encoding="utf-8")
             named = re.findall(r"\b(?:bin|lib/onramp|share/doc)/[-\w./]*\w", guide)
             self.assertGreater(len(named), 5)
+            documents = prefix / "share/doc/onramp/docs"
+            for page in documents.glob("*.md"):
+                named += [documents / link for link in re.findall(r"\]\(([\w./-]+)", page.read_text(encoding="utf-8"))]
             self.assertEqual([name for name in named if not (prefix / name).exists()], [])
 
 

@@ -132,9 +132,7 @@ MISTAKES = [
     (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "out of the medium"),
     (put(COMMON, "Comment", "x"), "key-unknown", "does not read"),
     (take(COMMON, "PkgInfo"), "key-missing", "PkgInfo", "nothing opens"),
-    (take(DESCRIPTION, "ContainedModel"), "key-missing", "ContainedModel", "no models"),
     (put(COMMON, "SystemMin", "10.6"), "value-kind", 'the string "10.6"', "a dictionary"),
-    (put(DESCRIPTION, "InstallPKG", "PKG_KestrelOnline", "NO"), "value-kind", "boolean"),
     (rename(DESCRIPTION, "PKG_WebLink", "PKG_WebLnk", "InstallPKG"), "key-misspelt", "PKG_WebLink"),
     (put(MODELS, "Model", MODEL, "Interfaces", "USB", "NO"), "value-kind", '"NO"', "<false/>"),
     (put(MODELS, "Model", MODEL, "x"), "value-kind", "a dictionary", "USB only"),
@@ -273,13 +271,6 @@ class OnrampCheck(unittest.TestCase):
         result = run(self.broken(replace(ENGLISH, '"Next";', '"Next"')))
         self.assertEqual(1, result.returncode)
         self.assertRegex(result.stdout, f'^{ENGLISH}:9: error: ";" expected.* Effect: ')
-
-    def test_lists_every_text_that_the_sources_ask_for_and_no_other(self):
-        sources = "".join(path.read_text() for room in ("app", "pages")
-                          for path in (ROOT / room).glob("*.[ch]*"))
-        asked = set(re.findall(r'"((?:INST|BTN|APP_MENU)_\w+)"', sources))
-        listed = [line.split()[0] for line in run("--texts").stdout.splitlines()]
-        self.assertEqual(sorted(asked), sorted(listed))
 
     def test_warnings_count_only_with_the_option_strict(self):
         medium = self.broken(put(COMMON, "Comment", "x"))

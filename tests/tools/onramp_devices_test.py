@@ -6,6 +6,7 @@ import json
 import os
 import pathlib
 import plistlib
+import re
 import signal
 import socketserver
 import subprocess
@@ -225,6 +226,13 @@ class Networks(unittest.TestCase):
                     result = run(TOOL, str(description), sys.executable, "-B", __file__,
                                  *sys.argv[1:4], tests)
                     self.assertEqual(result.returncode, 0, result.stderr)
+
+    def test_devices_of_the_example_get_the_verdicts_that_its_comments_give(self):
+        example = SOURCE / "examples/practice-network.toml"
+        said = re.findall(r'^name = "(.+)"  # ([\w-]+)$', example.read_text(encoding="utf-8"), re.MULTILINE)
+        devices = by_name(run(TOOL, str(example), *browse()).stdout)
+        self.assertEqual({name: device["verdict"]["id"] for name, device in devices.items()}, dict(said))
+        self.assertEqual(len(said), 19)
 
     def test_a_broadcast_reaches_a_practice_network_of_two_hosts(self):
         with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:

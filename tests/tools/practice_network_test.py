@@ -12,7 +12,6 @@ import unittest
 
 TOOLS = pathlib.Path(__file__).resolve().parents[2] / "tools"
 TOOL = str(TOOLS / "practice-network")
-EXAMPLE = TOOLS.parent / "examples" / "practice-network.toml"
 sys.path.insert(0, str(TOOLS))
 
 from practice_network import ControlError, PracticeNetwork
@@ -120,11 +119,6 @@ class FromOutside(unittest.TestCase):
         result = run(TOOL, self.describe(DEVICES), sys.executable, "-B", __file__, "FromInside")
         self.assertEqual(result.returncode, 0, result.stderr)
 
-    def test_the_example_starts_completely(self):
-        result = run(TOOL, str(EXAMPLE), "--", TOOL, "ctl", "list")
-        self.assertEqual((result.stdout.count('"established"'), result.stdout.count('"withdrawn"')),
-                         (19, 1), result.stderr)
-
     def test_the_exit_status_is_that_of_the_command(self):
         description = self.describe("")
         for command, status in ((["sh", "-c", "exit 5"], 5), (["sh", "-c", "kill -9 $$"], 137),
@@ -154,7 +148,6 @@ class FromOutside(unittest.TestCase):
                 ("[[device]]\nname = x\n", "not valid TOML.*line 2"),
                 ('[[devices]]\nname = "A"', r'unknown entry "devices".*\[\[device\]\]'),
                 ('[network]\nipv4 = true', 'network: unknown entry.*did you mean "ipv6"'),
-                ('[network]\ninterfaces = 3', "network: interfaces must be 1 or 2, not 3"),
                 ('[device]\nname = "A"', "double brackets"),
                 ("[[device]]\nport = 1", "device number 1: name is missing"),
                 ('[[device]]\nname = "A"\nmodle = "x"', 'device "A".*did you mean "model"'),
@@ -163,7 +156,6 @@ class FromOutside(unittest.TestCase):
                 ('[[device]]\nname = "A"\nactiveif = "quiet"', '"silent", "closed".*\'quiet\''),
                 ('[[device]]\nname = "A"\nactiveif = [1, 2]', "2 values for 1 addresses"),
                 ('[[device]]\nname = "A"\naddresses = ["127.0.1"]', "list of different addresses"),
-                (f'[[device]]\nname = "A"\nnote = "{"n" * 260}"', "note is too long"),
                 ('[[device]]\nname = "A"\naddresses = ["127.0.1.1"]\n'
                  '[[device]]\nname = "B"\naddresses = ["127.0.1.1"]', "another device's address")):
             with self.subTest(text):

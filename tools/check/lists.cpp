@@ -9,7 +9,6 @@
 #include "media/KSOROSXCD.h"
 #include "media/connection_type.h"
 #include "media/medium.h"
-#include "tools/check/key_rules.h"
 
 namespace onramp::check {
 
@@ -17,12 +16,14 @@ namespace {
 
 constexpr const char* kPackageAtOnce =
     "every model counts as one without wireless, so the package opens at once, without any page";
+constexpr const char* kNothing = "the wizard ends at once, without any page, and no package opens";
 constexpr const char* kNoModels =
     "the medium has no models, so the package opens at once, without any page";
 constexpr const char* kNoPackage = "nothing opens when the wizard ends";
+constexpr const char* kNoVersionPackage = "nothing opens on the systems that use this key";
 
 constexpr std::array kInformationRules{
-    KeyRule{"CommonResourcePath", Kind::kPath, Need::kRequired, kNoModels},
+    KeyRule{"CommonResourcePath", Kind::kPath, Need::kRequired, kNothing},
     KeyRule{"CFBundleName", Kind::kText, Need::kAdvised, "a window without a title"},
 };
 
@@ -46,12 +47,12 @@ constexpr std::array kResourceRules{
 constexpr std::array kPackageRules{
     KeyRule{"PkgLocation", Kind::kPath, Need::kRequired, kNoPackage},
     KeyRule{"PkgName", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"104", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"105", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"106", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"107", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"108", Kind::kText, Need::kOptional, kNoPackage},
-    KeyRule{"109", Kind::kText, Need::kOptional, kNoPackage},
+    KeyRule{"104", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"105", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"106", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"107", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"108", Kind::kText, Need::kOptional, kNoVersionPackage},
+    KeyRule{"109", Kind::kText, Need::kOptional, kNoVersionPackage},
 };
 
 constexpr std::array kMinimumRules{
@@ -112,6 +113,21 @@ constexpr std::array kInterfaceRules{
             "the model counts as one without a wired network"},
     KeyRule{"WirelessLAN", Kind::kBoolean, Need::kAdvised,
             "the model counts as one without wireless"},
+};
+
+// "NAME" stands for a model's name.
+constexpr std::array kGroups{
+    KeyGroup{"Info.plist", "", kInformationRules},
+    KeyGroup{"CDCommonInfo.plist", "", kResourceRules},
+    KeyGroup{"CDCommonInfo.plist", "PkgInfo/", kPackageRules},
+    KeyGroup{"CDCommonInfo.plist", "SystemMin/", kMinimumRules},
+    KeyGroup{"CDCommonInfo.plist", "SystemMax/", kMaximumRules},
+    KeyGroup{"CDInfo.plist", "", kDescriptionRules},
+    KeyGroup{"CDInfo.plist", "Type/", kTypeRules},
+    KeyGroup{"CDInfo.plist", "InstallPKG/", kOptionRules},
+    KeyGroup{"ModelInfo.plist", "", kModelInformationRules},
+    KeyGroup{"ModelInfo.plist", "Model/NAME/", kModelRules},
+    KeyGroup{"ModelInfo.plist", "Model/NAME/Interfaces/", kInterfaceRules},
 };
 
 bool isPackageVersion(const std::string& key) {
@@ -189,6 +205,10 @@ std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists
 
 }  // namespace
 
+std::span<const KeyGroup> keyGroups() {
+  return kGroups;
+}
+
 std::vector<std::string> Lists::modelNames() const {
   return containedModels(KSOROSXCD::initWithCDInfoPlist(description, resources));
 }
@@ -205,7 +225,7 @@ Lists readLists(const MediumFiles& files) {
     lists.informationPath = report.application + "/Contents/Info.plist";
     lists.information =
         files.list(lists.informationPath,
-                   {{.file = lists.informationPath}, "the application's Info.plist", kNoModels});
+                   {{.file = lists.informationPath}, "the application's Info.plist", kNothing});
     if (!lists.information) return lists;
     checkKeys(*lists.information, {lists.informationPath, {}}, kInformationRules,
               OtherKeys::kAllowed, report);
@@ -215,7 +235,7 @@ Lists readLists(const MediumFiles& files) {
   }
   lists.resources = files.list(lists.resourcesPath,
                                {DictionaryPlace{lists.informationPath, {}}.of("CommonResourcePath"),
-                                "the resource dictionary", kNoModels});
+                                "the resource dictionary", kNothing});
   if (!lists.resources) return lists;
   checkResources(*lists.resources, lists.resourcesPath, report);
   lists.description = namedList(files, lists, medium::kCDInfo, "the medium description", kNoModels,

@@ -1,13 +1,27 @@
 #pragma once
 
 #include <optional>
+#include <span>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "base/value.h"
+#include "tools/check/key_rules.h"
 #include "tools/check/medium_files.h"
 
 namespace onramp::check {
+
+/// The keys that the wizard reads from one dictionary.
+struct KeyGroup {
+  std::string_view list;  ///< the usual name of the dictionary's file
+  std::string_view path;  ///< the keys that lead to the dictionary, each followed by "/"
+  std::span<const KeyRule> rules;
+};
+
+/// Returns the keys of all dictionaries that have rules. In a path, "NAME" stands for a model's
+/// name.
+[[nodiscard]] std::span<const KeyGroup> keyGroups();
 
 /// The property lists that the wizard reads from a medium. A list that the wizard cannot read is
 /// nothing. All paths are relative to the medium, and are empty if unknown.

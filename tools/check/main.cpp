@@ -47,18 +47,21 @@ int run(int count, char* arguments[]) {
   std::string medium;
   bool json = false;
   bool strict = false;
+  bool keys = false;
   bool texts = false;
   app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with status 1 even if there are only warnings");
+  app.add_flag("--keys", keys, "Print the keys of the property lists that a medium needs");
   app.add_flag("--texts", texts, "Print the keys of the texts that a medium needs");
   try {
     app.parse(count, arguments);
   } catch (const CLI::ParseError& error) {
     return app.exit(error) == 0 ? 0 : kUnreadable;
   }
-  if (texts) {
-    check::writeTexts(std::cout);
+  if (keys || texts) {
+    if (keys) check::writeKeys(std::cout);
+    if (texts) check::writeTexts(std::cout);
     return finish(EXIT_SUCCESS);
   }
   std::error_code ignored;

@@ -16,8 +16,13 @@ void writeText(std::ostream& out, const Report& report, std::size_t width);
 /// are not UTF-8 become replacement characters.
 void writeJSON(std::ostream& out, const Report& report);
 
+/// Writes a line for every key that the wizard reads from a medium's lists: the key's list, the
+/// kind of its value, whether a medium needs it, and the path of keys.
+void writeKeys(std::ostream& out);
+
 /// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
-/// room for it, how often "%@" has to occur in it, and the place where it is shown.
+/// room for it, what is shown if the medium lacks it, how often "%@" has to occur in it, and the
+/// place where it is shown.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check

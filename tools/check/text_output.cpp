@@ -4,6 +4,7 @@
 #include <string>
 
 #include "base/text.h"
+#include "tools/check/lists.h"
 #include "tools/check/output.h"
 #include "tools/check/shown_texts.h"
 #include "tools/terminal_text.h"
@@ -95,6 +96,29 @@ const char* startInWords(FirstPage page) {
   return "the model list";
 }
 
+const char* nameOf(Kind kind) {
+  switch (kind) {
+    case Kind::kText:
+      return "string";
+    case Kind::kPath:
+      return "path";
+    case Kind::kBoolean:
+      return "boolean";
+    case Kind::kNumberOrText:
+      return "string or number";
+    case Kind::kDictionary:
+      return "dictionary";
+    case Kind::kAny:
+      break;
+  }
+  return "any value";
+}
+
+const char* nameOf(Need need) {
+  if (need == Need::kRequired) return "required";
+  return need == Need::kAdvised ? "advised" : "optional";
+}
+
 }  // namespace
 
 void writeText(std::ostream& out, const Report& report, std::size_t width) {
@@ -117,6 +141,16 @@ void writeText(std::ostream& out, const Report& report, std::size_t width) {
       << counted(report.models.size(), "model") << '\n';
 }
 
+void writeKeys(std::ostream& out) {
+  out << std::left;
+  for (const KeyGroup& group : keyGroups()) {
+    for (const KeyRule& rule : group.rules) {
+      out << std::setw(20) << group.list << std::setw(18) << nameOf(rule.kind) << std::setw(10)
+          << nameOf(rule.need) << group.path << rule.key << '\n';
+    }
+  }
+}
+
 void writeTexts(std::ostream& out) {
   for (const ShownText& text : shownTexts()) {
     out << std::left << std::setw(44) << text.key << std::right << std::setw(4);
@@ -125,7 +159,8 @@ void writeTexts(std::ostream& out) {
     } else {
       out << '-' << "    ";
     }
-    out << "  " << (text.mostPlaceholders > 0 ? "%@ once or twice, " : "") << text.where << '\n';
+    out << (text.hasFallback ? "  English  " : "  key      ")
+        << (text.mostPlaceholders > 0 ? "%@ once or twice, " : "") << text.where << '\n';
   }
 }
 

@@ -2,7 +2,7 @@
 _onramp_check() {
   local word=${COMP_WORDS[COMP_CWORD]}
   if [[ $word == -* ]]; then
-    mapfile -t COMPREPLY < <(compgen -W "--json --strict --texts --help --version" -- "$word")
+    mapfile -t COMPREPLY < <(compgen -W "--json --strict --keys --texts --help --version" -- "$word")
   else
     mapfile -t COMPREPLY < <(compgen -d -- "$word")
     compopt -o filenames

@@ -9,7 +9,8 @@ import tempfile
 
 from .processes import Missing, start, stop, wait_for
 
-_SIZE = "2732x1536"  # twice 1366 × 768, the smallest screen that the wizard must fit on
+_SIZE = "1366x768"  # the smallest screen that the wizard must fit on
+_TWICE_THE_DENSITY = "2732x1536"
 
 
 def _free_display():
@@ -29,11 +30,13 @@ class Desktop:
 
     Programs on the desktop find a substitute for xdg-open that only records files and addresses. A
     process can use only one desktop, because its accessibility library keeps the first desktop's
-    bus. There is no window manager if `window_manager` is false.
+    bus. There is no window manager if `window_manager` is false. With `dense`, the screen has room
+    for the wizard at twice the density.
     """
 
-    def __init__(self, window_manager=True):
+    def __init__(self, window_manager=True, dense=True):
         self._window_manager = window_manager
+        self._size = _TWICE_THE_DENSITY if dense else _SIZE
         self._processes = []
         self._folder = None
         self.env = {}
@@ -125,7 +128,7 @@ class Desktop:
 
     def _start_display(self):
         display = self._start(
-            ["Xvfb", f":{_free_display()}", "-displayfd", "1", "-screen", "0", f"{_SIZE}x24",
+            ["Xvfb", f":{_free_display()}", "-displayfd", "1", "-screen", "0", f"{self._size}x24",
              "-noreset", "-nolisten", "tcp"],
             "xvfb", stdout=subprocess.PIPE, text=True)
         number = display.stdout.readline().strip()

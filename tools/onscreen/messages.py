@@ -1,6 +1,7 @@
 """Reads the texts in a medium's message bundle."""
 
 import pathlib
+import plistlib
 import re
 
 _ENTRY = re.compile(r'"((?:[^"\\]|\\.)*)"\s*=\s*"((?:[^"\\]|\\.)*)"\s*;')
@@ -8,7 +9,7 @@ _RESOURCES = "MacResources/CDCommonMessage.bundle/Contents/Resources"
 _TRADITIONAL_CHINESE = ("zh_hant", "zh_tw", "zh_hk", "zh_mo")
 
 
-class _Texts(dict):
+class Texts(dict):
     """Texts by their keys. For a missing text, gives the key, as the wizard does."""
 
     def __missing__(self, key):
@@ -55,9 +56,16 @@ def read(medium, language):
 
 
 def read_table(table):
-    """Returns the texts of a strings file in UTF-8 or UTF-16. Returns no texts if the file is
-    missing."""
+    """Returns the texts of a strings file, which may be text in UTF-8 or UTF-16 or a property list.
+    Returns no texts if the file is missing or damaged."""
     data = table.read_bytes() if table.exists() else b""
+    if data.startswith((b"<?xml", b"bplist")):
+        try:
+            content = plistlib.loads(data)
+        except Exception:  # plistlib's errors have nothing in common
+            content = {}
+        entries = content.items() if isinstance(content, dict) else ()
+        return Texts((key, text) for key, text in entries if isinstance(text, str))
     wide = data[:2] in (b"\xff\xfe", b"\xfe\xff")
-    entries = _ENTRY.findall(data.decode("utf-16" if wide else "utf-8"))
-    return _Texts((key, text.replace("\\n", "\n").replace('\\"', '"')) for key, text in entries)
+    entries = _ENTRY.findall(data.decode("utf-16" if wide else "utf-8", errors="replace"))
+    return Texts((key, text.replace("\\n", "\n").replace('\\"', '"')) for key, text in entries)

@@ -13,6 +13,14 @@ class Missing(Exception):
     """Raised when a program is not installed or does not start. The text names the program."""
 
 
+class InVain(TimeoutError):
+    """Raised after a wait in vain. `what` describes the awaited event."""
+
+    def __init__(self, seconds, what):
+        super().__init__(f"gave up after waiting {seconds} s for {what}")
+        self.what = what
+
+
 def _die_with_parent():
     _libc.prctl(_PR_SET_PDEATHSIG, signal.SIGKILL)
 
@@ -25,6 +33,8 @@ def start(arguments, package=None, **options):
     except FileNotFoundError as error:
         hint = f"; install it with: apt-get install {package}" if package else ""
         raise Missing(f"{arguments[0]} was not found{hint}") from error
+    except OSError as error:
+        raise Missing(f"{arguments[0]} cannot be started: {error.strerror}") from error
 
 
 def stop(process):
@@ -41,7 +51,7 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises TimeoutError after `seconds`. `what` describes the awaited event in the error's text.
+    Raises InVain after `seconds`. `what` describes the awaited event in the error's text.
     """
     deadline = time.monotonic() + seconds
     while True:
@@ -49,5 +59,5 @@ def wait_for(condition, seconds, what):
         if value:
             return value
         if time.monotonic() > deadline:
-            raise TimeoutError(f"gave up after waiting {seconds} s for {what}")
+            raise InVain(seconds, what)
         time.sleep(0.02)

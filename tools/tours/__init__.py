@@ -1,1 +1,1 @@
-"""The routes that the tour takes through the wizard of any medium."""
+"""The tour through the wizard of any medium."""

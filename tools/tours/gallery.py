@@ -1,17 +1,23 @@
 """Takes pictures of every page in every language, and in several sizes and colour schemes."""
 
+import contextlib
 import pathlib
 import tempfile
 
 from onscreen import messages
+from onscreen.desktop import Desktop
 from onscreen.processes import wait_for
 
 from . import crowded
+from .facts import Facts
+from .medium import Medium
 from .person import Person
-from .ways import GEAR_REFRESH, choose_model
+from .visit import GEAR_REFRESH, choose_model
 
 LANGUAGES = ("en_US", "de_DE", "ja_JP", "ko_KR", "zh_CN")
 DEVICES = 40
+_ROWS = 8  # enough to show every kind of name
+_ANSWER_SECONDS = 20
 _PATIENCE = 120
 _SEARCHES = 10
 _LARGE, _USUAL = 18, 10  # points
@@ -41,17 +47,31 @@ def settings(scheme, points):
 def all_looks(follows_desktop):
     """Returns (language, scale in per cent, scheme, points) for every set of pictures.
 
-    The front end for macOS has one size and one colour scheme under GNUstep, which finds no texts for
-    zh_CN.
+    The front end for macOS has one size and one colour scheme under GNUstep.
     """
     if not follows_desktop:
-        return [(language, 100, "light", _USUAL) for language in (*LANGUAGES, crowded.LANGUAGE)
-                if language != "zh_CN"]
+        return [(language, 100, "light", _USUAL) for language in (*LANGUAGES, crowded.LANGUAGE)]
     looks = [(language, scale, scheme, _USUAL) for language in LANGUAGES for scale in (100, 200)
              for scheme in ("light", "dark")]
     looks += [(language, scale, "light", _LARGE) for language in LANGUAGES for scale in (100, 200)]
     looks += [(crowded.LANGUAGE, 100, "light", points) for points in (_USUAL, _LARGE)]
     return looks + [("en_US", 100, "contrast", _USUAL)]
+
+
+def take_all(folder, pictures, network):
+    """Takes the pictures of the medium in `folder` on a practice network without devices. Returns the
+    exit status."""
+    pictures = pathlib.Path(pictures)
+    for old in pictures.glob("*.png"):
+        old.unlink()
+    with tempfile.TemporaryDirectory() as copies, Desktop() as desktop:
+        copy = crowded.make(folder, pathlib.Path(copies) / "medium")
+        medium = Medium(copy, Facts(copy))
+        model = next(model.name for model in medium.facts.models
+                     if model.wireless and " " in model.name)
+        Gallery(desktop, medium, pictures, network).take(
+            model, medium.service_type, medium.too_old() or medium.too_new())
+    return 0
 
 
 class Gallery:
@@ -105,13 +125,15 @@ class Gallery:
         with self._start() as person:
             person.see("label", self._text["INST_TXT_MODEL"], _PATIENCE)
             self._take(person, "1-models")
-            choose_model(person, model)
+            choose_model(person, self._medium.facts.names(), model)
             person.press("Return")
             person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
             self._take(person, "2-connection")
             self._search(person)
             # The devices are listed while the wait goes on.
             person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
+            with contextlib.suppress(TimeoutError):  # on a busy machine, few devices answer in time
+                wait_for(lambda: len(person.rows()) >= _ROWS, _ANSWER_SECONDS, "devices in the list")
             self._take(person, "4-devices")
             if Person.follows_desktop:
                 person.press("Tab")  # from the list to the gear button

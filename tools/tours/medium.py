@@ -1,4 +1,4 @@
-"""What the tour has to know about a medium to walk through its wizard."""
+"""A medium as the user of one language meets it."""
 
 import os
 import pathlib
@@ -6,30 +6,29 @@ import plistlib
 
 from onscreen import messages
 
-_RESOURCES = "MacResources/CDCommonInfo.plist"
+from .facts import Unsuitable
+
 _MESSAGES = "MacResources/CDCommonMessage.bundle/Contents/Info.plist"
 _PROGRAM = "Contents/Linux/Onramp OSX"
 
 
-class Unsuitable(Exception):
-    """The tour cannot walk through this medium's wizard. The text says why."""
-
-
 class Medium:
-    """A medium's folder with the application on it, and its texts in one language.
+    """A medium's folder with the application on it, its `facts`, and its texts in one language.
 
     The language is `language`, or the one in which the user reads the medium.
     """
 
-    def __init__(self, folder, language=None):
+    def __init__(self, folder, facts, language=None):
         self.folder = pathlib.Path(folder)
+        self.facts = facts
         application = self._application()
         self.program = application / _PROGRAM
         about = _read(application / "Contents/Info.plist")
-        self._resources = _read(self.folder / about.get("CommonResourcePath", _RESOURCES))
+        self._resources = _read(self.folder / _text(about, "CommonResourcePath", ""))
         self.locale = language or self._locales()[0]
         self.language = messages.language(self.folder, [language] if language else self._locales())
-        self.text = messages.read(self.folder, self.language)
+        self.text = (messages.read(self.folder, self.language) if facts.texts.get(self.language)
+                     else messages.Texts())
         # The name of the menu's button comes from the application, not from the medium.
         self.gear = messages.read_table(
             application / f"Contents/Resources/{self.language}.lproj/ChooseDeviceView.strings")[
@@ -48,43 +47,64 @@ class Medium:
         preferred = []
         if locale.split(".")[0] not in ("C", "POSIX"):
             preferred = [*filter(None, os.environ.get("LANGUAGE", "").split(":")), locale]
-        table = self.folder / _MESSAGES
-        about = _read(table) if table.exists() else {}
-        return [*(preferred or ["en"]), about.get("CFBundleDevelopmentRegion", "en"), "en"]
+        region = _text(_read(self.folder / _MESSAGES), "CFBundleDevelopmentRegion", "en")
+        return [*(preferred or ["en"]), region, "en"]
 
     @property
     def service_type(self):
-        """The service type that the wizard looks for, without its closing dot."""
-        return self._resources.get("BonjourNetwork", "").rstrip(".")
+        """The service type that the wizard looks for, without its closing dot; "" without one."""
+        return _text(self._resources, "BonjourNetwork", "").rstrip(".")
 
-    def wireless_models(self):
-        """Returns the models that support wireless, in the order of their names."""
-        contained = _read(self._path("CDInfo")).get("ContainedModel", {})
-        details = _read(self._path("ModelInfo")).get("Model", {})
-        wireless = [name for name in contained
-                    if details.get(name, {}).get("Interfaces", {}).get("WirelessLAN")]
-        if not wireless:
-            raise Unsuitable(f"{self._path('ModelInfo')} has no model with WirelessLAN: the wizard "
-                             "opens the package and shows no page")
-        return sorted(wireless, key=str.lower)
+    def oldest_system(self):
+        """Returns the oldest supported version; None if there is no limit."""
+        bound = self._bound("SystemMin")
+        return bound and ".".join(map(str, bound))
 
-    def unsupported_version(self):
-        """Returns a system version that the medium does not support; None if it supports all."""
-        for bound, step in (("SystemMin", -1), ("SystemMax", 1)):
-            try:
-                major = int(self._resources[bound]["Major"])
-            except (KeyError, ValueError):
-                continue
-            if major:
-                return f"{major + step}.0.0"
-        return None
+    def too_old(self):
+        """Returns a version that the medium refuses as too old; None if there is none."""
+        bound = self._bound("SystemMin")
+        if not bound:
+            return None
+        major, minor, bug_fix = bound
+        if bug_fix:
+            return f"{major}.{minor}.{bug_fix - 1}"
+        return f"{major}.{minor - 1}.0" if minor else f"{major - 1}.0.0"
 
-    def _path(self, entry):
-        return self.folder / self._resources.get(entry, "")
+    def too_new(self):
+        """Returns a version that the medium refuses as too new; None if there is none."""
+        bound = self._bound("SystemMax")
+        if not bound:
+            return None
+        major, minor, bug_fix = bound
+        limit = self._resources["SystemMax"].get("BugFix")
+        return f"{major}.{minor + 1}.0" if str(limit).lower() == "x" else f"{major}.{minor}.{bug_fix}"
+
+    def _bound(self, name):
+        """Returns a bound's three numbers; None where the wizard sees no limit."""
+        bound = self._resources.get(name)
+        if not isinstance(bound, dict):
+            return None
+        numbers = [_number(bound.get(key)) for key in ("Major", "Minor", "BugFix")]
+        return numbers if numbers[0] > 0 else None
 
 
 def _read(path):
+    """Returns a property list's dictionary. One that cannot be read is empty, as for the wizard."""
     try:
-        return plistlib.loads(path.read_bytes())
-    except (OSError, plistlib.InvalidFileException, ValueError) as error:
-        raise Unsuitable(f"{path} cannot be read as a property list: {error}") from error
+        content = plistlib.loads(path.read_bytes())
+    except Exception:  # plistlib's errors have nothing in common
+        return {}
+    return content if isinstance(content, dict) else {}
+
+
+def _text(content, key, default):
+    value = content.get(key)
+    return value if isinstance(value, str) else default
+
+
+def _number(value):
+    """Returns the number that the wizard reads: a text's leading digits count."""
+    if isinstance(value, str):
+        digits = len(value) - len(value.lstrip("0123456789"))
+        return int(value[:digits] or 0)
+    return value if isinstance(value, int) else 0

@@ -14,6 +14,10 @@
 - (void)setAccessibilityRole:(NSString*)role;
 @end
 
+@interface NSCell (OnrampAccessibility)
+- (void)setAccessibilityElement:(BOOL)isElement;
+@end
+
 @interface NSWindow (OnrampTermination)
 - (void)setPreventsApplicationTerminationWhenModal:(BOOL)prevents;
 @end

@@ -73,6 +73,14 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
                              arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
+// GNUstep would return the size of the text on a single line.
+NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
+  if (![self isKindOfClass:[NSTextFieldCell class]]) return [self cellSize];
+  return [[self attributedStringValue] boundingRectWithSize:bounds.size
+                                                    options:NSStringDrawingUsesLineFragmentOrigin]
+      .size;
+}
+
 // Prevents GNUstep from starting its daemon for notifications between applications. The application
 // exchanges no such notifications, and would fail to launch if the daemon were slow to answer.
 id noDistributedCenter(id, SEL) {
@@ -122,6 +130,7 @@ BOOL openURL(id, SEL, NSURL* url) {
         @selector(beginSheetModalForWindow:modalDelegate:didEndSelector:contextInfo:), beginSheet);
     originalPerformKey =
         replaceMethod([NSButton class], @selector(performKeyEquivalent:), performKeyEquivalent);
+    replaceMethod([NSCell class], @selector(cellSizeForBounds:), cellSizeForBounds);
     replaceMethod([NSWorkspace class], @selector(openURL:), openURL);
     replaceMethod(object_getClass([NSDistributedNotificationCenter class]),
                   @selector(defaultCenter), noDistributedCenter);

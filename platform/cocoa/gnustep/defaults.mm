@@ -34,7 +34,9 @@ NSArray* languageCodes() {
 @implementation OnrampDefaults
 
 // Sets the user's languages, shows the menu inside the window, and shows no icon of the application
-// on the desktop.
+// on the desktop. Draws all texts in a font with Chinese, Japanese and Korean characters, because
+// GNUstep draws a question mark for a character that the font lacks. GNUstep ignores a font that is
+// not installed.
 + (void)load {
   @autoreleasepool {
     NSUserDefaults* const defaults = [NSUserDefaults standardUserDefaults];
@@ -43,6 +45,8 @@ NSArray* languageCodes() {
     [options setObject:languageCodes() forKey:@"NSLanguages"];
     [options setObject:@"NSWindows95InterfaceStyle" forKey:@"NSMenuInterfaceStyle"];
     [options setObject:@"YES" forKey:@"GSSuppressAppIcon"];
+    [options setObject:@"NotoSansCJKjp-Regular" forKey:@"NSFont"];
+    [options setObject:@"NotoSansCJKjp-Bold" forKey:@"NSBoldFont"];
     [defaults removeVolatileDomainForName:kFirstDomain];
     [defaults setVolatileDomain:options forName:kFirstDomain];
   }

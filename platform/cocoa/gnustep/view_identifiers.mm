@@ -67,6 +67,13 @@ void dealloc(id self, SEL selector) {
 
 @end
 
+@implementation NSCell (OnrampAccessibility)
+
+- (void)setAccessibilityElement:(BOOL)isElement {
+}
+
+@end
+
 @interface OnrampViewIdentifiers : NSObject
 @end
 

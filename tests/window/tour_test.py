@@ -1,0 +1,50 @@
+"""Takes the tour of a medium with a mistake on it.
+
+Usage: tour_test.py MEDIUM, a medium's folder with the application on it. The environment variable
+ONRAMP_CHECK names onramp-check.
+"""
+
+import pathlib
+import re
+import shutil
+import subprocess
+import sys
+import tempfile
+import unittest
+
+import media
+from media import model
+
+BUILT = pathlib.Path(sys.argv.pop()).resolve()
+TOUR = pathlib.Path(__file__).resolve().parents[2] / "tools/tour"
+# No device can announce a name without a space, so the tour is the same with and without a network.
+MODELS = {"Ä/1": model(usb=True, wireless=True), "a-1": model(wireless=True), "Cable": model(usb=True)}
+
+
+class Tour(unittest.TestCase):
+    def test_a_mistake_does_not_keep_the_tour_from_pictures_of_every_kind_in_every_language(self):
+        with tempfile.TemporaryDirectory() as folder:
+            medium = media.make(f"{folder}/medium", BUILT, MODELS,
+                                SystemMin={"Major": "11", "Minor": "3"})
+            (medium / "Packages/Kestrel.pkg").unlink()
+            for shared in ("CDCommonMessage.bundle", "Images"):
+                (medium / "MacResources" / shared).unlink()
+                shutil.copytree(BUILT / "MacResources" / shared, medium / "MacResources" / shared)
+            pictures = pathlib.Path(folder) / "pictures"
+            done = subprocess.run([TOUR, "--languages", "de,zh_CN", medium, pictures],
+                                  capture_output=True, text=True)
+            self.assertEqual(done.returncode, 1, done.stdout + done.stderr)
+            for said in ("goes on with macOS 11.3.0", "the medium has no limit SystemMax",
+                         "By cable, users see nothing, because Packages/Kestrel.pkg is not on"):
+                self.assertEqual(done.stdout.lower().count(said.lower()) > 1, True, said)
+            steps = ["1-models", "2-connection", "3-cable"]
+            names = {*(f"{name}-{step}" for name in ("a-1", "A-1-2") for step in steps),
+                     "Cable-1-models", "menu-0-refused", "menu-1-menu", "menu-2-about",
+                     "alert-1-too-old"}
+            expected = {f"{language}-{name}.png" for language in ("de", "zh-CN") for name in names}
+            self.assertEqual({path.name for path in pictures.glob("*.png")}, expected)
+            index = (pictures / "index.html").read_text(encoding="utf-8")
+            self.assertEqual(set(re.findall(r'src="([^"]*)"', index)), expected)
+
+
+unittest.main()

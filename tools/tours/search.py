@@ -1,0 +1,105 @@
+"""The wireless way of the tour, on a network of made-up devices."""
+
+from onscreen.processes import wait_for
+
+from .visit import CONNECTION, DEVICES, GEAR_REFRESH, WentWrong
+
+_SEARCHES = 3  # on a busy machine, the first search may be in vain
+_LONGEST_SEARCH = 75  # seconds; the wizard waits 15, but the machine may be busy
+_LONGEST_NAME = 63  # bytes; a DNS label holds no more
+
+
+class Devices:
+    """Makes up devices of the medium's models on the practice network `network`."""
+
+    def __init__(self, network, service_type):
+        self._network = network
+        self._type = service_type
+        self._entries = {}
+
+    def make(self, models):
+        """Makes two wireless devices of each model, and one of the first that is on a cable."""
+        for number, model in enumerate(models):
+            self._add(model, model)
+            self._add(model, second_of(model))
+            if number == 0:
+                self._add(model, f"{model} on a cable", activeif=1)
+        self._network.settle()
+
+    def _add(self, model, name, **entries):
+        maker, kind = model.split(" ", 1)
+        self._entries[name] = {"maker": maker, "model": kind, "type": self._type} | entries
+        self._network.add(_label(name), **self._entries[name])
+
+    def leave(self):
+        for name in self._entries:
+            self._network.remove(_label(name))
+
+    def come_back(self):
+        for name in self._entries:
+            self._network.add(_label(name))
+        self._network.settle()
+
+
+def _label(name):
+    while len(name.encode()) > _LONGEST_NAME:
+        name = name[:-1]
+    return name
+
+
+def second_of(model):
+    return _label(f"(2) {model}")
+
+
+def matches_devices(model):
+    """Returns whether a device can announce the model's name: a maker, a space and a model."""
+    maker, space, kind = model.partition(" ")
+    return bool(maker and space and kind)
+
+
+def find_devices(visit, medium, step=None):
+    """Searches from the connection page until devices are listed. `step` names a picture of that."""
+    for number in range(_SEARCHES):
+        visit.next()
+        wait_for(lambda: visit.person.sees("progress bar"), 20, "the search to begin")
+        if step and number == 0:
+            visit.picture(step, "The search")
+        wait_for(lambda: not _is_searching(visit) and (visit.shows(DEVICES) or _can_connect(visit)),
+                 _LONGEST_SEARCH, "the search to end")
+        if visit.shows(DEVICES):
+            visit.see(DEVICES)
+            return
+    raise WentWrong(f"the {DEVICES} did not appear: {_SEARCHES} searches found none of the made-up "
+                    f"devices of the service type \"{medium.service_type}\". "
+                    + medium.facts.about("BonjourNetwork"))
+
+
+def _is_searching(visit):
+    return visit.person.sees("progress bar")
+
+
+def _can_connect(visit):
+    """Returns whether the connection page takes keys: no set-up tool is running."""
+    return visit.shows(CONNECTION) and any(
+        visit.person.has_state(control, "focused")
+        for role, _, control in visit.person.everything() if role == "radio button")
+
+
+def search_in_vain(visit, devices, gear):
+    """Shows the menu of the device list, a search in vain, and a search that finds devices."""
+    person = visit.person
+    devices.leave()
+    person.open_menu(gear)
+    visit.picture("6-gear", "The menu of the device list")
+    person.press("Escape")
+    person.choose_from_menu(gear, GEAR_REFRESH)
+    wait_for(lambda: _is_searching(visit), 20, "a new search to begin")
+    wait_for(lambda: person.sees("alert"), _LONGEST_SEARCH, "the alert that no device was found")
+    visit.picture("7-not-found", "A search in vain: the alert")
+    person.press("Return")
+    person.see_gone("alert")
+    visit.picture("8-nothing", "The device list after a search in vain")
+    devices.come_back()
+    person.choose_from_menu(gear, GEAR_REFRESH)
+    wait_for(lambda: _is_searching(visit), 20, "a new search to begin")
+    person.see_gone("progress bar", seconds=_LONGEST_SEARCH)

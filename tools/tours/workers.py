@@ -1,0 +1,80 @@
+"""Takes the tour in several languages side by side, each on a practice network of its own."""
+
+import concurrent.futures
+import json
+import pathlib
+import subprocess
+import sys
+import tempfile
+import time
+
+from onscreen import messages
+from practice_network.command import NO_NAMESPACE
+
+from . import index
+from .facts import Facts, Unsuitable
+
+INSIDE = "--inside"
+_TOOLS = pathlib.Path(__file__).resolve().parents[1]
+_AT_A_TIME = 3  # a search is mostly waiting
+
+
+def run(arguments, on_network=True, **options):
+    """Runs the tour with `arguments`, if wanted on a practice network without devices. Returns the
+    finished process."""
+    network = [sys.executable, _TOOLS / "practice-network", "/dev/null"] if on_network else []
+    return subprocess.run([*network, sys.executable, _TOOLS / "tour", *arguments], **options)
+
+
+def take_tours(medium, original, pictures, languages, options):
+    """Takes the tours and writes the index. Returns the exit status.
+
+    `original` is the folder that onramp-check reads: `medium`, or that to which its links lead.
+    """
+    began = time.monotonic()
+    facts = Facts(original)
+    wanted = _chosen(languages, medium)
+    status = subprocess.run([sys.executable, _TOOLS / "practice-network", "/dev/null", "true"]).returncode
+    if status not in (0, NO_NAMESPACE):
+        return status
+    if status == NO_NAMESPACE:
+        print("A network of made-up devices cannot be created here (see above), "
+              "so the tour goes only by cable.", flush=True)
+    folder = pathlib.Path(pictures)
+    folder.mkdir(parents=True, exist_ok=True)
+    for old in folder.glob("*.png"):
+        old.unlink()
+    print(f"Walking through {len(wanted)} language{'s'[len(wanted) == 1:]}, {_AT_A_TIME} at a time.",
+          flush=True)
+    with tempfile.TemporaryDirectory() as results:
+        orders = [{"medium": medium, "original": original, "pictures": pictures, "language": language,
+                   "options": options, "has_network": status == 0,
+                   "result": f"{results}/{number}"} for number, language in enumerate(wanted)]
+        with concurrent.futures.ThreadPoolExecutor(_AT_A_TIME) as pool:
+            statuses = list(pool.map(_take_one, orders))
+        files = [pathlib.Path(order["result"]) for order in orders]
+        albums = [json.loads(file.read_text(encoding="utf-8")) for file in files if file.exists()]
+    index.write(folder, original, facts.findings, albums)
+    print(f"\n{len(list(folder.glob('*.png')))} pictures in {time.monotonic() - began:.0f} s: "
+          f"{folder / 'index.html'}")
+    return max(statuses)
+
+
+def _chosen(languages, medium):
+    """Returns the languages to walk in; None stands for the user's own."""
+    offered = messages.languages(medium)
+    wanted = offered if languages == "all" else filter(None, languages.split(","))
+    wanted = list(wanted) or [None]
+    for language in wanted:
+        if language and language not in offered:
+            raise Unsuitable(f"{medium} has no texts in the language {language!r}; "
+                             f"it has {', '.join(offered) or 'no texts at all'}")
+    return wanted
+
+
+def _take_one(order):
+    """Runs one tour, and prints what it says when it has ended, so that tours do not mix."""
+    done = run([INSIDE, json.dumps(order)], order["has_network"],
+               stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True)
+    print(f"\n{done.stdout}", end="", flush=True)
+    return done.returncode
