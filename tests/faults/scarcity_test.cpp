@@ -47,11 +47,11 @@ TEST(Scarcity, MakesAFunctionFailAndDoesNoOtherHarm) {
       {"DatagramSocket::open", [] { return DatagramSocket::open().has_value(); }},
       {"runAndWait", [&] { return runAndWait(opener, {}) == 0; }},
       {"openFile", [] { return openFile("/package.pkg"); }}};
-  for (const auto& [name, function] : functions) {
-    SCOPED_TRACE(name);
+  for (const auto& function : functions) {
+    SCOPED_TRACE(function.first);
     bool succeeded = false;
     faults::failEveryCall(
-        {EMFILE, EAGAIN}, [&] { succeeded = function(); },
+        {EMFILE, EAGAIN}, [&] { succeeded = function.second(); },
         [&](const std::string& failed, const faults::Failure&) {
           EXPECT_TRUE(succeeded || !failed.empty());
         });
