@@ -7,14 +7,14 @@
 
 namespace onramp {
 
-/// Runs `action` once on the main thread, no earlier than `delay` from now, in every mode of the
-/// main loop, including the modal mode. Timers run in the order of their due times. Must be called
-/// on the main thread.
+/// Runs `action` once on the main thread, no earlier than `delay` from now, even while a modal
+/// window is shown. Timers run in the order of their due times. When the application terminates,
+/// `action` may never run. Must be called on the main thread.
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action);
 
-/// Runs `action` once on the main thread, in every mode of the main loop. Actions never run inside
-/// this function. They run in the order of the calls, except those that abortModal() holds back.
-/// Callable from any thread.
+/// Runs `action` once on the main thread, even while a modal window is shown. Actions never run
+/// inside this function. They run in the order of the calls, except those that abortModal() holds
+/// back. When the application terminates, `action` may never run. Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 
 /// Shows `window`, which must not be an empty handle, makes it the key window, and runs the main

@@ -1,7 +1,7 @@
 // Encodes the request for the SNMP object ActiveIF and decodes the reply, in turn with the wizard's
 // codec and with the net-snmp library. Prints the time for each message, the ratio of the times,
-// and the number of allocations for each message. With --json, prints the times as bench/compare
-// reads them.
+// and the number of allocations for each message. With --json, prints the times in the form that
+// bench/compare reads.
 
 #include <net-snmp/net-snmp-config.h>
 #include <net-snmp/net-snmp-includes.h>
@@ -168,8 +168,11 @@ int main(int argc, char** argv) {
     printJson("SNMP message", "decoding", "net-snmp's library", ourParse, peerParse);
     return 0;
   }
-  std::printf("Medians of %d rounds of %d messages of %zu bytes [5 %%, 95 %%]\n", kRounds,
-              kMessagesPerRound, a.size());
+  std::printf(
+      "Medians [5 %% and 95 %% quantiles] of %d rounds of %d messages (request %zu bytes, reply "
+      "%zu "
+      "bytes)\n",
+      kRounds, kMessagesPerRound, a.size(), reply.size());
   report("encode", ourBuild, peerBuild, allocationsOf([&] { request.build(); }),
          allocationsOf([&] { peer.build(); }));
   report("decode", ourParse, peerParse, allocationsOf([&] { answer.parse(reply); }),

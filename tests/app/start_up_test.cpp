@@ -28,7 +28,7 @@ TEST_F(StartUp, ListsTheModelsInByteOrderWhenTheirConnectionsDiffer) {
   EXPECT_EQ(screen.log.back(), "key and front");
 }
 
-TEST_F(StartUp, SkipsTheListWhenAllModelsHaveTheSameWiredConnections) {
+TEST_F(StartUp, SkipsTheListWhenAllModelsHaveTheSameConnectionsByCable) {
   const std::string wired =
       expectedConnectionPage("wiredLan.png", "INST_TXT_USB\nINST_TXT_ETHERNET");
   const std::string usb = expectedConnectionPage("usb.png", "INST_TXT_USB");
@@ -137,7 +137,7 @@ TEST_F(StartUp, RemovesTheFilesThatEarlierRunsLeft) {
   EXPECT_THAT(found, testing::UnorderedElementsAreArray(kept));
 }
 
-TEST_F(StartUp, StartsWhateverTheMediumLacks) {
+TEST_F(StartUp, StartsNoMatterWhatTheMediumLacks) {
   const std::string information = "Onramp OSX.app/Contents/Info.plist";
   const std::string missing = "missing";
   const std::string head = "<plist version=\"1.0\"><dict><key>";

@@ -123,7 +123,8 @@ def maximum(major, minor, bug_fix):
     return put(COMMON, "SystemMax", {"Major": major, "Minor": minor, "BugFix": bug_fix})
 
 
-# Each row has the breaker of a mistake, the identifier of the only finding, and parts of its texts.
+# Each row has a breaker, the identifier of the only finding that it causes, and parts of that
+# finding's texts.
 MISTAKES = [
     # Property lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),

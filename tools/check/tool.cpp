@@ -78,7 +78,7 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
          .place = {.file = table, .key = {kDisplayName}},
          .found = "the name " + quoted(*translated) + ", without " + quoted(maker),
          .expected = "a translation of " + quoted(name),
-         .effect = "on macOS, users of that language see that name",
+         .effect = "on macOS, users of this file's language see the name " + quoted(*translated),
          .remedy = "translate the tool's current name"});
   }
 }

@@ -13,15 +13,16 @@ struct TextStyle {
   std::size_t width = 0;  ///< columns of the terminal; 0 when the output is not a terminal
 };
 
-/// Returns a style with colours and columns if standard output is a terminal, and without them if
-/// it is a file or a pipe.
+/// Returns a style with colours and the terminal's width if standard output is a terminal.
+/// Otherwise the style has no colours, and its width is 0.
 [[nodiscard]] TextStyle outputStyle(bool isVerbose);
 
 /// Returns the header line of the table of devices.
 [[nodiscard]] std::string tableHead(const TextStyle& style);
 
-/// Returns a device's row in the table, and the lines that follow the row: the verdict, if the
-/// wizard does not list the device, the notes and, in the verbose style, all details.
+/// Returns a device's row in the table and the lines that follow it. These are the reason, but only
+/// for a device that the wizard does not list, then the notes and, in the verbose style, all
+/// details.
 [[nodiscard]] std::string rowOf(const JudgedDevice& device, const TextStyle& style);
 
 /// Returns the row for a device that is no longer announced.
