@@ -58,8 +58,8 @@ class View : public Outlet {
   [[nodiscard]] View firstSubview() const;
 
   /// Puts `view` inside this view and makes `view` fill it. Gives the keyboard focus to the first
-  /// list in `view`, or to the first control if there is no list. The owner of `view` does not
-  /// change.
+  /// list in `view`, or to the first control if there is no list. Lists and controls that do not
+  /// accept the focus do not count. The owner of `view` does not change.
   void addSubview(const View& view) const;
 
   /// Removes this view from the view that contains it, if there is one. The owner of this view does
@@ -109,7 +109,7 @@ class RadioMatrix : public Control {
   [[nodiscard]] int selectedRow() const;
 };
 
-/// A reference to an image file. The file is read when the image is drawn.
+/// A reference to an image file. The file is not read before the image is drawn.
 struct Image {
   std::string path;
 
@@ -187,7 +187,7 @@ class Window : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kWindow;
   using Outlet::Outlet;
 
-  /// Shows or hides the window's mark for resizing. On a system whose windows have no such mark,
+  /// Shows or hides the window's mark for resizing, if the system's windows have one. With Qt,
   /// setShowsResizeIndicator(false) prevents the user from resizing the window.
   void setShowsResizeIndicator(bool shows) const;
 
