@@ -161,12 +161,13 @@ class TableView : public Control {
   void setAllowsColumnSelection(bool allows) const;
   /// Shows `title` above a column. Does nothing when the table has no such column.
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
-  /// Does nothing in a front end whose tables never accept edits.
+  /// Sets whether the user may edit the texts in a column. Does nothing in a front end whose tables
+  /// never accept edits.
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 is what the button itself shows, not
-/// a command.
+/// A button that opens a menu of commands. Item 0 is not a command but what the button itself
+/// shows.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;
