@@ -25,9 +25,9 @@ struct AlertSheet {
 };
 
 /// Shows a sheet on `window`, which must not be an empty handle, and returns at once. When the
-/// sheet has ended, calls `didEnd` with kAlertOtherReturn if the user clicked the other button, and
-/// with kAlertDefaultReturn in all other cases. Does not call `didEnd` when the application
-/// terminates first.
+/// sheet has ended, calls `didEnd` with kAlertOtherReturn if the user clicked the button
+/// `otherButton`, and with kAlertDefaultReturn in all other cases. Does not call `didEnd` when the
+/// application terminates first.
 void beginAlertSheet(const AlertSheet& sheet, const Window& window,
                      std::function<void(int returnCode)> didEnd);
 

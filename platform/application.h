@@ -38,14 +38,14 @@ class ApplicationDelegate : public InterfaceOwner {
 /// controller, and runs the main loop until the application terminates. Returns the process's exit
 /// status. If the interface file cannot be loaded, prints a message that names the file; the exit
 /// status is then 1. On some systems the process ends inside this function when the application
-/// terminates. With Qt, the process also ends inside this function after an invalid option, after
-/// --help and --version, and when there is no display.
+/// terminates. With Qt, the process ends inside this function after an invalid option, after --help
+/// and --version, and when there is no display.
 int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
 /// Terminates the application. The main loop and any modal loop inside it stop, and no further
-/// timer or event is handled. On some systems the process ends inside this function. On other
-/// systems the function returns, and the caller must stop what it is doing.
+/// timer, posted action or event is handled. On some systems the process ends inside this function.
+/// On other systems the function returns, and the caller must stop what it is doing.
 void terminateApplication();
 
 /// hideApplication() takes all windows off the screen. unhideApplication() brings those windows

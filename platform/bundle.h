@@ -10,7 +10,7 @@ namespace onramp {
 
 /// A folder laid out as a resource bundle. The folder holds Contents/Info.plist and
 /// Contents/Resources, which has one folder of string tables for each language. In an application,
-/// a folder of Contents that is named after the operating system holds the executable. This object
+/// a folder in Contents that is named after the operating system holds the executable. This object
 /// stores only the path, and every query reads the disk. macOS, however, caches what it has read of
 /// a bundle, so a change to a bundle may go unnoticed while the program runs.
 class Bundle {
@@ -32,15 +32,15 @@ class Bundle {
   /// value or the value is not a string.
   [[nodiscard]] std::optional<std::string> infoString(std::string_view key) const;
 
-  /// Like infoString(), but returns the text in the user's language if the bundle's string table
-  /// "InfoPlist" contains `key`.
+  /// Like infoString(), but returns the text under `key` in the bundle's string table "InfoPlist"
+  /// if there is one.
   [[nodiscard]] std::optional<std::string> localizedInfoString(const std::string& key) const;
 
   /// Returns the path of the resource file `name`.`type`, where an empty `type` means a name
   /// without an extension. The search starts outside the language folders. It continues in the
   /// folder of the user's most preferred language that the bundle offers, and then in that of the
   /// bundle's development language. If the bundle offers neither language, the search continues in
-  /// the folder of English, or in that of any other language when the bundle does not offer
+  /// the folder of English, or in that of one other language when the bundle does not offer
   /// English. Returns nothing when the search finds no such file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
                                                            const std::string& type) const;

@@ -17,8 +17,9 @@ namespace onramp {
 
 /// Reports that a NetServiceBrowser's search sees a service on one network interface and protocol,
 /// or no longer sees the service there. The browser's client, in contrast, is told only of a
-/// service's first sighting and of the loss of the last one. When the search ends or discovery
-/// stops working, the services that were seen until then are not reported as gone.
+/// service's first sighting and of the loss of the last one. When the search ends, when it leaves a
+/// domain, and when discovery stops working, the services that were seen until then are not
+/// reported as gone.
 struct ServiceSighting {
   std::string name;       ///< as NetService::name()
   std::string type;       ///< as NetService::type()
@@ -29,8 +30,8 @@ struct ServiceSighting {
 };
 
 /// Sets the function that is called on the main thread for each sighting in any search. Replaces
-/// the earlier function. A null `watch` ends the calls. The backend for macOS does not receive
-/// sightings and never calls `watch`.
+/// the earlier function. A null `watch` ends the calls. The backend for macOS never calls `watch`,
+/// because macOS does not report the interface of a sighting.
 void watchSightings(std::function<void(const ServiceSighting&)> watch);
 
 }  // namespace onramp

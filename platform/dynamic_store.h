@@ -17,11 +17,11 @@
 ///
 /// Callers can rely on two kinds of entries, both in the domain kSCDynamicStoreDomainState:
 /// - the IPv4 entity of an interface. It exists for every interface that is up, can pass traffic
-///   (has a carrier and has passed authentication) and has an IPv4 address. The loopback interface
-///   is no exception. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold one
-///   dotted text for each address, in the system's order. The array
-///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
-///   when none is set;
+///   (has a carrier and has passed authentication where required) and has an IPv4 address. The
+///   loopback interface is no exception. The arrays kSCPropNetIPv4Addresses and
+///   kSCPropNetIPv4SubnetMasks hold one dotted text for each address, in the system's order. The
+///   array kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is
+///   absent when none is set;
 /// - the global IPv4 entity, which exists while there is a usable default route. Its text
 ///   kSCDynamicStorePropNetPrimaryInterface names the interface of the preferred default route.
 namespace onramp {
@@ -40,9 +40,9 @@ inline constexpr int kSCStatusFailed = 1001;
 inline constexpr int kSCStatusInvalidArgument = 1002;
 inline constexpr int kSCStatusNoStoreSession = 2001;
 
-/// A session with the store. The linked backend defines this type. Every function accepts a null
-/// session, for which it fails with kSCStatusNoStoreSession. Only one thread at a time may use a
-/// session, and only the main thread may use a session that has a callback.
+/// A session with the store. The linked backend defines this type. A function that gets a null
+/// session fails with kSCStatusNoStoreSession. Only one thread at a time may use a session, and
+/// only the main thread may use a session that has a callback.
 struct DynamicStore;
 using DynamicStoreRef = std::shared_ptr<DynamicStore>;
 

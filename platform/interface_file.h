@@ -42,8 +42,8 @@ class Interface {
   Interface& operator=(const Interface&) = delete;
   ~Interface();
 
-  /// Returns the first top-level object that is a view of any class, or an empty handle when there
-  /// is none.
+  /// Returns the first of the file's top-level views, or an empty handle when there is none. In
+  /// Qt's files, a window counts as a view.
   [[nodiscard]] View view() const;
 
   /// Returns the class that the file gives to the result of view(), such as "ModelListView", or an

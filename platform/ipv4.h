@@ -6,7 +6,8 @@
 
 namespace onramp {
 
-/// An IPv4 address. The first part of its dotted form is the highest byte of `bits`.
+/// An IPv4 address. The first part of its dotted form is the highest byte of `bits`. The functions
+/// below can be called from any thread.
 struct IPv4Address {
   std::uint32_t bits = 0;
   friend bool operator==(IPv4Address, IPv4Address) = default;

@@ -58,8 +58,8 @@ class View : public Outlet {
   [[nodiscard]] View firstSubview() const;
 
   /// Puts `view` inside this view and makes `view` fill it. Gives the keyboard focus to the first
-  /// list in `view`, or to the first control if there is no list. The owner of `view` does not
-  /// change.
+  /// list in `view`, or to the first control if there is no list. Lists and controls that do not
+  /// accept the focus do not count. The owner of `view` does not change.
   void addSubview(const View& view) const;
 
   /// Removes this view from the view that contains it, if there is one. The owner of this view does
@@ -109,7 +109,7 @@ class RadioMatrix : public Control {
   [[nodiscard]] int selectedRow() const;
 };
 
-/// A reference to an image file. The file is read when the image is drawn.
+/// A reference to an image file. The file is not read before the image is drawn.
 struct Image {
   std::string path;
 
@@ -161,12 +161,13 @@ class TableView : public Control {
   void setAllowsColumnSelection(bool allows) const;
   /// Shows `title` above a column. Does nothing when the table has no such column.
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
-  /// Does nothing in a front end whose tables never accept edits.
+  /// Sets whether the user may edit the texts in a column. Does nothing in a front end whose tables
+  /// never accept edits.
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 is what the button itself shows, not
-/// a command.
+/// A button that opens a menu of commands. Item 0 is not a command but what the button itself
+/// shows.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;
@@ -187,7 +188,7 @@ class Window : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kWindow;
   using Outlet::Outlet;
 
-  /// Shows or hides the window's mark for resizing. On a system whose windows have no such mark,
+  /// Shows or hides the window's mark for resizing, if the system's windows have one. With Qt,
   /// setShowsResizeIndicator(false) prevents the user from resizing the window.
   void setShowsResizeIndicator(bool shows) const;
 

@@ -2,8 +2,8 @@
 
 namespace onramp {
 
-// With these functions, a front end tells the threads that sleep in sleepOffMainThread() that the
-// application terminates. Both are callable from any thread.
+// A front end calls beginTermination() when the application terminates. Both functions can be
+// called from any thread.
 
 /// Returns whether beginTermination() has been called.
 [[nodiscard]] bool isTerminating();

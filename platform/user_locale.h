@@ -12,8 +12,8 @@ namespace onramp {
 /// result is empty when the country is unknown.
 [[nodiscard]] std::string localeCountryCode();
 
-/// Returns the user's languages, the most preferred one first, as identifiers such as "zh_CN" or
-/// "de".
+/// Returns the user's languages, the most preferred one first, as identifiers such as "de", "zh_CN"
+/// or "zh_Hans_CN".
 [[nodiscard]] std::vector<std::string> preferredLanguages();
 
 }  // namespace onramp

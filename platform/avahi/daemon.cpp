@@ -76,7 +76,7 @@ void Daemon::retryLater() {
 void Daemon::add(Query* query) {
   queries_.push_back(query);
   if (isPresent_) query->ask();
-  runSoon();  // arms the timers of the resolve that the query belongs to
+  runSoon();  // arms the timers that the query's resolve may have started
 }
 
 void Daemon::remove(Query* query) {
@@ -138,8 +138,8 @@ int Daemon::onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error*) {
   return 0;
 }
 
-// Here and in lost(), a query may remove other queries from `queries_`, so the loop runs over a
-// copy and skips the removed ones.
+// Here and in lost(), a query is allowed to remove other queries from `queries_`. The loop
+// therefore runs over a copy and skips the removed queries.
 void Daemon::arrived() {
   isPresent_ = true;
   for (Query* const query : std::vector(queries_)) {
@@ -169,8 +169,8 @@ Message Daemon::newCall(const char* method) const {
   return Message(message);
 }
 
-// The connection to the bus takes ownership of `reply`. It destroys `reply` after the answer has
-// arrived, or when the connection itself is destroyed. Returns false when the message cannot be
+// The connection to the bus takes ownership of `reply`, and destroys it after the answer has
+// arrived or when the connection itself is destroyed. Returns false when the message cannot be
 // sent.
 bool Daemon::call(sd_bus_message* message, Reply reply) {
   const auto answered = [](sd_bus_message* answer, void* receiver, sd_bus_error*) {

@@ -75,8 +75,8 @@ bool Service::resolveWithTimeout(std::chrono::duration<double> timeLimit) {
   return client_ ? startResolve(timeLimitOf(timeLimit)) : resolveNow(timeLimitOf(timeLimit));
 }
 
-// The client is called from the main loop, not from inside the daemon's loop. It may therefore
-// destroy any object, and a slow client does not keep the daemon's loop from reading the messages
+// The client is called from the main loop, not from inside sd-event's loop. It may therefore
+// destroy any object, and a slow client does not keep sd-event's loop from reading the messages
 // that are already waiting.
 bool Service::startResolve(TimeLimit timeLimit) {
   daemon_ = Daemon::shared();

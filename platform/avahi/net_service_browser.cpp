@@ -161,8 +161,8 @@ void Browser::gone(const Instance& instance) {
   if (const auto node = services_.extract(instance)) tell(kNetServiceFlagRemove, node.mapped());
 }
 
-// The client is called from the main loop, not from inside the daemon's loop. It may therefore
-// destroy any object, and a slow client does not keep the daemon's loop from reading the messages
+// The client is called from the main loop, not from inside sd-event's loop. It may therefore
+// destroy any object, and a slow client does not keep sd-event's loop from reading the messages
 // that are already waiting.
 void Browser::tell(unsigned long flags, const NetServiceRef& service) {
   performOnMainThread([weak = weak_from_this(), search = search_, flags, service] {

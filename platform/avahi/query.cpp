@@ -23,7 +23,7 @@ void Query::ask() {
   if (asked_ || isRefused_) return;
   const Message call = daemon_.newCall((std::string(kind_) + "Prepare").c_str());
   if (call && arguments_(call.get()) < 0) {
-    isRefused_ = true;  // Appending fails for a text that is not UTF-8, or for lack of memory.
+    isRefused_ = true;  // Appending fails, for example, for a text that is not UTF-8.
     return;
   }
   // The answer may arrive after this query has been destroyed or sent again. The object that the

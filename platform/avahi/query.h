@@ -13,8 +13,8 @@ namespace onramp::avahi {
 inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
-/// A question to the daemon that stays open for as long as this object exists. In the daemon, a
-/// browser or resolver object of version 0.8 of Avahi's D-Bus interface stands for the question.
+/// A question to the daemon that stays open for as long as this object exists. For each question,
+/// the daemon holds an object: a browser or a resolver of version 0.8 of Avahi's D-Bus interface.
 /// (The daemon waits 10 ms before it starts an object that was made with a method of an earlier
 /// version. The *Prepare methods of 0.8 avoid this pause.)
 class Query {
@@ -25,8 +25,8 @@ class Query {
     kCacheExhausted,  ///< the daemon has reported everything in its cache
     kLost,            ///< the daemon went away or the query failed: earlier results are invalid
   };
-  /// Called from inside the daemon's loop. The handler must not destroy the query. `message` is
-  /// null for kLost when the daemon went away.
+  /// Called from inside sd-event's loop. The handler must not destroy the query. `message` is null
+  /// for kLost when the daemon went away.
   using Handler = std::function<void(Event event, sd_bus_message* message)>;
   /// Appends the arguments of the *Prepare method to `call`. Returns a negative number on failure.
   using Arguments = std::function<int(sd_bus_message* call)>;
@@ -38,8 +38,8 @@ class Query {
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Returns whether the question is invalid. An invalid question gets no answer and is not
-  /// repeated.
+  /// Returns whether the daemon has called the question invalid or the question could not be put
+  /// into a message. Such a question gets no result and is not repeated.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:

@@ -37,7 +37,7 @@ class Records {
   };
 
   /// `name` is a domain name with escapes and without a closing dot. `changed` is called from
-  /// inside the daemon's loop whenever all() or isCacheExhausted() may have changed. It must not
+  /// inside sd-event's loop whenever all() or isCacheExhausted() may have changed. It must not
   /// destroy this object.
   Records(Daemon& daemon, const std::string& name, RecordType type, std::function<void()> changed);
 

@@ -17,8 +17,8 @@ constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 // whereas Records finds all of them.
 constexpr unsigned kNoAddress = 8;
 
-// Reads the arguments of a service resolver's Found signal. Joins the strings of the TXT record,
-// which the signal has in reverse order, to the record's data (RFC 1035 section 3.3.14). The data
+// Reads the arguments of a service resolver's Found signal. Builds the data of the TXT record (RFC
+// 1035 section 3.3.14) from the record's strings, which the signal lists in reverse order. The data
 // of a record without strings is one empty string. Returns nothing when the signal is malformed or
 // names no host.
 std::optional<Server> serverIn(sd_bus_message* message) {

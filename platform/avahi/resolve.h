@@ -32,7 +32,7 @@ struct Server {
 /// daemon goes away, the resolve starts again once the daemon is back.
 class Resolve {
  public:
-  /// Called when the resolve ends, at most once, from inside the daemon's loop. The argument is
+  /// Called when the resolve ends, at most once, from inside sd-event's loop. The argument is
   /// nothing when the time is up. The function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
@@ -40,7 +40,8 @@ class Resolve {
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
-  /// Returns whether the service's name is invalid, so that the daemon cannot look it up.
+  /// Returns whether the service's name, type or domain is invalid, so that the daemon cannot look
+  /// up the service.
   [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:

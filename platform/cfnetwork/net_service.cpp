@@ -99,7 +99,8 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  bool isResolved_ = false;  ///< the framework may keep the result of an earlier resolve
+  /// Whether the last resolve has succeeded. The framework may keep the result of an earlier one.
+  bool isResolved_ = false;
 };
 
 }  // namespace

@@ -147,7 +147,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Client client_;
   void* info_;
   Reference<CFNetServiceBrowserRef> browser_;
-  Reference<CFStringRef> domain_;  ///< null unless a search was asked for
+  Reference<CFStringRef> domain_;  ///< null while there is no search
   Reference<CFStringRef> type_;
   std::vector<Found> found_;
   unsigned long search_ = 0;  ///< the search's number; earlier searches are not retried

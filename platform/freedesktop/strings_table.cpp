@@ -106,8 +106,8 @@ class Parser {
     return true;
   }
 
-  // Reads a word, with or without quotation marks. If no word begins here, reports `expected` as
-  // the problem and returns nothing.
+  // Reads a word, with or without quotation marks. Refuses the file and returns nothing if no word
+  // begins here, with the reason `expected`, or if a quotation mark is never closed.
   std::optional<std::string> word(const char* expected) {
     const std::size_t start = at();
     std::optional<std::string> word;

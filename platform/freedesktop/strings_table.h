@@ -18,7 +18,7 @@ namespace onramp {
 /// of old-style property lists, and may contain comments. A key without a text is its own text.
 /// When a key occurs more than once, its last text counts. Returns nothing when any part of the
 /// input violates the grammar, or when there are more pairs than a property list may have objects.
-/// In this case, the function with the parameter `problem` stores the place and the reason there.
+/// In this case, `problem` gets the place and the reason.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);
 

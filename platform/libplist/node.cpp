@@ -25,10 +25,10 @@ struct Free {
 template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
-// libplist's functions for numbers do not distinguish -1 from 2^64-1, and its functions for dates
-// keep only 32 bits. Numbers and dates are therefore converted by means of a binary list that holds
-// nothing else and keeps every bit. The constants kInteger8, kInteger16 and kDate8 are the first
-// bytes of an integer of 8 bytes, an integer of 16 bytes and a date in such a list.
+// libplist's functions for integers do not distinguish -1 from 2^64-1, and its functions for dates
+// keep only 32 bits. Integers and dates are therefore converted by means of a binary list that
+// holds nothing else and keeps every bit. The constants kInteger8, kInteger16 and kDate8 are the
+// first bytes of an integer of 8 bytes, an integer of 16 bytes and a date in such a list.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;
@@ -52,7 +52,7 @@ Node nodeOfObject(const std::string& object) {
   return Node(node);
 }
 
-// Returns `node`. Throws std::bad_alloc if it is null, because libplist creates no node only when
+// Returns `node`. Throws std::bad_alloc if `node` is null, because libplist returns null only when
 // there is no memory.
 Node created(Node node) {
   if (!node) throw std::bad_alloc();
@@ -128,8 +128,9 @@ Value dictionaryOf(plist_t node) {
   return Dictionary(std::move(pairs));
 }
 
-// Replaces malformed UTF-8 and the characters that XML 1.0 does not allow. XML does not allow
-// control characters even as references, except the tab, the line feed and the carriage return.
+// Puts replacement characters in place of malformed UTF-8 and of the characters that XML 1.0 does
+// not allow. XML does not allow control characters even as references, except the tab, the line
+// feed and the carriage return.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());

@@ -20,9 +20,9 @@ using Node = std::unique_ptr<std::remove_pointer_t<plist_t>, NodeFree>;
 /// "CF$UID".
 [[nodiscard]] Value valueOf(plist_t node);
 
-/// Converts `value` to a node that XML can express. Characters that XML does not allow become the
-/// replacement character. Dates are rounded down to whole seconds and limited to the years 1 to
-/// 9999.
+/// Converts `value` to a node that XML can express. Malformed UTF-8 and characters that XML does
+/// not allow become the replacement character. Dates are rounded down to whole seconds and limited
+/// to the years 1 to 9999.
 [[nodiscard]] Node nodeOf(const Value& value);
 
 }  // namespace onramp::libplist

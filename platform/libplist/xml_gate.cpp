@@ -81,8 +81,8 @@ class XMLWalk {
     return true;
   }
 
-  // Returns true when the `end` that skipPast() found is not between quotation marks and the
-  // skipped markup contains none of the characters in `refused`.
+  // Refuses the list when the `end` that skipPast() found is between quotation marks, or when the
+  // skipped markup contains one of the characters in `refused`. Returns true otherwise.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
       return refuse("markup with a quotation mark that is never closed", start_);
