@@ -67,10 +67,12 @@ configure_file(${packaging}/onramp.metainfo.xml.in ${generated}/example.onramp.p
 configure_file(${packaging}/changelog.in ${generated}/changelog @ONLY)
 install(FILES ${generated}/example.onramp.preview.metainfo.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/metainfo)
 install_compressed(${generated}/changelog ${documents})
-install(FILES ${packaging}/copyright ${packaging}/media-kit.md ${PROJECT_SOURCE_DIR}/README.md
-  DESTINATION ${documents})
-foreach(document IN ITEMS mastering-a-medium.md texts-and-languages.md support.md wizard.png)
-  install(FILES ${PROJECT_SOURCE_DIR}/docs/${document} DESTINATION ${documents}/docs)
+install(FILES ${packaging}/copyright DESTINATION ${documents})
+# The documents keep their places, because they link to each other.
+foreach(document IN ITEMS README.md ARCHITECTURE.md CONTRIBUTING.md RELIABILITY.md SECURITY.md docs/first-mac.md
+    docs/mastering-a-medium.md docs/texts-and-languages.md docs/support.md docs/wizard.png packaging/media-kit.md)
+  cmake_path(GET document PARENT_PATH folder)
+  install(FILES ${PROJECT_SOURCE_DIR}/${document} DESTINATION ${documents}/${folder})
 endforeach()
 
 set(CPACK_GENERATOR DEB TGZ)

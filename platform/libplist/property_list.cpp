@@ -4,7 +4,6 @@
 
 #include "platform/libplist/parse.h"
 #include "platform/posix/file.h"
-#include "platform/property_list.h"
 
 namespace onramp {
 

@@ -20,8 +20,11 @@ TYPES = {16: ["icp4"], 32: ["icp5", "ic11"], 64: ["ic12"], 128: ["ic07"], 256: [
 def main(icon, *pictures):
     entries = b""
     for picture in pictures:
-        data = pathlib.Path(picture).read_bytes()
-        width, height = struct.unpack(">II", data[16:24])
+        try:
+            data = pathlib.Path(picture).read_bytes()
+        except OSError as error:
+            sys.exit(f"icns.py: {picture}: {error.strerror}")
+        width, height = struct.unpack(">II", data[16:24].ljust(8, b"\0"))
         if data[:8] != b"\x89PNG\r\n\x1a\n" or width != height or width not in TYPES:
             sys.exit(f"icns.py: {picture}: not a square PNG picture with a side of "
                      f"{', '.join(map(str, TYPES))} pixels")

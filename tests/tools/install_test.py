@@ -24,12 +24,12 @@ class Install(unittest.TestCase):
             self.assertRegex(done.stdout, r"\b0 errors, 0 warnings\b[\s\S]*the medium's own[\s\S]*\d\.\d\.\d")
             subprocess.run([sys.executable, "-Bc", "import practice_network.namespace"],
                            cwd=prefix / "lib/onramp/tools", check=True)
-            guide = (prefix / "share/doc/onramp/media-kit.md").read_text(encoding="utf-8")
+            documents = prefix / "share/doc/onramp"
+            guide = (documents / "packaging/media-kit.md").read_text(encoding="utf-8")
             named = re.findall(r"\b(?:bin|lib/onramp|share/doc)/[-\w./]*\w", guide)
             self.assertGreater(len(named), 5)
-            documents = prefix / "share/doc/onramp/docs"
-            for page in documents.glob("*.md"):
-                named += [documents / link for link in re.findall(r"\]\(([\w./-]+)", page.read_text(encoding="utf-8"))]
+            for page in documents.rglob("*.md"):
+                named += [page.parent / link for link in re.findall(r"\]\(([\w./-]+)", page.read_text(encoding="utf-8"))]
             self.assertEqual([name for name in named if not (prefix / name).exists()], [])
 
 

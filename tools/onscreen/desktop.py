@@ -11,6 +11,26 @@ from .processes import Missing, start, stop, wait_for
 
 _SIZE = "1366x768"  # the smallest screen that the wizard must fit on
 _TWICE_THE_DENSITY = "2732x1536"
+# The programs, and the Debian packages that contain them.
+_PROGRAMS = {"Xvfb": "xvfb", "openbox": "openbox", "xprop": "x11-utils", "xdotool": "xdotool",
+             "import": "imagemagick", "mogrify": "imagemagick", "dbus-daemon": "dbus"}
+_ACCESSIBILITY_BUS = pathlib.Path("/usr/share/dbus-1/services/org.a11y.Bus.service")
+
+
+def check_packages():
+    """Raises Missing, which names the Debian packages, if something that a desktop or its user
+    needs is not installed."""
+    packages = {package for name, package in _PROGRAMS.items() if not shutil.which(name)}
+    if not _ACCESSIBILITY_BUS.exists():
+        packages.add("at-spi2-core")
+    try:
+        import gi
+        gi.require_version("Atspi", "2.0")
+    except (ImportError, ValueError):
+        packages |= {"python3-gi", "gir1.2-atspi-2.0"}
+    if packages:
+        raise Missing("the virtual display needs more packages; install them: apt-get install "
+                      + " ".join(sorted(packages)))
 
 
 def _free_display():
