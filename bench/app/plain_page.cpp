@@ -16,7 +16,7 @@ namespace {
 
 constexpr int kModels = 100;
 
-// Returns an object without an owner. Qt deletes the object together with its parent.
+// Returns a new object, which its Qt parent deletes.
 template <typename Child, typename... Arguments>
 Child* make(Arguments&&... arguments) {
   return std::make_unique<Child>(std::forward<Arguments>(arguments)...).release();

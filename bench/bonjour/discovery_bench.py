@@ -1,12 +1,13 @@
 #!/usr/bin/python3
 """Compares the wizard's discovery with avahi-browse on the same network in the same run.
 
-Measures 1 to 500 services on dual-stack networks with one interface and with two. Each measured
-time is from the start of a program until it prints the line about the last service that it
-resolves. The warm part has one host, whose Avahi daemon has all services in its cache. The cold
-part has two hosts joined by virtual cables. In that part, the Avahi daemon of the searching host is
-restarted before every search, so that its cache is empty. The warm part also prints the processor
-time of a search that keeps running after it has found everything.
+Measures up to 500 services on dual-stack networks with one interface and, without --quick, with
+two. Each measured time is from the start of a program until it prints the line about the last
+service that it resolves. The warm part has one host, whose Avahi daemon has all services in its
+cache. The cold part has two hosts joined by virtual cables. In that part, the Avahi daemon of the
+searching host is restarted before every search, so that its cache is empty. Without --json, the
+warm part also prints the processor time of a search that keeps running after it has found
+everything.
 """
 
 import argparse
@@ -37,8 +38,8 @@ IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """Returns the seconds from the start of `command` until it has named `count` services.
-    `name_of` returns the service that an output line names, or None."""
+    """Returns the seconds from the start of `command` until it has named `count` services, or until
+    its output ends. `name_of` returns the service that an output line names, or None."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:

@@ -1,1 +1,1 @@
-"""What all benchmarks use to report their figures, and what bench/compare makes of the reports."""
+"""What the benchmarks use to report their figures, and what bench/compare makes of the reports."""

@@ -1,4 +1,4 @@
-"""The one form in which every benchmark reports what it measured."""
+"""The form in which the parts of bench/compare report what they measured."""
 
 import argparse
 import dataclasses
@@ -36,13 +36,13 @@ def quartiles(values):
 
 
 def spread(values):
-    """Returns the distance of the quartiles as a part of the median, which is the noise."""
+    """Returns the noise: the distance between the quartiles as a part of the median."""
     low, middle, high = quartiles(values)
     return (high - low) / middle if middle else 0
 
 
 def with_unit(value, unit):
-    """Returns a value of "s" or "MiB" as a text with three digits that count."""
+    """Returns a value of "s" or "MiB" as a text with at most three significant digits."""
     for factor, name in _SCALES[unit]:
         if abs(value) >= factor:
             break
@@ -68,7 +68,7 @@ class Report:
         print(json.dumps(dataclasses.asdict(case)) if self._as_json else line(case), flush=True)
 
     def remark(self, text):
-        """Prints something that has no peer, for people only."""
+        """Prints a line for people. Prints nothing with --json."""
         if not self._as_json:
             print(text, flush=True)
 
@@ -79,10 +79,10 @@ def read(text):
 
 
 def parser(description, usage=None):
-    """Returns the parser of the options that every benchmark has."""
+    """Returns a parser with the options --json and --quick."""
     result = argparse.ArgumentParser(description=description, usage=usage,
                                      formatter_class=argparse.RawDescriptionHelpFormatter)
-    result.add_argument("--json", action="store_true", help="print a line of JSON for each case")
+    result.add_argument("--json", action="store_true", help="print the cases as JSON")
     result.add_argument("--quick", action="store_true", help="fewer rounds and sizes")
     return result
 

@@ -9,7 +9,8 @@ NOISE_ROW, NOISE_NAMES, NOISE_WIDTH = 20, 470, 920
 
 
 def cost(cases, axis):
-    """Returns an SVG with a panel for each benchmark that was measured along `axis`, or None.
+    """Returns an SVG with a panel for each benchmark that has at least two cases along `axis`.
+    Returns None if no benchmark has.
 
     Points are medians, and bars reach from the lower to the upper quartile. Both axes are
     logarithmic.
@@ -71,8 +72,7 @@ def _axes(x, y, unit, axis):
 
 
 def noise(cases):
-    """Returns an SVG with the spread of each case, which is the distance between the quartiles of
-    repetitions of the same thing as a part of their median."""
+    """Returns an SVG with two values for each case: spread() of ours and of the peer's values."""
     spreads = [(f"{case.benchmark}, {case.name}", spread(case.ours), spread(case.peer))
                for case in cases]
     most = max(0.05, *(max(ours, peer) for _, ours, peer in spreads))

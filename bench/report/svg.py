@@ -10,7 +10,7 @@ _DASHES = ("", "6 4")
 
 
 def _colours(number, ground, ink, faint):
-    """Returns the rules for one choice of colours, the `number`th of _SERIES."""
+    """Returns the CSS rules for light colours if `number` is 0, and for dark ones if it is 1."""
     series = "".join(f".stroke{index} {{ stroke: {pair[number]}; }} "
                      f".fill{index} {{ fill: {pair[number]}; }} "
                      for index, pair in enumerate(_SERIES))
@@ -18,7 +18,7 @@ def _colours(number, ground, ink, faint):
             f".grid {{ stroke: {faint}; }} {series}")
 
 
-# Classes instead of variables, because some programs that show SVG know no variables.
+# Classes instead of CSS variables, which some programs that show SVG do not know.
 _STYLE = f"""
 text {{ font: 12px sans-serif; }} .title {{ font-weight: bold; font-size: 13px; }}
 .line {{ fill: none; stroke-width: 2; }} .bar {{ stroke-width: 1.5; }}
@@ -77,7 +77,8 @@ class LogScale:
         return self._start + part * (self._end - self._start)
 
     def ticks(self):
-        """Returns the powers of ten in the range. If it is short, also their doubles and fivefolds."""
+        """Returns the powers of ten in the range. If the range is short, also returns the values
+        that are twice or five times a power of ten."""
         steps = (1,) if self._high - self._low > 2.2 else (1, 2, 5)
         powers = range(math.floor(self._low), math.ceil(self._high) + 1)
         values = (step * 10.0 ** power for power in powers for step in steps)

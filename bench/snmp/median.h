@@ -43,7 +43,7 @@ class Samples {
   std::vector<double> samples_;
 };
 
-/// Whether `argv` asks for JSON.
+/// Whether the last argument is --json.
 inline bool wantsJson(int argc, char** argv) {
   return argc > 1 && std::strcmp(argv[argc - 1], "--json") == 0;
 }

@@ -1,6 +1,9 @@
 #!/usr/bin/python3
-"""Compares the times that onramp-check takes for media of 10 to 10,000 models with the time that
-the same number of models would take at the cost of 1,000."""
+"""Measures how long onramp-check takes for media of 10 to 10,000 models.
+
+Some media have no mistakes in the lists of models. On the others, the lists differ in every name.
+Each time is compared with the time for 1,000 models, scaled to the same number of models.
+"""
 
 import pathlib
 import plistlib
@@ -60,7 +63,7 @@ def main():
             kind = "every name misspelt" if differs else "clean lists"
             for count, runs in times.items():
                 report.add(Case(f"onramp-check, {kind}", f"{count:,} models",
-                                f"at the cost of {BASE:,}", "s", runs,
+                                f"{BASE:,} models, scaled", "s", runs,
                                 [one * count / BASE for one in times[BASE]], axis="models",
                                 size=count))
 

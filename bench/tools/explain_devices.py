@@ -1,9 +1,9 @@
 #!/usr/bin/python3
 """Compares onramp-devices with avahi-browse on a small and on a large network.
 
-In each round, measures the time until onramp-devices has explained every device, and the time in
-which avahi-browse resolves the same devices. The peer's time is the latter plus the time of the
-slowest SNMP answer.
+In each round, measures the time until onramp-devices has explained every device, and the time until
+avahi-browse has resolved the same devices. The peer's time is the second of these times plus the
+time of the slowest snmpget, which is measured once for each size of the network.
 """
 
 import os

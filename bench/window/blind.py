@@ -1,4 +1,4 @@
-"""The wizard's chooser as a person uses it who has no assistive program.
+"""The wizard's chooser as used by a person who has no assistive program.
 
 While an assistive program may listen, Qt makes an object for a cell whenever the selected row
 changes, and never frees it. So whoever measures memory must not look through the accessibility bus.
@@ -22,7 +22,8 @@ def descriptors(process):
 class BlindChooser:
     """A context manager that starts the wizard and uses it without a look at the screen.
 
-    A search is recognised by the descriptors that the wizard has open only while it searches.
+    An earlier run of the wizard, which ends in the constructor, shows where the menu's button is. A
+    search is recognised by the descriptors that the wizard has open only while it searches.
     """
 
     def __init__(self, desktop, medium, text):

@@ -17,7 +17,7 @@ PROGRAM = "Onramp OSX.app/Contents/Linux/Onramp OSX"
 MAKER, MODEL = "Kestrel", "Model 100"
 GEAR, GEAR_REFRESH = "Actions", 2
 WAIT_SECONDS = 90  # for a search to end
-BEGIN_SECONDS = 5  # after which a search has begun, unless a device stops the wizard at once
+BEGIN_SECONDS = 5  # the longest wait to see that a search has begun
 
 
 def require_medium(folder):
@@ -70,13 +70,13 @@ class Chooser(Person):
         return self.sees("label", self._text["INST_WAIT"])
 
     def wait(self):
-        """Waits until the search has ended that go_there() or refresh() has just started."""
+        """Waits for the end of the search that go_there() or refresh() has just started."""
         if self._key:
             self._key.wait()
             until = time.monotonic() + BEGIN_SECONDS
             while not self.is_searching() and time.monotonic() < until:
                 time.sleep(0.02)
-        self._ask()  # which takes until the wizard answers again
+        self._ask()  # returns once the wizard answers again
         self.see_gone("label", self._text["INST_WAIT"], WAIT_SECONDS)
 
     def screen_coordinates(self):
@@ -87,7 +87,7 @@ class Chooser(Person):
         return self.see("tree").get_table_iface()
 
     def names(self):
-        """Returns the names of the listed devices, even of those that have to be scrolled to."""
+        """Returns the names of the listed devices, including those that are out of view."""
         table = self.table()
         names = []
         for row in range(table.get_n_rows()):

@@ -8,7 +8,7 @@ from chooser import MAKER, MODEL
 
 REST = 3          # seconds after which a device that left is in no cache
 STEADY = 4        # wireless devices that never leave
-AT_ONCE = 24      # devices that come and go and are there at the same time, at most
+AT_ONCE = 24      # the most devices, besides the steady ones, that are there at the same time
 _PAUSES = (0.2, 1.0)  # seconds between two changes of the network, at least and at most
 _BEHAVIOURS = (2, 2, 2, 2, 1, "missing", "text", "closed")
 

@@ -13,7 +13,7 @@ PATIENCE = 120  # seconds; longer than any silence that is measured
 
 @dataclasses.dataclass(frozen=True)
 class Silence:
-    """A time in which the main loop answered no request, without the waits for a processor."""
+    """A time in which the main loop answered no request. Waits for a processor do not count."""
 
     began: float      # time.monotonic()
     seconds: float
@@ -52,7 +52,7 @@ class Ear:
         return [one for one in self._silences if one.began >= since]
 
     def longest(self, since=0):
-        """Returns the longest of these silences, or None when there is none of at least NOTED."""
+        """Returns the longest of silences(since), or None if there is none."""
         return max(self.silences(since), key=lambda one: one.seconds, default=None)
 
 

@@ -3,9 +3,8 @@
 
 The wizard's time is that from the key press that starts a search until the list has all wireless
 devices. The tools' time is the time until avahi-browse has resolved the same devices, plus the time
-of one snmpget for each device. Neither time includes the pauses in which the wizard waits for its
-search. The search ends after its first pause, so a network is left out if a search does not find all
-of its devices.
+of one snmpget for each device. A search ends after its first pause of three seconds if a device is
+listed by then. If the list does not get all devices, this network and the larger ones are left out.
 """
 
 import os
@@ -26,7 +25,7 @@ from report.cases import Case, Report, parser
 
 COUNTS, QUICK_COUNTS = (1, 10, 50, 100, 200), (1, 50, 100)
 ROUNDS, QUICK_ROUNDS = 9, 5
-PATIENCE = 10  # seconds; a search of a wizard that finds anything ends earlier
+PATIENCE = 10  # seconds; a search that finds anything ends earlier
 TYPE = "_pdl-datastream._tcp"
 
 
@@ -53,7 +52,7 @@ def time_of_tools(count):
 def time_of_wizard(person, count):
     """Returns the time from a refresh, which empties the list, until the list has `count` rows.
 
-    Returns None if the search ends with fewer.
+    Returns None if the list has fewer rows PATIENCE seconds after the refresh.
     """
     table = person.table()
     began = person.refresh()

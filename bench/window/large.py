@@ -6,8 +6,8 @@ Usage: large.py [--medium MEDIUM] [devices] [models] [silent]
 MEDIUM is a built medium (default: build/medium of this source tree).
 
 devices  1,000 models and 500 devices
-models   10,000 models: the list of models, and then a search for all of them
-silent   a device that receives questions and answers none, which stops the window by design
+models   10,000 models: the list of models, and then a search with 50 devices
+silent   a device that receives questions and answers none; by design, the window waits for it
 
 For each, the program prints whether the list is as it must be, the times, the longest silence of
 the main loop, and the peak of the memory. It exits with status 1 if a list is wrong.
@@ -82,8 +82,8 @@ class Trial:
 
 
 def _seconds_until_listed(person, table, count, began):
-    """Returns the time since `began` until the list, which is emptied first, had `count` rows or the
-    search was over, and the list stopped growing."""
+    """Waits until the list, which is emptied first, has `count` rows or the search is over. Returns
+    the time from `began` to the last change of the list that was seen."""
     emptied = False
     last, changed = table.get_n_rows(), began
     for look in itertools.count():

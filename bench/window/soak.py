@@ -5,9 +5,9 @@ Usage: soak.py [--seconds 3600] [--seed 1] [--memory] [MEDIUM]
 
 MEDIUM is a built medium (default: build/medium of this source tree).
 
-After every search, the list must have at least the devices that were there all the time, and at
-most one row more for each device that came or went. At every checkpoint, the network rests, and the
-list must have exactly the wireless devices that are there, if need be after another search. The
+After every search, the list must have at least as many rows as wireless devices were there all the
+time, and at most one row more for each device that came or went. At every checkpoint, the network
+rests, and one of up to three searches must list exactly the wireless devices that are there. The
 program prints the wizard's memory at each checkpoint, the growth of this memory, and the longest
 silences of the wizard's main loop. It exits with status 1 if a list was wrong.
 
@@ -45,7 +45,7 @@ def memory(process):
 
 
 def slope(points):
-    """Returns the slope of the line that fits `points`, pairs of x and y, best."""
+    """Returns the slope of the line that best fits `points`, which are pairs of x and y."""
     middle_x, middle_y = (sum(values) / len(points) for values in zip(*points))
     square = sum((x - middle_x) ** 2 for x, _ in points)
     return sum((x - middle_x) * (y - middle_y) for x, y in points) / square if square else 0
@@ -104,7 +104,7 @@ class Soak:
         """Searches while the network rests, and compares the list with what is there.
 
         A search ends three seconds after its start if a device is listed. On a busy machine, other
-        devices may then be missing, so an incomplete list is only counted, and searched for again.
+        devices may then be missing. So an incomplete list is counted, and the search is repeated.
         """
         self._devices.rest()
         try:

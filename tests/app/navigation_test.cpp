@@ -17,8 +17,8 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 class Navigation : public Wizard {
  protected:
   /// Launches the wizard on a medium with `models` and goes to the connection page of the first
-  /// model. The models must differ in their support of USB or wired Ethernet, because the wizard
-  /// otherwise skips the list.
+  /// model. The models must differ in their support of USB or wired Ethernet, so that the wizard
+  /// does not skip the list.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
                               {"Cable", model(true, false, false)}}) {
@@ -240,7 +240,7 @@ TEST_F(Navigation, AToolStartedFromTheMenuKeepsTheChooserWhenItAsksToGoBack) {
   EXPECT_EQ(screen.log, (Strings{"hide", "unhide", "activate", "key and front"}));
 }
 
-TEST_F(Navigation, TheNotificationSetsTheLengthOfTheWaitsPauses) {
+TEST_F(Navigation, TheNotificationSetsTheLengthOfThePauses) {
   goToConnectionPage();
   delegate->showProgressAtChooseDeviceViewByRefresh(
       {.name = {}, .object = nullptr, .userInfo = {{std::string(kWaitTime), 7}}});

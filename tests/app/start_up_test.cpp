@@ -28,7 +28,7 @@ TEST_F(StartUp, ListsTheModelsInByteOrderWhenTheirConnectionsDiffer) {
   EXPECT_EQ(screen.log.back(), "key and front");
 }
 
-TEST_F(StartUp, SkipsTheListWhenAllModelsHaveTheSameConnectionsByCable) {
+TEST_F(StartUp, ChoosesTheFirstPageByTheModelsConnections) {
   const std::string wired =
       expectedConnectionPage("wiredLan.png", "INST_TXT_USB\nINST_TXT_ETHERNET");
   const std::string usb = expectedConnectionPage("usb.png", "INST_TXT_USB");
@@ -72,7 +72,7 @@ TEST_F(StartUp, OpensThePackageAtOnceWhenNoModelIsWireless) {
   }
 }
 
-TEST_F(StartUp, ShowsTheTitleThePictureAndTheMenuInTheUsersLanguage) {
+TEST_F(StartUp, ShowsTitleAndPictureAndTranslatesTheMenu) {
   describeTwoModels();
   medium.setEnvironment("LANG", "ja_JP.UTF-8");
   medium.write(
@@ -137,7 +137,7 @@ TEST_F(StartUp, RemovesTheFilesThatEarlierRunsLeft) {
   EXPECT_THAT(found, testing::UnorderedElementsAreArray(kept));
 }
 
-TEST_F(StartUp, StartsNoMatterWhatTheMediumLacks) {
+TEST_F(StartUp, CopesWithMissingAndInvalidFiles) {
   const std::string information = "Onramp OSX.app/Contents/Info.plist";
   const std::string missing = "missing";
   const std::string head = "<plist version=\"1.0\"><dict><key>";
@@ -181,7 +181,7 @@ TEST_F(StartUp, RunsWithoutThePagesWhoseInterfaceFilesAreMissing) {
   launch();
   EXPECT_EQ(page(), "");
   screen.click("rightMostButton");
-  EXPECT_TRUE(screen.terminated) << "without a page, every button quits";
+  EXPECT_TRUE(screen.terminated) << "without a page, the rightmost button quits";
 }
 
 Dictionary version(Value major, Value minor, Value bugFix) {

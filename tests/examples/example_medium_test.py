@@ -1,4 +1,7 @@
-"""Checks texts of the example medium, and runs its set-up tool. onramp-check does neither."""
+"""Checks that texts of the example medium agree, and runs its set-up tool.
+
+onramp-check does neither.
+"""
 
 import os
 import plistlib
@@ -17,7 +20,7 @@ from onscreen import messages  # noqa: E402
 
 
 class Messages(unittest.TestCase):
-    def test_every_description_calls_the_next_button_by_its_title(self):
+    def test_descriptions_call_the_next_button_by_its_title(self):
         for language in LANGUAGES:
             table = messages.read(MEDIUM, language)
             for key in ("INST_TXT_MODEL_DESC", "INST_TXT_CONNECTIONTYPE_DESC"):
@@ -25,7 +28,7 @@ class Messages(unittest.TestCase):
 
 
 class Medium(unittest.TestCase):
-    def test_the_set_up_tool_exits_with_the_status_in_the_variable_or_with_64(self):
+    def test_the_variable_sets_the_exit_status_of_the_set_up_tool(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
         for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):

@@ -16,8 +16,8 @@
 namespace onramp {
 namespace {
 
-// Expects that `work` throws an exception when an allocation fails, or returns what it returns
-// otherwise. The address sanitizer finds memory that is lost.
+// Expects that `work`, when one of its allocations fails, either throws std::bad_alloc or returns
+// the same as without the failure. The address sanitizer finds memory that is lost.
 template <typename Work>
 void failEveryAllocation(const Work& work) {
   const auto expected = work();

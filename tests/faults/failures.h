@@ -17,24 +17,25 @@ namespace onramp::faults {
 /// Which calls of the functions that system_calls.cpp replaces are to fail, and how.
 struct Failure {
   std::size_t first = 0;  ///< the number of the first call that fails, counted from 1
-  /// The value of `errno` after a call that fails. ENOMEM makes allocations fail and counts only
-  /// these; any other value makes system calls fail and counts only those.
+  /// The error number of a call that fails. ENOMEM makes allocations fail and counts only these.
+  /// Any other value makes the other functions fail and counts only those.
   int error = 0;
   bool isLasting = false;  ///< whether all later calls fail, too
 };
 
-/// Starts to count the calls of this thread and lets them fail.
+/// Starts to count this thread's calls, and makes those fail that `failure` says.
 void begin(const Failure& failure);
 
 /// Lets all calls succeed again. Returns the names of the functions that were called since begin(),
 /// in their order.
 std::vector<std::string> end();
 
-/// Calls `work` with its first call failing, then with its second, and so on until no call fails.
-/// Each failure is tried with each of `errors`, and once as one that lasts, which also keeps `work`
-/// from cleaning up, as if the process were killed. After each run, expects that no descriptor has
-/// been left open and calls `check` with the name of the first call that failed, which is empty in
-/// the last run, and with the failure. Returns the names of all calls.
+/// Calls `work` with its first call failing, then with its second, and so on until no call fails or
+/// the test has failed. Does this for each of `errors`, first with single failures and then, except
+/// for EINTR, with lasting failures. These also keep `work` from cleaning up, as if the process
+/// were killed. After each run, expects that no descriptor has been left open, and calls `check`
+/// with the name of the first call that failed and with the failure. The name is empty if no call
+/// failed. Returns the names of all calls.
 template <typename Work, typename Check>
 std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Work& work,
                                     const Check& check) {

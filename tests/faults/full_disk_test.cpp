@@ -10,7 +10,7 @@
 namespace onramp {
 namespace {
 
-TEST(FullDisk, KeepsTheOldFileAndNothingElse) {
+TEST(FullDisk, KeepsTheOldFileAndLeavesNoTemporaryFile) {
   const TemporaryFolder folder;
   const auto run = [&](const std::string& command) {
     EXPECT_EQ(std::system(("cd '" + folder / "' && " + command).c_str()), 0) << command;

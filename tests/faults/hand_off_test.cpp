@@ -57,7 +57,7 @@ TEST(AtomicWriting, AFailureLeavesTheOldFileAndRemovalDeletesLeftovers) {
 
 using Faults = Wizard;
 
-TEST_F(Faults, NeitherKeepTheWizardFromItsWayNorLeaveHalfAFile) {
+TEST_F(Faults, DoNotStopTheWizardOrLeaveHalfAFile) {
   describeTwoModels();
   const fs::path user = fs::path(medium.modelFilePath()).parent_path();
   const fs::path local = fs::path(medium.optionsFilePath()).parent_path();
@@ -95,7 +95,7 @@ TEST_F(Faults, NeitherKeepTheWizardFromItsWayNorLeaveHalfAFile) {
   });
 }
 
-TEST_F(Faults, WhenNoThreadCanStartTheMainLoopMakesThePausesOfTheWait) {
+TEST_F(Faults, TheMainLoopMakesThePausesOfTheWaitIfNoThreadCanStart) {
   describeTwoModels();
   launch();
   chooseModel("All");

@@ -1,4 +1,4 @@
-// No process, thread, descriptor or pipe is to be had.
+// What happens when the system refuses to make a process, a thread or a descriptor.
 
 #include <gtest/gtest.h>
 #include <signal.h>

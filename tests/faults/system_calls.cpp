@@ -1,5 +1,6 @@
 // Replaces functions of the C library and the allocation of memory, for the program that links this
-// file and for its libraries. Each function either fails or calls the one that it replaces.
+// file and for its libraries. Except for close and fsync, each function either fails or calls the
+// one that it replaces.
 
 #include <dirent.h>
 #include <dlfcn.h>
@@ -38,13 +39,14 @@ Function* original(const char* name) {
   return reinterpret_cast<Function*>(dlsym(RTLD_NEXT, name));
 }
 
-// Returns `failure` when the call is to fail, otherwise the result of the function.
+// Returns `failure` and sets `errno` when the call is to fail, otherwise returns the result of the
+// function.
 template <typename Result, typename... Parameters>
 Result call(const char* name, Result failure, Parameters... arguments) {
   const bool isFailing = fails(name);
   Result result{};
-  // Linux closes a descriptor even when it reports an error. Flushes would take most of the tests'
-  // time and change nothing that the tests see.
+  // Linux closes a descriptor even when it reports an error, so a close that fails closes, too. An
+  // fsync never flushes, which would take most of the tests' time and change nothing that they see.
   if ((!isFailing && std::string_view(name) != "fsync") || std::string_view(name) == "close") {
     result = original<Result(Parameters...)>(name)(arguments...);
   }

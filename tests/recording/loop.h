@@ -11,9 +11,9 @@ void resetLoop();
 /// Ends the loop and wakes every waiting thread.
 void endLoop();
 
-/// Runs posted actions until `done` returns true. When no action is left, waits for one. Gives up
-/// when `most` has passed during the wait, when the loop has ended or when abortModal() has been
-/// called. Returns what `done` returned last.
+/// Runs posted actions until `done` returns true. When no action is left, waits for one. Stops
+/// waiting and returns when `most` has passed since the call, when the loop has ended or when
+/// abortModal() has been called. Returns what `done` returned last.
 bool runPosted(const std::function<bool()>& done, std::chrono::duration<double> most);
 
 }  // namespace onramp::recording
