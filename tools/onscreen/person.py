@@ -248,7 +248,7 @@ class Person:
 
     def _visit(self, control, visit, tables=True):
         """Calls `visit` for `control` and all visible controls below it, until a call returns
-        False.
+        False. Does not call `visit` for the application itself.
 
         Goes depth first, skips controls that disappear, and enters tables only if `tables` is set.
         Returns False if a call returned False, otherwise True.

@@ -58,6 +58,7 @@ there is one table for each device:
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
                                    answers with a text. A list gives each address its own value.
+                                   IPv6 addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
     present = false                switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
