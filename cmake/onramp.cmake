@@ -19,6 +19,7 @@ if(ONRAMP_SANITIZE)
 endif()
 if(ONRAMP_FUZZ)
   add_compile_options(-fsanitize=fuzzer-no-link)
+  add_custom_target(fuzzers)
 endif()
 
 # onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room. Its files are
@@ -81,6 +82,7 @@ function(onramp_fuzz name)
   add_executable(${name} ${ARG_UNPARSED_ARGUMENTS})
   target_link_libraries(${name} PRIVATE onramp_options ${ARG_LINK})
   target_link_options(${name} PRIVATE -fsanitize=fuzzer)
+  add_dependencies(fuzzers ${name})
   file(MAKE_DIRECTORY ${CMAKE_CURRENT_BINARY_DIR}/${name}-found)
   add_test(NAME ${name}
     COMMAND ${name} -runs=100000 -max_total_time=20 -timeout=5 -print_final_stats=1

@@ -107,9 +107,9 @@ def idle(interfaces, probe, report):
         search.wait_for("update", "Kestrel 1")
         time.sleep(IDLE_SECONDS)
         search.end()
-        report.remark(f"search of {COUNTS['warm'][-1]} services, left idle for {IDLE_SECONDS} s, "
-                      f"{interfaces} interface(s): {processor_seconds() - before:.3f} s of "
-                      "processor time, including start and discovery")
+        report.remark(f"search of all services, left idle for {IDLE_SECONDS} s, {interfaces} "
+                      f"interface(s): {processor_seconds() - before:.3f} s of processor time, "
+                      "including start and discovery")
 
 
 def run_inside(state, interfaces, arguments):

@@ -30,7 +30,7 @@ from onscreen.processes import wait_for
 from practice_network import PracticeNetwork
 
 SEARCHES = 3
-LOOKS_AT_ALL = 25  # of so many looks at the list, one is at the whole window
+LOOKS_AT_ALL = 25  # one look in so many is at the whole window, the others only at the list
 
 
 class Trial:

@@ -7,9 +7,10 @@ MEDIUM is a built medium (default: build/medium of this source tree).
 
 After every search, the list must have at least as many rows as wireless devices were there all the
 time, and at most one row more for each device that came or went. At every checkpoint, the network
-rests, and one of up to three searches must list exactly the wireless devices that are there. The
-program prints the wizard's memory at each checkpoint, the growth of this memory, and the longest
-silences of the wizard's main loop. It exits with status 1 if a list was wrong.
+rests, and one of up to three searches must list exactly the wireless devices that are there. None
+of these searches may list another device. The program prints the wizard's memory at each
+checkpoint, the growth of this memory, and the longest silences of the wizard's main loop. It exits
+with status 1 if a list was wrong.
 
 With --memory, nothing looks at the lists or listens to the main loop. Only then is the memory that
 of the wizard alone: while an assistive program may listen, Qt never frees what it makes for a cell.
@@ -33,7 +34,7 @@ from practice_network import PracticeNetwork
 
 CHECKPOINT_EVERY = 10  # searches
 SEARCHES_AT_CHECKPOINT = 3  # at most
-WARM_UP = 0.1          # the part of the time that is left out of the growth
+WARM_UP = 0.1          # the growth leaves out this part of the time, at the start
 
 
 def memory(process):

@@ -23,7 +23,7 @@ struct Failure {
   bool isLasting = false;  ///< whether all later calls fail, too
 };
 
-/// Starts to count this thread's calls, and makes those fail that `failure` says.
+/// Starts to count this thread's calls, and makes some of them fail as `failure` says.
 void begin(const Failure& failure);
 
 /// Lets all calls succeed again. Returns the names of the functions that were called since begin(),

@@ -17,8 +17,11 @@ class Texts(dict):
 
 
 def _fitness(offered, wanted):
-    """Returns how well the language `offered` suits a user who wants `wanted`, from 0 to 3. 3 means
-    the same language, and 0 means a language that the user does not read."""
+    """Returns how well the language `offered` suits a user who wants `wanted`.
+
+    3 means the same name, 2 the same language without a region, 1 the same language with a region,
+    and 0 a language that the user does not read.
+    """
     offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
                        for name in (offered, wanted))
     if offered == wanted:
@@ -56,8 +59,8 @@ def read(medium, language):
 
 
 def read_table(table):
-    """Returns the texts of a strings file, which may be text in UTF-8 or UTF-16 or a property list.
-    Returns no texts if the file is missing or damaged."""
+    """Returns the texts of a strings file, which may be text in UTF-8 or UTF-16, or a property
+    list. Returns no texts if the file is missing or is a damaged property list."""
     data = table.read_bytes() if table.exists() else b""
     if data.startswith((b"<?xml", b"bplist")):
         try:

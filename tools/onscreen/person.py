@@ -16,7 +16,7 @@ _COLUMNS = 3
 
 
 def _is(control, role, name):
-    """Returns whether the control has the role and the name. The name None matches every control.
+    """Returns whether the control has the role and the name. If `name` is None, any name will do.
 
     A heading counts as a label, too. The accessible name of a row's first cell may end with a comma
     and the row's address, which `name` leaves out.
@@ -36,8 +36,6 @@ def _words(role, name):
 class Person:
     """A person who uses one program. Creating the object starts the program on a desktop, and
     leaving the object's context ends it.
-
-    Most methods use the program as a person does.
     """
 
     follows_desktop = True  # whether the program uses the desktop's text size, scale and colours
@@ -81,7 +79,7 @@ class Person:
                  f"{_words(role, name)} to disappear")
 
     def everything(self):
-        """Returns the tuple (role, name, control) of every control on the screen, in a list."""
+        """Returns a list with the tuple (role, name, control) of every control on the screen."""
         found = []
         self._visit(self._application(), lambda c: found.append(
             (c.get_role_name(), c.get_name(), c)))
@@ -193,8 +191,8 @@ class Person:
         """Returns the seconds that the program takes to answer a small request on the accessibility
         bus.
 
-        The time during which the program and this process wait for a processor does not count.
-        Returns None when the program has ended.
+        The time during which the program and this process wait for a processor does not count. If
+        the request fails, returns the time until the failure, or None when the program has ended.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -250,7 +248,7 @@ class Person:
 
     def _visit(self, control, visit, tables=True):
         """Calls `visit` for `control` and all visible controls below it, until a call returns
-        False.
+        False. Does not call `visit` for the application itself.
 
         Goes depth first, skips controls that disappear, and enters tables only if `tables` is set.
         Returns False if a call returned False, otherwise True.

@@ -1,6 +1,6 @@
 """A network of made-up printers and scanners, inside namespaces of the kernel.
 
-Tests that run inside the network use PracticeNetwork to change its devices.
+Programs that run inside the network use PracticeNetwork to change its devices.
 """
 
 from practice_network.control import ControlError, PracticeNetwork

@@ -39,7 +39,8 @@ class Agents:
         self._by_device = {}
 
     def start(self, devices):
-        """Starts the agents of `devices` in parallel, and returns when all of them listen."""
+        """Starts the agents of `devices` in parallel, and returns when all of them listen. IPv6
+        addresses get no agent."""
         awaited = []
         for device in devices:
             handles = self._by_device[device.name] = []

@@ -58,12 +58,13 @@ there is one table for each device:
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
                                    answers with a text. A list gives each address its own value.
+                                   IPv6 addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
     present = false                switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
 inside the network, these commands show and change the devices while COMMAND runs. KEY=VALUE is an
-entry as in the file:
+entry as in the file, but a text needs no quotes:
     practice-network ctl list                         prints the devices, with their states
     practice-network ctl add NAME [KEY=VALUE ...]     switches on a known device, or adds a new one
     practice-network ctl set NAME KEY=VALUE ...       changes a device, such as: activeif=silent
@@ -72,7 +73,7 @@ entry as in the file:
     practice-network ctl unplug INTERFACE             takes an interface down
     practice-network ctl plug INTERFACE               brings the interface back
     practice-network ctl stop-daemon | start-daemon | restart-daemon      controls Avahi
-    practice-network ctl settle                       waits until all devices are published
+    practice-network ctl settle                       waits until the devices are published
 PracticeNetwork in tools/practice_network offers these commands to Python tests. ctl and
 PracticeNetwork find the network through the environment variable ONRAMP_PRACTICE_SOCKET.
 
@@ -81,9 +82,10 @@ do by default. Abstract sockets and TCP connections to the X server do not work 
 XDG_RUNTIME_DIR is a new folder. The session bus, Wayland and the accessibility bus of your
 desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
-exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND; 2 for a bad description or
-command line, 77 if this machine cannot create namespaces, 125 if the network did not start or ended
-before COMMAND, 126 or 127 if COMMAND could not be run.
+exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND or the tool; 2 for a bad
+description or command line, 77 if namespaces cannot be created, 125 if the network did not start or
+ended before COMMAND, 126 or 127 if COMMAND could not be run. ctl returns 0 if the network did what
+was asked, 1 if not, and 2 for a bad command line.
 """
 
 

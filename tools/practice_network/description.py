@@ -76,8 +76,8 @@ def address_count(addresses):
 
 
 def load(path):
-    """Returns the settings and the list of devices in a description file. Raises
-    DescriptionError."""
+    """Returns the settings and the list of devices in a description file. Raises DescriptionError
+    if the file cannot be read or has a mistake."""
     try:
         with open(path, "rb") as file:
             content = tomllib.load(file)

@@ -1,4 +1,4 @@
-"""Runs the network in namespaces. Nothing leaks out of them, and they end with the tool."""
+"""Runs the network in namespaces, which end with the tool."""
 
 import json
 import os
@@ -119,8 +119,7 @@ def devices(options):
 
 
 def _own_run(user):
-    """Takes over /run. Returns the environment variables for the command, which refer to the new
-    /run."""
+    """Takes over /run. Returns the command's environment, which refers to the new /run."""
     variables = {SOCKET_VARIABLE: str(RUN / "socket"), "DBUS_SYSTEM_BUS_ADDRESS": BUS_ADDRESS,
                  "XDG_RUNTIME_DIR": str(RUN / "user")}
     authority = pathlib.Path(os.environ.get("XAUTHORITY", "/nowhere"))

@@ -109,7 +109,7 @@ class Publisher:
 
     def state(self, device):
         """Returns "established" if both groups of the device are established, otherwise the state
-        of a group that is not."""
+        of a group that is not. A device without groups, or without Avahi, is "withdrawn"."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"

@@ -3,8 +3,8 @@
 
 Usage: crowded.py MEDIUM COPY
 
-The copy has 500 models, some with long names, and a made-up language, "art", whose texts are 40 %
-longer than the German ones. An existing COPY is replaced.
+The copy has at least 500 models, some with long names, and a made-up language, "art", whose texts
+are about 40 % longer than the German ones. An existing COPY is replaced.
 """
 
 import pathlib

@@ -1,7 +1,7 @@
-"""What a medium holds, as the wizard reads it.
+"""The facts about a medium.
 
-onramp-check, which reads media with the wizard's own code, provides it. The environment variable
-ONRAMP_CHECK names that program; without it, the release build's is used.
+They come from onramp-check, which reads media with the wizard's own code. The environment variable
+ONRAMP_CHECK names that program. Without the variable, the release build's is used.
 """
 
 import dataclasses
@@ -52,15 +52,16 @@ class Facts:
         said = json.loads(done.stdout)
         self.start = said["start"]  # "package", "connection type" or "model list"
         self.models = [Model(**model) for model in said["models"]]
-        self.texts = {one["name"]: one["texts"] for one in said["languages"]}  # how many of them
+        # The number of texts in each language.
+        self.texts = {one["name"]: one["texts"] for one in said["languages"]}
         self.findings = said["findings"]
 
     def names(self):
         return [model.name for model in self.models]
 
     def kinds(self):
-        """Returns one model for each combination of connections, if possible one that a device can
-        announce: a name of a maker, a space and a model."""
+        """Returns one model for each combination of connections, if possible one whose name a
+        device can announce: a maker, a space and a model."""
         chosen = {}
         for model in self.models:
             known = chosen.get(model.kind)
@@ -75,6 +76,7 @@ class Facts:
         return " ".join(said)
 
     def without_tool(self):
-        """Returns what users see because there is no wireless set-up tool; "" if there is one."""
+        """Returns what users see because the medium names no wireless set-up tool, or names a file
+        instead of an application's folder. Returns "" otherwise."""
         return next((finding["effect"] for finding in self.findings
                      if finding["id"] in ("tool-none", "tool-no-bundle")), "")

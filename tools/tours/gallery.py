@@ -1,4 +1,4 @@
-"""Takes pictures of every page in every language, and in several sizes and colour schemes."""
+"""Takes pictures of every page in several languages, sizes and colour schemes."""
 
 import contextlib
 import pathlib
@@ -33,7 +33,7 @@ _SCHEMES = {"light": {}, "dark": _DARK, "contrast": _CONTRAST}
 
 
 def settings(scheme, points):
-    """Returns a desktop's settings file for that colour scheme and text size."""
+    """Returns a desktop's settings file for a colour scheme and a text size in points."""
     lines = ["[General]", f"font=Sans Serif,{points},-1,5,50,0,0,0,0,0"]
     for group, (background, text) in _SCHEMES[scheme].items():
         lines += [f"[Colors:{group}]", f"BackgroundNormal={background}",
@@ -59,8 +59,8 @@ def all_looks(follows_desktop):
 
 
 def take_all(folder, pictures, network):
-    """Takes the pictures of the medium in `folder` on a practice network without devices. Returns the
-    exit status."""
+    """Takes the pictures of a crowded copy of the medium in `folder`. `network` is a practice
+    network without devices. Returns the exit status."""
     pictures = pathlib.Path(pictures)
     for old in pictures.glob("*.png"):
         old.unlink()
@@ -84,7 +84,8 @@ class Gallery:
         self._network = network
 
     def take(self, model, service_type, version):
-        """Takes all pictures. The search finds devices of `model`; `version` is not supported."""
+        """Takes all pictures. The search finds devices of `model`. `version` is a system that the
+        medium does not support, or None."""
         self._add_devices(model, service_type)
         with tempfile.TemporaryDirectory() as folder:
             for look in all_looks(Person.follows_desktop):

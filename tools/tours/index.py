@@ -23,9 +23,9 @@ pre { overflow: auto; background: var(--soft); padding: .7em; border-radius: 8px
 
 
 def write(folder, medium, findings, albums):
-    """Writes index.html in `folder`: `findings` of onramp-check, then a part for each language.
+    """Writes index.html in `folder`: the `findings` of onramp-check, then a part for each language.
 
-    `albums` are the contents of albums.
+    `albums` has the `content` of each Album.
     """
     title = _text(f"The wizard of {medium}")
     lines = ['<!DOCTYPE html>', '<html lang="en">', '<meta charset="utf-8">',

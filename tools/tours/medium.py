@@ -1,4 +1,4 @@
-"""A medium as the user of one language meets it."""
+"""A medium, with its texts in one language."""
 
 import os
 import pathlib
@@ -15,7 +15,7 @@ _PROGRAM = "Contents/Linux/Onramp OSX"
 class Medium:
     """A medium's folder with the application on it, its `facts`, and its texts in one language.
 
-    The language is `language`, or the one in which the user reads the medium.
+    The language is `language` or, if that is None, the one that the wizard chooses for the user.
     """
 
     def __init__(self, folder, facts, language=None):
@@ -52,7 +52,7 @@ class Medium:
 
     @property
     def service_type(self):
-        """The service type that the wizard looks for, without its closing dot; "" without one."""
+        """The service type that the wizard looks for, without the closing dot; "" for none."""
         return _text(self._resources, "BonjourNetwork", "").rstrip(".")
 
     def oldest_system(self):
@@ -89,7 +89,7 @@ class Medium:
 
 
 def _read(path):
-    """Returns a property list's dictionary. One that cannot be read is empty, as for the wizard."""
+    """Returns the dictionary in a property list, or an empty one if the list cannot be read."""
     try:
         content = plistlib.loads(path.read_bytes())
     except Exception:  # plistlib's errors have nothing in common
@@ -103,7 +103,7 @@ def _text(content, key, default):
 
 
 def _number(value):
-    """Returns the number that the wizard reads: a text's leading digits count."""
+    """Returns the number that the wizard reads: a number itself, a text's leading digits, or 0."""
     if isinstance(value, str):
         digits = len(value) - len(value.lstrip("0123456789"))
         return int(value[:digits] or 0)

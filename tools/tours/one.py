@@ -1,4 +1,4 @@
-"""Takes the tour in one language, in a process of its own: it can use only one desktop."""
+"""Takes the tour in one language. Each tour has its own process, which can use only one desktop."""
 
 import json
 import pathlib

@@ -5,7 +5,7 @@ from onscreen.processes import wait_for
 from .visit import CONNECTION, DEVICES, GEAR_REFRESH, WentWrong
 
 _SEARCHES = 3  # on a busy machine, the first search may be in vain
-_LONGEST_SEARCH = 75  # seconds; the wizard waits 15, but the machine may be busy
+_LONGEST_SEARCH = 75  # seconds; the wizard pauses for at most 15, but the machine may be busy
 _LONGEST_NAME = 63  # bytes; a DNS label holds no more
 
 
@@ -18,7 +18,7 @@ class Devices:
         self._entries = {}
 
     def make(self, models):
-        """Makes two wireless devices of each model, and one of the first that is on a cable."""
+        """Makes two wireless devices of each model, and a wired device of the first model."""
         for number, model in enumerate(models):
             self._add(model, model)
             self._add(model, second_of(model))
@@ -58,7 +58,8 @@ def matches_devices(model):
 
 
 def find_devices(visit, medium, step=None):
-    """Searches from the connection page until devices are listed. `step` names a picture of that."""
+    """Searches from the connection page until devices are listed. Raises WentWrong if none are. If
+    `step` is set, it names a picture of the first search."""
     for number in range(_SEARCHES):
         visit.next()
         wait_for(lambda: visit.person.sees("progress bar"), 20, "the search to begin")

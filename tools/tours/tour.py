@@ -5,7 +5,7 @@ from .search import Devices, find_devices, matches_devices, search_in_vain, seco
 from .visit import ALERT, CONNECTION, MODELS, Visit, WentWrong
 
 
-_MODELS_AT_ONCE = 3  # of which devices are made up when the wizard lists the devices of all models
+_MODELS_AT_ONCE = 3  # how many models get made-up devices when the wizard has no model list
 _UNMATCHED = ("No device can announce the name of this model, because the name is not a maker, a space "
               "and a model. The tour leaves out the wireless way.")
 
@@ -27,7 +27,7 @@ class Tour:
         self._options = list(options)
 
     def take(self):
-        """Takes the whole tour. What goes wrong in one section does not keep it from the next."""
+        """Takes the whole tour. When one section goes wrong, the tour goes on with the next."""
         self._section("Menu and About", "menu", self._menu)
         if self._first in (CONNECTION, MODELS):
             self._models()
@@ -74,13 +74,14 @@ class Tour:
         visit.picture("2-about", "The About panel")
 
     def _take_a_supported_system(self):
-        """Goes on with the oldest supported system, unless the options name a system."""
+        """Goes on with the oldest supported system, unless the options name a system or the medium
+        does not say which is the oldest."""
         oldest = self._medium.oldest_system()
         if any(option.startswith("--system-version") for option in self._options) or not oldest:
             self._album.note("The medium does not support this system, so there is no page.")
             return
-        self._album.note(f"The medium does not support macOS 10.15.7, which the preview assumes, so "
-                         f"the tour goes on with macOS {oldest}.")
+        self._album.note("The medium does not support the version of macOS that the preview "
+                         f"assumes, so the tour goes on with macOS {oldest}.")
         self._options += ["--system-version", oldest]
         with self._visit() as visit:
             self._first = visit.first_page()

@@ -10,7 +10,8 @@ from .person import Person
 
 GEAR_REFRESH = 2
 MODELS, CONNECTION, DEVICES, ALERT = "model list", "connection page", "device list", "alert"
-# How a page is recognised whatever its texts are: the roles of which one is on no other page.
+# The roles by which a page is recognised, whatever its texts are. The page has a control of one of
+# these roles, and no other page has one.
 _ROLES = {MODELS: ("list",), CONNECTION: ("radio button",), DEVICES: ("tree", "tree table", "table"),
           ALERT: ("alert",)}
 _TITLES = {MODELS: "INST_TXT_MODEL", CONNECTION: "INST_TXT_CONNECTIONTYPE",
@@ -26,7 +27,7 @@ class WentWrong(Exception):
 def choose_model(person, models, model):
     """Chooses a model with the keyboard. `models` are all models on the medium."""
     person.see("list item")
-    # The list is sorted by the models' codes. Should it differ, single steps lead to the model.
+    # The list should be in the order of Unicode. If it is not, single steps lead to the model.
     steps = sorted(models).index(model) - sorted(models).index(_selected_model(person))
     if steps:
         person.press(*["Down" if steps > 0 else "Up"] * abs(steps))
@@ -129,7 +130,8 @@ class Visit:
     def see_package_open(self, files, way):
         """Waits for the wizard to end, and compares what it left with what it should leave.
 
-        `way` says how the user came here, such as "By cable".
+        `files` is the number of files that the wizard should write for the package. `way` says how
+        the user came here, such as "By cable".
         """
         status = self._end()
         if status:

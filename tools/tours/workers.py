@@ -20,8 +20,8 @@ _AT_A_TIME = 3  # a search is mostly waiting
 
 
 def run(arguments, on_network=True, **options):
-    """Runs the tour with `arguments`, if wanted on a practice network without devices. Returns the
-    finished process."""
+    """Runs the tour with `arguments`. With `on_network`, runs it on a practice network without
+    devices. Returns the finished process."""
     network = [sys.executable, _TOOLS / "practice-network", "/dev/null"] if on_network else []
     return subprocess.run([*network, sys.executable, _TOOLS / "tour", *arguments], **options)
 
@@ -29,7 +29,8 @@ def run(arguments, on_network=True, **options):
 def take_tours(medium, original, pictures, languages, options):
     """Takes the tours and writes the index. Returns the exit status.
 
-    `original` is the folder that onramp-check reads: `medium`, or that to which its links lead.
+    `original` is the folder that onramp-check reads: `medium`, or the folder to which the links in
+    `medium` lead.
     """
     began = time.monotonic()
     facts = Facts(original)
@@ -73,7 +74,8 @@ def _chosen(languages, medium):
 
 
 def _take_one(order):
-    """Runs one tour, and prints what it says when it has ended, so that tours do not mix."""
+    """Runs one tour. Prints the tour's output after its end, so that the output of tours does not
+    mix."""
     done = run([INSIDE, json.dumps(order)], order["has_network"],
                stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True)
     print(f"\n{done.stdout}", end="", flush=True)
