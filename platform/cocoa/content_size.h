@@ -4,10 +4,10 @@
 
 namespace onramp::cocoa {
 
-/// Makes `window` as large as its contents need, up to the size of the screen, and makes room for
-/// the contents inside it. The window never shrinks, and its middle stays in place as far as the
-/// screen allows. Call this after every change of a text or of the visible views. Does nothing when
-/// `window` is nil.
+/// Makes `window` as large as its contents need, up to the size of the screen. The window never
+/// shrinks, and its middle stays in place as far as the screen allows. Also arranges the contents,
+/// as described below. Call this after every change of a text or of the visible views. Does nothing
+/// when `window` is nil.
 ///
 /// A text field that is attached to the top of the view that contains it grows downwards. Any other
 /// text field grows upwards. To make room for it, a list in the same view first gets shorter, down

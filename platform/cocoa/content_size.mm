@@ -227,8 +227,8 @@ void growFields(NSView* view) {
   }
 }
 
-// Returns the place nearest to `start` where a stretch of this length begins, if the stretch must
-// be between `least` and `greatest`. Returns `least` if the stretch is too long.
+// Returns the place nearest to `start` where a stretch of `length` can begin, so that it lies
+// between `least` and `greatest`. Returns `least` if there is no such place.
 CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat length) {
   return std::max(least, std::min(std::floor(start), greatest - length));
 }

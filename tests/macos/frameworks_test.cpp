@@ -155,7 +155,7 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndCanBeReleasedByItsClient)
 
   EXPECT_TRUE(service->resolveWithTimeout(std::chrono::seconds(5)));
   EXPECT_TRUE(service->addressing().empty() && !service->txtData())
-      << "the addresses or the TXT data of the previous resolve are still there";
+      << "a new resolve drops the addresses and the TXT data of the previous one";
   seen.service = std::move(service);
   error.error = kNetServiceErrorTimeout;
   native->client(native, &error, native->info);

@@ -19,8 +19,8 @@ from media import model
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TOUR = pathlib.Path(__file__).resolve().parents[2] / "tools/tour"
-# A device's model name has a space between the maker and the model. No device has a name like these, so
-# the tour is the same with and without a network.
+# The wizard puts a space between a device's maker and its model. So no device is of one of these models,
+# and the tour is the same with and without a network.
 MODELS = {"Ä/1": model(usb=True, wireless=True), "a-1": model(wireless=True), "Cable": model(usb=True)}
 
 

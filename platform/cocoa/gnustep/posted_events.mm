@@ -1,6 +1,6 @@
-// Makes a posted event wake the main loop, as on macOS. A GNUstep loop runs its timers and delayed
-// messages and then waits for input. If a timer or message has posted an event, the loop does not
-// notice the event until some input arrives.
+// Makes a posted event wake the main loop, as on macOS. A GNUstep loop first runs its timers and
+// delayed messages, then it waits for input. If a timer or message has posted an event, the loop
+// does not notice the event until some input arrives.
 
 #include <sys/eventfd.h>
 
