@@ -1,7 +1,7 @@
 #!/usr/bin/python3
 """Measures how long onramp-check takes for media of 10 to 10,000 models.
 
-Some media have no mistakes in the lists of models. On the others, the lists differ in every name.
+On some of the media, the two lists of models agree. On the others, they differ in every name.
 Each time is compared with the time for 1,000 models, scaled to the same number of models.
 """
 

@@ -4,8 +4,8 @@
 
 #include <functional>
 
-/// Holds a function. An object of this class can be the target of a control, a menu item, a timer
-/// or performSelectorOnMainThread:. Each of them calls the function through perform:.
+/// Holds a function, which perform: calls. So an object of this class can be the target of a
+/// button, a menu item or a timer.
 @interface OnrampAction : NSObject {
   std::function<void()> _function;
 }

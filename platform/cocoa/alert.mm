@@ -26,7 +26,7 @@
          returnCode:(NSInteger)returnCode
         contextInfo:(void*)contextInfo {
   [self autorelease];
-  // Code outside this file may also end the sheet, with a return code that belongs to no button.
+  // Code outside this file can also end the sheet, with a return code that belongs to no button.
   _didEnd(returnCode == NSAlertSecondButtonReturn ? onramp::kAlertOtherReturn
                                                   : onramp::kAlertDefaultReturn);
 }
@@ -65,7 +65,7 @@ void beginAlertSheet(const AlertSheet& sheet, const Window& window,
   const Retained<NSAlert> alert = makeAlert(sheet.title, sheet.message);
   [alert.get() addButtonWithTitle:toNSString(sheet.defaultButton)];
   [alert.get() addButtonWithTitle:toNSString(sheet.otherButton)];
-  // Lets the user quit or log out while the sheet is shown.
+  // Without this call, AppKit would refuse to quit while the sheet is shown.
   [[alert.get() window] setPreventsApplicationTerminationWhenModal:NO];
   [alert.get() beginSheetModalForWindow:cocoa::nativeOf<NSWindow>(window)
                           modalDelegate:[[OnrampSheetEnd alloc] initWithFunction:std::move(didEnd)]

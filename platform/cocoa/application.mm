@@ -7,8 +7,8 @@
 #import "platform/cocoa/retained.h"
 #include "platform/termination.h"
 
-/// The delegate of the application and of its window. Passes their events and questions to the
-/// controller.
+/// The delegate of the application and of its window. Passes most of their events and questions to
+/// the controller.
 @interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
   onramp::ApplicationDelegate* _delegate;
   onramp::Window _window;

@@ -5,13 +5,14 @@
 namespace onramp::cocoa {
 
 /// Makes `window` as large as its contents need, up to the size of the screen. The window never
-/// shrinks, and its middle stays in place as far as the screen allows. Call this after every change
-/// of a text or of the visible views. Does nothing when `window` is nil or everything fits.
+/// shrinks, and its middle stays in place as far as the screen allows. Also arranges the contents,
+/// as described below. Call this after every change of a text or of the visible views. Does nothing
+/// when `window` is nil.
 ///
-/// Text fields grow downwards if they hang on the top of the view that contains them, and upwards
-/// if they stand on its bottom. A list beside them gets lower before the window gets higher. The
-/// buttons directly inside the window's content view stand in a row, and their order in the
-/// interface file is that from left to right.
+/// A text field that is attached to the top of the view that contains it grows downwards. Any other
+/// text field grows upwards. To make room for it, a list in the same view first gets shorter, down
+/// to six rows. Only then does the window get taller. The buttons directly inside the window's
+/// content view form a row. The interface file must list them from left to right.
 void fitWindow(NSWindow* window);
 
 }  // namespace onramp::cocoa

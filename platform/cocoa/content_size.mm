@@ -11,7 +11,7 @@ namespace {
 constexpr CGFloat kUnlimited = 1e6;
 constexpr CGFloat kRoomBesideTitle = 10;
 constexpr CGFloat kButtonGap = -2;  // AppKit draws a push button smaller than its frame
-constexpr CGFloat kLeastGap = 8;    // between what hangs on the top and what stands on the bottom
+constexpr CGFloat kLeastGap = 8;    // between the views at the top and those at the bottom
 constexpr CGFloat kScrollerRoom = 20;
 constexpr NSInteger kLeastRows = 6;
 
@@ -23,13 +23,14 @@ bool fillsHeight(NSView* view) {
   return ([view autoresizingMask] & NSViewHeightSizable) != 0;
 }
 
-// Returns whether views inside `view` may be found and laid out. Other views lay out their contents
-// themselves.
+// Returns whether fitWindow() lays out the views inside `view`. Controls and scroll views lay out
+// their contents themselves.
 bool isContainer(NSView* view) {
   return ![view isKindOfClass:[NSControl class]] && ![view isKindOfClass:[NSScrollView class]];
 }
 
-// Moves or resizes a view and has it drawn again, but only if the frame is a new one.
+// Moves or resizes `view`, and has the view that contains it drawn again. Does nothing if `view`
+// already has this frame.
 void setFrame(NSView* view, NSRect frame) {
   if (NSEqualRects(frame, [view frame])) return;
   [view setFrame:frame];
@@ -41,7 +42,8 @@ class ButtonRow {
  public:
   explicit ButtonRow(NSView* content) : content_(content) {}
 
-  /// Returns the width that the content view lacks for the visible buttons.
+  /// Returns the width that the content view lacks for the visible buttons. The result is negative
+  /// if the content view is wider than necessary.
   [[nodiscard]] CGFloat missingWidth() const {
     CGFloat needed = leftEdge() + NSWidth([content_ bounds]) - rightEdge();
     CGFloat gap = 0;
@@ -53,7 +55,8 @@ class ButtonRow {
     return needed - NSWidth([content_ bounds]);
   }
 
-  /// Places the visible buttons beside each other, from both edges.
+  /// Places the visible buttons side by side, some from the left edge and the others from the right
+  /// edge.
   void layOut() const {
     CGFloat left = leftEdge();
     CGFloat right = rightEdge();
@@ -88,7 +91,7 @@ class ButtonRow {
     setFrame(button, frame);
   }
 
-  // The outermost buttons keep the row's edges even when they are hidden.
+  // The row's edges are those of its outermost buttons, even if these buttons are hidden.
   [[nodiscard]] CGFloat leftEdge() const {
     CGFloat edge = NSWidth([content_ bounds]);
     for (NSView* view in [content_ subviews]) {
@@ -108,7 +111,7 @@ class ButtonRow {
   NSView* content_;
 };
 
-// Returns the width that the cells of `matrix` need. They stand below each other.
+// Returns the width that the cells of `matrix` need. The cells are in one column.
 CGFloat neededWidth(NSMatrix* matrix) {
   CGFloat width = 0;
   for (NSCell* cell in [matrix cells])
@@ -124,7 +127,8 @@ CGFloat neededWidth(NSTableView* list) {
   return width;
 }
 
-// Returns the width that the lists and radio buttons inside `view` lack.
+// Returns the greatest width that a list or a radio matrix in `view` lacks. If `view` itself is the
+// list or the matrix, the result can be negative.
 CGFloat missingWidth(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {
     return neededWidth(static_cast<NSMatrix*>(view)) - NSWidth([view frame]);
@@ -141,8 +145,8 @@ CGFloat missingWidth(NSView* view) {
   return missing;
 }
 
-// Makes the cells of each matrix as wide as the matrix, because a matrix whose cells keep their
-// height keeps their width, too.
+// Makes the cells of each matrix as wide as the matrix. The cells do not grow with the matrix,
+// because then their height would change, too.
 void widenCells(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {
     NSMatrix* const matrix = static_cast<NSMatrix*>(view);
@@ -171,7 +175,7 @@ CGFloat leastHeight(NSView* view) {
   return static_cast<CGFloat>(rows) * ([list rowHeight] + [list intercellSpacing].height);
 }
 
-// Returns by how much text fields in `parent` can grow before their parent has to.
+// Returns by how much the text fields in `parent` can grow before `parent` itself must grow.
 CGFloat spareHeight(NSView* parent) {
   CGFloat lowestOnTop = NSHeight([parent bounds]);
   CGFloat highestOnBottom = 0;
@@ -186,7 +190,7 @@ CGFloat spareHeight(NSView* parent) {
   return lowestOnTop - highestOnBottom - kLeastGap;
 }
 
-// Returns the height that the text fields inside `view` lack.
+// Returns by how much `view` must grow for the text fields inside it.
 CGFloat missingHeightInside(NSView* view) {
   if (!isContainer(view)) return 0;
   CGFloat missingHere = 0;
@@ -223,13 +227,14 @@ void growFields(NSView* view) {
   }
 }
 
-// Returns the start of a stretch of this length that is nearest to `start` within the bounds. A
-// stretch that is too long begins where the bounds begin.
+// Returns the place nearest to `start` where a stretch of `length` can begin, so that it lies
+// between `least` and `greatest`. Returns `least` if there is no such place.
 CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat length) {
   return std::max(least, std::min(std::floor(start), greatest - length));
 }
 
-// Enlarges a window up to the size of the screen, and keeps its middle in place as far as possible.
+// Enlarges a window by `width` and `height`, but not beyond the size of the screen. Keeps the
+// window's middle in place as far as possible.
 void enlarge(NSWindow* window, CGFloat width, CGFloat height) {
   NSScreen* const screen = [window screen] ? [window screen] : [NSScreen mainScreen];
   const NSRect bounds = [screen visibleFrame];

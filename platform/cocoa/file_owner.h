@@ -19,7 +19,7 @@
 /// Returns the window that the file connects to the outlet "window", or nil when the file connects
 /// none.
 - (NSWindow*)window;
-/// AppKit calls this function when it loads the file.
+/// AppKit calls this function when it loads a file that connects the outlet.
 - (void)setWindow:(NSWindow*)window;
 
 @end

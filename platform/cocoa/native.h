@@ -7,7 +7,7 @@
 namespace onramp::cocoa {
 
 /// Returns the object to which `outlet` refers, or nil if `outlet` is empty or the object is not of
-/// class `Class`. The callers need not check for nil, because messages to nil do nothing.
+/// class `Class`. Most callers need not check for nil, because messages to nil do nothing.
 template <typename Class>
 [[nodiscard]] Class* nativeOf(const Outlet& outlet) {
   id const object = reinterpret_cast<id>(outlet.native());

@@ -46,8 +46,8 @@ class Reader {
   }
 
   // Several containers may share one string or data object, but each value gets a copy. So the
-  // total size of the copies has the same limit as the size of a file. A string counts by its
-  // UTF-16 units. Returns false when the limit is exceeded.
+  // total size of the copies has the same limit as the size of a file. Each UTF-16 unit of a string
+  // counts as one byte. Returns false when the limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;
     if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;

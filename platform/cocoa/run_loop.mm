@@ -26,8 +26,8 @@ int modalLoops = 0;
 bool isModalAborted = false;
 
 // True from abortModal() until the modal loop has returned or the main thread has found that no
-// loop is running. During this time, posted actions do not run, because each of them might occupy
-// the main thread for seconds and so delay the return.
+// loop is running. During this time, a modal loop holds posted actions back, because each of them
+// can occupy the main thread for seconds and so delay the return.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while
@@ -97,7 +97,7 @@ void performOnMainThread(std::function<void()> action) {
   });
 }
 
-// AppKit may also end its loop without a call of abortModal(), for example when the user presses a
+// AppKit can also end its loop without a call of abortModal(), for example when the user presses a
 // key that cancels. This function then starts the loop again.
 void runModalForWindow(const Window& window) {
   // The loop counts as running before the window is shown, because showing the window may run a

@@ -12,7 +12,8 @@ namespace {
 constexpr CGFloat kCellPadding = 6;  // points
 constexpr NSUInteger kLeastNameLetters = 24;
 
-// Returns the enabled button in `view` that the Return key presses, or nil when there is none.
+// Returns the enabled, visible button in `view` that the Return key presses, or nil when there is
+// none.
 NSButton* defaultButton(NSView* view) {
   if ([view isKindOfClass:[NSButton class]] && ![view isHidden]) {
     NSButton* const button = static_cast<NSButton*>(view);
@@ -90,9 +91,10 @@ CGFloat leastNameWidth(NSCell* cell) {
   [self showSelection];
 }
 
-// Widens every column except the first one to fit its texts, and prevents the user from making it
-// narrower than that. If the table is then too narrow for all columns, narrows the first one, which
-// shows the names, but not below its minimum width. Below that, the window gets wider.
+// Makes every column except the first one at least as wide as its texts. The first column shows the
+// names. It becomes narrower if necessary, but always has room for its title and for 24 letters. If
+// the table is too narrow even then, makes the window wider. Does nothing when there is only one
+// column.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -121,8 +123,8 @@ CGFloat leastNameWidth(NSCell* cell) {
   if (row >= 0) _controller->choose(static_cast<std::size_t>(row));
 }
 
-// Clicks the button after the table has handled the double-click, because the button's action may
-// remove the table.
+// Clicks the default button after the table has handled the double-click, because the button's
+// action can remove the table.
 - (void)goOn:(id)sender {
   if ([_table clickedRow] < 0) return;
   [defaultButton([[_table window] contentView]) performSelector:@selector(performClick:)

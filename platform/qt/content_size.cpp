@@ -10,7 +10,7 @@ namespace onramp::qt {
 
 namespace {
 
-constexpr int kTitleBarHeight = 32;  // assumed until the window manager reports the real height
+constexpr int kTitleBarHeight = 32;  // the least height that a title bar is assumed to have
 
 }  // namespace
 

@@ -161,7 +161,7 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 }  // namespace
 
 // Owns the root widget, unless the widget's parent has already destroyed the widget. While a page
-// is shown, its root is a child of the window, and the window may be destroyed before the page.
+// is shown, its root is a child of the window, and the window can be destroyed before the page.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

@@ -12,9 +12,9 @@ namespace onramp::qt {
 
 namespace {
 
-// Returns the tool tip, which shows `text` in full even when its column is too narrow. A text that
-// looks like markup, as a device's name may, is escaped. Otherwise Qt would show the text as rich
-// text, which can load pictures.
+// Returns the tool tip, which shows `text` in full even when its column is too narrow. Escapes a
+// text that looks like markup. Otherwise Qt would show the text as rich text, and a device could
+// have a name that loads pictures.
 QString toolTip(const QString& text) {
   return Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text) : text;
 }

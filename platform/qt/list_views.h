@@ -56,8 +56,9 @@ class ColumnsWidget final : public FramedView<QTreeView> {
  public:
   explicit ColumnsWidget(QWidget* parent = nullptr);
 
-  /// Call this after every change of the contents or of a header. The first call adjusts the widths
-  /// at once. Calls soon after it share one more adjustment, which measures all rows again.
+  /// Call this after every change of the contents or of a header. Adjusts the widths at once,
+  /// unless a call has done so a moment ago. All calls within that moment share one adjustment at
+  /// its end.
   void fitColumns();
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }

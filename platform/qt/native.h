@@ -10,7 +10,7 @@
 
 namespace onramp::qt {
 
-// Some of the properties of widgets that this front end adds to those of Qt.
+// Some of the properties that this front end adds to Qt's widgets.
 inline constexpr const char* kViewClass = "viewClass";  ///< text: a page's class, set on its root
 inline constexpr const char* kHeading = "heading";      ///< true for a label that is a title
 inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: columns that name a row
@@ -21,6 +21,7 @@ template <typename Class>
   return qobject_cast<Class*>(reinterpret_cast<QObject*>(outlet.native()));
 }
 
+/// Returns `object`, which may be null, in the form in which an Outlet stores it.
 [[nodiscard]] inline NativeObject* toNative(QObject* object) {
   return reinterpret_cast<NativeObject*>(object);
 }

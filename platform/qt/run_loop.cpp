@@ -22,8 +22,9 @@ std::vector<QEventLoop*>& modalLoops() {
   return loops;
 }
 
-// True from abortModal() until the modal loop has returned. Each posted action may occupy the main
-// thread for seconds, so posted actions are held back until the modal loop has returned.
+// True from abortModal() until the modal loop has returned or the main thread has found that no
+// loop is running. During this time, a modal loop holds posted actions back, because each of them
+// can occupy the main thread for seconds and so delay the return.
 std::atomic<bool> isAborting = false;
 
 }  // namespace

@@ -5,9 +5,10 @@
 
 namespace onramp::qt {
 
-/// A wheel of spokes that turns while it is animated. Assistive programs see the spinner as a
-/// progress bar that does not show how much is done. If the spinner is animated when it appears, it
-/// takes the keyboard focus, so that these programs read out what the user is waiting for.
+/// A wheel of spokes that turns from start() to stop(). To assistive programs, the turning spinner
+/// is a progress bar that does not show how much is done. If the spinner is turning when it
+/// appears, it takes the keyboard focus, so that these programs read out what the user is waiting
+/// for.
 class Spinner final : public QProgressBar {
   Q_OBJECT
 

@@ -17,8 +17,8 @@ namespace {
 using qt::ListModel;
 using qt::nativeOf;
 
-// Returns the view's model. The model is created on first use, because headers may be set before
-// bind().
+// Returns the view's model. The first call for a view creates the model, because a header can be
+// set before bind().
 ListModel* modelOf(QAbstractItemView* view) {
   if (!view) return nullptr;
   if (auto* const model = qobject_cast<ListModel*>(view->model())) return model;
@@ -68,8 +68,8 @@ void takeSelection(QAbstractItemView* view, ArrayController& controller,
   }
 }
 
-// Clicks the window's default button once the list has handled the double-click, because the
-// button's action may remove the list. A button that is disabled now is not clicked later either.
+// Clicks the window's default button after the list has handled the double-click, because the
+// button's action can remove the list. Does nothing if the button is hidden or disabled now.
 void clickDefaultButtonSoon(const QWidget& window) {
   for (QPushButton* const button : window.findChildren<QPushButton*>()) {
     if (!button->isDefault() || !button->isVisible() || !button->isEnabled()) continue;

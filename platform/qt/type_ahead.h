@@ -7,8 +7,8 @@ class QAbstractItemView;
 
 namespace onramp::qt {
 
-/// Finds a row of a list by what the user types. A row matches if any word of its text starts with
-/// the typed text, ignoring case.
+/// Finds a row of a list by what the user types. A row matches if any word in its first column
+/// starts with the typed text, ignoring case.
 class TypeAhead {
  public:
   /// Call this when the user has typed `text`. Texts that are typed in quick succession are joined.

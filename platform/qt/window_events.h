@@ -10,9 +10,9 @@ class ApplicationDelegate;
 
 namespace qt {
 
-/// Lets the delegate decide whether a window may close, and handles some keys. Escape clicks the
-/// button whose key equivalent is "Escape". Return and Enter do what performReturn() does. F10 does
-/// what openMenu() does.
+/// Lets the delegate decide whether a window may close and whether the application then terminates.
+/// Also handles some keys. Escape clicks the first visible, enabled button whose key equivalent is
+/// "Escape". Return and Enter do what performReturn() does. F10 does what openMenu() does.
 class WindowEvents final : public QObject {
   Q_OBJECT
 
@@ -25,15 +25,15 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Beeps. If a spinner is shown, the title bar says what the wizard is waiting for until the
+  /// Beeps. If a spinner is visible, the title bar also shows the text beside the spinner until the
   /// spinner stops.
   void explainRefusal();
 
   /// Returns whether the key did anything.
   bool performKey(int key);
 
-  /// Clicks the button that has the focus. If no button has the focus, clicks the button whose key
-  /// equivalent is "Return". Returns whether a button was clicked.
+  /// Clicks the push button that has the focus. If none has the focus, clicks the first visible,
+  /// enabled one whose key equivalent is "Return". Returns false if there is no such button.
   bool performReturn();
 
   /// Selects the first menu of the menu bar, so that the arrow keys work in the menu bar. Returns
@@ -42,7 +42,7 @@ class WindowEvents final : public QObject {
 
   QWidget* window_;
   ApplicationDelegate& delegate_;
-  bool isExplained_ = false;  ///< the title bar shows what the wizard is waiting for
+  bool isExplained_ = false;  ///< the title bar shows the text beside the spinner
 };
 
 }  // namespace qt

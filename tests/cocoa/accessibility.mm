@@ -5,12 +5,12 @@
 // The environment variable ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the test
 // creates a question file, whose name is that of the answer file with ".question" appended. The
 // application's main loop removes the question file and writes the answer file. The answer is a
-// JSON array with an object for each visible control. The object has the keys "role", "name",
-// "states", "x", "y", "width" and "height". Roles and states have their AT-SPI names, except the
-// state "cut off" of a text that lacks room. Lengths are in pixels, and x and y start at the
-// screen's upper left corner. The first object stands for the application. Its role is
-// "application". Instead of a frame, it has the key "presses": the number of mouse presses that the
-// application has handled so far.
+// JSON array. Its first object stands for the application. That object has the keys "role" (with
+// the value "application"), "name", "states" and "presses": how often the left mouse button was
+// pressed in one of the application's windows so far. Every other object stands for a visible
+// window or control, and has the keys "role", "name", "states", "x", "y", "width" and "height".
+// Roles and states have their AT-SPI names, except the state "cut off" of a text that lacks room.
+// Lengths are in pixels, and x and y start at the screen's upper left corner.
 
 #include <unistd.h>
 
@@ -90,15 +90,16 @@ class Reader {
     }
   }
 
-  // The wizard's own texts must not be cut off. GNUstep lays out its panels itself.
+  // Adds the state "cut off" if the text of `cell` does not fit into `room`. Leaves panels out,
+  // because GNUstep itself lays them out.
   void checkRoom(NSCell* cell, NSRect room, NSMutableArray* states) {
     const NSSize needed = [cell cellSizeForBounds:NSMakeRect(0, 0, NSWidth(room), kUnlimited)];
     const bool fits = needed.width <= NSWidth(room) && needed.height <= NSHeight(room);
     if (!fits && ![window_ isKindOfClass:[NSPanel class]]) [states addObject:@"cut off"];
   }
 
-  // In a table without headers, reports each row as a list item. In a table with headers, reports
-  // each cell.
+  // Reports each row of a table without headers as a list item, and each cell of a table with
+  // headers as a table cell.
   void readTable(NSTableView* table) {
     NSString* const role = [table headerView] ? @"table cell" : @"list item";
     const NSRange rows = [table rowsInRect:[table visibleRect]];

@@ -1,8 +1,7 @@
 """A person at the screen of the Cocoa front end under GNUstep.
 
-GNUstep does not support AT-SPI. Instead, this module asks the program by creating a question file. The
-program writes its visible controls, with their AT-SPI roles, into an answer file. accessibility.mm
-describes the protocol.
+GNUstep does not support AT-SPI. So this module asks the program itself which controls are visible. The
+question and the answer are files; accessibility.mm describes them.
 """
 
 import itertools
@@ -58,10 +57,10 @@ class GNUstepPerson(Person):
         self._point_at(control)
         before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
-        # The mouse button stays down until GNUstep has noticed the press. Otherwise, GNUstep would
-        # find the mouse button up when it handles the press. The application cannot count a press
-        # inside an open menu, because the menu grabs the mouse, so the wait for that press is
-        # short.
+        # The mouse button stays down until the application has counted the press or `patience` has
+        # run out. Otherwise, GNUstep could find the mouse button up when it handles the press. The
+        # application cannot count a press inside an open menu, because the menu grabs the mouse. So
+        # the wait for such a press is short.
         patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
         deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:
@@ -94,7 +93,7 @@ class GNUstepPerson(Person):
         self.desktop.run(["xdotool", "mouseup", "1"])
 
     def _menu_entries(self):
-        """Returns the entries of the open menu, without that of the menu bar, or None."""
+        """Returns the entries of the open menu, or None when no menu is open."""
         items = [control for control in self._read() if control["role"] == "menu item"]
         return [item for item in items if item["name"] != _MENU_BAR_ITEM] if len(items) > 1 else None
 
@@ -131,7 +130,7 @@ class GNUstepPerson(Person):
         """Returns the visible controls, after an entry for the application.
 
         Waits while the program's main loop is busy. Returns only the entry for the application if
-        the program has ended.
+        the program has ended. Fails if a text is cut off.
         """
         self._answer.unlink(missing_ok=True)
         self._question.touch()
@@ -159,7 +158,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """Returns environment variables that replace options, because the Cocoa front end has none."""
+        """Returns environment variables for `arguments`, because the Cocoa front end has no options."""
         if not arguments:
             return {}
         option, value = arguments

@@ -45,8 +45,9 @@ template <typename Result, typename... Parameters>
 Result call(const char* name, Result failure, Parameters... arguments) {
   const bool isFailing = fails(name);
   Result result{};
-  // Linux closes a descriptor even when it reports an error, so a close that fails closes, too. An
-  // fsync never flushes, which would take most of the tests' time and change nothing that they see.
+  // Linux closes a descriptor even when it reports an error, so a close that fails closes, too. No
+  // fsync flushes, because flushes would take most of the tests' time and change nothing that the
+  // tests see.
   if ((!isFailing && std::string_view(name) != "fsync") || std::string_view(name) == "close") {
     result = original<Result(Parameters...)>(name)(arguments...);
   }

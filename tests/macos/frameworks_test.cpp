@@ -118,7 +118,7 @@ TEST(CFNetworkBrowser, ReportsItsServicesGoneAfterAnErrorAndSearchesAgain) {
   EXPECT_FALSE(native.isRunning);
 }
 
-TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndCanBeUnscheduled) {
+TEST(CFNetworkBrowser, CanBeDestroyedByItsClientAndCanBeUnscheduled) {
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::endBrowser, &seen);
   seen.browser->schedule();
@@ -133,7 +133,7 @@ TEST(CFNetworkBrowser, MayBeDestroyedByItsClientAndCanBeUnscheduled) {
   EXPECT_FALSE(standin::Browser::last->isScheduled);
 }
 
-TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient) {
+TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndCanBeReleasedByItsClient) {
   Seen seen;
   seen.service = NetService::create("local.", "_ipp._tcp.", "Büro", 0);
   auto* native = standin::Service::last;
@@ -155,7 +155,7 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndMayBeReleasedByItsClient)
 
   EXPECT_TRUE(service->resolveWithTimeout(std::chrono::seconds(5)));
   EXPECT_TRUE(service->addressing().empty() && !service->txtData())
-      << "these belonged to the previous resolve";
+      << "a new resolve drops the addresses and the TXT data of the previous one";
   seen.service = std::move(service);
   error.error = kNetServiceErrorTimeout;
   native->client(native, &error, native->info);
@@ -168,7 +168,7 @@ TEST(CFNetworkService, IsNotCreatedFromTextsThatAreNotUTF8) {
   EXPECT_EQ(corefoundation::toCFArray({"a", "\xFF", "b"}).get()->members.size(), 2U);
 }
 
-TEST(SystemConfigurationStore, AsksByKeysAndByPatternsAndOmitsValuesOfUnknownTypes) {
+TEST(SystemConfigurationStore, MakesKeysAsksByPatternsAndOmitsValuesOfUnknownTypes) {
   const DynamicStoreRef store = createDynamicStore("test");
   const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
   EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");

@@ -71,7 +71,7 @@ class Layout : public testing::TestWithParam<int> {
     return {widget.mapTo(window, QPoint()), widget.size()};
   }
 
-  // Expects that no text is cut off, except the device's name, and that all columns are visible.
+  // Expects that no text is cut off, except devices' names, and that all columns are visible.
   static void expectColumnsFit(QTreeView& tree) {
     int width = 0;
     for (int column = 0; column < tree.header()->count(); ++column) {
@@ -153,7 +153,7 @@ class Layout : public testing::TestWithParam<int> {
   QWidget* window = nullptr;
 };
 
-TEST_P(Layout, NothingIsCutOffAndNothingOverlaps) {
+TEST_P(Layout, ControlsFitTheScreenAndTheirTextsAndDoNotOverlap) {
   delegate->showModelListView();
   delegate->setModelListViewButton();
   expectEverythingFits();

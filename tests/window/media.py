@@ -50,7 +50,7 @@ def make(folder, built, models, tool_status=0, **resources):
 
 
 def make_tool(folder, status):
-    """Writes a set-up tool that exits with `status`, or replaces the set-up tool on the medium."""
+    """Writes a set-up tool that exits with `status` to the medium. Replaces the tool that is there."""
     tool = folder / "Setup.app/Contents/Linux/setup"
     tool.parent.mkdir(exist_ok=True)
     tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {status}\n")

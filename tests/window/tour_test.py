@@ -1,7 +1,9 @@
-"""Takes the tour of a medium with a mistake on it.
+"""Takes the tour of a medium with mistakes on it.
 
-Usage: tour_test.py MEDIUM, a medium's folder with the application on it. The environment variable
-ONRAMP_CHECK names onramp-check.
+Usage: tour_test.py MEDIUM
+
+MEDIUM is the folder of a medium with the application on it. The environment variable ONRAMP_CHECK holds
+the path of onramp-check. Without it, the tour uses the release build's onramp-check.
 """
 
 import pathlib
@@ -17,12 +19,13 @@ from media import model
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TOUR = pathlib.Path(__file__).resolve().parents[2] / "tools/tour"
-# No device can announce a name without a space, so the tour is the same with and without a network.
+# The wizard puts a space between a device's maker and its model. So no device is of one of these models,
+# and the tour is the same with and without a network.
 MODELS = {"Ä/1": model(usb=True, wireless=True), "a-1": model(wireless=True), "Cable": model(usb=True)}
 
 
 class Tour(unittest.TestCase):
-    def test_a_mistake_does_not_keep_the_tour_from_pictures_of_every_kind_in_every_language(self):
+    def test_the_tour_takes_pictures_for_each_kind_of_model_and_language_despite_mistakes(self):
         with tempfile.TemporaryDirectory() as folder:
             medium = media.make(f"{folder}/medium", BUILT, MODELS,
                                 SystemMin={"Major": "11", "Minor": "3"})

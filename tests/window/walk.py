@@ -3,10 +3,10 @@
 
 Usage: walk.py [--seed S] [--count N] MEDIUM
 
-The seeds of the N walks are S, S + 1 and so on, so `--seed S --count 1` repeats the walk with the seed S.
-A walk fails, for example, when the program exits with an error, when the main loop hangs, when the window
-cannot be closed at the end, or when a file for the package is incomplete. A failed walk prints its seed
-and its steps.
+MEDIUM is the folder of a medium with the application on it. The seeds of the N walks are S, S + 1 and so
+on, so `--seed S --count 1` repeats the choices of the walk with the seed S. A walk fails, for example,
+when the program exits with an error, when the main loop hangs, when the window cannot be closed at the
+end, or when a file for the package is incomplete. A failed walk prints its seed and its steps.
 """
 
 import argparse
@@ -28,7 +28,7 @@ from practice_network import PracticeNetwork
 AT_A_TIME = 4
 STEPS = 14
 PATIENCE = 60
-HANG = 10  # seconds; the devices answer at once, so the main loop is never busy for so long
+HANG = 10  # seconds; the devices answer at once, so the main loop should never be busy for so long
 CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu item")
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
@@ -116,14 +116,14 @@ class Walk:
             self.devices[name] = True
         elif self.dice.random() < 0.5:
             # Changes the device's service type to one that the wizard does not browse for, or back.
-            # The device still answers questions, because the wizard may be about to ask it.
+            # The device still answers questions, because the wizard can still ask it.
             self.devices[name] = not self.devices[name]
             self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
         else:
             self.network.set(name, note=f"after step {len(self.steps)}")
 
     def listen(self, person, seconds):
-        """Waits for `seconds`. Raises Wrong if the main loop hangs during that time."""
+        """Waits for `seconds`, or until the program ends. Raises Wrong if the main loop hangs."""
         until = time.monotonic() + seconds
         while True:
             silent = person.round_trip()
@@ -186,7 +186,7 @@ def main():
                                   *sys.argv, BUILT])
     shares = [range(options.seed + first, options.seed + options.count, AT_A_TIME)
               for first in range(AT_A_TIME)]
-    sys.argv.append(str(BUILT))  # where way.py looks for it in each process
+    sys.argv.append(str(BUILT))  # way.py takes the medium from here in each process
     with multiprocessing.get_context("spawn").Pool(AT_A_TIME) as pool:
         return all(pool.map(take_walks, shares))
 

@@ -1,7 +1,7 @@
 """Shared code of the tests that go through the wizard from start to end.
 
-The last argument of each test program is a medium's folder with the application on it. With
-ONRAMP_GNUSTEP in the environment, that application is the Cocoa front end under GNUstep.
+The last argument of each test program is the folder of a medium with the application on it. If the
+application has the Cocoa front end under GNUstep, ONRAMP_GNUSTEP must be in the environment.
 """
 
 import pathlib

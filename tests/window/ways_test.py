@@ -17,7 +17,7 @@ TWO_MODELS = {"Kestrel 1": model(usb=True, wired=True, wireless=True),
 
 
 class Ways(WayTest):
-    def test_keyboard_forward_back_and_forward_again(self):
+    def test_forward_by_keyboard_then_back_and_forward_again(self):
         person = self.start({name: model(usb=True, wired=wired, wireless=True)
                              for name, wired in (("A", True), ("B", False), ("C", True))})
         person.see("list item", "B")
@@ -39,7 +39,7 @@ class Ways(WayTest):
         person = self.start({"Cable": model(usb=True, wired=True)})
         self.assert_installer_opened(person, None)
 
-    def test_escape_the_close_button_and_cancel_quit(self):
+    def test_the_escape_key_the_close_button_and_cancel_each_quit(self):
         for leave in (lambda p: p.press("Escape"), lambda p: p.close_window(),
                       lambda p: p.click("push button", TEXT["BTN_CANCEL"])):
             with self.subTest(leave=leave):

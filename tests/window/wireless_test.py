@@ -2,8 +2,9 @@
 
 Usage: wireless_test.py [TEST] MEDIUM
 
-MEDIUM is the folder of a medium with the application on it. Every test has its own process, desktop and
-devices. Several tests run at a time, because each of them mostly waits.
+MEDIUM is the folder of a medium with the application on it. TEST is a name such as
+WirelessWays.test_back_and_forth_keeps_list_and_choice. Without TEST, all tests run, each with its own
+process, desktop and devices. Several tests run at a time, because each of them mostly waits.
 """
 
 import concurrent.futures

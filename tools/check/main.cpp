@@ -52,7 +52,7 @@ int run(int count, char* arguments[]) {
   app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with status 1 even if there are only warnings");
-  app.add_flag("--keys", keys, "Print the keys that the wizard reads from a medium");
+  app.add_flag("--keys", keys, "Print the keys that the wizard reads from property lists");
   app.add_flag("--texts", texts, "Print the keys of the texts that the wizard shows");
   try {
     app.parse(count, arguments);

@@ -6,7 +6,7 @@ import unicodedata
 
 
 def file_names(names):
-    """Returns a part of a file name for each name. No two parts differ only in case."""
+    """Returns a part of a file name for each name. The parts differ even if case is ignored."""
     result, used = {}, set()
     for name in names:
         letters = unicodedata.normalize("NFKD", name).encode("ascii", "ignore").decode()

@@ -18,7 +18,7 @@ class Devices:
         self._entries = {}
 
     def make(self, models):
-        """Makes two wireless devices of each model, and one of the first model on a cable."""
+        """Makes two wireless devices of each model, and a wired device of the first model."""
         for number, model in enumerate(models):
             self._add(model, model)
             self._add(model, second_of(model))

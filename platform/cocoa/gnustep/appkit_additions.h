@@ -4,8 +4,7 @@
 
 #import <AppKit/AppKit.h>
 
-// Declares the AppKit methods that the front end uses and GNUstep's headers lack. The build
-// includes this header before every Objective-C++ source.
+// Declares the AppKit methods that the front end uses but GNUstep's headers lack.
 
 @interface NSView (OnrampIdentification)
 - (NSString*)identifier;

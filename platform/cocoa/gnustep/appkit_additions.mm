@@ -58,8 +58,8 @@ void ignore(id, SEL, BOOL) {}
 
 namespace {
 
-// Opens the sheet after the caller has returned, as in AppKit. GNUstep's own function runs a modal
-// loop until the sheet ends, and only then returns.
+// Returns at once, as in AppKit, and opens the sheet in the next iteration of the main loop.
+// GNUstep's own function runs a modal loop until the sheet ends, and only then returns.
 void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) {
   OnrampWaitingSheet* const sheet = [[[OnrampWaitingSheet alloc] init] autorelease];
   sheet->_alert = [self retain];
@@ -73,7 +73,8 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
                              arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
-// GNUstep would return the size of the text on a single line.
+// Returns the size that a text field's wrapped text has within `bounds`. GNUstep's own function
+// returns the size of the text on a single line.
 NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
   if (![self isKindOfClass:[NSTextFieldCell class]]) return [self cellSize];
   return [[self attributedStringValue] boundingRectWithSize:bounds.size

@@ -7,7 +7,7 @@ namespace {
 // The defaults domain that GNUstep searches first.
 NSString* const kFirstDomain = @"GSPrimaryDomain";
 
-// Returns the codes of the user's languages, the most preferred one first, and then "en". By
+// Returns the codes of the user's locale and language, such as "de_DE" and "de", and then "en". By
 // default, GNUstep looks for folders that are named after languages, such as "German.lproj". The
 // folders of our bundles are named after codes, such as "de.lproj".
 NSArray* languageCodes() {
@@ -34,9 +34,9 @@ NSArray* languageCodes() {
 @implementation OnrampDefaults
 
 // Sets the user's languages, shows the menu inside the window, and shows no icon of the application
-// on the desktop. Draws all texts in a font with Chinese, Japanese and Korean characters, because
-// GNUstep draws a question mark for a character that the font lacks. GNUstep ignores a font that is
-// not installed.
+// on the desktop. Selects fonts that have Chinese, Japanese and Korean characters, because GNUstep
+// draws a question mark for a character that the font lacks. GNUstep ignores a font that is not
+// installed.
 + (void)load {
   @autoreleasepool {
     NSUserDefaults* const defaults = [NSUserDefaults standardUserDefaults];

@@ -1,7 +1,8 @@
 // GNUstep stores the time of the last event. This file prevents that time from going back. Every
 // request for the keyboard focus carries the stored time, and the window manager refuses a request
-// whose time looks old. GNUstep also stores the number in each "_NET_WM_PING" message, which need
-// not be a time. The window manager Openbox, for example, sends a count that starts at one.
+// whose time looks old. GNUstep also stores a number from each "_NET_WM_PING" message, but this
+// number need not be a time. The window manager Openbox, for example, sends a count that starts at
+// one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"

@@ -1,6 +1,6 @@
-// Makes a posted event wake the main loop, as on macOS. A GNUstep loop runs its timers and delayed
-// messages and then waits for input. If a timer or message has posted an event, the loop does not
-// notice the event until some input arrives.
+// Makes a posted event wake the main loop, as on macOS. A GNUstep loop first runs its timers and
+// delayed messages, then it waits for input. If a timer or message has posted an event, the loop
+// does not notice the event until some input arrives.
 
 #include <sys/eventfd.h>
 
@@ -9,8 +9,8 @@
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
 
-/// An input source of the main loop. Every posted event gives the source input, which wakes the
-/// loop.
+/// An input source of the main loop. Every posted event makes input available at the source, and so
+/// wakes the loop.
 @interface OnrampPostedEvents : NSObject <RunLoopEvents> {
   int _descriptor;
 }
@@ -51,7 +51,7 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  eventfd_write(_descriptor, 1);  // fails when so many posts wait that the loop wakes anyway
+  eventfd_write(_descriptor, 1);  // fails only if earlier posts are waiting, which wake the loop
 }
 
 - (void)receivedEvent:(void*)data

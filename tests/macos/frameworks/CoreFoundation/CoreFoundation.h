@@ -1,7 +1,7 @@
 // A stand-in for the part of Core Foundation that platform/corefoundation, cfnetwork and
-// systemconfiguration call. With the stand-ins in this folder, these backends compile and run on
-// Linux. The tests show how the backends use the frameworks' objects, not how macOS behaves. The
-// sanitizers report an object that is released too often or never.
+// systemconfiguration use. With the stand-ins in tests/macos/frameworks, these backends compile and
+// run on Linux. The tests show how the backends use the frameworks' objects, not how macOS behaves.
+// In a build with sanitizers, the sanitizers report an object that is released too often or never.
 #pragma once
 
 #include <cstddef>

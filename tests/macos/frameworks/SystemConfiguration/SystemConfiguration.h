@@ -14,7 +14,8 @@ struct SCDynamicStoreContext {
 
 namespace standin {
 
-/// A session with the store. The answer to a request holds the request's own keys or patterns.
+/// A session with the store. The answer to a request holds the request's own keys or patterns, and
+/// a value of an unknown type.
 struct Store : Object {
   Store() : Object(kOther) { last = this; }
   ~Store() override {
