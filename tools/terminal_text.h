@@ -10,7 +10,7 @@ namespace onramp {
 [[nodiscard]] std::size_t columnsOf(std::string_view text);
 
 /// Returns `text`, in UTF-8, in exactly `columns` columns. A shorter text is padded with spaces. A
-/// longer one is cut and ends with "…".
+/// longer one is cut and, if there is a column for it, ends with "…".
 [[nodiscard]] std::string fitted(std::string_view text, std::size_t columns);
 
 /// Returns `text` broken at spaces into lines of at most `width` columns. Each line starts with

@@ -26,7 +26,7 @@ Report checkMedium(const std::string& root) {
                                .expected = "the wizard, beside \"MacResources\"",
                                .effect = "there is nothing to double-click",
                                .remedy = "copy the application to the medium's top; until then, "
-                                         "its usual settings are assumed here"});
+                                         "onramp-check assumes the application's usual settings"});
   }
   const MediumFiles files(folder, application, report);
   const Lists lists = readLists(files);

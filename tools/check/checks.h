@@ -6,23 +6,22 @@
 
 namespace onramp::check {
 
-// Each function checks one subject. It adds its findings to the report, which is files.report()
-// unless there is a parameter for it. A function that "reports" something also fills the report's
-// members that describe what users will see.
+// Each check adds its findings to the report, which is files.report() if the function has no
+// parameter for the report. Some functions also set members of the report.
 
 /// Checks the models' names in the medium description, and compares them with the names in the
 /// model information.
 void checkModelNames(const Lists& lists, Report& report);
 
-/// Reports the connections that each model offers, and the page that the wizard begins with.
+/// Sets the members `models` and `start` of the report. Checks nothing.
 void describeModels(const Lists& lists, Report& report);
 
-/// Checks and reports the range of systems that the medium supports, and the package that opens on
-/// each of them.
+/// Checks the range of systems that the medium supports, and the packages. Sets the report's
+/// members `systems` and `packages`.
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
-/// Checks that the wireless set-up tool exists and has a program and a name. If the name contains
-/// the maker's name, checks that every translation does, too.
+/// Checks that the wireless set-up tool exists and has a program and a name. If the tool's name
+/// contains the maker's name, checks that every translation of the tool's name does, too.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
 /// Checks the application's program file. If the medium offers the online service, also checks the
@@ -31,10 +30,10 @@ void checkApplication(const MediumFiles& files, const Lists& lists);
 
 /// Checks the values that the wizard passes to the network and to other programs: the service type,
 /// the vendor's name and the series code. Checks that the application declares the service type,
-/// unless the type itself is wrong.
+/// unless the type itself is missing or wrong.
 void checkIdentity(const Lists& lists, Report& report);
 
-/// Checks the texts of every language, and reports how many texts each language has.
+/// Checks the texts of every language. Sets the report's member `languages`.
 void checkTexts(const MediumFiles& files, const Lists& lists);
 
 /// Checks the pictures of the connections and the application's background picture.

@@ -10,7 +10,7 @@ namespace onramp::check {
 
 enum class Severity {
   kError,    ///< users will probably see something wrong
-  kWarning,  ///< this may be intended, but often is not
+  kWarning,  ///< what was found may be intended, but often is not
 };
 
 /// Where a mistake was found.
@@ -23,7 +23,7 @@ struct Place {
 };
 
 /// One mistake on a medium. `found`, `expected`, `effect` and `remedy` are phrases without a full
-/// stop. writeText() leaves out those that are empty.
+/// stop. writeText() leaves out empty phrases.
 struct Finding {
   std::string id{};  ///< the broken rule's name, such as "key-missing"; programs rely on it
   Severity severity = Severity::kError;

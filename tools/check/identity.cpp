@@ -111,7 +111,7 @@ void checkVendor(const Lists& lists, Report& report) {
              std::any_of(name.begin(), name.end(), isControl)) {
     finding.id = "vendor-folder";
     finding.found = quoted(*written) + ", which cannot be the name of a folder";
-    finding.expected = "a name without \"/\" and control characters, other than \".\" and \"..\"";
+    finding.expected = "a name that has no \"/\" or control character, and is not \".\" or \"..\"";
   } else if (file.size() > kLongestFileName) {
     finding.id = "vendor-long";
     finding.found = "a name of " + std::to_string(name.size()) + " bytes, not counting spaces";
@@ -123,7 +123,9 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.severity = Severity::kWarning;
     finding.found = quoted(*written) + ", with characters outside ASCII";
     finding.expected = "only the letters A to Z, digits and spaces";
-    finding.effect = "a folder and files whose names some programs encode differently";
+    finding.effect =
+        "a folder and files whose names some programs may not find, because they "
+        "encode the letters in another way";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }

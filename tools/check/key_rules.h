@@ -31,6 +31,7 @@ struct DictionaryPlace {
   std::string file;
   std::vector<std::string> path;
 
+  /// Returns the place of `key` in the dictionary.
   [[nodiscard]] Place of(std::string_view key) const;
 };
 

@@ -23,8 +23,9 @@ struct KeyGroup {
 /// name.
 [[nodiscard]] std::span<const KeyGroup> keyGroups();
 
-/// The property lists that the wizard reads from a medium. A list that the wizard cannot read is
-/// nothing. All paths are relative to the medium, and are empty if unknown.
+/// The main property lists of a medium. A list that cannot be read has no value. All paths are
+/// relative to the medium. An unknown path is empty, except that `resourcesPath` is then the usual
+/// path.
 struct Lists {
   std::string informationPath;  ///< of the application's Info.plist
   std::optional<Dictionary> information;
@@ -42,8 +43,9 @@ struct Lists {
   [[nodiscard]] bool anyWireless() const;
 };
 
-/// Reads the lists. Adds to files.report() why a list cannot be read, and mistakes in the lists'
-/// keys and in the kinds of their values.
+/// Reads the lists, except those whose paths are unknown. Adds to files.report() why a list cannot
+/// be read, and mistakes in the lists' keys and in the kinds of their values. If the medium has no
+/// application, reads the resource dictionary at its usual path.
 [[nodiscard]] Lists readLists(const MediumFiles& files);
 
 }  // namespace onramp::check

@@ -25,9 +25,9 @@ constexpr const char* kFooter = R"(Examples:
   onramp-check /Volumes/Setup          print what is wrong with the medium
   onramp-check --json build/medium     print the same as JSON, for a program
 
-Exit status: 0 when no error was found, 1 when an error or, with --strict, a
-warning was found, 2 when the medium could not be read, the output could not be
-written or the command line is wrong.)";
+Exit status: 1 when an error or, with --strict, a warning was found; 2 when the
+medium could not be read, the output could not be written or the command line is
+wrong; otherwise 0.)";
 
 // Returns `status` if standard output could be written. Otherwise prints a message and returns
 // kUnreadable.
@@ -52,8 +52,8 @@ int run(int count, char* arguments[]) {
   app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with status 1 even if there are only warnings");
-  app.add_flag("--keys", keys, "Print the keys of the property lists that a medium needs");
-  app.add_flag("--texts", texts, "Print the keys of the texts that a medium needs");
+  app.add_flag("--keys", keys, "Print the keys that the wizard reads from property lists");
+  app.add_flag("--texts", texts, "Print the keys of the texts that the wizard shows");
   try {
     app.parse(count, arguments);
   } catch (const CLI::ParseError& error) {

@@ -33,14 +33,14 @@ class MediumFiles {
   /// Returns the full path at which the wizard looks for `relative`.
   [[nodiscard]] std::string fullPath(const std::string& relative) const;
 
-  /// Returns whether the medium has a file or folder at `relative`. Capital letters must match,
-  /// even where the file system ignores them. Reports a path that leads out of the medium or to
-  /// nothing.
+  /// Returns whether the medium has a file or folder at `relative`. Capital and small letters
+  /// differ, even on a file system that ignores the difference. Reports a path that leads out of
+  /// the medium or to nothing, and returns false for it.
   bool exists(const std::string& relative, const PathUse& use) const;
 
-  /// Returns the property list at `relative`. If it is an XML list, reports each key that its
-  /// dictionary already has, except keys inside arrays. When exists() returns false or the wizard
-  /// cannot read the list, reports why and returns nothing.
+  /// Returns the property list at `relative`. If it is an XML list, reports each repetition of a
+  /// key in its dictionary, except inside arrays. When exists() returns false or the wizard cannot
+  /// read the list, reports why and returns nothing.
   [[nodiscard]] std::optional<Dictionary> list(const std::string& relative,
                                                const PathUse& use) const;
 
@@ -53,8 +53,8 @@ class MediumFiles {
   /// folder cannot be read.
   [[nodiscard]] std::vector<std::string> names(const std::string& relative) const;
 
-  /// Adds the line number to each finding in the report about a key of an XML property list, if the
-  /// line is known.
+  /// Adds line numbers to the report's findings about keys of XML property lists, where the lines
+  /// are known.
   void addLines() const;
 
  private:

@@ -125,7 +125,7 @@ class ModelCheck {
          .remedy = "add the model to that list, or remove it from this one"});
   }
 
-  // Reports a name that no device can announce, and a name with suspicious spaces. A device
+  // Reports a name that no printer can announce, and a name with suspicious spaces. A device
   // announces maker and model as two texts, which the wizard joins with a space. Each text has at
   // most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
   void announceable(const std::string& name) {
@@ -146,7 +146,7 @@ class ModelCheck {
     } else if (name.size() > kMostBytes) {
       impossible(
           "a name of " + std::to_string(name.size()) + " bytes",
-          "at most " + std::to_string(kMostBytes) + " bytes, the most that a device can announce",
+          "at most " + std::to_string(kMostBytes) + " bytes, the most that a printer can announce",
           "write the name as the devices announce it");
     } else if (control || !isUTF8(name)) {
       impossible("a name with a control character, such as a line break, or with damaged UTF-8",

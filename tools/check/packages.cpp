@@ -18,8 +18,8 @@ namespace {
 
 using Version = std::array<std::int64_t, 3>;
 
-// Returns the versions at which the wizard's choice of a package can change: the first releases of
-// 10.0 to 10.16, and 11.0.
+// Returns the first releases of 10.0 to 10.16, and 11.0. The wizard's choice of a package changes
+// at no other version.
 std::set<Version> differentSystems() {
   constexpr std::int64_t kLastMinor = 16;
   std::set<Version> systems{{11, 0, 0}};

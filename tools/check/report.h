@@ -21,7 +21,7 @@ struct ModelRow {
 /// The package that the wizard opens on a range of systems.
 struct PackageRow {
   std::string systems{};  ///< in words
-  std::string package{};  ///< relative to the medium; empty when nothing opens
+  std::string package{};  ///< relative to the medium; empty when the medium names none
 };
 
 /// A language of the message bundle.
@@ -41,6 +41,7 @@ struct Report {
   std::vector<PackageRow> packages{};
   std::vector<LanguageRow> languages{};
 
+  /// Returns the number of findings with this severity.
   [[nodiscard]] std::size_t count(Severity severity) const;
 };
 

@@ -88,7 +88,7 @@ struct Range {
   char32_t last;
 };
 
-// Unicode blocks whose characters are as wide as they are high.
+// Ranges of characters most of which are as wide as they are high.
 constexpr std::array kSquare{
     Range{0x1100, 0x115F}, Range{0x2E80, 0xA4CF},   Range{0xAC00, 0xD7A3},
     Range{0xF900, 0xFAFF}, Range{0xFE30, 0xFE4F},   Range{0xFF00, 0xFF60},

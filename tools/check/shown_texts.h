@@ -15,7 +15,7 @@ struct ShownText {
   double width = 0;                  ///< of a line, in points; 0 where any text fits
   double size = 13;                  ///< of the letters, in points
   int lines = 1;                     ///< how many lines there is room for
-  std::size_t mostPlaceholders = 0;  ///< how many "%@" it may have; if not 0, it needs one
+  std::size_t mostPlaceholders = 0;  ///< the most "%@" that may occur; if not 0, one must occur
   bool hasFallback = false;          ///< if missing, an English text is shown, not the key
 };
 

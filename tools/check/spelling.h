@@ -29,9 +29,9 @@ class Spelling {
   std::size_t work_ = 0;
 };
 
-/// Returns the least number of changes that turn `a` into `b`. A change inserts, removes or
-/// replaces one byte, or swaps two neighbouring bytes. ASCII letters that differ only in case are
-/// equal. Returns `most` + 1 when more than `most` changes are needed.
+/// Returns the least number of changes that turn `a` into `b`, if no byte is changed twice. A
+/// change inserts, removes or replaces one byte, or swaps two neighbouring bytes. ASCII letters
+/// that differ only in case are equal. Returns `most` + 1 when more than `most` changes are needed.
 [[nodiscard]] std::size_t editDistance(std::string_view a, std::string_view b, std::size_t most);
 
 }  // namespace onramp::check

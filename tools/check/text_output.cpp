@@ -16,11 +16,10 @@ namespace {
 constexpr std::string_view kRed = "\033[31m";
 constexpr std::string_view kYellow = "\033[33m";
 constexpr std::string_view kPlain = "\033[0m";
-constexpr std::size_t kConnectionColumns =
-    24;  // what the line needs in addition to the model's name
+constexpr std::size_t kConnectionColumns = 24;  // all columns of a model's line except its name
 
-// Returns `text` with replacement characters for its control characters, so that the text stays on
-// one line and cannot control the terminal.
+// Returns `text` with replacement characters for its control characters and damaged bytes, so that
+// the text stays on one line and cannot control the terminal.
 std::string printable(std::string_view text) {
   std::string result;
   while (!text.empty()) {

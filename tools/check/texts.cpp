@@ -40,8 +40,8 @@ std::string joined(const std::vector<std::string>& words) {
   return text;
 }
 
-// Returns whether `offered` contains the language `wanted`. A related language does not count, even
-// if the system would use it instead.
+// Returns whether `offered` contains the language `wanted`, in any region. A related language does
+// not count, even if the system would use it instead.
 bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
   const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
   if (found.empty()) return false;
@@ -241,8 +241,8 @@ class TextCheck {
     report_.findings.push_back(std::move(finding));
   }
 
-  // Reports languages of the message bundle in which the application has no texts. The
-  // message bundle cannot supply these.
+  // Reports languages of the message bundle in which the application has no texts of its own. The
+  // message bundle cannot supply the application's texts.
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";
@@ -258,8 +258,8 @@ class TextCheck {
            .expected = "the languages of the message bundle; the application has " +
                        (own.empty() ? "none" : joined(own)),
            .effect = "users of " + quoted(language) +
-                     " read and hear some of the application's texts in English: why it uses the "
-                     "network, and the name of the gear button",
+                     " read and hear some of the application's texts in English: why the wizard "
+                     "uses the network, and the name of the gear button",
            .remedy = "have the application built with texts in that language"});
     }
   }

@@ -111,7 +111,7 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
          .found = "a file at " + quoted(*relative),
          .expected = "an application bundle, which is a folder",
          .effect = kEffect,
-         .remedy = "write the path of the folder that ends in \".app\""});
+         .remedy = "write the path of the folder whose name ends in \".app\""});
     return;
   }
   const std::string list = *relative + "/Contents/Info.plist";

@@ -85,7 +85,8 @@ class Walk {
     const bool isKey = closed.name == "key" && !open_.empty() && open_.back().name == "dict";
     if (!isKey) return;
     path_.back() = text_;
-    // `path_` has no array indexes, so dictionaries in an array would seem to repeat their keys.
+    // `path_` has no array indexes, so the dictionaries in an array would seem to be one dictionary
+    // that repeats its keys.
     if (arrays_ == 0 && !lines_.keys.emplace(path_, keyLine_).second) {
       lines_.twice.emplace_back(path_, keyLine_);
     }

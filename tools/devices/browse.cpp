@@ -156,7 +156,7 @@ int Session::run() {
     progress_.print(jsonOf(all));
     return 0;
   }
-  // Shows the devices that have no row yet, and those that are gone.
+  // Shows the verdicts on the devices that have no row yet, and on those that are gone.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));

@@ -20,8 +20,8 @@ struct TextStyle {
 /// Returns the header line of the table of devices.
 [[nodiscard]] std::string tableHead(const TextStyle& style);
 
-/// Returns a device's row in the table and the lines that follow it. These are the reason, but only
-/// for a device that the wizard does not list, then the notes and, in the verbose style, all
+/// Returns a device's row in the table and the lines that follow it. If the wizard does not list
+/// the device, the reason follows first. Then come the notes and, in the verbose style, all
 /// details.
 [[nodiscard]] std::string rowOf(const JudgedDevice& device, const TextStyle& style);
 

@@ -25,7 +25,7 @@ struct Device {
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
   std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"; empty on macOS
-  std::optional<Answer> answer;     ///< nothing until the device has been asked
+  std::optional<Answer> answer;     ///< nothing until the asking is finished
 };
 
 /// The parts of a medium on which the wizard's search depends.

@@ -40,7 +40,7 @@ struct Exchange {
 /// The result of asking one device.
 struct Answer {
   bool isWireless = false;  ///< as the wizard decides
-  bool isComplete = false;  ///< false when `stopped` was set before the end
+  bool isComplete = false;  ///< false when askDevice() was stopped before the end
   double seconds = 0;       ///< how long the wizard's window would not respond
   std::vector<Exchange> exchanges;
 

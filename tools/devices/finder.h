@@ -19,7 +19,8 @@ namespace onramp::devices {
 /// functions must be called on the main thread.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Called when a service of `device` is found, is resolved or is gone.
+  /// Called when a service of `device` is found or is gone, and when the service that gives the
+  /// addresses is resolved.
   using Changed = std::function<void(Device& device)>;
 
   /// If a device has services of several types, the finder uses the addresses and TXT record of the
@@ -33,6 +34,8 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   /// Starts to browse `types` and, if `all` is true, every other type that is announced. The finder
   /// and its browsers keep each other alive until stop() is called.
   void start(const std::vector<std::string>& types, bool all);
+
+  /// Stops browsing. The devices found so far remain.
   void stop();
 
   /// Returns all devices found so far, including those that are gone, in the order of their names.

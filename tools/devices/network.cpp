@@ -56,7 +56,7 @@ std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds) {
   if (!canSendMulticast()) {
     if (!hasNetwork()) {
       return {{.id = "no-network",
-               .why = "no network: this computer has only loopback addresses",
+               .why = "no network: this computer has no address except on loopback",
                .remedy = "connect the computer to the devices' network"}};
     }
     return {{.id = "multicast-blocked",

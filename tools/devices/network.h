@@ -6,9 +6,9 @@
 
 namespace onramp::devices {
 
-/// Returns the reason why the search found no device: no discovery daemon, no network, multicast
-/// blocked, or nothing announced. `seconds` is how long the search took. If devices were found,
-/// only a missing daemon counts as a problem.
+/// Returns at most one problem of the network as a whole. A missing discovery daemon is always a
+/// problem. If the search found no device, the problem is otherwise that there is no network, that
+/// multicast is blocked, or that nothing was announced. `seconds` is how long the search took.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
 /// Returns whether `address`, a dotted IPv4 text, is in a subnet of this computer. Returns false

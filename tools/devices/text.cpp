@@ -18,7 +18,7 @@ void appendEscaped(std::string& out, char byte) {
 }
 
 // Returns whether the character is invisible: a control character, a separator of lines or
-// paragraphs, a space without width, or a mark that changes the direction of text.
+// paragraphs, a space or joiner without width, or a mark that changes the direction of text.
 bool isUnprintable(char32_t character) {
   return character < 0x20 || (character >= 0x7f && character < 0xa0) ||
          (character >= 0x200b && character <= 0x200f) ||

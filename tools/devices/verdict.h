@@ -13,8 +13,8 @@ namespace onramp::devices {
 struct Verdict {
   std::string id;  ///< such as "on-cable"; programs rely on it
   bool isListed = false;
-  std::string why{};     ///< a sentence without its full stop
-  std::string remedy{};  ///< what to do; may be empty
+  std::string why{};     ///< a phrase without a full stop
+  std::string remedy{};  ///< what to do; can be empty
 };
 
 /// Returns whether the wizard would ask the device which interface it uses: the device is resolved
