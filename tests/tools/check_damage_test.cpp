@@ -112,8 +112,8 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the name of the first page that `report` predicts. If the wizard refuses the system,
-// there is no page.
+// Returns the name of the first page that `report` predicts. `start` is the result of
+// startOfTheWizard(). If the wizard refuses the system, there is no page.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";

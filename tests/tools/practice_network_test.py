@@ -84,7 +84,7 @@ class FromInside(unittest.TestCase):
         self.network.settle()
         self.assertEqual(browse("_pdl-datastream._tcp")["Newer"], expected)
 
-    def test_devices_are_back_after_the_daemon_was_stopped(self):
+    def test_devices_are_back_after_the_daemon_was_stopped_and_started(self):
         self.network.stop_daemon()
         self.assertNotEqual(run("avahi-browse", "-at").returncode, 0)
         self.network.start_daemon()
