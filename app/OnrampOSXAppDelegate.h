@@ -283,7 +283,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   Dictionary mKSCD;
   std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses from the model list
   std::uint32_t mContainedModelCount = 0;
-  /// True from the wizard's own start of the set-up tool until the tool sends the user back.
+  /// True from the wizard's own start of the set-up tool on, unless that run of the tool asks to go
+  /// back to the connection page.
   bool mIsWLANTool = false;
   std::shared_ptr<Page> mChooseDeviceViewController;
   std::shared_ptr<Page> mShownPage;  ///< the page whose view is in `mainView`

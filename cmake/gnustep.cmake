@@ -14,8 +14,8 @@ function(gnustep_flags variable kind)
   execute_process(COMMAND ${ONRAMP_GNUSTEP_CONFIG} ${kind} OUTPUT_VARIABLE flags
     OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
   separate_arguments(flags NATIVE_COMMAND "${flags}")
-  # The first command removes flags that CMake sets itself. The second suppresses warnings in
-  # GNUstep's headers.
+  # The first command removes flags that the build sets itself or does not want. The second
+  # suppresses warnings in GNUstep's headers.
   list(FILTER flags EXCLUDE REGEX "^(-M.*|-Wall|-Wno-import|-g|-O2|-shared-libgcc|-I\\.)$")
   list(TRANSFORM flags REPLACE "^-I" "-isystem")
   set(${variable} ${flags} PARENT_SCOPE)

@@ -23,7 +23,8 @@ if(ONRAMP_FUZZ)
 endif()
 
 # onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room. Its files are
-# not joined in unity builds. So a program needs only the backends for those files that it uses.
+# joined only for the linter, not in other unity builds. So a program needs only the backends for
+# those files that it uses.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})

@@ -3,7 +3,7 @@
 
 Usage: icns.py ICON.icns PICTURE.png…
 
-Every PICTURE is square.
+Every PICTURE is square, with a side of 16, 32, 64, 128, 256, 512 or 1024 pixels.
 """
 
 import pathlib
@@ -11,8 +11,8 @@ import struct
 import sys
 
 # The types of the entries that hold a picture, by the length of its side in pixels. Some pictures
-# get two entries: one as an icon of that many points, and one as an icon of half as many points on
-# a display of twice the density.
+# get two entries: one for an icon with as many points as the picture has pixels, and one for an
+# icon with half as many points on a display of twice the density.
 TYPES = {16: ["icp4"], 32: ["icp5", "ic11"], 64: ["ic12"], 128: ["ic07"], 256: ["ic08", "ic13"],
          512: ["ic09", "ic14"], 1024: ["ic10"]}
 
