@@ -51,7 +51,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Tests that run inside a practice network with DEVICES, as the network's command."""
+    """Tests inside a practice network with DEVICES. A test of FromOutside starts them there."""
 
     def setUp(self):
         self.network = PracticeNetwork()
