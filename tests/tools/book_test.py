@@ -23,7 +23,8 @@ def printed(option):
 
 
 def rows(document, heading):
-    """Returns the rows of the tables with this heading: its groups, then the cells."""
+    """Returns the rows of the tables whose heading matches the regular expression `heading`. A row
+    begins with the expression's groups, and its cells follow."""
     text = text_of(document).replace("`", "")
     return [(*table.groups()[:-1], *line.strip("| ").split(" | "))
             for table in re.finditer(rf"^\| {heading} \|.*\n\|[-|]+\n((?:\|.*\n)+)", text, re.MULTILINE)

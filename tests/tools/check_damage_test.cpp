@@ -69,7 +69,8 @@ class DamagedMedium {
   }
 
   // Returns a copy of `dictionary` in which one random key, at any depth, is removed, renamed or
-  // given a value of another kind. Appends a description of the change to `what`.
+  // given a value of another kind. Some of the new names equal the old ones. Appends a description
+  // of the change to `what`.
   Dictionary damagedCopy(const Dictionary& dictionary, std::string& what) {
     std::vector<Dictionary::Pair> pairs(dictionary.begin(), dictionary.end());
     if (pairs.empty()) return dictionary;
@@ -112,8 +113,8 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the name of the first page that `report` predicts. If the wizard refuses the system,
-// there is no page.
+// Returns the name of the first page that `report` predicts. `start` is the result of
+// startOfTheWizard(). If the wizard refuses the system, there is no page.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";

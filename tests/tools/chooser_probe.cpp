@@ -1,5 +1,6 @@
-// Searches the network for SECONDS with the wizard's own device chooser. Then prints the names of
-// the devices in the chooser's list, one on each line.
+// Runs the wizard's own device chooser for SECONDS seconds, searching for the models MODEL…, then
+// prints the names of the devices in the chooser's list, one on each line. APPLICATION is the path
+// of the wizard's application on the medium.
 //
 //   chooser_probe APPLICATION SECONDS MODEL…
 

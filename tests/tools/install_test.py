@@ -1,5 +1,5 @@
-"""Installs a build into a new folder and uses the installed programs. Arguments: cmake, and the
-build's folder."""
+"""Installs a build into a new folder and tries a part of what was installed. Arguments: cmake, and
+the build's folder."""
 
 import os
 import pathlib
@@ -13,7 +13,7 @@ CMAKE, BUILD = sys.argv[1:]
 
 
 class Install(unittest.TestCase):
-    def test_the_installed_preview_finds_its_medium_and_the_documents_name_what_is_there(self):
+    def test_the_installed_preview_runs_and_the_documents_link_only_to_installed_files(self):
         with tempfile.TemporaryDirectory() as folder:
             subprocess.run([CMAKE, "--install", BUILD, "--prefix", folder], check=True, capture_output=True)
             prefix = pathlib.Path(folder)

@@ -1,5 +1,6 @@
 // Puts each input in place of one file of the example medium. The input's first byte chooses the
-// file. Then the wizard's own records of the medium and the report of onramp-check must agree.
+// file and is left out of it. Then the wizard's own records and the report of onramp-check must
+// agree about the models.
 
 #include <array>
 #include <cstdint>

@@ -123,8 +123,8 @@ def maximum(major, minor, bug_fix):
     return put(COMMON, "SystemMax", {"Major": major, "Minor": minor, "BugFix": bug_fix})
 
 
-# Each row has a breaker, the identifier of the only finding that it causes, and parts of that
-# finding's texts.
+# Each row has a breaker, the identifier of the only finding that it causes, and parts of the text
+# that words() returns for that finding.
 MISTAKES = [
     # Property lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
@@ -273,7 +273,7 @@ class OnrampCheck(unittest.TestCase):
         self.assertEqual(1, result.returncode)
         self.assertRegex(result.stdout, f'^{ENGLISH}:9: error: ";" expected.* Effect: ')
 
-    def test_warnings_count_only_with_the_option_strict(self):
+    def test_warnings_change_the_exit_status_only_with_the_option_strict(self):
         medium = self.broken(put(COMMON, "Comment", "x"))
         self.assertEqual([0, 1], [run(medium).returncode, run("--strict", medium).returncode])
 

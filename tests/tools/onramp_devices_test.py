@@ -56,7 +56,8 @@ def tlv(tag, *parts):
 
 def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
     """Returns a function that turns a request into a reply with these parts. If `number` is not 0,
-    the reply's identifier differs from the request's. `seconds` delay the reply."""
+    the reply's identifier differs from the request's. The reply keeps the first `arcs` of the 14
+    arcs of the object's name, and comes after `seconds` seconds."""
     def answer(request):
         time.sleep(seconds)
         at = request.index(b"corridor") + 12
@@ -68,8 +69,8 @@ def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, second
     return answer
 
 
-# Each row has the reply (None for a closed port), the outcome and the value in JSON, and a text
-# that snmpget prints.
+# Each row has the function that answers (None for a closed port), the outcome and the value in
+# JSON, and a text that snmpget prints.
 REPLIES = [
     *((reply(tlv(2, bytes((n & 255,)))), "value", n, f"INTEGER: {n}") for n in (2, 1, -1)),
     *((reply(value), "other-type", None, text) for value, text in (
@@ -217,7 +218,7 @@ class CommandLine(unittest.TestCase):
 
 
 class Networks(unittest.TestCase):
-    def test_on_practice_networks(self):
+    def test_the_other_classes_pass_on_practice_networks(self):
         with tempfile.TemporaryDirectory() as folder:
             description = pathlib.Path(folder, "devices.toml")
             for text, tests in ((DESCRIPTION, "Everybody"), ("", "Nobody")):

@@ -51,7 +51,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Tests that run inside a practice network with DEVICES, as the network's command."""
+    """Tests inside a practice network with DEVICES. A test of FromOutside starts them there."""
 
     def setUp(self):
         self.network = PracticeNetwork()
@@ -84,7 +84,7 @@ class FromInside(unittest.TestCase):
         self.network.settle()
         self.assertEqual(browse("_pdl-datastream._tcp")["Newer"], expected)
 
-    def test_devices_are_back_after_the_daemon_was_stopped(self):
+    def test_devices_are_back_after_the_daemon_was_stopped_and_started(self):
         self.network.stop_daemon()
         self.assertNotEqual(run("avahi-browse", "-at").returncode, 0)
         self.network.start_daemon()

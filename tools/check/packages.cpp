@@ -145,7 +145,7 @@ class PackageCheck {
     report_.findings.push_back({.id = "range-empty",
                                 .place = placeOf(medium::kSystemMax),
                                 .found = "a range that contains no system: " + report_.systems,
-                                .expected = "a newest system later than the oldest",
+                                .expected = "a maximum later than the minimum",
                                 .effect = "every system is refused",
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }

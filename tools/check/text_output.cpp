@@ -86,7 +86,7 @@ std::string counted(std::size_t count, const char* word) {
 const char* startInWords(FirstPage page) {
   switch (page) {
     case FirstPage::kNone:
-      return "no page, because no model supports wireless; the package opens at once";
+      return "no page, because no model supports wireless; the package, if any, opens at once";
     case FirstPage::kConnectionType:
       return "the connection page, because all models have the same connections by cable";
     case FirstPage::kModelList:

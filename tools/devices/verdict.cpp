@@ -117,7 +117,7 @@ Verdict judge(const Device& device, const Medium& medium,
     return {
         .id = "unresolved",
         .why = "announced as " + joined(device.types) +
-               ", but never resolved: nothing on the network announces the address of its host",
+               ", but not resolved: during the search, nothing announced the address of its host",
         .remedy = "switch the device off and on; check that no other device uses its host name"};
   }
   if (auto verdict = judgeName(device, medium)) return *verdict;
