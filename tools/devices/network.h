@@ -11,8 +11,9 @@ namespace onramp::devices {
 /// multicast is blocked, or that nothing was announced. `seconds` is how long the search took.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
-/// Returns whether `address`, a dotted IPv4 text, is in a subnet of this computer. Returns false
-/// before AddNetworkInterfaceListChangeCallbackSCF() has been called.
+/// Returns whether local_address_for_destination() finds a subnet of this computer that contains
+/// `address`, a dotted IPv4 text. Returns false before AddNetworkInterfaceListChangeCallbackSCF()
+/// has been called.
 [[nodiscard]] bool isInLocalSubnet(const std::string& address);
 
 }  // namespace onramp::devices
