@@ -22,8 +22,7 @@ namespace onramp {
 class ChooseDeviceView;
 class ModelListView;
 
-/// Who started the wireless set-up tool: the wizard itself, after a search that found no device, or
-/// the user.
+/// Who started the wireless set-up tool: the wizard (because a search found no device) or the user.
 enum class ToolStart { kAutomatic, kManual };
 
 /// The wizard's only controller. It owns the pages, remembers the user's choices, decides which
@@ -212,14 +211,15 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop for kMostPauses pauses of length `pause`, or until the chooser lists a
-  /// device at the end of a pause. Then ends the search. During the wait, the user can neither
-  /// click a button nor close the window, and `page` shows its spinner. `page` may be null.
+  /// Waits in a modal loop for at most kMostPauses pauses of length `pause`. The wait ends earlier
+  /// if the chooser lists a device at the end of a pause. Then ends the search. During the wait,
+  /// the user can neither click a button nor close the window, and `page` shows its spinner. `page`
+  /// may be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Sleeps for kMostPauses pauses of length `pause`, until a device is listed at the end of a
-  /// pause, or until the application terminates. Then ends the modal loop. Must not be called on
-  /// the main thread.
+  /// Sleeps for at most kMostPauses pauses of length `pause`, and then ends the modal loop. Ends
+  /// the loop earlier if a device is listed at the end of a pause, or if the application
+  /// terminates. Must not be called on the main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 
   /// Calls showProgress() with the chooser as the page. Afterwards enables Next if a device is

@@ -11,9 +11,9 @@
 
 namespace onramp {
 
-/// Holds a list's entries, their order and the selection. A table that shows the list is bound to
-/// it and is told of every change. All functions except arrangedCount() must be called on the main
-/// thread.
+/// Holds a list's entries, their order and the selection. A table that is bound to the controller
+/// shows the list and is told of every change. All functions except arrangedCount() must be called
+/// on the main thread.
 class ArrayController {
  public:
   /// Makes rearrange() sort the entries by their strings under `key`. An entry that has no string

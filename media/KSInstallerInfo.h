@@ -32,7 +32,7 @@ class KSInstallerInfo {
   /// them to their defaults.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
-  // These functions do what setCDCommonInfoValue() does, each for the values in its name only.
+  // Each of these functions does the part of setCDCommonInfoValue() that its name says.
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);
@@ -47,7 +47,7 @@ class KSInstallerInfo {
   /// dictionary could not be read.
   [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
 
-  /// The bounds of the supported system versions, as system_range.h explains them. Each is a
+  /// The bounds of the supported system versions. system_range.h has their meaning. Each is a
   /// dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A key that the
   /// medium leaves out counts as 0. A "Major" of 0, the default, means that there is no bound.
   [[nodiscard]] const Dictionary& supportSystemMin() const { return mSystemMin; }

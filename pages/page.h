@@ -14,7 +14,7 @@ namespace onramp {
 /// of page is a subclass; a view of an unknown class becomes a plain Page.
 class Page {
  public:
-  /// `interface` must hold a view. The page owns it.
+  /// `interface`, which the page owns, must hold a view.
   explicit Page(std::unique_ptr<Interface> interface) : interface_(std::move(interface)) {}
   Page(const Page&) = delete;
   Page& operator=(const Page&) = delete;
