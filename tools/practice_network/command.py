@@ -46,7 +46,9 @@ the description is a TOML file. One table, which may be left out, is for the net
     domains = ["annex.local"]      domains to browse besides "local"; default none
 there is one table for each device:
     [[device]]
-    name = "Kestrel Model 100"     the name in the wizard's list; only this entry is required
+    name = "Kestrel Model 100"     the name in the wizard's list; only this entry is required. A
+                                   name in a script such as Japanese should have at most 57 bytes,
+                                   because Avahi loses devices with longer ones after two minutes.
     maker = "Kestrel"              maker and model, which make up the medium's model names
     model = "Model 100"
     note = "2nd floor"             the device's location

@@ -7,6 +7,7 @@ import tempfile
 from onscreen import messages
 from onscreen.desktop import Desktop
 from onscreen.processes import wait_for
+from practice_network.names import shortened
 
 from . import crowded
 from .facts import Facts
@@ -107,9 +108,8 @@ class Gallery:
         for number in range(DEVICES):
             # The number comes first, so that the first picture of the sorted list has every kind of
             # name.
-            name = f"{number:02} {crowded.LONG_NAMES[number % len(crowded.LONG_NAMES)]}"
-            while len(name.encode()) > 63:
-                name = name[:-1]
+            name = shortened(f"{number:02} {crowded.LONG_NAMES[number % len(crowded.LONG_NAMES)]}",
+                             service_type)
             self._network.add(name, maker=maker, model=kind, type=service_type)
         self._network.settle()
 

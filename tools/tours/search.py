@@ -1,16 +1,17 @@
 """The wireless way of the tour, on a network of made-up devices."""
 
 from onscreen.processes import wait_for
+from practice_network.names import shortened
 
 from .visit import CONNECTION, DEVICES, GEAR_REFRESH, WentWrong
 
 _SEARCHES = 3  # on a busy machine, the first search may be in vain
 _LONGEST_SEARCH = 75  # seconds; the wizard pauses for at most 15, but the machine may be busy
-_LONGEST_NAME = 63  # bytes; a DNS label holds no more
 
 
 class Devices:
-    """Makes up devices of the medium's models on the practice network `network`."""
+    """Makes up devices of the medium's models on the practice network `network`. A device has its
+    model's name, shortened if the name is too long for a device."""
 
     def __init__(self, network, service_type):
         self._network = network
@@ -21,34 +22,30 @@ class Devices:
         """Makes two wireless devices of each model, and a wired device of the first model."""
         for number, model in enumerate(models):
             self._add(model, model)
-            self._add(model, second_of(model))
+            self._add(model, second_of(model, self._type))
             if number == 0:
                 self._add(model, f"{model} on a cable", activeif=1)
         self._network.settle()
 
     def _add(self, model, name, **entries):
         maker, kind = model.split(" ", 1)
+        name = shortened(name, self._type)
         self._entries[name] = {"maker": maker, "model": kind, "type": self._type} | entries
-        self._network.add(_label(name), **self._entries[name])
+        self._network.add(name, **self._entries[name])
 
     def leave(self):
         for name in self._entries:
-            self._network.remove(_label(name))
+            self._network.remove(name)
 
     def come_back(self):
         for name in self._entries:
-            self._network.add(_label(name))
+            self._network.add(name)
         self._network.settle()
 
 
-def _label(name):
-    while len(name.encode()) > _LONGEST_NAME:
-        name = name[:-1]
-    return name
-
-
-def second_of(model):
-    return _label(f"(2) {model}")
+def second_of(model, service_type):
+    """Returns the name of the second device of `model`."""
+    return shortened(f"(2) {model}", service_type)
 
 
 def matches_devices(model):

@@ -1,5 +1,7 @@
 """The tour through the wizard of one medium in one language."""
 
+from practice_network.names import shortened
+
 from .album import file_names
 from .search import Devices, find_devices, matches_devices, search_in_vain, second_of
 from .visit import ALERT, CONNECTION, MODELS, Visit, WentWrong
@@ -174,14 +176,14 @@ class Tour:
             self._go_to_list(visit, model)
             self._go_to_connection(visit)
             find_devices(visit, self._medium, "4-search" if is_first else None)
-            visit.person.see("table cell", model.name)
+            visit.person.see("table cell", shortened(model.name, self._medium.service_type))
             visit.picture("5-devices", "The devices that were found")
             if not is_first:
                 return
             if effect := self._facts.without_tool():
                 self._album.note(f"The medium has no wireless set-up tool. Effect: {effect}.")
             search_in_vain(visit, devices, self._medium.gear)
-            visit.person.click("table cell", second_of(model.name))
+            visit.person.click("table cell", second_of(model.name, self._medium.service_type))
             visit.picture("9-choice", "A device is chosen")
             visit.next()
             visit.see_package_open(2, "By wireless")
