@@ -38,6 +38,10 @@ std::string conclusionOf(const Answer& answer) {
   if (!answer.isComplete) return "interrupted before the device answered\n";
   if (answer.isWireless) return "wireless\n";
   if (!told || !told->value) return "no usable answer: not in the wizard's list\n";
+  if (*told->value == kActiveIFWireless) {
+    return "reports wireless, but left the last question without an answer: not in the wizard's "
+           "list\n";
+  }
   return "not wireless (wireless would be " + std::to_string(kActiveIFWireless) +
          "): not in the wizard's list\n";
 }

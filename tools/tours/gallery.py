@@ -10,7 +10,7 @@ from onscreen.processes import wait_for
 from practice_network.names import shortened
 
 from . import crowded
-from .facts import Facts
+from .facts import Facts, Unsuitable
 from .medium import Medium
 from .person import Person
 from .visit import GEAR_REFRESH, choose_model
@@ -68,8 +68,11 @@ def take_all(folder, pictures, network):
     with tempfile.TemporaryDirectory() as copies, Desktop() as desktop:
         copy = crowded.make(folder, pathlib.Path(copies) / "medium")
         medium = Medium(copy, Facts(copy))
-        model = next(model.name for model in medium.facts.models
-                     if model.wireless and " " in model.name)
+        model = next((model.name for model in medium.facts.models
+                      if model.wireless and " " in model.name), None)
+        if not model:
+            raise Unsuitable(f"{folder} has no wireless model whose name is a maker and a model, so "
+                             "there is no device to list")
         Gallery(desktop, medium, pictures, network).take(
             model, medium.service_type, medium.too_old() or medium.too_new())
     return 0
