@@ -72,8 +72,8 @@ class KSBonjour {
   /// running. If the browse cannot start, the browser still forwards the events of other browsers.
   void startBrowsing();
 
-  /// Ends the browse and forgets the table, without calling observers. Does nothing when the
-  /// browser is idle.
+  /// Ends the browse, cancels the resolves of services that have not been resolved, and forgets the
+  /// table. Does not call the observers. Does nothing when the browser is idle.
   void stopBrowsing();
 
   // The handlers of the three notifications.

@@ -48,7 +48,7 @@ int KSNetServiceCancelResolve(const NetServiceRef& service);
 int KSNetServiceResolveSync(const NetServiceRef& service, double timeout);
 
 /// Resolves the service with this name, type and domain, and blocks as KSNetServiceResolveSync()
-/// does. On success, stores the service's IPv4 addresses in `addresses`, or nothing when there are
+/// does. On success, sets `addresses` to the service's IPv4 addresses, or to nothing when there are
 /// none. Returns 1 and leaves `addresses` unchanged when the resolve does not succeed and when an
 /// argument is nothing or null.
 int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
@@ -63,12 +63,12 @@ int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
     const NetServiceRef& service);
 
 /// Stores in `addresses` the IPv4 addresses of the device that `uri` names. A "dnssd://" or
-/// "mdns://" URI must name a service in the domain "local.", which is resolved as by
-/// KSNetServiceCreateAndResolve(). For any other URL, looks up the host and stores the host's first
-/// address; `timeout` does not limit the look-up. On failure, returns 1 and leaves `addresses`
-/// unchanged. The function fails when `uri` is nothing, malformed or a "usb://" URI, when
-/// `addresses` is null, when the host's name has more than 1,024 bytes or no IPv4 address is found
-/// for it, and when the resolve does not succeed.
+/// "mdns://" URI must name a service in the domain "local."; KSNetServiceCreateAndResolve()
+/// resolves that service. For any other URL, looks up the host and stores the host's first address;
+/// `timeout` does not limit the look-up. On failure, returns 1 and leaves `addresses` unchanged.
+/// The function fails when `uri` is nothing, malformed or a "usb://" URI, when `addresses` is null,
+/// when the host's name has more than 1,024 bytes or no IPv4 address is found for it, and when the
+/// resolve does not succeed.
 int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
                                           std::optional<std::vector<std::string>>* addresses,
                                           double timeout);

@@ -10,9 +10,9 @@ namespace onramp {
 
 /// Encodes `message` (RFC 1157 section 4) at the start of `out_buffer` and stores the size of the
 /// encoding in `out_length`. Sets the `encoded_length` of each encoded binding. Replaces each
-/// negative integer in `message` by the unsigned number that has the same bytes (ber_put_int()).
-/// For example, -1 becomes 255, and a second encoding contains 255. A binding is written without a
-/// value if its `type` is none of 1, 2, 4, 5, 6 and 64 to 68.
+/// negative integer in `message`, except the values of types 65 to 67, by the unsigned number that
+/// has the same bytes (ber_put_int()). For example, -1 becomes 255, and a second encoding contains
+/// 255. A binding is written without a value if its `type` is none of 1, 2, 4, 5, 6 and 64 to 68.
 ///
 /// Returns SNMP_ERR_CODEC when the message does not fit in the buffer or is longer than 65,535
 /// bytes, when `varbind_count` exceeds the size of the array, when an object identifier cannot be
@@ -39,8 +39,8 @@ namespace onramp {
 /// Returns SNMP_ERR_CODEC for bytes that the functions of snmp/ber_reader.h refuse, such as an
 /// integer of more than four bytes, and for bytes in which an expected tag is missing or a list of
 /// bindings is declared longer than the bytes that follow. Also returns it when the reply has more
-/// bindings than the array, and when the record for a name or value is missing or too small. Parts
-/// that were decoded before the error stay in `message`.
+/// bindings than the array, and when the record for a name or value is missing or too small. An
+/// empty string needs no record. Parts that were decoded before the error stay in `message`.
 [[nodiscard]] snmp_status snmp_decode_message(snmp_message& message,
                                               std::span<const std::uint8_t> bytes);
 

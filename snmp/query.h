@@ -108,7 +108,8 @@ class snmp_table_request {
 /// one if the first gives no result. The first address that answers every request of its first try
 /// decides the result. Any other address is tried three times, with a pause of 20 ms after each
 /// try. If no address decides, the last try of the last address does. A try without a result counts
-/// as the value 0 of ActiveIF. Returns false when there are no addresses.
+/// as the value 0 of ActiveIF. An entry that is not a string counts as an address that answers
+/// without a result. Returns false when there are no addresses.
 ///
 /// Blocks for about 12 seconds for each address from which nothing comes back, not even the host's
 /// report that no program uses the port.

@@ -60,8 +60,8 @@ extern std::int64_t snmp_request_counter_ext;
 
 /// Normalizes `address` with snmp_normalize_ipv4(), sets the request identifier with
 /// snmp_next_request_id() and makes one exchange. Returns SNMP_ERR_TRANSPORT for a null message,
-/// for an address that cannot be normalized, and for a reply whose identifier differs. Otherwise
-/// returns the status of snmp_exchange().
+/// for an address that cannot be normalized, and for a reply whose identifier is not the request's.
+/// Otherwise returns the status of snmp_exchange().
 [[nodiscard]] snmp_status snmp_request_to_address(snmp_message* message, const char* address);
 
 }  // namespace onramp

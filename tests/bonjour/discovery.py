@@ -101,8 +101,8 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts the daemon. `settings` replace those in its configuration file; their names have
-        "_" in place of "-"."""
+        """Starts the daemon. Each of `settings` replaces the setting of the same name in the
+        configuration file. The names here have "_" in place of "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="
@@ -133,7 +133,7 @@ class Avahi:
 
 
 def announce_pointer(service_type, target_labels, seconds=4500):
-    """Announces a PTR record (RFC 6762 section 8.3), and no other record, that points from
+    """Announces one PTR record and no other record (RFC 6762 section 8.3). The record points from
     `service_type` in the domain "local" to a name. `target_labels` are the labels of that name.
     `seconds` is the record's time to live; 0 withdraws the record."""
     name = _labels(*service_type.encode().split(b"."), b"local")

@@ -34,7 +34,7 @@ class NetServiceTest : public ::testing::Test {
   NetServiceRef service = Network::service("Kestrel", "_ipp._tcp.");
 };
 
-TEST_F(NetServiceTest, ABrowseThatCannotStartLeavesNoBrowser) {
+TEST_F(NetServiceTest, ABrowseThatTheSystemRefusesLeavesNoBrowser) {
   NetServiceBrowserRef browser;
   ASSERT_EQ(KSNetServiceBrowserStart(browser, "", "_ipp._tcp.", &recordingCallbacks()), 0);
   const NetServiceBrowserRef first = browser;
@@ -74,7 +74,7 @@ TEST_F(NetServiceTest, AResolveHasNoTimeLimitAndIsRetriedUntilItSucceeds) {
   EXPECT_EQ(KSNetServiceCancelResolve(nullptr), 1);
 }
 
-TEST_F(NetServiceTest, IPv4AddressesAreListedInOrderWithDuplicatesAndIPv6AddressesAreNot) {
+TEST_F(NetServiceTest, TheListHasEveryIPv4AddressInOrderAndNoIPv6Address) {
   EXPECT_EQ(KSNetServiceCopyIPv4Addresses(nullptr), std::nullopt);
   Network::fill(service, {ipv6Address()}, {});
   EXPECT_EQ(KSNetServiceCopyIPv4Addresses(service), std::nullopt);

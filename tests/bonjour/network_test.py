@@ -1,8 +1,8 @@
 """Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM
 
-The tests run on one of two hosts, which two cables join, with IPv4 and IPv6. On the other host,
-Avahi announces devices. On this host, one test announces a device with another mDNS implementation,
-zeroconf."""
+The tests run on one of two hosts. Two cables, each with IPv4 and IPv6, join the hosts. On the other
+host, Avahi announces devices. On this host, one test announces a device with another mDNS
+implementation, zeroconf."""
 
 import os
 import pathlib
@@ -96,7 +96,7 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Harrier (2)")[3:7:3],
                              ["Harrier Jet 7", "192.0.2.1"])
             responder.update_service(service(b"Jet 8"))
-            # Avahi notices the change after a while, but a running search never does.
+            # Avahi notices the change after a while. Only a new search then reports it.
             model = None
             deadline = time.monotonic() + discovery.PATIENCE
             while model != "Harrier Jet 8" and time.monotonic() < deadline:

@@ -11,7 +11,7 @@ namespace {
 
 using recording::MediumFolder;
 
-TEST(FullPath, IsRelativeToTheFolderThatHoldsTheBundle) {
+TEST(FullPath, BeginsWithTheFolderThatHoldsTheBundle) {
   const std::tuple<const char*, std::optional<std::string>, const char*> cases[] = {
       {"/Volumes/Disc/Setup.app", "MacResources/Images", "/Volumes/Disc/MacResources/Images"},
       {"/Setup.app", "MacResources/Images", "/MacResources/Images"},
@@ -65,7 +65,7 @@ TEST(ModelRecord, IsReadFromTheModelInformation) {
   EXPECT_EQ(KSOROSXModel::initWithName("Other", info), record("Other", "", true, false, false));
   EXPECT_EQ(KSOROSXModel::initWithName("Odd", std::nullopt), record("Odd", "", true, false, false));
   EXPECT_EQ(KSOROSXModel::initWithName("Nameless", info), (Dictionary{{"name", "Nameless"}}))
-      << "the record of a model without an identifier has only the name";
+      << "the record of a listed model without an identifier has only the name";
   EXPECT_EQ(KSOROSXModel::initWithName(std::nullopt, info), Dictionary());
 }
 

@@ -1,5 +1,5 @@
-// Compares the results with the network configuration of the kernel. Runs as root in a new network
-// namespace; see tests/in_namespace.
+// Compares what netconfig/ and the dynamic store report with the network configuration of the
+// kernel. Runs as root in a new network namespace; see tests/in_namespace.
 
 #include <gmock/gmock.h>
 

@@ -1,5 +1,5 @@
-// Tests rules that cannot be tested with the kernel's configuration. kernel_test.cpp tests the
-// others.
+// Tests netconfig/ with a simulated dynamic store. kernel_test.cpp tests it with the kernel's
+// configuration.
 
 #include <gtest/gtest.h>
 

@@ -68,7 +68,7 @@ TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
       {"two million elements", plistWith("<array>" + repeated("<true/>", 2000000) + "</array>")},
       {"a text of a million entities",
        plistWith("<string>" + repeated("&amp;", 1000000) + "</string>")},
-      {"a dictionary of 100,000 keys that hash alike",
+      {"a dictionary of 100,000 equal keys",
        plistWith("<dict>" + repeated("<key>aa</key><true/>", 100000) + "</dict>")},
       {"a file of 17 MiB", plistWith("<string>" + std::string(17 << 20, 'x') + "</string>")},
       {"shared references that grow to 10^13 objects", arrays(13, 10)},
@@ -81,7 +81,7 @@ TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
                                          repeated(bigEndian(3), 200000)
                                    : "\x5F\x12" + bigEndian(1000000, 4) + std::string(1000000, 'x');
                       })},
-      {"a list that holds itself",
+      {"two arrays that hold each other",
        dictionaryOver(2, [](std::size_t i) { return "\xA1" + bigEndian(5 - i); })}};
   // Each file is loaded in a process of its own, whose peak memory shows what the loading costs.
   rusage usage{};

@@ -45,7 +45,7 @@ TEST(StringsTable, IsNothingWhenItBreaksTheGrammarAnywhere) {
   }
 }
 
-TEST(StringsTable, IsReadInEveryFormThatMediaUse) {
+TEST(StringsTable, IsReadFromTextAndFromXMLAndBinaryLists) {
   const Dictionary expected{{"k", "次"}};
   const TemporaryFolder folder;
   ASSERT_TRUE(writeDictionaryAtomically(expected, folder / "xml"));

@@ -23,7 +23,7 @@ std::vector<std::uint8_t> written(Put put) {
   return {bytes.end() - static_cast<std::ptrdiff_t>(out.size()), bytes.end()};
 }
 
-TEST(Integers, TakeTheFewestBytesAndAreSignExtendedByTheirSize) {
+TEST(Integers, TakeTheFewestBytesAndSizeDecidesHowTheyAreSignExtended) {
   // Each row has the number, its encoding, and the results of ber_get_int() and ber_get_uint().
   // ber_put_int() sets its argument to the last one, too.
   const std::tuple<std::int64_t, const char*, std::int64_t, std::uint64_t> cases[] = {
@@ -75,7 +75,7 @@ TEST(Lengths, HaveThreeFormsAndNoOther) {
   }
 }
 
-TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255Bytes) {
+TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255BytesOfContent) {
   const auto put = [](std::vector<std::uint16_t> arcs) {
     const auto count = static_cast<std::uint16_t>(arcs.size());
     return written([&](ber_writer& out) { return ber_put_oid(out, {count, count, arcs.data()}); });
@@ -244,8 +244,8 @@ TEST(Encoding, RefusesMessagesThatExceedTheBufferOr16BitLengths) {
   EXPECT_TRUE(m.encode().empty());
 }
 
-// Returns the parts of a message as net-snmp reads them: the PDU's type, the request identifier,
-// and the type and value of each binding.
+// Returns what net-snmp finds in a message: the PDU's type, the request identifier, and the type
+// and value of each binding. Returns "refused" when net-snmp cannot read the message.
 std::string readByNetSnmp(std::vector<std::uint8_t> bytes) {
   netsnmp_session session{};
   snmp_sess_init(&session);
@@ -267,7 +267,7 @@ std::string readByNetSnmp(std::vector<std::uint8_t> bytes) {
   return text;
 }
 
-TEST(NetSnmpReads, TheProgramsRequest) {
+TEST(NetSnmpReads, RequestsWithAndWithoutABinding) {
   Message m(1);
   ASSERT_EQ(m.decode(realReply()), SNMP_OK);
   snmp_message_init(m.message, 1);

@@ -9,7 +9,7 @@
 
 namespace onramp {
 
-/// Returns the bytes that `text` has in hexadecimal. Spaces are ignored.
+/// Returns the bytes that the hexadecimal digits in `text` stand for. Spaces are ignored.
 inline std::vector<std::uint8_t> hex(std::string_view text) {
   std::vector<std::uint8_t> bytes;
   int digits = 0;
@@ -29,8 +29,8 @@ inline std::vector<std::uint8_t> realReply() {
       "06 0f 2b 06 01 04 01 a1 12 02 04 04 89 58 01 02 00 02 01 02");
 }
 
-/// Returns a reply to request 7 with `bindings`, at most 255 bytes, as hexadecimal text. Some of
-/// the declared lengths in the reply are 0.
+/// Returns the bytes of a reply to request 7. `bindings` is the hexadecimal text of the reply's
+/// bindings, at most 255 bytes. Some of the declared lengths in the reply are 0.
 inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8_t errorStatus = 0,
                                            std::uint8_t errorIndex = 0) {
   const auto list = hex(bindings);

@@ -1,4 +1,4 @@
-// Queries simulated agents; see tests/recording/agents.h.
+// Sends queries, get and set requests to simulated agents; see tests/recording/agents.h.
 
 #include "snmp/query.h"
 
@@ -100,7 +100,7 @@ TEST_F(Query, BuildsTheResultFromTheValuesThatATableAsksFor) {
   EXPECT_EQ(ask(replyWith("")), "nothing 0 0");
 }
 
-TEST_F(Query, SendsTheNextIdentifierAndWaitsAtMostTwoSeconds) {
+TEST_F(Query, SendsTheNextIdentifierAndLimitsEachWaitToTwoSeconds) {
   EXPECT_EQ(kFirstIdentifier, 0);
   agents.answers["127.0.1.2"] = {2};
   bool noReply = false;
@@ -126,7 +126,7 @@ TEST_F(Query, ReportsAFailedRequestAsNoReplyButNotANullArgument) {
   EXPECT_EQ(outcome(&active_interface_table), kNoReply);
 }
 
-TEST_F(Query, AsksForTheNameOfTheLatestReply) {
+TEST_F(Query, KeepsTheShorterNameOfAReplyAndThenRefusesALongerOne) {
   reply(replyWith("30 00 06 05 2B 06 01 04 01 02 01 02"));
   EXPECT_EQ(outcome(&active_interface_table), "ActiveIF 2 0 0");
   EXPECT_EQ(active_interface_table.entries[0].oid.count, 6);
@@ -224,8 +224,8 @@ class GetSet : public testing::Test {
 
 TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
-  // Each row has the reply's bindings, the capacity of the second slot, and its contents
-  // afterwards. A refused reply does not change the contents.
+  // Each row has the reply's bindings, the capacity of the second slot, and the contents of that
+  // slot afterwards. A refused reply does not change the second slot.
   const std::tuple<const char*, std::string, std::uint16_t, std::string> cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},

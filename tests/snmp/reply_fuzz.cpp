@@ -1,6 +1,7 @@
 // Uses each input as an agent's reply to a query, a get and a set. Nothing may be written past the
 // storage that the caller provides. That storage has no spare room, so the sanitizers report a
-// write past its end. If the input can be decoded, the message is also encoded and decoded again.
+// write past its end. An input that can be decoded is also encoded and decoded again, unless it
+// contains a value or a name for which that cannot work.
 
 #include <algorithm>
 #include <array>
@@ -57,8 +58,8 @@ void exchangeStrings(bool set) {
     require(octets[i].length <= texts[i].size(), "a string fits in its slot");
 }
 
-// Returns whether the decoder can read `binding` after the encoder has written it. The decoder
-// cannot read unknown types, which are written without a value, and unsigned numbers of 2^31 or
+// Returns whether the decoder can read `binding` after the encoder has written it. The decoder can
+// read neither unknown types, which are written without a value, nor unsigned numbers of 2^31 or
 // more, which take 5 bytes.
 bool isReadable(const snmp_varbind& binding) {
   const std::uint64_t type = binding.type;
