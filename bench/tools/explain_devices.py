@@ -1,9 +1,9 @@
 #!/usr/bin/python3
-"""Compares onramp-devices with avahi-browse on a small and on a large network.
+"""Compares onramp-devices with avahi-browse and snmpget on networks of several sizes.
 
-In each round, measures the time until onramp-devices has explained every device, and the time until
-avahi-browse has resolved the same devices. The peer's time is the second of these times plus the
-time of the slowest snmpget, which is measured once for each size of the network.
+Each round measures two times: the time until onramp-devices has explained every device, and the
+time until avahi-browse has resolved the same devices. Before the rounds, one snmpget for each
+device is measured. The slowest of them is added to each time of avahi-browse.
 """
 
 import os
@@ -94,7 +94,7 @@ def measure(program, medium, counts, rounds, report):
             peer.append(avahi_seconds(count) + answer)
             ours.append(explained_seconds(program, medium, count))
         report.add(Case("Explanation of every device", f"{count} device{'s' * (count > 1)}",
-                        "avahi-browse and an answer", "s", ours, peer, axis="devices", size=count))
+                        "avahi-browse and snmpget", "s", ours, peer, axis="devices", size=count))
 
 
 def make_medium(folder, build):

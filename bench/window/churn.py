@@ -54,11 +54,13 @@ class Devices(threading.Thread):
             raise self._failure
 
     def wireless(self):
-        """Returns the names of the wireless devices that are there. Callable only after rest()."""
+        """Returns the names of the wireless devices that are there. Call this only between
+        rest() and resume()."""
         return sorted(name for name, answer in self._present.items() if answer == 2)
 
     def bounds(self, moment):
-        """Returns how many rows a search since `moment` must have, and how many it may have."""
+        """Returns the least and the greatest number of devices that a search may list if it began
+        at the time `moment` and ends now. Call this only while the changes go on."""
         with self._allowed:
             changed = [name for when, name, _ in self.changes if when >= moment]
             there = sum(answer == 2 for name, answer in self._present.items()
@@ -88,7 +90,8 @@ class Devices(threading.Thread):
         self.changes.append((time.monotonic(), name, change))
 
     def near(self, silence):
-        """Returns words about the changes from a second before the silence until its end."""
+        """Returns a text that names the devices that came or left from a second before `silence`
+        until its end, each with the time since the silence began."""
         return ", ".join(f"{name} {change} at {when - silence.began:+.2f} s"
                          for when, name, change in self.changes
                          if -1 < when - silence.began < silence.seconds)

@@ -4,7 +4,8 @@
 The wizard's time is that from the key press that starts a search until the list has all wireless
 devices. The tools' time is the time until avahi-browse has resolved the same devices, plus the time
 of one snmpget for each device. A search ends after its first pause of three seconds if a device is
-listed by then. If the list does not get all devices, this network and the larger ones are left out.
+listed by then. The networks have several sizes. If a list does not get all devices, this
+size and the larger ones are left out.
 """
 
 import os

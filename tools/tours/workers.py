@@ -16,7 +16,7 @@ from .facts import Facts, Unsuitable
 
 INSIDE = "--inside"
 _TOOLS = pathlib.Path(__file__).resolve().parents[1]
-_AT_A_TIME = 3  # a search is mostly waiting
+_AT_A_TIME = 3  # more than most machines have processors, because a search mostly waits
 
 
 def run(arguments, on_network=True, **options):
@@ -27,7 +27,8 @@ def run(arguments, on_network=True, **options):
 
 
 def take_tours(medium, original, pictures, languages, options):
-    """Takes the tours and writes the index. Returns the exit status.
+    """Takes the tours and writes the index. First removes all pictures (*.png) from the folder
+    `pictures`. Returns the exit status.
 
     `original` is the folder that onramp-check reads: `medium`, or the folder to which the links in
     `medium` lead.
@@ -45,8 +46,8 @@ def take_tours(medium, original, pictures, languages, options):
     folder.mkdir(parents=True, exist_ok=True)
     for old in folder.glob("*.png"):
         old.unlink()
-    print(f"Walking through {len(wanted)} language{'s'[len(wanted) == 1:]}, {_AT_A_TIME} at a time.",
-          flush=True)
+    print("Walking through one language." if len(wanted) == 1 else
+          f"Walking through {len(wanted)} languages, {_AT_A_TIME} at a time.", flush=True)
     with tempfile.TemporaryDirectory() as results:
         orders = [{"medium": medium, "original": original, "pictures": pictures, "language": language,
                    "options": options, "has_network": status == 0,
