@@ -165,6 +165,8 @@ MISTAKES = [
     # Systems and packages.
     (packages(v109=1), "package-none", "no package for 10.6.0 up to, but not including, 10.9.0"),
     (put(COMMON, "PkgInfo", "PkgName", "None.pkg"), "path-missing", "Packages/None.pkg"),
+    (both(packages(v106=1, v107=1, v108=1, v109=1), put(COMMON, "PkgInfo", "108", Path(PACKAGE).stem + "2.pkg")),
+     "path-missing", "put it at that path, or correct the path"),
     (put(COMMON, "PkgInfo", "109", "Old.pkg"), "package-shadowed", '"109"', "every system gets"),
     (put(COMMON, "PkgInfo", "110", "New.pkg"), "package-key-unknown", "no system uses"),
     (packages(v105=1, v106=1, v107=1, v108=1, v109=1), "package-key-unused", "outside"),

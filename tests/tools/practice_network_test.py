@@ -164,6 +164,9 @@ class FromOutside(unittest.TestCase):
                 self.assertEqual(result.returncode, 2)
                 self.assertRegex(result.stderr, message)
                 self.assertIn(path, result.stderr)
+        result = run(TOOL, path, "true", env=os.environ | {"ONRAMP_MAKER": "/nowhere"})
+        self.assertEqual(result.returncode, 2)
+        self.assertRegex(result.stderr, "^practice-network: /nowhere: cannot be read.*ONRAMP_MAKER")
 
     @unittest.skipIf(os.getuid(), "without sudo on the path, only root gets that far")
     def test_a_missing_program_is_reported_with_its_package(self):

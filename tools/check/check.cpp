@@ -38,6 +38,7 @@ Report checkMedium(const std::string& root) {
   checkTool(files, lists);
   checkTexts(files, lists);
   checkPictures(files);
+  files.withdrawUsedNames();
   files.addLines();
   return report;
 }

@@ -50,6 +50,10 @@ std::optional<std::vector<std::string>> components(const std::string& path) {
   return parts;
 }
 
+std::string joined(const std::string& folder, const std::string& name) {
+  return folder.empty() ? name : folder + "/" + name;
+}
+
 bool isInside(const std::string& path, const std::string& root) {
   std::error_code error;
   const fs::path real = fs::canonical(path, error);
@@ -64,14 +68,15 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
-// `nearest` is a name on the medium that resembles `missing`. `isWritten` says whether `missing` is
-// written in a file on the medium, and not fixed in the wizard.
+// `nearest` is a name on the medium that resembles `missing`, if there is one. `isWritten` says
+// whether `missing` is written in a file on the medium, and not fixed in the wizard.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
                              bool isWritten) {
   if (!nearest)
     return isWritten ? "put it at that path, or correct the path" : "put it at that path";
-  const std::string rename = "rename the file to " + quoted(missing);
-  return isWritten ? "write " + quoted(*nearest) + ", or " + rename : rename;
+  const std::string rename = "rename " + quoted(*nearest) + " to " + quoted(missing);
+  return "put it at that path, or " + rename +
+         (isWritten ? ", or write " + quoted(*nearest) : std::string());
 }
 
 // Adds to `finding` the reason why the wizard cannot read `bytes`, a file's contents, and the
@@ -137,12 +142,16 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
                     : ", which does not exist");
       finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
                                         : quoted(part) + " in " + quoted(folder);
-      if (nearest) finding.nearest = *nearest;
+      if (nearest) {
+        finding.nearest = *nearest;
+        guesses_.push_back({report_.findings.size(), joined(folder, *nearest), part});
+      }
       finding.remedy = remedyForMissing(part, nearest, !use.place.key.empty());
       report_.findings.push_back(std::move(finding));
       return false;
     }
-    folder += (folder.empty() ? "" : "/") + part;
+    folder = joined(folder, part);
+    used_.insert(folder);
   }
   return true;
 }
@@ -217,6 +226,15 @@ std::optional<Dictionary> MediumFiles::strings(const std::string& relative,
   auto table = loadStringsTable(fullPath(relative));
   if (!table) reportUnreadable(relative, use, true);
   return table;
+}
+
+void MediumFiles::withdrawUsedNames() const {
+  for (const Guess& guess : guesses_) {
+    Finding& finding = report_.findings[guess.finding];
+    if (finding.id != "path-missing" || !used_.contains(guess.path)) continue;
+    finding.nearest.clear();
+    finding.remedy = remedyForMissing(guess.missing, std::nullopt, !finding.place.key.empty());
+  }
 }
 
 void MediumFiles::addLines() const {

@@ -2,6 +2,7 @@
 
 #include <map>
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -53,11 +54,21 @@ class MediumFiles {
   /// folder cannot be read.
   [[nodiscard]] std::vector<std::string> names(const std::string& relative) const;
 
+  /// Removes each proposal to use another file in place of a missing one, if that file has been
+  /// found under its own name, because something else needs it. Call this after all the checks.
+  void withdrawUsedNames() const;
+
   /// Adds line numbers to the report's findings about keys of XML property lists, where the lines
   /// are known.
   void addLines() const;
 
  private:
+  struct Guess {
+    std::size_t finding = 0;  ///< the index in the report's findings
+    std::string path{};       ///< of the file that was probably meant
+    std::string missing{};
+  };
+
   void reportUnreadable(const std::string& relative, const PathUse& use, bool isStrings) const;
 
   const XMLLines& linesOf(const std::string& relative) const;
@@ -65,6 +76,8 @@ class MediumFiles {
   std::string root_;
   std::string application_;
   Report& report_;
+  mutable std::set<std::string> used_;  ///< every path that exists() has found
+  mutable std::vector<Guess> guesses_;
   mutable std::map<std::string, XMLLines>
       lines_;  ///< by the relative path of the property list; filled by linesOf()
 };

@@ -10,7 +10,8 @@
 
 namespace onramp::check {
 
-/// A model, and the connections that the wizard offers for it.
+/// A model, and its connections as the medium gives them. The wizard may offer a cable that the
+/// model lacks.
 struct ModelRow {
   std::string name{};
   bool usb = false;

@@ -6,15 +6,30 @@ import pathlib
 import signal
 import socket
 import subprocess
+import sys
 import threading
 import time
 
 from practice_network.description import CLOSED, MISSING, SILENT, TEXT
 
-MAKER = json.loads(pathlib.Path(os.environ.get("ONRAMP_MAKER")
-                                or pathlib.Path(__file__).parents[2] / "maker.json").read_text())
-COMMUNITY = MAKER["snmpCommunity"]
-OBJECT = MAKER["activeIFObject"]
+
+def maker_settings():
+    """Returns the community and the object of the maker's settings. Ends the program with status 2
+    and a message if the file does not give them."""
+    path = (os.environ.get("ONRAMP_MAKER") or pathlib.Path(__file__).parents[2] / "maker.json")
+    try:
+        maker = json.loads(pathlib.Path(path).read_text(encoding="utf-8"))
+        return maker["snmpCommunity"], maker["activeIFObject"]
+    except OSError as error:
+        problem = f"cannot be read: {error.strerror}"
+    except (ValueError, KeyError, TypeError):
+        problem = 'is not JSON with the texts "snmpCommunity" and "activeIFObject"'
+    print(f"practice-network: {path}: {problem}; set ONRAMP_MAKER to a copy of maker.json, "
+          "or unset it", file=sys.stderr)
+    sys.exit(2)
+
+
+COMMUNITY, OBJECT = maker_settings()
 PORT = 161
 # With only these modules, an agent starts in about 15 ms and opens no socket for sub-agents.
 MODULES = "override,pass,vacm_conf,vacm_context"
