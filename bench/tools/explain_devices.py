@@ -3,7 +3,7 @@
 
 Each round measures two times: the time until onramp-devices has explained every device, and the
 time until avahi-browse has resolved the same devices. Before the rounds, one snmpget for each
-device is measured. The slowest of them is added to each time of avahi-browse.
+device that answers is measured. The slowest of them is added to each time of avahi-browse.
 """
 
 import os

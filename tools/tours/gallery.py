@@ -63,7 +63,7 @@ def take_all(folder, pictures, network):
     """Takes the pictures of a crowded copy of the medium in `folder`. `network` is a practice
     network without devices. Returns the exit status."""
     pictures = pathlib.Path(pictures)
-    for old in pictures.glob("*.png"):
+    for old in pictures.glob("*pt-[1-7]-*.png"):
         old.unlink()
     with tempfile.TemporaryDirectory() as copies, Desktop() as desktop:
         copy = crowded.make(folder, pathlib.Path(copies) / "medium")

@@ -16,7 +16,7 @@ from .facts import Facts, Unsuitable
 
 INSIDE = "--inside"
 _TOOLS = pathlib.Path(__file__).resolve().parents[1]
-_AT_A_TIME = 3  # more than most machines have processors, because a search mostly waits
+_AT_A_TIME = 3  # a tour mostly waits, so this many need little more time than one
 
 
 def run(arguments, on_network=True, **options):
@@ -27,8 +27,8 @@ def run(arguments, on_network=True, **options):
 
 
 def take_tours(medium, original, pictures, languages, options):
-    """Takes the tours and writes the index. First removes all pictures (*.png) from the folder
-    `pictures`. Returns the exit status.
+    """Takes the tours and writes the index. First removes the pictures of an earlier tour from the
+    folder `pictures`. Returns the exit status.
 
     `original` is the folder that onramp-check reads: `medium`, or the folder to which the links in
     `medium` lead.
@@ -36,18 +36,21 @@ def take_tours(medium, original, pictures, languages, options):
     began = time.monotonic()
     facts = Facts(original)
     wanted = _chosen(languages, medium)
+    folder = pathlib.Path(pictures)
+    folder.mkdir(parents=True, exist_ok=True)
+    if any(folder.glob("*.png")) and not (folder / "index.html").exists():
+        raise Unsuitable(f"{folder} has pictures, but no index.html of an earlier tour; "
+                         "empty the folder, or give another one")
     status = subprocess.run([sys.executable, _TOOLS / "practice-network", "/dev/null", "true"]).returncode
     if status not in (0, NO_NAMESPACE):
         return status
     if status == NO_NAMESPACE:
         print("A network of made-up devices cannot be created here (see above), "
               "so the tour goes only by cable.", flush=True)
-    folder = pathlib.Path(pictures)
-    folder.mkdir(parents=True, exist_ok=True)
     for old in folder.glob("*.png"):
         old.unlink()
     print("Walking through one language." if len(wanted) == 1 else
-          f"Walking through {len(wanted)} languages, {_AT_A_TIME} at a time.", flush=True)
+          f"Walking through {len(wanted)} languages, at most {_AT_A_TIME} at a time.", flush=True)
     with tempfile.TemporaryDirectory() as results:
         orders = [{"medium": medium, "original": original, "pictures": pictures, "language": language,
                    "options": options, "has_network": status == 0,
