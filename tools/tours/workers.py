@@ -47,6 +47,8 @@ def take_tours(medium, original, pictures, languages, options):
     if status == NO_NAMESPACE:
         print("A network of made-up devices cannot be created here (see above), "
               "so the tour goes only by cable.", flush=True)
+    # The next tour accepts the folder even if this one is interrupted.
+    (folder / "index.html").touch()
     for old in folder.glob("*.png"):
         old.unlink()
     print("Walking through one language." if len(wanted) == 1 else
