@@ -25,7 +25,7 @@ TIME, MEMORY = "Time from start to first page", "Peak memory at the first page"
 
 
 def measure(build, env, program):
-    """Returns a start's time in seconds and its peak memory in MiB."""
+    """Returns how long a start takes in seconds, and its peak memory in MiB."""
     line = subprocess.run([build / "bench/app/time_to_window", program], env=env, check=True,
                           stdout=subprocess.PIPE, text=True).stdout
     milliseconds, kibibytes = line.split()
