@@ -66,9 +66,9 @@ class ArrayController {
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 
   /// Binds a table to the list. Calls `onChange` at once, and from then on after every change of
-  /// the entries and every call of rearrange() and removeAllObjects(). `onSelect` is called after every call
-  /// of setSelectionIndex(), setSelectedObject(), choose() and chooseObject(). A later call of
-  /// bind() replaces both functions. Empty functions unbind the table.
+  /// the entries and every call of rearrange() and removeAllObjects(). `onSelect` is called after
+  /// every call of setSelectionIndex(), setSelectedObject(), choose() and chooseObject(). A later
+  /// call of bind() replaces both functions. Empty functions unbind the table.
   void bind(std::function<void()> onChange, std::function<void()> onSelect);
 
  private:
