@@ -11,8 +11,8 @@
 
 namespace onramp {
 
-/// Holds a list's entries, their order and the selection. A table that is bound to the controller
-/// shows the list and is told of every change. All functions except arrangedCount() must be called
+/// Holds a list's entries, their order and the selection. A bound table shows the list, and the
+/// controller reports every change to this table. All functions except arrangedCount() must be called
 /// on the main thread.
 class ArrayController {
  public:

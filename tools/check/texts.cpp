@@ -241,8 +241,8 @@ class TextCheck {
     report_.findings.push_back(std::move(finding));
   }
 
-  // Reports languages of the message bundle in which the application has no texts of its own. The
-  // message bundle cannot supply the application's texts.
+  // Reports each language that the message bundle has and the application lacks. The message bundle
+  // cannot supply the application's texts.
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";

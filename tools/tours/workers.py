@@ -27,8 +27,8 @@ def run(arguments, on_network=True, **options):
 
 
 def take_tours(medium, original, pictures, languages, options):
-    """Takes the tours and writes the index. First removes the pictures of an earlier tour from the
-    folder `pictures`. Returns the exit status.
+    """Takes the tours and writes the index. First removes all pictures from the folder
+    `pictures`, but refuses a folder with pictures that has no index. Returns the exit status.
 
     `original` is the folder that onramp-check reads: `medium`, or the folder to which the links in
     `medium` lead.
