@@ -12,8 +12,8 @@
 namespace onramp {
 
 /// Holds a list's entries, their order and the selection. A bound table shows the list, and the
-/// controller reports every change to this table. All functions except arrangedCount() must be called
-/// on the main thread.
+/// controller reports every change to this table. All functions except arrangedCount() must be
+/// called on the main thread.
 class ArrayController {
  public:
   /// Makes rearrange() sort the entries by their strings under `key`. An entry that has no string
