@@ -21,7 +21,7 @@ from onscreen import messages
 from onscreen.desktop import Desktop
 from onscreen.processes import start, stop
 from practice_network import PracticeNetwork
-from practice_network.agents import COMMUNITY, OBJECT
+from practice_network.agents import maker_settings
 from report.cases import Case, Report, parser
 
 COUNTS, QUICK_COUNTS = (1, 10, 50, 100, 200), (1, 50, 100)
@@ -41,8 +41,9 @@ def time_of_tools(count):
         fields = browser.stdout.readline().split(";")
         if fields[0] == "=":
             addresses[fields[3]] = fields[7]
+    community, snmp_object = maker_settings()
     for address in addresses.values():
-        subprocess.run(["snmpget", "-v1", "-c", COMMUNITY, address, OBJECT], check=True,
+        subprocess.run(["snmpget", "-v1", "-c", community, address, snmp_object], check=True,
                        stdout=subprocess.DEVNULL, env=os.environ | {"MIBS": ""})
     passed = time.monotonic() - began
     stop(browser)

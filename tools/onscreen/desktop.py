@@ -133,13 +133,13 @@ class Desktop:
             if name in os.environ:
                 self.env[name] = os.environ[name]
 
-    def _start(self, arguments, package, **options):
-        process = start(arguments, package, env=self.env, stderr=subprocess.DEVNULL, **options)
+    def _start(self, arguments, **options):
+        process = start(arguments, _PROGRAMS[arguments[0]], env=self.env, stderr=subprocess.DEVNULL, **options)
         self._processes.append(process)
         return process
 
     def _start_bus(self):
-        bus = self._start(["dbus-daemon", "--session", "--nofork", "--print-address"], "dbus",
+        bus = self._start(["dbus-daemon", "--session", "--nofork", "--print-address"],
                           stdout=subprocess.PIPE, text=True)
         address = bus.stdout.readline().strip()
         if not address:
@@ -150,13 +150,13 @@ class Desktop:
         display = self._start(
             ["Xvfb", f":{_free_display()}", "-displayfd", "1", "-screen", "0", f"{self._size}x24",
              "-noreset", "-nolisten", "tcp"],
-            "xvfb", stdout=subprocess.PIPE, text=True)
+            stdout=subprocess.PIPE, text=True)
         number = display.stdout.readline().strip()
         if not number:
             raise Missing("Xvfb did not start a display")
         self.env["DISPLAY"] = f":{number}"
         if not self._window_manager:
             return
-        self._start(["openbox", "--sm-disable"], "openbox", stdout=subprocess.DEVNULL)
+        self._start(["openbox", "--sm-disable"], stdout=subprocess.DEVNULL)
         wait_for(lambda: "_NET_SUPPORTING_WM_CHECK(WINDOW)" in
                  self.run(["xprop", "-root", "_NET_SUPPORTING_WM_CHECK"]), 10, "openbox to start")

@@ -1,22 +1,23 @@
 """The SNMP side of the devices: a net-snmp agent for each address that answers."""
 
+import functools
 import json
 import os
 import pathlib
 import signal
 import socket
 import subprocess
-import sys
 import threading
 import time
 
-from practice_network.description import CLOSED, MISSING, SILENT, TEXT
+from practice_network.description import CLOSED, MISSING, SILENT, TEXT, DescriptionError
 
 
+@functools.cache
 def maker_settings():
-    """Returns the community and the object of the maker's settings. Ends the program with status 2
-    and a message if the file does not give them."""
-    path = (os.environ.get("ONRAMP_MAKER") or pathlib.Path(__file__).parents[2] / "maker.json")
+    """Returns the SNMP community and object of the maker's settings. Raises DescriptionError if
+    their file does not give them."""
+    path = os.environ.get("ONRAMP_MAKER") or pathlib.Path(__file__).parents[2] / "maker.json"
     try:
         maker = json.loads(pathlib.Path(path).read_text(encoding="utf-8"))
         return maker["snmpCommunity"], maker["activeIFObject"]
@@ -24,12 +25,9 @@ def maker_settings():
         problem = f"cannot be read: {error.strerror}"
     except (ValueError, KeyError, TypeError):
         problem = 'is not JSON with the texts "snmpCommunity" and "activeIFObject"'
-    print(f"practice-network: {path}: {problem}; set ONRAMP_MAKER to a copy of maker.json, "
-          "or unset it", file=sys.stderr)
-    sys.exit(2)
+    raise DescriptionError(f"{path}: {problem}; set ONRAMP_MAKER to a copy of maker.json, or unset it")
 
 
-COMMUNITY, OBJECT = maker_settings()
 PORT = 161
 # With only these modules, an agent starts in about 15 ms and opens no socket for sub-agents.
 MODULES = "override,pass,vacm_conf,vacm_context"
@@ -128,14 +126,15 @@ class _Agent:
         self.address = address
         self._log = folder / f"{address}.log"
         configuration = folder / f"{address}.conf"
-        lines = [f"rocommunity {COMMUNITY}", f"agentAddress udp:{address}:{PORT}"]
+        community, snmp_object = maker_settings()
+        lines = [f"rocommunity {community}", f"agentAddress udp:{address}:{PORT}"]
         if delay:
             script = folder / f"{address}.sh"
             script.write_text(_slow_script(activeif, delay))
             script.chmod(0o755)
-            lines.append(f"pass .{OBJECT.rsplit('.', 1)[0]} {script}")
+            lines.append(f"pass .{snmp_object.rsplit('.', 1)[0]} {script}")
         elif activeif != MISSING:
-            lines.append(f"override {OBJECT} {_override(activeif)}")
+            lines.append(f"override {snmp_object} {_override(activeif)}")
         configuration.write_text("\n".join(lines) + "\n")
         self._process = subprocess.Popen(
             ["snmpd", "-f", "-C", "-c", configuration, "-I", MODULES, "-Lf", self._log],
@@ -167,7 +166,8 @@ def _override(activeif):
 def _slow_script(activeif, delay):
     """Returns a script that net-snmp runs for the object. After `delay` seconds, the script prints
     the object's name, type and value, or nothing if the agent lacks the object."""
-    answer = {MISSING: "", TEXT: f".{OBJECT}\nstring\ntwo"}.get(
-        activeif, f".{OBJECT}\ninteger\n{activeif}")
-    return f"#!/bin/sh\nsleep {delay}\n[ \"$1\" = -g ] && [ \"$2\" = .{OBJECT} ] || exit 0\n" \
+    _, snmp_object = maker_settings()
+    answer = {MISSING: "", TEXT: f".{snmp_object}\nstring\ntwo"}.get(
+        activeif, f".{snmp_object}\ninteger\n{activeif}")
+    return f"#!/bin/sh\nsleep {delay}\n[ \"$1\" = -g ] && [ \"$2\" = .{snmp_object} ] || exit 0\n" \
            f"cat <<'END'\n{answer}\nEND\n"

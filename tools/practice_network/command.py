@@ -9,7 +9,7 @@ import sys
 import textwrap
 import tomllib
 
-from practice_network import description
+from practice_network import agents, description
 from practice_network.control import ControlError, PracticeNetwork
 from practice_network.description import DescriptionError
 
@@ -122,6 +122,7 @@ def _run(program, arguments):
 
     try:
         description.load(options.description)
+        agents.maker_settings()
     except DescriptionError as error:
         return _complain(error, BAD_INPUT)
     if os.getuid() != 0:
