@@ -27,8 +27,8 @@ enum class ToolStart { kAutomatic, kManual };
 
 /// The wizard's only controller. It owns the pages, remembers the user's choices, decides which
 /// page is shown and passes the choices to the installer package. The functions are grouped by the
-/// source file that defines them. All functions must be called on the main thread, except
-/// waitDeviceSearchTask() and listedDevices().
+/// source file that defines them. All functions except waitDeviceSearchTask() and listedDevices()
+/// must be called on the main thread.
 class OnrampOSXAppDelegate final : public ApplicationDelegate {
  public:
   OnrampOSXAppDelegate();
@@ -77,42 +77,43 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // navigation.cpp: pages and buttons.
 
-  /// Loads the page from the interface file `name`. Returns null when the file is missing or
-  /// unreadable, or holds no view.
+  /// Loads the page from the interface file `name`. Returns null when the file is missing, cannot
+  /// be read or contains no view.
   [[nodiscard]] std::shared_ptr<Page> loadView(const std::string& name);
 
-  /// Removes the page that is shown, then shows `page`. When `page` is null, loads a new page from
-  /// the interface file `name` and shows that page. If the page cannot be loaded, the window shows
-  /// no page.
+  /// Replaces the current page with `page`. If `page` is null, loads a new page from the interface
+  /// file `name` and shows that page instead. If this page cannot be loaded, the window shows no
+  /// page.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
-  /// Shows a new model list.
+  /// Shows a new model-list page.
   void showModelListView();
 
-  /// Shows a new connection page for `type`. Also tells the chooser, a ChooseDeviceView, which
-  /// models to look for: the model that the user has chosen or, if there is none, all models on
-  /// the medium.
+  /// Shows a new connection page for `type`. Also tells the chooser, the ChooseDeviceView, which
+  /// models to look for: the model that the user has chosen, or all models on the medium if the
+  /// user has chosen none.
   void showConnectionTypeView(ConnectionType type);
 
-  /// What this function does depends on the page that is shown:
-  /// - on the chooser, it searches again;
-  /// - on the connection page, while mIsWLANTool is false, it shows the chooser when the chooser
-  ///   lists a device, and otherwise starts the wireless set-up tool;
-  /// - in every other case, it shows the chooser and searches.
+  /// The effect depends on the current page:
+  /// - On the chooser, searches again.
+  /// - On the connection page, if mIsWLANTool is false: shows the chooser if it lists a device, and
+  ///   otherwise starts the wireless set-up tool.
+  /// - In all other cases, shows the chooser and searches.
   void showChooseDeviceView();
 
-  /// Shows `image` stretched over the window's background. Does nothing without an image.
+  /// Makes `image` the window's background, stretched to fit. Does nothing if `image` is nothing.
   void setBackGroundView(const std::optional<Image>& image);
 
-  /// Set the buttons' titles for a page, and show or hide each button. Every page has Next and
-  /// Cancel. The connection page also has Back if the user has chosen a model, and the chooser has
-  /// Back while mIsWLANTool is false. These functions neither enable nor disable a button.
+  /// Each of these functions sets up the buttons for one page: their titles, and whether they are
+  /// hidden. Every page has Next and Cancel. The connection page also has Back if the user has
+  /// chosen a model, and the chooser has Back if mIsWLANTool is false. None of these functions
+  /// enables or disables a button.
   void setModelListViewButton();
   void setConnentionTypeViewButton();
   void setChooseDeviceViewButton();
 
-  /// Each function sets the title of one button to the localized word in the function's name.
-  /// `titleKey` is the key of boundTexts() to which the button's title is bound.
+  /// Each of these functions gives a button the title "Cancel", "Back" or "Next" in the user's
+  /// language. The button is the one whose title is bound to the key `titleKey` of boundTexts().
   void setCancelButton(std::string_view titleKey);
   void setBackButton(std::string_view titleKey);
   void setNextButton(std::string_view titleKey);
@@ -120,8 +121,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void performAction(std::string_view action) override;
 
   // The buttons' actions. The rightmost button is Next. The button to its left is Back, or Cancel
-  // on a page without Back. The other two buttons always quit. When none of the three pages is
-  // shown, every button quits.
+  // on a page without Back. The other two buttons always quit. If the current page is neither the
+  // model list, the connection page nor the chooser, every button quits.
   void rightMostButtonClicked();
   void rightButtonClicked();
   void leftButtonClicked();
@@ -129,36 +130,37 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // system_check.cpp: does the medium support the running system?
 
-  /// The components of the running system's version; empty when the version is unknown.
+  /// Returns the components of the running system's version, or an empty list when the version is
+  /// unknown.
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
-  /// Compare the running system's version with one bound of the medium's range.
-  /// supportedOSMaxCheck() returns kNewerThanMaximum if isNewerThan() is true, and
-  /// supportedOSMinCheck() returns kOlderThanMinimum if isOlderThan() is true. Otherwise both
+  /// Each of these functions compares the running system's version with one bound of the range that
+  /// the medium supports. The first returns kNewerThanMaximum if isNewerThan() returns true, and
+  /// the second returns kOlderThanMinimum if isOlderThan() returns true. In all other cases, they
   /// return kSupported. Unlike installationCheck(), they do not skip a bound whose "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
-  /// Compares the running system's version with the medium's maximum and then with its minimum.
-  /// Skips a bound whose "Major" is 0. Returns kNewerThanMaximum or kOlderThanMinimum for the first
-  /// bound that the version violates, and otherwise kSupported.
+  /// Checks whether the running system's version is above the medium's maximum, and then whether it
+  /// is below the minimum. Skips a bound whose "Major" is 0. Returns kNewerThanMaximum,
+  /// kOlderThanMinimum or, if the version is in the range, kSupported.
   [[nodiscard]] SystemSupport installationCheck() const;
 
-  /// The medium's minimum version as text, such as "10.6.0".
+  /// Returns the oldest system version that the medium supports, such as "10.6.0".
   [[nodiscard]] std::string supportSystemMinString() const;
 
-  /// Shows an alert that says why the system is not supported, and returns when the user has
-  /// dismissed the alert. Does nothing for a supported system. `parent` is not used.
+  /// Shows an alert that says why the system is not supported. Returns when the user dismisses the
+  /// alert. Does nothing if `type` is kSupported. `parent` is not used.
   void showSystemNotSpecifiedAlert(const Window& parent, SystemSupport type) const;
 
-  // hand_off.cpp: the files that hand the choices to the installer package.
+  // hand_off.cpp: the files that pass the user's choices to the installer package.
 
   /// Returns the medium's vendor name without its spaces, or an empty text when the medium names no
   /// vendor.
   [[nodiscard]] static std::string setVenderName();
 
-  /// Returns the path of the package-options file, which tells the package what else to install. If
-  /// the file's folder is missing, creates it and makes it writable for every user. Ignores
+  /// Returns the path of the package-options file, which holds the options for the package. If the
+  /// file's folder is missing, creates the folder and makes it writable for every user. Ignores
   /// failures.
   [[nodiscard]] static std::string InstallPKGInfoURL();
 
@@ -166,17 +168,18 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// file's folder if it is missing. Ignores failures.
   [[nodiscard]] static std::string instmodelPlistURL();
 
-  /// Writes the package-options file: the options under "InstallPKG" in the medium description, and
-  /// the five standard options that docs/mastering-a-medium.md describes. Ignores failures.
+  /// Writes the package-options file. It holds the options under "InstallPKG" in the medium
+  /// description, and the five standard options that docs/mastering-a-medium.md describes. Ignores
+  /// failures.
   static void copyCDInfo();
 
   /// Returns the model file's contents for a device that is connected by a USB or Ethernet cable.
   [[nodiscard]] static Dictionary instmodelPlistNotWiFi(const std::string& model);
 
-  /// Returns the model file's contents for a wireless device with the KSDevice record `property`.
-  /// When there is no record, when the record lacks a name or an address, or when the medium names
-  /// no service type, returns instmodelPlistNotWiFi() for `model`, or for an empty name when
-  /// `model` is nothing.
+  /// Returns the model file's contents for the wireless device whose KSDevice record is `property`.
+  /// Falls back to instmodelPlistNotWiFi() when `property` is nothing or lacks a name or an
+  /// address, and when the medium names no service type. The fallback uses the name `model`, or an
+  /// empty name if `model` is nothing.
   [[nodiscard]] static Dictionary instmodelPlistWiFi(const std::optional<std::string>& model,
                                                      const std::optional<Dictionary>& property);
 
@@ -186,44 +189,43 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// package for the system, or when the package cannot be opened.
   bool launchPackage();
 
-  /// Returns at once, and terminates the application one second later. The delay gives the package
-  /// time to open.
+  /// Returns at once and terminates the application one second later, so that the package has time
+  /// to open.
   void quitMe();
 
-  /// Hide the application and return. Half a second later, the wireless set-up tool runs. Its exit
-  /// status decides what follows:
-  /// - 1: the wizard reappears. After an automatic start, it shows the connection page, with the
-  ///   wireless choice selected;
-  /// - 2: the application terminates;
-  /// - any other status, or none: the wizard reappears, shows the chooser and searches.
-  /// launchWLANToolAutomatically() is for a search that found no device, and
-  /// launchWLANToolManually() for the user's request.
+  /// Call the first function after a search that found no device, and the second when the user asks
+  /// for the wireless set-up tool. Both hide the wizard and return. Half a second later, the tool
+  /// runs. The wizard then acts on the tool's exit status:
+  /// - 1: It reappears. If the tool was started automatically, it shows the connection page with
+  ///   the wireless choice selected.
+  /// - 2: It terminates.
+  /// - Any other status, or a tool that cannot be run: It reappears, shows the chooser and
+  ///   searches.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 
-  /// Returns the URL of the support page for this medium and the user's language and country;
-  /// nothing when the URL would be invalid, for example because the medium's series code contains a
-  /// space.
+  /// Returns the URL of the support page for this medium and the user's language and country.
+  /// Returns nothing when the URL would be invalid, for example because the medium's series code
+  /// contains a space.
   [[nodiscard]] static std::optional<std::string> FAQ_URL();
 
-  /// Opens `url` in the user's browser. Does nothing without a URL.
+  /// Opens `url` in the user's browser. Does nothing if `url` is nothing.
   static void openURL(const std::optional<std::string>& url);
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop for at most kMostPauses pauses of length `pause`. The wait ends earlier
-  /// if the chooser lists a device at the end of a pause. Then ends the search. During the wait,
-  /// the user can neither click a button nor close the window, and `page` shows its spinner. `page`
-  /// may be null.
+  /// Waits in a modal loop until the chooser lists a device at the end of a pause, or until
+  /// kMostPauses pauses of length `pause` have passed. Then ends the search. During the wait, the
+  /// user can neither click a button nor close the window, and `page` shows its spinner. `page` may
+  /// be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Sleeps for at most kMostPauses pauses of length `pause`, and then ends the modal loop. Ends
-  /// the loop earlier if a device is listed at the end of a pause, or if the application
-  /// terminates. Must not be called on the main thread.
+  /// Sleeps for `pause` up to kMostPauses times, until the chooser lists a device or the
+  /// application terminates. Then ends the modal loop. Must not be called on the main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 
-  /// Calls showProgress() with the chooser as the page. Afterwards enables Next if a device is
-  /// listed. Otherwise disables Next and says in a sheet that no device was found.
+  /// Calls showProgress() with the chooser as the page. Then enables Next if a device is listed. If
+  /// not, disables Next and tells the user in a sheet that no device was found.
   void showProgressAtChooseDeviceView(std::chrono::seconds pause);
 
   /// Calls showProgressAtChooseDeviceView() with the number of seconds under kWaitTime in the
@@ -233,21 +235,21 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Tells the user in a sheet that no device was found, and returns at once.
   void showListAlertSheet();
 
-  /// Opens the support page if `returnCode` is kAlertOtherReturn, which stands for the sheet's
-  /// second button.
+  /// Opens the support page if `returnCode` is kAlertOtherReturn, that is, if the user clicked the
+  /// sheet's second button.
   void didEndCloseSheet(int returnCode);
 
  private:
   [[nodiscard]] static std::vector<std::string> allContainedModels();
 
-  /// The chooser, or null when its interface file was not usable.
+  /// Returns the chooser, or null when it could not be loaded.
   [[nodiscard]] ChooseDeviceView* chooser() const;
 
-  /// The number of devices that the chooser lists, or 0 when there is no chooser. Callable from any
-  /// thread.
+  /// Returns the number of devices that the chooser lists, or 0 when there is no chooser. Callable
+  /// from any thread.
   [[nodiscard]] std::size_t listedDevices() const;
 
-  /// Returns the page shown if it is a PageClass, otherwise null.
+  /// Returns the current page if it is a PageClass, otherwise null.
   template <typename PageClass>
   [[nodiscard]] PageClass* shownPage() const {
     return dynamic_cast<PageClass*>(mShownPage.get());
@@ -281,13 +283,13 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   ImageView mBackGroundView;
   KSInstallerInfo mKSInstallerInfo;
   Dictionary mKSCD;
-  std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses from the model list
+  std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses a model
   std::uint32_t mContainedModelCount = 0;
-  /// True from the wizard's own start of the set-up tool on, unless that run of the tool asks to go
-  /// back to the connection page.
+  /// Becomes true when the wizard starts the set-up tool automatically, and false again if that run
+  /// of the tool asks to go back to the connection page.
   bool mIsWLANTool = false;
   std::shared_ptr<Page> mChooseDeviceViewController;
-  std::shared_ptr<Page> mShownPage;  ///< the page whose view is in `mainView`
+  std::shared_ptr<Page> mShownPage;  ///< the current page; may be null
 };
 
 }  // namespace onramp

@@ -39,7 +39,7 @@ void setDefault(Dictionary& options, const char* key) {
 }
 
 // Returns the entry for the user's country in the application's SupportedKOL.plist. Returns false
-// when there is no such entry, or when the medium does not offer the online service.
+// when the medium does not offer the online service or the country has no entry.
 Value onlineServiceOption(const Dictionary& options) {
   const Value* const offered = options.find("PKG_KestrelOnline");
   if (!offered || offered->boolean() == false) return false;
@@ -56,7 +56,7 @@ bool fontSetOption(const Dictionary& options) {
   return language == "ja" || language == "ko" || language == "zh";
 }
 
-// In the records of the medium and of devices, an empty text stands for an unknown value.
+// In medium and device records, an empty text means that the value is unknown.
 std::optional<std::string> knownText(const Dictionary& record, std::string_view key) {
   std::optional<std::string> text = record.string(key);
   return text && !text->empty() ? text : std::nullopt;

@@ -21,12 +21,12 @@ namespace {
 // The time between opening the package and terminating the application.
 constexpr std::chrono::milliseconds kQuitDelay{1000};
 
-// The time between hiding the application and running the set-up tool. The main thread is blocked
-// while the tool runs, so the window has to disappear before that.
+// The time between hiding the application and running the set-up tool. The tool's run blocks the
+// main thread, so the window must disappear before it starts.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
-// Exit statuses of the set-up tool. Any other status leads to a new search, and so does a tool that
-// cannot be run.
+// Exit statuses of the set-up tool. After any other status, or if the tool cannot be run, the
+// wizard searches again.
 constexpr int kToolAsksToGoBack = 1;
 constexpr int kToolAsksToQuit = 2;
 

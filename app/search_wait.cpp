@@ -22,8 +22,8 @@ void showProgressOn(Page* page, bool on) {
   }
 }
 
-// The message texts are format strings, in which "%%" stands for a percent sign. The sheet shows
-// plain text, so "%%" is replaced by "%".
+// The medium's texts are format strings, in which "%%" stands for a percent sign. The sheet shows
+// plain text, so this function replaces "%%" with "%".
 std::string textOfFormat(std::string format) {
   for (std::size_t at = format.find("%%"); at != std::string::npos; at = format.find("%%", at)) {
     format.erase(at++, 1);
@@ -64,8 +64,8 @@ void OnrampOSXAppDelegate::waitDeviceSearchTask(std::chrono::seconds pause) cons
   abortModal();
 }
 
-// Used in place of waitDeviceSearchTask() when the system cannot start another thread. Each pause
-// is a timer that runs in the modal loop.
+// Replaces waitDeviceSearchTask() when the system cannot start another thread. Each pause is a
+// timer in the modal loop.
 void OnrampOSXAppDelegate::waitOnMainLoop(std::chrono::seconds pause, int pausesLeft) {
   scheduleTimer(pause, [this, pause, pausesLeft] {
     if (pausesLeft > 1 && listedDevices() == 0) {

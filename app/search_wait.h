@@ -4,17 +4,17 @@
 
 namespace onramp {
 
-// How long the wizard waits for the device search. A wait consists of pauses. After each pause, the
-// wizard checks whether a device is listed, and ends the wait if one is.
+// How long the wizard waits for the device search. A wait consists of pauses. The wait ends after
+// any pause if a device is listed by then.
 
-/// The number of pauses in a wait that finds no device.
+/// The number of pauses after which the wait ends even if no device is listed.
 inline constexpr int kMostPauses = 5;
 
-/// The length of each pause when the user has clicked Next on the connection page.
+/// The length of each pause after the user clicks Next on the connection page.
 inline constexpr std::chrono::seconds kFirstSearchPause{2};
 
-/// The length of each pause when the wizard searches from the chooser, the page that lists the
-/// devices. A refresh that the user requests has pauses of ChooseDeviceView::kRefreshPause instead.
+/// The length of each pause when the wizard starts a search on the chooser, the page that lists the
+/// devices. When the user starts a search there, ChooseDeviceView::kRefreshPause applies instead.
 inline constexpr std::chrono::seconds kChooserSearchPause{3};
 
 }  // namespace onramp

@@ -15,7 +15,8 @@ struct RetitledItem {
   const char* key;
 };
 
-// "APP_MENU_HIDEOHTERS" is misspelt here because the message tables on the media misspell it.
+// The misspelling in "APP_MENU_HIDEOHTERS" must stay, because the message tables on the media
+// contain it, too.
 constexpr RetitledItem kApplicationMenuItems[] = {{"About", "APP_MENU_ABOUT"},
                                                   {"Hide", "APP_MENU_HIDE"},
                                                   {"Hide Others", "APP_MENU_HIDEOHTERS"},
@@ -77,7 +78,7 @@ void OnrampOSXAppDelegate::applicationWillFinishLaunching() {
     terminateApplication();
     return;
   }
-  // The package must not take an earlier run's files for this run's choices.
+  // The package must not mistake files from an earlier run for this run's choices.
   removeDictionary(instmodelPlistURL());
   removeDictionary(InstallPKGInfoURL());
 }

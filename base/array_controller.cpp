@@ -29,7 +29,7 @@ void ArrayController::removeObject(const Dictionary& entry) {
   std::size_t kept = 0;
   std::optional<std::size_t> selection;
   for (std::size_t i = 0; i < entries_.size(); ++i) {
-    if (selection_ == i) selection = kept;  // if entry i is removed, its successor moves to `kept`
+    if (selection_ == i) selection = kept;  // if entry i is removed, the next one moves to `kept`
     if (entries_[i] == entry) {
       if (selection_ == i) hasChoice_ = false;
       continue;
@@ -89,7 +89,7 @@ void ArrayController::setSelectedObject(const Dictionary& entry) {
   setSelectionIndex(indexOf(entry));
 }
 
-// Returns the number of entries when no entry is equal.
+// Returns the index of the first entry equal to `entry`, or the number of entries if there is none.
 std::size_t ArrayController::indexOf(const Dictionary& entry) const {
   const auto found = std::find(entries_.begin(), entries_.end(), entry);
   return static_cast<std::size_t>(found - entries_.begin());

@@ -11,9 +11,9 @@
 
 namespace onramp {
 
-/// Holds a list's entries, their order and the selection. A bound table shows the list, and the
-/// controller reports every change to this table. All functions except arrangedCount() must be
-/// called on the main thread.
+/// Holds the entries of a list, their order and the selection. A table can be bound to the
+/// controller. It then shows the list and is told of every change. All functions except
+/// arrangedCount() must be called on the main thread.
 class ArrayController {
  public:
   /// Makes rearrange() sort the entries by their strings under `key`. An entry that has no string
@@ -21,20 +21,20 @@ class ArrayController {
   /// rearrange() does not change the order.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
-  /// Appends `entries` without sorting the list. If the list was empty, its first new entry becomes
-  /// selected. Does nothing when `entries` is empty.
+  /// Appends `entries` without sorting the list. If the list was empty, selects the first of them.
+  /// Does nothing when `entries` is empty.
   void addObjects(std::vector<Dictionary> entries);
 
-  /// Removes every entry equal to `entry`. If the selected entry is removed, the next remaining
-  /// entry becomes selected; if no entry follows, the last entry becomes selected. If the list
-  /// becomes empty, the selection is cleared. Does nothing when no entry is equal to `entry`.
+  /// Removes every entry equal to `entry`. If the selected entry is removed, selects the next
+  /// remaining entry, or the last one if none follows. If the list becomes empty, clears the
+  /// selection. Does nothing when no entry is equal to `entry`.
   void removeObject(const Dictionary& entry);
 
-  /// Removes all entries, and thereby clears the selection.
+  /// Removes all entries and clears the selection.
   void removeAllObjects();
 
-  /// Sorts the entries by their strings under the key of setSortKey(), in ascending byte order.
-  /// Entries with equal strings keep their order. The selected entry stays selected.
+  /// Sorts the entries by their strings under the sort key, in ascending byte order. Entries with
+  /// equal strings keep their order. The selected entry stays selected.
   void rearrange();
 
   /// The entries in the list's order.
@@ -49,26 +49,23 @@ class ArrayController {
   /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
   void setSelectedObject(const Dictionary& entry);
 
-  /// choose() selects an entry as setSelectionIndex() does, and chooseObject() as
-  /// setSelectedObject() does. Both also record that the user has made a selection, even when they
-  /// clear the selection. The bound table calls choose().
+  /// Do what setSelectionIndex() and setSelectedObject() do, and record that the user made the
+  /// selection, even if the call clears it. The bound table calls choose().
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 
-  /// Whether the user has made a selection. The result is false at first, true after choose() and
-  /// chooseObject(), and false again once the selected entry has been removed or removeAllObjects()
-  /// has been called.
+  /// Whether the user has made a selection. choose() and chooseObject() make this true. It becomes
+  /// false again when the selected entry is removed or removeAllObjects() is called.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
-  /// Return the index of the selected entry, and the entry itself. Both return nothing when no
-  /// entry is selected.
+  /// Return the selected entry's index and the entry itself, or nothing when no entry is selected.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 
-  /// Binds a table to the list. Calls `onChange` at once, and from then on after every change of
-  /// the entries and every call of rearrange() and removeAllObjects(). `onSelect` is called after
-  /// every call of setSelectionIndex(), setSelectedObject(), choose() and chooseObject(). A later
-  /// call of bind() replaces both functions. Empty functions unbind the table.
+  /// Binds a table to the list. Calls `onChange` at once, then after every change to the entries
+  /// and after every call to rearrange() and removeAllObjects(). Calls `onSelect` after every call
+  /// to setSelectionIndex(), setSelectedObject(), choose() and chooseObject(). A later call to
+  /// bind() replaces both functions. Empty functions unbind the table.
   void bind(std::function<void()> onChange, std::function<void()> onSelect);
 
  private:

@@ -6,8 +6,8 @@
 
 namespace onramp {
 
-// These functions classify and convert ASCII characters independently of the user's locale, as
-// protocols and file formats require. The functions of <cctype> depend on the locale, and their
+// These functions classify and convert ASCII characters in the same way in every locale, as
+// protocols and file formats require. The <cctype> functions depend on the locale, and their
 // behaviour is undefined for most negative arguments.
 
 [[nodiscard]] constexpr bool isASCIIDigit(char c) {

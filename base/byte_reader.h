@@ -11,7 +11,7 @@ namespace onramp {
 /// Reads untrusted bytes, such as those from the network or the medium, from front to back and
 /// never past their end. A read of more bytes than remain returns nothing and does not move the
 /// reader. A copy of a reader moves independently of the original, so a copy can be used to look
-/// ahead. The bytes must outlive the reader, its copies and the views that they return.
+/// ahead. The bytes must outlive the reader, its copies and all views that the functions return.
 class ByteReader {
  public:
   explicit ByteReader(std::span<const std::byte> bytes) : rest_(bytes) {}
@@ -37,7 +37,7 @@ class ByteReader {
     return taken;
   }
 
-  /// Reads `count` bytes as a text. The result is a view of the input.
+  /// Reads `count` bytes as text. The result is a view of the input.
   [[nodiscard]] std::optional<std::string_view> text(std::uint64_t count) {
     const auto taken = take(count);
     if (!taken) return std::nullopt;

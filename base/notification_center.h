@@ -19,7 +19,7 @@ struct Notification {
   UserInfo userInfo;
 };
 
-/// Passes every posted notification to the handlers that observe its name. The handlers are called
+/// Passes every posted notification to the handlers that observe its name. Calls the handlers
 /// synchronously, in the order in which they were added. All functions must be called on the main
 /// thread.
 class NotificationCenter {
@@ -29,18 +29,18 @@ class NotificationCenter {
   /// Returns the centre that the whole process shares.
   [[nodiscard]] static NotificationCenter& defaultCenter();
 
-  /// Calls `handler` for every notification called `name`, whoever posts it, until removeObserver()
-  /// is called for `observer`. `observer` is never dereferenced. An observer may have several
-  /// handlers.
+  /// Adds `handler`, which is called for every notification called `name`, whoever posts it, until
+  /// removeObserver() is called for `observer`. `observer` is never dereferenced. An observer may
+  /// have several handlers.
   void addObserver(const void* observer, std::string_view name, Handler handler);
 
-  /// Removes all handlers of `observer`. A notification that is being delivered does not reach the
-  /// removed handlers any more.
+  /// Removes all handlers of `observer`. During a delivery, a handler that is removed before its
+  /// turn is not called.
   void removeObserver(const void* observer);
 
   /// Calls all handlers that were added for the notification's name. A handler may add and remove
-  /// observers and post further notifications. A handler that is added during a delivery does not
-  /// get the notification that is being delivered.
+  /// observers and post further notifications. A handler that is added during a delivery is called
+  /// only from the next notification on.
   void post(const Notification& notification);
 
  private:

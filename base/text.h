@@ -14,8 +14,8 @@ inline constexpr char32_t kReplacementCharacter = 0xFFFD;
 /// value above U+10FFFF.
 void appendUTF8(std::string& text, char32_t character);
 
-/// Removes one character from the front of `text` and returns it. If the text does not begin with a
-/// well-formed sequence (RFC 3629), removes one byte and returns nothing. `text` must not be empty.
+/// Removes the first character from `text` and returns it. If `text` does not begin with
+/// well-formed UTF-8 (RFC 3629), removes one byte and returns nothing. `text` must not be empty.
 std::optional<char32_t> takeUTF8(std::string_view& text);
 
 /// Whether `text` is well-formed UTF-8 (RFC 3629): no overlong forms, no surrogates, nothing above
@@ -37,16 +37,16 @@ std::optional<char32_t> takeUTF8(std::string_view& text);
   return 0x10000 + ((lead - 0xD800) << 10) + (trail - 0xDC00);
 }
 
-/// Takes the contents of a text file, in UTF-8 or UTF-16, and returns the text in UTF-8 without a
-/// byte-order mark. A file without a byte-order mark is read as UTF-16 when one of its first two
-/// bytes is zero, otherwise as UTF-8. This is safe because all text files that the program reads
-/// begin with an ASCII character, which has a zero byte only in UTF-16. Returns nothing when the
-/// bytes are malformed.
+/// Converts the contents of a text file, in UTF-8 or UTF-16, to UTF-8 without a byte-order mark. A
+/// file without a byte-order mark counts as UTF-16 if one of its first two bytes is zero, otherwise
+/// as UTF-8. This works because every text file that the program reads begins with an ASCII
+/// character, which contains a zero byte only in UTF-16. Returns nothing when the bytes are
+/// malformed.
 [[nodiscard]] std::optional<std::string> decodedText(std::string_view bytes);
 
-/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). Such a text has
-/// only the characters that these parts may have, at most one "#", and two hexadecimal digits after
-/// every "%". An empty text is valid.
+/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). A valid text
+/// contains only characters that these parts may contain, at most one "#", and two hexadecimal
+/// digits after every "%". An empty text is valid.
 [[nodiscard]] bool isURLText(std::string_view text);
 
 }  // namespace onramp

@@ -28,7 +28,8 @@ std::int64_t leadingInteger(std::string_view text) {
   const bool negative = text[at] == '-';
   if (negative || text[at] == '+') ++at;
 
-  // Accumulates a negative number, because the negative range is larger by one.
+  // Accumulates a negative number, because the negative range is one larger than the positive
+  // range.
   constexpr std::int64_t kMin = std::numeric_limits<std::int64_t>::min();
   std::int64_t number = 0;
   for (; at < text.size() && text[at] >= '0' && text[at] <= '9'; ++at) {

@@ -43,9 +43,9 @@ class Dictionary {
   /// dictionary and all its copies have been destroyed or assigned to.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
-  /// Return the value under `key` if it is of the type that the function is named after. Otherwise
-  /// array() returns null, and string() and dictionary() return nothing. The pointer that array()
-  /// returns is valid for as long as a pointer from find().
+  /// Return the value under `key` if it has the type in the function's name. Otherwise array()
+  /// returns null, and the other two return nothing. A pointer from array() is valid as long as a
+  /// pointer from find().
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;
@@ -56,7 +56,7 @@ class Dictionary {
   /// Returns the value under `key` converted by Value::integerValue(); 0 when there is no value.
   [[nodiscard]] std::int64_t integerValue(std::string_view key) const;
 
-  /// Returns a copy that has `value` under `key`, replacing the earlier value if there was one.
+  /// Returns a copy with `value` under `key`, in place of any earlier value.
   [[nodiscard]] Dictionary with(std::string_view key, Value value) const;
 
   [[nodiscard]] std::size_t size() const;
@@ -75,7 +75,7 @@ class Dictionary {
 /// One property-list value.
 class Value {
  public:
-  /// An integer that fits in std::int64_t is stored in that type. So std::uint64_t holds only
+  /// An integer that fits in std::int64_t is stored as that type, so std::uint64_t holds only
   /// integers of 2^63 and above.
   using Storage = std::variant<bool, std::int64_t, std::uint64_t, double, std::string, Data, Date,
                                Array, Dictionary>;
@@ -101,14 +101,14 @@ class Value {
     return std::get_if<Kind>(&storage_);
   }
 
-  /// Converts the value to a boolean. A number is true unless it is zero. A value that is neither a
-  /// boolean nor a number gives nothing.
+  /// Converts the value to a boolean. A number is true unless it is zero. Returns nothing for a
+  /// value that is neither a boolean nor a number.
   [[nodiscard]] std::optional<bool> boolean() const;
 
-  /// Converts the value to an integer. A boolean gives 0 or 1. A real number is truncated towards
-  /// zero; NaN gives 0. A string gives the decimal integer that it begins with, or 0 when it does
-  /// not begin with one. ASCII white space and one sign may precede the digits. A number outside
-  /// the signed 64-bit range gives the nearest end of the range. All other types give 0.
+  /// Converts the value to an integer. A boolean becomes 0 or 1. A real number is truncated towards
+  /// zero; NaN becomes 0. A string becomes the decimal integer at its start, or 0 if there is none.
+  /// ASCII white space and one sign may precede the digits. A number outside the signed 64-bit
+  /// range becomes the nearest number in the range. All other types become 0.
   [[nodiscard]] std::int64_t integerValue() const;
 
   friend bool operator==(const Value& a, const Value& b) { return a.storage_ == b.storage_; }
