@@ -63,7 +63,8 @@ void KSBonjour::removeKSBonjourObserver(const KSBonjourObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// An observer may remove itself when it is called, so each of these loops uses a copy of the array.
+// An observer may remove itself when it is called, so each loop below runs over a copy of the
+// array.
 
 void KSBonjour::notifyAddToKSBonjourObserver(const NetServiceRef& service) const {
   for (const auto& observer : std::vector(_aryObserver))
@@ -130,8 +131,8 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   const bool wasValid = std::exchange(entry.isValid, false);
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
-    // Only the first removal after an addition or a resolve lowers the count. By design, an entry
-    // that was added at least three times therefore survives several removals in quick succession.
+    // Only the first removal after an addition or a resolve lowers the count. So, by design, an
+    // entry that was added three or more times survives several removals in quick succession.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {
@@ -154,9 +155,9 @@ std::string KSBonjour::keyForService(const std::string& name, const std::string&
   return name + '.' + type + domain;
 }
 
-// Returns the key of `service` in this browser's table. Returns nothing when the service is null,
-// has no name, type or domain, or is of another type than the browser's, and when the browser is
-// stopped.
+// Returns the key of `service` in this browser's table. Returns nothing when the browser is
+// stopped, and when the service is null, lacks a name, type or domain, or has a different type from
+// the browser.
 std::optional<std::string> KSBonjour::ownKeyOf(const NetServiceRef& service) const {
   if (!service || !_services) return std::nullopt;
   const auto name = service->name();

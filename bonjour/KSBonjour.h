@@ -12,10 +12,10 @@
 
 namespace onramp {
 
-// The notifications that all browsers post on the default notification centre, without an object,
-// and observe there. Each carries a NetServiceRef under kServiceInfo. kAddNotification also carries
-// the browse flags, an unsigned long, under kAddFlagInfo; kRemoveNotification carries them under
-// kRemoveFlagsInfo.
+// All browsers post these notifications, without an object, on the default notification centre, and
+// observe them there. Each notification carries a NetServiceRef under kServiceInfo. The browse
+// flags, an unsigned long, are under kAddFlagInfo in kAddNotification, and under kRemoveFlagsInfo
+// in kRemoveNotification.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
 inline constexpr std::string_view kRemoveNotification = "removeNotificationInternal";
 inline constexpr std::string_view kResolvedNotification = "resolveNotificationInternal";
@@ -24,7 +24,7 @@ inline constexpr std::string_view kAddFlagInfo = "flag";
 inline constexpr std::string_view kRemoveFlagsInfo = "flags";
 
 /// Receives the events of a browser. A running browser also forwards the events of all other
-/// browsers, so a service may be of another type than the browser's.
+/// browsers, so a service may have a different type from the browser.
 class KSBonjourObserver {
  public:
   KSBonjourObserver() = default;
@@ -34,22 +34,21 @@ class KSBonjourObserver {
 
   /// Called when a service is found, before it is resolved.
   virtual void addBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service is reported gone, after the browser's table has been updated. If the
-  /// service was added more than once, it may still be in the table. `service` is the object that
-  /// was in the table, or null when the table did not contain the service.
+  /// Called when a service is reported gone, after the browser has updated its table. A service
+  /// that was added more than once may still be in the table. `service` is the object that was in
+  /// the table, or null if the table did not contain the service.
   virtual void removeBonjourService(const NetServiceRef& service) = 0;
-  /// Called when a service's addresses and TXT record are known, after the browser's table has been
-  /// updated.
+  /// Called when a service's addresses and TXT record are known, after the browser has updated its
+  /// table.
   virtual void resolvedBonjourService(const NetServiceRef& service) = 0;
 };
 
-/// Browses for services of one type, resolves each service that it finds, and keeps these services
-/// in a table. A service that is found several times has one entry, with a count. All functions
-/// must be called on the main thread.
+/// Browses for services of one type, resolves each service that it finds, and keeps the services in
+/// a table. A service that is found several times has one entry with a count. All functions must be
+/// called on the main thread.
 class KSBonjour {
  public:
-  /// Creates an idle browser for `type`. If `type` is nothing, startBrowsing() only stops the
-  /// browser.
+  /// Creates an idle browser for `type`. If `type` is nothing, the browser never starts.
   [[nodiscard]] static std::shared_ptr<KSBonjour> initWithType(std::optional<std::string> type);
 
   KSBonjour(const KSBonjour&) = delete;
@@ -68,15 +67,16 @@ class KSBonjour {
   void notifyRemoveToKSBonjourObserver(const NetServiceRef& service) const;
   void notifyResolvedToKSBonjourObserver(const NetServiceRef& service) const;
 
-  /// Starts to browse all configured domains, with an empty table. Stops first if the browser is
-  /// running. If the browse cannot start, the browser still forwards the events of other browsers.
+  /// Starts to browse all domains that the computer is configured to browse. Stops first if the
+  /// browser is running. The table is empty at first. If the browse cannot start, the browser still
+  /// forwards the events of other browsers.
   void startBrowsing();
 
-  /// Ends the browse, cancels the resolves of services that have not been resolved, and forgets the
-  /// table. Does not call the observers. Does nothing when the browser is idle.
+  /// Stops browsing, cancels all unfinished resolves and discards the table. Does not call the
+  /// observers. Does nothing when the browser is idle.
   void stopBrowsing();
 
-  // The handlers of the three notifications.
+  // These functions handle the three notifications above.
   void addKSNetService(const Notification& notification);
   void removeKSNetService(const Notification& notification);
   void resolvedKSNetService(const Notification& notification);
@@ -99,7 +99,7 @@ class KSBonjour {
  private:
   struct Entry {
     NetServiceRef service;
-    int referenceCount = 0;    ///< additions, less those removals that lower the count
+    int referenceCount = 0;    ///< additions, less removals while isValid was true
     bool didResolved = false;  ///< whether the service has been resolved since its last addition
     bool isValid = true;       ///< false from a removal until the next addition or resolve
   };

@@ -43,7 +43,8 @@ void KSBonjourSearch::removeKSDeviceObserver(const KSDeviceObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// An observer may remove itself when it is called, so each loop uses a copy of the array.
+// An observer may remove itself when it is called, so each loop below runs over a copy of the
+// array.
 
 void KSBonjourSearch::notifyAddToKSDeviceObserver(const Dictionary& device) const {
   for (const auto& observer : std::vector(_aryObserver))

@@ -20,18 +20,19 @@ class KSDeviceObserver {
 
   /// Called when a device is resolved and no browser's table contains it.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is resolved or reported gone while a browser's table contains it. A
-  /// browser stores a resolved service before it reports the service. So the search reports even a
-  /// new device by this function, and an observer must add any device that it does not know.
+  /// Called when a device is resolved or reported gone and a browser's table contains it. Even a
+  /// new device is usually reported here, because a browser stores a resolved service before it
+  /// reports the service. So an observer must add any device that it does not know.
   virtual void updateKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is reported gone and no browser's table contains it any longer.
+  /// Called when a device is reported gone and no browser's table contains it.
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
-/// Searches the network for devices that offer the medium's service type. Reports each device when
-/// its service is resolved and when it is reported gone. Ignores services that lack a name, type or
-/// domain. A running search and its browser keep each other alive, so the owner must call
-/// stopBrowsing() before it drops its reference. All functions must be called on the main thread.
+/// Searches the network for devices that offer the service type that the medium names. Tells the
+/// observers when a device's service is resolved and when it is gone. Ignores services that lack a
+/// name, type or domain. A running search and its browser keep each other alive, so the owner of a
+/// search must call stopBrowsing() before releasing it. All functions must be called on the main
+/// thread.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:
@@ -51,15 +52,15 @@ class KSBonjourSearch final : public KSBonjourObserver,
   void notifyUpdateToKSDeviceObserver(const Dictionary& device) const;
   void notifyRemoveToKSDeviceObserver(const Dictionary& device) const;
 
-  /// Stops the running search, if there is one. Then searches for the service type that the medium
-  /// names, or for nothing when the medium names none.
+  /// Ends the running search, if there is one, and starts a new one. The new search finds nothing
+  /// if the medium names no service type.
   void startBrowsing();
 
   /// Ends the search without calling observers. Does nothing when no search is running.
   void stopBrowsing();
 
-  /// Returns the types, as strings, of all browsers whose tables have a service with this name and
-  /// domain. Returns an empty array when an argument is nothing.
+  /// Returns the types, as strings, of all browsers whose tables contain a service with this name
+  /// and domain. Returns an empty array when an argument is nothing.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

@@ -9,9 +9,9 @@ namespace onramp {
 
 namespace {
 
-// Returns an empty text for a null service, and nothing when a service lacks the text. The caller
-// needs the difference: the model name is one space for a null service, but empty for a service
-// that lacks the manufacturer or the model.
+// Returns an empty text for a null service, but nothing for a service that lacks the text. So the
+// record's model name is one space for a null service, but empty for a service that lacks the
+// manufacturer or the model.
 std::optional<std::string> textOf(const NetServiceRef& service,
                                   std::optional<std::string> (*read)(const NetServiceRef&)) {
   return service ? read(service) : "";

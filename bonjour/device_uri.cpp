@@ -12,7 +12,7 @@ namespace {
 constexpr std::string_view kAuthorityStart = "://";
 constexpr std::string_view kLocalDomain = "local.";
 constexpr std::size_t kProtocolLabelLength = std::string_view("_tcp.").size();
-constexpr std::size_t kDotAndLetter = 2;  // a letter of the type and a dot, which precede "_tcp."
+constexpr std::size_t kDotAndLetter = 2;  // "_tcp." follows at least one letter and a dot
 
 bool staysInName(char c) {
   return isASCIILetterOrDigit(c) || std::string_view("-_.!~*'$").find(c) != std::string_view::npos;

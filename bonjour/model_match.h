@@ -7,11 +7,11 @@
 
 namespace onramp {
 
-/// Returns the model name of a device as the medium spells it: the record's USB manufacturer and
-/// USB model, joined by one space even if either is empty.
+/// Returns a device's model name in the form that the medium uses: the USB manufacturer and the USB
+/// model from the record `device`, joined by one space even if either is empty.
 [[nodiscard]] std::string modelTextOf(const Dictionary& device);
 
-/// Returns whether `models` contains exactly the text that modelTextOf() returns for the device.
+/// Returns whether `models` contains exactly the text that modelTextOf(device) returns.
 [[nodiscard]] bool isOneOf(const std::vector<std::string>& models, const Dictionary& device);
 
 }  // namespace onramp

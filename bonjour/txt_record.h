@@ -16,9 +16,9 @@ class TxtRecord {
   /// Skips strings without a key. Returns nothing when a string runs past the end of the data.
   [[nodiscard]] static std::optional<TxtRecord> parse(std::span<const std::byte> data);
 
-  /// Returns the value of the first attribute whose key is `key`, where the letters A to Z may be
-  /// in either case. The value may contain zero bytes. Returns nothing when no attribute has the
-  /// key, or when the first that has it lacks a "=".
+  /// Returns the value of the first attribute whose key is `key`, ignoring the case of the letters
+  /// A to Z. The value may contain zero bytes. Returns nothing when no attribute has this key, or
+  /// when the first attribute that has it contains no "=".
   [[nodiscard]] std::optional<std::string> value(std::string_view key) const;
 
  private:

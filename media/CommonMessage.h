@@ -13,8 +13,8 @@ namespace CommonMessage {
     const std::optional<std::string>& relativePath);
 
 /// Returns the text of `key` in the user's language, or `value` when the medium has no such text.
-/// Without a `table`, the text is looked up in the message bundle's default table. Every call opens
-/// the bundle again.
+/// If `table` is nothing, looks in the message bundle's default table. Every call opens the bundle
+/// again.
 [[nodiscard]] std::string localizedStringForKey(const std::string& key, const std::string& value,
                                                 const std::optional<std::string>& table);
 

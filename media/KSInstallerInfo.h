@@ -15,10 +15,10 @@ struct FileURL {
   friend bool operator==(const FileURL&, const FileURL&) = default;
 };
 
-/// The dictionary "PkgInfo" of the medium resource dictionary may name a separate package for each
-/// range of system versions. Returns the key that names the package for `version`, or nothing when
-/// no key covers `version`. `version` is in binary-coded decimal: 0x1068 is 10.6.8. If "PkgInfo"
-/// has the key "PkgName", the wizard uses only that key.
+/// Returns the key that names the package for the system version `version`, or nothing when no key
+/// covers that version. `version` is in binary-coded decimal: 0x1068 is 10.6.8. The key belongs to
+/// the dictionary "PkgInfo" in the medium resource dictionary (media/medium.h). If "PkgInfo" has
+/// the key "PkgName", the wizard uses only that key.
 [[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
 /// Where the installer package and the wireless set-up tool are on the medium, and which systems
@@ -32,13 +32,13 @@ class KSInstallerInfo {
   /// them to their defaults.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
-  // Each of these functions does the part of setCDCommonInfoValue() that its name says.
+  // The three steps of setCDCommonInfoValue().
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);
 
   /// The package to open, which may not exist. Nothing when the medium resource dictionary could
-  /// not be read, or when its "PkgInfo" is missing or gives no folder or no package name for the
+  /// not be read, or when its "PkgInfo" is missing or lacks the folder or the package name for the
   /// running system.
   [[nodiscard]] const std::optional<FileURL>& pkgURL() const { return mPkgURL; }
 
@@ -47,9 +47,9 @@ class KSInstallerInfo {
   /// dictionary could not be read.
   [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
 
-  /// The bounds of the supported system versions. system_range.h has their meaning. Each is a
-  /// dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A key that the
-  /// medium leaves out counts as 0. A "Major" of 0, the default, means that there is no bound.
+  /// The bounds of the supported system versions. system_range.h defines how they are compared.
+  /// Each is a dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A key
+  /// that the medium omits counts as 0. A "Major" of 0, the default, means that there is no bound.
   [[nodiscard]] const Dictionary& supportSystemMin() const { return mSystemMin; }
   [[nodiscard]] const Dictionary& supportSystemMax() const { return mSystemMax; }
 

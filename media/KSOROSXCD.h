@@ -9,9 +9,9 @@
 
 namespace onramp {
 
-/// Makes a record of the medium: the models that the medium serves, whether it has a printer
-/// package and a scanner package, its series code at the support centre, and the service type by
-/// which devices are found on the network.
+/// Makes a record of the medium. It holds the models that the medium serves, whether the medium has
+/// a printer package and a scanner package, its series code at the support centre, and the service
+/// type to search the network for.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.
@@ -26,9 +26,10 @@ inline constexpr std::string_view kBonjourServiceType =
 [[nodiscard]] Dictionary initWithCDInfo();
 
 /// Makes the record from two dictionaries. `info` is the dictionary in the file that "CDInfo"
-/// names, and `CDCommonInfo` is the medium resource dictionary, which gives only the service type.
-/// A value that is absent or of the wrong type gets its default: no models, true for a package, an
-/// empty text. Without `info`, all values get their defaults, even the service type.
+/// names, and `CDCommonInfo` is the medium resource dictionary, from which only the service type is
+/// taken. A value that is absent or has the wrong type gets its default: no models, true for a
+/// package, an empty text. If `info` is nothing, all values get their defaults, even the service
+/// type.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
@@ -38,8 +39,8 @@ inline constexpr std::string_view kBonjourServiceType =
 
 }  // namespace KSOROSXCD
 
-/// Returns the model names under kContainedModels of `record`, in the record's order. Returns no
-/// names when the record has no such array.
+/// Returns the model names under kContainedModels of `record`, in the record's order. Returns an
+/// empty list when the record has no such array.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

@@ -8,8 +8,8 @@
 
 namespace onramp {
 
-/// What the medium says about one model: its connections and its support-centre identifier. To
-/// query many models, call modelInfo() once and pass its result to initWithName(), which otherwise
+/// Makes a record of one model: its connections and its support-centre identifier. To query many
+/// models, call modelInfo() once and pass its result to initWithName(). Otherwise initWithName()
 /// reads the medium on every call.
 namespace KSOROSXModel {
 

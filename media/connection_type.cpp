@@ -32,7 +32,6 @@ ConnectionType sharedConnectionType(const std::vector<std::string>& models,
     return connectionType(KSOROSXModel::initWithName(model, modelInfo));
   };
   const ConnectionType first = typeOf(models.front());
-  // Two models have the same type exactly when they agree on both connections.
   const bool agree = std::all_of(models.begin(), models.end(),
                                  [&](const std::string& model) { return typeOf(model) == first; });
   return agree ? first : ConnectionType::kNeither;

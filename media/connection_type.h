@@ -33,7 +33,7 @@ enum class ConnectionType : unsigned char {
 [[nodiscard]] bool anySupportsWiFi(const std::vector<std::string>& models,
                                    const std::optional<Dictionary>& modelInfo);
 
-/// The page that the wizard begins with.
+/// The page that the wizard shows first.
 enum class FirstPage {
   kNone,  ///< no page: no model supports wireless, so the package opens at once
   kConnectionType,

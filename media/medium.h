@@ -18,14 +18,14 @@ inline constexpr std::string_view kSystemMax = "SystemMax";
 inline constexpr std::string_view kWLANtool = "WLANtool";
 inline constexpr std::string_view kVenderName = "VenderName";
 
-/// Returns `path` without slashes at its end; the root stays "/".
+/// Returns `path` without the slashes at its end, but leaves the root "/" as it is.
 [[nodiscard]] std::string withoutClosingSlash(std::string path);
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
-/// at `bundlePath`. Without a relative path, returns that folder. `bundlePath` must not end in "/".
-/// When `bundlePath` contains no "/", returns the relative path itself, or an empty text when there
-/// is none. Drops slashes at the result's end, as withoutClosingSlash() does. Does not access the
-/// disk.
+/// at `bundlePath`. If `relativePath` is nothing, returns that folder. `bundlePath` must not end in
+/// "/". If it contains no "/", the folder counts as empty, so the result is `relativePath` or an
+/// empty text. Removes slashes from the result's end, as withoutClosingSlash() does. Does not
+/// access the disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 
@@ -37,8 +37,9 @@ inline constexpr std::string_view kVenderName = "VenderName";
 /// "CommonResourcePath". Returns nothing when the list cannot be read.
 [[nodiscard]] std::optional<Dictionary> loadResourceDictionary();
 
-/// Reads the dictionary in the property list whose relative path is the string under `key` in
-/// `resources`. Returns nothing when there is no such string or no such dictionary.
+/// Reads the dictionary in another property list of the medium. The string under `key` in
+/// `resources` is the relative path of that list. Returns nothing when there is no such string or
+/// no such dictionary.
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 

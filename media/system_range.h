@@ -19,15 +19,15 @@ struct SystemVersion {
 /// counts as 0, and so does a component that does not begin with a number.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
-/// How a system compares with the range that the medium supports.
+/// How a system version compares with the range that the medium supports.
 enum class SystemSupport : std::uint32_t {
   kSupported = 0,
   kOlderThanMinimum = 1,
   kNewerThanMaximum = 2,
 };
 
-// The functions that follow take bounds in the form that KSInstallerInfo returns. A key that is
-// missing counts as 0.
+// The functions below take bounds in the form that KSInstallerInfo returns. A missing key counts as
+// 0.
 
 /// Whether `bound` sets a limit, that is, whether its "Major" is not 0. isNewerThan() and
 /// isOlderThan() do not check this.
@@ -41,7 +41,8 @@ enum class SystemSupport : std::uint32_t {
 /// Whether `version` is below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
-/// Compares `version` with `maximum` and then with `minimum`. Skips a bound that sets no limit.
+/// Returns how `version` compares with the range. Checks `maximum` first. Skips a bound that sets
+/// no limit.
 [[nodiscard]] SystemSupport systemSupport(const SystemVersion& version, const Dictionary& minimum,
                                           const Dictionary& maximum);
 

@@ -7,8 +7,8 @@ namespace onramp {
 namespace {
 
 // Returns the dictionary under `key` in the dynamic store. Returns nothing when `key` is nothing,
-// when the store has no dictionary there, and when the store cannot be read. The store treats the
-// key as a pattern.
+// when the store has no dictionary there, and when the store cannot be read. The store reads `key`
+// as a regular expression.
 std::optional<Dictionary> stateUnder(const std::string& storeName,
                                      const std::optional<std::string>& key) {
   if (!key) return std::nullopt;

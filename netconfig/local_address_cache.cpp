@@ -33,7 +33,7 @@ void AddNetworkInterfaceListChangeCallbackSCF() {
                                                            kSCCompAnyRegex, kSCEntNetIPv4)) {
     setNotificationKeys(store, {}, {*pattern});
   }
-  // After an earlier failure, the source is null, and adding it does nothing.
+  // If the store could not be created, the source is null and adding it does nothing.
   addSourceToMainLoop(createRunLoopSource(store, 0));
 }
 

@@ -9,34 +9,34 @@
 
 namespace onramp {
 
-/// The computer's IPv4 addresses at the time when the list was made. The list has one dictionary
-/// for every interface with an IPv4 entity in the dynamic store (platform/dynamic_store.h), in no
-/// particular order. Each dictionary has arrays of dotted texts under kSCPropNetIPv4Addresses,
-/// kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks; any of the arrays may be
+/// The computer's IPv4 addresses when the list was made. The list has one dictionary for every
+/// interface with an IPv4 entity in the dynamic store (platform/dynamic_store.h), in no particular
+/// order. Each dictionary has arrays of dotted texts under kSCPropNetIPv4Addresses,
+/// kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks; any of these arrays may be
 /// missing. A null pointer means that there is no list.
 using local_address_list = std::shared_ptr<const Array>;
 
-/// The status of a call with an invalid argument.
+/// Returned by a call with an invalid argument.
 inline constexpr int kLocalAddressListMisused = 1;
 
-/// Reads the computer's addresses, stores them as a new list in `*out_list` and returns 0. A
-/// computer without IPv4 has an empty list. Returns kLocalAddressListMisused when `out_list` is
-/// null or `*out_list` already holds a list. When the dynamic store cannot be read, returns the
-/// store's error code, or kSCStatusFailed when the store reports no error. On failure `*out_list`
-/// is unchanged.
+/// Reads the computer's addresses, stores them as a new list in `*out_list` and returns 0. The list
+/// is empty on a computer without IPv4. Returns kLocalAddressListMisused when `out_list` is null or
+/// `*out_list` already holds a list. When the dynamic store cannot be read, returns the store's
+/// error code, or kSCStatusFailed when the store reports no error. On failure, `*out_list` is
+/// unchanged.
 int KSSysConfigCopyCurrentLocalAddressList(local_address_list* out_list);
 
 /// Returns the number of interfaces in `list`, or 0 for a null list.
 [[nodiscard]] std::size_t local_address_list_count(const local_address_list& list);
 
 /// Returns the first text of the array under `key` in the list's entry `index`. Returns null when
-/// the list is null or lacks the entry, and when the entry lacks the array or its first text. The
-/// result points into the list.
+/// the list is null or has no such entry, and when the entry's array is missing, is empty or does
+/// not begin with a text. The result points into the list.
 [[nodiscard]] const std::string* local_address_list_value(const local_address_list& list,
                                                           std::size_t index, std::string_view key);
 
-/// Each of the next three functions calls local_address_list_value(), with the key
-/// kSCPropNetIPv4Addresses, kSCPropNetIPv4SubnetMasks or kSCPropNetIPv4BroadcastAddresses.
+/// These three functions call local_address_list_value() with the keys kSCPropNetIPv4Addresses,
+/// kSCPropNetIPv4SubnetMasks and kSCPropNetIPv4BroadcastAddresses.
 [[nodiscard]] const std::string* local_address_at(const local_address_list& list,
                                                   std::size_t index);
 [[nodiscard]] const std::string* local_subnet_mask_at(const local_address_list& list,

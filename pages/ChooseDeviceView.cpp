@@ -102,7 +102,7 @@ void ChooseDeviceView::stopBrowsing() {
   if (!mBonjourSearch) return;
   mBonjourSearch->stopBrowsing();
   mBonjourSearch->removeKSDeviceObserver(this);
-  // The search object may be the caller of this function, so it is destroyed only after the current
+  // The search object may be calling this function, so it is destroyed only after the current
   // event.
   performOnMainThread([search = std::exchange(mBonjourSearch, nullptr)] {});
 }
@@ -160,8 +160,8 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // The first row is selected until the user chooses a row. From then on, reports of devices leave
-  // the user's choice alone.
+  // The first row is selected until the user chooses a row. After that, new reports of devices do
+  // not change the choice.
   if (isChoice) {
     deviceArrayController.chooseObject(entry);
   } else if (!deviceArrayController.hasChoice()) {

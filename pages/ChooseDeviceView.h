@@ -16,20 +16,22 @@
 
 namespace onramp {
 
-// The notifications by which the chooser asks the controller to do something.
+// The notifications that the chooser (ChooseDeviceView) posts to the controller
+// (OnrampOSXAppDelegate).
 
-/// Requests that the wireless set-up tool be launched. Carries no user info.
+/// Asks the controller to launch the wireless set-up tool. Carries no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Requests a wait for the device search. The user info holds an int under kWaitTime: the length in
-/// seconds of each pause of the wait (see app/search_wait.h).
+/// Asks the controller to wait for the device search. The user info holds an int under kWaitTime:
+/// the length of each pause of the wait, in seconds (see app/search_wait.h).
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
-/// The page that lists the devices found on the network. A device is listed if its model is looked
-/// for and the device reports that it is using its wireless interface. The page object is created
-/// once. While the window shows another page, this object keeps its list, and a running search goes
-/// on. A running search shares ownership of the object until stopBrowsing() is called.
+/// The page that lists the devices found on the network. It lists a device if setSearchModelList()
+/// has set the device's model and the device reports that it is using its wireless interface. The
+/// wizard creates this page only once. While the window shows another page, this page keeps its
+/// list, and a running search goes on. A running search shares ownership of the page until
+/// stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
@@ -51,7 +53,7 @@ class ChooseDeviceView final : public Page,
   /// Sets the models to look for, as texts of the form "manufacturer model".
   void setSearchModelList(std::vector<std::string> models);
 
-  /// Ends the running search, if there is one, and starts a new one. The list keeps its entries.
+  /// Ends any running search and starts a new one. The list keeps its entries.
   void startBrowsing();
 
   /// Ends the search. The list keeps its entries. Does nothing when no search is running.
@@ -77,23 +79,22 @@ class ChooseDeviceView final : public Page,
   void progressON(bool on);
 
   /// The search calls these three functions. addKSDevice() and updateKSDevice() call
-  /// setServiceToList() if doesMatchedModel() and doesWiFi() return true. doesWiFi() is called
+  /// setServiceToList() if doesMatchedModel() and doesWiFi() return true. They call doesWiFi()
   /// second, because it may block for seconds. removeKSDevice() calls removeServiceFromList() if
   /// doesMatchedModel() returns true.
   void addKSDevice(const Dictionary& device) override;
   void updateKSDevice(const Dictionary& device) override;
   void removeKSDevice(const Dictionary& device) override;
 
-  /// Whether the device's model is one of those that setSearchModelList() has set.
+  /// Whether the device's model is one of those passed to setSearchModelList().
   [[nodiscard]] bool doesMatchedModel(const Dictionary& device) const;
 
-  /// Whether the device answers that it is using its wireless interface; false when the record has
-  /// no addresses. Blocks for about 12 seconds for each address from which nothing comes back.
+  /// Whether the device reports that it is using its wireless interface. Returns false when the
+  /// record has no addresses. Blocks for about 12 seconds for each address that does not respond.
   [[nodiscard]] static bool doesWiFi(const Dictionary& device);
 
-  /// Adds the device's entry to the list, replacing an equal entry if there is one. The entry that
-  /// the user has chosen stays selected. Until the user chooses an entry, the first one is
-  /// selected.
+  /// Adds the device's entry to the list, in place of any equal entry. The entry that the user has
+  /// chosen stays selected. Until the user chooses an entry, the first one is selected.
   void setServiceToList(const Dictionary& device);
 
   /// Removes the entry that setServiceToList() would add for `device`. Does nothing when the list

@@ -26,7 +26,7 @@ class ConnectionTypeView final : public Page {
   /// The selected row: kWirelessRow or kWiredRow.
   [[nodiscard]] int chooseDeviceType() const;
 
-  /// Selects the choice in `row`. The only `column` is 0.
+  /// Selects the choice in `row`. `column` must be 0.
   void setChooseButton(int row, int column);
 
   /// Shows or hides the spinner and the text beside it, which asks the user to wait. While they are

@@ -19,7 +19,7 @@ class ModelListView final : public Page {
   ModelListView& operator=(const ModelListView&) = delete;
   ~ModelListView() override { destroyView(); }
 
-  /// The name of the selected model; nothing when no model is selected.
+  /// Returns the name of the selected model, or nothing when no model is selected.
   [[nodiscard]] std::optional<std::string> choosedModelName() const;
 
   /// Selects the model called `name`, or clears the selection when the list has no such model.

@@ -11,10 +11,10 @@
 namespace onramp {
 
 /// One page of the wizard: a view and all other objects from the view's interface file. Each kind
-/// of page is a subclass; a view of an unknown class becomes a plain Page.
+/// of page is a subclass. A view of an unknown class becomes a plain Page.
 class Page {
  public:
-  /// `interface`, which the page owns, must hold a view.
+  /// The page owns `interface`, which must contain a view.
   explicit Page(std::unique_ptr<Interface> interface) : interface_(std::move(interface)) {}
   Page(const Page&) = delete;
   Page& operator=(const Page&) = delete;
@@ -30,7 +30,7 @@ class Page {
     return interface_->outlet<Handle>(name);
   }
 
-  /// Destroys the view. A page with a list that is bound to a table must call this function in its
+  /// Destroys the view. A page that binds a list to a table must call this function in its
   /// destructor. Otherwise the list would be destroyed before the table.
   void destroyView() { interface_.reset(); }
 
@@ -39,10 +39,10 @@ class Page {
 };
 
 /// Loads the page in the interface file `name` and binds its controls to `owner`. Returns null when
-/// the file is missing or unreadable, or holds no view.
+/// the file is missing, cannot be read or contains no view.
 [[nodiscard]] std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner);
 
-/// Shows or hides `progress`, a spinner, and `text`, which asks the user to wait. The spinner turns
+/// Shows or hides `progress`, a spinner, and `text`, which asks the user to wait. The spinner spins
 /// while it is shown.
 void showWaiting(const ProgressIndicator& progress, const TextField& text, bool on);
 

@@ -8,9 +8,9 @@ namespace onramp {
 
 namespace {
 
-// Reads one arc. Each byte holds seven bits of the arc, the most significant bits first. All bytes
-// but the last have the top bit set. Returns nothing when the arc does not fit in 16 bits or its
-// last byte is missing.
+// Reads one arc of an object identifier. Each byte holds seven bits of the arc, the most
+// significant bits first. The top bit is set in every byte except the last. Returns nothing when
+// the arc does not fit in 16 bits or its last byte is missing.
 std::optional<std::uint16_t> next_arc(ByteReader& content) {
   std::uint32_t arc = 0;
   while (const auto byte = content.byte()) {

@@ -11,10 +11,10 @@ namespace onramp {
 
 // Each of these functions reads one part of a BER encoding (X.690 section 8, as restricted by RFC
 // 1157). On success, the function moves `in` past that part and returns SNMP_OK. To refuse the
-// input, it returns SNMP_ERR_CODEC. `in` may then stand anywhere in the part. Every function
-// refuses malformed and missing bytes.
+// input, it returns SNMP_ERR_CODEC, and may leave `in` anywhere in the part. Every function refuses
+// malformed and missing bytes.
 
-/// Reads a tag of one byte. Refuses a longer tag without moving `in`.
+/// Reads a one-byte tag. Refuses a longer tag without moving `in`.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
   constexpr std::uint8_t kHighTagNumber = 0x1F;
   ByteReader ahead = in;
@@ -52,9 +52,9 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads an integer of `length` bytes as a signed number. Refuses a length other than 1 to 4. Only
-/// the low 32 bits of `value` are sure to hold the number: one or two bytes are sign-extended to 64
-/// bits, three bytes to 32 bits, and four bytes not at all.
+/// Reads an integer of `length` bytes as a signed number. Refuses a length other than 1 to 4. Use
+/// only the low 32 bits of `value`: a number of one or two bytes is sign-extended to 64 bits, but a
+/// longer one only to 32 bits.
 [[nodiscard]] inline snmp_status ber_get_int(ByteReader& in, std::int64_t& value,
                                              std::uint16_t length) {
   std::uint64_t bits = 0;
@@ -75,16 +75,16 @@ namespace onramp {
 [[nodiscard]] snmp_status ber_get_oid(ByteReader& in, snmp_oid* target, std::uint16_t length);
 
 /// Reads a string of `length` bytes, copies it to `target->bytes` and sets `target->length`.
-/// Refuses a string longer than `target->capacity`. If `target` is null, refuses every string but
-/// the empty one.
+/// Refuses a string longer than `target->capacity`. If `target` is null, refuses every non-empty
+/// string.
 [[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
 // The program does not use ber_get_octets_ref(), which is here for completeness.
 
 /// Reads a string of `length` bytes and makes `target->bytes` point to it in the input, which must
 /// outlive `target`. Sets `target->capacity` to 0, because the input must not be written to. For an
-/// empty string, changes only `target->length`. If `target` is null, refuses every string but the
-/// empty one.
+/// empty string, changes only `target->length`. If `target` is null, refuses every non-empty
+/// string.
 [[nodiscard]] snmp_status ber_get_octets_ref(ByteReader& in, snmp_octets* target,
                                              std::uint16_t length);
 

@@ -32,8 +32,8 @@ snmp_status ber_put_octets(ber_writer& out, std::span<const std::uint8_t> bytes,
   return out.put(bytes) || ber_put_header(out, tag, end) ? SNMP_ERR_CODEC : SNMP_OK;
 }
 
-// This function and ber_put_oid write through a copy of the writer, which the compiler keeps in
-// registers. It cannot keep `out` there, because a byte that is written might be a part of `out`.
+// This function and ber_put_oid() write through a copy of the writer, so that the compiler can keep
+// the copy in registers. It could not keep `out` there, because a written byte might alias `out`.
 snmp_status ber_put_int(ber_writer& out, std::uint64_t& value, std::uint8_t tag) {
   ber_writer own = out;
   const std::size_t end = own.size();

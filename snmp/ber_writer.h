@@ -37,9 +37,9 @@ class ber_writer {
 };
 
 // Each of these functions puts one part of a BER encoding (X.690 section 8) in front of the bytes
-// written so far and returns SNMP_OK. When the buffer has too little room, and to refuse a value
-// that cannot be encoded, the function returns SNMP_ERR_CODEC. Some bytes of the part may then have
-// been written.
+// written so far and returns SNMP_OK. If the buffer has too little room, or to refuse a value that
+// cannot be encoded, the function returns SNMP_ERR_CODEC, and may leave some bytes of the part in
+// the buffer.
 
 /// Puts a length field of one, two or three bytes: the short form, or the long form that starts
 /// with 0x81 or 0x82. Refuses a length above 65,535.
@@ -74,13 +74,12 @@ class ber_writer {
 
 /// Puts the low 32 bits of `value` as the unsigned number of a Counter, Gauge or TimeTicks, in as
 /// few bytes as possible, 1 to 5. These types are encoded like an INTEGER, which is signed (RFC
-/// 1155 section 6, X.690 section 8.3). So a zero byte comes first whenever the next byte has its
+/// 1155 section 6, X.690 section 8.3). So a zero byte precedes a number whose first byte has its
 /// top bit set.
 [[nodiscard]] snmp_status ber_put_uint(ber_writer& out, std::uint64_t value, std::uint8_t tag);
 
-/// Puts an object identifier. Refuses an identifier with fewer than two arcs or with more than 255
-/// bytes of content. Also refuses an identifier in which 40 times the first arc plus the second
-/// exceeds 255.
+/// Puts an object identifier. Refuses an identifier that has fewer than two arcs or more than 255
+/// bytes of content, or in which 40 times the first arc plus the second exceeds 255.
 [[nodiscard]] snmp_status ber_put_oid(ber_writer& out, const snmp_oid& oid);
 
 [[nodiscard]] snmp_status ber_put_null(ber_writer& out);

@@ -23,7 +23,7 @@ constexpr const char* kLoopbackAddress = "127.0.0.1";
 constexpr int kReceiveAttempts = 256;
 constexpr std::chrono::seconds kListening{5};
 
-// This is room for kReceiveAttempts replies, each as large as an Ethernet frame.
+// Room for kReceiveAttempts replies, each as large as an Ethernet frame.
 constexpr std::size_t kReceiveBufferSize = std::size_t{kReceiveAttempts} * 2048;
 
 std::chrono::seconds wholeSeconds() {

@@ -10,37 +10,44 @@ namespace onramp {
 
 /// Encodes `message` (RFC 1157 section 4) at the start of `out_buffer` and stores the size of the
 /// encoding in `out_length`. Sets the `encoded_length` of each encoded binding. Replaces each
-/// negative integer in `message`, except the values of types 65 to 67, by the unsigned number that
-/// has the same bytes (ber_put_int()). For example, -1 becomes 255, and a second encoding contains
-/// 255. A binding is written without a value if its `type` is none of 1, 2, 4, 5, 6 and 64 to 68.
+/// negative integer in `message`, except the values of types 65 to 67, with the unsigned number
+/// that has the same bytes (ber_put_int()). For example, -1 becomes 255, so a second call encodes
+/// 255. Encodes a binding without a value unless its `type` is 1, 2, 4, 5, 6 or 64 to 68.
 ///
-/// Returns SNMP_ERR_CODEC when the message does not fit in the buffer or is longer than 65,535
-/// bytes, when `varbind_count` exceeds the size of the array, when an object identifier cannot be
-/// encoded, and when a binding's pointer to its name or value is null. The buffer's content is then
-/// undefined, and negative integers in the message may have been replaced.
+/// Returns SNMP_ERR_CODEC when:
+/// - the message does not fit in the buffer or is longer than 65,535 bytes,
+/// - `varbind_count` exceeds the size of the array `varbinds`,
+/// - an object identifier cannot be encoded, or
+/// - a binding's pointer to its name or value is null.
+///
+/// The buffer's content is then undefined, and negative integers in the message may have been
+/// replaced.
 [[nodiscard]] snmp_status snmp_encode_message(snmp_message& message,
                                               std::span<std::uint8_t> out_buffer,
                                               std::uint16_t& out_length);
 
-/// Decodes the reply `bytes` into `message`. The caller provides the records for names, strings and
-/// object identifiers, and the bindings point to them on entry. In each snmp_oid, `count` is on
-/// entry the number of arcs that fit. On return, `message.community` points into `bytes`.
+/// Decodes the reply `bytes` into `message`. On entry, the bindings must point to the caller's
+/// records for names, strings and object identifiers, and the `count` of each snmp_oid must be the
+/// number of arcs that fit. On return, `message.community` points into `bytes`.
 ///
-/// All strings are stored end to end in one buffer. On entry, every `octets_value->bytes` points to
-/// the start of that buffer. On return, the `bytes` of a string points past the strings before it,
-/// and its `capacity` is reduced by their size. If the value is an integer or an object identifier,
-/// the snmp_octets that `octets_value` points to is emptied, and its `bytes` becomes null.
+/// All strings are stored end to end in one buffer. On entry, every `octets_value->bytes` must
+/// point to the start of that buffer. On return, the `bytes` of a string points past the strings
+/// before it, and its `capacity` is reduced by their size. If a binding's value is an integer or an
+/// object identifier, all fields of `*octets_value` are reset, so its `bytes` is null.
 ///
 /// Decoding ends after the binding that reaches the declared end of the list of bindings. The
-/// declared lengths of the message, the PDU and each binding are ignored. The content of a value of
-/// unknown type is not skipped but read as the next binding, so decoding usually fails. The same
-/// applies to a NULL that has content.
+/// declared lengths of the message, the PDU and each binding are ignored. The content of a NULL or
+/// of a value of unknown type is not skipped. If there is any, it is read as the next binding, so
+/// decoding usually fails.
 ///
-/// Returns SNMP_ERR_CODEC for bytes that the functions of snmp/ber_reader.h refuse, such as an
-/// integer of more than four bytes, and for bytes in which an expected tag is missing or a list of
-/// bindings is declared longer than the bytes that follow. Also returns it when the reply has more
-/// bindings than the array, and when the record for a name or value is missing or too small. An
-/// empty string needs no record. Parts that were decoded before the error stay in `message`.
+/// Returns SNMP_ERR_CODEC when:
+/// - a function of snmp/ber_reader.h refuses the bytes, such as an integer of more than four bytes,
+/// - an expected tag is missing,
+/// - the declared length of the list of bindings exceeds the number of bytes that follow,
+/// - the reply has more bindings than the array `varbinds`, or
+/// - the record for a name or value is missing or too small. An empty string needs no record.
+///
+/// Parts that were decoded before the error stay in `message`.
 [[nodiscard]] snmp_status snmp_decode_message(snmp_message& message,
                                               std::span<const std::uint8_t> bytes);
 

@@ -22,28 +22,28 @@ struct snmp_result_slot {
 /// values in the reply to `results`. There must be one slot for each binding. Sends a get-next
 /// request when `pdu_type` is kPduGetNext, otherwise a get request. `address` and `mode` are those
 /// of snmp_exchange(). A zero byte follows a copied string if the slot has room for it. Values of
-/// types 6, 64 and 68 are not copied, and their slots then have no meaning. The `octets_value` of
-/// each binding is null afterwards.
+/// types 6, 64 and 68 are not copied; the contents of their slots are undefined. The `octets_value`
+/// of each binding is null afterwards.
 ///
 /// If the exchange fails, returns the status of snmp_exchange(). Otherwise returns the reply's
 /// error status, which is 0 on success. Returns SNMP_ERR_CODEC when there are more slots than
-/// bindings in the array, and when a value has no slot, has another type than its slot or does not
-/// fit in it.
+/// bindings in the array, and when a value has no slot, has a different type from its slot or does
+/// not fit in its slot.
 [[nodiscard]] snmp_status snmp_get(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 
-/// Sends the bindings of `message` to the device at `address` in a set request. The caller sets
-/// each binding's `index`, which is the index of the binding's slot in `results`. The binding takes
-/// its type from the slot. If the type is 4, the binding also takes its value from the slot;
-/// otherwise it keeps its own value. Copies the values in the reply to the slots and returns a
-/// status as snmp_get() does. The reply's first value goes to the first slot, the second to the
-/// second, and so on, whatever `index` was.
+/// Sends the bindings of `message` to the device at `address` in a set request. On entry, each
+/// binding's `index` must be the index of its slot in `results`. The binding takes its type from
+/// the slot. If the type is 4, the binding also takes its value from the slot; otherwise it keeps
+/// its own value. Like snmp_get(), copies the values in the reply to the slots and returns a
+/// status. The reply's first value goes to the first slot, the second to the second, and so on,
+/// whatever `index` was.
 ///
 /// A string here is a value of type 4, 64 or 68. The strings are copied to a buffer of kReplySize
 /// bytes, where each starts at a multiple of 16. The `octets_value` of a binding with a string is
 /// null after the exchange. Returns SNMP_ERR_CODEC and sends nothing when `varbind_count` exceeds
-/// the size of the array, when a binding has no slot, when a string has no value, and when the
-/// strings do not fit.
+/// the size of the array, when a binding has no slot, when a string has no record, and when the
+/// strings do not fit in the buffer.
 [[nodiscard]] snmp_status snmp_set(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 

@@ -32,7 +32,7 @@ void store(std::int32_t* out, std::uint64_t value) {
   if (out) *out = static_cast<std::int32_t>(value);
 }
 
-// Asks a second time when the first request gives no result.
+// Calls `ask` a second time if the first call returns nothing.
 template <typename Ask>
 std::optional<Dictionary> ask_twice(const Ask& ask) {
   std::optional<Dictionary> result;

@@ -14,19 +14,20 @@
 
 namespace onramp {
 
-/// One object to ask for. `expected_type` is not checked; the handler decides whether to accept the
-/// type of the value that comes.
+/// One object to ask for. `expected_type` is not checked; the handler decides which types it
+/// accepts in a reply.
 struct mib_entry {
   std::uint64_t expected_type = kTagInteger;
   snmp_oid oid;  ///< the name asked for; the reply's name is decoded into the same storage
 };
 
-/// Stores the value of a reply's binding in `result` under `name` and returns 0. To refuse the
-/// value, returns another number. The last argument is always 0.
+/// Stores the value of a reply's binding in `result` under `name` and returns 0. Returns any other
+/// number to refuse the value. The last argument is always 0.
 using mib_decode = snmp_status (*)(Dictionary& result, const char* name,
                                    const snmp_varbind& binding, std::uint64_t reserved);
 
-/// Says how to store the value of one mib_entry. Both have the same index in their arrays.
+/// Says how to store the value of one mib_entry. The entry and its handler have the same index in
+/// their arrays.
 struct mib_value_handler {
   const char* name = nullptr;   ///< the value's key in the result
   mib_decode decode = nullptr;  ///< null when the value is not stored
@@ -39,15 +40,16 @@ struct mib_table {
   const mib_value_handler* handlers = nullptr;
 };
 
-/// The two keys that every result has. The other keys are names of the table's handlers.
+/// The two keys that every result of a query has. The other keys are the names of the table's
+/// handlers.
 constexpr const char* kConnectionKey = "Connection";  ///< string, always "Network"
 constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's address
 
 constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
 /// The table that asks for kActiveIFObject. The name in each reply overwrites the name in this
-/// table, and later requests ask for the new name. After a reply with a shorter name, the table has
-/// room only for names of at most that length.
+/// table, and later requests ask for the new name. After a reply with a shorter name, the table
+/// accepts only names of at most that length.
 extern mib_table active_interface_table;
 
 /// Stores an INTEGER under `name` as a 32-bit number and returns 0. Returns 1 for a value of any
@@ -67,12 +69,13 @@ class snmp_table_request {
   /// The message to send. The reply is decoded into the same message. The caller sets `request_id`.
   [[nodiscard]] snmp_message& message() { return message_; }
 
-  /// Prepares the message for decoding another reply. Forgets the values of the previous one.
+  /// Prepares the message for decoding another reply, and discards the values of the previous
+  /// reply.
   void clear_values();
 
   /// Returns the values that the handlers accept from the reply in the message. Adds
   /// kConnectionKey, and `address` under kIPAddressKey. If a handler refuses a value, the values
-  /// stored before it are dropped. Returns nothing when the value of the last entry is refused, and
+  /// before it are dropped, too. Returns nothing when the value of the last entry is refused, and
   /// when the table has no entries.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
@@ -80,23 +83,22 @@ class snmp_table_request {
   mib_table& table_;
   std::vector<snmp_varbind> bindings_;
   std::vector<snmp_octets> octets_;
-  std::array<std::uint8_t, kReplySize> strings_{};  // those of all bindings, end to end
+  std::array<std::uint8_t, kReplySize> strings_{};  // the strings of all bindings, end to end
   snmp_message message_;
 };
 
 /// Asks the device at `address`, a dotted IPv4 text, for the objects of `table`. Returns nothing
 /// when `table` or `address` is null, when the request fails, when the reply has an error status,
 /// and when snmp_table_request::result() returns nothing for the reply. A request fails when it
-/// cannot be sent or gets no valid reply; only then is `out_no_reply` set to true. It is never set
-/// to false. The error status and index of a reply are stored in the last two arguments, each of
-/// which may be null. Blocks as snmp_exchange() does.
+/// cannot be sent or gets no valid reply. A failed request sets `out_no_reply` to true; nothing
+/// sets it to false. Stores the error status and index of a reply in the last two arguments, each
+/// of which may be null. Blocks as snmp_exchange() does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
                                                          std::int32_t* out_error_index);
 
-/// Does what snmp_query_table() does, and asks a second time when the first request gives no
-/// result.
+/// Calls snmp_query_table(), and calls it a second time if the first call returns nothing.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table_retry(mib_table* table,
                                                                const char* address,
                                                                bool& out_no_reply,
@@ -105,23 +107,23 @@ class snmp_table_request {
 
 /// Returns whether a device reports that it is using its wireless interface. `addresses` holds the
 /// device's addresses as strings, which are tried in order. A try makes one request, and a second
-/// one if the first gives no result. The first address that answers every request of its first try
-/// decides the result. Any other address is tried three times, with a pause of 20 ms after each
-/// try. If no address decides, the last try of the last address does. A try without a result counts
-/// as the value 0 of ActiveIF. An entry that is not a string counts as an address that answers
-/// without a result. Returns false when there are no addresses.
+/// request if the first returns no result. The first address that answers every request of its
+/// first try decides the result. Every other address before it is tried three times, with a pause
+/// of 20 ms after each try. If no address decides, the last try of the last address does. A try
+/// without a result counts as the value 0 of ActiveIF. An entry that is not a string counts as an
+/// address that answers without a result. Returns false when there are no addresses.
 ///
-/// Blocks for about 12 seconds for each address from which nothing comes back, not even the host's
-/// report that no program uses the port.
+/// Blocks for about 12 seconds for each address that sends nothing back, not even a report that the
+/// port is closed.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
-/// Makes one request to the device at `address`, which is null when the entry in the array of
-/// addresses is not a string. Returns the result of snmp_query_table(), and sets `no_reply` to true
-/// when that function sets `out_no_reply`.
+/// Makes one request to the device at `address`, which is null for an entry of `addresses` that is
+/// not a string. Returns what snmp_query_table() returns, and sets `no_reply` to true when
+/// snmp_query_table() sets `out_no_reply`.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
-/// Does what snmp_active_interface_is_wireless() above does, but makes each request by calling
-/// `ask`. So a caller can record the requests.
+/// Does what snmp_active_interface_is_wireless() above does, but calls `ask` to make each request.
+/// This lets a caller record the requests.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask);
 
 }  // namespace onramp

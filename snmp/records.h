@@ -39,7 +39,8 @@ struct snmp_octets {
   std::uint8_t* bytes = nullptr;
 };
 
-/// One variable binding. Only the value field that belongs to `type` is used.
+/// One variable binding. `type` is one of the tag bytes above; the comments give it in decimal.
+/// Only the value field for this type is used.
 struct snmp_varbind {
   std::uint64_t type = kTagNull;
   snmp_oid* name = nullptr;             ///< the name to ask for; a reply's name replaces it
@@ -64,14 +65,13 @@ struct snmp_message {
 };
 
 /// Makes `message` an SNMPv1 request with the community kCommunity of snmp/protocol.h. Sets
-/// `varbind_count`, and gives the type NULL to that many bindings, or to all if the array has
-/// fewer. Leaves `request_id` and `pdu_type` unchanged.
+/// `varbind_count`, and sets the type of that many bindings to NULL, or of all bindings if the
+/// array has fewer. Leaves `request_id` and `pdu_type` unchanged.
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
 /// Compares two object identifiers arc by arc. At the first difference, returns -1 when the arc of
-/// `first` is less, and 1 when it is greater. Without a difference, returns -1 when `first` is
-/// shorter. Otherwise returns 0, even when `second` is shorter. The program does not use this
-/// function.
+/// `first` is less, and 1 when it is greater. If there is no difference, returns -1 when `first` is
+/// shorter, and 0 otherwise, even when `second` is shorter. The program does not use this function.
 [[nodiscard]] int snmp_oid_compare(const snmp_oid& first, const snmp_oid& second);
 
 }  // namespace onramp

@@ -27,8 +27,8 @@ std::size_t ask(DatagramSocket& socket, const DatagramEndpoint& agent,
   return received ? received->length : 0;
 }
 
-// Does what snmp_exchange() does, and sets `sent` to the identifier that a reply must carry. This
-// may differ from the caller's `request_id`, because encoding replaces a negative number.
+// Does what snmp_exchange() does, and sets `sent` to the identifier that a reply must carry. `sent`
+// may differ from the caller's `request_id`, because encoding replaces a negative identifier.
 snmp_status exchange(snmp_message& message, const char* address, std::uint32_t mode,
                      std::uint64_t& sent) {
   snmp_packet request{};

@@ -12,18 +12,17 @@
 
 namespace onramp {
 
-/// The largest size of a reply datagram in bytes. All strings of a reply together have this limit,
-/// too.
+/// The largest size in bytes of a reply datagram, and of all strings of a reply together.
 constexpr std::uint16_t kReplySize = 1500;
 
 /// A buffer for one encoded message.
 using snmp_packet = std::array<std::uint8_t, 1536>;
 
-/// The longest waits: until a request can be sent, and until its reply arrives.
+/// The longest time to wait until a request can be sent, and until its reply arrives.
 constexpr std::chrono::seconds kSendWait{2};
 constexpr std::chrono::seconds kReceiveWait{2};
 
-/// Modes of snmp_exchange(). Every mode other than kModeNoNetwork works like kModeNetwork.
+/// Modes of snmp_exchange(). Any other value has the effect of kModeNetwork.
 constexpr std::uint32_t kModeNetwork = 4;
 constexpr std::uint32_t kModeNoNetwork = 6;
 
@@ -37,9 +36,9 @@ extern std::int64_t snmp_request_counter_ext;
 [[nodiscard]] std::uint64_t snmp_next_request_id();
 
 /// Returns `text` with each of its dot-separated parts replaced by the decimal number at the start
-/// of the part, or by 0 if there is none. This removes leading zeros, which would mark a part as
-/// octal. Returns nothing for a null or empty text, and when the result would be longer than 31
-/// characters.
+/// of that part, or by 0 if it does not start with a number. This removes leading zeros, which
+/// would mark a part as octal. Returns nothing for a null or empty text, and when the result would
+/// be longer than 31 characters.
 [[nodiscard]] std::optional<std::string> snmp_normalize_ipv4(const char* text);
 
 /// Returns the endpoint of the SNMP agent at `address`, a dotted IPv4 text. For any other text, the
@@ -48,12 +47,12 @@ extern std::int64_t snmp_request_counter_ext;
 
 /// Sends `message` to the SNMP port of `address`, a dotted IPv4 text, and decodes the reply into
 /// `message`. Sends nothing if `address` is null or not an IPv4 address. Blocks for at most
-/// kSendWait plus kReceiveWait. The wait ends early when the host reports that no program uses the
-/// port. `message.community` keeps its value, because the reply's community does not outlive the
-/// call. The reply's identifier is stored in `message.request_id` but not checked.
+/// kSendWait plus kReceiveWait. The wait ends early when the host reports that the port is closed.
+/// `message.community` keeps its value, because the reply's community does not outlive the call.
+/// The reply's identifier is stored in `message.request_id` but not checked.
 ///
-/// Returns SNMP_OK for a valid reply, SNMP_ERR_CODEC when the message cannot be encoded and when no
-/// valid reply comes in time, and SNMP_ERR_TRANSPORT when no socket can be opened. With
+/// Returns SNMP_OK for a valid reply, SNMP_ERR_TRANSPORT when no socket can be opened, and
+/// SNMP_ERR_CODEC when the message cannot be encoded or the wait ends without a valid reply. With
 /// kModeNoNetwork, sends nothing and returns SNMP_ERR_CODEC.
 [[nodiscard]] snmp_status snmp_exchange(snmp_message& message, const char* address,
                                         std::uint32_t mode);
