@@ -89,16 +89,16 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// Shows a new model-list page.
   void showModelListView();
 
-  /// Shows a new connection page for `type`. Also tells the chooser, the ChooseDeviceView, which
-  /// models to look for: the model that the user has chosen, or all models on the medium if the
-  /// user has chosen none.
+  /// Shows a new connection page for `type`. Also tells the chooser (ChooseDeviceView) which models
+  /// to look for: the model that the user has chosen, or all models on the medium if the user has
+  /// chosen none.
   void showConnectionTypeView(ConnectionType type);
 
   /// The effect depends on the current page:
-  /// - On the chooser, searches again.
+  /// - On the chooser: searches again.
   /// - On the connection page, if mIsWLANTool is false: shows the chooser if it lists a device, and
   ///   otherwise starts the wireless set-up tool.
-  /// - In all other cases, shows the chooser and searches.
+  /// - In all other cases: shows the chooser and searches.
   void showChooseDeviceView();
 
   /// Makes `image` the window's background, stretched to fit. Does nothing if `image` is nothing.
@@ -121,8 +121,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void performAction(std::string_view action) override;
 
   // The buttons' actions. The rightmost button is Next. The button to its left is Back, or Cancel
-  // on a page without Back. The other two buttons always quit. If the current page is neither the
-  // model list, the connection page nor the chooser, every button quits.
+  // on a page without Back. The other two buttons always quit. If the current page is not the model
+  // list, the connection page or the chooser, every button quits.
   void rightMostButtonClicked();
   void rightButtonClicked();
   void leftButtonClicked();
@@ -135,9 +135,10 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static std::vector<std::string> getSystemVersion();
 
   /// Each of these functions compares the running system's version with one bound of the range that
-  /// the medium supports. The first returns kNewerThanMaximum if isNewerThan() returns true, and
-  /// the second returns kOlderThanMinimum if isOlderThan() returns true. In all other cases, they
-  /// return kSupported. Unlike installationCheck(), they do not skip a bound whose "Major" is 0.
+  /// the medium supports. supportedOSMaxCheck() returns kNewerThanMaximum if isNewerThan() returns
+  /// true. supportedOSMinCheck() returns kOlderThanMinimum if isOlderThan() returns true. In all
+  /// other cases, both return kSupported. Unlike installationCheck(), they do not skip a bound
+  /// whose "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
@@ -159,9 +160,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// vendor.
   [[nodiscard]] static std::string setVenderName();
 
-  /// Returns the path of the package-options file, which holds the options for the package. If the
-  /// file's folder is missing, creates the folder and makes it writable for every user. Ignores
-  /// failures.
+  /// Returns the path of the package-options file, which passes the medium's options to the
+  /// package. If the file's folder is missing, creates the folder and makes it writable for every
+  /// user. Ignores failures.
   [[nodiscard]] static std::string InstallPKGInfoURL();
 
   /// Returns the path of the model file, which names the device's model and connection. Creates the
@@ -189,13 +190,14 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// package for the system, or when the package cannot be opened.
   bool launchPackage();
 
-  /// Returns at once and terminates the application one second later, so that the package has time
-  /// to open.
+  /// Terminates the application after one second, so that the package has time to open. Returns at
+  /// once.
   void quitMe();
 
-  /// Call the first function after a search that found no device, and the second when the user asks
-  /// for the wireless set-up tool. Both hide the wizard and return. Half a second later, the tool
-  /// runs. The wizard then acts on the tool's exit status:
+  /// Call launchWLANToolAutomatically() after a search that found no device, and
+  /// launchWLANToolManually() when the user asks for the wireless set-up tool. Both hide the wizard
+  /// and return. Half a second later, the tool runs. The wizard then acts on the tool's exit
+  /// status:
   /// - 1: It reappears. If the tool was started automatically, it shows the connection page with
   ///   the wireless choice selected.
   /// - 2: It terminates.
@@ -214,10 +216,10 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop until the chooser lists a device at the end of a pause, or until
-  /// kMostPauses pauses of length `pause` have passed. Then ends the search. During the wait, the
-  /// user can neither click a button nor close the window, and `page` shows its spinner. `page` may
-  /// be null.
+  /// Waits in a modal loop for up to kMostPauses pauses of length `pause`. Ends the wait after a
+  /// pause if the chooser lists a device by then. Ends the search after the wait. During the wait,
+  /// the user can neither click a button nor close the window, and `page` shows its spinner. `page`
+  /// may be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
   /// Sleeps for `pause` up to kMostPauses times, until the chooser lists a device or the
@@ -285,8 +287,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   Dictionary mKSCD;
   std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses a model
   std::uint32_t mContainedModelCount = 0;
-  /// Becomes true when the wizard starts the set-up tool automatically, and false again if that run
-  /// of the tool asks to go back to the connection page.
+  /// Becomes true when the wizard starts the set-up tool automatically. Becomes false again if the
+  /// tool then asks to go back to the connection page.
   bool mIsWLANTool = false;
   std::shared_ptr<Page> mChooseDeviceViewController;
   std::shared_ptr<Page> mShownPage;  ///< the current page; may be null

@@ -25,8 +25,8 @@ std::string fileName(const std::string& vendor, const std::string& kind) {
   return "com." + lowercaseString(vendor) + "." + kind + ".plist";
 }
 
-// Makes `folder` writable for every user, because other users' runs and the installer must be able
-// to replace the files in it. Does nothing if the path is longer than PATH_MAX allows on macOS.
+// Makes `folder` writable for every user, because other users and the installer must be able to
+// replace the files in it. Does nothing if the path is longer than PATH_MAX allows on macOS.
 void openToEveryone(const std::string& folder) {
   constexpr std::size_t kPathBufferSize = 1024;  // bytes, including the terminating zero
   if (folder.size() >= kPathBufferSize) return;

@@ -21,8 +21,8 @@ namespace {
 // The time between opening the package and terminating the application.
 constexpr std::chrono::milliseconds kQuitDelay{1000};
 
-// The time between hiding the application and running the set-up tool. The tool's run blocks the
-// main thread, so the window must disappear before it starts.
+// The time between hiding the application and running the set-up tool. The main thread is blocked
+// while the tool runs, so the window must disappear first.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
 // Exit statuses of the set-up tool. After any other status, or if the tool cannot be run, the

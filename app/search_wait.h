@@ -4,8 +4,8 @@
 
 namespace onramp {
 
-// How long the wizard waits for the device search. A wait consists of pauses. The wait ends after
-// any pause if a device is listed by then.
+// How long the wizard waits for the device search. A wait is a series of pauses. It ends after a
+// pause if a device is listed by then.
 
 /// The number of pauses after which the wait ends even if no device is listed.
 inline constexpr int kMostPauses = 5;

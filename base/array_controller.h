@@ -11,9 +11,9 @@
 
 namespace onramp {
 
-/// Holds the entries of a list, their order and the selection. A table can be bound to the
-/// controller. It then shows the list and is told of every change. All functions except
-/// arrangedCount() must be called on the main thread.
+/// Holds the entries of a list, their order and the selection. A table that is bound to the
+/// controller shows the list and is told about every change. All functions except arrangedCount()
+/// must be called on the main thread.
 class ArrayController {
  public:
   /// Makes rearrange() sort the entries by their strings under `key`. An entry that has no string

@@ -12,8 +12,8 @@
 
 namespace onramp {
 
-// All browsers post these notifications, without an object, on the default notification centre, and
-// observe them there. Each notification carries a NetServiceRef under kServiceInfo. The browse
+// All browsers post these notifications on the default notification centre, with a null `object`,
+// and observe them there. Each notification carries a NetServiceRef under kServiceInfo. The browse
 // flags, an unsigned long, are under kAddFlagInfo in kAddNotification, and under kRemoveFlagsInfo
 // in kRemoveNotification.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
@@ -99,7 +99,7 @@ class KSBonjour {
  private:
   struct Entry {
     NetServiceRef service;
-    int referenceCount = 0;    ///< additions, less removals while isValid was true
+    int referenceCount = 0;    ///< additions, minus the removals that found isValid true
     bool didResolved = false;  ///< whether the service has been resolved since its last addition
     bool isValid = true;       ///< false from a removal until the next addition or resolve
   };

@@ -29,10 +29,10 @@ class KSDeviceObserver {
 };
 
 /// Searches the network for devices that offer the service type that the medium names. Tells the
-/// observers when a device's service is resolved and when it is gone. Ignores services that lack a
-/// name, type or domain. A running search and its browser keep each other alive, so the owner of a
-/// search must call stopBrowsing() before releasing it. All functions must be called on the main
-/// thread.
+/// observers when a device's service is resolved and when the service is gone. Ignores services
+/// that lack a name, type or domain. A running search and its browser keep each other alive, so the
+/// owner of a search must call stopBrowsing() before releasing it. All functions must be called on
+/// the main thread.
 class KSBonjourSearch final : public KSBonjourObserver,
                               public std::enable_shared_from_this<KSBonjourSearch> {
  public:

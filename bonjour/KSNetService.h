@@ -13,8 +13,8 @@ namespace onramp {
 // nothing or false if the service is null. All functions must be called on the main thread.
 
 /// Callbacks for browses and resolves. They are called when a service is found, is gone or has been
-/// resolved. Each pointer may be null. `flags` are the flags of NetServiceBrowser. The structure
-/// must outlive every browse and resolve that is started with it.
+/// resolved. Each pointer may be null. `flags` are the flags in platform/net_service.h. The
+/// structure must outlive every browse and resolve that is started with it.
 struct ServiceClientCallbacks {
   void (*add)(const NetServiceRef& service, unsigned long flags) = nullptr;
   void (*remove)(const NetServiceRef& service, unsigned long flags) = nullptr;
@@ -66,7 +66,7 @@ int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
 /// resolves. For any other URL, looks up the host and stores its first address; `timeout` does not
 /// limit the look-up. Returns 1 and leaves `addresses` unchanged in these cases:
 /// - `uri` is nothing, malformed or a "usb://" URI, or `addresses` is null.
-/// - The host's name is longer than 1,024 bytes or has no known IPv4 address.
+/// - The host's name is longer than 1,024 bytes, or the look-up finds no IPv4 address.
 /// - The resolve fails or times out.
 int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
                                           std::optional<std::vector<std::string>>* addresses,
@@ -84,9 +84,10 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 /// service lacks counts as empty.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyDeviceURI(const NetServiceRef& service);
 
-/// Return the USB model and the USB manufacturer from the service's TXT record. Their keys depend
-/// on the service's type; see identity_keys.h. Return nothing when the value is absent or not
-/// UTF-8, when the record is absent or malformed, and when identity_keys.h does not list the type.
+/// Return the USB model and the USB manufacturer from the service's TXT record. The record's keys
+/// for them depend on the service's type; see identity_keys.h. Return nothing when the value is
+/// absent or not UTF-8, when the record is absent or malformed, and when identity_keys.h does not
+/// list the type.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyModel(const NetServiceRef& service);
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyManufacturer(const NetServiceRef& service);
 
@@ -102,13 +103,13 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 [[nodiscard]] bool KSNetServiceSupportsURF(const NetServiceRef& service);
 
 /// The client function of every browser. `info` is null or points to a ServiceClientCallbacks.
-/// Calls `add` or `remove`, or neither if `error` reports a failure.
+/// Calls its `add` or `remove`, or neither if `error` reports a failure.
 void KSNetServiceBrowseCallBack(const NetServiceBrowserRef& browser, unsigned long flags,
                                 const NetServiceRef& service, const NetServiceError& error,
                                 void* info);
 
 /// The client function of every asynchronous resolve. `info` is null or points to a
-/// ServiceClientCallbacks. Calls `resolved` after a success, and starts the resolve again after a
+/// ServiceClientCallbacks. Calls its `resolved` after a success. Starts the resolve again after a
 /// failure.
 void KSNetServiceResolveCallBack(const NetServiceRef& service, const NetServiceError& error,
                                  void* info);

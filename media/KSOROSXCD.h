@@ -9,9 +9,9 @@
 
 namespace onramp {
 
-/// Makes a record of the medium. It holds the models that the medium serves, whether the medium has
-/// a printer package and a scanner package, its series code at the support centre, and the service
-/// type to search the network for.
+/// Makes a record of the medium: the models that the medium serves, whether it has a printer
+/// package and a scanner package, the series code at the support centre, and the service type to
+/// search the network for.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.

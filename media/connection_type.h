@@ -8,9 +8,9 @@
 
 namespace onramp {
 
-/// The wired connections that a model supports, or on which several models agree.
+/// The wired connections that one model supports, or that several models share.
 enum class ConnectionType : unsigned char {
-  kNeither = 0,  ///< neither USB nor Ethernet, or models that disagree
+  kNeither = 0,  ///< neither USB nor Ethernet, or the models differ
   kEthernet = 2,
   kUSB = 3,
   kUSBAndEthernet = 4,

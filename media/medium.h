@@ -23,9 +23,9 @@ inline constexpr std::string_view kVenderName = "VenderName";
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
 /// at `bundlePath`. If `relativePath` is nothing, returns that folder. `bundlePath` must not end in
-/// "/". If it contains no "/", the folder counts as empty, so the result is `relativePath` or an
-/// empty text. Removes slashes from the result's end, as withoutClosingSlash() does. Does not
-/// access the disk.
+/// "/". If `bundlePath` contains no "/", the result is `relativePath`, or an empty text if that is
+/// nothing. Removes slashes from the result's end, as withoutClosingSlash() does. Does not access
+/// the disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 

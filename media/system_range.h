@@ -41,8 +41,8 @@ enum class SystemSupport : std::uint32_t {
 /// Whether `version` is below `minimum`.
 [[nodiscard]] bool isOlderThan(const Dictionary& minimum, const SystemVersion& version);
 
-/// Returns how `version` compares with the range. Checks `maximum` first. Skips a bound that sets
-/// no limit.
+/// Returns how `version` compares with the range from `minimum` to `maximum`. Checks `maximum`
+/// first. Skips a bound that sets no limit.
 [[nodiscard]] SystemSupport systemSupport(const SystemVersion& version, const Dictionary& minimum,
                                           const Dictionary& maximum);
 

@@ -16,7 +16,7 @@ namespace onramp {
 /// missing. A null pointer means that there is no list.
 using local_address_list = std::shared_ptr<const Array>;
 
-/// Returned by a call with an invalid argument.
+/// KSSysConfigCopyCurrentLocalAddressList() returns this status for an invalid argument.
 inline constexpr int kLocalAddressListMisused = 1;
 
 /// Reads the computer's addresses, stores them as a new list in `*out_list` and returns 0. The list

@@ -27,11 +27,11 @@ inline constexpr std::string_view kLaunchWLANToolNotification = "addNotification
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
-/// The page that lists the devices found on the network. It lists a device if setSearchModelList()
-/// has set the device's model and the device reports that it is using its wireless interface. The
-/// wizard creates this page only once. While the window shows another page, this page keeps its
-/// list, and a running search goes on. A running search shares ownership of the page until
-/// stopBrowsing() is called.
+/// The page that lists the devices found on the network. It lists a device if the device's model
+/// was passed to setSearchModelList() and the device reports that it is using its wireless
+/// interface. The wizard creates this page only once. While the window shows another page, this
+/// page keeps its list, and a running search goes on. A running search shares ownership of the page
+/// until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {

@@ -42,8 +42,8 @@ class Page {
 /// the file is missing, cannot be read or contains no view.
 [[nodiscard]] std::shared_ptr<Page> loadPage(const std::string& name, InterfaceOwner& owner);
 
-/// Shows or hides `progress`, a spinner, and `text`, which asks the user to wait. The spinner spins
-/// while it is shown.
+/// Shows or hides `progress`, a spinner, and `text`, which asks the user to wait. The spinner is
+/// animated only while it is shown.
 void showWaiting(const ProgressIndicator& progress, const TextField& text, bool on);
 
 }  // namespace onramp

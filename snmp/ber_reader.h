@@ -68,7 +68,7 @@ namespace onramp {
 }
 
 /// Reads an object identifier of `length` content bytes into `target`. On entry, `target->count` is
-/// the number of arcs that fit. On return, it is the number of arcs read, which is 0 when `length`
+/// the number of arcs that fit. On success, it is the number of arcs read, which is 0 when `length`
 /// is 0. The first byte encodes the first two arcs: the byte divided by 40, and the remainder.
 /// Refuses a null target, more arcs than fit, an arc above 65,535, and content that ends inside an
 /// arc. A refusal leaves `count` unchanged, but some arcs may have been stored.

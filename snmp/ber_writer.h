@@ -37,8 +37,8 @@ class ber_writer {
 };
 
 // Each of these functions puts one part of a BER encoding (X.690 section 8) in front of the bytes
-// written so far and returns SNMP_OK. If the buffer has too little room, or to refuse a value that
-// cannot be encoded, the function returns SNMP_ERR_CODEC, and may leave some bytes of the part in
+// written so far and returns SNMP_OK. If the buffer has too little room, or if the function refuses
+// a value that cannot be encoded, it returns SNMP_ERR_CODEC and may leave some bytes of the part in
 // the buffer.
 
 /// Puts a length field of one, two or three bytes: the short form, or the long form that starts

@@ -33,12 +33,12 @@ namespace onramp {
 /// All strings are stored end to end in one buffer. On entry, every `octets_value->bytes` must
 /// point to the start of that buffer. On return, the `bytes` of a string points past the strings
 /// before it, and its `capacity` is reduced by their size. If a binding's value is an integer or an
-/// object identifier, all fields of `*octets_value` are reset, so its `bytes` is null.
+/// object identifier, all fields of `*octets_value` are set to zero or null.
 ///
 /// Decoding ends after the binding that reaches the declared end of the list of bindings. The
 /// declared lengths of the message, the PDU and each binding are ignored. The content of a NULL or
-/// of a value of unknown type is not skipped. If there is any, it is read as the next binding, so
-/// decoding usually fails.
+/// of a value of unknown type is not skipped. If the content is not empty, it is read as the next
+/// binding, so decoding usually fails.
 ///
 /// Returns SNMP_ERR_CODEC when:
 /// - a function of snmp/ber_reader.h refuses the bytes, such as an integer of more than four bytes,

@@ -108,18 +108,18 @@ class snmp_table_request {
 /// Returns whether a device reports that it is using its wireless interface. `addresses` holds the
 /// device's addresses as strings, which are tried in order. A try makes one request, and a second
 /// request if the first returns no result. The first address that answers every request of its
-/// first try decides the result. Every other address before it is tried three times, with a pause
-/// of 20 ms after each try. If no address decides, the last try of the last address does. A try
-/// without a result counts as the value 0 of ActiveIF. An entry that is not a string counts as an
-/// address that answers without a result. Returns false when there are no addresses.
+/// first try decides the result. Each earlier address is tried three times, with a pause of 20 ms
+/// after each try. If no address decides, the last try of the last address does. A try without a
+/// result counts as the value 0 of ActiveIF. An entry that is not a string counts as an address
+/// that answers without a result. Returns false when there are no addresses.
 ///
 /// Blocks for about 12 seconds for each address that sends nothing back, not even a report that the
 /// port is closed.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
-/// Makes one request to the device at `address`, which is null for an entry of `addresses` that is
-/// not a string. Returns what snmp_query_table() returns, and sets `no_reply` to true when
-/// snmp_query_table() sets `out_no_reply`.
+/// Makes one request to the device at `address`, which is null if the entry in the list of
+/// addresses is not a string. Returns what snmp_query_table() returns, and sets `no_reply` to true
+/// when snmp_query_table() sets `out_no_reply`.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
 /// Does what snmp_active_interface_is_wireless() above does, but calls `ask` to make each request.
