@@ -29,9 +29,9 @@ class NotificationCenter {
   /// Returns the centre that the whole process shares.
   [[nodiscard]] static NotificationCenter& defaultCenter();
 
-  /// Adds `handler`, which is called for every notification called `name`, whoever posts it, until
-  /// removeObserver() is called for `observer`. `observer` is never dereferenced. An observer may
-  /// have several handlers.
+  /// Adds `handler` for all notifications called `name`, whoever posts them. `observer` identifies
+  /// the handler for removeObserver() and is never dereferenced. An observer may have several
+  /// handlers.
   void addObserver(const void* observer, std::string_view name, Handler handler);
 
   /// Removes all handlers of `observer`. During a delivery, a handler that is removed before its
@@ -39,8 +39,8 @@ class NotificationCenter {
   void removeObserver(const void* observer);
 
   /// Calls all handlers that were added for the notification's name. A handler may add and remove
-  /// observers and post further notifications. A handler that is added during a delivery is called
-  /// only from the next notification on.
+  /// observers and post further notifications. A handler that is added during a delivery does not
+  /// receive that notification.
   void post(const Notification& notification);
 
  private:

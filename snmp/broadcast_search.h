@@ -15,8 +15,8 @@ namespace onramp {
 /// this function.
 ///
 /// For each interface, blocks for up to 2 seconds to send, and then for 5 to 8 seconds to receive.
-/// Receiving ends earlier after 256 attempts. Returns an empty array at once when all interfaces
-/// are skipped or the list of interfaces cannot be read.
+/// Receiving also ends after 256 attempts. Returns an empty array at once when all interfaces are
+/// skipped or the list of interfaces cannot be read.
 [[nodiscard]] Array snmp_broadcast_search(mib_table& table);
 
 }  // namespace onramp
