@@ -138,8 +138,9 @@ int Daemon::onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error*) {
   return 0;
 }
 
-// Here and in lost(), a query is allowed to remove other queries from `queries_`. The loop
-// therefore runs over a copy and skips the removed queries.
+// When a query handles a call from here or from lost(), other queries may be destroyed and so
+// disappear from `queries_`. The loop therefore runs over a copy and skips the queries that have
+// disappeared.
 void Daemon::arrived() {
   isPresent_ = true;
   for (Query* const query : std::vector(queries_)) {

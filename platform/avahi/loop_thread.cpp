@@ -54,8 +54,8 @@ void LoopThread::runSoon() {
   });
 }
 
-// Runs on `thread_`. Once the main thread has been asked to run the loop, this function waits only
-// for the main thread's answer.
+// Runs on `thread_`. After this function has asked the main thread to run the loop, it ignores the
+// loop's descriptor until the main thread has answered.
 void LoopThread::wait() {
   bool isAsking = false;
   while (!isEnding_) {

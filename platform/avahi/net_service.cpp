@@ -75,9 +75,9 @@ bool Service::resolveWithTimeout(std::chrono::duration<double> timeLimit) {
   return client_ ? startResolve(timeLimitOf(timeLimit)) : resolveNow(timeLimitOf(timeLimit));
 }
 
-// The client is called from the main loop, not from inside sd-event's loop. It may therefore
-// destroy any object, and a slow client does not keep sd-event's loop from reading the messages
-// that are already waiting.
+// The client is called from the main loop, not from inside sd-event's loop. So the client may
+// destroy any object, and even if it is slow, sd-event's loop has already read all waiting
+// messages.
 bool Service::startResolve(TimeLimit timeLimit) {
   daemon_ = Daemon::shared();
   if (!daemon_) return false;

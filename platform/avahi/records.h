@@ -26,7 +26,7 @@ struct Instance {
 /// The DNS record types that this backend uses (RFC 1035 section 3.2.2, RFC 3596).
 enum class RecordType : std::uint16_t { kIPv4 = 1, kIPv6 = 28 };
 
-/// The records of one name and type on any interface and protocol, kept up to date.
+/// The current DNS records of one name and type, from all interfaces and protocols.
 class Records {
  public:
   struct Record {

@@ -14,7 +14,7 @@
 
 namespace onramp::avahi {
 
-/// The result of a resolve, in the form of NetService::addressing() and txtData().
+/// The result of a resolve, in the formats of NetService::addressing() and txtData().
 struct Resolution {
   std::vector<Data> addressing;
   Data txt;
@@ -27,13 +27,13 @@ struct Server {
   Data txt;
 };
 
-/// Looks up the host, the port, the TXT record and the addresses of one service on any interface
-/// and protocol. The resolve continues until all of these are known or its time is up. When the
-/// daemon goes away, the resolve starts again once the daemon is back.
+/// Looks up the host, the port, the TXT record and the addresses of one service, on any interface
+/// and protocol. Ends when all of these are known or the time is up. If the daemon goes away, the
+/// resolve starts again when the daemon is back.
 class Resolve {
  public:
-  /// Called when the resolve ends, at most once, from inside sd-event's loop. The argument is
-  /// nothing when the time is up. The function must not destroy the resolve.
+  /// Called once from inside sd-event's loop when the resolve ends. The argument is nothing when
+  /// the time is up. The function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
   /// The daemon must outlive the resolve. Without a `timeLimit`, the resolve may run for ever.
@@ -62,8 +62,8 @@ class Resolve {
   bool isGraceOver_ = false;
   unsigned losses_ = 0;           ///< the daemon's losses() when the resolve last began
   std::optional<Server> server_;  ///< nothing until the daemon has named the host
-  // The daemon limits the number of questions that a client has open, so the question about the
-  // service is closed as soon as it is answered.
+  // Destroyed as soon as it is answered, because the daemon limits the number of queries that this
+  // program may have open.
   std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;

@@ -25,9 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// A dump is the kernel's list of a whole table. If the table changes during a dump, the kernel
-// marks the dump as interrupted, and the dump is requested again. This is the maximum number of
-// requests.
+// How often to request one dump, the kernel's list of a whole table. The request must be repeated
+// if the table changes during the dump, in which case the kernel marks the dump as interrupted.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;
