@@ -21,8 +21,8 @@ class ApplicationDelegate : public InterfaceOwner {
   virtual void awakeFromNib() = 0;
 
   /// When the main loop starts, applicationWillFinishLaunching() is called, and then
-  /// applicationDidFinishLaunching(). The second call is left out if the first has called
-  /// terminateApplication().
+  /// applicationDidFinishLaunching(). applicationDidFinishLaunching() is not called if the first
+  /// call has terminated the application.
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 

@@ -45,14 +45,13 @@ class Interface {
   /// Qt's files, a window counts as a view.
   [[nodiscard]] View view() const;
 
-  /// Returns the name of the class that the file gives to the view of view(), such as
-  /// "ModelListView". Returns an empty text when there is no view or the file names no class for
-  /// it.
+  /// Returns the name of the class of view() in the file, such as "ModelListView". Returns an empty
+  /// text when there is no view or the file names no class for it.
   [[nodiscard]] std::string viewClass() const;
 
-  /// Returns a handle to the object with this name in the file, or an empty handle when no object
-  /// of the kind of `Handle` has the name. On macOS, finds no menus, no menu items, and no windows
-  /// except the one called "window".
+  /// Returns a handle to the object that the file calls `name`. Returns an empty handle when there
+  /// is no such object or it is not of the handle's kind. On macOS, finds no menus, no menu items,
+  /// and no windows except the one called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

@@ -28,7 +28,7 @@ inline constexpr std::int32_t kNetServiceErrorTimeout = -72007;
 
 // The flags that a NetServiceBrowser passes to its client.
 
-/// The client is called again at once. Only the backend for macOS sets this flag.
+/// The client will be called again at once. Only the backend for macOS sets this flag.
 inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
 /// The service is gone. Without this flag, the service has been found.
 inline constexpr unsigned long kNetServiceFlagRemove = 8;
@@ -39,11 +39,11 @@ inline constexpr unsigned long kNetServiceFlagRemove = 8;
 class NetServiceBrowser {
  public:
   /// Called when a service is found and when it is gone. Both calls pass the same `service`. A
-  /// service is identified by its name, type and domain. It is found when the first network
-  /// interface and protocol shows it, and gone when none shows it any more. When a running search
-  /// fails, all its services are reported as gone, and the search restarts automatically. Some
-  /// backends report the failure in one more call, with a null `service` and an `error` whose code
-  /// is not 0. The client may call invalidate() or destroy the browser.
+  /// service is identified by its name, type and domain. It is found when it first appears on any
+  /// network interface and protocol, and gone when it has disappeared from all of them. When a
+  /// running search fails, all its services are reported as gone, and the search restarts
+  /// automatically. Some backends report the failure in one more call, with a null `service` and an
+  /// `error` whose code is not 0. The client may call invalidate() or destroy the browser.
   using Client = void (*)(const NetServiceBrowserRef& browser, unsigned long flags,
                           const NetServiceRef& service, const NetServiceError& error, void* info);
 
@@ -60,7 +60,7 @@ class NetServiceBrowser {
   virtual void schedule() = 0;
   virtual void unschedule() = 0;
 
-  /// Starts a search for services of the type `type`, such as "_ipp._tcp.", in `domain`, such as
+  /// Starts a search for services of this `type`, such as "_ipp._tcp.", in `domain`, such as
   /// "local.". An empty `domain` means "local." and all other domains that the computer is
   /// configured to browse. Returns false when the search cannot start, for example because this
   /// browser is already searching. A search can start even if the responder is not running, and
@@ -75,8 +75,8 @@ class NetServiceBrowser {
   virtual void stopSearch() = 0;
 };
 
-/// One service on the network, regardless of the network interface and protocol. To resolve a
-/// service is to ask the network for its addresses and TXT record. Main thread only. The client is
+/// One service on the network, which need not be on one network interface or protocol. A resolve
+/// asks the network for the service's addresses and TXT record. Main thread only. The client is
 /// called on the main thread, even while a modal window is shown. Destroying a service cancels its
 /// resolve.
 class NetService {
@@ -86,8 +86,8 @@ class NetService {
   /// may call any function of the service, or destroy the service.
   using Client = void (*)(const NetServiceRef& service, const NetServiceError& error, void* info);
 
-  /// Creates a service that can be resolved. `port` has no effect on the result. Returns null on
-  /// failure.
+  /// Creates a service with this domain, type and name. `port` has no effect on a resolve. Returns
+  /// null on failure.
   [[nodiscard]] static NetServiceRef create(const std::string& domain, const std::string& type,
                                             const std::string& name, std::int32_t port);
 
@@ -125,9 +125,9 @@ class NetService {
   virtual void unschedule() = 0;
 
   /// Resolves the service. If `timeLimit` is 0 or less, there is no time limit. With a client,
-  /// returns at once whether the resolve has started, and calls the client when it ends. Without a
-  /// client, blocks until the resolve ends and returns whether it succeeded. Returns false when
-  /// another resolve of the service is running.
+  /// returns at once; the result says whether the resolve has started. The client is called when
+  /// the resolve ends. Without a client, blocks until the resolve ends and returns whether it
+  /// succeeded. Returns false when another resolve of the service is running.
   virtual bool resolveWithTimeout(std::chrono::duration<double> timeLimit) = 0;
 
   /// Cancels the running resolve, if there is one, without calling the client.

@@ -165,8 +165,8 @@ class TableView : public Control {
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 of the menu is not a command; the button shows it
-/// as its title.
+/// A button that opens a menu of commands. Item 0 of the menu is not a command; it is what the
+/// button shows.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;

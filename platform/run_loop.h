@@ -26,8 +26,8 @@ void runModalForWindow(const Window& window);
 /// waiting actions of performOnMainThread() do not run. Callable from any thread.
 void abortModal();
 
-/// Blocks the calling thread, which must not be the main thread, for `duration`, and then returns
-/// true. When the application terminates, returns false at once, and the caller must end its
+/// Blocks the calling thread for `duration` and then returns true. If the application terminates,
+/// returns false at once, and the caller must end its thread. Must not be called on the main
 /// thread.
 bool sleepOffMainThread(std::chrono::milliseconds duration);
 

@@ -11,9 +11,9 @@ namespace onramp {
 /// report its version.
 [[nodiscard]] std::optional<std::string> productVersion();
 
-/// Returns the same version in binary-coded decimal, as Gestalt() of macOS does for the selector
-/// "sysv". For example, 0x1068 means 10.6.8. A minor or bug-fix number above 9 becomes 9. Returns
-/// nothing when the system does not report its version.
+/// Returns the same version in binary-coded decimal, in the format that Gestalt() of macOS uses for
+/// the selector "sysv". For example, 0x1068 means 10.6.8. A minor or bug-fix number above 9 becomes
+/// 9. Returns nothing when the system does not report its version.
 [[nodiscard]] std::optional<std::int32_t> gestaltSystemVersion();
 
 }  // namespace onramp

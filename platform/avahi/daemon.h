@@ -17,9 +17,9 @@ namespace onramp::avahi {
 class Query;
 
 /// A connection to the Avahi daemon over the system's message bus. The bus and the daemon may come
-/// and go at any time. The connection knows all queries and sends them again to each new daemon.
-/// Only runUntil() waits for the daemon. Main thread only. README.md in this folder explains how
-/// the parts of this backend work together.
+/// and go at any time. The connection keeps a list of all queries and sends them again to each new
+/// daemon. Only runUntil() waits for the daemon. Main thread only. README.md in this folder
+/// explains how the parts of this backend work together.
 class Daemon {
  public:
   /// Returns the connection that all callers share, or creates it if there is none. The connection
@@ -49,7 +49,7 @@ class Daemon {
 
   explicit Daemon(EventLoop loop);
 
-  // These functions are for queries.
+  // Called by queries.
   void add(Query* query);
   void remove(Query* query);
   void listen(const std::string& path, Query* query) { listeners_[path] = query; }

@@ -83,7 +83,7 @@ void LoopThread::askMainThread() {
   });
 }
 
-// The last call of sd_event_run() finds nothing to do. It prepares the loop's descriptor for the
+// The last call of sd_event_run() finds nothing to do, but prepares the loop's descriptor for the
 // next wait.
 void LoopThread::runLoop() {
   int done = 0;

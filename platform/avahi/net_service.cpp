@@ -76,8 +76,8 @@ bool Service::resolveWithTimeout(std::chrono::duration<double> timeLimit) {
 }
 
 // The client is called from the main loop, not from inside sd-event's loop. So the client may
-// destroy any object, and even if it is slow, sd-event's loop has already read all waiting
-// messages.
+// destroy any object. A slow client does not delay the messages that are already waiting, because
+// sd-event's loop reads them before the client is called.
 bool Service::startResolve(TimeLimit timeLimit) {
   daemon_ = Daemon::shared();
   if (!daemon_) return false;

@@ -161,8 +161,8 @@ void Browser::gone(const Instance& instance) {
 }
 
 // The client is called from the main loop, not from inside sd-event's loop. So the client may
-// destroy any object, and even if it is slow, sd-event's loop has already read all waiting
-// messages.
+// destroy any object. A slow client does not delay the messages that are already waiting, because
+// sd-event's loop reads them before the client is called.
 void Browser::tell(unsigned long flags, const NetServiceRef& service) {
   performOnMainThread([weak = weak_from_this(), search = search_, flags, service] {
     const auto browser = weak.lock();

@@ -80,7 +80,7 @@ void Resolve::begin() {
       [this](Query::Event event, sd_bus_message* message) { happened(event, message); });
 }
 
-// This function ignores a failure, because the query is then sent again automatically.
+// A failure needs no action here, because the query is then sent again automatically.
 void Resolve::happened(Query::Event event, sd_bus_message* message) {
   if (event == Query::Event::kFound) server_ = serverIn(message);
   checkSoon();

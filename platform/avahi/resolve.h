@@ -32,8 +32,8 @@ struct Server {
 /// resolve starts again when the daemon is back.
 class Resolve {
  public:
-  /// Called once from inside sd-event's loop when the resolve ends. The argument is nothing when
-  /// the time is up. The function must not destroy the resolve.
+  /// Called when the resolve ends, at most once, from inside sd-event's loop. The argument is
+  /// nothing when the time is up. The function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
   /// The daemon must outlive the resolve. Without a `timeLimit`, the resolve may run for ever.
@@ -62,8 +62,8 @@ class Resolve {
   bool isGraceOver_ = false;
   unsigned losses_ = 0;           ///< the daemon's losses() when the resolve last began
   std::optional<Server> server_;  ///< nothing until the daemon has named the host
-  // Destroyed as soon as it is answered, because the daemon limits the number of queries that this
-  // program may have open.
+  // This query is destroyed as soon as it is answered, because the daemon limits the number of
+  // queries that a program may have open.
   std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;

@@ -8,8 +8,8 @@ namespace onramp {
 /// trailing "/". Used by tests and by tools that examine another application.
 void setMainBundlePath(std::string path);
 
-/// Returns the path of the running application's bundle, without a trailing "/". If
-/// setMainBundlePath() has not set this path, the bundle is the folder that holds
+/// Returns the path of the running application's bundle, without a trailing "/". Unless
+/// setMainBundlePath() has set the path, the bundle is the folder that holds
 /// Contents/<system>/<executable>. If the executable is not in such a folder, the bundle is the
 /// executable's folder.
 [[nodiscard]] std::string mainBundlePath();

@@ -110,7 +110,7 @@ class BinaryWalk {
   }
 
   // Computes the object's cost. Returns false when libplist must not build the object. The depth
-  // limit ends the recursion.
+  // limit bounds the recursion.
   bool visit(std::size_t index, std::size_t depth) {
     State& state = states_[index];
     if (state.progress == Progress::kOpen) {

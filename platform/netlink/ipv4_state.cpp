@@ -25,8 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// How often to request one dump, the kernel's list of a whole table. The request must be repeated
-// if the table changes during the dump, in which case the kernel marks the dump as interrupted.
+// The maximum number of requests for one dump (the kernel's list of a whole table). If the table
+// changes during a dump, the kernel marks the dump as interrupted, and it must be requested again.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;

@@ -8,7 +8,7 @@
 namespace onramp::posix {
 
 /// Reads the regular file at `path`. Returns nothing when the file cannot be read, is not a regular
-/// file, or is larger than `most` bytes. Never blocks on a pipe.
+/// file, or is larger than `most` bytes. Does not block even if `path` is a pipe.
 [[nodiscard]] std::optional<std::string> readFile(const std::string& path, std::size_t most);
 
 /// Writes `bytes` to `path` atomically: writes and flushes a temporary file in the same folder,
