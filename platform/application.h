@@ -20,9 +20,8 @@ class ApplicationDelegate : public InterfaceOwner {
   /// Called once, after setOutlets() and before the main loop starts.
   virtual void awakeFromNib() = 0;
 
-  /// When the main loop starts, applicationWillFinishLaunching() is called, and then
-  /// applicationDidFinishLaunching(). applicationDidFinishLaunching() is not called if the first
-  /// call has terminated the application.
+  /// Both functions are called when the main loop starts, applicationWillFinishLaunching() first.
+  /// If that call terminates the application, applicationDidFinishLaunching() is not called.
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 

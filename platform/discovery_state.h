@@ -11,7 +11,7 @@ namespace onramp {
 
 /// Returns, in English, the reason why the system's service discovery does not work. Returns
 /// nothing when no such reason is known. May block until the system answers. A search can be
-/// started even while discovery does not work. It finds services as soon as discovery works.
+/// started even while discovery does not work, and finds services as soon as it works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
 /// A report that a NetServiceBrowser's search has seen a service on one network interface and

@@ -45,8 +45,8 @@ class Interface {
   /// Qt's files, a window counts as a view.
   [[nodiscard]] View view() const;
 
-  /// Returns the name of the class of view() in the file, such as "ModelListView". Returns an empty
-  /// text when there is no view or the file names no class for it.
+  /// Returns the class name of the view that view() returns, such as "ModelListView". Returns an
+  /// empty text when there is no view or the file gives it no class.
   [[nodiscard]] std::string viewClass() const;
 
   /// Returns a handle to the object that the file calls `name`. Returns an empty handle when there

@@ -14,7 +14,7 @@ namespace onramp {
 class NetService;
 class NetServiceBrowser;
 
-/// Handles to shared objects. Handles to the same object compare equal.
+/// Shared handles. Handles to the same object compare equal.
 using NetServiceRef = std::shared_ptr<NetService>;
 using NetServiceBrowserRef = std::shared_ptr<NetServiceBrowser>;
 
@@ -75,10 +75,10 @@ class NetServiceBrowser {
   virtual void stopSearch() = 0;
 };
 
-/// One service on the network, which need not be on one network interface or protocol. A resolve
-/// asks the network for the service's addresses and TXT record. Main thread only. The client is
-/// called on the main thread, even while a modal window is shown. Destroying a service cancels its
-/// resolve.
+/// One service on the network. It may be available on several network interfaces and protocols. A
+/// resolve asks the network for the service's addresses and TXT record. Main thread only. The
+/// client is called on the main thread, even while a modal window is shown. Destroying a service
+/// cancels its resolve.
 class NetService {
  public:
   /// Called when a resolve has ended. The code in `error` is 0 after success and
@@ -99,9 +99,9 @@ class NetService {
   /// Returns the service's name in UTF-8 without escapes, such as "Office Printer". name(), type()
   /// and domain() return nothing when the system does not report the text.
   [[nodiscard]] virtual std::optional<std::string> name() const = 0;
-  /// Returns the type with its closing dot, such as "_ipp._tcp.".
+  /// Returns the type with its trailing dot, such as "_ipp._tcp.".
   [[nodiscard]] virtual std::optional<std::string> type() const = 0;
-  /// Returns the domain with its closing dot, such as "local.".
+  /// Returns the domain with its trailing dot, such as "local.".
   [[nodiscard]] virtual std::optional<std::string> domain() const = 0;
 
   /// Returns the addresses that the last resolve found, in the responder's order. The list is empty

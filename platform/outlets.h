@@ -151,7 +151,7 @@ class TableView : public Control {
   using Control::Control;
 
   /// Shows the entries of `controller`, and keeps the selections of the table and of `controller`
-  /// the same. A double-click on an entry clicks the window's default button. May be called only
+  /// in sync. A double-click on an entry clicks the window's default button. May be called only
   /// once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 

@@ -49,7 +49,7 @@ class Daemon {
 
   explicit Daemon(EventLoop loop);
 
-  // Called by queries.
+  // Queries call these functions.
   void add(Query* query);
   void remove(Query* query);
   void listen(const std::string& path, Query* query) { listeners_[path] = query; }
@@ -69,8 +69,7 @@ class Daemon {
   static int onMessage(sd_bus_message* message, void* self, sd_bus_error* error);
   static int onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error* error);
 
-  // `loop_` comes first, and so is destroyed last, because the thread, the bus and the timer use
-  // it.
+  // The first member is destroyed last: the thread, the bus and the timer use the loop.
   EventLoop loop_;
   Timer retry_;
   std::vector<Query*> queries_;

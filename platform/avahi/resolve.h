@@ -22,7 +22,7 @@ struct Resolution {
 
 /// The host and the port that offer a service, and the data of the service's TXT record.
 struct Server {
-  std::string host;  ///< a domain name with escapes and without a closing dot
+  std::string host;  ///< a domain name with escapes and without a trailing dot
   std::uint16_t port = 0;
   Data txt;
 };
@@ -40,8 +40,8 @@ class Resolve {
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
-  /// Returns whether the service's name, type or domain is invalid, so that the daemon cannot look
-  /// up the service.
+  /// Returns whether the daemon cannot look up the service because its name, type or domain is
+  /// invalid.
   [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:

@@ -5,7 +5,7 @@
 namespace onramp {
 
 /// Makes the folder at `path` the running application's bundle. `path` must be absolute and have no
-/// trailing "/". Used by tests and by tools that examine another application.
+/// trailing "/". For tests, and for tools that examine another application.
 void setMainBundlePath(std::string path);
 
 /// Returns the path of the running application's bundle, without a trailing "/". Unless

@@ -12,8 +12,8 @@ namespace onramp::netlink {
 /// is true, because all routes must be read for it. Returns nothing when the state cannot be read.
 ///
 /// A default route of the main table is usable if it has a next hop that is not dead. The preferred
-/// default route is the first usable one with the lowest metric. The primary interface is that of
-/// its first next hop that is not dead.
+/// default route is the first usable one with the lowest metric. The primary interface is the one
+/// of this route's first next hop that is not dead.
 [[nodiscard]] std::optional<Dictionary> readIPv4State(nl_sock* socket, bool withGlobal);
 
 }  // namespace onramp::netlink
