@@ -20,8 +20,8 @@ class ApplicationDelegate : public InterfaceOwner {
   /// Called once, after setOutlets() and before the main loop starts.
   virtual void awakeFromNib() = 0;
 
-  /// Both functions are called when the main loop starts, applicationWillFinishLaunching() first.
-  /// If that call terminates the application, applicationDidFinishLaunching() is not called.
+  /// The two functions below are called when the main loop starts, applicationWillFinishLaunching()
+  /// first. If that call terminates the application, applicationDidFinishLaunching() is not called.
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 

@@ -14,11 +14,10 @@ namespace onramp {
 /// or exceeds a limit in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> loadStringsTable(const std::string& path);
 
-/// Parses `text`, the content of a ".strings" file. The text consists of pairs `"key" = "text";` in
-/// the grammar of old-style property lists, and may contain comments. If a key has no text, the key
-/// is also the text. When a key occurs more than once, its last text counts. Returns nothing when
-/// `text` violates the grammar or has more than kMostPropertyListObjects pairs. `problem` then gets
-/// the place and the reason.
+/// Parses the content of a ".strings" file: pairs `"key" = "text";` in the grammar of old-style
+/// property lists, and comments. If a key has no text, the key is also the text. When a key occurs
+/// more than once, its last text counts. Returns nothing when the content violates the grammar or
+/// has more than kMostPropertyListObjects pairs. `problem` then gets the place and the reason.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);
 
