@@ -16,7 +16,7 @@ inline constexpr int kAlertOtherReturn = -1;
 void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
                       const std::string& buttonTitle);
 
-/// The texts of a sheet with two buttons.
+/// The texts of a sheet (an alert that is attached to a window) with two buttons.
 struct AlertSheet {
   std::string title;
   std::string message;
@@ -24,10 +24,9 @@ struct AlertSheet {
   std::string otherButton;
 };
 
-/// Shows a sheet on `window`, which must not be an empty handle, and returns at once. When the
-/// sheet has ended, calls `didEnd` with kAlertOtherReturn if the user clicked the button
-/// `otherButton`, and with kAlertDefaultReturn in all other cases. Does not call `didEnd` when the
-/// application terminates first.
+/// Shows `sheet` on `window` and returns at once. `window` must not be an empty handle. When the
+/// sheet has closed, calls `didEnd` with kAlertOtherReturn if the user clicked `otherButton`, and
+/// with kAlertDefaultReturn otherwise. Does not call `didEnd` if the application terminates first.
 void beginAlertSheet(const AlertSheet& sheet, const Window& window,
                      std::function<void(int returnCode)> didEnd);
 

@@ -9,19 +9,19 @@
 
 namespace onramp {
 
-/// The interface through which the application reports events to its controller and asks the
-/// controller for decisions. An application has one controller, which is also the owner of the main
-/// interface file.
+/// The interface of the application's only controller. The application reports events to the
+/// controller and asks it for decisions. The controller is also the owner of the main interface
+/// file.
 class ApplicationDelegate : public InterfaceOwner {
  public:
-  /// Gives the controller the objects of the main interface file.
+  /// Passes the controller the objects of the main interface file.
   virtual void setOutlets(const Interface& mainInterface) = 0;
 
   /// Called once, after setOutlets() and before the main loop starts.
   virtual void awakeFromNib() = 0;
 
-  /// The two functions below are called, in this order, when the main loop starts. The second one
-  /// is not called if the first one has asked the application to terminate.
+  /// The two functions below are called when the main loop starts, applicationWillFinishLaunching()
+  /// first. If that call terminates the application, applicationDidFinishLaunching() is not called.
   virtual void applicationWillFinishLaunching() = 0;
   virtual void applicationDidFinishLaunching() = 0;
 
@@ -37,19 +37,19 @@ class ApplicationDelegate : public InterfaceOwner {
 /// Creates the controller with `makeDelegate`, loads the interface file `mainInterfaceName` for the
 /// controller, and runs the main loop until the application terminates. Returns the process's exit
 /// status. If the interface file cannot be loaded, prints a message that names the file; the exit
-/// status is then 1. On some systems the process ends inside this function when the application
-/// terminates. With Qt, the process ends inside this function after an invalid option, after --help
-/// and --version, and when there is no display.
+/// status is then 1. On some systems, the process exits inside this function when the application
+/// terminates. With Qt, the process also exits inside this function when there is no display, and
+/// after an invalid option, --help or --version.
 int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
-/// Terminates the application. The main loop and any modal loop inside it stop, and no further
-/// timer, posted action or event is handled. On some systems the process ends inside this function.
-/// On other systems the function returns, and the caller must stop what it is doing.
+/// Terminates the application. The main loop and any modal loop stop, and no more timers, posted
+/// actions or events are handled. On some systems, the process exits inside this function. On other
+/// systems, the function returns, and the caller must then return without doing anything else.
 void terminateApplication();
 
-/// hideApplication() takes all windows off the screen. unhideApplication() brings those windows
-/// back. Do not call hideApplication() twice without unhideApplication() in between.
+/// hideApplication() hides all windows, and unhideApplication() shows them again. Do not call
+/// hideApplication() twice without calling unhideApplication() in between.
 void hideApplication();
 void unhideApplication();
 
@@ -59,7 +59,7 @@ void activateIgnoringOtherApps();
 
 /// Returns the main menu, or an empty handle when there is none.
 [[nodiscard]] Menu mainMenu();
-/// Makes `menu` the main menu. Does nothing in a front end whose windows show their own menu bars.
+/// Makes `menu` the main menu. Does nothing in a front end where each window has its own menu bar.
 void setMainMenu(const Menu& menu);
 
 }  // namespace onramp

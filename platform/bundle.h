@@ -8,11 +8,11 @@
 
 namespace onramp {
 
-/// A folder laid out as a resource bundle. The folder holds Contents/Info.plist and
-/// Contents/Resources, which has one folder of string tables for each language. In an application,
-/// a folder in Contents that is named after the operating system holds the executable. This object
-/// stores only the path, and every query reads the disk. macOS, however, caches what it has read of
-/// a bundle, so a change to a bundle may go unnoticed while the program runs.
+/// A resource bundle: a folder that holds Contents/Info.plist and Contents/Resources. The resources
+/// include one folder of string tables for each language. An application's bundle also holds the
+/// executable, in a folder of Contents that is named after the operating system. A Bundle object
+/// stores only the path, and every query reads the disk. However, macOS caches what it has read of
+/// a bundle, so the running program may not see later changes to the bundle.
 class Bundle {
  public:
   /// Returns the bundle of the running application.
@@ -24,36 +24,38 @@ class Bundle {
   /// Returns the absolute path of the bundle's folder, without a trailing "/".
   [[nodiscard]] const std::string& path() const { return path_; }
 
-  /// Returns the information dictionary, or an empty dictionary when the bundle has none that can
-  /// be read.
+  /// Returns the information dictionary (Contents/Info.plist), or an empty dictionary when it is
+  /// missing or cannot be read.
   [[nodiscard]] Dictionary infoDictionary() const;
 
   /// Returns the string under `key` in the information dictionary, or nothing when there is no
   /// value or the value is not a string.
   [[nodiscard]] std::optional<std::string> infoString(std::string_view key) const;
 
-  /// Like infoString(), but returns the text under `key` in the bundle's string table "InfoPlist"
-  /// if there is one.
+  /// Returns the text under `key` in the bundle's string table "InfoPlist". If there is no such
+  /// text, returns the result of infoString().
   [[nodiscard]] std::optional<std::string> localizedInfoString(const std::string& key) const;
 
-  /// Returns the path of the resource file `name`.`type`, where an empty `type` means a name
-  /// without an extension. The search starts outside the language folders. It continues in the
-  /// folder of the user's most preferred language that the bundle offers, and then in that of the
-  /// bundle's development language. If the bundle offers neither language, the search continues in
-  /// the folder of English, or in that of one other language when the bundle does not offer
-  /// English. Returns nothing when the search finds no such file.
+  /// Returns the path of the resource file `name`.`type`, or of the file `name` if `type` is empty.
+  /// Searches these folders in this order:
+  /// - the resources folder itself;
+  /// - the folder of the user's most preferred language among those that the bundle offers;
+  /// - the folder of the bundle's development language;
+  /// - if the bundle offers neither language, the folder of English;
+  /// - if the bundle does not offer English either, the folder of one other language.
+  /// Returns nothing when none of these folders holds the file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
                                                            const std::string& type) const;
 
-  /// Returns the path of the bundle's program. Returns nothing when the information dictionary
-  /// names no program. If the file does not exist, some backends return the path that it should
-  /// have, and others return nothing.
+  /// Returns the path of the bundle's executable. Returns nothing when the information dictionary
+  /// names no executable. If the named file does not exist, some backends return the path where it
+  /// should be, and others return nothing.
   [[nodiscard]] std::optional<std::string> executablePath() const;
 
-  /// Returns the text under `key` in the string table `table` ("Localizable" when no table is
-  /// given), or `value` when the table does not contain `key` or cannot be read. The table is the
-  /// file that pathForResource() finds for the name of the table and the type "strings". `value`
-  /// should not be empty, because macOS returns `key` in place of an empty `value`.
+  /// Returns the text under `key` in the string table `table`, or in "Localizable" if `table` is
+  /// nothing. Returns `value` when the table does not contain `key` or cannot be read. The table is
+  /// the file that pathForResource() finds for the table's name and the type "strings". Do not pass
+  /// an empty `value`, because macOS would return `key` instead.
   [[nodiscard]] std::string localizedString(const std::string& key, const std::string& value,
                                             const std::optional<std::string>& table) const;
 

@@ -18,8 +18,9 @@ struct DatagramEndpoint {
   friend bool operator==(const DatagramEndpoint&, const DatagramEndpoint&) = default;
 };
 
-/// A UDP socket over IPv4 on a port that the system chooses. Only the two wait functions block. The
-/// destructor closes the socket. Any thread may use a socket, but only one thread at a time.
+/// A UDP socket over IPv4 on a port that the system chooses. Only waitWritable() and waitReadable()
+/// block. The destructor closes the socket. Any thread may use a socket, but only one thread at a
+/// time.
 class DatagramSocket {
  public:
   struct Received {
@@ -38,24 +39,24 @@ class DatagramSocket {
   ~DatagramSocket();
 
   /// Restricts the socket to `peer`: send() sends to `peer`, and the system drops datagrams from
-  /// anyone else. From then on, the system also reports when the peer's host refuses a datagram
-  /// because no program uses the port. After such a report, waitReadable() returns true, and the
-  /// next call of send() or receive() fails. This function returns false when the system refuses,
-  /// for example because it has no route to `peer`.
+  /// other senders. Returns false when the system refuses, for example because it has no route to
+  /// `peer`. On a connected socket, the system also reports that the peer's host has refused a
+  /// datagram because no program uses the port. After such a report, waitReadable() returns true,
+  /// and the next call of send() or receive() fails.
   [[nodiscard]] bool connect(const DatagramEndpoint& peer);
 
   /// Allows sendTo() to send to broadcast addresses. Returns false when the system refuses.
   [[nodiscard]] bool permitBroadcast();
 
-  /// Asks the system for a buffer of `bytes` for datagrams that have arrived but that receive() has
-  /// not fetched yet. The system's overhead for each datagram also takes space in the buffer. The
-  /// system may provide a smaller buffer.
+  /// Asks the system for a buffer of this many bytes for datagrams that receive() has not fetched
+  /// yet. The system may provide a smaller buffer, and its overhead for each datagram also takes
+  /// space in the buffer.
   void setReceiveBufferSize(std::size_t bytes);
 
   /// waitWritable() waits until the socket can send a datagram or has an error to report.
   /// waitReadable() waits until there is a datagram or an error for receive(). Both wait for at
   /// most `timeout`, which must not be negative and is rounded up to whole milliseconds. They
-  /// return whether the socket is ready, and false on failure.
+  /// return true when the socket is ready, and false when the time is up or the wait fails.
   [[nodiscard]] bool waitWritable(std::chrono::nanoseconds timeout) const;
   [[nodiscard]] bool waitReadable(std::chrono::nanoseconds timeout) const;
 

@@ -7,31 +7,29 @@
 namespace onramp {
 
 // Information about service discovery for diagnostic programs. The wizard does not use this header.
-// All functions must be called on the main thread.
+// Call all functions on the main thread.
 
-/// Returns the reason, in English, why the system's service discovery cannot be used. Returns
-/// nothing when no such reason is known. May block until the system answers. A search may be
-/// started even while discovery cannot be used. The search finds services as soon as discovery
-/// works.
+/// Returns, in English, the reason why the system's service discovery does not work. Returns
+/// nothing when no such reason is known. May block until the system answers. A search can be
+/// started even while discovery does not work, and finds services as soon as it works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
-/// Reports that a NetServiceBrowser's search sees a service on one network interface and protocol,
-/// or no longer sees the service there. The browser's client, in contrast, is told only of a
-/// service's first sighting and of the loss of the last one. When the search ends, when it leaves a
-/// domain, and when discovery stops working, the services that were seen until then are not
-/// reported as gone.
+/// A report that a NetServiceBrowser's search has seen a service on one network interface and
+/// protocol, or no longer sees it there. (The browser's client learns only of a service's first
+/// sighting and of the loss of its last one.) Services are not reported as gone when the search
+/// ends, when it stops covering their domain, or when discovery stops working.
 struct ServiceSighting {
   std::string name;       ///< as NetService::name()
   std::string type;       ///< as NetService::type()
   std::string domain;     ///< as NetService::domain()
   std::string interface;  ///< the network interface's name, or its number if the interface is gone
-  bool isIPv6 = false;    ///< true for a sighting by IPv6, false for one by IPv4
-  bool isGone = false;    ///< true when the service is no longer seen there
+  bool isIPv6 = false;    ///< whether the protocol is IPv6 rather than IPv4
+  bool isGone = false;    ///< whether the service is no longer seen on this interface and protocol
 };
 
-/// Sets the function that is called on the main thread for each sighting in any search. Replaces
-/// the earlier function. A null `watch` ends the calls. The backend for macOS never calls `watch`,
-/// because macOS does not report the interface of a sighting.
+/// Makes all searches call `watch` on the main thread for each sighting. Replaces the function that
+/// an earlier call has set. A null `watch` ends the calls. The backend for macOS never calls
+/// `watch`, because macOS does not report the interface of a sighting.
 void watchSightings(std::function<void(const ServiceSighting&)> watch);
 
 }  // namespace onramp

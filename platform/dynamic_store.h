@@ -10,18 +10,18 @@
 #include "base/value.h"
 
 /// Access to the system's dynamic configuration store. The store describes the current state of the
-/// computer's network as dictionaries under keys such as "State:/Network/Interface/en0/IPv4". Each
-/// function here except addSourceToMainLoop() corresponds to a function of the SystemConfiguration
-/// framework of macOS. The backend for macOS uses that framework. The backend for Linux obtains the
-/// entries described below from the kernel.
+/// computer's network as dictionaries under keys such as "State:/Network/Interface/en0/IPv4". The
+/// last part of a key is called the entity. Each function here except addSourceToMainLoop()
+/// corresponds to a function of the SystemConfiguration framework of macOS. The backend for macOS
+/// uses that framework. The backend for Linux obtains the entries described below from the kernel.
 ///
 /// Callers can rely on two kinds of entries, both in the domain kSCDynamicStoreDomainState:
-/// - the IPv4 entity of an interface. It exists for every interface that is up, can pass traffic
-///   (has a carrier and has passed authentication where required) and has an IPv4 address. The
-///   loopback interface is no exception. The arrays kSCPropNetIPv4Addresses and
-///   kSCPropNetIPv4SubnetMasks hold one dotted text for each address, in the system's order. The
-///   array kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is
-///   absent when none is set;
+/// - the IPv4 entity of an interface. It exists for every interface that is up, is ready for
+///   traffic (connected and, where required, authenticated) and has an IPv4 address. This includes
+///   the loopback interface. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold
+///   one dotted text for each address, in the system's order. The array
+///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
+///   when none is set;
 /// - the global IPv4 entity, which exists while there is a usable default route. Its text
 ///   kSCDynamicStorePropNetPrimaryInterface names the interface of the preferred default route.
 namespace onramp {
@@ -34,7 +34,8 @@ inline constexpr std::string_view kSCPropNetIPv4BroadcastAddresses = "BroadcastA
 inline constexpr std::string_view kSCPropNetIPv4SubnetMasks = "SubnetMasks";
 inline constexpr std::string_view kSCDynamicStorePropNetPrimaryInterface = "PrimaryInterface";
 
-/// The error codes that both backends use. The framework has further codes.
+/// The error codes that both backends use. The backend for macOS also returns the framework's other
+/// codes.
 inline constexpr int kSCStatusOK = 0;
 inline constexpr int kSCStatusFailed = 1001;
 inline constexpr int kSCStatusInvalidArgument = 1002;
@@ -53,9 +54,9 @@ using DynamicStoreSourceRef = std::shared_ptr<DynamicStoreSource>;
 
 using DynamicStoreCallback = std::function<void(const std::vector<std::string>& changedKeys)>;
 
-/// Creates a session. The system uses `name` only for diagnostics. Once the session's source is on
-/// the run loop, `callback` is called on the main thread for the changes that setNotificationKeys()
-/// asks for. Returns null on failure.
+/// Creates a session. The system uses `name` only for diagnostics. `callback` is called on the main
+/// thread for changes of the keys that setNotificationKeys() has selected. The calls begin when the
+/// session's source is on the run loop. Returns null on failure.
 [[nodiscard]] DynamicStoreRef createDynamicStore(const std::string& name,
                                                  DynamicStoreCallback callback = nullptr);
 
@@ -79,23 +80,23 @@ using DynamicStoreCallback = std::function<void(const std::vector<std::string>& 
                                                      const std::vector<std::string>& patterns);
 
 /// Makes the session call its callback when the value of a selected key changes. `keys` and
-/// `patterns` select keys as in copyMultiple(). Replaces any earlier request. A value that appears
-/// or disappears also counts as changed. Returns false on failure.
+/// `patterns` select keys as in copyMultiple(). Replaces the selection of any earlier call. A value
+/// that appears or disappears also counts as changed. Returns false on failure.
 bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::string>& keys,
                          const std::vector<std::string>& patterns);
 
-/// Creates a source for the session's notifications. A run loop that orders its sources handles a
-/// source with a lower `order` first. Returns null on failure.
+/// Creates a source for the session's notifications. If the run loop orders its sources, it handles
+/// those with a lower `order` first. Returns null on failure.
 [[nodiscard]] DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int order);
 
-/// Adds `source` to the main run loop in every mode, including the modal one. The loop keeps the
-/// source until the process ends. Does nothing when `source` is null or when a source of the same
-/// session has already been added. If the system provides no thread, the session's callback is not
-/// called until setNotificationKeys() is called again and succeeds.
+/// Adds `source` to the main run loop. The source works even while a modal window is shown. The
+/// loop keeps the source until the process ends. Does nothing when `source` is null or when a
+/// source of the same session has already been added. If the system provides no thread, the
+/// session's callback is not called until setNotificationKeys() is called again and succeeds.
 void addSourceToMainLoop(const DynamicStoreSourceRef& source);
 
-/// Returns the error code of the calling thread's last store operation that failed, or kSCStatusOK
-/// when no failure is known.
+/// Returns the error code of the last function of this header that failed on the calling thread, or
+/// kSCStatusOK when no failure is known.
 [[nodiscard]] int lastDynamicStoreError();
 
 }  // namespace onramp

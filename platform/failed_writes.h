@@ -2,9 +2,9 @@
 
 namespace onramp {
 
-/// Makes a write return an error, instead of ending the process, when the reader of a pipe has gone
-/// away or when a file would exceed the limit on file sizes. Call this once, before anything is
-/// written.
+/// Makes failed writes return an error instead of ending the process by SIGPIPE (a pipe has no
+/// reader) or SIGXFSZ (a file would exceed the limit on file sizes). Call this once, before the
+/// first write.
 void surviveFailedWrites();
 
 }  // namespace onramp

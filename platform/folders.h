@@ -10,9 +10,8 @@ enum class FolderDomain {
 };
 
 /// Returns the absolute path of the domain's application-support folder, without a trailing "/".
-/// Tries to create the folder if it does not exist. A failure to create the folder becomes visible
-/// only when a file is written there. On macOS, returns an empty text when the system names no such
-/// folder.
+/// Tries to create the folder if it does not exist, but does not report a failure to do so. On
+/// macOS, returns an empty text when the system names no such folder.
 [[nodiscard]] std::string applicationSupportFolder(FolderDomain domain);
 
 }  // namespace onramp

@@ -9,9 +9,9 @@
 
 namespace onramp {
 
-/// The owner of an interface file. The file binds titles to the owner's texts, and names the
-/// owner's action that each click performs. The owner must outlive all objects that are created
-/// from the file.
+/// The owner of an interface file, which describes windows and views. The file binds titles to
+/// texts of its owner, and names the action that the owner performs on each click. The owner must
+/// outlive all objects that are created from the file.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;
@@ -19,8 +19,7 @@ class InterfaceOwner {
   InterfaceOwner& operator=(const InterfaceOwner&) = delete;
   virtual ~InterfaceOwner() = default;
 
-  /// Performs the action that the interface file calls `action`. Does nothing when the owner has no
-  /// such action.
+  /// Performs the action with the name `action`. Does nothing when the owner has no such action.
   virtual void performAction(std::string_view action) = 0;
 
   /// Returns the texts to which the interface file binds titles.
@@ -33,8 +32,8 @@ class InterfaceOwner {
 /// Owns the objects that were created from one interface file of the application's bundle.
 class Interface {
  public:
-  /// Loads the interface file `name`, which is given without an extension, for `owner`. Returns
-  /// null when the bundle has no readable interface file of that name.
+  /// Loads the interface file `name` (without its extension) for `owner`. Returns null when the
+  /// bundle has no readable interface file of that name.
   [[nodiscard]] static std::unique_ptr<Interface> load(const std::string& name,
                                                        InterfaceOwner& owner);
 
@@ -46,13 +45,13 @@ class Interface {
   /// Qt's files, a window counts as a view.
   [[nodiscard]] View view() const;
 
-  /// Returns the class that the file gives to the result of view(), such as "ModelListView", or an
+  /// Returns the class name of the view that view() returns, such as "ModelListView". Returns an
   /// empty text when there is no view or the file gives it no class.
   [[nodiscard]] std::string viewClass() const;
 
-  /// Returns the object that the file calls `name`, or an empty handle when no object of the
-  /// handle's kind has that name. On macOS, finds no menus and no menu items, and only the window
-  /// called "window".
+  /// Returns a handle to the object that the file calls `name`. Returns an empty handle when there
+  /// is no such object or it is not of the handle's kind. On macOS, finds no menus, no menu items,
+  /// and no windows except the one called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

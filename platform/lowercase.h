@@ -4,9 +4,9 @@
 
 namespace onramp {
 
-/// Returns `text`, which is UTF-8, with the letters of all alphabets in lower case. The result does
-/// not depend on the user's language. Characters without a lower-case form stay unchanged. The
-/// result for malformed UTF-8 depends on the backend.
+/// Returns `text` (UTF-8) with the letters of all alphabets in lower case. The result does not
+/// depend on the user's language. Characters without a lower-case form stay unchanged. The result
+/// for malformed UTF-8 depends on the backend.
 [[nodiscard]] std::string lowercaseString(const std::string& text);
 
 }  // namespace onramp

@@ -2,9 +2,8 @@
 
 namespace onramp {
 
-// The main loop of a program without windows. The loop runs the timers of scheduleTimer() and the
-// actions of performOnMainThread(), which are declared in platform/run_loop.h. Such a program has
-// no modal loops.
+// The main loop of a program without windows. The loop runs the timers and actions that are passed
+// to scheduleTimer() and performOnMainThread() in platform/run_loop.h. There are no modal loops.
 
 /// Runs the loop on the calling thread, which must be the main thread, until endMainLoop() is
 /// called.

@@ -14,7 +14,7 @@ namespace onramp {
 class NetService;
 class NetServiceBrowser;
 
-/// Handles are shared. Two handles that compare equal refer to the same object.
+/// Shared handles. Handles to the same object compare equal.
 using NetServiceRef = std::shared_ptr<NetService>;
 using NetServiceBrowserRef = std::shared_ptr<NetServiceBrowser>;
 
@@ -28,23 +28,22 @@ inline constexpr std::int32_t kNetServiceErrorTimeout = -72007;
 
 // The flags that a NetServiceBrowser passes to its client.
 
-/// More calls follow at once. Only the backend for macOS sets this flag.
+/// The client will be called again at once. Only the backend for macOS sets this flag.
 inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
 /// The service is gone. Without this flag, the service has been found.
 inline constexpr unsigned long kNetServiceFlagRemove = 8;
 
-/// Looks for services by DNS Service Discovery. The responder, a program of the system, does the
-/// actual work. Main thread only. The client is called on the main thread, in every mode of the
-/// main loop. Destroying a browser has the effect of invalidate().
+/// Searches for services with DNS Service Discovery. The responder, a program of the system, does
+/// the actual work. Main thread only. The client is called on the main thread, even while a modal
+/// window is shown. Destroying a browser has the same effect as invalidate().
 class NetServiceBrowser {
  public:
-  /// Called when a service is found and when it is gone. A service is identified by its name, type
-  /// and domain. It may be seen on several network interfaces and protocols. It is found when it is
-  /// first seen on any of them, and gone when it is no longer seen on any of them. Both calls pass
-  /// the same `service`. When a running search fails, all its services are reported as gone, and
-  /// the search starts again by itself. Some backends report the failure in one more call, which
-  /// passes a null `service` and an `error` whose code is not 0. The client may end or destroy the
-  /// browser.
+  /// Called when a service is found and when it is gone. Both calls pass the same `service`. A
+  /// service is identified by its name, type and domain. It is found when it first appears on any
+  /// network interface and protocol, and gone when it has disappeared from all of them. When a
+  /// running search fails, all its services are reported as gone, and the search restarts
+  /// automatically. Some backends report the failure in one more call, with a null `service` and an
+  /// `error` whose code is not 0. The client may call invalidate() or destroy the browser.
   using Client = void (*)(const NetServiceBrowserRef& browser, unsigned long flags,
                           const NetServiceRef& service, const NetServiceError& error, void* info);
 
@@ -61,11 +60,12 @@ class NetServiceBrowser {
   virtual void schedule() = 0;
   virtual void unschedule() = 0;
 
-  /// Starts to look for `type`, such as "_ipp._tcp.", in `domain`, such as "local.". An empty
-  /// domain means all domains that the computer is configured to browse, "local." included. Returns
-  /// false when the search cannot start, for example because another search of this browser is
-  /// running. The search starts even if the responder is not running. It then finds services once
-  /// the responder runs, and it starts again by itself after the responder has restarted.
+  /// Starts a search for services of this `type`, such as "_ipp._tcp.", in `domain`, such as
+  /// "local.". An empty `domain` means "local." and all other domains that the computer is
+  /// configured to browse. Returns false when the search cannot start, for example because this
+  /// browser is already searching. A search can start even if the responder is not running, and
+  /// finds services once the responder runs. When the responder restarts, the search restarts
+  /// automatically.
   virtual bool searchForServices(const std::string& domain, const std::string& type) = 0;
 
   /// Ends the browser for good. The client is not called again.
@@ -75,18 +75,19 @@ class NetServiceBrowser {
   virtual void stopSearch() = 0;
 };
 
-/// One service instance on the network. It is not bound to a network interface or protocol. Main
-/// thread only. The client is called on the main thread, in every mode of the main loop. Destroying
-/// a service cancels its resolve.
+/// One service on the network. It may be available on several network interfaces and protocols. A
+/// resolve asks the network for the service's addresses and TXT record. Main thread only. The
+/// client is called on the main thread, even while a modal window is shown. Destroying a service
+/// cancels its resolve.
 class NetService {
  public:
   /// Called when a resolve has ended. The code in `error` is 0 after success and
-  /// kNetServiceErrorTimeout when the time was up; a backend may report other errors. The client
-  /// may cancel, resolve again or destroy the service.
+  /// kNetServiceErrorTimeout after the time limit. A backend may report other errors. The client
+  /// may call any function of the service, or destroy the service.
   using Client = void (*)(const NetServiceRef& service, const NetServiceError& error, void* info);
 
-  /// Creates a service to be resolved by its name. `port` has no effect on resolving. Returns null
-  /// on failure.
+  /// Creates a service with this domain, type and name. `port` has no effect on a resolve. Returns
+  /// null on failure.
   [[nodiscard]] static NetServiceRef create(const std::string& domain, const std::string& type,
                                             const std::string& name, std::int32_t port);
 
@@ -95,40 +96,38 @@ class NetService {
   NetService& operator=(const NetService&) = delete;
   virtual ~NetService() = default;
 
-  /// Returns the instance name in UTF-8 without escapes, such as "Office Printer". Like type() and
-  /// domain(), returns nothing when the system does not report the text.
+  /// Returns the service's name in UTF-8 without escapes, such as "Office Printer". name(), type()
+  /// and domain() return nothing when the system does not report the text.
   [[nodiscard]] virtual std::optional<std::string> name() const = 0;
-  /// Returns the type with its closing dot, such as "_ipp._tcp.".
+  /// Returns the type with its trailing dot, such as "_ipp._tcp.".
   [[nodiscard]] virtual std::optional<std::string> type() const = 0;
-  /// Returns the domain with its closing dot, such as "local.".
+  /// Returns the domain with its trailing dot, such as "local.".
   [[nodiscard]] virtual std::optional<std::string> domain() const = 0;
 
   /// Returns the addresses that the last resolve found, in the responder's order. The list is empty
-  /// before the first resolve, and from the start of a resolve until it succeeds. IPv6 addresses
-  /// may be missing when the host has IPv4 addresses. Each address is a socket address in the BSD
-  /// layout, even on a system with another layout. Byte 0 is the length, byte 1 the family (2 for
-  /// IPv4, 30 for IPv6), and bytes 2 and 3 are the port in network order. The four bytes of an IPv4
-  /// address start at byte 4. The sixteen bytes of an IPv6 address start at byte 8, and the
-  /// address's scope, four bytes in the machine's byte order, starts at byte 24.
+  /// unless the last resolve has succeeded. IPv6 addresses may be missing when the host has IPv4
+  /// addresses. Each address is a socket address in the BSD layout, even on a system with another
+  /// layout. Byte 0 is the length, byte 1 the family (2 for IPv4, 30 for IPv6), and bytes 2 and 3
+  /// are the port in network order. The four bytes of an IPv4 address start at byte 4. The sixteen
+  /// bytes of an IPv6 address start at byte 8. Bytes 24 to 27 are the scope of the IPv6 address, in
+  /// the machine's byte order.
   [[nodiscard]] virtual std::vector<Data> addressing() const = 0;
 
-  /// Returns the data of the TXT record that the last resolve found, as on the wire (RFC 6763
-  /// section 6). Returns nothing before the first resolve, and from the start of a resolve until it
-  /// succeeds.
+  /// Returns the data of the TXT record that the last resolve found, in the wire format (RFC 6763
+  /// section 6). Returns nothing unless the last resolve has succeeded.
   [[nodiscard]] virtual std::optional<Data> txtData() const = 0;
 
-  /// Sets the client that is called at the end of a resolve. A null `client` removes the client. A
-  /// resolve without a client blocks the caller.
+  /// Sets the client, which is called when a resolve ends. A null `client` removes the client.
   virtual void setClient(Client client, void* info) = 0;
 
   /// The client is called only between schedule() and unschedule().
   virtual void schedule() = 0;
   virtual void unschedule() = 0;
 
-  /// Asks the network for the service's addresses and TXT record. If `timeLimit` is 0 or less,
-  /// there is no time limit. With a client, returns at once whether the resolve has started, and
-  /// calls the client when the resolve ends. Without a client, blocks until the resolve ends and
-  /// returns whether it succeeded. Returns false when another resolve of the service is running.
+  /// Resolves the service. If `timeLimit` is 0 or less, there is no time limit. With a client,
+  /// returns at once; the result says whether the resolve has started. The client is called when
+  /// the resolve ends. Without a client, blocks until the resolve ends and returns whether it
+  /// succeeded. Returns false when another resolve of the service is running.
   virtual bool resolveWithTimeout(std::chrono::duration<double> timeLimit) = 0;
 
   /// Cancels the running resolve, if there is one, without calling the client.

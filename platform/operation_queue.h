@@ -7,8 +7,8 @@
 
 namespace onramp {
 
-/// Runs operations off the main thread, each on its own thread. The destructor waits for the end of
-/// all operations, so whatever an operation refers to must exist until the queue is destroyed.
+/// Runs each operation on a separate thread. The destructor waits until all operations have ended,
+/// so everything that an operation refers to must exist until then.
 class OperationQueue {
  public:
   OperationQueue() = default;
@@ -19,7 +19,8 @@ class OperationQueue {
       thread.join();
   }
 
-  /// Starts `operation`. Returns false, without running it, when the system provides no thread.
+  /// Starts `operation`. Returns false when the system provides no thread; the operation is then
+  /// not run.
   [[nodiscard]] bool addOperation(std::function<void()> operation) {
     try {
       threads_.emplace_back(std::move(operation));

@@ -28,10 +28,10 @@ enum class OutletKind {
 };
 
 /// A handle to an object of the user interface. The handle does not own the object, and must not be
-/// used once the object has been destroyed. Copies refer to the same object. An empty handle
-/// accepts every call and does nothing; its queries return 0 or an empty handle. The handle of an
-/// object that is missing from the interface file is empty, so a page also works when its file
-/// lacks some objects. Main thread only.
+/// used once the object has been destroyed. Copies refer to the same object. The functions of an
+/// empty handle do nothing, and return 0 or an empty handle. An object that is missing from the
+/// interface file has an empty handle, so a page works even if its file lacks some objects. Main
+/// thread only.
 class Outlet {
  public:
   Outlet() = default;
@@ -58,8 +58,8 @@ class View : public Outlet {
   [[nodiscard]] View firstSubview() const;
 
   /// Puts `view` inside this view and makes `view` fill it. Gives the keyboard focus to the first
-  /// list in `view`, or to the first control if there is no list. Lists and controls that do not
-  /// accept the focus do not count. The owner of `view` does not change.
+  /// list in `view` that accepts it, or else to the first control that accepts it. The owner of
+  /// `view` does not change.
   void addSubview(const View& view) const;
 
   /// Removes this view from the view that contains it, if there is one. The owner of this view does
@@ -80,12 +80,12 @@ class TextField : public View {
   static constexpr OutletKind kKind = OutletKind::kTextField;
   using View::View;
 
-  /// Shows `text` as it is, even if it looks like markup.
+  /// Shows `text` unchanged, even if it looks like markup.
   void setStringValue(const std::string& text) const;
 };
 
 /// A push button. The interface file binds the button's title to a text of the file's owner, and
-/// names the owner's action that a click performs.
+/// names the action that the owner performs on a click.
 class Button : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kButton;
@@ -98,10 +98,10 @@ class RadioMatrix : public Control {
   static constexpr OutletKind kKind = OutletKind::kRadioMatrix;
   using Control::Control;
 
-  /// Sets the title of the button in this place, counted from 0. Does nothing when there is no such
-  /// button.
+  /// Sets the title of the button at `row` and `column`, which count from 0. Does nothing when
+  /// there is no such button.
   void setTitle(int row, int column, const std::string& title) const;
-  /// Selects the button in this place, which must exist, and deselects all others.
+  /// Selects the button at `row` and `column`, which must exist, and deselects all others.
   void selectCell(int row, int column) const;
 
   /// Returns the row of the selected button, counted from 0. Returns 0 when this handle is empty.
@@ -109,12 +109,12 @@ class RadioMatrix : public Control {
   [[nodiscard]] int selectedRow() const;
 };
 
-/// A reference to an image file. The file is not read before the image is drawn.
+/// A reference to an image file. The file is not read until the image is drawn.
 struct Image {
   std::string path;
 
-  /// Returns the image with this file name in the resources of the application's bundle, or nothing
-  /// when there is none.
+  /// Returns the image `fileName` in the resources of the application's bundle, or nothing when
+  /// there is no such file.
   [[nodiscard]] static std::optional<Image> named(const std::string& fileName);
 };
 
@@ -128,7 +128,7 @@ class ImageView : public View {
   static constexpr OutletKind kKind = OutletKind::kImageView;
   using View::View;
 
-  /// A file that is missing or is not an image leaves the view empty.
+  /// Shows `image`, or nothing when its file is missing or is not an image.
   void setImage(const Image& image) const;
   void setImageScaling(ImageScaling scaling) const;
 };
@@ -139,35 +139,34 @@ class ProgressIndicator : public View {
   static constexpr OutletKind kKind = OutletKind::kProgressIndicator;
   using View::View;
 
-  /// Start and stop the spinner's turning.
   void startAnimation() const;
   void stopAnimation() const;
 };
 
-/// A list with columns. The interface file gives each column an identifier. For each entry, the
-/// column shows the text that the entry has under that identifier.
+/// A list with columns. The interface file gives each column an identifier. A column shows the text
+/// that each entry has under the column's identifier.
 class TableView : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kTableView;
   using Control::Control;
 
-  /// Shows the entries of `controller` and keeps the table's selection the same as the
-  /// controller's. A double-click on an entry clicks the window's default button. May be called
-  /// only once for each table. `controller` must outlive the table.
+  /// Shows the entries of `controller`, and keeps the selections of the table and of `controller`
+  /// in sync. A double-click on an entry clicks the window's default button. May be called only
+  /// once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 
-  /// Set whether the user may move columns, and whether the user may select a column by its header.
+  /// Set whether the user may move columns, and whether a click on a header selects the column.
   void setAllowsColumnReordering(bool allows) const;
   void setAllowsColumnSelection(bool allows) const;
-  /// Shows `title` above a column. Does nothing when the table has no such column.
+  /// Shows `title` above the column `identifier`. Does nothing when the table has no such column.
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
-  /// Sets whether the user may edit the texts in a column. Does nothing in a front end whose tables
-  /// never accept edits.
+  /// Sets whether the user may edit the texts in the column `identifier`. Does nothing in a front
+  /// end whose tables are always read-only.
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };
 
-/// A button that opens a menu of commands. Item 0 is not a command but what the button itself
-/// shows.
+/// A button that opens a menu of commands. Item 0 of the menu is not a command; it is what the
+/// button shows.
 class PopUpButton : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kPopUpButton;
@@ -175,7 +174,8 @@ class PopUpButton : public Control {
 
   /// Returns the number of items, including item 0.
   [[nodiscard]] std::size_t numberOfItems() const;
-  /// Removes a command. `index` must be at least 1. Does nothing when there is no such item.
+  /// Removes the command at `index`, which must be at least 1. Does nothing when there is no such
+  /// item.
   void removeItem(std::size_t index) const;
 
   /// Adds a command to the end of the menu. When the user chooses the command, `action` runs on the
@@ -188,8 +188,8 @@ class Window : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kWindow;
   using Outlet::Outlet;
 
-  /// Shows or hides the window's mark for resizing, if the system's windows have one. With Qt,
-  /// setShowsResizeIndicator(false) prevents the user from resizing the window.
+  /// Shows or hides the window's resize handle, if the system's windows have one. With Qt, hiding
+  /// it also prevents the user from resizing the window.
   void setShowsResizeIndicator(bool shows) const;
 
   /// Centres the window on its screen.

@@ -9,17 +9,17 @@
 
 namespace onramp {
 
-// Limits on the property lists that are read. For comparison, the ModelInfo.plist of a medium with
-// 5,000 models takes about 1.3 megabytes and 60,000 objects, keys included, nested four levels
-// deep. With libplist, an XML list is also refused if reading it would take too many steps, for
-// example if one dictionary has more than about 23,000 keys.
+// Limits for reading property lists. For comparison, a ModelInfo.plist with 5,000 models has about
+// 1.3 megabytes, 60,000 objects (including keys) and a depth of four. The backend libplist also
+// refuses XML lists that would take too many steps to read, such as one with more than about 23,000
+// keys in one dictionary.
 
 /// The maximum size of a file in bytes. It also limits the total size of all texts and data in a
-/// list, where a shared object of a binary list counts once for each reference to it.
+/// list. A shared object of a binary list counts once for each reference to it.
 inline constexpr std::size_t kMostPropertyListBytes = std::size_t{16} << 20;
 
-/// The maximum number of objects in a list. Containers count as objects, and in some backends so do
-/// the keys of dictionaries. A shared object counts once for each reference to it.
+/// The maximum number of objects in a list. Containers count, and in some backends the keys of
+/// dictionaries count, too. A shared object counts once for each reference to it.
 inline constexpr std::uint64_t kMostPropertyListObjects = std::uint64_t{1} << 18;
 
 /// The maximum nesting depth of containers.
@@ -29,14 +29,14 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 /// is absent, unreadable or malformed, holds something other than a dictionary, or exceeds a limit.
 [[nodiscard]] std::optional<Dictionary> loadDictionary(const std::string& path);
 
-/// Writes `dictionary` to `path` as an XML property list. The write is atomic: a temporary file in
-/// the same folder is completed and then renamed. Returns false on failure, for example when the
-/// folder is missing. In that case a file that was at `path` is unchanged. What becomes of
-/// characters that XML does not allow depends on the backend.
+/// Writes `dictionary` to `path` as an XML property list. The write is atomic: the data goes to a
+/// temporary file in the same folder, which is then renamed to `path`. Returns false on failure,
+/// for example when the folder is missing. An existing file at `path` is then unchanged. Each
+/// backend treats characters that XML does not allow in its own way.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
-/// Removes the file or the folder tree at `path`, and the temporary files of processes that were
-/// killed while they were writing to `path`. Ignores failures.
+/// Removes the file at `path`, or the folder and its contents. Also removes the temporary files of
+/// processes that were killed while writing to `path`. Ignores failures.
 void removeDictionary(const std::string& path);
 
 }  // namespace onramp

@@ -138,8 +138,8 @@ int Daemon::onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error*) {
   return 0;
 }
 
-// Here and in lost(), a query is allowed to remove other queries from `queries_`. The loop
-// therefore runs over a copy and skips the removed queries.
+// In lost(), a query's handler may destroy other queries, which removes them from `queries_`. Here
+// and in lost(), the loop therefore runs over a copy and skips the removed queries.
 void Daemon::arrived() {
   isPresent_ = true;
   for (Query* const query : std::vector(queries_)) {

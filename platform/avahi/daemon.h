@@ -16,15 +16,14 @@ namespace onramp::avahi {
 
 class Query;
 
-/// The connection to the Avahi daemon over the system's message bus. The bus and the daemon may be
-/// absent, and may come and go at any time. Queries are kept and are sent again to each new daemon.
-/// Only runUntil() waits for the daemon. Main thread only. README.md in this folder explains how
-/// the parts of this backend work together.
+/// A connection to the Avahi daemon over the system's message bus. The bus and the daemon may come
+/// and go at any time. The connection keeps a list of all queries and sends them again to each new
+/// daemon. Only runUntil() waits for the daemon. Main thread only. README.md in this folder
+/// explains how the parts of this backend work together.
 class Daemon {
  public:
-  /// Returns the connection that runs on the main thread's loop, and creates it if there is none.
-  /// The callers share the ownership of the connection. Returns null when the system provides no
-  /// descriptor or thread.
+  /// Returns the connection that all callers share, or creates it if there is none. The connection
+  /// runs on the main loop. Returns null when the system provides no descriptor or thread.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 
   /// Creates a connection that runs only inside runUntil(). Returns null when the system provides
@@ -35,7 +34,8 @@ class Daemon {
   Daemon& operator=(const Daemon&) = delete;
   ~Daemon() = default;
 
-  /// Runs the loop until `done` returns true. Returns false when the loop fails before that.
+  /// Runs the connection's event loop until `done` returns true, and then returns true. Returns
+  /// false when the loop fails.
   bool runUntil(const std::function<bool()>& done);
 
   /// Returns how many times the daemon or the bus has gone away so far.
@@ -49,7 +49,7 @@ class Daemon {
 
   explicit Daemon(EventLoop loop);
 
-  // Queries use the functions of this group.
+  // Queries call these functions.
   void add(Query* query);
   void remove(Query* query);
   void listen(const std::string& path, Query* query) { listeners_[path] = query; }
@@ -69,12 +69,11 @@ class Daemon {
   static int onMessage(sd_bus_message* message, void* self, sd_bus_error* error);
   static int onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error* error);
 
-  // The order matters, because members are destroyed from last to first. The thread polls the loop,
-  // and the bus and the timer use the loop.
+  // The first member is destroyed last: the thread, the bus and the timer use the loop.
   EventLoop loop_;
   Timer retry_;
   std::vector<Query*> queries_;
-  std::map<std::string, Query*> listeners_;  ///< under the path of the query's object
+  std::map<std::string, Query*> listeners_;  ///< by the path of the query's object
   unsigned losses_ = 0;
   bool isPresent_ = false;    ///< the daemon is on the bus
   bool isConnected_ = false;  ///< `bus_` is set and works

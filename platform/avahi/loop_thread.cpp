@@ -54,8 +54,8 @@ void LoopThread::runSoon() {
   });
 }
 
-// Runs on `thread_`. Once the main thread has been asked to run the loop, this function waits only
-// for the main thread's answer.
+// Runs on `thread_`. After this function has asked the main thread to run the loop, it ignores the
+// loop's descriptor until the main thread has answered.
 void LoopThread::wait() {
   bool isAsking = false;
   while (!isEnding_) {
@@ -83,7 +83,7 @@ void LoopThread::askMainThread() {
   });
 }
 
-// The last call of sd_event_run() finds nothing to do. It prepares the loop's descriptor for the
+// The last call of sd_event_run() finds nothing to do, but prepares the loop's descriptor for the
 // next wait.
 void LoopThread::runLoop() {
   int done = 0;

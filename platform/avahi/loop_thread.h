@@ -9,9 +9,9 @@
 
 namespace onramp::avahi {
 
-/// Lets the main thread run an sd-event loop in addition to its own loop. A separate thread waits
-/// until the sd-event loop has something to do and then asks the main thread to run that loop. The
-/// separate thread only polls the loop's descriptor and never touches the loop itself.
+/// Lets the main thread run an sd-event loop in addition to the main loop. A separate thread waits
+/// until the sd-event loop has something to do, and then asks the main thread to run that loop. The
+/// separate thread polls the loop's descriptor, but never touches the loop itself.
 class LoopThread : public std::enable_shared_from_this<LoopThread> {
  public:
   /// Starts the thread for `loop`, which must outlive the result. Returns null when the system
@@ -20,8 +20,8 @@ class LoopThread : public std::enable_shared_from_this<LoopThread> {
 
   LoopThread(const LoopThread&) = delete;
   LoopThread& operator=(const LoopThread&) = delete;
-  /// Ends the thread and waits for its end. This takes up to a second if the thread is pausing
-  /// after a failure.
+  /// Ends the thread and waits until it has ended. This takes up to a second if the thread is
+  /// pausing after a failure.
   ~LoopThread();
 
   /// Makes the main thread run the loop soon. Call this when code outside the loop has changed what

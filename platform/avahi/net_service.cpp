@@ -75,9 +75,9 @@ bool Service::resolveWithTimeout(std::chrono::duration<double> timeLimit) {
   return client_ ? startResolve(timeLimitOf(timeLimit)) : resolveNow(timeLimitOf(timeLimit));
 }
 
-// The client is called from the main loop, not from inside sd-event's loop. It may therefore
-// destroy any object, and a slow client does not keep sd-event's loop from reading the messages
-// that are already waiting.
+// The client is called from the main loop, not from inside sd-event's loop. So the client may
+// destroy any object. A slow client does not delay the messages that are already waiting, because
+// sd-event's loop reads them before the client is called.
 bool Service::startResolve(TimeLimit timeLimit) {
   daemon_ = Daemon::shared();
   if (!daemon_) return false;

@@ -54,7 +54,7 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   Client client_;
   void* info_;
   bool isScheduled_ = false;
-  unsigned long search_ = 0;  ///< counts searches; late events of earlier ones are ignored
+  unsigned long search_ = 0;  ///< the search's number; events of earlier searches are ignored
   std::string type_;
   /// The services that have been found. When one is gone, the client gets the same object again.
   std::map<Instance, NetServiceRef> services_;
@@ -64,9 +64,8 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   std::unique_ptr<Query> domainQuery_;
 };
 
-// For an empty domain, a DomainBrowser query reports the domains that the computer or the network
-// is configured to browse. The query never reports the local domain, which is therefore always
-// browsed.
+// If `domain` is empty, a DomainBrowser query finds the domains that the computer or the network is
+// configured to browse. The query never reports the local domain, so that domain is always browsed.
 bool Browser::searchForServices(const std::string& domain, const std::string& type) {
   if (!client_ || daemon_) return false;
   daemon_ = Daemon::shared();
@@ -161,9 +160,9 @@ void Browser::gone(const Instance& instance) {
   if (const auto node = services_.extract(instance)) tell(kNetServiceFlagRemove, node.mapped());
 }
 
-// The client is called from the main loop, not from inside sd-event's loop. It may therefore
-// destroy any object, and a slow client does not keep sd-event's loop from reading the messages
-// that are already waiting.
+// The client is called from the main loop, not from inside sd-event's loop. So the client may
+// destroy any object. A slow client does not delay the messages that are already waiting, because
+// sd-event's loop reads them before the client is called.
 void Browser::tell(unsigned long flags, const NetServiceRef& service) {
   performOnMainThread([weak = weak_from_this(), search = search_, flags, service] {
     const auto browser = weak.lock();

@@ -23,11 +23,11 @@ void Query::ask() {
   if (asked_ || isRefused_) return;
   const Message call = daemon_.newCall((std::string(kind_) + "Prepare").c_str());
   if (call && arguments_(call.get()) < 0) {
-    isRefused_ = true;  // Appending fails, for example, for a text that is not UTF-8.
+    isRefused_ = true;  // for example because a text is not UTF-8
     return;
   }
-  // The answer may arrive after this query has been destroyed or sent again. The object that the
-  // answer names is then unused and is freed.
+  // The answer may arrive after this query has been destroyed or sent again. Nobody then uses the
+  // object that the answer names, so the object is freed.
   asked_ = std::make_shared<char>();
   const auto answer = [this, &daemon = daemon_, interface = interface(),
                        asked = std::weak_ptr(asked_)](sd_bus_message* reply) {

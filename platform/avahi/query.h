@@ -13,17 +13,17 @@ namespace onramp::avahi {
 inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
-/// A question to the daemon that stays open for as long as this object exists. For each question,
-/// the daemon holds an object: a browser or a resolver of version 0.8 of Avahi's D-Bus interface.
-/// (The daemon waits 10 ms before it starts an object that was made with a method of an earlier
-/// version. The *Prepare methods of 0.8 avoid this pause.)
+/// A question to the daemon that stays open as long as this object exists. For each question, the
+/// daemon holds an object: a browser or a resolver. Queries create these objects with the *Prepare
+/// methods of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms before it starts an
+/// object that was created with an older method.)
 class Query {
  public:
   enum class Event {
-    kFound,           ///< a new result; `message` holds the arguments of ItemNew or Found
-    kGone,            ///< a removed result; `message` holds the arguments of ItemRemove
+    kFound,           ///< a new result; `message` is the signal ItemNew or Found
+    kGone,            ///< a removed result; `message` is the signal ItemRemove
     kCacheExhausted,  ///< the daemon has reported everything in its cache
-    kLost,            ///< the daemon went away or the query failed: earlier results are invalid
+    kLost,            ///< the daemon went away or the query failed; all results are invalid
   };
   /// Called from inside sd-event's loop. The handler must not destroy the query. `message` is null
   /// for kLost when the daemon went away.

@@ -13,7 +13,7 @@
 namespace onramp::avahi {
 
 /// The three parts of a service's full name. As in the daemon's messages, the name has no escapes,
-/// and the type and the domain have no closing dots.
+/// and the type and the domain have no trailing dots.
 struct Instance {
   std::string name;
   std::string type;
@@ -26,7 +26,7 @@ struct Instance {
 /// The DNS record types that this backend uses (RFC 1035 section 3.2.2, RFC 3596).
 enum class RecordType : std::uint16_t { kIPv4 = 1, kIPv6 = 28 };
 
-/// The records of one name and type on any interface and protocol, kept up to date.
+/// The current DNS records of one name and type, from all interfaces and protocols.
 class Records {
  public:
   struct Record {
@@ -36,8 +36,8 @@ class Records {
     friend bool operator==(const Record&, const Record&) = default;
   };
 
-  /// `name` is a domain name with escapes and without a closing dot. `changed` is called from
-  /// inside sd-event's loop whenever all() or isCacheExhausted() may have changed. It must not
+  /// `name` is a domain name with escapes and without a trailing dot. `changed` is called from
+  /// inside sd-event's loop whenever all() or isCacheExhausted() may have changed, and must not
   /// destroy this object.
   Records(Daemon& daemon, const std::string& name, RecordType type, std::function<void()> changed);
 

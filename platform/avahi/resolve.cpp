@@ -9,18 +9,18 @@ namespace onramp::avahi {
 
 namespace {
 
-// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. This is
-// enough time for the daemon to repeat the question once if the first answer was lost.
+// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. In this
+// time, the daemon can repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 
-// Tells a service resolver not to look up an address. The resolver would find only one address,
-// whereas Records finds all of them.
+// Tells a service resolver not to look up an address. It would find only one, but Records finds
+// all.
 constexpr unsigned kNoAddress = 8;
 
-// Reads the arguments of a service resolver's Found signal. Builds the data of the TXT record (RFC
-// 1035 section 3.3.14) from the record's strings, which the signal lists in reverse order. The data
-// of a record without strings is one empty string. Returns nothing when the signal is malformed or
-// names no host.
+// Reads a service resolver's Found signal. Builds the data of the TXT record (RFC 1035 section
+// 3.3.14) from the record's strings, which the signal lists in reverse order. If there are no
+// strings, the data is one empty string. Returns nothing when the signal is malformed or names no
+// host.
 std::optional<Server> serverIn(sd_bus_message* message) {
   Server server;
   const char* host = nullptr;
@@ -71,7 +71,7 @@ void Resolve::begin() {
   service_.emplace(
       daemon_, "ServiceResolver",
       [this](sd_bus_message* call) {
-        // Without a name, the daemon would look up the type itself in place of a service.
+        // Without a name, the daemon would look up the type itself instead of a service.
         if (instance_.name.empty() || instance_.domain.empty()) return -EINVAL;
         return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
                                      instance_.name.c_str(), instance_.type.c_str(),
@@ -80,7 +80,7 @@ void Resolve::begin() {
       [this](Query::Event event, sd_bus_message* message) { happened(event, message); });
 }
 
-// When the daemon gives up after some seconds, the query asks again by itself.
+// A failure needs no action here, because the query is then sent again automatically.
 void Resolve::happened(Query::Event event, sd_bus_message* message) {
   if (event == Query::Event::kFound) server_ = serverIn(message);
   checkSoon();
@@ -116,8 +116,8 @@ void Resolve::check() {
   end(std::move(resolution));
 }
 
-// Returns the IPv4 addresses, or the IPv6 addresses when no IPv4 address has arrived in time.
-// Returns null while the resolve has to wait for addresses.
+// Returns the IPv4 addresses, or the IPv6 addresses when no IPv4 address has arrived within
+// kGraceForIPv4. Returns null while the resolve must still wait for addresses.
 const Records* Resolve::knownAddresses() {
   if (!ipv4_ || !ipv4_->isCacheExhausted()) return nullptr;
   if (!ipv4_->all().empty()) return &*ipv4_;

@@ -14,7 +14,7 @@
 
 namespace onramp::avahi {
 
-/// The result of a resolve, in the form of NetService::addressing() and txtData().
+/// The result of a resolve, in the formats of NetService::addressing() and txtData().
 struct Resolution {
   std::vector<Data> addressing;
   Data txt;
@@ -22,14 +22,14 @@ struct Resolution {
 
 /// The host and the port that offer a service, and the data of the service's TXT record.
 struct Server {
-  std::string host;  ///< a domain name with escapes and without a closing dot
+  std::string host;  ///< a domain name with escapes and without a trailing dot
   std::uint16_t port = 0;
   Data txt;
 };
 
-/// Looks up the host, the port, the TXT record and the addresses of one service on any interface
-/// and protocol. The resolve continues until all of these are known or its time is up. When the
-/// daemon goes away, the resolve starts again once the daemon is back.
+/// Looks up the host, the port, the TXT record and the addresses of one service, on any interface
+/// and protocol. Ends when all of these are known or the time is up. If the daemon goes away, the
+/// resolve starts again when the daemon is back.
 class Resolve {
  public:
   /// Called when the resolve ends, at most once, from inside sd-event's loop. The argument is
@@ -40,8 +40,8 @@ class Resolve {
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
-  /// Returns whether the service's name, type or domain is invalid, so that the daemon cannot look
-  /// up the service.
+  /// Returns whether the daemon cannot look up the service because its name, type or domain is
+  /// invalid.
   [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:
@@ -62,8 +62,8 @@ class Resolve {
   bool isGraceOver_ = false;
   unsigned losses_ = 0;           ///< the daemon's losses() when the resolve last began
   std::optional<Server> server_;  ///< nothing until the daemon has named the host
-  // The daemon limits the number of questions that a client has open, so the question about the
-  // service is closed as soon as it is answered.
+  // This query is destroyed as soon as it is answered, because the daemon limits the number of
+  // queries that a program may have open.
   std::optional<Query> service_;
   std::optional<Records> ipv4_;
   std::optional<Records> ipv6_;

@@ -12,9 +12,9 @@ namespace onramp::avahi {
 /// memory or descriptor, the timer does nothing and isUsable() returns false.
 class Timer {
  public:
-  /// Events that are due in a loop at the same time are handled in the order of their priorities.
-  /// Timers with SD_EVENT_PRIORITY_IDLE run after all messages have been handled. `action` must not
-  /// destroy the timer.
+  /// `priority` ranks events of `loop` that are due at the same time. With SD_EVENT_PRIORITY_IDLE,
+  /// the timer runs after all waiting messages have been handled. `action` must not destroy the
+  /// timer.
   Timer(sd_event* loop, std::function<void()> action,
         std::int64_t priority = SD_EVENT_PRIORITY_NORMAL);
   Timer(const Timer&) = delete;

@@ -8,7 +8,7 @@ std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }
 
-// Takes the function by value, because the other backend stores the function.
+// Takes the function by value, because the backend for Linux stores the function.
 // NOLINTNEXTLINE(performance-unnecessary-value-param)
 void watchSightings(std::function<void(const ServiceSighting&)>) {}
 

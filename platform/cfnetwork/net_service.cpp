@@ -16,7 +16,7 @@ using corefoundation::toString;
 
 class CFService;
 
-// Returns the existing handles. The key of a handle is the framework's object that the handle owns.
+// Returns the existing handles. Each is stored under the framework's object that it owns.
 std::map<CFNetServiceRef, std::weak_ptr<CFService>>& liveServices() {
   static std::map<CFNetServiceRef, std::weak_ptr<CFService>> services;
   return services;
@@ -99,7 +99,8 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  /// Whether the last resolve has succeeded. The framework may keep the result of an earlier one.
+  /// Whether the last resolve has succeeded. If it has not, the framework may still return the
+  /// results of an earlier resolve.
   bool isResolved_ = false;
 };
 

@@ -6,8 +6,8 @@
 
 namespace onramp::cfnetwork {
 
-/// Returns the handle for `service`, and creates the handle if there is none. A handle retains its
-/// service. Returns null when `service` is null. Main thread only.
+/// Returns the existing handle for `service`, or creates one, which retains `service`. Returns null
+/// when `service` is null. Main thread only.
 [[nodiscard]] NetServiceRef handleOf(CFNetServiceRef service);
 
 }  // namespace onramp::cfnetwork

@@ -94,10 +94,10 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     }
   }
 
-  // Updates the number of the service's sightings. `isSeen` is false when a sighting has ended. The
-  // framework may report a sighting for each network interface, and may pass a different object
-  // each time. If this sighting is the first one, or if the last one has ended, returns the object
-  // that the first sighting passed. Returns null otherwise.
+  // Adds a sighting of the service if `isSeen` is true, and removes one otherwise. The framework
+  // may report a service once for each network interface, with a different object each time.
+  // Returns the object of the first sighting when this call has added the first sighting or removed
+  // the last one. Returns null otherwise.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
       return found.service->name() == service->name() && found.service->type() == service->type() &&
@@ -114,9 +114,9 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     return gone;
   }
 
-  // Reports all services as gone, reports the error, and starts the search again after a pause. A
-  // search fails, for instance, when the responder ends. The new search will find the services
-  // again. Stopping the failed search may cause another error, which this function ignores.
+  // Reports all services as gone, reports the error, and restarts the search after a pause. A
+  // search fails, for instance, when the responder ends. The new search finds the services again.
+  // Stopping the failed search may cause another error, which this function ignores.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;
     isFailed_ = true;

@@ -32,8 +32,8 @@ MainLoop& mainLoop() {
   return *instance;
 }
 
-// Waits until there is an action or a timer is due. Returns that action or the action of that
-// timer.
+// Waits until an action has been posted or a timer is due. Returns the posted action or the timer's
+// action.
 std::function<void()> nextAction() {
   MainLoop& loop = mainLoop();
   std::unique_lock lock(loop.mutex);

@@ -23,9 +23,8 @@ namespace onramp::corefoundation {
 /// Returns a copy of the bytes of `data`, which must not be null.
 [[nodiscard]] Data toData(CFDataRef data);
 
-/// Converts a string, an array or a dictionary to a value. Leaves out members of any other kind,
-/// and members whose keys are not strings. Returns nothing when `object` is null or is of any other
-/// kind.
+/// Converts a string, an array or a dictionary to a value. Returns nothing when `object` is null or
+/// of any other kind. Leaves out items of any other kind, and items whose keys are not strings.
 [[nodiscard]] std::optional<Value> toValue(CFTypeRef object);
 
 }  // namespace onramp::corefoundation

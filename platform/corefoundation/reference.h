@@ -12,11 +12,11 @@ class Reference {
  public:
   Reference() = default;
 
-  /// Takes over the reference to `object` that a function with "Create" or "Copy" in its name
+  /// Takes ownership of the reference that a function with "Create" or "Copy" in its name has
   /// returned. Does not retain `object`, which may be null.
   explicit Reference(Ref object) : object_(object) {}
 
-  /// Retains `object`, which may be null. For an object that somebody else owns.
+  /// Retains `object`, which somebody else owns and which may be null.
   [[nodiscard]] static Reference retaining(Ref object) {
     if (object) CFRetain(object);
     return Reference(object);

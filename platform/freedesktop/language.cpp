@@ -65,7 +65,7 @@ int fitness(const Language& offered, const Language& preferred) {
   return offered.region.empty() ? 2 : 1;
 }
 
-// Moves the languages in `offered` that match `wanted` to the end of `chosen`, the best match
+// Moves the languages that match `wanted` from `offered` to the end of `chosen`, the best match
 // first. Returns whether there was a match.
 bool choose(std::vector<std::string>& offered, const Language& wanted,
             std::vector<std::string>& chosen) {

@@ -6,12 +6,12 @@
 
 namespace onramp {
 
-/// The parts of a language identifier, in any of its spellings: "zh_CN", "zh-Hans-CN",
-/// "zh_CN.UTF-8" or, as on old media, "German".
+/// The parts of a language identifier such as "zh_CN", "zh-Hans-CN", "zh_CN.UTF-8" or, on old
+/// media, "German".
 struct Language {
   std::string code;  ///< ISO 639, in lower case; empty when the identifier is malformed
-  /// ISO 15924, such as "Hans"; empty when not given. Chinese without a script gets the script that
-  /// is usual in its region.
+  /// ISO 15924, such as "Hans"; empty when not given. For Chinese without a script, this is the
+  /// usual script of the region.
   std::string script;
   std::string region;  ///< ISO 3166, in upper case; empty when not given
 
@@ -19,13 +19,15 @@ struct Language {
   [[nodiscard]] static Language parse(std::string_view identifier);
 };
 
-/// Returns the languages in which to look for a resource, in the order of the search and spelled as
-/// in `offered`. The result begins with the matches of the first language in `preferred` that has a
-/// match. Of these, the match with the exact region comes first, then a match without a region,
-/// then matches with other regions. The matches of `development` follow. If nothing matches, the
-/// result is English. If English is not offered, the result is the offered language that comes
-/// first in alphabetical order. The result is empty when no well-formed language is offered. Two
-/// languages whose scripts are known and differ never match.
+/// Returns the languages in which to look for a resource, spelled as in `offered`. They come in
+/// this order:
+/// - the matches of the first language in `preferred` that has a match: first the match with the
+///   same region, then one without a region, then those with other regions;
+/// - the matches of `development`;
+/// - if there are none of these, the matches of English;
+/// - if there are none of these either, the alphabetically first well-formed language in `offered`.
+/// Two languages whose scripts are known and differ never match. The result is empty when `offered`
+/// has no well-formed language.
 [[nodiscard]] std::vector<std::string> languagesToSearch(std::vector<std::string> offered,
                                                          const std::vector<std::string>& preferred,
                                                          const std::string& development);

@@ -14,9 +14,8 @@ namespace onramp {
 
 namespace {
 
-// Converts letters by the rules of a neutral locale. The user's own locale is not suitable, because
-// in Turkish "I" becomes a letter without a dot. If the system lacks the neutral locale, the
-// process's locale is used.
+// Converts letters by the rules of the neutral locale C.UTF-8, because in a Turkish locale "I"
+// becomes an "i" without a dot. If the system lacks C.UTF-8, the process's locale is used.
 class PlainLetters {
  public:
   PlainLetters() : locale_(newlocale(LC_CTYPE_MASK, "C.UTF-8", nullptr)) {}

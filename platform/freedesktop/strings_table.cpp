@@ -14,8 +14,8 @@ namespace onramp {
 
 namespace {
 
-// Octal escapes name characters of the NEXTSTEP character set. The lower half of that set is ASCII,
-// and this table is the upper half.
+// Octal escapes stand for characters of the NEXTSTEP character set. The lower half of that set is
+// ASCII, and this table is the upper half.
 constexpr std::array<char16_t, 128> kNextStepUpperHalf = {
     0x00A0, 0x00C0, 0x00C1, 0x00C2, 0x00C3, 0x00C4, 0x00C5, 0x00C7, 0x00C8, 0x00C9, 0x00CA, 0x00CB,
     0x00CC, 0x00CD, 0x00CE, 0x00CF, 0x00D0, 0x00D1, 0x00D2, 0x00D3, 0x00D4, 0x00D5, 0x00D6, 0x00D9,
@@ -84,7 +84,7 @@ class Parser {
            refuse(hasText ? "\";\" expected" : "\"=\" or \";\" expected", lastEnd_);
   }
 
-  // Skips white space and comments. Returns false when a comment does not end.
+  // Skips white space and comments. Refuses the file and returns false when a comment does not end.
   bool skipBlanks() {
     for (;;) {
       rest_.remove_prefix(std::min(rest_.find_first_not_of(" \t\n\v\f\r"), rest_.size()));
@@ -106,8 +106,9 @@ class Parser {
     return true;
   }
 
-  // Reads a word, with or without quotation marks. Refuses the file and returns nothing if no word
-  // begins here, with the reason `expected`, or if a quotation mark is never closed.
+  // Reads a word, with or without quotation marks. If no word begins here, refuses the file with
+  // the reason `expected` and returns nothing. Also refuses the file and returns nothing if a
+  // quotation mark is never closed.
   std::optional<std::string> word(const char* expected) {
     const std::size_t start = at();
     std::optional<std::string> word;
@@ -172,8 +173,8 @@ class Parser {
     return code < 0x80 ? code : kNextStepUpperHalf[code - 0x80];
   }
 
-  // Reads a UTF-16 unit of up to four hexadecimal digits, or two units that form a surrogate pair,
-  // and returns the character.
+  // Reads up to four hexadecimal digits, which name a UTF-16 unit, and returns the character. If
+  // the unit is the first of a surrogate pair, also reads the second one.
   char32_t unicode() {
     const char32_t first = unit();
     if (!isLeadSurrogate(first) || !rest_.starts_with("\\U")) return first;

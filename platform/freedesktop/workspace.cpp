@@ -21,7 +21,7 @@ std::optional<std::string> programOnPath(std::string_view name) {
     const std::size_t end = rest.find(':');
     const std::string folder(rest.substr(0, end));
     rest.remove_prefix(end == std::string_view::npos ? rest.size() : end + 1);
-    // An empty entry means the current folder. Running programs from there would be unsafe.
+    // An empty entry means the current folder, from which it would be unsafe to run programs.
     if (folder.empty()) continue;
     std::string program = folder + "/" + std::string(name);
     std::error_code ignored;
@@ -36,8 +36,8 @@ bool openWithDesktop(const std::string& target) {
   const auto opener = programOnPath("xdg-open");
   const auto process = opener ? startProcess(*opener, {target}, Session::kOwn) : std::nullopt;
   if (!process) return false;
-  // The thread waits for the process, which would otherwise remain as a zombie until this program
-  // ends. A zombie that remains because the system provides no thread is harmless.
+  // A thread waits for the process, which would otherwise remain as a zombie until this program
+  // ends. If the system provides no thread, the zombie remains, which is harmless.
   try {
     std::thread([process] { waitForProcess(*process); }).detach();
   } catch (const std::system_error&) {
@@ -48,7 +48,7 @@ bool openWithDesktop(const std::string& target) {
 }  // namespace
 
 bool openFile(const std::string& path) {
-  // The prefix "./" ensures that a relative path is not mistaken for an option or an address.
+  // With the prefix "./", xdg-open does not mistake a relative path for an option or a URL.
   return openWithDesktop(path.starts_with('/') ? path : "./" + path);
 }
 

@@ -102,15 +102,15 @@ class BinaryWalk {
     Cost cost;
   };
 
-  // Returns a reader that begins with the object and ends where the table of offsets begins. The
-  // reader is empty when the object's offset does not lie before the table.
+  // Returns a reader for the bytes from the object to the table of offsets. The reader is empty
+  // when the object does not lie before the table.
   [[nodiscard]] ByteReader objectAt(std::size_t index) const {
     const std::uint64_t offset = offsets_[index];
     return ByteReader(objects_.substr(std::min<std::uint64_t>(offset, objects_.size())));
   }
 
   // Computes the object's cost. Returns false when libplist must not build the object. The depth
-  // limit ends the recursion.
+  // limit bounds the recursion.
   bool visit(std::size_t index, std::size_t depth) {
     State& state = states_[index];
     if (state.progress == Progress::kOpen) {
@@ -161,7 +161,7 @@ class BinaryWalk {
   }
 
   // Returns the number of items in a container, or of units in a text or data object. Returns
-  // UINT64_MAX, which exceeds every limit, when the number is malformed.
+  // UINT64_MAX, which exceeds every limit, when this number is malformed.
   static std::uint64_t count(std::uint64_t low, ByteReader& object) {
     if (low < 0xF) return low;
     const std::uint64_t marker = object.number(1).value_or(0);

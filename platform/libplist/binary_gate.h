@@ -10,9 +10,9 @@ namespace onramp::libplist {
 /// platform/property_list.h. The format is "bplist00": a header, objects, a table of their offsets
 /// and a trailer of 32 bytes. Every object that can be reached from the root must be of a known
 /// kind and lie before the table. Keys must be texts, and no UTF-16 text may contain a null
-/// character. No container may contain itself. The list must be within the limits even when each
-/// shared object counts once for each reference to it. The check builds nothing. When the result is
-/// false, `problem` gives the place and the reason.
+/// character. No container may contain itself. For the limits, a shared object counts once for each
+/// reference to it. The check itself builds no objects. When the result is false, `problem` gives
+/// the place and the reason.
 [[nodiscard]] bool mayReadBinary(std::string_view bytes, ParseProblem& problem);
 
 }  // namespace onramp::libplist

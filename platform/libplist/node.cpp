@@ -26,9 +26,9 @@ template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
 // libplist's functions for integers do not distinguish -1 from 2^64-1, and its functions for dates
-// keep only 32 bits. Integers and dates are therefore converted by means of a binary list that
-// holds nothing else and keeps every bit. The constants kInteger8, kInteger16 and kDate8 are the
-// first bytes of an integer of 8 bytes, an integer of 16 bytes and a date in such a list.
+// keep only 32 bits. A binary list keeps every bit, so each integer and date is converted through a
+// binary list of one object. In such a list, an 8-byte integer begins with kInteger8, a 16-byte
+// integer with kInteger16, and a date with kDate8.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;
@@ -59,8 +59,8 @@ Node created(Node node) {
   return node;
 }
 
-// Converts `node` to a binary list that holds nothing else, and returns the bytes after the list's
-// header. These bytes begin with the object. Returns an empty text on failure.
+// Converts `node` to a binary list of one object, and returns the bytes after the list's header.
+// These bytes begin with the object. Returns an empty text on failure.
 std::string objectOf(plist_t node) {
   char* bytes = nullptr;
   std::uint32_t size = 0;
@@ -128,9 +128,9 @@ Value dictionaryOf(plist_t node) {
   return Dictionary(std::move(pairs));
 }
 
-// Puts replacement characters in place of malformed UTF-8 and of the characters that XML 1.0 does
-// not allow. XML does not allow control characters even as references, except the tab, the line
-// feed and the carriage return.
+// Replaces malformed UTF-8, and characters that XML 1.0 does not allow, with the replacement
+// character. XML allows no control characters except tab, line feed and carriage return, not even
+// as references.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());

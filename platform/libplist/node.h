@@ -13,7 +13,7 @@ struct NodeFree {
   void operator()(plist_t node) const { plist_free(node); }
 };
 
-/// A libplist node with everything below it.
+/// Owns a libplist node and everything below it.
 using Node = std::unique_ptr<std::remove_pointer_t<plist_t>, NodeFree>;
 
 /// Converts `node` to a value. As in an XML list, a UID becomes a dictionary whose only key is

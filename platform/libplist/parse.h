@@ -9,8 +9,8 @@
 namespace onramp::libplist {
 
 /// Returns the value in `bytes`, an XML property list (in UTF-8 or UTF-16) or a binary one. Returns
-/// nothing when `bytes` are not such a list or exceed a limit. In this case, `problem` gets the
-/// place and the reason, unless libplist itself fails.
+/// nothing when `bytes` are not such a list or exceed a limit. `problem` then gets the place and
+/// the reason, unless the check finds no fault and only libplist fails.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 

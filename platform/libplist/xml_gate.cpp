@@ -14,9 +14,10 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// The limit on those steps of libplist whose number grows quadratically with the size of the list.
-// The keys of a dictionary cause such steps, because libplist hashes them into a fixed number of
-// chains. So do entities, because libplist moves the rest of a text at each entity in the text.
+// Limits the steps of libplist whose number grows quadratically with the size of the list. The keys
+// of a dictionary cause such steps, because libplist hashes them into a fixed number of chains. The
+// entities in a text also cause such steps, because libplist moves the rest of the text at each
+// entity.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {
@@ -67,9 +68,9 @@ class XMLWalk {
     return skipPast(">", 9) && quotesArePaired("[");
   }
 
-  // Moves past the next `end` that is at least `from` characters ahead. Sets `skipped_` to the
-  // markup before that `end`, without the first `from` characters. Refuses the list when there is
-  // no such `end`.
+  // Moves past the first `end` that begins at least `from` characters from here. Sets `skipped_` to
+  // the markup before that `end`, without the first `from` characters. Refuses the list when there
+  // is no such `end`.
   bool skipPast(std::string_view end, std::size_t from) {
     const std::size_t found = text_.find(end, at_ + from);
     if (found == kNone) {
@@ -81,7 +82,7 @@ class XMLWalk {
     return true;
   }
 
-  // Refuses the list when the `end` that skipPast() found is between quotation marks, or when the
+  // Refuses the list when skipPast() has found an `end` between quotation marks, or when the
   // skipped markup contains one of the characters in `refused`. Returns true otherwise.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {

@@ -7,13 +7,15 @@
 
 namespace onramp::libplist {
 
-/// Returns `text`, an XML property list in UTF-8 without a byte-order mark, in a form that libplist
-/// reads correctly. Spaces replace the leading zeros of integers, because libplist would read an
-/// integer with leading zeros as octal. Returns nothing when `text` exceeds the limits in
-/// platform/property_list.h or would take libplist too many steps. Also returns nothing for a null
-/// character, for containers that are not properly nested, and for markup that libplist might parse
-/// differently from this check, such as a document type with an internal part. When the result is
-/// nothing, `problem` gives the place and the reason.
+/// Checks `text`, an XML property list in UTF-8 without a byte-order mark, and returns it in a form
+/// that libplist reads correctly. In this form, spaces replace the leading zeros of integers,
+/// because libplist would read an integer with leading zeros as octal. Returns nothing in these
+/// cases:
+/// - `text` exceeds the limits in platform/property_list.h or would take libplist too many steps;
+/// - `text` has a null character or containers that are not properly nested;
+/// - `text` has markup that libplist might parse differently from this check, such as a document
+///   type with an internal subset.
+/// `problem` then gives the place and the reason.
 [[nodiscard]] std::optional<std::string> admittedXML(std::string text, ParseProblem& problem);
 
 }  // namespace onramp::libplist

@@ -15,8 +15,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// Reads and discards all messages that wait on the socket. The error ENOBUFS means that messages
-// did not fit into the socket's buffer, so something has changed in this case, too. Returns false
+// Reads and discards all messages that wait on the socket. ENOBUFS counts as a message: it means
+// that the kernel has dropped messages for which the socket's buffer was too small. Returns false
 // when the socket is unusable.
 bool drain(int socket) {
   for (;;) {

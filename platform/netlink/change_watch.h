@@ -10,23 +10,21 @@
 namespace onramp::netlink {
 
 /// Reports that the computer's interfaces, IPv4 addresses or, on request, IPv4 routes may have
-/// changed. It does not say what has changed, so the caller has to ask the kernel for the new
-/// state.
+/// changed. It does not say what has changed, so the caller must ask the kernel for the new state.
 class ChangeWatch {
  public:
-  /// Creates a watch, which collects changes from then on. Changes of routes are included if
-  /// `withRoutes` is true. Returns null on failure.
+  /// Creates a watch, which notices all changes from this call on. It notices changes of routes
+  /// only if `withRoutes` is true. Returns null on failure.
   [[nodiscard]] static std::unique_ptr<ChangeWatch> create(bool withRoutes);
 
   ChangeWatch(const ChangeWatch&) = delete;
   ChangeWatch& operator=(const ChangeWatch&) = delete;
   ~ChangeWatch();
 
-  /// Starts to call `changed` on the watch's own thread after every burst of changes, including the
-  /// changes since the watch was created. The destructor stops the calls and waits for a call that
-  /// is running. If the socket to the kernel fails, the calls stop for good, and nobody is told.
-  /// This function may be called only once. It returns false, and calls nothing, when the system
-  /// provides no thread.
+  /// Starts a thread that calls `changed` after every burst of changes, and once for the changes
+  /// since the watch was created. The destructor stops the calls and waits for a running call to
+  /// end. If the socket to the kernel fails, the calls stop for good without a report. Returns
+  /// false when the system provides no thread. Must not be called twice.
   [[nodiscard]] bool start(std::function<void()> changed);
 
  private:

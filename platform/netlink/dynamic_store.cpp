@@ -56,7 +56,7 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
   std::optional<netlink::Selection> selection = netlink::Selection::of(keys, patterns);
   if (!selection) return fail(kSCStatusInvalidArgument, false);
 
-  // The watch is created before the state is read, so that no change between the two is missed.
+  // The watch must exist before the state is read. Otherwise, changes in between would be missed.
   auto watch = netlink::ChangeWatch::create(selection->hasGlobal());
   std::optional<Dictionary> known = watch ? selection->read(store->socket.get()) : std::nullopt;
   if (!known) return fail(kSCStatusFailed, false);

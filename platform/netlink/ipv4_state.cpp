@@ -25,9 +25,8 @@ namespace onramp::netlink {
 
 namespace {
 
-// A dump is the kernel's list of a whole table. If the table changes during a dump, the kernel
-// marks the dump as interrupted, and the dump is requested again. This is the maximum number of
-// requests.
+// The maximum number of requests for one dump (the kernel's list of a whole table). If the table
+// changes during a dump, the kernel marks the dump as interrupted, and it must be requested again.
 constexpr int kDumpAttempts = 16;
 
 using Objects = std::vector<Object>;

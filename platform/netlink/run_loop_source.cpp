@@ -1,5 +1,5 @@
-// This function is in a separate file, so that a program without a run loop can link the other
-// functions of the store.
+// addSourceToMainLoop() is in a separate file, so that a program without a run loop can link the
+// other functions of the store.
 
 #include <atomic>
 #include <memory>
@@ -17,8 +17,8 @@ void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
   static std::vector<DynamicStoreSourceRef> sourcesOnLoop;
   sourcesOnLoop.push_back(source);
 
-  // Makes the main thread look for changes. If the kernel reports more changes before the main
-  // thread has looked, the main thread still looks only once.
+  // Makes the main thread look for changes. The main thread looks only once for all changes that
+  // the kernel reports before then.
   const auto posted = std::make_shared<std::atomic<bool>>(false);
   store->changesArrived = [posted, weak = std::weak_ptr(store)] {
     if (posted->exchange(true)) return;

@@ -23,7 +23,7 @@ class Selection {
   /// Selects nothing.
   Selection() = default;
 
-  /// Creates a selection by the rules of copyMultiple() in platform/dynamic_store.h. Returns
+  /// Creates the selection that copyMultiple() in platform/dynamic_store.h describes. Returns
   /// nothing when a pattern is invalid.
   [[nodiscard]] static std::optional<Selection> of(const std::vector<std::string>& keys,
                                                    const std::vector<std::string>& patterns);
@@ -63,11 +63,11 @@ struct DynamicStore {
   std::function<void()> changesArrived;  ///< empty until the session's source is on the loop
   std::unique_ptr<netlink::ChangeWatch> watch;  ///< null until setNotificationKeys()
 
-  /// Calls the callback with the keys in `notified` whose values have changed, if there are any.
+  /// Calls `callback` with the keys in `notified` whose values have changed, if there are any.
   void tellChanges();
 
-  /// Starts `watch` so that it calls `changesArrived`, if both are set. Removes `watch` and returns
-  /// false when the system provides no thread.
+  /// Makes `watch` call `changesArrived`, if both are set. Destroys `watch` and returns false when
+  /// the system provides no thread.
   bool startWatch();
 };
 

@@ -9,8 +9,8 @@ namespace onramp::posix {
 /// Owns a file descriptor. The destructor closes it.
 class Descriptor {
  public:
-  /// Takes ownership of `number`. A negative number, the result of a failed call, means no
-  /// descriptor.
+  /// Takes ownership of the descriptor `number`. A negative number, which failed system calls
+  /// return, means no descriptor.
   explicit Descriptor(int number = -1) : number_(number) {}
   Descriptor(Descriptor&& other) noexcept : number_(std::exchange(other.number_, -1)) {}
   Descriptor& operator=(Descriptor&& other) noexcept {

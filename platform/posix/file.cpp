@@ -20,16 +20,16 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// Returns the beginning of the names of temporary files for `path`. A temporary file is called
-// ".NAME.PROCESS-NUMBER". The limit on NAME keeps the whole name within the 255 bytes that a file
-// name may have.
+// Returns ".NAME.", with which the names of all temporary files for `path` begin. A full name is
+// ".NAME.PROCESS-NUMBER", where PROCESS is a process ID. NAME is cut short so that the full name
+// has at most 255 bytes, the usual limit on file names.
 std::string temporaryStem(const fs::path& path) {
   constexpr std::size_t kMostNameBytes = 200;
   return "." + path.filename().string().substr(0, kMostNameBytes) + ".";
 }
 
 // Creates a file with an unused name next to `path`, and stores the new file's path in `name`. The
-// user's umask determines the file's access rights. Returns no descriptor on failure.
+// umask determines the file's access rights. Returns an empty descriptor on failure.
 Descriptor createBeside(const fs::path& path, std::string& name) {
   constexpr int kMostTries = 100;  // processes that were killed may have left files with such names
   const std::string stem =
@@ -52,9 +52,9 @@ bool writeAll(int descriptor, std::string_view bytes) {
   return true;
 }
 
-// Returns whether the temporary file whose name ends with `processAndNumber` is no longer being
-// written. A file with this process's ID was left by an earlier process that had the same ID.
-// Returns false when `processAndNumber` is malformed.
+// Returns whether no process is writing the temporary file whose name ends with `processAndNumber`.
+// A file with this process's ID counts as left over, because only an earlier process with the same
+// ID can have left it. Returns false when `processAndNumber` is malformed.
 bool isLeftOver(std::string_view processAndNumber) {
   constexpr std::string_view kDigits = "0123456789";
   const std::size_t dash = processAndNumber.find('-');
@@ -105,8 +105,8 @@ bool writeFileAtomically(const std::string& path, std::string_view bytes) {
 
 void removeWithTemporaries(const std::string& path) {
   std::error_code ignored;
-  // remove_all() opens even a file, in case it is a folder. It removes nothing when the system
-  // provides no descriptor, so the file is removed first.
+  // remove_all() opens `path` even if it is a file, which fails when the system provides no
+  // descriptor. remove() needs no descriptor, so it is tried first.
   if (!fs::remove(path, ignored)) fs::remove_all(path, ignored);
   const std::string stem = temporaryStem(path);
   std::vector<fs::path> leftOver;

@@ -8,16 +8,16 @@
 namespace onramp::posix {
 
 /// Reads the regular file at `path`. Returns nothing when the file cannot be read, is not a regular
-/// file, or is larger than `most` bytes. Never blocks on a pipe.
+/// file, or is larger than `most` bytes. Does not block even if `path` is a pipe.
 [[nodiscard]] std::optional<std::string> readFile(const std::string& path, std::size_t most);
 
 /// Writes `bytes` to `path` atomically: writes and flushes a temporary file in the same folder,
-/// then renames it to `path`. Returns false when a step fails. In that case the temporary file is
-/// removed, and a file that was at `path` is unchanged.
+/// then renames it to `path`. Returns false when a step fails. The temporary file is then removed,
+/// and an existing file at `path` is unchanged.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
 
-/// Removes the file or the folder tree at `path`, and the temporary files that processes left when
-/// they ended during writeFileAtomically() for `path`. Ignores failures.
+/// Removes the file at `path`, or the folder and its contents. Also removes the temporary files of
+/// processes that ended during writeFileAtomically() for `path`. Ignores failures.
 void removeWithTemporaries(const std::string& path);
 
 }  // namespace onramp::posix

@@ -23,7 +23,7 @@ void onInterruption(std::function<void()> action) {
   sigemptyset(&signals);
   sigaddset(&signals, SIGINT);
   sigaddset(&signals, SIGTERM);
-  // Every thread that starts later inherits this mask. Only the thread that calls sigwait()
+  // Every thread that starts later inherits this mask, so only the thread that calls sigwait()
   // receives the signals.
   pthread_sigmask(SIG_BLOCK, &signals, nullptr);
   const auto wait = [signals, action = std::move(action)]() mutable {

@@ -13,9 +13,9 @@ enum class Session {
   kShared,  ///< the caller's session: the started program may end with the terminal
 };
 
-/// Starts the program at `executable` with no signal blocked or ignored. Returns the ID of the new
-/// process, which the caller must pass to waitForProcess(). Returns nothing when the program cannot
-/// be started.
+/// Starts the program at `executable` with `arguments`. The program starts with no signal blocked
+/// or ignored. Returns the ID of the new process, which the caller must pass to waitForProcess().
+/// Returns nothing when the program cannot be started.
 [[nodiscard]] std::optional<pid_t> startProcess(const std::string& executable,
                                                 const std::vector<std::string>& arguments,
                                                 Session session);

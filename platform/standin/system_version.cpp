@@ -25,8 +25,8 @@ std::string runningVersion() {
   return version && *version ? version : kDefaultVersion;
 }
 
-// Removes the text up to and including the next dot. Returns the number at the start of that text,
-// limited to the range from 0 to `most`.
+// Removes the beginning of `version` up to and including the next dot. Returns the number with
+// which `version` began, limited to the range from 0 to `most`.
 std::int64_t takeComponent(std::string_view& version, std::int64_t most) {
   const std::int64_t number = leadingInteger(version.substr(0, version.find('.')));
   version.remove_prefix(std::min(version.find('.'), version.size() - 1) + 1);
@@ -44,7 +44,8 @@ std::optional<std::string> productVersion() {
 }
 
 std::optional<std::int32_t> gestaltSystemVersion() {
-  // The three added dots ensure that each of the three components ends with a dot.
+  // With three dots at the end, even a version such as "10" has three components that end with a
+  // dot.
   const std::string version = runningVersion() + "...";
   std::string_view rest = version;
   std::int64_t digits = takeComponent(rest, 9999);
