@@ -25,9 +25,9 @@ NSArray* allModes() {
 int modalLoops = 0;
 bool isModalAborted = false;
 
-// True from abortModal() until the modal loop has returned or the main thread has found that no
-// loop is running. During this time, a modal loop holds posted actions back, because each of them
-// can occupy the main thread for seconds and so delay the return.
+// True from abortModal() until the modal loop has returned, or until the main thread has found that
+// no loop is running. Meanwhile, posted actions wait for the end of the loop, because each of them
+// could block the main thread for seconds.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while
