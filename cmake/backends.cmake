@@ -1,5 +1,4 @@
-# Sets ONRAMP_BACKENDS to the backends with which the wizard is linked. Together they implement those
-# headers in platform/ that the wizard uses.
+# Sets ONRAMP_BACKENDS to the libraries that implement the headers of platform/ for the wizard.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)
