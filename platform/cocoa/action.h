@@ -4,7 +4,7 @@
 
 #include <functional>
 
-/// Makes a function the target of a button, a menu item or a timer, which calls it with perform:.
+/// Holds a function that a button, a menu item or a timer calls through perform:.
 @interface OnrampAction : NSObject {
   std::function<void()> _function;
 }

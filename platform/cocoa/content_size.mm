@@ -127,7 +127,7 @@ CGFloat neededWidth(NSTableView* list) {
   return width;
 }
 
-// Returns how much wider `view` must be for every list and radio matrix in it. The result can be
+// Returns how much wider `view` must be to fit every list and radio matrix in it. The result can be
 // negative if `view` itself is a list or a matrix.
 CGFloat missingWidth(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {

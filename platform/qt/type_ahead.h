@@ -14,8 +14,8 @@ class TypeAhead {
   /// Call this when the user has typed `text`. Joins texts that are typed in quick succession, and
   /// selects the first row that matches. The search starts at the current row, or at the next one
   /// if the user types the same text again after a pause. After the last row, it continues at the
-  /// first. If one letter was typed several times quickly and no row matches the joined letters,
-  /// searches for the single letter from the next row on. Does nothing if no row matches.
+  /// first row. If one letter was typed several times quickly and no row matches the joined
+  /// letters, searches for the single letter from the next row on. Does nothing if no row matches.
   void type(QAbstractItemView& view, const QString& text);
 
  private:

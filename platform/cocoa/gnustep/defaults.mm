@@ -7,9 +7,9 @@ namespace {
 // The defaults domain that GNUstep searches first.
 NSString* const kFirstDomain = @"GSPrimaryDomain";
 
-// Returns the codes of the user's locale and language, such as "de_DE" and "de", and then "en". Our
-// bundles name their folders after codes, as in "de.lproj". By default, GNUstep looks for the names
-// of languages, as in "German.lproj".
+// Returns the codes of the user's locale and language, such as "de_DE" and "de", and then "en". In
+// our bundles, folders are named after codes, as in "de.lproj". By default, GNUstep looks for
+// folders that are named after languages, as in "German.lproj".
 NSArray* languageCodes() {
   NSDictionary* const environment = [[NSProcessInfo processInfo] environment];
   NSMutableArray* const codes = [NSMutableArray array];

@@ -51,7 +51,7 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  eventfd_write(_descriptor, 1);  // fails only if earlier posts wait, which also wake the loop
+  eventfd_write(_descriptor, 1);  // fails only if many earlier posts are pending
 }
 
 - (void)receivedEvent:(void*)data
