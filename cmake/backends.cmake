@@ -1,4 +1,4 @@
-# Sets ONRAMP_BACKENDS to the libraries that implement the headers of platform/ for the wizard.
+# Sets ONRAMP_BACKENDS to the backends: libraries that implement the headers of platform/ for the wizard.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)

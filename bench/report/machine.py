@@ -35,7 +35,7 @@ def _times():
 
 
 def noise():
-    """Returns a case in which `ours` and `peer` time the same work, so that they differ by noise."""
+    """Returns a case in which `ours` and `peer` time the same work and differ only by noise."""
     def work():
         began = time.perf_counter()
         hashlib.sha256(_BLOCK).digest()

@@ -1,4 +1,4 @@
-"""Uses the wizard's chooser (its list of devices) without the accessibility bus.
+"""Controls the wizard's chooser (its list of devices) without the accessibility bus.
 
 This is necessary to measure the wizard's memory. With the accessibility bus, Qt creates an object
 for a cell whenever the selected row changes, and never frees it.
@@ -20,10 +20,11 @@ def descriptors(process):
 
 
 class BlindChooser:
-    """A context manager that starts the wizard and uses it without reading the screen.
+    """A context manager that starts the wizard and controls it without reading the screen.
 
     The constructor first runs the wizard once with the accessibility bus, to find the button of the
-    menu. While the wizard searches, it has more open descriptors, which show that it is searching.
+    menu. The wizard has more open descriptors while it searches, so their number shows whether a
+    search is running.
     """
 
     def __init__(self, desktop, medium, text):

@@ -1,4 +1,4 @@
-"""Uses the wizard's chooser, which is the page that lists devices, on a practice network."""
+"""Controls the wizard's chooser, the page that lists devices, on a practice network."""
 
 import os
 import pathlib
@@ -56,8 +56,8 @@ class Chooser(Person):
         self.wait()
 
     def refresh(self):
-        """Chooses the menu item that empties the list and searches again. Returns the time of the
-        key press, as time.monotonic() counts. Does not wait until the wizard has received the key.
+        """Chooses the menu item that empties the list and searches again. Returns time.monotonic()
+        at the key press. Does not wait until the wizard has received the key.
         """
         self.open_menu(GEAR)
         self.press(*["Down"] * GEAR_REFRESH)
@@ -69,7 +69,7 @@ class Chooser(Person):
         return self.sees("label", self._text["INST_WAIT"])
 
     def wait(self):
-        """Waits until the search that go_there() or refresh() has just started has ended."""
+        """Waits for the end of the search that go_there() or refresh() has started."""
         if self._key:
             self._key.wait()
             until = time.monotonic() + BEGIN_SECONDS
@@ -82,7 +82,7 @@ class Chooser(Person):
         return self._atspi.CoordType.SCREEN
 
     def table(self):
-        """Returns the table of the devices. Qt creates no cell when the number of rows is read."""
+        """Returns the table of devices. Reading its number of rows does not make Qt create cells."""
         return self.see("tree").get_table_iface()
 
     def names(self):

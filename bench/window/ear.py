@@ -1,4 +1,4 @@
-"""Finds the times in which a program's main loop is silent, that is, does not answer requests."""
+"""Detects silences, the periods in which a program's main loop does not answer requests."""
 
 import dataclasses
 import multiprocessing
@@ -13,11 +13,11 @@ PATIENCE = 120  # seconds; longer than any silence that is measured
 
 @dataclasses.dataclass(frozen=True)
 class Silence:
-    """A time in which the main loop did not answer a request."""
+    """A period in which the main loop did not answer a request."""
 
     began: float      # time.monotonic()
-    seconds: float    # without the time in which no processor was free
-    processor: float  # the seconds of it in which the main thread computed
+    seconds: float    # excludes waits for a free processor
+    processor: float  # seconds of computing in the main thread
 
     def __str__(self):
         return (f"{self.seconds:.2f} s, of which {self.processor:.2f} s computing and "
@@ -26,13 +26,13 @@ class Silence:
 
 class Ear:
     """A context manager that sends requests to the program of a Person from a separate process.
-    The program's window must be visible before that."""
+    The program's window must already be visible."""
 
     def __init__(self, person):
         context = multiprocessing.get_context("spawn")
         self._heard, writer = context.Pipe(duplex=False)
         self._silences = []
-        # The process reads the address of the accessibility bus from the environment that Person set.
+        # The process finds the accessibility bus through the environment that Person has set.
         self._process = context.Process(target=_listen, args=(person.process.pid, writer),
                                         daemon=True)
 

@@ -10,7 +10,7 @@ models   10,000 models: the list of models, and then a search with 50 devices
 silent   a device that never answers SNMP questions; by design, the window waits for it
 
 For each trial, the program prints whether the lists are right, the times and the peak memory. It
-also prints the longest silence, a time in which the main loop did not answer requests. The exit
+also prints the longest silence, a period in which the main loop did not answer requests. The exit
 status is 1 if a list is wrong.
 """
 

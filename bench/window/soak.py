@@ -6,14 +6,15 @@ Usage: soak.py [--seconds 3600] [--seed 1] [--memory] [MEDIUM]
 MEDIUM is a built medium (default: build/medium of this source tree).
 
 After every search, the program counts the rows of the list. The list must have a row for each
-wireless device that was present all the time. It may have a row for each device that came or left.
+wireless device that was present all the time. It may have another row for each device that came or
+left.
 
 At every checkpoint, no device comes or goes while the wizard searches up to three times. One of
 these searches must list exactly the wireless devices that are present, and none may list any other
 device.
 
 The program prints the wizard's memory at each checkpoint, and how the memory grew. It also prints
-the longest silences, the times in which the main loop did not answer requests. The exit status is 1
+the longest silences, the periods in which the main loop did not answer requests. The exit status is 1
 if a list was wrong.
 
 With --memory, the program checks no list and measures no silence, because both need the
@@ -39,7 +40,7 @@ from practice_network import PracticeNetwork
 
 CHECKPOINT_EVERY = 10  # searches
 SEARCHES_AT_CHECKPOINT = 3  # at most
-WARM_UP = 0.1          # the growth is computed without this first part of the run
+WARM_UP = 0.1          # the growth leaves out this first part of the run
 
 
 def memory(process):

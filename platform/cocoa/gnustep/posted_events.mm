@@ -51,7 +51,7 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  eventfd_write(_descriptor, 1);  // fails only if many earlier posts are pending
+  eventfd_write(_descriptor, 1);  // fails only when the counter is full, which wakes the loop, too
 }
 
 - (void)receivedEvent:(void*)data
