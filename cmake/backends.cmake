@@ -1,4 +1,5 @@
-# Sets ONRAMP_BACKENDS to the backends: libraries that implement the headers of platform/ for the wizard.
+# Sets ONRAMP_BACKENDS to the backends of the wizard, which are libraries that implement the headers of
+# platform/.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)
