@@ -1,5 +1,5 @@
-# Sets ONRAMP_BACKENDS to the backends with which the wizard is linked. Together they implement those
-# headers in platform/ that the wizard uses.
+# Sets ONRAMP_BACKENDS to the backends of the wizard, which are libraries that implement the headers of
+# platform/.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)

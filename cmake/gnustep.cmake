@@ -1,5 +1,5 @@
-# Finds GNUstep, which replaces Cocoa on Linux, and defines the target GNUstep::AppKit. Makes clang
-# the compiler for Objective-C++, because Debian's g++ 12 rejects `for (x in y)`.
+# Finds GNUstep, which replaces Cocoa on Linux, and defines the target GNUstep::AppKit. Compiles
+# Objective-C++ with clang, because Debian's g++ 12 rejects `for (x in y)`.
 
 find_program(ONRAMP_GNUSTEP_CONFIG gnustep-config REQUIRED)
 find_program(CMAKE_OBJCXX_COMPILER NAMES clang++ clang++-14 REQUIRED)
@@ -14,8 +14,8 @@ function(gnustep_flags variable kind)
   execute_process(COMMAND ${ONRAMP_GNUSTEP_CONFIG} ${kind} OUTPUT_VARIABLE flags
     OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
   separate_arguments(flags NATIVE_COMMAND "${flags}")
-  # The first command removes flags that the build sets itself or does not want. The second
-  # suppresses warnings in GNUstep's headers.
+  # Remove flags that the build sets itself or does not want, and suppress warnings in GNUstep's
+  # headers.
   list(FILTER flags EXCLUDE REGEX "^(-M.*|-Wall|-Wno-import|-g|-O2|-shared-libgcc|-I\\.)$")
   list(TRANSFORM flags REPLACE "^-I" "-isystem")
   set(${variable} ${flags} PARENT_SCOPE)
@@ -30,6 +30,6 @@ execute_process(COMMAND gcc -print-file-name=include OUTPUT_VARIABLE gcc_include
 add_library(GNUstep::AppKit INTERFACE IMPORTED)
 target_compile_options(GNUstep::AppKit INTERFACE
   $<$<COMPILE_LANGUAGE:OBJCXX>:${compile_flags} -fobjc-runtime=gcc -idirafter${gcc_include}>
-  # This header declares what GNUstep's headers lack.
+  # This header declares methods that GNUstep's headers lack.
   "$<$<COMPILE_LANGUAGE:OBJCXX>:SHELL:-include ${PROJECT_SOURCE_DIR}/platform/cocoa/gnustep/appkit_additions.h>")
 target_link_libraries(GNUstep::AppKit INTERFACE ${link_flags})

@@ -1,8 +1,8 @@
-# Installs the application, the companions, an example medium and the documents. From these files,
-# cpack makes a Debian package and the media kit, a tarball that can be used without installation.
+# Installs the application, the command-line tools, an example medium and the documents. cpack puts
+# these files into a Debian package and into the media kit, a tarball that runs without installation.
 #
-# LIBDIR/onramp holds the example medium with the application on it, and scripts from tools/. The
-# commands in BINDIR that are scripts are links to these scripts.
+# LIBDIR/onramp holds the scripts from tools/, and the example medium with the application on it. Each
+# command in BINDIR is a program or a link to one of these scripts.
 
 set(ONRAMP_ZSH_COMPLETIONS ${CMAKE_INSTALL_DATADIR}/zsh/site-functions CACHE STRING
   "Where zsh looks for completions; on Debian it is share/zsh/vendor-completions for packages")
@@ -17,7 +17,7 @@ set(generated ${PROJECT_BINARY_DIR}/packaging)
 file(MAKE_DIRECTORY ${generated})
 
 # install_compressed(FILE FOLDER) compresses FILE and installs the result, whose name ends in ".gz",
-# in FOLDER. The same FILE always gives the same bytes.
+# in FOLDER. The result depends only on the contents of FILE.
 function(install_compressed file folder)
   get_filename_component(name ${file} NAME)
   set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${file})
@@ -41,8 +41,7 @@ foreach(modules IN ITEMS onscreen practice_network tours)
 endforeach()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/examples/medium DESTINATION ${home} USE_SOURCE_PERMISSIONS)
 install(FILES ${PROJECT_SOURCE_DIR}/examples/practice-network.toml DESTINATION ${home}/examples)
-# The practice network reads the maker's settings, so that its devices answer as the maker's devices
-# do.
+# The practice network reads the maker's settings, so that its devices answer like the maker's.
 install(FILES ${ONRAMP_MAKER} RENAME maker.json DESTINATION ${home})
 
 foreach(tool IN ITEMS check devices)
@@ -68,7 +67,7 @@ configure_file(${packaging}/changelog.in ${generated}/changelog @ONLY)
 install(FILES ${generated}/example.onramp.preview.metainfo.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/metainfo)
 install_compressed(${generated}/changelog ${documents})
 install(FILES ${packaging}/copyright DESTINATION ${documents})
-# The documents keep their places, because they link to each other.
+# The documents keep their relative paths, because they link to each other.
 foreach(document IN ITEMS README.md ARCHITECTURE.md CONTRIBUTING.md RELIABILITY.md SECURITY.md docs/first-mac.md
     docs/mastering-a-medium.md docs/texts-and-languages.md docs/support.md docs/wizard.png packaging/media-kit.md)
   cmake_path(GET document PARENT_PATH folder)

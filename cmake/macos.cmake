@@ -1,5 +1,5 @@
-# Builds the application for macOS. The target medium assembles a medium with the application in
-# ONRAMP_MEDIUM. The target dmg makes a disc image of that medium.
+# Builds the application for macOS. The target medium assembles a medium with the application in the
+# folder ONRAMP_MEDIUM. The target dmg makes a disc image of that medium.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_application "${ONRAMP_MEDIUM}/Onramp OSX.app")
@@ -10,8 +10,8 @@ set_target_properties(onramp PROPERTIES
   MACOSX_BUNDLE_INFO_PLIST ${PROJECT_BINARY_DIR}/Info.plist
   RUNTIME_OUTPUT_DIRECTORY ${ONRAMP_MEDIUM})
 
-# onramp_resource(FILE [FOLDER]) puts FILE into the folder Resources of the application's bundle, or
-# into the subfolder FOLDER of Resources.
+# onramp_resource(FILE [FOLDER]) puts FILE into Resources in the application's bundle, or into
+# Resources/FOLDER.
 function(onramp_resource file)
   target_sources(onramp PRIVATE ${file})
   set_source_files_properties(${file} PROPERTIES MACOSX_PACKAGE_LOCATION "Resources/${ARGV1}")

@@ -1,5 +1,5 @@
-# The target medium assembles a medium in ONRAMP_MEDIUM from the example medium's files and the
-# application's bundle. The installed example medium gets the bundle, too.
+# The target medium assembles a medium in the folder ONRAMP_MEDIUM: the files of the example medium and
+# the application's bundle. The bundle is also installed on the installed example medium.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")

@@ -8,11 +8,10 @@ target_compile_options(onramp_options INTERFACE
   # memory.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
   # macOS deprecates its C functions for network services and for the system's version, but has no
-  # newer C functions.
+  # other C functions for them.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
-# These options are global, so that every object file is instrumented, and with it the code from
-# third-party headers.
+# These options are global, so that all code is instrumented, including that of third-party headers.
 if(ONRAMP_SANITIZE)
   add_compile_options(-fsanitize=${ONRAMP_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
   add_link_options(-fsanitize=${ONRAMP_SANITIZE})
@@ -22,9 +21,9 @@ if(ONRAMP_FUZZ)
   add_custom_target(fuzzers)
 endif()
 
-# onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room. Its files are
-# joined only for the linter, not in other unity builds. So a program needs only the backends for
-# those files that it uses.
+# onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room, as this project
+# calls a folder with one task. The files of the library are joined only for the linter, not in other
+# unity builds. Otherwise, a program would need backends for files that it does not use.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
@@ -34,18 +33,17 @@ function(onramp_library name)
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 
-# onramp_backend(NAME SOURCES… [LINK libraries…]) adds a backend, which implements a part of the
-# seam. A backend is an object library, because it precedes the rooms' libraries on the linker's
-# command line. From a static library in that place, the linker would not take the symbols that the
-# rooms need.
+# onramp_backend(NAME SOURCES… [LINK libraries…]) adds a backend, which implements headers of
+# platform/. A backend is an object library, because it comes before the libraries that use it on the
+# linker's command line. The linker would skip the files of a static library in that place, because
+# nothing needs them yet.
 function(onramp_backend name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})
   target_link_libraries(${name} PUBLIC onramp_options ${ARG_LINK})
 endfunction()
 
-# onramp_test(NAME SOURCES… [LINK libraries…]) adds a GoogleTest program, which ctest runs as one
-# test.
+# onramp_test(NAME SOURCES… [LINK libraries…]) adds a GoogleTest program. ctest runs it as one test.
 function(onramp_test name)
   if(NOT ONRAMP_TESTS)
     return()
@@ -57,9 +55,9 @@ function(onramp_test name)
   set_tests_properties(${name} PROPERTIES TIMEOUT 300)
 endfunction()
 
-# onramp_namespace_test(NAME …) does what onramp_test does, but the test runs as root in a new
-# network namespace. It is skipped where no namespace can be created. ctest starts the test through
-# tests/in_namespace, which CMake's property for emulators names.
+# onramp_namespace_test(NAME …) is like onramp_test, but the test runs as root in a new network
+# namespace. If no namespace can be created, the test is skipped. The emulator property makes ctest
+# start the test with tests/in_namespace.
 function(onramp_namespace_test name)
   onramp_test(${name} ${ARGN})
   if(TARGET ${name})
@@ -70,8 +68,8 @@ function(onramp_namespace_test name)
 endfunction()
 
 # onramp_fuzz(NAME SOURCES… [CORPUS folder] [LINK libraries…]) adds a libFuzzer program. ctest runs
-# the program briefly, with seeds from the folder corpus/NAME beside its source, or from
-# corpus/CORPUS. New inputs are stored in the build folder.
+# the program briefly. Its seeds are in the folder corpus/CORPUS beside its source. CORPUS is NAME by
+# default. New inputs are stored in the build folder.
 function(onramp_fuzz name)
   if(NOT ONRAMP_FUZZ)
     return()

@@ -1,4 +1,4 @@
-// Shows an empty window of the wizard's size, with which start_up.py compares the wizard.
+// Shows an empty window of the wizard's size. start_up.py compares its start-up with the wizard's.
 
 #include <QApplication>
 #include <QMainWindow>

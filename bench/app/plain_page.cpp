@@ -1,5 +1,5 @@
-// Shows a page like the wizard's first page, written directly with Qt: title, text, list, menu and
-// buttons.
+// Shows a page like the wizard's first page, written in plain Qt. start_up.py compares its start-up
+// with the wizard's.
 
 #include <QApplication>
 #include <QLabel>
@@ -16,7 +16,7 @@ namespace {
 
 constexpr int kModels = 100;
 
-// Returns a new object, which its Qt parent deletes.
+// Creates an object that its Qt parent deletes.
 template <typename Child, typename... Arguments>
 Child* make(Arguments&&... arguments) {
   return std::make_unique<Child>(std::forward<Arguments>(arguments)...).release();

@@ -1,8 +1,8 @@
 #!/usr/bin/python3
 """Compares the wizard's start-up with that of an empty window and of a similar page in plain Qt.
 
-The wizard runs on media of 10 to 10,000 models. Each time is from the start of a program until
-something is drawn. The memory is the peak until 0.3 seconds later.
+The wizard starts from media with 10 to 10,000 models. A time runs from the start of a program until
+it draws something. The peak memory is read 0.3 seconds later.
 """
 
 import pathlib
@@ -25,7 +25,7 @@ TIME, MEMORY = "Time from start to first page", "Peak memory at the first page"
 
 
 def measure(build, env, program):
-    """Returns how long a start takes in seconds, and its peak memory in MiB."""
+    """Returns how many seconds `program` takes to draw something, and its peak memory in MiB."""
     line = subprocess.run([build / "bench/app/time_to_window", program], env=env, check=True,
                           stdout=subprocess.PIPE, text=True).stdout
     milliseconds, kibibytes = line.split()
@@ -33,8 +33,8 @@ def measure(build, env, program):
 
 
 def medium_with(folder, count):
-    """Makes a medium of `count` models and returns its wizard. The last model differs from the
-    others, so that the wizard has to read all of them to choose the first page."""
+    """Makes a medium with `count` models and returns the path of its wizard. Only the last model
+    has other connections, so the wizard must read all models to choose the first page."""
     models = {f"Kestrel Model {i:05}": media.model(usb=True, wired=i + 1 < count, wireless=True)
               for i in range(count)}
     medium = media.make(pathlib.Path(folder) / str(count), ROOT / "build/medium", models)
@@ -42,8 +42,8 @@ def medium_with(folder, count):
 
 
 def run_all(build, rounds):
-    """Returns the times and the memories of each program. The keys are the names of the peers and,
-    for the wizard, the numbers of models."""
+    """Returns a dictionary with the times and the peak memories of each program. Its keys are the
+    names of the peers and, for the wizard, the numbers of models."""
     with Desktop(window_manager=False) as desktop, tempfile.TemporaryDirectory() as folder:
         env = desktop.env | {"LANG": "en_US.UTF-8"}
         del env["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"]

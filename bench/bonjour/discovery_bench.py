@@ -1,13 +1,15 @@
 #!/usr/bin/python3
-"""Compares the wizard's discovery with avahi-browse on the same network in the same run.
+"""Compares the wizard's search for network services with avahi-browse on the same network.
 
-Measures up to 500 services on dual-stack networks with one interface and, without --quick, with
-two. Each measured time is from the start of a program until it prints the line about the last
-service that it resolves. The warm part has one host, whose Avahi daemon has all services in its
-cache. The cold part has two hosts joined by virtual cables. In that part, the Avahi daemon of the
-searching host is restarted before every search, so that its cache is empty. Without --json, the
-warm part also prints the processor time of a search that keeps running after it has found
-everything.
+The network has IPv4 and IPv6, up to 500 services, and one interface. Without --quick, a network
+with two interfaces is measured, too. A time runs from the start of a program until it prints the
+last service that it resolves.
+
+Full cache: both programs run on the host of the services, whose Avahi daemon knows all of them.
+Empty cache: a second host searches. Its Avahi daemon is restarted before every search.
+
+Without --json, the program also measures a search that keeps running after it has found everything
+in the full cache, and prints its processor time.
 """
 
 import argparse
@@ -38,8 +40,8 @@ IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """Returns the seconds from the start of `command` until it has named `count` services, or until
-    its output ends. `name_of` returns the service that an output line names, or None."""
+    """Runs `command` until it has named `count` services or its output ends. Returns the seconds
+    that this took. `name_of` returns the service that a line of output names, or None."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:
@@ -68,8 +70,8 @@ def grow_to(network, count):
         network.add(f"Kestrel {number}", type=TYPE, activeif="closed", maker="Kestrel",
                     model="Model 100")
     network.settle()
-    # For a while, Avahi repeats the announcements of new services. These would fill the empty
-    # cache.
+    # Avahi repeats the announcements of new services for a while. They would fill a cache that
+    # empty_cache() has emptied.
     time.sleep(14 + 0.1 * count)
 
 
@@ -89,7 +91,7 @@ def compare(state, interfaces, probe, quick, report):
                 if state == "cold":
                     empty_cache()
                 seconds = program(*arguments)
-                if round_number:  # The first round is only a warm-up.
+                if round_number:  # the first round is only a warm-up
                     samples[program].append(seconds)
         report.add(Case(f"Discovery, {'full' if state == 'warm' else 'empty'} cache, {interfaces} "
                         f"interface{'s' * (interfaces > 1)}", f"{count} service{'s' * (count > 1)}",
@@ -113,7 +115,7 @@ def idle(interfaces, probe, report):
 
 
 def run_inside(state, interfaces, arguments):
-    """Starts this program again on a practice network and returns its exit status."""
+    """Runs this program again inside a practice network and returns its exit status."""
     with tempfile.NamedTemporaryFile("w", suffix=".toml") as description:
         description.write(f"[network]\ninterfaces = {interfaces}\n")
         description.flush()

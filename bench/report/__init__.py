@@ -1,1 +1,1 @@
-"""What the benchmarks use to report their figures, and what bench/compare makes of the reports."""
+"""Reports the results of the benchmarks, and makes the table and the plots of bench/compare."""

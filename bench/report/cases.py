@@ -1,4 +1,4 @@
-"""The form in which the parts of bench/compare report what they measured."""
+"""The results of a benchmark, as JSON for bench/compare and as text for people."""
 
 import argparse
 import dataclasses
@@ -11,19 +11,19 @@ _SCALES = {"s": ((1, "s"), (1e-3, "ms"), (1e-6, "µs"), (1e-9, "ns")), "MiB": ((
 
 @dataclasses.dataclass(frozen=True)
 class Case:
-    """What was measured again and again under the same conditions, each time beside a peer.
+    """Repeated measurements of Onramp and of a peer under the same conditions.
 
-    A pair of values with the same index was measured in the same round.
+    `ours[i]` and `peer[i]` were measured in the same round.
     """
 
     benchmark: str      # such as "Time from start to first page"
     name: str           # what distinguishes this case, such as "100 models"
-    peer_name: str      # what `peer` was measured with
+    peer_name: str      # what Onramp is compared with, such as "avahi-browse"
     unit: str           # of all values: "s" or "MiB"
     ours: list[float]
     peer: list[float]
-    axis: str = ""      # what the plot of the benchmark has below its x axis, such as "models"
-    size: int = 0       # the place of this case on that axis
+    axis: str = ""      # what the x axis of the plot counts, such as "models"; empty: no plot
+    size: int = 0       # the number on the x axis
 
     def ratio(self):
         """Returns the quartiles of ours / peer, over all rounds."""
@@ -36,13 +36,13 @@ def quartiles(values):
 
 
 def spread(values):
-    """Returns the noise: the distance between the quartiles as a part of the median."""
+    """Returns the interquartile range divided by the median, or 0 if the median is 0."""
     low, middle, high = quartiles(values)
     return (high - low) / middle if middle else 0
 
 
 def with_unit(value, unit):
-    """Returns a value of "s" or "MiB" as a text with at most three significant digits."""
+    """Returns `value` with a unit and at most three significant digits, such as "12.3 ms"."""
     for factor, name in _SCALES[unit]:
         if abs(value) >= factor:
             break
@@ -50,7 +50,7 @@ def with_unit(value, unit):
 
 
 def line(case):
-    """Returns one line about a case, for people."""
+    """Returns a line of text about a case."""
     low, middle, high = case.ratio()
     ours, peer = (with_unit(statistics.median(values), case.unit)
                   for values in (case.ours, case.peer))
@@ -59,7 +59,7 @@ def line(case):
 
 
 class Report:
-    """Prints each case of a benchmark as a line for people or, with --json, as a line of JSON."""
+    """Prints each case of a benchmark as a line of text or, with --json, as a line of JSON."""
 
     def __init__(self, as_json):
         self._as_json = as_json
@@ -68,7 +68,7 @@ class Report:
         print(json.dumps(dataclasses.asdict(case)) if self._as_json else line(case), flush=True)
 
     def remark(self, text):
-        """Prints a line for people. Prints nothing with --json."""
+        """Prints `text`, but not with --json."""
         if not self._as_json:
             print(text, flush=True)
 
@@ -88,7 +88,7 @@ def parser(description, usage=None):
 
 
 def require(paths, remedy):
-    """Ends the program with a message if one of `paths` is missing."""
+    """Ends the program if one of `paths` is missing, with a message that ends in `remedy`."""
     for path in paths:
         if not path.exists():
             sys.exit(f"{sys.argv[0]}: {path} is missing; {remedy}")

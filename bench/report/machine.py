@@ -1,4 +1,4 @@
-"""How quiet the machine is: what else it does, and how much the same work differs in time."""
+"""How busy the machine is, and how much the time of the same work varies on it."""
 
 import hashlib
 import os
@@ -13,15 +13,15 @@ _WATCH_SECONDS = 2
 
 
 def describe():
-    """Returns the processor's name and how many of them there are."""
+    """Returns the number of processors and their name."""
     lines = pathlib.Path("/proc/cpuinfo").read_text().splitlines()
     names = [line.split(":", 1)[1].strip() for line in lines if line.startswith("model name")]
     return f"{os.cpu_count()} × {names[0] if names else 'processor'}"
 
 
 def busy_share():
-    """Watches the machine for two seconds, in which no benchmark may run. Returns the share of the
-    processors that other programs use, from 0 to 1."""
+    """Watches the machine for two seconds. Returns the share of the processors that are busy in
+    this time, from 0 to 1. Call this while no benchmark runs."""
     before = _times()
     time.sleep(_WATCH_SECONDS)
     spent = [after - earlier for earlier, after in zip(before, _times())]
@@ -29,13 +29,13 @@ def busy_share():
 
 
 def _times():
-    """Returns how long the processors did each kind of work. The fourth and fifth are idleness."""
+    """Returns how long the processors were in each state. In states 3 and 4 they were idle."""
     first_line = pathlib.Path("/proc/stat").read_text().split("\n")[0]
     return [int(field) for field in first_line.split()[1:9]]
 
 
 def noise():
-    """Returns a case in which ours and the peer are the same work. What differs is noise."""
+    """Returns a case in which `ours` and `peer` time the same work and differ only by noise."""
     def work():
         began = time.perf_counter()
         hashlib.sha256(_BLOCK).digest()

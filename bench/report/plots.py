@@ -1,4 +1,4 @@
-"""The plots: cost against the number of models and of devices, and the noise of each case."""
+"""Plots of time or memory against the number of models or devices, and of each case's noise."""
 
 from . import svg
 from .cases import quartiles, spread, with_unit
@@ -9,8 +9,8 @@ NOISE_ROW, NOISE_NAMES, NOISE_WIDTH = 20, 470, 920
 
 
 def cost(cases, axis):
-    """Returns an SVG with a panel for each benchmark that has at least two cases along `axis`.
-    Returns None if no benchmark has.
+    """Returns an SVG with a panel for each benchmark that has at least two cases along `axis`, or
+    None if there is no such benchmark.
 
     Points are medians, and bars reach from the lower to the upper quartile. Both axes are
     logarithmic.
@@ -49,7 +49,7 @@ def _panel(group, axis):
         quarters = [(x(size), *map(y, quartiles(values))) for size, values in points]
         parts.append(svg.line([(at, middle) for at, _, middle, _ in quarters], number))
         for at, low, middle, high in quarters:
-            aside = at + 4 * number - 2  # so that the bars of both series can be seen
+            aside = at + 4 * number - 2  # keeps the bars of the two series apart
             parts += [svg.error_bar(aside, low, high, number), svg.dot(at, middle, number)]
     return parts
 
@@ -72,7 +72,7 @@ def _axes(x, y, unit, axis):
 
 
 def noise(cases):
-    """Returns an SVG with two values for each case: spread() of ours and of the peer's values."""
+    """Returns an SVG that shows, for each case, the spread() of our values and of the peer's."""
     spreads = [(f"{case.benchmark}, {case.name}", spread(case.ours), spread(case.peer))
                for case in cases]
     most = max(0.05, *(max(ours, peer) for _, ours, peer in spreads))
@@ -82,7 +82,7 @@ def noise(cases):
     def at(part):
         return NOISE_NAMES + part / most * (NOISE_WIDTH - NOISE_NAMES - 30)
 
-    parts = [svg.text(16, 20, "Noise: the spread between repetitions of the same thing",
+    parts = [svg.text(16, 20, "Noise: how much repeated measurements differ",
                       kind="title")]
     for series, name in enumerate(("Onramp", "peer")):
         parts += [svg.dot(NOISE_NAMES + series * 90, 40, series),
@@ -97,5 +97,5 @@ def noise(cases):
         parts += [svg.text(NOISE_NAMES - 10, y + 4, name, anchor="end"),
                   svg.dot(at(ours), y - 2, 0), svg.dot(at(peer), y + 2, 1)]
     parts.append(svg.text((NOISE_NAMES + NOISE_WIDTH) / 2, bottom + 34,
-                          "distance of the quartiles, as a part of the median", anchor="middle"))
+                          "interquartile range, as a share of the median", anchor="middle"))
     return svg.document(NOISE_WIDTH, height, parts, "Noise of the benchmarks")

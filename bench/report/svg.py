@@ -1,16 +1,16 @@
-"""Draws charts as SVG. Their colours follow the reader's choice of light or dark."""
+"""Draws charts as SVG. Their colours follow the reader's light or dark colour scheme."""
 
 import html
 import math
 
 PANEL_WIDTH, PANEL_HEIGHT = 460, 320
 LEFT, RIGHT, TOP, BOTTOM = 74, 16, 64, 46
-_SERIES = (("#0b62c4", "#66aaff"), ("#b3470b", "#ff9d5c"))  # in light and in dark colours
+_SERIES = (("#0b62c4", "#66aaff"), ("#b3470b", "#ff9d5c"))  # for a light and a dark colour scheme
 _DASHES = ("", "6 4")
 
 
 def _colours(number, ground, ink, faint):
-    """Returns the CSS rules for light colours if `number` is 0, and for dark ones if it is 1."""
+    """Returns CSS rules. `number` is 0 for the light colours of _SERIES, and 1 for the dark ones."""
     series = "".join(f".stroke{index} {{ stroke: {pair[number]}; }} "
                      f".fill{index} {{ fill: {pair[number]}; }} "
                      for index, pair in enumerate(_SERIES))
@@ -18,7 +18,7 @@ def _colours(number, ground, ink, faint):
             f".grid {{ stroke: {faint}; }} {series}")
 
 
-# Classes instead of CSS variables, which some programs that show SVG do not know.
+# Uses classes, because some SVG viewers do not support CSS variables.
 _STYLE = f"""
 text {{ font: 12px sans-serif; }} .title {{ font-weight: bold; font-size: 13px; }}
 .line {{ fill: none; stroke-width: 2; }} .bar {{ stroke-width: 1.5; }}
@@ -64,7 +64,7 @@ def line(points, series):
 
 
 class LogScale:
-    """Maps values from `low` to `high` to positions from `start` to `end`, logarithmically."""
+    """A logarithmic scale. Maps values from `low` to `high` to positions from `start` to `end`."""
 
     def __init__(self, low, high, start, end):
         self._low, self._high = math.log10(low), math.log10(high)
@@ -78,7 +78,7 @@ class LogScale:
 
     def ticks(self):
         """Returns the powers of ten in the range. If the range is short, also returns the values
-        that are twice or five times a power of ten."""
+        in it that are 2 or 5 times a power of ten."""
         steps = (1,) if self._high - self._low > 2.2 else (1, 2, 5)
         powers = range(math.floor(self._low), math.ceil(self._high) + 1)
         values = (step * 10.0 ** power for power in powers for step in steps)

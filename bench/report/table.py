@@ -16,7 +16,7 @@ def rows(cases):
 
 
 def text(cases):
-    """Returns the table with columns of equal width, for a terminal."""
+    """Returns the table with aligned columns, for a terminal."""
     table = [HEADINGS, *rows(cases)]
     widths = [max(map(len, column)) for column in zip(*table)]
     return "\n".join("  ".join(cell.ljust(width) for cell, width in zip(row, widths)).rstrip()

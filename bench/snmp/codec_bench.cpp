@@ -1,6 +1,6 @@
-// Encodes the request for the SNMP object ActiveIF and decodes the reply, in turn with the wizard's
-// codec and with the net-snmp library. Prints the time for each message, the ratio of the times,
-// and the number of allocations for each message. With --json, prints the times in the form that
+// Compares the wizard's SNMP codec with the net-snmp library. Both encode the request for the
+// object ActiveIF and decode the reply. Prints the time and the number of allocations for a
+// message, and the ratio of the times. With --json, prints only the times, in the form that
 // bench/compare reads.
 
 #include <net-snmp/net-snmp-config.h>
@@ -22,8 +22,7 @@ long allocations = 0;
 
 }  // namespace
 
-// These functions replace malloc and calloc in the whole process, net-snmp included, and count the
-// calls.
+// Replaces malloc and calloc in the whole process, including net-snmp, to count the calls.
 extern "C" {
 // The C library's own allocation functions.
 void* __libc_malloc(std::size_t size);                     // NOLINT(bugprone-reserved-identifier)
@@ -105,7 +104,7 @@ class NetSnmp {
     snmp_free_pdu(pdu);
   }
 
-  /// net-snmp encodes towards the buffer's start, so the request is at the buffer's end.
+  /// net-snmp fills the buffer from its end, so the request is at the end.
   [[nodiscard]] std::span<const std::uint8_t> request() const {
     return std::span(buffer_).last(offset_);
   }

@@ -31,8 +31,8 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the sample at the quantile `part`, from 0 (the least sample) to 1 (the greatest).
-  /// Between two samples, returns the lesser one. There must be at least one sample.
+  /// Returns the sample at the quantile `part`, from 0 (the least sample) to 1 (the greatest). If
+  /// the quantile is between two samples, returns the lesser. There must be at least one sample.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());
@@ -43,12 +43,12 @@ class Samples {
   std::vector<double> samples_;
 };
 
-/// Whether the last argument is --json.
+/// Returns whether the last argument is --json.
 inline bool wantsJson(int argc, char** argv) {
   return argc > 1 && std::strcmp(argv[argc - 1], "--json") == 0;
 }
 
-/// Prints a benchmark's samples beside those of a peer as a line of JSON, in the form of
+/// Prints the samples of a benchmark and of its peer as a line of JSON: a Case of
 /// bench/report/cases.py.
 inline void printJson(const char* benchmark, const char* name, const char* peerName,
                       const Samples& ours, const Samples& peer) {

@@ -1,6 +1,6 @@
-// Compares the time of a query, from the request to the result, with the time of a bare UDP
-// exchange that asks the same agent for the same object. Queries and bare exchanges alternate.
-// With --json as the last argument, prints the times in the form that bench/compare reads.
+// Compares the time of the wizard's SNMP query with that of a bare UDP exchange, which sends the
+// same agent a request for the same object. Queries and bare exchanges alternate. With --json as
+// the last argument, prints the times in the form that bench/compare reads.
 
 #include <array>
 #include <cstdio>

@@ -1,8 +1,9 @@
 #!/usr/bin/python3
-"""Measures how long onramp-check takes for media of 10 to 10,000 models.
+"""Measures how long onramp-check takes for media with 10 to 10,000 models.
 
-On some of the media, the two lists of models agree. On the others, they differ in every name.
-Each time is compared with the time for 1,000 models, scaled to the same number of models.
+A medium lists its models in ModelInfo.plist and in CDInfo.plist. On half of the media, both files
+have the same names. On the others, CDInfo.plist misspells every name. Each time is compared with
+the time for 1,000 models, scaled to the same number of models.
 """
 
 import pathlib

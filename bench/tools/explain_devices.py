@@ -1,9 +1,9 @@
 #!/usr/bin/python3
 """Compares onramp-devices with avahi-browse and snmpget on networks of several sizes.
 
-Each round measures two times: the time until onramp-devices has explained every device, and the
-time until avahi-browse has resolved the same devices. Before the rounds, one snmpget for each
-device that answers is measured. The slowest of them is added to each time of avahi-browse.
+Each round measures how long onramp-devices takes to explain every device, and how long avahi-browse
+takes to resolve the same devices. Before the rounds, snmpget asks each device that has an SNMP
+agent. The time of the slowest answer is added to every time of avahi-browse.
 """
 
 import os
@@ -25,7 +25,7 @@ COUNTS, QUICK_COUNTS = (1, 20, 100, 500), (1, 500)
 ROUNDS, QUICK_ROUNDS = 7, 5
 TYPE = "_pdl-datastream._tcp"
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
-ANSWERING = 50  # the other devices have the setting activeif = "closed", so they have no agent
+ANSWERING = 50  # the number of devices with an SNMP agent
 AGENTS = [f"127.0.5.{number + 1}" for number in range(ANSWERING)]
 
 

@@ -1,7 +1,7 @@
-"""The wizard's chooser as used by a person who has no assistive program.
+"""Controls the wizard's chooser (its list of devices) without the accessibility bus.
 
-While an assistive program may listen, Qt makes an object for a cell whenever the selected row
-changes, and never frees it. So whoever measures memory must not look through the accessibility bus.
+This is necessary to measure the wizard's memory. With the accessibility bus, Qt creates an object
+for a cell whenever the selected row changes, and never frees it.
 """
 
 import pathlib
@@ -20,10 +20,11 @@ def descriptors(process):
 
 
 class BlindChooser:
-    """A context manager that starts the wizard and uses it without a look at the screen.
+    """A context manager that starts the wizard and controls it without reading the screen.
 
-    An earlier run of the wizard, which ends in the constructor, shows where the menu's button is. A
-    search is recognised by the descriptors that the wizard has open only while it searches.
+    The constructor first runs the wizard once with the accessibility bus, to find the button of the
+    menu. The wizard has more open descriptors while it searches, so their number shows whether a
+    search is running.
     """
 
     def __init__(self, desktop, medium, text):
@@ -45,7 +46,7 @@ class BlindChooser:
         stop(self.process)
 
     def go_there(self):
-        """Chooses wireless, and returns when the first search has ended."""
+        """Chooses wireless on the first page. Returns when the first search has ended."""
         self._desktop.run(["xdotool", "search", "--sync", "--onlyvisible", "--pid",
                            str(self.process.pid)], timeout=WAIT_SECONDS)
         time.sleep(2)
@@ -57,13 +58,13 @@ class BlindChooser:
     def refresh(self):
         def choose():
             self._desktop.run(["xdotool", "mousemove", *self._gear, "click", "1"])
-            time.sleep(0.5)  # in which the menu opens
+            time.sleep(0.5)  # until the menu is open
             self._press(*["Down"] * GEAR_REFRESH, "Return")
 
         self._try(choose, lambda: descriptors(self.process.pid) > self._idle)
 
     def wait(self):
-        """Waits until a search has ended."""
+        """Waits until no search is running."""
         wait_for(lambda: descriptors(self.process.pid) <= self._idle, WAIT_SECONDS,
                  "the search to end")
         time.sleep(0.5)
@@ -73,7 +74,8 @@ class BlindChooser:
 
     @staticmethod
     def _try(act, has_begun):
-        """Acts until a search has begun. A click may come too early, and be lost."""
+        """Calls `act` until a search begins, because a click that comes too early is lost. Raises
+        TimeoutError after several calls."""
         for _ in range(_TRIES):
             act()
             try:

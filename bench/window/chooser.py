@@ -1,4 +1,4 @@
-"""The wizard's chooser on a practice network, as the benchmarks of the window use it."""
+"""Controls the wizard's chooser, the page that lists devices, on a practice network."""
 
 import os
 import pathlib
@@ -17,11 +17,11 @@ PROGRAM = "Onramp OSX.app/Contents/Linux/Onramp OSX"
 MAKER, MODEL = "Kestrel", "Model 100"
 GEAR, GEAR_REFRESH = "Actions", 2
 WAIT_SECONDS = 90  # for a search to end
-BEGIN_SECONDS = 5  # the longest wait to see that a search has begun
+BEGIN_SECONDS = 5  # for a search to begin
 
 
 def require_medium(folder):
-    """Returns the medium's full path. Ends the program with a message when it lacks the wizard."""
+    """Returns the medium's full path. Ends the program if the wizard is not on the medium."""
     medium = pathlib.Path(folder).resolve()
     require([medium / PROGRAM],
             "build it: cmake --preset release && cmake --build --preset release --target medium")
@@ -29,16 +29,16 @@ def require_medium(folder):
 
 
 def enter_network(description="/dev/null"):
-    """Starts this program again on a practice network, unless it already runs on one."""
+    """Runs this program again on a practice network, unless it is already on one."""
     if "ONRAMP_PRACTICE_SOCKET" not in os.environ:
         os.execv(sys.executable, [sys.executable, str(ROOT / "tools/practice-network"),
                                   str(description), sys.executable, *sys.argv])
 
 
 class Chooser(Person):
-    """A person who goes to the wizard's chooser and searches for devices there.
+    """A simulated person who opens the wizard's chooser and searches for devices.
 
-    `text` has the texts of the medium in English.
+    `text` is a dictionary of the medium's English texts.
     """
 
     def __init__(self, desktop, medium, text):
@@ -48,7 +48,7 @@ class Chooser(Person):
         self._key = None
 
     def go_there(self):
-        """Chooses wireless on the first page, which must be that of the connections. Returns when the
+        """Chooses wireless on the first page, which must be the connection page. Returns when the
         first search has ended."""
         self.see("radio button", self._text["INST_TXT_WIFI"])
         self.click("push button", self._text["BTN_NEXT"])
@@ -56,9 +56,8 @@ class Chooser(Person):
         self.wait()
 
     def refresh(self):
-        """Empties the list and starts a search. Returns the time at which the key was pressed.
-
-        Does not wait until the program has got the key.
+        """Chooses the menu item that empties the list and searches again. Returns time.monotonic()
+        at the key press. Does not wait until the wizard has received the key.
         """
         self.open_menu(GEAR)
         self.press(*["Down"] * GEAR_REFRESH)
@@ -70,7 +69,7 @@ class Chooser(Person):
         return self.sees("label", self._text["INST_WAIT"])
 
     def wait(self):
-        """Waits for the end of the search that go_there() or refresh() has just started."""
+        """Waits for the end of the search that go_there() or refresh() has started."""
         if self._key:
             self._key.wait()
             until = time.monotonic() + BEGIN_SECONDS
@@ -83,11 +82,11 @@ class Chooser(Person):
         return self._atspi.CoordType.SCREEN
 
     def table(self):
-        """Returns the accessible table of the devices. Reading its number of rows makes no cells."""
+        """Returns the table of devices. Reading its number of rows does not make Qt create cells."""
         return self.see("tree").get_table_iface()
 
     def names(self):
-        """Returns the names of the listed devices, including those that are out of view."""
+        """Returns the names of all listed devices, including those scrolled out of view."""
         table = self.table()
         names = []
         for row in range(table.get_n_rows()):

@@ -6,15 +6,15 @@ import time
 
 from chooser import MAKER, MODEL
 
-REST = 3          # seconds after which a device that left is in no cache
+REST = 3          # seconds until no cache has a device that left
 STEADY = 4        # wireless devices that never leave
-AT_ONCE = 24      # the most devices, besides the steady ones, that are there at the same time
-_PAUSES = (0.2, 1.0)  # seconds between two changes of the network, at least and at most
+AT_ONCE = 24      # the most devices that are present at once, besides the steady ones
+_PAUSES = (0.2, 1.0)  # the shortest and the longest time between two changes, in seconds
 _BEHAVIOURS = (2, 2, 2, 2, 1, "missing", "text", "closed")
 
 
 class Devices(threading.Thread):
-    """Devices that come and go from start() on, except between rest() and resume()."""
+    """A thread that adds and removes devices, except between rest() and resume()."""
 
     def __init__(self, network, seed):
         super().__init__(daemon=True)
@@ -40,7 +40,8 @@ class Devices(threading.Thread):
             self._failure = error
 
     def rest(self):
-        """Returns once all devices are settled. None comes or goes until resume() is called."""
+        """Stops the changes until resume() is called. Returns when all devices are published and
+        no cache has a device that left."""
         self._allowed.acquire()
         self._network.settle(60)
         time.sleep(REST)
@@ -49,18 +50,18 @@ class Devices(threading.Thread):
         self._allowed.release()
 
     def raise_failure(self):
-        """Raises what stopped the changes, if anything did."""
+        """Raises the exception that ended the thread, if there was one."""
         if self._failure:
             raise self._failure
 
     def wireless(self):
-        """Returns the names of the wireless devices that are there. Call this only between
+        """Returns the names of the wireless devices that are present. Call this only between
         rest() and resume()."""
         return sorted(name for name, answer in self._present.items() if answer == 2)
 
     def bounds(self, moment):
-        """Returns the least and the greatest number of devices that a search may list if it began
-        at the time `moment` and ends now. Call this only while the changes go on."""
+        """Returns the least and the greatest number of devices that a search from `moment` until
+        now may list. Do not call this between rest() and resume()."""
         with self._allowed:
             changed = [name for when, name, _ in self.changes if when >= moment]
             there = sum(answer == 2 for name, answer in self._present.items()
@@ -90,8 +91,8 @@ class Devices(threading.Thread):
         self.changes.append((time.monotonic(), name, change))
 
     def near(self, silence):
-        """Returns a text that names the devices that came or left from a second before `silence`
-        until its end, each with the time since the silence began."""
+        """Returns a text about the devices that came or left during `silence` or in the second
+        before. Each time in the text is relative to the start of the silence."""
         return ", ".join(f"{name} {change} at {when - silence.began:+.2f} s"
                          for when, name, change in self.changes
                          if -1 < when - silence.began < silence.seconds)

@@ -1,4 +1,4 @@
-"""Listens to a program's main loop from a separate process, and records when it was silent."""
+"""Detects silences, the periods in which a program's main loop does not answer requests."""
 
 import dataclasses
 import multiprocessing
@@ -7,17 +7,17 @@ import pathlib
 import time
 
 PERIOD = 0.02  # seconds between two requests
-NOTED = 0.05   # a shorter silence is not recorded
+NOTED = 0.05   # seconds; shorter silences are not recorded
 PATIENCE = 120  # seconds; longer than any silence that is measured
 
 
 @dataclasses.dataclass(frozen=True)
 class Silence:
-    """A time in which the main loop answered no request. Waits for a processor do not count."""
+    """A period in which the main loop did not answer a request."""
 
     began: float      # time.monotonic()
-    seconds: float
-    processor: float  # how much of it the main thread computed, in seconds
+    seconds: float    # excludes waits for a free processor
+    processor: float  # seconds of computing in the main thread
 
     def __str__(self):
         return (f"{self.seconds:.2f} s, of which {self.processor:.2f} s computing and "
@@ -25,13 +25,14 @@ class Silence:
 
 
 class Ear:
-    """A context manager that listens to the program of a Person, who has seen its window."""
+    """A context manager that sends requests to the program of a Person from a separate process.
+    The program's window must already be visible."""
 
     def __init__(self, person):
         context = multiprocessing.get_context("spawn")
         self._heard, writer = context.Pipe(duplex=False)
         self._silences = []
-        # The process gets the bus's address from the environment, where Person has put it.
+        # The process finds the accessibility bus through the environment that Person has set.
         self._process = context.Process(target=_listen, args=(person.process.pid, writer),
                                         daemon=True)
 
@@ -44,7 +45,7 @@ class Ear:
         self._process.join()
 
     def silences(self, since=0):
-        """Returns the silences that ended so far and began after `since`."""
+        """Returns the silences that began at or after `since` and have ended."""
         while self._heard.poll():
             self._silences.append(self._heard.recv())
         if not self._process.is_alive():
@@ -86,7 +87,7 @@ def _application(atspi, process):
 
 
 def _schedule(files):
-    """Returns how long the first thread computed and how long all waited for a processor, in
-    seconds."""
+    """Reads schedstat files. Returns how many seconds the thread of the first file computed, and
+    how many seconds all threads waited for a processor."""
     times = [[int(field) / 1e9 for field in file.read_text().split()[:2]] for file in files]
     return times[0][0], sum(waited for _, waited in times)

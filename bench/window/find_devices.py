@@ -1,11 +1,13 @@
 #!/usr/bin/python3
 """Compares the wizard's search with avahi-browse and snmpget on the same practice network.
 
-The wizard's time is that from the key press that starts a search until the list has all wireless
-devices. The tools' time is the time until avahi-browse has resolved the same devices, plus the time
-of one snmpget for each device. A search ends after its first pause of three seconds if a device is
-listed by then. The networks have several sizes. If a list does not get all devices, this
-size and the larger ones are left out.
+The wizard's time runs from the key press that starts a search until the list has all devices. The
+tools' time is how long avahi-browse takes to resolve the same devices, plus how long snmpget takes
+to ask each of them.
+
+The network grows up to 200 devices. The wizard ends a search after three seconds if the list has a
+device by then, so other devices can be missing. The program stops at the first network size for
+which a list is incomplete.
 """
 
 import os
@@ -26,12 +28,12 @@ from report.cases import Case, Report, parser
 
 COUNTS, QUICK_COUNTS = (1, 10, 50, 100, 200), (1, 50, 100)
 ROUNDS, QUICK_ROUNDS = 9, 5
-PATIENCE = 10  # seconds; a search that finds anything ends earlier
+PATIENCE = 10  # seconds; a search that finds a device within nine seconds ends earlier
 TYPE = "_pdl-datastream._tcp"
 
 
 def time_of_tools(count):
-    """Returns the seconds until avahi-browse has resolved `count` devices and snmpget has asked
+    """Returns how many seconds avahi-browse takes to resolve `count` devices, and snmpget to ask
     each of them."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
@@ -52,10 +54,8 @@ def time_of_tools(count):
 
 
 def time_of_wizard(person, count):
-    """Returns the time from a refresh, which empties the list, until the list has `count` rows.
-
-    Returns None if the list has fewer rows PATIENCE seconds after the refresh.
-    """
+    """Refreshes the list, which empties it. Returns the seconds until the list has `count` rows, or
+    None if it has fewer after PATIENCE seconds."""
     table = person.table()
     began = person.refresh()
     emptied = False
@@ -63,14 +63,14 @@ def time_of_wizard(person, count):
         emptied = emptied or table.get_n_rows() < count
         if time.monotonic() - began > PATIENCE:
             return None
-        time.sleep(0.002)  # each look takes some of the wizard's time
+        time.sleep(0.002)  # each request takes some of the wizard's time
     passed = time.monotonic() - began
     person.wait()
     return passed
 
 
 def rounds(desktop, medium, text, count, number):
-    """Returns the times of the wizard and of the tools, or None if a search was incomplete."""
+    """Returns the times of the wizard and of the tools, or None if a list was incomplete."""
     times = [], []
     with Chooser(desktop, medium, text) as person:
         person.go_there()

@@ -1,5 +1,5 @@
 #!/usr/bin/python3
-"""Tries the wizard on large media, on large networks, and beside a device that swallows questions.
+"""Tries the wizard on large media, on large networks, and with a device that never answers.
 
 Usage: large.py [--medium MEDIUM] [devices] [models] [silent]
 
@@ -7,10 +7,11 @@ MEDIUM is a built medium (default: build/medium of this source tree).
 
 devices  1,000 models and 500 devices
 models   10,000 models: the list of models, and then a search with 50 devices
-silent   a device that receives questions and answers none; by design, the window waits for it
+silent   a device that never answers SNMP questions; by design, the window waits for it
 
-For each, the program prints whether the list is as it must be, the times, the longest silence of
-the main loop, and the peak of the memory. It exits with status 1 if a list is wrong.
+For each trial, the program prints whether the lists are right, the times and the peak memory. It
+also prints the longest silence, a period in which the main loop did not answer requests. The exit
+status is 1 if a list is wrong.
 """
 
 import argparse
@@ -30,11 +31,11 @@ from onscreen.processes import wait_for
 from practice_network import PracticeNetwork
 
 SEARCHES = 3
-LOOKS_AT_ALL = 25  # one look in so many is at the whole window, the others only at the list
+LOOKS_AT_ALL = 25  # one look in so many reads the whole window; the others read only the list
 
 
 class Trial:
-    """A medium with `models` models on a desktop, and the devices that the trial adds."""
+    """A medium with `models` models, and devices that add() puts on the network."""
 
     def __init__(self, desktop, built, folder, models, last_differs=False):
         self._desktop, self._text = desktop, messages.read(built, "en")
@@ -60,9 +61,11 @@ class Trial:
             self._network.remove(name)
 
     def search(self, what):
-        """Searches a few times. Returns whether every list had only devices that belong there, each
-        once. Lists may be incomplete, because a search ends three seconds after its start if a
-        device is listed."""
+        """Searches a few times. Returns whether every list had only expected devices, each once.
+
+        A list may be incomplete: the wizard ends a search after three seconds if the list has a
+        device by then.
+        """
         expected = sorted(name for name, answer in self._devices.items() if answer == 2)
         right = True
         with self.person() as person:
@@ -77,13 +80,13 @@ class Trial:
                     right &= len(set(listed)) == len(listed) and set(listed) <= set(expected)
                     report(what, f"{len(listed)} of {len(expected)} listed after {complete:.2f} s",
                            person, ear, began)
-        print(f"{what}: the lists are {'as they must be' if right else 'WRONG'}", flush=True)
+        print(f"{what}: the lists are {'right' if right else 'WRONG'}", flush=True)
         return right
 
 
 def _seconds_until_listed(person, table, count, began):
-    """Waits until the list, which is emptied first, has `count` rows or the search is over. Returns
-    the time from `began` to the last change of the list that was seen."""
+    """Waits until the list has been emptied and then has `count` rows, or the search has ended.
+    Returns the seconds from `began` to the last change of the list that a look showed."""
     emptied = False
     last, changed = table.get_n_rows(), began
     for look in itertools.count():
@@ -92,20 +95,20 @@ def _seconds_until_listed(person, table, count, began):
         rows = table.get_n_rows()
         if rows != last or searching and not emptied:
             changed = time.monotonic()
-        # A list that is filled again at once is not seen empty.
+        # A list can be filled again before a look shows that it was empty.
         emptied = emptied or searching or rows < last or rows == 0
         last = rows
         if emptied and (rows == count or looks_at_all and not searching):
             return changed - began
         if time.monotonic() - began > WAIT_SECONDS:
             raise TimeoutError("the search did not end")
-        time.sleep(0.02)  # each look takes some of the wizard's time
+        time.sleep(0.02)  # each request takes some of the wizard's time
 
 
 def report(what, figures, person, ear, since=0):
     status = pathlib.Path(f"/proc/{person.process.pid}/status").read_text()
     peak = int(status.split("VmHWM:")[1].split()[0]) / 1024
-    time.sleep(0.3)  # in which a silence that lasts until now is heard
+    time.sleep(0.3)  # until the Ear has recorded a silence that has just ended
     silence = ear.longest(since)
     print(f"{what}: {figures}; longest silence {silence or 'less than 0.05 s'}; "
           f"peak memory {peak:.1f} MiB", flush=True)
@@ -150,7 +153,7 @@ def try_silent(desktop, built, folder):
     trial.add("Answers", 1)
     trial.add("Swallows", 2, "silent")
     trial.settle()
-    right = trial.search("2 devices, one of which swallows questions")
+    right = trial.search("2 devices, one of which never answers")
     trial.remove_all()
     return right
 

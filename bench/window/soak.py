@@ -5,15 +5,21 @@ Usage: soak.py [--seconds 3600] [--seed 1] [--memory] [MEDIUM]
 
 MEDIUM is a built medium (default: build/medium of this source tree).
 
-After every search, the list must have at least as many rows as wireless devices were there all the
-time, and at most one row more for each device that came or went. At every checkpoint, the network
-rests, and one of up to three searches must list exactly the wireless devices that are there. None
-of these searches may list another device. The program prints the wizard's memory at each
-checkpoint, the growth of this memory, and the longest silences of the wizard's main loop. It exits
-with status 1 if a list was wrong.
+After every search, the program counts the rows of the list. The list must have a row for each
+wireless device that was present all the time. It may have another row for each device that came or
+left.
 
-With --memory, nothing looks at the lists or listens to the main loop. Only then is the memory that
-of the wizard alone: while an assistive program may listen, Qt never frees what it makes for a cell.
+At every checkpoint, no device comes or goes while the wizard searches up to three times. One of
+these searches must list exactly the wireless devices that are present, and none may list any other
+device.
+
+The program prints the wizard's memory at each checkpoint, and how the memory grew. It also prints
+the longest silences, the periods in which the main loop did not answer requests. The exit status is 1
+if a list was wrong.
+
+With --memory, the program checks no list and measures no silence, because both need the
+accessibility bus. With that bus, Qt creates objects for cells and never frees them, so the memory
+grows.
 """
 
 import argparse
@@ -34,7 +40,7 @@ from practice_network import PracticeNetwork
 
 CHECKPOINT_EVERY = 10  # searches
 SEARCHES_AT_CHECKPOINT = 3  # at most
-WARM_UP = 0.1          # the growth leaves out this part of the time, at the start
+WARM_UP = 0.1          # the growth leaves out this first part of the run
 
 
 def memory(process):
@@ -53,7 +59,7 @@ def slope(points):
 
 
 class Record:
-    """The wizard's memory in the course of time."""
+    """The wizard's memory over time."""
 
     def __init__(self, person, devices):
         self._person, self._devices = person, devices
@@ -65,7 +71,7 @@ class Record:
         return time.monotonic() - self.began
 
     def checkpoint(self, *more):
-        """Notes the memory and prints a line that ends with `more`."""
+        """Records the memory, and prints a line that ends with `more`."""
         kibibytes, descriptors, threads = memory(self._person.process.pid)
         self._memory.append((self.seconds(), self.searches, kibibytes))
         print(f"{self.seconds():6.0f} s", f"{self.searches:4} searches",
@@ -91,7 +97,7 @@ class Soak:
         self._checkpoints = self._incomplete = self.wrong = 0
 
     def search(self):
-        """Searches while devices come and go, and compares the number of rows with the bounds."""
+        """Searches while devices come and go, and checks the number of rows in the list."""
         moment = time.monotonic() - REST
         self._person.refresh()
         self._person.wait()
@@ -102,10 +108,11 @@ class Soak:
             self._complain(f"{count} devices are listed, not {least} to {most}")
 
     def check(self):
-        """Searches while the network rests, and compares the list with what is there.
+        """Searches while no device comes or goes, and compares the list with the devices present.
 
-        A search ends three seconds after its start if a device is listed. On a busy machine, other
-        devices may then be missing. So an incomplete list is counted, and the search is repeated.
+        The wizard ends a search after three seconds if the list has a device by then. On a busy
+        machine, other devices may be missing. So an incomplete list is counted, and the search is
+        repeated.
         """
         self._devices.rest()
         try:
@@ -143,7 +150,7 @@ class Soak:
 
 
 def soak(desktop, medium, text, devices, seconds):
-    """Returns whether all lists were right."""
+    """Searches for `seconds` and returns whether all lists were right."""
     with Chooser(desktop, medium, text) as person:
         person.go_there()
         with Ear(person) as ear:

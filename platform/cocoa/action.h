@@ -4,8 +4,7 @@
 
 #include <functional>
 
-/// Holds a function, which perform: calls. So an object of this class can be the target of a
-/// button, a menu item or a timer.
+/// Holds a function that a button, a menu item or a timer calls through perform:.
 @interface OnrampAction : NSObject {
   std::function<void()> _function;
 }

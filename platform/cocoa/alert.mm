@@ -7,8 +7,8 @@
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
-/// The delegate of one sheet. When the sheet ends, translates the sheet's return code, calls the
-/// function with the result and releases itself.
+/// The delegate of one sheet. When the sheet ends, calls the function with kAlertOtherReturn or
+/// kAlertDefaultReturn, and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }

@@ -7,8 +7,8 @@
 #import "platform/cocoa/retained.h"
 #include "platform/termination.h"
 
-/// The delegate of the application and of its window. Passes most of their events and questions to
-/// the controller.
+/// The AppKit delegate of the application and of its window. Passes most of their events and
+/// questions to an onramp::ApplicationDelegate.
 @interface OnrampDelegate : NSObject <NSApplicationDelegate, NSWindowDelegate> {
   onramp::ApplicationDelegate* _delegate;
   onramp::Window _window;
@@ -40,8 +40,7 @@
   return _delegate->applicationShouldTerminateAfterLastWindowClosed();
 }
 
-// Lets the user quit only if the controller lets the window close. Does not ask the controller
-// after a call of terminateApplication().
+// Lets the user quit only if the window may close. Always quits after terminateApplication().
 - (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
   if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
   NSBeep();
@@ -66,7 +65,7 @@ namespace onramp {
 
 using cocoa::Retained;
 
-// This function ignores the arguments, because AppKit reads them from the process.
+// Ignores the arguments, because AppKit reads them from the process.
 int runApplication(int, char**, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate) {
   @autoreleasepool {

@@ -29,8 +29,8 @@ bool isContainer(NSView* view) {
   return ![view isKindOfClass:[NSControl class]] && ![view isKindOfClass:[NSScrollView class]];
 }
 
-// Moves or resizes `view`, and has the view that contains it drawn again. Does nothing if `view`
-// already has this frame.
+// Moves or resizes `view`, and redraws its superview. Does nothing if `view` already has this
+// frame.
 void setFrame(NSView* view, NSRect frame) {
   if (NSEqualRects(frame, [view frame])) return;
   [view setFrame:frame];
@@ -42,8 +42,8 @@ class ButtonRow {
  public:
   explicit ButtonRow(NSView* content) : content_(content) {}
 
-  /// Returns the width that the content view lacks for the visible buttons. The result is negative
-  /// if the content view is wider than necessary.
+  /// Returns how much wider the content view must be for the visible buttons. The result is
+  /// negative if it is wider than necessary.
   [[nodiscard]] CGFloat missingWidth() const {
     CGFloat needed = leftEdge() + NSWidth([content_ bounds]) - rightEdge();
     CGFloat gap = 0;
@@ -55,8 +55,8 @@ class ButtonRow {
     return needed - NSWidth([content_ bounds]);
   }
 
-  /// Places the visible buttons side by side, some from the left edge and the others from the right
-  /// edge.
+  /// Places the visible buttons side by side. Buttons that are attached to the right edge start
+  /// there, and the others start at the left edge.
   void layOut() const {
     CGFloat left = leftEdge();
     CGFloat right = rightEdge();
@@ -91,7 +91,7 @@ class ButtonRow {
     setFrame(button, frame);
   }
 
-  // The row's edges are those of its outermost buttons, even if these buttons are hidden.
+  // The outermost buttons mark the edges of the row, even if they are hidden.
   [[nodiscard]] CGFloat leftEdge() const {
     CGFloat edge = NSWidth([content_ bounds]);
     for (NSView* view in [content_ subviews]) {
@@ -111,7 +111,7 @@ class ButtonRow {
   NSView* content_;
 };
 
-// Returns the width that the cells of `matrix` need. The cells are in one column.
+// Returns the width that `matrix`, which has one column, needs for its cells.
 CGFloat neededWidth(NSMatrix* matrix) {
   CGFloat width = 0;
   for (NSCell* cell in [matrix cells])
@@ -127,8 +127,8 @@ CGFloat neededWidth(NSTableView* list) {
   return width;
 }
 
-// Returns the greatest width that a list or a radio matrix in `view` lacks. If `view` itself is the
-// list or the matrix, the result can be negative.
+// Returns how much wider `view` must be to fit every list and radio matrix in it. The result can be
+// negative if `view` itself is a list or a matrix.
 CGFloat missingWidth(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {
     return neededWidth(static_cast<NSMatrix*>(view)) - NSWidth([view frame]);
@@ -145,8 +145,8 @@ CGFloat missingWidth(NSView* view) {
   return missing;
 }
 
-// Makes the cells of each matrix as wide as the matrix. The cells do not grow with the matrix,
-// because then their height would change, too.
+// Makes the cells of each matrix as wide as the matrix. The interface files do not let AppKit
+// resize the cells, because AppKit would also change their height.
 void widenCells(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {
     NSMatrix* const matrix = static_cast<NSMatrix*>(view);
@@ -158,7 +158,7 @@ void widenCells(NSView* view) {
   }
 }
 
-// Returns the height that a view lacks if it is a text field, and 0 otherwise.
+// Returns how much taller a text field must be to show its text, or 0 for any other view.
 CGFloat missingHeight(NSView* view) {
   if (![view isKindOfClass:[NSTextField class]]) return 0;
   const NSRect bounds = NSMakeRect(0, 0, NSWidth([view frame]), kUnlimited);
@@ -175,7 +175,7 @@ CGFloat leastHeight(NSView* view) {
   return static_cast<CGFloat>(rows) * ([list rowHeight] + [list intercellSpacing].height);
 }
 
-// Returns by how much the text fields in `parent` can grow before `parent` itself must grow.
+// Returns how much taller the text fields in `parent` can get before `parent` must get taller, too.
 CGFloat spareHeight(NSView* parent) {
   CGFloat lowestOnTop = NSHeight([parent bounds]);
   CGFloat highestOnBottom = 0;
@@ -190,7 +190,7 @@ CGFloat spareHeight(NSView* parent) {
   return lowestOnTop - highestOnBottom - kLeastGap;
 }
 
-// Returns by how much `view` must grow for the text fields inside it.
+// Returns how much taller `view` must be for the text fields inside it.
 CGFloat missingHeightInside(NSView* view) {
   if (!isContainer(view)) return 0;
   CGFloat missingHere = 0;
@@ -202,7 +202,7 @@ CGFloat missingHeightInside(NSView* view) {
   return missingHere > 0 ? std::max(missing, missingHere - spareHeight(view)) : missing;
 }
 
-// Makes a text field taller by `height`, and makes room for it among the other views in `parent`.
+// Makes a text field taller by `height`, and moves or shortens the other views in `parent`.
 void grow(NSView* field, CGFloat height, NSView* parent) {
   const NSRect old = [field frame];
   const bool isOnTop = hangsOnTop(field);
@@ -227,8 +227,8 @@ void growFields(NSView* view) {
   }
 }
 
-// Returns the place nearest to `start` where a stretch of `length` can begin, so that it lies
-// between `least` and `greatest`. Returns `least` if there is no such place.
+// Returns where a line of `length` must start to lie between `least` and `greatest`, as near as
+// possible to `start`. Returns `least` if the line is too long.
 CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat length) {
   return std::max(least, std::min(std::floor(start), greatest - length));
 }
@@ -250,7 +250,7 @@ void enlarge(NSWindow* window, CGFloat width, CGFloat height) {
 
 }  // namespace
 
-// The height of wrapped texts depends on the width, so the width is settled first.
+// Sets the width first, because the height of wrapped texts depends on it.
 void fitWindow(NSWindow* window) {
   NSView* const content = [window contentView];
   if (!content) return;

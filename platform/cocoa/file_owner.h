@@ -4,8 +4,8 @@
 
 #include "platform/interface_file.h"
 
-/// Represents an InterfaceOwner to AppKit, which accepts only an Objective-C object as the owner of
-/// an interface file. If the file binds a control to a key of this object, the control shows the
+/// Represents an InterfaceOwner in AppKit, where the owner of an interface file must be an
+/// Objective-C object. If the file binds a control to a key of this object, the control shows the
 /// InterfaceOwner's text under that key.
 @interface OnrampFileOwner : NSObject {
   onramp::InterfaceOwner* _owner;
@@ -16,10 +16,9 @@
 /// `owner` must outlive this object.
 - (instancetype)initWithOwner:(onramp::InterfaceOwner&)owner;
 
-/// Returns the window that the file connects to the outlet "window", or nil when the file connects
-/// none.
+/// Returns the window that the file connects to the outlet "window", or nil if it connects none.
 - (NSWindow*)window;
-/// AppKit calls this function when it loads a file that connects the outlet.
+/// AppKit calls this function when it loads a file that connects the outlet "window".
 - (void)setWindow:(NSWindow*)window;
 
 @end

@@ -29,9 +29,9 @@
   _window = window;
 }
 
-// A binding calls this function for the current text under its key. The first call for a key also
-// makes this object report every later change of that text, and each binding to the key then calls
-// this function again.
+// A binding calls this function to get the text under its key. After the first call for a key, this
+// object reports every change of the text, and each binding to the key then calls this function
+// again.
 - (id)valueForUndefinedKey:(NSString*)key {
   const std::string name = onramp::cocoa::toStdString(key);
   if (![_boundKeys containsObject:key]) {

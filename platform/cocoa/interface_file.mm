@@ -89,8 +89,8 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// Makes a click on a button perform the owner's action. The interface file sends these actions to
-// the first responder, so a loaded button with such an action has no target.
+// Makes each button perform its action on `owner`. These buttons have no target yet, because the
+// interface file sends their actions to the first responder.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {
@@ -109,8 +109,8 @@ void connectActions(NSView* view, InterfaceOwner& owner,
     connectActions(subview, owner, actions);
 }
 
-// Returns the file's top-level objects, or nil when the file is missing or damaged. AppKit reports
-// a failure with an exception or with the result NO.
+// Returns the file's top-level objects, or nil if the file is missing or damaged. AppKit reports a
+// failure with an exception or with the result NO.
 NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
   NSArray* topLevelObjects = nil;
   @try {

@@ -1,7 +1,7 @@
-// Makes macOS ask for access to the local network while the user reads the first page. Since macOS
-// 15, a program needs the user's consent to this access, and the system asks for the consent when
-// the program first uses the local network. Without this file, the wizard would first use the local
-// network in the device search, which might end before the user has answered.
+// Makes macOS ask the user for access to the local network while the first page is shown. Since
+// macOS 15, the system asks for this consent when a program first uses the local network. Without
+// this file, the device search would be the first use, and it might end before the user has
+// answered.
 
 #import <AppKit/AppKit.h>
 

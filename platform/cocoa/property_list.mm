@@ -30,8 +30,8 @@ class Reader {
   }
 
  private:
-  // Only two Boolean objects exist, so comparing pointers recognises a Boolean. The C type of any
-  // other object tells whether the number is real.
+  // Only two Boolean objects exist, so comparing pointers recognises a Boolean. For any other
+  // number, the C type tells whether it is real.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);
@@ -45,9 +45,10 @@ class Reader {
     return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
   }
 
-  // Several containers may share one string or data object, but each value gets a copy. So the
-  // total size of the copies has the same limit as the size of a file. Each UTF-16 unit of a string
-  // counts as one byte. Returns false when the limit is exceeded.
+  // Adds `bytes` to the total size of the copied strings and data. This size can exceed the size of
+  // the file, because containers can share an object but each value gets a copy. So the copies have
+  // the same limit as a file. Each UTF-16 unit of a string counts as one byte. Returns false if the
+  // limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;
     if (bytes_ > kMostPropertyListBytes) isExceeded_ = true;
@@ -121,9 +122,9 @@ struct ToPropertyList {
   }
 };
 
-// Returns the bytes of the file at `path`. Returns nil when the file is not a regular file, exceeds
-// the size limit or cannot be read. Links are resolved first, because attributesOfItemAtPath: does
-// not follow them.
+// Returns the bytes of the file at `path`, or nil if the file is not a regular file, exceeds the
+// size limit or cannot be read. Resolves links first, because attributesOfItemAtPath: does not
+// follow them.
 NSData* contents(NSString* path) {
   NSString* const file = [path stringByResolvingSymlinksInPath];
   NSDictionary* const attributes = [[NSFileManager defaultManager] attributesOfItemAtPath:file

@@ -31,7 +31,7 @@ class Retained {
   }
   ~Retained() { [object_ release]; }
 
-  /// Returns the object, or nil when there is none. The caller does not own the result.
+  /// Returns the object, or nil if there is none. The caller does not own the result.
   [[nodiscard]] Class* get() const { return object_; }
 
  private:

@@ -25,14 +25,14 @@ NSArray* allModes() {
 int modalLoops = 0;
 bool isModalAborted = false;
 
-// True from abortModal() until the modal loop has returned or the main thread has found that no
-// loop is running. During this time, a modal loop holds posted actions back, because each of them
-// can occupy the main thread for seconds and so delay the return.
+// True from abortModal() until the modal loop has returned, or until the main thread has found that
+// no loop is running. Meanwhile, posted actions wait for the end of the loop, because each of them
+// could block the main thread for seconds.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while
-// `action` runs a modal loop. The object destroys `action` on the thread that ran it, because any
-// thread may release the object.
+// `action` runs a modal loop. Destroys `action` right after running it, on the same thread, because
+// any thread may release the object.
 OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();
@@ -48,9 +48,8 @@ void post(std::function<void()> action) {
   }
 }
 
-// Drops the clicks and keys that arrived while the main thread was busy. They were meant for the
-// page that was on the screen at that time. No timer or posted action runs in the loop mode used
-// here.
+// Drops the clicks and keys that arrived while the main thread was busy, because the user meant
+// them for the page that was shown then. No timer or posted action runs in the loop mode used here.
 void dropWaitingInput() {
   const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
                            NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;
@@ -97,18 +96,17 @@ void performOnMainThread(std::function<void()> action) {
   });
 }
 
-// AppKit can also end its loop without a call of abortModal(), for example when the user presses a
-// key that cancels. This function then starts the loop again.
+// Starts AppKit's loop again if it ends without a call of abortModal(), for example because the
+// user has pressed a key that cancels.
 void runModalForWindow(const Window& window) {
   // The loop counts as running before the window is shown, because showing the window may run a
-  // posted action, and that action may call abortModal().
+  // posted action that calls abortModal().
   ++modalLoops;
   // AppKit does not show windows of a hidden application.
   if ([NSApp isHidden]) unhideApplication();
   window.makeKeyAndOrderFront();
   NSWindow* const modal = cocoa::nativeOf<NSWindow>(window);
-  // The close button is disabled, because the controller refuses to close the window while the loop
-  // runs.
+  // The close button is disabled, because the window must not close while the loop runs.
   NSButton* const closeButton = [modal standardWindowButton:NSWindowCloseButton];
   [closeButton setEnabled:NO];
   while (modal && !isModalAborted)

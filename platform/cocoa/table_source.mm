@@ -12,7 +12,7 @@ namespace {
 constexpr CGFloat kCellPadding = 6;  // points
 constexpr NSUInteger kLeastNameLetters = 24;
 
-// Returns the enabled, visible button in `view` that the Return key presses, or nil when there is
+// Returns the enabled, visible button in `view` that the Return key presses, or nil if there is
 // none.
 NSButton* defaultButton(NSView* view) {
   if ([view isKindOfClass:[NSButton class]] && ![view isHidden]) {
@@ -91,10 +91,9 @@ CGFloat leastNameWidth(NSCell* cell) {
   [self showSelection];
 }
 
-// Makes every column except the first one at least as wide as its texts. The first column shows the
-// names. It becomes narrower if necessary, but always has room for its title and for 24 letters. If
-// the table is too narrow even then, makes the window wider. Does nothing when there is only one
-// column.
+// Makes every column except the first one at least as wide as its texts. The first column shows
+// names. It gets narrower if necessary, but keeps room for its title and for 24 letters. If the
+// table is still too narrow, makes the window wider. Does nothing if there is only one column.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -159,9 +158,8 @@ CGFloat leastNameWidth(NSCell* cell) {
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// Returns the first row from `startRow` on with a name in which a word starts with `typed`. After
-// the last row, the search continues with row 0. Returns -1 when no row up to and including
-// `endRow` matches.
+// Returns the first row, from `startRow` to `endRow`, whose name has a word that starts with
+// `typed`. After the last row of the table, continues at row 0. Returns -1 if no row matches.
 - (NSInteger)tableView:(NSTableView*)table
     nextTypeSelectMatchFromRow:(NSInteger)startRow
                          toRow:(NSInteger)endRow
@@ -177,7 +175,7 @@ CGFloat leastNameWidth(NSCell* cell) {
   return -1;
 }
 
-// Passes the user's selection to the controller. If the user deselects the row, selects the row
+// Passes the user's selection to the controller. If the user has deselected the row, selects it
 // again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;

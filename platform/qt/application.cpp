@@ -40,7 +40,7 @@ std::vector<QPointer<QWidget>>& hiddenWindows() {
   return windows;
 }
 
-// Reads the options. Ends the process after --help and --version, and with an error message when an
+// Reads the options. Ends the process after --help or --version, or with an error message if an
 // option is invalid.
 void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
@@ -79,9 +79,9 @@ bool asksForInformation(int argc, char** argv) {
   });
 }
 
-// On a fatal message, which Qt sends when there is no display, reports the missing display and ends
-// the process. Qt itself would abort the process. Drops all other messages unless QT_DEBUG_PLUGINS
-// is set.
+// Handles Qt's messages while the application object is created. Qt sends a fatal message if there
+// is no display, and would then abort the process. This function prints an error and exits instead.
+// Drops all other messages unless QT_DEBUG_PLUGINS is set.
 void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
   if (type == QtFatalMsg) {
     std::fprintf(stderr,
@@ -93,7 +93,7 @@ void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString
   if (isVerbose) std::fprintf(stderr, "%s\n", qPrintable(message));
 }
 
-// Creates the application object. Ends the process with a message when there is no display.
+// Creates the application object. Ends the process with a message if there is no display.
 std::unique_ptr<QApplication> makeApplication(int& argc, char** argv) {
   const QtMessageHandler usual = qInstallMessageHandler(exitWithoutDisplay);
   auto application = std::make_unique<QApplication>(argc, argv);

@@ -4,13 +4,12 @@ class QWidget;
 
 namespace onramp::qt {
 
-/// Gives the keyboard focus to the first list on the page. If the page has no list, gives the focus
-/// to the first control. The tab order decides which is first. Hidden and disabled controls, and
-/// controls that the Tab key does not reach, do not count. Leaves the focus as it is if the page
-/// has no control that counts.
+/// Gives the keyboard focus to the first list on the page or, if the page has no list, to the first
+/// control in the tab order. Ignores controls that are hidden, are disabled, or cannot be reached
+/// with the Tab key. Does nothing if no control remains.
 void focusFirstControl(QWidget& page);
 
-/// Calls focusFirstControl() for the page that `window` shows, if there is one.
+/// Calls focusFirstControl() for the page that `window` shows, if it shows one.
 void focusPage(const QWidget& window);
 
 }  // namespace onramp::qt

@@ -23,7 +23,7 @@ class ImageViewWidget final : public QWidget {
 
  private:
   /// Returns whether the image must not be drawn. A stretched image is a background for dark text.
-  /// In a dark colour scheme the text is light and could not be read on the image.
+  /// In a dark colour scheme, the text is light and would be unreadable on the image.
   [[nodiscard]] bool isOutOfPlace() const;
 
   /// Returns the rectangle in this view in which the image is drawn.

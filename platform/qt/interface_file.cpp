@@ -32,15 +32,15 @@ QString textOf(std::string_view text) {
   return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-// Creates the widgets of an interface file, including those that this front end defines. For an
-// unknown class it creates a plain widget and stores the name of the class in a property, because
-// an interface file gives a page's root the class of the page.
+// Creates the widgets of an interface file, including those that this front end defines. In the
+// file, the root widget of a page has the page's class, which is not a widget class. For such a
+// class, creates a plain widget and stores the name of the class in the property kViewClass.
 class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;
 
-  /// Returns the application's only loader. There is only one, because creating a loader takes as
-  /// long as loading a file.
+  /// Returns the loader that all interface files share. Creating a loader takes as long as loading
+  /// a file.
   static Loader& shared() {
     static Loader* const loader = makeWithoutPlugIns();
     return *loader;
@@ -69,8 +69,9 @@ class Loader final : public QUiLoader {
   }
 
  private:
-  // Creates the loader while Qt has no library paths to search. QUiLoader's constructor would
-  // otherwise load every Designer plug-in that it finds, together with many libraries of Qt.
+  // Creates the loader while Qt's list of library paths is empty. Otherwise, QUiLoader's
+  // constructor would load every Designer plug-in in these paths, and with them many libraries of
+  // Qt.
   static Loader* makeWithoutPlugIns() {
     const QStringList paths = QCoreApplication::libraryPaths();
     QCoreApplication::setLibraryPaths({});
@@ -108,7 +109,7 @@ void localize(QWidget& root, const std::string& interfaceName) {
   }
 }
 
-// The property "titleBinding" names the owner's text that a button or window shows.
+// Makes a button or window show the owner's text that its property "titleBinding" names.
 void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   const QString key = widget->property("titleBinding").toString();
   if (key.isEmpty()) return;
@@ -121,7 +122,7 @@ void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   });
 }
 
-// The property "action" names the owner's action that a click performs.
+// Makes a click on a button perform the owner's action that its property "action" names.
 void connectAction(QWidget* widget, InterfaceOwner& owner) {
   auto* const button = qobject_cast<QAbstractButton*>(widget);
   const std::string action = widget->property("action").toString().toStdString();
@@ -160,8 +161,8 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 
 }  // namespace
 
-// Owns the root widget, unless the widget's parent has already destroyed the widget. While a page
-// is shown, its root is a child of the window, and the window can be destroyed before the page.
+// Owns the root widget. While a page is shown, its root widget is also a child of the window. If
+// the window is destroyed before the page, it destroys the root widget, and `root` becomes null.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

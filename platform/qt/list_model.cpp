@@ -12,9 +12,9 @@ namespace onramp::qt {
 
 namespace {
 
-// Returns the tool tip, which shows `text` in full even when its column is too narrow. Escapes a
-// text that looks like markup. Otherwise Qt would show the text as rich text, and a device could
-// have a name that loads pictures.
+// Returns a tool tip that shows `text`, which may be too long for its column. Escapes a text that
+// looks like markup. Otherwise, Qt would show it as rich text, and the name of a device could make
+// Qt load pictures.
 QString toolTip(const QString& text) {
   return Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text) : text;
 }

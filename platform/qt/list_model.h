@@ -15,7 +15,7 @@ class ListModel final : public QAbstractTableModel {
   Q_OBJECT
 
  public:
-  /// Assistive programs name a row by its texts in `spokenColumns`.
+  /// Assistive programs read out the texts in `spokenColumns` as the name of a row.
   ListModel(QStringList columns, QStringList spokenColumns, QObject* parent);
 
   /// Returns the height of a row, including some space around its text.
@@ -27,7 +27,7 @@ class ListModel final : public QAbstractTableModel {
   /// Call this when the controller's entries have changed.
   void reload();
 
-  /// Sets the title of a column. Does nothing when there is no such column.
+  /// Sets the title of the column `identifier`. Does nothing if there is no such column.
   void setHeader(const QString& identifier, const QString& title);
 
   [[nodiscard]] int rowCount(const QModelIndex& parent = {}) const override;
@@ -37,7 +37,7 @@ class ListModel final : public QAbstractTableModel {
                                     int role) const override;
 
  private:
-  /// Returns an empty text when the controller has no such entry or the entry has no such text.
+  /// Returns an empty text if the controller has no such entry or the entry has no such text.
   [[nodiscard]] QString text(int row, const QString& column) const;
 
   [[nodiscard]] QString spokenName(int row) const;

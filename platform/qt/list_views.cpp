@@ -16,8 +16,8 @@ namespace {
 constexpr int kLeastRows = 6;
 constexpr int kLeastNameLetters = 24;
 
-// An adjustment measures every row. Without pauses, a search that finds hundreds of devices would
-// spend a third of its time on adjustments.
+// Adjusting the column widths measures every row. Without these pauses, a search that finds
+// hundreds of devices would spend a third of its time on adjustments.
 constexpr std::chrono::milliseconds kPauseBetweenAdjustments{50};
 
 }  // namespace
@@ -88,7 +88,7 @@ void ColumnsWidget::resizeEvent(QResizeEvent* event) {
   adjustWidths();
 }
 
-// The user may make the first column too narrow for its texts, but not the others.
+// The user may make only the first column too narrow for its texts.
 void ColumnsWidget::sectionResized(int column, int width) {
   if (QGuiApplication::mouseButtons() == Qt::NoButton) return;
   isUsersLayout_ = true;

@@ -8,15 +8,14 @@
 
 namespace onramp::qt {
 
-/// Returns the minimum height of a list without its frame and header. This height is enough for
-/// several rows.
+/// Returns the minimum height of the rows of a list, without its frame and header.
 [[nodiscard]] int leastListHeight();
 
 /// Returns the minimum width of a column of names.
 [[nodiscard]] int leastNameWidth();
 
-/// A view that is redrawn as a whole, including its frame, when it gets or loses the focus. Qt's
-/// own views redraw only their rows.
+/// A view that also redraws its frame when it gets or loses the focus, because the frame shows the
+/// focus. Qt's own views redraw only their rows.
 template <typename View>
 class FramedView : public View {
  public:
@@ -56,9 +55,9 @@ class ColumnsWidget final : public FramedView<QTreeView> {
  public:
   explicit ColumnsWidget(QWidget* parent = nullptr);
 
-  /// Call this after every change of the contents or of a header. Adjusts the widths at once,
-  /// unless a call has done so a moment ago. All calls within that moment share one adjustment at
-  /// its end.
+  /// Call this after every change of the contents or of a header. Adjusts the column widths at
+  /// once, or after a short pause if the last adjustment was only a moment ago. All calls during
+  /// the pause share one adjustment.
   void fitColumns();
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }
@@ -77,7 +76,7 @@ class ColumnsWidget final : public FramedView<QTreeView> {
   void adjustWidths();
   void sectionResized(int column, int width);
 
-  QTimer pause_;  ///< active for a moment after an adjustment
+  QTimer pause_;  ///< active for a short time after an adjustment
   bool isAdjustmentDue_ = false;
   TypeAhead typeAhead_;
   bool isUsersLayout_ = false;

@@ -20,7 +20,7 @@ std::string information(const std::string& key) {
   return Bundle::main().infoString(key).value_or("");
 }
 
-// The panel runs no nested event loop, so that a search can continue and end while the panel is
+// The panel runs no nested event loop, so that a search for devices can end while the panel is
 // open.
 void showAboutPanel(QWidget* window, const QString& title) {
   const std::string version = Bundle::main().localizedString("Version %@", "Version %@", "About");
@@ -57,8 +57,7 @@ void connectStandardMenuItems(QWidget* window) {
       QObject::connect(item, &QAction::triggered, window,
                        [window, item] { showAboutPanel(window, item->text()); });
     } else if (action == QLatin1String("hide:")) {
-      // Minimises the window instead, because a desktop can bring back a minimised window but not a
-      // hidden program.
+      // A desktop can restore a minimised window but not a hidden program.
       QObject::connect(item, &QAction::triggered, window, [window] { window->showMinimized(); });
     } else if (action == QLatin1String("unhideAllApplications:")) {
       QObject::connect(item, &QAction::triggered, window, [window] { window->showNormal(); });
@@ -74,7 +73,7 @@ void connectStandardMenuItems(QWidget* window) {
 
 using qt::nativeOf;
 
-// A Menu refers to a QMenuBar or a QMenu. A MenuItem refers to an action of a menu bar or menu.
+// A Menu refers to a QMenuBar or a QMenu. A MenuItem refers to a QAction in one of them.
 
 MenuItem Menu::itemWithTitle(const std::string& title) const {
   const auto* const menu = nativeOf<QWidget>(*this);

@@ -10,10 +10,10 @@
 
 namespace onramp::qt {
 
-// Some of the properties that this front end adds to Qt's widgets.
+// The names of some properties that this front end adds to Qt's widgets.
 inline constexpr const char* kViewClass = "viewClass";  ///< text: a page's class, set on its root
 inline constexpr const char* kHeading = "heading";      ///< true for a label that is a title
-inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: columns that name a row
+inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< texts: see ListModel
 
 /// Returns the object behind `outlet` if it is of class `Class`, or null otherwise.
 template <typename Class>
@@ -32,8 +32,8 @@ Class* makeChild(Parent* parent, Arguments&&... arguments) {
   return std::make_unique<Class>(std::forward<Arguments>(arguments)..., parent).release();
 }
 
-/// Converts `text` to the title of a button or menu item. Each "&" is doubled, because a single one
-/// would underline the next letter.
+/// Converts `text` to the title of a button or menu item. Doubles each "&", because Qt would hide a
+/// single "&" and underline the next letter.
 [[nodiscard]] inline QString titleText(const std::string& text) {
   return QString::fromStdString(text).replace(QLatin1Char('&'), QLatin1String("&&"));
 }

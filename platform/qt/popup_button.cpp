@@ -31,7 +31,7 @@ void PopUpButton::addItem(const std::string& title, std::function<void()> action
   if (!button) return;
   if (!button->menu()) button->setMenu(qt::makeChild<QMenu>(button));
   const QAction* const item = button->menu()->addAction(qt::titleText(title));
-  // The command runs after the menu has closed, because a command can block for seconds.
+  // Runs the action after the menu has closed, because an action can block for seconds.
   QObject::connect(item, &QAction::triggered, button, std::move(action), Qt::QueuedConnection);
 }
 

@@ -12,10 +12,10 @@ class RadioMatrixWidget final : public QWidget {
  public:
   using QWidget::QWidget;
 
-  /// Returns the button in that place, or null when there is none.
+  /// Returns the button at that row and column, or null if there is none.
   [[nodiscard]] QRadioButton* cell(int row, int column) const;
 
-  /// Returns the row of the selected button, or 0 when no button is selected.
+  /// Returns the row of the selected button, or 0 if no button is selected.
   [[nodiscard]] int selectedRow() const;
 };
 

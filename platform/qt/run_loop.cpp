@@ -16,15 +16,15 @@ namespace onramp {
 
 namespace {
 
-// Returns the modal loops that are running, the innermost last. Main thread only.
+// Returns the running modal loops. The innermost is the last. Main thread only.
 std::vector<QEventLoop*>& modalLoops() {
   static std::vector<QEventLoop*> loops;
   return loops;
 }
 
-// True from abortModal() until the modal loop has returned or the main thread has found that no
-// loop is running. During this time, a modal loop holds posted actions back, because each of them
-// can occupy the main thread for seconds and so delay the return.
+// True from abortModal() until the modal loop has returned, or until the main thread has found that
+// no loop is running. Meanwhile, posted actions wait for the end of the loop, because each of them
+// could block the main thread for seconds.
 std::atomic<bool> isAborting = false;
 
 }  // namespace
@@ -55,8 +55,8 @@ void runModalForWindow(const Window& window) {
   QEventLoop loop;
   modalLoops().push_back(&loop);
   loop.exec();
-  // Handles the clicks and keys that arrived while the main thread was busy, because the user meant
-  // them for the page that is still shown.
+  // Handles the clicks and keys that arrived while the main thread was busy. The user meant them
+  // for this page, not for the next one.
   if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;

@@ -51,7 +51,7 @@ void Spinner::paintEvent(QPaintEvent*) {
   painter.rotate(turn_ * 360.0 / kSpokes);
   QColor color = palette().color(QPalette::WindowText);
   for (int spoke = 0; spoke < kSpokes; ++spoke) {
-    // The last spoke is the strongest. The others fade towards the first one.
+    // The spokes become more opaque from the first one to the last.
     color.setAlphaF(0.15F + 0.7F * static_cast<float>(spoke) / kSpokes);
     painter.setPen(QPen(color, radius / 5, Qt::SolidLine, Qt::RoundCap));
     painter.drawLine(QPointF(0, -radius * 0.5), QPointF(0, -radius * 0.9));

@@ -5,17 +5,15 @@
 
 namespace onramp::qt {
 
-/// A wheel of spokes that turns from start() to stop(). To assistive programs, the turning spinner
-/// is a progress bar that does not show how much is done. If the spinner is turning when it
-/// appears, it takes the keyboard focus, so that these programs read out what the user is waiting
-/// for.
+/// A wheel of spokes that turns from start() to stop(). For assistive programs, the turning spinner
+/// is an indeterminate progress bar. If the spinner is turning when it appears, it takes the
+/// keyboard focus, so that these programs read out what the user is waiting for.
 class Spinner final : public QProgressBar {
   Q_OBJECT
 
  public:
   using QProgressBar::QProgressBar;
 
-  /// Start and stop the turning.
   void start();
   void stop();
 
@@ -29,7 +27,7 @@ class Spinner final : public QProgressBar {
 
  private:
   QBasicTimer timer_;
-  int turn_ = 0;  ///< by how many spokes the wheel has turned
+  int turn_ = 0;  ///< the angle of the wheel, in spokes
 };
 
 }  // namespace onramp::qt

@@ -14,7 +14,7 @@ constexpr int kRingWidth = 2;
 constexpr qreal kCornerRadius = 3;
 constexpr int kRoomBesideTitle = 10;
 constexpr int kRoomAboveTitle = 3;
-constexpr int kLeastGrayDistance = 150;  ///< from a title to its button, in grey levels
+constexpr int kLeastGrayDistance = 150;  ///< between a title and its button, in grey levels
 constexpr int kLeastDisabledDistance = 40;
 
 void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
@@ -28,8 +28,8 @@ void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.restore();
 }
 
-// Returns the colour of the default button, which is that of selections. If the button's title is
-// lighter than this colour, the colour is darkened until the title can be read.
+// Returns the colour of the default button, which is the colour of selections. If the title is
+// lighter than this colour, darkens the colour until the title can be read.
 QColor defaultButtonColor(const QPalette& palette) {
   QColor color = palette.color(QPalette::Highlight);
   const int title = qGray(palette.color(QPalette::HighlightedText).rgb());
@@ -120,7 +120,7 @@ void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, 
   }
 }
 
-// Makes disabled text readable. Some high-contrast palettes give it the colour of the window.
+// Makes disabled text readable. In some high-contrast palettes, it has the colour of the window.
 void Style::drawItemText(QPainter* painter, const QRect& rectangle, int flags,
                          const QPalette& palette, bool isEnabled, const QString& text,
                          QPalette::ColorRole role) const {
@@ -146,8 +146,8 @@ QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, con
   const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
   // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
-  // Fusion's column for check marks is as wide as the item is high, but the width that Fusion
-  // computes leaves no room for that column when the text is large.
+  // Fusion draws a column for check marks that is as wide as the item is high. If the text is
+  // large, the width that Fusion computes has no room for this column.
   if (type == CT_MenuItem) return normal + QSize(normal.height(), 0);
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

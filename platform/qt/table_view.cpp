@@ -17,8 +17,8 @@ namespace {
 using qt::ListModel;
 using qt::nativeOf;
 
-// Returns the view's model. The first call for a view creates the model, because a header can be
-// set before bind().
+// Returns the view's model, or null if `view` is null. Creates the model on the first call for a
+// view, because a header can be set before bind().
 ListModel* modelOf(QAbstractItemView* view) {
   if (!view) return nullptr;
   if (auto* const model = qobject_cast<ListModel*>(view->model())) return model;
@@ -54,10 +54,9 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// Tells the controller which row the user has selected. If the user has deselected the controller's
-// row, selects that row again. This also happens when an assistive program deselects the old row
-// before it selects another one. Both rows are then selected for a moment, and only `added` tells
-// which row is meant.
+// Tells the controller which row the user has selected. If no row is selected now, selects the
+// controller's row again. An assistive program can cause this when it deselects the old row before
+// it selects another. Both rows are then selected for a moment, and `added` has only the new one.
 void takeSelection(QAbstractItemView* view, ArrayController& controller,
                    const QItemSelection& added) {
   if (!view->selectionModel()->hasSelection()) {
@@ -69,7 +68,7 @@ void takeSelection(QAbstractItemView* view, ArrayController& controller,
 }
 
 // Clicks the window's default button after the list has handled the double-click, because the
-// button's action can remove the list. Does nothing if the button is hidden or disabled now.
+// button's action can remove the list. Does nothing if the button is hidden or disabled.
 void clickDefaultButtonSoon(const QWidget& window) {
   for (QPushButton* const button : window.findChildren<QPushButton*>()) {
     if (!button->isDefault() || !button->isVisible() || !button->isEnabled()) continue;

@@ -17,8 +17,8 @@ bool hasWordThatStarts(const QString& text, const QString& start) {
   return false;
 }
 
-// Returns the first matching row from row `from` on. The search continues at row 0 after the last
-// row. Returns -1 when no row matches.
+// Returns the first row, starting at row `from`, in which a word starts with `start`. After the
+// last row, continues at row 0. Returns -1 if no row matches.
 int rowFrom(int from, const QAbstractItemModel& model, const QString& start) {
   const int count = model.rowCount();
   for (int step = 0; step < count; ++step) {

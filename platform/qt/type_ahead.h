@@ -7,16 +7,15 @@ class QAbstractItemView;
 
 namespace onramp::qt {
 
-/// Finds a row of a list by what the user types. A row matches if any word in its first column
-/// starts with the typed text, ignoring case.
+/// Selects a row of a list when the user types a text. A row matches if any word in its first
+/// column starts with the text, ignoring case.
 class TypeAhead {
  public:
-  /// Call this when the user has typed `text`. Texts that are typed in quick succession are joined.
-  /// Selects the first matching row from the current row on; after the last row, the search
-  /// continues at the first one. If the user types the same text again after a pause, the search
-  /// starts at the row after the current one. If the user types one letter several times quickly
-  /// and no row matches the joined letters, searches for the single letter from the row after the
-  /// current one. Does nothing when no row matches.
+  /// Call this when the user has typed `text`. Joins texts that are typed in quick succession, and
+  /// selects the first row that matches. The search starts at the current row, or at the next one
+  /// if the user types the same text again after a pause. After the last row, it continues at the
+  /// first row. If one letter was typed several times quickly and no row matches the joined
+  /// letters, searches for the single letter from the next row on. Does nothing if no row matches.
   void type(QAbstractItemView& view, const QString& text);
 
  private:

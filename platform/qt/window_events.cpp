@@ -25,7 +25,7 @@ bool clickFirst(const QWidget& window, const QString& keyEquivalent) {
   return false;
 }
 
-// Returns the spinner that is visible, or null when there is none.
+// Returns the visible spinner, or null if there is none.
 const Spinner* visibleSpinner(const QWidget& window) {
   for (const Spinner* const spinner : window.findChildren<Spinner*>()) {
     if (spinner->isVisible()) return spinner;

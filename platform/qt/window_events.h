@@ -12,7 +12,7 @@ namespace qt {
 
 /// Lets the delegate decide whether a window may close and whether the application then terminates.
 /// Also handles some keys. Escape clicks the first visible, enabled button whose key equivalent is
-/// "Escape". Return and Enter do what performReturn() does. F10 does what openMenu() does.
+/// "Escape". Return and Enter call performReturn(), and F10 calls openMenu().
 class WindowEvents final : public QObject {
   Q_OBJECT
 
@@ -32,12 +32,12 @@ class WindowEvents final : public QObject {
   /// Returns whether the key did anything.
   bool performKey(int key);
 
-  /// Clicks the push button that has the focus. If none has the focus, clicks the first visible,
-  /// enabled one whose key equivalent is "Return". Returns false if there is no such button.
+  /// Clicks the push button that has the focus. If no push button has the focus, clicks the first
+  /// visible, enabled one whose key equivalent is "Return". Returns whether it clicked a button.
   bool performReturn();
 
-  /// Selects the first menu of the menu bar, so that the arrow keys work in the menu bar. Returns
-  /// whether there is a menu.
+  /// Selects the first menu of the menu bar, so that the arrow keys work there. Returns whether
+  /// there is a menu.
   bool openMenu();
 
   QWidget* window_;

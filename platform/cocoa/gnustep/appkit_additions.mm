@@ -1,5 +1,5 @@
-// Makes small changes and additions to GNUstep, so that it behaves like AppKit. Larger ones have
-// files of their own beside this one.
+// Makes small changes to GNUstep, so that it behaves like AppKit. The other files in this folder
+// make larger changes.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
@@ -24,8 +24,7 @@ void ignore(id, SEL, BOOL) {}
 
 }  // namespace
 
-/// A sheet that is to open in the next iteration of the main loop. Retains the alert and the
-/// window.
+/// A sheet that will open in the next iteration of the main loop. Retains the alert and the window.
 @interface OnrampWaitingSheet : NSObject {
  @public
   NSAlert* _alert;
@@ -82,8 +81,8 @@ NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
       .size;
 }
 
-// Prevents GNUstep from starting its daemon for notifications between applications. The application
-// exchanges no such notifications, and would fail to launch if the daemon were slow to answer.
+// Prevents GNUstep from starting its daemon for notifications between applications. The wizard
+// needs no such notifications, and would fail to launch if the daemon were slow to answer.
 id noDistributedCenter(id, SEL) {
   return nil;
 }

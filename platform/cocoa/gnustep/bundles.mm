@@ -25,9 +25,9 @@ NSString* contentsOf(NSString* bundlePath) {
   return isFolder(contents) ? contents : bundlePath;
 }
 
-// Returns the folder of the user's most preferred language, or nil when the bundle lacks that
-// folder. GNUstep's own search misses "zh_CN.lproj", because it looks for names such as
-// "SimplifiedChinese.lproj" instead.
+// Returns the folder of the user's first language, or nil if the bundle lacks that folder.
+// GNUstep's own search misses "zh_CN.lproj", because it looks for names such as
+// "SimplifiedChinese.lproj".
 NSString* firstLanguageFolder(NSString* rootPath, NSString* subPath) {
   NSArray* const languages =
       [[NSUserDefaults standardUserDefaults] stringArrayForKey:@"NSLanguages"];
@@ -45,7 +45,7 @@ NSArray* resourcePaths(id self, SEL selector, NSString* rootPath, NSString* subP
   NSString* const first = localization ? nil : firstLanguageFolder(contents, subPath);
   if (!first || [paths count] == 0) return paths;
   NSMutableArray* const all = [NSMutableArray arrayWithArray:paths];
-  [all insertObject:first atIndex:1];  // after the folder for resources of no language
+  [all insertObject:first atIndex:1];  // after the folder of resources that have no language
   return all;
 }
 
@@ -63,7 +63,7 @@ NSString* executablePath(id self, SEL selector) {
   return originalExecutablePath(self, selector);
 }
 
-// Returns the bundle of the running program, which is in the bundle's folder Contents/Linux.
+// Returns the bundle whose folder Contents/Linux contains the running program.
 NSBundle* mainBundle(id, SEL) {
   static NSBundle* bundle = nil;
   if (!bundle) {

@@ -7,9 +7,9 @@ namespace {
 // The defaults domain that GNUstep searches first.
 NSString* const kFirstDomain = @"GSPrimaryDomain";
 
-// Returns the codes of the user's locale and language, such as "de_DE" and "de", and then "en". By
-// default, GNUstep looks for folders that are named after languages, such as "German.lproj". The
-// folders of our bundles are named after codes, such as "de.lproj".
+// Returns the codes of the user's locale and language, such as "de_DE" and "de", and then "en". In
+// our bundles, folders are named after codes, as in "de.lproj". By default, GNUstep looks for
+// folders that are named after languages, as in "German.lproj".
 NSArray* languageCodes() {
   NSDictionary* const environment = [[NSProcessInfo processInfo] environment];
   NSMutableArray* const codes = [NSMutableArray array];
@@ -33,9 +33,9 @@ NSArray* languageCodes() {
 
 @implementation OnrampDefaults
 
-// Sets the user's languages, shows the menu inside the window, and shows no icon of the application
-// on the desktop. Selects fonts that have Chinese, Japanese and Korean characters, because GNUstep
-// draws a question mark for a character that the font lacks. GNUstep ignores a font that is not
+// Sets the user's languages, puts the menu inside the window, and removes the application's icon
+// from the desktop. Selects fonts with Chinese, Japanese and Korean characters, because GNUstep
+// draws a question mark for a character that the font lacks. GNUstep ignores fonts that are not
 // installed.
 + (void)load {
   @autoreleasepool {

@@ -1,8 +1,7 @@
-// GNUstep stores the time of the last event. This file prevents that time from going back. Every
-// request for the keyboard focus carries the stored time, and the window manager refuses a request
-// whose time looks old. GNUstep also stores a number from each "_NET_WM_PING" message, but this
-// number need not be a time. The window manager Openbox, for example, sends a count that starts at
-// one.
+// GNUstep stores the time of the last event. This file prevents the stored time from going back.
+// Requests for the keyboard focus carry this time, and the window manager refuses a request whose
+// time looks old. GNUstep also stores a number from each "_NET_WM_PING" message, which need not be
+// a time. The window manager Openbox, for example, sends a count that starts at one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
@@ -11,8 +10,8 @@ namespace {
 
 using SetTime = void(id, SEL, unsigned long);
 
-// Times are milliseconds in 32 bits, and start at 0 again after the largest number. A step back of
-// at least this size is such a restart.
+// Times are milliseconds in 32 bits, and restart at 0 after the largest number. A step back of at
+// least this size is such a restart.
 constexpr unsigned long kGreatestStepBack = 0xF0000000UL;
 
 SetTime* originalSetLastTime = nullptr;
@@ -40,8 +39,8 @@ void setLastTime(id self, SEL selector, unsigned long time) {
   }
 }
 
-// Runs when the application object exists, because GNUstep loads its X11 backend, which has the
-// class XGServer, only when it creates that object.
+// Runs after GNUstep has created the application object and, with it, loaded the X11 backend, which
+// defines the class XGServer.
 + (void)replace:(NSNotification*)notification {
   Class const server = NSClassFromString(@"XGServer");
   if (!server) return;

@@ -1,7 +1,7 @@
-// Hides and unhides the application as AppKit does, when the program asks for it. GNUstep would
-// replace each window with an icon, because the application has no icon that the user could click.
-// If a window came back before its icon was on the screen, the window would not always get the
-// keyboard focus.
+// Makes the windows disappear without icons, as in AppKit, when the program hides itself. GNUstep
+// would replace each window with an icon, because the application has no icon that the user could
+// click. If a window came back before its icon had appeared, it would not always get the keyboard
+// focus.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"

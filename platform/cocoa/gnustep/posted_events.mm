@@ -1,5 +1,5 @@
 // Makes a posted event wake the main loop, as on macOS. A GNUstep loop first runs its timers and
-// delayed messages, then it waits for input. If a timer or message has posted an event, the loop
+// delayed messages, and then waits for input. If a timer or message has posted an event, the loop
 // does not notice the event until some input arrives.
 
 #include <sys/eventfd.h>
@@ -9,7 +9,7 @@
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
 
-/// An input source of the main loop. Every posted event makes input available at the source, and so
+/// An input source of the main loop. Every posted event makes input available at this source, which
 /// wakes the loop.
 @interface OnrampPostedEvents : NSObject <RunLoopEvents> {
   int _descriptor;
@@ -51,7 +51,7 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  eventfd_write(_descriptor, 1);  // fails only if earlier posts are waiting, which wake the loop
+  eventfd_write(_descriptor, 1);  // fails only when the counter is full, which wakes the loop, too
 }
 
 - (void)receivedEvent:(void*)data

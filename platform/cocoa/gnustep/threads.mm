@@ -1,6 +1,7 @@
-// Makes GNUstep create its locks before a second thread exists. GNUstep creates the lock around the
-// attributes of texts when the first other thread starts. If the main thread is using a text at
-// that moment, it unlocks the lock without having locked it, which raises an exception.
+// Starts and ends a thread when the program is loaded, so that GNUstep creates its locks. GNUstep
+// creates the lock for the attributes of texts when the second thread starts. If the main thread
+// were using a text at that moment, it would unlock a lock that it has not locked, which raises an
+// exception.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 
