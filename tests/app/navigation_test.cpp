@@ -18,7 +18,7 @@ class Navigation : public Wizard {
  protected:
   /// Launches the wizard on a medium with `models` and goes to the connection page of the first
   /// model. The models must differ in their support of USB or wired Ethernet, so that the wizard
-  /// does not skip the list.
+  /// shows the model list first.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
                               {"Cable", model(true, false, false)}}) {
@@ -213,7 +213,7 @@ TEST_F(Navigation, TheSheetAfterAnEmptySearchOffersTheSupportPage) {
   EXPECT_THAT(screen.opened, ElementsAre("http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"));
   EXPECT_EQ(buttons(), "[BTN_CANCEL](BTN_NEXT)");
 
-  // The text is written as a format string, in which "%%" stands for a percent sign.
+  // The message text is a format string, in which "%%" stands for a percent sign.
   medium.setEnvironment("LANG", "en_US.UTF-8");
   medium.write(kEnglishTexts,
                std::string("INST_TXT_ALERT_WIFI_DEVICENOTFOUND = \"100%% of 5%%\";"));

@@ -29,8 +29,7 @@ TEST(NotificationCenter, CallsObserversInOrderEvenWhenHandlersAddAndRemoveThem) 
   center.post({"x", nullptr, {{"text", std::string("first")}}});
   EXPECT_EQ(log, "first( cy ) cx ");
   center.post({"x", nullptr, {}});
-  EXPECT_EQ(log, "first( cy ) cx cx cx ")
-      << "a later notification reaches the handler that was added";
+  EXPECT_EQ(log, "first( cy ) cx cx cx ") << "the handler added meanwhile gets later notifications";
 }
 
 }  // namespace
