@@ -1,5 +1,5 @@
-// Tests how corefoundation, cfnetwork and systemconfiguration use the frameworks' objects. The
-// folder frameworks/ has stand-ins for the frameworks.
+// Tests how corefoundation, cfnetwork and systemconfiguration in platform/ use the objects of the
+// macOS frameworks. The folder frameworks/ has stand-ins for these frameworks.
 
 #include <CoreServices/CoreServices.h>
 #include <SystemConfiguration/SystemConfiguration.h>

@@ -1,6 +1,6 @@
-// Runs the wizard's own device chooser for SECONDS seconds, searching for the models MODEL…, then
-// prints the names of the devices in the chooser's list, one on each line. APPLICATION is the path
-// of the wizard's application on the medium.
+// Lets the wizard's own device chooser search for the models MODEL… for SECONDS seconds. Then
+// prints the devices' names from the chooser's list, one per line. APPLICATION is the path of the
+// wizard's application on the medium.
 //
 //   chooser_probe APPLICATION SECONDS MODEL…
 

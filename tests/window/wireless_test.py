@@ -4,7 +4,7 @@ Usage: wireless_test.py [TEST] MEDIUM
 
 MEDIUM is the folder of a medium with the application on it. TEST is a name such as
 WirelessWays.test_back_and_forth_keeps_list_and_choice. Without TEST, all tests run, each with its own
-process, desktop and devices. Several tests run at a time, because each of them mostly waits.
+process, desktop and devices. Several tests run at a time, because a test mostly waits.
 """
 
 import concurrent.futures
