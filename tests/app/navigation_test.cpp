@@ -130,7 +130,7 @@ TEST_F(Navigation, TheSearchAfterTheToolFindsTheChosenModelsDevice) {
   EXPECT_THAT(deviceRows(), ElementsAre("Office 192.0.2.8"));
   EXPECT_THAT(screen.sheets, IsEmpty());
   EXPECT_THAT(network.browsers, IsEmpty());
-  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no way back after the tool";
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no Back button after the tool";
   EXPECT_TRUE(screen.object("progress").hidden);
 
   screen.click("rightMostButton");
@@ -240,7 +240,7 @@ TEST_F(Navigation, AToolStartedFromTheMenuKeepsTheChooserWhenItAsksToGoBack) {
   EXPECT_EQ(screen.log, (Strings{"hide", "unhide", "activate", "key and front"}));
 }
 
-TEST_F(Navigation, TheNotificationSetsTheLengthOfThePauses) {
+TEST_F(Navigation, TheWaitNotificationSetsTheLengthOfThePauses) {
   goToConnectionPage();
   delegate->showProgressAtChooseDeviceViewByRefresh(
       {.name = {}, .object = nullptr, .userInfo = {{std::string(kWaitTime), 7}}});

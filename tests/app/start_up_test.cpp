@@ -170,7 +170,7 @@ TEST_F(StartUp, CopesWithMissingAndInvalidFiles) {
         screen.runTimers();
       }
       EXPECT_TRUE(screen.terminated);
-      EXPECT_EQ(filesBelow(medium.path("")), before) << "the medium is never written to";
+      EXPECT_EQ(filesBelow(medium.path("")), before) << "the wizard never writes to the medium";
     }
   }
 }
@@ -188,7 +188,7 @@ Dictionary version(Value major, Value minor, Value bugFix) {
   return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
 }
 
-TEST_F(StartUp, ChecksTheSystemFirst) {
+TEST_F(StartUp, ChecksTheSystemVersionFirst) {
   const Dictionary none = version("0", "0", "0");
   // Each case has the running system's version, the minimum, the maximum and part of the expected
   // alert text, which is empty if the system is supported.

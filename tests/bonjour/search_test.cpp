@@ -99,8 +99,8 @@ TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // Only the first of the three removals counted. After the next resolve, the service is gone after
-  // two more removals.
+  // Only the first of the three removals counted. After the next resolve, two more removals remove
+  // the service.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());

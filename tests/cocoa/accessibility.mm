@@ -1,6 +1,6 @@
 // Tells a test which controls are on the screen, because GNUstep has no accessibility interface. A
-// build with tests links this file into the application. The other half of the protocol is in
-// gnustep_person.py.
+// build with tests links this file into the application. gnustep_person.py asks for the controls
+// and reads the answer.
 //
 // The environment variable ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the test
 // creates a question file, whose name is the answer file's name with ".question" appended. The

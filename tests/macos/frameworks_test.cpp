@@ -168,7 +168,7 @@ TEST(CFNetworkService, IsNotCreatedFromTextsThatAreNotUTF8) {
   EXPECT_EQ(corefoundation::toCFArray({"a", "\xFF", "b"}).get()->members.size(), 2U);
 }
 
-TEST(SystemConfigurationStore, MakesKeysAsksByPatternsAndOmitsValuesOfUnknownTypes) {
+TEST(SystemConfigurationStore, MakesKeysQueriesPatternsAndOmitsValuesOfUnknownTypes) {
   const DynamicStoreRef store = createDynamicStore("test");
   const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
   EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");

@@ -23,7 +23,7 @@ std::vector<std::uint8_t> written(Put put) {
   return {bytes.end() - static_cast<std::ptrdiff_t>(out.size()), bytes.end()};
 }
 
-TEST(Integers, TakeTheFewestBytesAndSizeDecidesHowTheyAreSignExtended) {
+TEST(Integers, TakeTheFewestBytesAndAreSignExtendedDependingOnTheirSize) {
   // Each row has the number, its encoding, and the results of ber_get_int() and ber_get_uint().
   // ber_put_int() also sets its argument to the result of ber_get_uint().
   const std::tuple<std::int64_t, const char*, std::int64_t, std::uint64_t> cases[] = {
@@ -283,7 +283,7 @@ TEST(NetSnmpReads, RequestsWithAndWithoutABinding) {
   EXPECT_EQ(readByNetSnmp(m.encode()), "163 7");
 }
 
-TEST(NetSnmpReads, EveryTypeOfValueOfSnmpv1) {
+TEST(NetSnmpReads, EveryValueTypeOfSNMPv1) {
   const std::uint16_t arcs[] = {1, 3, 127, 128, 16383, 16384, 65535};
   const std::uint8_t types[] = {2, 65, 66, 67, 2, 4, 64, 68, 6, 5};
   Message m(std::size(types), std::size(arcs));

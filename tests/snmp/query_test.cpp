@@ -151,7 +151,7 @@ TEST_F(Query, ReturnsTheStatusOfTheExchange) {
 
   snmp_request_counter = 6;
   EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT)
-      << "the reply is to another request";
+      << "the reply answers another request";
   agents.socketsOpen = false;
   EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork), SNMP_ERR_TRANSPORT);
   EXPECT_EQ(snmp_request_to_address(nullptr, "192.0.2.1"), SNMP_ERR_TRANSPORT);
@@ -225,7 +225,7 @@ class GetSet : public testing::Test {
                                {.type = kTagInteger}};
 };
 
-TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
+TEST_F(GetSet, CopyValuesIntoTheirSlotsAndNeverPastThem) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
   // Each row has a name, the reply's bindings, the capacity of the second slot, and the later
   // contents of the second slot. A refused reply does not change the second slot.

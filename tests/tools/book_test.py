@@ -34,7 +34,7 @@ def rows(document, heading):
 class Book(unittest.TestCase):
     maxDiff = None
 
-    def test_has_every_key_with_its_type_and_need(self):
+    def test_has_every_key_with_its_type_and_whether_it_is_needed(self):
         told = []
         for name, keys, kind, need, *_ in rows(BOOK, r"Key in .*?(\w+\.plist)"):
             *path, last = keys.split(" / ")
