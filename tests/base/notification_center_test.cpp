@@ -29,7 +29,8 @@ TEST(NotificationCenter, CallsObserversInOrderEvenWhenHandlersAddAndRemoveThem) 
   center.post({"x", nullptr, {{"text", std::string("first")}}});
   EXPECT_EQ(log, "first( cy ) cx ");
   center.post({"x", nullptr, {}});
-  EXPECT_EQ(log, "first( cy ) cx cx cx ") << "the handler added meanwhile gets later notifications";
+  EXPECT_EQ(log, "first( cy ) cx cx cx ")
+      << "a handler added during a notification gets later ones";
 }
 
 }  // namespace

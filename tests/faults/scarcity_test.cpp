@@ -59,8 +59,7 @@ TEST(Scarcity, MakesAFunctionFailAndDoesNoOtherHarm) {
   }
 }
 
-// This test cannot use failEveryCall(), because the main loop keeps the source and its descriptors
-// until the process ends.
+// The main loop keeps the source's descriptors open, so this test cannot use failEveryCall().
 TEST(Scarcity, LeavesAStoreWithoutNotifications) {
   const std::vector<std::string> keys{"State:/Network/Global/IPv4"};
   const DynamicStoreRef store = createDynamicStore("test");

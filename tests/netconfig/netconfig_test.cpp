@@ -22,7 +22,7 @@ struct Store {
   std::string failing;  ///< the step that fails: "create", "key" or "copy"
   int error = 0;
   DynamicStoreCallback callback;  ///< the latest callback
-  bool hasAddedNull = false;      ///< whether the latest source was null
+  bool hasAddedNull = false;      ///< whether the source added last was null
 
   void change(Dictionary newContents) {
     contents = std::move(newContents);

@@ -24,7 +24,7 @@ class Agents {
 
   static Agents& instance();
 
-  /// Returns to the initial state, in which no address answers.
+  /// Restores the initial state, in which no address answers.
   void reset() { *this = Agents(); }
 
   /// For each dotted address, the agent's answers in order. The last value also answers all further

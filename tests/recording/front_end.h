@@ -58,7 +58,7 @@ class FrontEnd {
  public:
   static FrontEnd& instance();
 
-  /// Returns to the state of a new process, but keeps the objects of pages that still exist.
+  /// Restores the state of a new process, but keeps the objects of pages that still exist.
   void reset();
 
   /// Launches the application for `delegate` as the platform does, up to the point where it waits

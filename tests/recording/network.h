@@ -14,7 +14,7 @@ class Network {
  public:
   static Network& instance();
 
-  /// Returns to the initial state. Earlier browsers get no more events.
+  /// Restores the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
   /// Makes a service like those that a browser passes to its client.

@@ -24,8 +24,8 @@ std::vector<std::uint8_t> written(Put put) {
 }
 
 TEST(Integers, TakeTheFewestBytesAndAreSignExtendedDependingOnTheirSize) {
-  // Each row has the number, its encoding, and the results of ber_get_int() and ber_get_uint().
-  // ber_put_int() also sets its argument to the result of ber_get_uint().
+  // Each row has a number, its encoding, and the numbers that ber_get_int() and ber_get_uint() read
+  // from the encoding. ber_put_int() sets its argument to the last number.
   const std::tuple<std::int64_t, const char*, std::int64_t, std::uint64_t> cases[] = {
       {127, "02 01 7F", 127, 127},
       {128, "02 02 00 80", 128, 128},

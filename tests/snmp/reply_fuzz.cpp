@@ -1,6 +1,6 @@
 // Uses each input as an agent's reply to a query, a get and a set. The caller's storage has no
-// spare room, so the sanitizers report a write past its end. Also encodes each message that can be
-// decoded and decodes it again, unless one of its values or names does not allow that.
+// spare room, so the sanitizers report a write past its end. If the input can be decoded, also
+// encodes the result and decodes it again, unless one of its values or names does not allow that.
 
 #include <algorithm>
 #include <array>

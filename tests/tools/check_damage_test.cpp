@@ -113,8 +113,9 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the name of the first page that `report` predicts, or an empty text for no page. `start`
-// is the result of startOfTheWizard(). If the wizard refuses the system, there is no page.
+// Returns the name of the first page that `report` predicts, or an empty text for no page. `start`,
+// the result of startOfTheWizard(), says whether the wizard refuses the system and so shows no
+// page.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";

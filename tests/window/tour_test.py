@@ -2,8 +2,8 @@
 
 Usage: tour_test.py MEDIUM
 
-MEDIUM is the folder of a medium with the application on it. The environment variable ONRAMP_CHECK can
-name another onramp-check than that of the release build.
+MEDIUM is the folder of a medium with the application on it. The environment variable ONRAMP_CHECK may
+hold the path of onramp-check. The default is the release build's program.
 """
 
 import pathlib

@@ -33,9 +33,9 @@ CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu ite
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
 PRINTER = "_pdl-datastream._tcp"
-# How likely a walk is to click a control, by name. A control that is not listed has the weight 1. With
-# equal weights, most walks would end early. Hide is never clicked, because the desktop has no task bar
-# that could bring the window back.
+# The weights of the controls in random clicks. A control that is not listed has the weight 1. With
+# equal weights, most walks would end early. Hide is never clicked, because the desktop has no task
+# bar that could bring the window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
 # Values for a device's `activeif`. With each of them, the device answers at once, so the wizard
