@@ -18,7 +18,7 @@ class Navigation : public Wizard {
  protected:
   /// Launches the wizard on a medium with `models` and goes to the connection page of the first
   /// model. The models must differ in their support of USB or wired Ethernet, so that the wizard
-  /// does not skip the list.
+  /// shows the model list first.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
                               {"All", model(true, true, true)},
                               {"Cable", model(true, false, false)}}) {
@@ -130,7 +130,7 @@ TEST_F(Navigation, TheSearchAfterTheToolFindsTheChosenModelsDevice) {
   EXPECT_THAT(deviceRows(), ElementsAre("Office 192.0.2.8"));
   EXPECT_THAT(screen.sheets, IsEmpty());
   EXPECT_THAT(network.browsers, IsEmpty());
-  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no way back after the tool";
+  EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "there is no Back button after the tool";
   EXPECT_TRUE(screen.object("progress").hidden);
 
   screen.click("rightMostButton");
@@ -213,7 +213,7 @@ TEST_F(Navigation, TheSheetAfterAnEmptySearchOffersTheSupportPage) {
   EXPECT_THAT(screen.opened, ElementsAre("http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"));
   EXPECT_EQ(buttons(), "[BTN_CANCEL](BTN_NEXT)");
 
-  // The text is written as a format string, in which "%%" stands for a percent sign.
+  // The message text is a format string, in which "%%" stands for a percent sign.
   medium.setEnvironment("LANG", "en_US.UTF-8");
   medium.write(kEnglishTexts,
                std::string("INST_TXT_ALERT_WIFI_DEVICENOTFOUND = \"100%% of 5%%\";"));
@@ -240,7 +240,7 @@ TEST_F(Navigation, AToolStartedFromTheMenuKeepsTheChooserWhenItAsksToGoBack) {
   EXPECT_EQ(screen.log, (Strings{"hide", "unhide", "activate", "key and front"}));
 }
 
-TEST_F(Navigation, TheNotificationSetsTheLengthOfThePauses) {
+TEST_F(Navigation, TheWaitNotificationSetsTheLengthOfThePauses) {
   goToConnectionPage();
   delegate->showProgressAtChooseDeviceViewByRefresh(
       {.name = {}, .object = nullptr, .userInfo = {{std::string(kWaitTime), 7}}});

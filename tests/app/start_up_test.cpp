@@ -162,7 +162,7 @@ TEST_F(StartUp, CopesWithMissingAndInvalidFiles) {
       const auto before = filesBelow(medium.path(""));
       launch();
       if (file == kEnglishTexts) {
-        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "missing texts show their keys";
+        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "buttons show the keys of missing texts";
         screen.click("rightButton");
       } else {
         // No wireless model can be read from such a medium, so the wizard shows no page and ends.
@@ -170,7 +170,7 @@ TEST_F(StartUp, CopesWithMissingAndInvalidFiles) {
         screen.runTimers();
       }
       EXPECT_TRUE(screen.terminated);
-      EXPECT_EQ(filesBelow(medium.path("")), before) << "the medium is never written to";
+      EXPECT_EQ(filesBelow(medium.path("")), before) << "the wizard never writes to the medium";
     }
   }
 }
@@ -188,10 +188,10 @@ Dictionary version(Value major, Value minor, Value bugFix) {
   return Dictionary{{"Major", major}, {"Minor", minor}, {"BugFix", bugFix}};
 }
 
-TEST_F(StartUp, ChecksTheSystemFirst) {
+TEST_F(StartUp, ChecksTheSystemVersionFirst) {
   const Dictionary none = version("0", "0", "0");
-  // Each case has the running system's version, the minimum, the maximum and a part of the expected
-  // alert. This part is empty if the system is supported.
+  // Each case has the running system's version, the minimum, the maximum and part of the expected
+  // alert text, which is empty if the system is supported.
   const std::tuple<const char*, Dictionary, Dictionary, std::string> cases[] = {
       {"10.5.8", version(10, 6, 0), none, "Mac OS X 10.6 or"},
       {"10.6.0", version("10", "6", "0"), none, ""},

@@ -18,8 +18,8 @@ namespace onramp {
 inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
-/// Runs the wizard from a temporary medium on a scripted network. Its functions prepare the medium
-/// and the network, and see and use the wizard as a person does.
+/// Runs the wizard from a temporary medium on a scripted network. The functions prepare the medium
+/// and the network, and read and use the wizard's window as a person does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {
@@ -59,7 +59,7 @@ class Wizard : public testing::Test {
     screen.launch(*delegate);
   }
 
-  /// Returns the class of the page shown. Returns an empty text unless exactly one page is shown.
+  /// Returns the class of the visible page, or an empty text unless exactly one page is visible.
   [[nodiscard]] std::string page() const {
     const auto& shown = screen.object("mainView").subviews;
     return shown.size() == 1 ? shown.front()->name : "";
@@ -80,8 +80,8 @@ class Wizard : public testing::Test {
     screen.object("deviceListPopupButton").items.at(index).second();
   }
 
-  /// Lets a wireless device of the maker Kestrel appear on the network at 192.0.2.`host`. Only a
-  /// search that is running finds the device.
+  /// Announces a wireless device of the maker Kestrel at 192.0.2.`host`. Only a search that is
+  /// already running finds the device.
   void appear(const std::string& name, const std::string& model, unsigned char host) const {
     const NetServiceRef service = recording::Network::service(name, "_printer._tcp.");
     agents.answers["192.0.2." + std::to_string(host)] = {2};

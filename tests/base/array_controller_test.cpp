@@ -15,7 +15,7 @@ Dictionary entry(const std::string& name, const std::string& number = "") {
   return Dictionary{{"name", name}, {"number", number}};
 }
 
-// Returns the names and numbers of all entries, with those of the selected entry in brackets.
+// Returns each entry's name and number, with the selected entry in brackets.
 std::string shown(const ArrayController& list) {
   std::string text;
   for (std::size_t i = 0; i < list.arrangedObjects().size(); ++i) {
@@ -44,7 +44,7 @@ TEST(ArrayController, SelectsTheFirstEntryAddedToAnEmptyListAndNotifiesTheTable)
   EXPECT_EQ(list.arrangedCount(), 1U);
 }
 
-TEST(ArrayController, SelectsTheSuccessorOfARemovedSelection) {
+TEST(ArrayController, SelectsTheNextOrLastEntryWhenTheSelectedOneIsRemoved) {
   const std::tuple<std::size_t, const char*, const char*> cases[] = {
       {0, "a", "[b]cb"}, {2, "c", "ab[b]"}, {1, "b", "a[c]"},        {3, "b", "a[c]"},
       {2, "a", "b[c]b"}, {0, "b", "[a]c"},  {1, "absent", "a[b]cb"}, {4, "a", "bcb"}};
@@ -57,7 +57,7 @@ TEST(ArrayController, SelectsTheSuccessorOfARemovedSelection) {
   }
 }
 
-TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
+TEST(ArrayController, SortsStablyByTheSortKeyAndKeepsTheSelection) {
   ArrayController list;
   std::string sorted;
   for (int i = 100; i < 200; ++i) {
@@ -67,7 +67,7 @@ TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
   list.setSelectedObject(entry("b", "150"));
   list.addObjects({entry("a"), entry("B")});
   list.rearrange();
-  EXPECT_EQ(shown(list), sorted + "aB") << "there is no sort key";
+  EXPECT_EQ(shown(list), sorted + "aB") << "without a sort key, the order stays";
   list.setSortKey("name");
   list.rearrange();
   EXPECT_EQ(shown(list), "Ba" + sorted);
@@ -76,7 +76,8 @@ TEST(ArrayController, RearrangesByTheSortKeyAloneAndKeepsTheSelection) {
   EXPECT_EQ(list.selectionIndex(), std::nullopt);
 }
 
-// Under the thread sanitizer, this test fails if arrangedCount() is not safe on another thread.
+// Under the thread sanitizer, this test fails if arrangedCount() is not safe to call on another
+// thread.
 TEST(ArrayController, LetsAnotherThreadWaitForAnEntry) {
   ArrayController list;
   std::size_t seen = 0;

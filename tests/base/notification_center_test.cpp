@@ -30,7 +30,7 @@ TEST(NotificationCenter, CallsObserversInOrderEvenWhenHandlersAddAndRemoveThem) 
   EXPECT_EQ(log, "first( cy ) cx ");
   center.post({"x", nullptr, {}});
   EXPECT_EQ(log, "first( cy ) cx cx cx ")
-      << "a later notification reaches the handler that was added";
+      << "a handler added during a notification gets later ones";
 }
 
 }  // namespace

@@ -11,8 +11,8 @@ namespace {
 
 using namespace std::literals;
 
-// Reads the characters of `bytes` and writes them again. A byte that starts no valid character
-// becomes "?".
+// Reads the characters of `bytes` and writes them again. A byte that is not part of a valid
+// character becomes "?".
 std::string readAndWritten(std::string_view bytes) {
   std::string text;
   while (!bytes.empty()) {
@@ -22,7 +22,7 @@ std::string readAndWritten(std::string_view bytes) {
   return text;
 }
 
-TEST(UTF8, IsReadByCharacterAndMalformedBytesAreRefusedOneByOne) {
+TEST(UTF8, ReadsWholeCharactersAndRefusesEachMalformedByte) {
   for (const char* const whole :
        {"", "a\x7F", "\u0080\u07FF", "\u0800\uD7FF\uE000\uFFFF", "\U00010000\U0010FFFF"}) {
     EXPECT_EQ(readAndWritten(whole), whole);
@@ -38,7 +38,7 @@ TEST(UTF8, IsReadByCharacterAndMalformedBytesAreRefusedOneByOne) {
   }
 }
 
-TEST(UTF8, ReplacesInvalidCodePointsWhenTheyAreAppended) {
+TEST(UTF8, AppendsAReplacementCharacterForAnInvalidCodePoint) {
   std::string text;
   for (const char32_t unit : {0xD800U, 0xDFFFU, 0x110000U})
     appendUTF8(text, unit);

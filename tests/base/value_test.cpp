@@ -9,7 +9,7 @@ namespace {
 
 constexpr double kTwoTo63 = 9223372036854775808.0;
 
-TEST(Value, ReadsAsAnIntegerWithinTheSignedRange) {
+TEST(Value, ConvertsToAnIntegerAndClampsItToTheSignedRange) {
   const std::pair<std::int64_t, Array> cases[] = {
       {1, {true, "1x"}},
       {-5, {-5}},
@@ -39,7 +39,7 @@ TEST(Value, IsTrueWhenItIsANumberOtherThanZero) {
   }
 }
 
-TEST(Value, HoldsAnIntegerAsSignedWhenItFits) {
+TEST(Value, StoresAnIntegerAsSignedIfItFits) {
   EXPECT_EQ(Value(std::uint64_t{5}), Value(5));
   EXPECT_EQ(Value(std::uint64_t{1} << 63).as<std::int64_t>(), nullptr);
   EXPECT_FALSE(Value(1) == Value(true));

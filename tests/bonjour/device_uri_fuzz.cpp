@@ -1,5 +1,5 @@
-// Reads each input as a device URI and as a URL. Then uses the input as a service's name, makes a
-// URI with it and, unless the name is ambiguous or not UTF-8, reads the name back.
+// Parses each input as a device URI and as a URL. Then makes a device URI of a service with the
+// input as its name, and reads the name back unless it is ambiguous or not UTF-8.
 
 #include <cstdint>
 #include <cstdlib>
@@ -22,8 +22,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   const std::string escaped = onramp::percentEscaped(text);
   const bool utf8 = onramp::isUTF8(text);
   if (onramp::percentUnescaped(escaped).has_value() != utf8) std::abort();
-  // Dots are not escaped in a URI. So the end of a name that contains a dot or ends in "_tcp" may
-  // be read as part of the service type.
+  // Dots are not escaped in a URI. If a name contains a dot or ends in "_tcp", its end may be read
+  // as part of the service type.
   const bool ambiguous = text.find('.') != std::string::npos || text.ends_with("_tcp");
   if (utf8 && !ambiguous) {
     const onramp::ServiceInstance whole{text, "_ipp._tcp.", "local."};

@@ -16,9 +16,8 @@ PATIENCE = 30  # the seconds after which a missing event counts as a failure
 
 
 def enclose(description):
-    """Does nothing if this program already runs on a practice network.
+    """Restarts this program on a practice network of two hosts, unless it already runs on one.
 
-    Otherwise replaces the process by one that runs the program on a practice network of two hosts.
     `description` is the network's description file.
     """
     if "ONRAMP_PRACTICE_SOCKET" in os.environ:
@@ -28,8 +27,8 @@ def enclose(description):
 
 
 class Search:
-    """A running `bonjour_probe search`. An event is the list of fields in a line of its output: the
-    time, a word such as "found", the device's name, and details."""
+    """A running `bonjour_probe search`. Each line of its output becomes an event, a list of fields:
+    the time, a word such as "found", the device's name, and details."""
 
     def __init__(self, probe, service_type, **options):
         self._process = subprocess.Popen([probe, "search", service_type + "."], text=True,
@@ -102,7 +101,7 @@ class Avahi:
 
     def start(self, **settings):
         """Starts the daemon. Each of `settings` replaces the setting of the same name in the
-        configuration file. The names here have "_" in place of "-"."""
+        configuration file. In the arguments' names, "_" stands for "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="
@@ -133,9 +132,9 @@ class Avahi:
 
 
 def announce_pointer(service_type, target_labels, seconds=4500):
-    """Announces one PTR record and no other record (RFC 6762 section 8.3). The record points from
-    `service_type` in the domain "local" to a name. `target_labels` are the labels of that name.
-    `seconds` is the record's time to live; 0 withdraws the record."""
+    """Announces a single PTR record (RFC 6762 section 8.3). The record points from `service_type`
+    in the domain "local" to the name with the labels `target_labels`. `seconds` is the record's
+    time to live; 0 withdraws the record."""
     name = _labels(*service_type.encode().split(b"."), b"local")
     target = _labels(*target_labels)
     packet = (struct.pack("!6H", 0, 0x8400, 0, 1, 0, 0) + name

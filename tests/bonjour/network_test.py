@@ -1,8 +1,8 @@
 """Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM
 
-The tests run on one of two hosts. Two cables, each with IPv4 and IPv6, join the hosts. On the other
-host, Avahi announces devices. On this host, one test announces a device with another mDNS
-implementation, zeroconf."""
+The tests run on one of two hosts. Two cables, each with IPv4 and IPv6, connect the hosts. On the
+other host, Avahi announces devices. One test announces a device from this host with zeroconf,
+another mDNS implementation."""
 
 import os
 import pathlib
@@ -34,8 +34,8 @@ def packets():
 
 
 def asked(seen, last):
-    """Waits for an SNMP request to `last`. Returns the destinations of all SNMP requests up to
-    it."""
+    """Waits for an SNMP request to the address `last`. Returns the destinations of all SNMP
+    requests up to this one."""
     addresses = []
     while last not in addresses:
         packet = seen.recv(100)
@@ -96,7 +96,7 @@ class NetworkTest(unittest.TestCase):
             self.assertEqual(search.wait_for("update", "Harrier (2)")[3:7:3],
                              ["Harrier Jet 7", "192.0.2.1"])
             responder.update_service(service(b"Jet 8"))
-            # Avahi notices the change after a while. Only a new search then reports it.
+            # Avahi notices the change after a while, but reports it only to new searches.
             model = None
             deadline = time.monotonic() + discovery.PATIENCE
             while model != "Harrier Jet 8" and time.monotonic() < deadline:
@@ -117,8 +117,8 @@ class NetworkTest(unittest.TestCase):
                         self.assertEqual(search.wait_for("update", "Dual")[6], "192.0.2.66")
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
-                        # Avahi announces a new device only after it has checked the device's name.
-                        # By then, all sightings of the removed device have ended.
+                        # Before Avahi announces a new device, it checks the device's name.
+                        # Meanwhile, all sightings of the removed device end.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],

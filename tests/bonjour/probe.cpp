@@ -1,9 +1,9 @@
-// Makes a search or a look-up on the network, and prints a line for each event: the seconds
-// since the start, a word for the event, and details. Tests and benchmarks run this program on a
-// practice network. A search ends at the end of the standard input.
+// Searches for services or looks up addresses, and prints a line for each event: the seconds since
+// the start, a word for the event, and details. A search ends when the standard input ends. Tests
+// and benchmarks run this program on a practice network.
 //
 //   bonjour_probe search TYPE            searches for services of TYPE with KSBonjourSearch
-//   bonjour_probe addresses URI SECONDS  looks up the addresses of the device that URI names
+//   bonjour_probe addresses URI SECONDS  looks up the addresses of the device with that URI
 
 #include <unistd.h>
 

@@ -99,8 +99,8 @@ TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // Only the first of the three removals counted. After the next resolve, it takes two more
-  // removals to remove the service.
+  // Only the first of the three removals counted. After the next resolve, two more removals remove
+  // the service.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());
@@ -260,7 +260,7 @@ TEST_F(SearchTest, AnObserverMayDestroyTheSearch) {
   EXPECT_THAT(network.browsers, IsEmpty());
 }
 
-TEST(Device, NoKeyOfTheRecordIsEverAbsent) {
+TEST(Device, EveryRecordHasAllKeys) {
   const Dictionary none = KSDevice::initWithService(nullptr, std::nullopt);
   EXPECT_EQ(none.size(), 8u);
   EXPECT_EQ(none.string(KSDevice::kModelName), " ");

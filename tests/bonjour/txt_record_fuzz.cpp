@@ -1,5 +1,5 @@
-// Reads each input as a TXT record. Then makes a record with up to 250 bytes of the input as an
-// attribute's value, and expects to read the same value from the record.
+// Parses each input as a TXT record. Then makes a record with up to 250 bytes of the input as an
+// attribute's value, parses the record, and expects the same value.
 
 #include <cstdint>
 #include <cstdlib>

@@ -1,16 +1,16 @@
 // Tells a test which controls are on the screen, because GNUstep has no accessibility interface. A
-// build with tests links this file into the application. The other half of the protocol is in
-// gnustep_person.py.
+// build with tests links this file into the application. gnustep_person.py asks for the controls
+// and reads the answer.
 //
 // The environment variable ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the test
-// creates a question file, whose name is that of the answer file with ".question" appended. The
+// creates a question file, whose name is the answer file's name with ".question" appended. The
 // application's main loop removes the question file and writes the answer file. The answer is a
-// JSON array. Its first object stands for the application. That object has the keys "role" (with
-// the value "application"), "name", "states" and "presses": how often the left mouse button was
-// pressed in one of the application's windows so far. Every other object stands for a visible
-// window or control, and has the keys "role", "name", "states", "x", "y", "width" and "height".
-// Roles and states have their AT-SPI names, except the state "cut off" of a text that lacks room.
-// Lengths are in pixels, and x and y start at the screen's upper left corner.
+// JSON array. Its first object stands for the application, and has the keys "role" (with the value
+// "application"), "name", "states" and "presses" (the number of left mouse button presses in its
+// windows so far). Every other object stands for a visible window or control, and has the keys
+// "role", "name", "states", "x", "y", "width" and "height". Roles and states have their AT-SPI
+// names, except that the state "cut off" marks a text that lacks room. Lengths are in pixels, and x
+// and y start at the screen's upper left corner.
 
 #include <unistd.h>
 
@@ -90,8 +90,8 @@ class Reader {
     }
   }
 
-  // Adds the state "cut off" if the text of `cell` does not fit into `room`. Leaves panels out,
-  // because GNUstep itself lays them out.
+  // Adds the state "cut off" if the text of `cell` does not fit into `room`. Skips texts in panels,
+  // because GNUstep itself lays panels out.
   void checkRoom(NSCell* cell, NSRect room, NSMutableArray* states) {
     const NSSize needed = [cell cellSizeForBounds:NSMakeRect(0, 0, NSWidth(room), kUnlimited)];
     const bool fits = needed.width <= NSWidth(room) && needed.height <= NSHeight(room);

@@ -1,7 +1,7 @@
-"""A person at the screen of the Cocoa front end under GNUstep.
+"""Lets tests use the Cocoa front end under GNUstep as a person would.
 
-GNUstep does not support AT-SPI. So this module asks the program itself which controls are visible. The
-question and the answer are files; accessibility.mm describes them.
+GNUstep does not support AT-SPI. So this module asks the program itself which controls are visible.
+accessibility.mm describes the files with the question and the answer.
 """
 
 import itertools
@@ -25,7 +25,7 @@ class GNUstepPerson(Person):
     """Starts a program on a desktop and uses its window. A `with` statement ends the program."""
 
     follows_desktop = False
-    errors = ()  # the use of a control that is gone raises no error
+    errors = ()  # using a control that is gone raises no error
 
     def __init__(self, desktop, program, arguments=(), env=None):
         self.desktop = desktop
@@ -57,10 +57,10 @@ class GNUstepPerson(Person):
         self._point_at(control)
         before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
-        # The mouse button stays down until the application has counted the press or `patience` has
-        # run out. Otherwise, GNUstep could find the mouse button up when it handles the press. The
-        # application cannot count a press inside an open menu, because the menu grabs the mouse. So
-        # the wait for such a press is short.
+        # Holds the mouse button down until the application has counted the press, for at most
+        # `patience` seconds. If the button were released sooner, GNUstep could find it up when it
+        # handles the press. The application cannot count a press inside an open menu, because the
+        # menu grabs the mouse. So the wait for such a press is short.
         patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
         deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:
@@ -106,10 +106,10 @@ class GNUstepPerson(Person):
         return self._at_rest(role, name)
 
     def _at_rest(self, role, name):
-        """Returns the control after two looks have found it in the same place.
+        """Returns the control once two looks in a row have found it unchanged.
 
-        The first look may be too early, because the window manager moves a new window. If a look does
-        not find the control, returns the result of the look before.
+        The first look may be too early, because the window manager moves a new window. If a look
+        does not find the control, returns the result of the previous look.
         """
         seen = None
         while True:
@@ -127,7 +127,7 @@ class GNUstepPerson(Person):
         self._read()
 
     def _read(self):
-        """Returns the visible controls, after an entry for the application.
+        """Returns an entry for the application and then the visible controls.
 
         Waits while the program's main loop is busy. Returns only the entry for the application if
         the program has ended. Fails if a text is cut off.
@@ -158,7 +158,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """Returns environment variables for `arguments`, because the Cocoa front end has no options."""
+        """Turns options into environment variables, because the Cocoa front end has no options."""
         if not arguments:
             return {}
         option, value = arguments

@@ -1,6 +1,5 @@
-"""Checks that texts of the example medium agree, and runs its set-up tool.
-
-onramp-check does neither.
+"""Checks two things on the example medium that onramp-check does not check: texts that name a
+button, and the exit status of the set-up tool.
 """
 
 import os
@@ -28,7 +27,7 @@ class Messages(unittest.TestCase):
 
 
 class Medium(unittest.TestCase):
-    def test_the_variable_sets_the_exit_status_of_the_set_up_tool(self):
+    def test_an_environment_variable_sets_the_exit_status_of_the_set_up_tool(self):
         information = plistlib.loads((TOOL / "Info.plist").read_bytes())
         program = TOOL / "MacOS" / information["CFBundleExecutable"]
         for told, status in (("", 1), ("0", 0), ("2", 2), ("255", 255), ("256", 64), ("x", 64)):

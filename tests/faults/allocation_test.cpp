@@ -16,8 +16,8 @@
 namespace onramp {
 namespace {
 
-// Expects that `work`, when one of its allocations fails, either throws std::bad_alloc or returns
-// the same as without the failure. The address sanitizer finds memory that is lost.
+// Makes the allocations of `work` fail. Expects `work` to throw std::bad_alloc, or to return the
+// same result as without a failure. The address sanitizer reports leaks.
 template <typename Work>
 void failEveryAllocation(const Work& work) {
   const auto expected = work();
@@ -38,7 +38,7 @@ void failEveryAllocation(const Work& work) {
 }
 
 TEST(AllocationFailure, AParserReturnsItsWholeResultOrThrows) {
-  // This text is too long for std::string to store without an allocation.
+  // The text is so long that std::string must allocate memory for it.
   const std::string text(40, 'x');
   const auto values = "<array><string>" + text + "</string><data>AAAA</data><real>1.5</real>" +
                       "<dict><key>" + text + "</key><integer>7</integer></dict></array>";

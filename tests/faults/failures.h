@@ -14,28 +14,28 @@
 
 namespace onramp::faults {
 
-/// Which calls of the functions that system_calls.cpp replaces are to fail, and how.
+/// Says which calls fail, and how. Only functions that system_calls.cpp replaces can fail.
 struct Failure {
   std::size_t first = 0;  ///< the number of the first call that fails, counted from 1
-  /// The error number of a call that fails. ENOMEM makes allocations fail and counts only these.
-  /// Any other value makes the other functions fail and counts only those.
+  /// The error number of a call that fails. With ENOMEM, only allocations are counted and fail;
+  /// with any other value, only calls of the other functions.
   int error = 0;
   bool isLasting = false;  ///< whether all later calls fail, too
 };
 
-/// Starts to count this thread's calls, and makes some of them fail as `failure` says.
+/// Starts counting this thread's calls, and makes calls fail as `failure` says.
 void begin(const Failure& failure);
 
-/// Lets all calls succeed again. Returns the names of the functions that were called since begin(),
-/// in their order.
+/// Stops counting, and lets all calls succeed again. Returns the function's name for every counted
+/// call since begin(), in order.
 std::vector<std::string> end();
 
-/// Calls `work` with its first call failing, then with its second, and so on until no call fails or
-/// the test has failed. Does this for each of `errors`, first with single failures and then, except
-/// for EINTR, with lasting failures. These also keep `work` from cleaning up, as if the process
-/// were killed. After each run, expects that no descriptor has been left open, and calls `check`
-/// with the name of the first call that failed and with the failure. The name is empty if no call
-/// failed. Returns the names of all calls.
+/// Runs `work` again and again. In the first run, the first call fails; in the second run, the
+/// second; and so on until no call fails or the test has failed. Does this for each of `errors`,
+/// first with single failures, then with lasting failures (except for EINTR). Lasting failures also
+/// keep `work` from cleaning up, as if the process were killed. After each run, expects that no
+/// descriptor is left open, and calls `check` with the name of the first call that failed and the
+/// failure. The name is empty if no call failed. Returns the names of all calls.
 template <typename Work, typename Check>
 std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Work& work,
                                     const Check& check) {
@@ -46,7 +46,7 @@ std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Wor
   std::set<std::string> seen;
   for (const int error : errors) {
     for (const bool isLasting : {false, true}) {
-      if (isLasting && error == EINTR) continue;  // interrupted calls are rightly repeated for ever
+      if (isLasting && error == EINTR) continue;  // callers rightly repeat such a call for ever
       std::string failed = "?";
       for (std::size_t number = 1; !failed.empty() && !testing::Test::HasFailure(); ++number) {
         const Failure failure{number, error, isLasting};

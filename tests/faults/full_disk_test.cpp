@@ -15,7 +15,7 @@ TEST(FullDisk, KeepsTheOldFileAndLeavesNoTemporaryFile) {
   const auto run = [&](const std::string& command) {
     EXPECT_EQ(std::system(("cd '" + folder / "' && " + command).c_str()), 0) << command;
   };
-  // The mount's options, and the command that leads to the failure.
+  // Each case has mount options and a command. After the command, writing a list fails.
   const std::pair<std::string, const char*> failures[] = {
       {"size=64k", "! head -c 1M /dev/zero > fill"},
       {"size=64k", "! head -c 1M /dev/zero > fill; truncate -s -8192 fill"},

@@ -95,7 +95,7 @@ TEST_F(Faults, DoNotStopTheWizardOrLeaveHalfAFile) {
   });
 }
 
-TEST_F(Faults, TheMainLoopMakesThePausesOfTheWaitIfNoThreadCanStart) {
+TEST_F(Faults, TheWizardWaitsWithTimersIfNoThreadCanStart) {
   describeTwoModels();
   launch();
   chooseModel("All");

@@ -1,4 +1,4 @@
-// What happens when the system refuses to make a process, a thread or a descriptor.
+// Tests what happens when the system refuses to create a process, a thread or a descriptor.
 
 #include <gtest/gtest.h>
 #include <signal.h>
@@ -29,7 +29,8 @@ bool search() {
 
 bool resolve() {
   const auto service = NetService::create("local.", "_ipp._tcp.", "Kestrel", 0);
-  EXPECT_FALSE(service->resolveWithTimeout(std::chrono::milliseconds(1))) << "it is not there";
+  EXPECT_FALSE(service->resolveWithTimeout(std::chrono::milliseconds(1)))
+      << "no such service exists";
   service->setClient([](const auto&, const auto&, void*) {}, nullptr);
   return service->resolveWithTimeout(std::chrono::seconds(1));
 }
@@ -58,7 +59,7 @@ TEST(Scarcity, MakesAFunctionFailAndDoesNoOtherHarm) {
   }
 }
 
-// The main loop keeps a source, and with it its descriptors, until the process ends.
+// The main loop keeps the source's descriptors open, so this test cannot use failEveryCall().
 TEST(Scarcity, LeavesAStoreWithoutNotifications) {
   const std::vector<std::string> keys{"State:/Network/Global/IPv4"};
   const DynamicStoreRef store = createDynamicStore("test");

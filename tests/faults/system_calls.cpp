@@ -1,6 +1,5 @@
-// Replaces functions of the C library and the allocation of memory, for the program that links this
-// file and for its libraries. Except for close and fsync, each function either fails or calls the
-// one that it replaces.
+// Replaces `operator new` and functions of the C library, in the program that links this file and
+// in its libraries. Each replacement except close and fsync either fails or calls the original.
 
 #include <dirent.h>
 #include <dlfcn.h>
@@ -39,15 +38,15 @@ Function* original(const char* name) {
   return reinterpret_cast<Function*>(dlsym(RTLD_NEXT, name));
 }
 
-// Returns `failure` and sets `errno` when the call is to fail, otherwise returns the result of the
-// function.
+// If the call must fail, sets `errno` and returns `failure`. Otherwise returns the result of the
+// original function `name`.
 template <typename Result, typename... Parameters>
 Result call(const char* name, Result failure, Parameters... arguments) {
   const bool isFailing = fails(name);
   Result result{};
-  // Linux closes a descriptor even when it reports an error, so a close that fails closes, too. No
-  // fsync flushes, because flushes would take most of the tests' time and change nothing that the
-  // tests see.
+  // Linux closes a descriptor even when close() reports an error, so a failing close() closes it
+  // here, too. fsync() never flushes, because flushing would take most of the tests' time and has
+  // no effect that they can see.
   if ((!isFailing && std::string_view(name) != "fsync") || std::string_view(name) == "close") {
     result = original<Result(Parameters...)>(name)(arguments...);
   }

@@ -1,5 +1,5 @@
-// Tests how corefoundation, cfnetwork and systemconfiguration use the frameworks' objects. The
-// folder frameworks/ has stand-ins for the frameworks.
+// Tests how corefoundation, cfnetwork and systemconfiguration in platform/ use the objects of the
+// macOS frameworks. The folder frameworks/ has stand-ins for these frameworks.
 
 #include <CoreServices/CoreServices.h>
 #include <SystemConfiguration/SystemConfiguration.h>
@@ -168,7 +168,7 @@ TEST(CFNetworkService, IsNotCreatedFromTextsThatAreNotUTF8) {
   EXPECT_EQ(corefoundation::toCFArray({"a", "\xFF", "b"}).get()->members.size(), 2U);
 }
 
-TEST(SystemConfigurationStore, MakesKeysAsksByPatternsAndOmitsValuesOfUnknownTypes) {
+TEST(SystemConfigurationStore, MakesKeysQueriesPatternsAndOmitsValuesOfUnknownTypes) {
   const DynamicStoreRef store = createDynamicStore("test");
   const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
   EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");

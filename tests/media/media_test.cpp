@@ -114,7 +114,7 @@ TEST(InstallerInformation, HasADefaultForEveryMissingPart) {
   EXPECT_EQ(sparse.supportSystemMax(), unbounded);
   EXPECT_EQ(sparse.supportSystemMin(), minimum);
   EXPECT_EQ(sparse.WLANtoolURL(), FileURL{medium.path("").substr(0, medium.path("").size() - 1)})
-      << "without a tool, the path is that of the folder that holds the application";
+      << "without a tool, the result is the folder that holds the application";
 }
 
 }  // namespace

@@ -1,5 +1,5 @@
-// Compares what netconfig/ and the dynamic store report with the network configuration of the
-// kernel. Runs as root in a new network namespace; see tests/in_namespace.
+// Checks that netconfig/ and the dynamic store report the kernel's network configuration. Runs as
+// root in a new network namespace; see tests/in_namespace.
 
 #include <gmock/gmock.h>
 
@@ -42,8 +42,8 @@ std::vector<std::string> entriesOf(const local_address_list& list) {
 
 class Kernel : public ::testing::Test {
  protected:
-  // Makes two pairs of connected interfaces, near and far, left and right. All are up and in this
-  // namespace.
+  // Makes two pairs of connected interfaces: near and far, and left and right. All are up and in
+  // this namespace.
   void SetUp() override {
     recording::resetLoop();
     ip("link set lo up");
@@ -63,8 +63,8 @@ class Kernel : public ::testing::Test {
 
 const char* const kLoopback = "127.0.0.1,|255.0.0.0,||";
 
-// Each scenario has a name, the commands that set it up, the expected entries without that of the
-// loopback interface, and the primary interface.
+// Each scenario has a name, the commands that set it up, the expected entries of all interfaces but
+// loopback, and the expected primary interface, which is empty if there is none.
 const std::tuple<const char*, std::vector<const char*>, std::vector<std::string>, const char*>
     kScenarios[] = {
         {"addresses of several kinds, and a route that is no default route",

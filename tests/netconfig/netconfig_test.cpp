@@ -1,5 +1,5 @@
-// Tests netconfig/ with a simulated dynamic store. kernel_test.cpp tests it with the kernel's
-// configuration.
+// Tests netconfig/ with a simulated dynamic store. kernel_test.cpp tests netconfig/ with the
+// kernel's configuration.
 
 #include <gtest/gtest.h>
 
@@ -16,13 +16,13 @@
 namespace onramp {
 namespace {
 
-/// A simulated dynamic store. The test sets its contents and makes it fail.
+/// A simulated dynamic store. A test sets its contents and can make it fail.
 struct Store {
   Dictionary contents;
   std::string failing;  ///< the step that fails: "create", "key" or "copy"
   int error = 0;
-  DynamicStoreCallback callback;  ///< the one that was passed last
-  bool hasAddedNull = false;      ///< whether the latest source was null
+  DynamicStoreCallback callback;  ///< the latest callback
+  bool hasAddedNull = false;      ///< whether the source added last was null
 
   void change(Dictionary newContents) {
     contents = std::move(newContents);
@@ -118,7 +118,7 @@ TEST_F(Netconfig, ListHoldsTheAddressArraysOfEveryInterface) {
 
   const auto before = list;
   EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(nullptr), 1);
-  EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(&list), 1) << "there is a list already";
+  EXPECT_EQ(KSSysConfigCopyCurrentLocalAddressList(&list), 1) << "`list` holds a list already";
   EXPECT_EQ(list, before);
 }
 

@@ -73,7 +73,7 @@ TEST_F(Chooser, ShowsItsTextsAndItsMenu) {
     return titles;
   };
   EXPECT_THAT(commands(), ElementsAre("Gear", "Setup...", "again"))
-      << "a tool without a display name has its file name";
+      << "the menu shows the file name of a tool without a display name";
   medium.addSetUpTool(0);
   load();
   EXPECT_THAT(commands(), ElementsAre("Gear", "Wireless Setup...", "again"));
@@ -84,7 +84,7 @@ TEST_F(Chooser, ShowsItsTextsAndItsMenu) {
   EXPECT_THAT(commands(), ElementsAre("Gear", "Einrichtung...", "again"));
 }
 
-TEST_F(Chooser, ListsOnlyDevicesOfTheModelsLookedFor) {
+TEST_F(Chooser, ListsOnlyDevicesOfTheModelsItSearchesFor) {
   const std::tuple<const char*, const char*, bool> cases[] = {{"Kestrel", "Model 100", true},
                                                               {"Kestrel Model", "100", true},
                                                               {"kestrel", "Model 100", false},
@@ -98,7 +98,7 @@ TEST_F(Chooser, ListsOnlyDevicesOfTheModelsLookedFor) {
     page->updateKSDevice(found);
     EXPECT_EQ(page->deviceArrayControllerCnt(), listed ? 1U : 0U) << maker << '|' << model;
     EXPECT_EQ(agents.asked.size(), listed ? 1U : 0U)
-        << "only a device of a model looked for is asked";
+        << "the chooser asks only devices of these models";
     page->removeKSDevice(found);
     EXPECT_THAT(rows(), IsEmpty());
   }
@@ -121,8 +121,8 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWireless}, {kWired}}, {6, 1, 0}, true},
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
-      // An address that leaves one request unanswered is tried three times, even if it answers
-      // later requests. If this is so for every address, the last try of the last address decides.
+      // An address that leaves any request unanswered is tried three times, even if it answers
+      // later requests. If every address does so, the last try of the last address decides.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},
@@ -163,8 +163,7 @@ TEST_F(Chooser, AnUpdateWithAnotherAddressKeepsTheOldEntry) {
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*", "D 192.0.2.2"));
   page->removeKSDevice(device("D", {"192.0.2.2"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
-  // The record of the listed entry has two addresses, so a record with only one of them is not
-  // equal.
+  // The listed record has two addresses, so it does not equal a record with only one of them.
   page->removeKSDevice(device("D", {"192.0.2.1"}));
   EXPECT_THAT(rows(), ElementsAre("D 192.0.2.1*"));
 }

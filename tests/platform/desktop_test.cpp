@@ -68,8 +68,8 @@ TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   recording::MediumFolder medium;
   const std::string gate = medium.path("gate");
   const std::string opened = medium.path("opened");
-  // The opener waits for input from the pipe `gate`. Then it writes the number of its arguments,
-  // the first argument, and whether it leads a session, to the file `opened`.
+  // The opener waits for input from the pipe `gate`. Then it writes to the file `opened`: the
+  // number of its arguments, the first argument, and whether it leads its own session.
   medium.write("bin/xdg-open", "#!/bin/sh\ntimeout 60 cat '" + gate +
                                    "' > /dev/null\nwords=\"$#:$1\"\n" +
                                    "read -r line < /proc/$$/stat\nset -- $line\n" +
@@ -116,7 +116,7 @@ TEST(Desktop, OpensNothingWithoutAnOpener) {
   }
 }
 
-TEST(Desktop, StartsProgramsWithoutIgnoredSignals) {
+TEST(Desktop, StartsProgramsWithNoSignalIgnored) {
   surviveFailedWrites();
   EXPECT_EQ(runAndWait("/usr/bin/grep", {"-q", "^SigIgn:.*0000000$", "/proc/self/status"}), 0);
 }

@@ -4,8 +4,8 @@
 
 #include "platform/libplist/parse.h"
 
-// Reads the input, writes it and reads it back. From then on, writing and reading must change
-// nothing. The first writing may change texts and dates, because XML cannot hold all of them.
+// Parses each input, writes it as XML, and parses the XML. A second round must change nothing. The
+// first round may change texts and dates, because XML cannot hold all of them.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
   using namespace onramp;
   const auto value =

@@ -20,7 +20,7 @@ std::string bigEndian(std::size_t number, int bytes = 4) {
   return text;
 }
 
-// Returns a binary list of `objects`, whose root is the first object.
+// Returns a binary property list of `objects`, the first of which is the root.
 std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
                    int referenceSize = 4) {
   std::string bytes = "bplist00";
@@ -35,8 +35,8 @@ std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
          bigEndian(0, 8) + bigEndian(table, 8);
 }
 
-// Returns a binary list whose root is a dictionary with one value, object 2. `object` returns the
-// bytes of object 2 and of the objects after it, `count` in all.
+// Returns a binary list whose root is a dictionary with one value, object 2. The list has `count`
+// objects from object 2 on. `object(i)` returns the bytes of object i.
 std::string dictionaryOver(std::size_t count,
                            const std::function<std::string(std::size_t)>& object) {
   std::vector<std::string> objects{"\xD1" + bigEndian(1) + bigEndian(2), "\x51k"};
@@ -83,7 +83,7 @@ TEST(Limits, AHostileFileIsRefusedAtLittleCost) {
                       })},
       {"two arrays that hold each other",
        dictionaryOver(2, [](std::size_t i) { return "\xA1" + bigEndian(5 - i); })}};
-  // Each file is loaded in a process of its own, whose peak memory shows what the loading costs.
+  // Loads each file in a new process, so that the process's peak memory shows the cost of loading.
   rusage usage{};
   const auto load = [&](const std::string& bytes) {
     const std::string path = folder.holding("list", bytes);

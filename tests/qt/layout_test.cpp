@@ -31,8 +31,8 @@ std::string nameOf(const QWidget& widget) {
   return widget.objectName().toStdString();
 }
 
-/// The wizard's window in one font size, with the texts of the process's language. A process has
-/// only one language, because the language decides which fonts Qt loads.
+/// Shows the wizard's window in one font size and in the process's language. Each language needs
+/// its own process, because the language decides which fonts Qt loads.
 class Layout : public testing::TestWithParam<int> {
  protected:
   void SetUp() override {
@@ -71,7 +71,7 @@ class Layout : public testing::TestWithParam<int> {
     return {widget.mapTo(window, QPoint()), widget.size()};
   }
 
-  // Expects that no text is cut off, except devices' names, and that all columns are visible.
+  // Expects that all columns are visible, and that no text but a device's name is cut off.
   static void expectColumnsFit(QTreeView& tree) {
     int width = 0;
     for (int column = 0; column < tree.header()->count(); ++column) {
@@ -153,7 +153,7 @@ class Layout : public testing::TestWithParam<int> {
   QWidget* window = nullptr;
 };
 
-TEST_P(Layout, ControlsFitTheScreenAndTheirTextsAndDoNotOverlap) {
+TEST_P(Layout, ControlsHaveRoomForTheirTextsFitTheScreenAndDoNotOverlap) {
   delegate->showModelListView();
   delegate->setModelListViewButton();
   expectEverythingFits();

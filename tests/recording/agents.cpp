@@ -20,7 +20,7 @@ namespace recording {
 
 namespace {
 
-// Returns the reply that answers a request for one object with `value`.
+// Returns a reply with `value` to a request for one object.
 Agents::Bytes answerTo(const Agents::Bytes& request, int value) {
   Message message(1);
   if (message.decode(request)) std::abort();

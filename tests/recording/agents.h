@@ -13,8 +13,8 @@
 
 namespace onramp::recording {
 
-/// SNMP agents that replace the system's sockets. They answer at once with the values that a test
-/// has set. Waiting for an answer that does not come takes no time.
+/// Simulated SNMP agents, which replace the system's sockets. They answer at once with the values
+/// that a test has set. A wait for an answer that never comes takes no time.
 class Agents {
  public:
   static constexpr int kSilent = -1;
@@ -24,11 +24,11 @@ class Agents {
 
   static Agents& instance();
 
-  /// Returns to the initial state, in which no address answers.
+  /// Restores the initial state, in which no address answers.
   void reset() { *this = Agents(); }
 
-  /// For each dotted address, the values with which its agent answers, in order. The agent answers
-  /// all further requests with the last value.
+  /// For each dotted address, the agent's answers in order. The last value also answers all further
+  /// requests.
   std::map<std::string, std::vector<int>> answers;
 
   /// If this function is set, it returns the reply to every request, and `answers` is not used.
@@ -41,8 +41,8 @@ class Agents {
   std::size_t room = 0;            ///< the size of the program's reply buffer, in bytes
   std::vector<std::chrono::nanoseconds> waits;  ///< the time limit of every wait
 
-  /// Removes and returns the next value of `address` in `answers`, but does not remove the last
-  /// value. Returns kSilent when the address has no values.
+  /// Returns the next value of `address` in `answers`, and removes it unless it is the last one.
+  /// Returns kSilent when the address has no values.
   [[nodiscard]] int nextAnswer(const std::string& address);
 };
 

@@ -50,15 +50,15 @@ struct ShownAlert {
   std::string buttonTitle;
 };
 
-/// A front end without a screen, and a desktop that opens nothing but reports success. The front
-/// end records what the program shows and asks for, and plays the user and the clock. Alerts return
-/// at once. Time passes only in runTimers(). sleepOffMainThread() does not sleep; it records the
-/// pause and calls `duringPause`.
+/// Replaces the screen, the desktop, the user and the clock. Records what the program shows and
+/// opens. Opening a file or an address always succeeds, and alerts return at once. Time passes only
+/// in runTimers(). sleepOffMainThread() does not sleep; it records the pause and calls
+/// `duringPause`.
 class FrontEnd {
  public:
   static FrontEnd& instance();
 
-  /// Returns to the state of a new process, but keeps the objects of pages that still exist.
+  /// Restores the state of a new process, but keeps the objects of pages that still exist.
   void reset();
 
   /// Launches the application for `delegate` as the platform does, up to the point where it waits
@@ -87,12 +87,12 @@ class FrontEnd {
   std::vector<std::pair<AlertSheet, std::function<void(int)>>> sheets;  ///< with their handlers
   std::vector<unsigned> pauses;     ///< the length of every sleepOffMainThread(), in seconds
   std::vector<double> delays;       ///< the delay of every timer, in seconds
-  std::vector<std::string> opened;  ///< every path and address that was to be opened
+  std::vector<std::string> opened;  ///< every path and address that the program opened
   bool terminated = false;
 
   // What a test sets up.
   std::set<std::string> missingInterfaces;  ///< the interface files that cannot be loaded
-  /// Called on the main thread during each pause, with the number of the pause, which starts at 1.
+  /// Called on the main thread during each pause. `pause` counts the pauses from 1.
   std::function<void(int pause)> duringPause;
   /// Called when the program opens a file or an address.
   std::function<void()> duringOpening;

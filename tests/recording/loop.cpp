@@ -91,7 +91,7 @@ void abortModal() {
 }
 
 bool sleepOffMainThread(std::chrono::milliseconds duration) {
-  // The pause ends when the main thread has called the test's `duringPause`.
+  // The pause ends once the main thread has called the test's `duringPause`.
   const auto passed = std::make_shared<bool>(false);
   performOnMainThread([duration, passed] {
     recording::FrontEnd& frontEnd = recording::FrontEnd::instance();

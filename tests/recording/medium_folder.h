@@ -13,11 +13,11 @@ namespace onramp::recording {
 
 /// A temporary folder that holds a medium and the application-support folders. The medium holds the
 /// running application's bundle. The destructor removes the folder and restores the environment
-/// variables that this object has set.
+/// variables that this object has changed.
 class MediumFolder {
  public:
-  /// Makes a medium with an application bundle and nothing else. Sets the environment variables for
-  /// the application-support folders, for English texts and for macOS 10.9.5.
+  /// Makes a medium that holds only an application bundle. Sets the environment variables that
+  /// select the application-support folders, English texts and macOS 10.9.5.
   MediumFolder();
   MediumFolder(const MediumFolder&) = delete;
   MediumFolder& operator=(const MediumFolder&) = delete;
@@ -28,18 +28,19 @@ class MediumFolder {
     return root_ / "medium/" + relative;
   }
 
-  /// Write a file on the medium. The file's folder is created if it is missing.
+  /// Write a file on the medium, and create its folder if that is missing.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
-  /// Lets the user run the file `relative` on the medium.
+  /// Makes a file on the medium executable by its owner.
   void makeExecutable(const std::string& relative) const;
 
-  /// Writes the medium's three property lists. Adds the entries "CDInfo", "ModelInfo" and
-  /// "VenderName" ("Kestrel Imaging") to `resources`.
+  /// Writes the medium's three property lists. To `resources`, adds the entries "CDInfo",
+  /// "ModelInfo" and "VenderName" ("Kestrel Imaging"). `modelInfo` maps models' names to their
+  /// entries.
   void describe(const Dictionary& resources, const Dictionary& cdInfo,
                 const Dictionary& modelInfo) const;
 
-  /// Puts on the medium a set-up tool that records its arguments and exits with `status`.
+  /// Adds a set-up tool to the medium. The tool records its arguments and exits with `status`.
   void addSetUpTool(int status) const;
 
   /// Returns the arguments of the tool's last run, or an empty text when the tool has not run.
@@ -68,7 +69,7 @@ class MediumFolder {
 /// Returns a model's entry in the model information, with the identifier "k1".
 [[nodiscard]] Dictionary model(bool usb, bool wired, bool wireless);
 
-/// Returns a medium description that contains the models with these names.
+/// Returns the contents of a CDInfo.plist that lists the models with these names.
 [[nodiscard]] Dictionary containing(const std::vector<std::string>& models);
 
 }  // namespace onramp::recording

@@ -8,13 +8,13 @@
 
 namespace onramp::recording {
 
-/// A scripted network. A test says which services are found, resolved and gone, and sees what the
-/// program asked for. Events reach the program at once, as if they came from the main loop.
+/// A scripted network. A test reports services as found, resolved and gone, and sees what the
+/// program asked for. The program gets each event at once, as if from the main loop.
 class Network {
  public:
   static Network& instance();
 
-  /// Returns to the initial state. Earlier browsers get no more events.
+  /// Restores the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
   /// Makes a service like those that a browser passes to its client.
@@ -37,7 +37,7 @@ class Network {
                    std::optional<Data> txt);
 
   /// The addresses that a resolve without a client finds. A key is a service's full name, such as
-  /// "Office._ipp._tcp.local.". Such a resolve of any other service fails.
+  /// "Office._ipp._tcp.local.". A resolve of any other service fails if it has no client.
   std::map<std::string, std::vector<Data>> answers;
 
   bool searchesStart = true;                 ///< when false, no search can be started

@@ -1,7 +1,7 @@
 """Checks the application's resources, because the program and macOS ignore most mistakes in them.
 
-The sources look up outlets, actions, bound titles, columns and menu items. The interface files of both
-front ends must have them all. The interface files for macOS must have the frames, cells and fonts that
+The interface files of both front ends must have all outlets, actions, bound titles, columns and menu
+items that the sources look up. The interface files for macOS must have the frames, cells and fonts that
 Xcode writes, and the information dictionary must have the entries that current versions of macOS need.
 """
 
@@ -173,7 +173,7 @@ class CocoaFiles(unittest.TestCase):
                     self.assertIsNotNone(element.find("autoresizingMask"), name)
                 if element.tag in ("textField", "button", "imageView", "popUpButton"):
                     self.assertIsNotNone(element.find("*[@key='cell']"), name)
-                if element.tag == "font":  # GNUstep replaces a missing size with its own
+                if element.tag == "font":  # GNUstep replaces a missing size with its default
                     self.assertTrue(element.get("metaFont") and element.get("size"), name)
 
     def test_scroll_views_and_tables_have_the_right_properties(self):

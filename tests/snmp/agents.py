@@ -1,8 +1,8 @@
 """Runs a command on a loopback network with SNMP agents: agents.py COMMAND [ARGUMENT ...]
 
 Must run as root in a new network namespace; see tests/in_namespace. The agents at 127.0.1.1 and
-127.0.2.1 answer at once, the one at 127.0.1.8 after four seconds. Requests to 127.0.2.1 are first
-answered by two other sockets. The exit status is that of the command."""
+127.0.2.1 answer at once, and the agent at 127.0.1.8 after four seconds. Two other sockets answer
+each request to 127.0.2.1 before the agent does. The exit status is that of the command."""
 
 import socket
 import subprocess
@@ -20,8 +20,8 @@ def bound_to(address, port=161):
 
 
 def serve(address, number, seconds=0, strangers=()):
-    """Starts an agent that answers `number` after `seconds`. Just before, each socket in
-    `strangers` answers 1."""
+    """Starts an agent that answers each request with `number` after `seconds`. Just before that,
+    each socket in `strangers` answers with 1."""
     agent = bound_to(address)
 
     def answer():

@@ -1,4 +1,5 @@
-// Queries the agents of agents.py over real sockets. agents.py starts them and runs this program.
+// Queries the agents of agents.py over real sockets. agents.py starts the agents and then this
+// program.
 
 #include <gtest/gtest.h>
 

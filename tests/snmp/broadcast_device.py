@@ -1,7 +1,7 @@
-"""Plays a device that answers the first request on port 161: broadcast_device.py KIND
+"""Simulates a device that answers one SNMP request: broadcast_device.py KIND
 
-KIND is the number to answer, or "stutter" or "flood" for a device that answers many times.
-Some replies of "stutter" are malformed."""
+KIND is the number to answer with. The kinds "stutter" and "flood" answer many times instead. Some
+of the replies of "stutter" are malformed."""
 
 import socket
 import sys
@@ -14,8 +14,8 @@ SEVEN = reply(IDENTIFIER, 7)
 TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
 NO_BINDINGS = SEVEN[:27] + b"\0"
 
-# The datagrams that these two kinds send, with the seconds since the request. A search listens for
-# 5 to 8 seconds, so it must miss the last datagram of "stutter".
+# The datagrams of the kinds that answer many times, each after its time in seconds since the
+# request. A search listens for 5 to 8 seconds, so it must miss the last datagram of "stutter".
 REPLIES = {
     "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)),
                 (0, TEXT), (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN),

@@ -23,9 +23,9 @@ std::vector<std::uint8_t> written(Put put) {
   return {bytes.end() - static_cast<std::ptrdiff_t>(out.size()), bytes.end()};
 }
 
-TEST(Integers, TakeTheFewestBytesAndSizeDecidesHowTheyAreSignExtended) {
-  // Each row has the number, its encoding, and the results of ber_get_int() and ber_get_uint().
-  // ber_put_int() sets its argument to the last one, too.
+TEST(Integers, TakeTheFewestBytesAndAreSignExtendedDependingOnTheirSize) {
+  // Each row has a number, its encoding, and the numbers that ber_get_int() and ber_get_uint() read
+  // from the encoding. ber_put_int() sets its argument to the last number.
   const std::tuple<std::int64_t, const char*, std::int64_t, std::uint64_t> cases[] = {
       {127, "02 01 7F", 127, 127},
       {128, "02 02 00 80", 128, 128},
@@ -56,7 +56,7 @@ TEST(Integers, TakeTheFewestBytesAndSizeDecidesHowTheyAreSignExtended) {
             hex("42 05 00 80 00 00 00"));
 }
 
-TEST(Lengths, HaveThreeFormsAndNoOther) {
+TEST(Lengths, HaveExactlyThreeForms) {
   const std::pair<std::uint16_t, const char*> forms[] = {{0, "00"},         {127, "7F"},
                                                          {128, "81 80"},    {255, "81 FF"},
                                                          {256, "82 01 00"}, {65535, "82 FF FF"}};
@@ -75,7 +75,7 @@ TEST(Lengths, HaveThreeFormsAndNoOther) {
   }
 }
 
-TEST(ObjectIdentifiers, PackTwoArcsInOneByteAndHaveAtMost255BytesOfContent) {
+TEST(ObjectIdentifiers, PackTheFirstTwoArcsInOneByteAndHaveAtMost255BytesOfContent) {
   const auto put = [](std::vector<std::uint16_t> arcs) {
     const auto count = static_cast<std::uint16_t>(arcs.size());
     return written([&](ber_writer& out) { return ber_put_oid(out, {count, count, arcs.data()}); });
@@ -136,7 +136,8 @@ TEST(Decoding, ReadsARealReplyInPlaceAndRefusesATruncatedOne) {
 
 TEST(Decoding, AcceptsEveryFormOfValue) {
   const std::pair<const char*, const char*> cases[] = {
-      // The second text has the type, the number, the count of arcs, and the string.
+      // Each row has an encoded value and the decoded type, number, count of arcs, and string.
+      // "cleared" is a null string, and "####" an unchanged one.
       {"01 01 FF", "1 -1 4 cleared"},
       {"02 02 80 00", "2 -32768 4 cleared"},
       {"41 03 80 00 01", "65 4286578689 4 cleared"},
@@ -164,7 +165,7 @@ TEST(Decoding, AcceptsEveryFormOfValue) {
   }
 }
 
-TEST(Decoding, StoresStringsEndToEndAndNotPastTheirBuffer) {
+TEST(Decoding, StoresStringsEndToEndAndNeverPastTheirBuffer) {
   const auto reply = replyWith(
       "30 00 06 01 2B 04 03 61 62 63  30 00 06 01 2B 02 01 05  30 00 06 01 2B 40 04 64 65 66 67"
       "30 00 06 01 2B 44 02 78 79");
@@ -183,7 +184,7 @@ TEST(Decoding, StoresStringsEndToEndAndNotPastTheirBuffer) {
   }
 }
 
-TEST(Decoding, RefusesWhatIsMalformedOrDoesNotFitAndAcceptsTheRest) {
+TEST(Decoding, RefusesMalformedOrOversizedMessagesAndAcceptsTheRest) {
   const std::string head = "02 01 00 04 00", pdu = "02 01 07 02 01 00 02 01 00",
                     bindings = "30 00 06 01 2B 05 00 30 00 06 01 2B 02 01 02",
                     list = head + "a2 1A" + pdu + "30";
@@ -203,7 +204,7 @@ TEST(Decoding, RefusesWhatIsMalformedOrDoesNotFitAndAcceptsTheRest) {
       {"indefinite length", hex("30 80" + head + "a2 80" + pdu + "30 00 00 00"), -1},
       {"zeros, as after a time-out", hex("00 00 00 00"), -1},
       {"as many arcs as fit", replyWith("30 7F 06 03 2B 06 01 05 00"), 1},
-      {"one arc more", replyWith("30 00 06 04 2B 06 01 04 05 00"), -1},
+      {"one arc too many", replyWith("30 00 06 04 2B 06 01 04 05 00"), -1},
       {"largest arc", replyWith("30 00 06 04 2B 83 FF 7F 05 00"), 1},
       {"arc above 16 bits", replyWith("30 00 06 04 2B 84 80 00 05 00"), -1},
       {"arc that wraps 32 bits", replyWith("30 00 06 07 2B 90 80 80 80 80 01 05 00"), -1},
@@ -244,7 +245,7 @@ TEST(Encoding, RefusesMessagesThatExceedTheBufferOr16BitLengths) {
   EXPECT_TRUE(m.encode().empty());
 }
 
-// Returns what net-snmp finds in a message: the PDU's type, the request identifier, and the type
+// Returns what net-snmp reads from a message: the PDU's type, the request identifier, and the type
 // and value of each binding. Returns "refused" when net-snmp cannot read the message.
 std::string readByNetSnmp(std::vector<std::uint8_t> bytes) {
   netsnmp_session session{};
@@ -282,7 +283,7 @@ TEST(NetSnmpReads, RequestsWithAndWithoutABinding) {
   EXPECT_EQ(readByNetSnmp(m.encode()), "163 7");
 }
 
-TEST(NetSnmpReads, EveryTypeOfValueOfSnmpv1) {
+TEST(NetSnmpReads, EveryValueTypeOfSNMPv1) {
   const std::uint16_t arcs[] = {1, 3, 127, 128, 16383, 16384, 65535};
   const std::uint8_t types[] = {2, 65, 66, 67, 2, 4, 64, 68, 6, 5};
   Message m(std::size(types), std::size(arcs));

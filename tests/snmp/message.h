@@ -30,7 +30,8 @@ inline std::vector<std::uint8_t> realReply() {
 }
 
 /// Returns the bytes of a reply to request 7. `bindings` is the hexadecimal text of the reply's
-/// bindings, at most 255 bytes. Some of the declared lengths in the reply are 0.
+/// bindings, at most 255 bytes. The reply declares some lengths as 0, but the decoder ignores
+/// those.
 inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8_t errorStatus = 0,
                                            std::uint8_t errorIndex = 0) {
   const auto list = hex(bindings);
@@ -42,9 +43,9 @@ inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8
   return reply;
 }
 
-/// A request with `bindings` NULL bindings, all named 1.3.1.1…, and the storage for a reply. Each
-/// name has room for `arcsEach` arcs, and all strings together for `stringBytes` bytes. The heap
-/// blocks have no spare room, so that the sanitizers report an access past the end.
+/// A request whose `bindings` bindings have the value NULL and the name 1.3.1.1…, and the storage
+/// for a reply. Each name has room for `arcsEach` arcs. All strings share `stringBytes` bytes. The
+/// heap blocks have no spare room, so the sanitizers report an access past the end.
 struct Message {
   explicit Message(std::size_t bindings, std::uint16_t arcsEach = 14,
                    std::uint16_t stringBytes = 1500)

@@ -1,4 +1,5 @@
-// Sends queries, get and set requests to simulated agents; see tests/recording/agents.h.
+// Sends table queries, get requests and set requests to the simulated agents of
+// tests/recording/agents.h.
 
 #include "snmp/query.h"
 
@@ -26,7 +27,7 @@ class Query : public testing::Test {
  protected:
   void SetUp() override {
     agents.reset();
-    snmp_request_counter = 7;  // the identifier in the replies of replyWith()
+    snmp_request_counter = 7;  // replyWith() makes replies to request 7
   }
   void TearDown() override {
     snmp_oid& name = active_interface_table.entries[0].oid;
@@ -41,8 +42,8 @@ class Query : public testing::Test {
   Agents& agents = Agents::instance();
 };
 
-// Makes a query and returns its results as text: the numbers or "nothing", "no reply" if that flag
-// is set, the error status and the error index.
+// Queries `address` and returns the results as text: the keys and numbers, or "nothing"; "no reply"
+// if that flag is set; the error status; and the error index.
 std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
   bool noReply = false;
   std::int32_t status = -1;
@@ -57,7 +58,7 @@ std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
          " " + std::to_string(index);
 }
 
-// Returns a binding with the name 1.3 and the value `value`. Both texts are hexadecimal.
+// Returns the hexadecimal text of a binding with the name 1.3 and the hexadecimal value `value`.
 std::string binding(const std::string& value) {
   return "30 00 06 01 2B " + value;
 }
@@ -70,14 +71,14 @@ TEST_F(Query, BuildsTheResultFromTheValuesThatATableAsksFor) {
   stale[11] = 6;
   const std::tuple<const char*, Agents::Bytes, const char*> cases[] = {
       {"two integers", replyWith(one + two), "one 5 two -2147483648 0 0"},
-      {"a refused value before another", replyWith(text + two), "two -2147483648 0 0"},
-      {"a refused value at the end", replyWith(one + text), "nothing 0 0"},
-      {"a counter for an integer", replyWith(one + binding("41 01 02")), "nothing 0 0"},
+      {"an unusable value before a usable one", replyWith(text + two), "two -2147483648 0 0"},
+      {"an unusable value at the end", replyWith(one + text), "nothing 0 0"},
+      {"a counter instead of an integer", replyWith(one + binding("41 01 02")), "nothing 0 0"},
       {"a missing value", replyWith(one), "nothing 0 0"},
       {"no values", replyWith(""), "nothing 0 0"},
-      {"a refusal", replyWith(one + two, 2, 3), "nothing 2 3"},
+      {"an error status", replyWith(one + two, 2, 3), "nothing 2 3"},
       {"one value too many", replyWith(one + two + one), kNoReply},
-      {"another request's identifier", stale, kNoReply},
+      {"the identifier of another request", stale, kNoReply},
       {"malformed", hex("30 07 02 84 DE AD BA BE 00"), kNoReply},
       {"empty", {}, kNoReply},
   };
@@ -141,14 +142,15 @@ TEST_F(Query, ReturnsTheStatusOfTheExchange) {
   EXPECT_THAT(agents.asked, IsEmpty());
 
   reply(replyWith(binding("05 00")));
-  EXPECT_EQ(snmp_exchange(m.message, "somewhere", 0), SNMP_OK) << "all other modes send";
+  EXPECT_EQ(snmp_exchange(m.message, "somewhere", 0), SNMP_OK)
+      << "every mode but kModeNoNetwork sends";
   EXPECT_THAT(agents.asked, ElementsAre("255.255.255.255"));
   EXPECT_EQ(std::string(m.message.community, m.message.community_length), "corridor")
-      << "the community is not that of the reply";
+      << "the reply does not change the community";
 
   snmp_request_counter = 6;
   EXPECT_EQ(snmp_request_to_address(&m.message, "192.0.2.1"), SNMP_ERR_TRANSPORT)
-      << "the reply is to another request";
+      << "the reply answers another request";
   agents.socketsOpen = false;
   EXPECT_EQ(snmp_exchange(m.message, "192.0.2.1", kModeNetwork), SNMP_ERR_TRANSPORT);
   EXPECT_EQ(snmp_request_to_address(nullptr, "192.0.2.1"), SNMP_ERR_TRANSPORT);
@@ -177,8 +179,8 @@ TEST(Addresses, AreNormalizedPartByPart) {
 constexpr std::size_t kPduTagAt = 15;  // the offset of the PDU's tag in a short message
 const std::int64_t kFirstExtendedIdentifier = snmp_request_counter_ext;
 
-// Has two slots for strings and one for a number. "##" follows each string's storage, so that a
-// test sees whether something was written past the end.
+// Sends get and set requests with two string slots and a number slot. "##" follows each string's
+// storage, so that a test sees a write past the end.
 class GetSet : public testing::Test {
  protected:
   void SetUp() override {
@@ -203,7 +205,7 @@ class GetSet : public testing::Test {
     m.message.pdu_type = kind;
     return snmp_get(m.message, std::span(slots).first(count), "192.0.2.1", kModeNetwork);
   }
-  // Binding i uses the slot with the number indexes[i].
+  // Binding i uses slots[indexes[i]].
   snmp_status set(const std::vector<std::uint32_t>& indexes) {
     snmp_message_init(m.message, indexes.size());
     for (std::size_t i = 0; i < indexes.size(); ++i)
@@ -222,15 +224,15 @@ class GetSet : public testing::Test {
                                {.type = kTagInteger}};
 };
 
-TEST_F(GetSet, CopyValuesToTheirSlotsAndNotBeyond) {
+TEST_F(GetSet, CopyValuesIntoTheirSlotsAndNeverPastThem) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
-  // Each row has the reply's bindings, the capacity of the second slot, and the contents of that
-  // slot afterwards. A refused reply does not change the second slot.
+  // Each row has a name, the reply's bindings, the capacity of the second slot, and the later
+  // contents of the second slot. A refused reply does not change the second slot.
   const std::tuple<const char*, std::string, std::uint16_t, std::string> cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},
       {"no room for the string", abc + abc + five, 2, "yy##"},
-      {"a number for a string", abc + five + five, 4, "yyyy##"},
+      {"a number instead of a string", abc + five + five, 4, "yyyy##"},
       {"another kind of string", abc + "30 00 06 01 2B 44 01 61", 4, "yyyy##"},
       {"one value too many", abc + abc + five + five, 4, "yyyy##"},
   };
@@ -278,7 +280,7 @@ TEST_F(GetSet, SetSendsTheSlotOfEachBindingUnlessTheStringsAreTooLong) {
   EXPECT_EQ(slots[2].int_value, 70000);
 }
 
-TEST_F(GetSet, ReturnTheErrorStatusAndCountRequestsFromTwoHundred) {
+TEST_F(GetSet, ReturnTheErrorStatusAndNumberRequestsFrom200) {
   EXPECT_EQ(kFirstExtendedIdentifier, 200);
   const std::int64_t next = snmp_request_counter_ext;
   reply = replyWith("", 2);
@@ -293,7 +295,7 @@ TEST_F(GetSet, ReturnTheErrorStatusAndCountRequestsFromTwoHundred) {
   reply = replyWith("30 00 06 01 2B 05 00");
   slots[0] = {.type = kTagNull, .int_value = 9};
   EXPECT_EQ(get(1), SNMP_OK);
-  EXPECT_EQ(slots[0].int_value, 0) << "the old value is gone";
+  EXPECT_EQ(slots[0].int_value, 0) << "a NULL value clears the number";
 }
 
 }  // namespace

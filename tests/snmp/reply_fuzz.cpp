@@ -1,7 +1,6 @@
-// Uses each input as an agent's reply to a query, a get and a set. Nothing may be written past the
-// storage that the caller provides. That storage has no spare room, so the sanitizers report a
-// write past its end. An input that can be decoded is also encoded and decoded again, unless it
-// contains a value or a name for which that cannot work.
+// Uses each input as an agent's reply to a query, a get and a set. The caller's storage has no
+// spare room, so the sanitizers report a write past its end. If the input can be decoded, also
+// encodes the result and decodes it again, unless one of its values or names does not allow that.
 
 #include <algorithm>
 #include <array>
@@ -21,7 +20,7 @@ using namespace onramp;  // NOLINT(google-build-using-namespace)
 
 constexpr const char* kAddress = "192.0.2.1";
 
-// Aborts when `holds` is false. The fuzzer then keeps the input.
+// Aborts when `holds` is false, so that the fuzzer saves the input.
 void require(bool holds, const char* what) {
   if (holds) return;
   std::fprintf(stderr, "not so: %s\n", what);
@@ -58,9 +57,9 @@ void exchangeStrings(bool set) {
     require(octets[i].length <= texts[i].size(), "a string fits in its slot");
 }
 
-// Returns whether the decoder can read `binding` after the encoder has written it. The decoder can
-// read neither unknown types, which are written without a value, nor unsigned numbers of 2^31 or
-// more, which take 5 bytes.
+// Returns whether the decoder can read `binding` after the encoder has written it. The decoder
+// cannot read a value of an unknown type, because the encoder leaves it out. It also cannot read
+// unsigned numbers of 2^31 or more, because they take 5 bytes.
 bool isReadable(const snmp_varbind& binding) {
   const std::uint64_t type = binding.type;
   if (type >= kTagCounter && type <= kTagTimeTicks)

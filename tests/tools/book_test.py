@@ -1,5 +1,5 @@
-"""Compares what the documents for makers list with what the sources have, in both directions.
-Argument: onramp-check."""
+"""Checks that the documents for makers list exactly the keys, texts, settings, pictures and
+verdicts of the sources. Argument: the program onramp-check."""
 
 import re
 import subprocess
@@ -23,8 +23,8 @@ def printed(option):
 
 
 def rows(document, heading):
-    """Returns the rows of the tables whose heading matches the regular expression `heading`. A row
-    begins with the expression's groups, and its cells follow."""
+    """Returns the rows of the tables whose heading matches the regular expression `heading`. Each
+    row is a tuple of the expression's groups and the row's cells."""
     text = text_of(document).replace("`", "")
     return [(*table.groups()[:-1], *line.strip("| ").split(" | "))
             for table in re.finditer(rf"^\| {heading} \|.*\n\|[-|]+\n((?:\|.*\n)+)", text, re.MULTILINE)
@@ -34,7 +34,7 @@ def rows(document, heading):
 class Book(unittest.TestCase):
     maxDiff = None
 
-    def test_has_every_key_with_its_type_and_need(self):
+    def test_has_every_key_with_its_type_and_whether_it_is_needed(self):
         told = []
         for name, keys, kind, need, *_ in rows(BOOK, r"Key in .*?(\w+\.plist)"):
             *path, last = keys.split(" / ")
@@ -44,7 +44,7 @@ class Book(unittest.TestCase):
                           r'|view k\w+ = "(\w+)"|k(?:Major|Minor|BugFix) = "(\w+)"|\{0x\w+, "(\w+)"',
                           text_of("media/*.cpp", "media/medium.h", "app/*.cpp"))
         self.assertEqual({path.split("/")[-1] for *_, path in told},
-                         {"".join(key) for key in read} - {"Country"})  # which is in SupportedKOL.plist
+                         {"".join(key) for key in read} - {"Country"})  # a key of SupportedKOL.plist
 
     def test_has_every_text_with_its_room_and_place(self):
         told = rows("docs/texts-and-languages.md", "Key")

@@ -20,7 +20,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// A copy of the example medium, for damage in one random place at a time.
+/// A copy of the example medium, which a test damages in one random place at a time.
 class DamagedMedium {
  public:
   DamagedMedium() {
@@ -69,8 +69,8 @@ class DamagedMedium {
   }
 
   // Returns a copy of `dictionary` in which one random key, at any depth, is removed, renamed or
-  // given a value of another kind. Some of the new names equal the old ones. Appends a description
-  // of the change to `what`.
+  // given a value of another kind. A new name may equal the old one. Appends a description of the
+  // change to `what`.
   Dictionary damagedCopy(const Dictionary& dictionary, std::string& what) {
     std::vector<Dictionary::Pair> pairs(dictionary.begin(), dictionary.end());
     if (pairs.empty()) return dictionary;
@@ -97,8 +97,8 @@ class DamagedMedium {
   std::minstd_rand random_;
 };
 
-// Starts the wizard and returns the name of the first page. " opens " and a path follow for each
-// file that the wizard opens at once. If the wizard shows an alert, returns " refused".
+// Starts the wizard and returns the name of its first page, then " opens " and the path for each
+// file that the wizard opens at once. Returns " refused" if the wizard shows an alert.
 std::string startOfTheWizard() {
   recording::FrontEnd& screen = recording::FrontEnd::instance();
   screen.reset();
@@ -113,14 +113,15 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the name of the first page that `report` predicts. `start` is the result of
-// startOfTheWizard(). If the wizard refuses the system, there is no page.
+// Returns the name of the first page that `report` predicts, or an empty text for no page. `start`,
+// the result of startOfTheWizard(), says whether the wizard refuses the system and so shows no
+// page.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";
 }
 
-// For a longer run, set ONRAMP_DAMAGES to the number of times the medium is damaged.
+// Damages the medium 100 times, or as often as the environment variable ONRAMP_DAMAGES says.
 TEST(OnrampCheck, ReportsEveryDamageThatChangesTheStart) {
   const char* const wanted = std::getenv("ONRAMP_DAMAGES");
   const unsigned long count = wanted ? std::strtoul(wanted, nullptr, 10) : 100;

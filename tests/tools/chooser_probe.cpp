@@ -1,5 +1,5 @@
-// Runs the wizard's own device chooser for SECONDS seconds, searching for the models MODEL…, then
-// prints the names of the devices in the chooser's list, one on each line. APPLICATION is the path
+// Runs the wizard's own device chooser for SECONDS seconds, with the models MODEL… to search for.
+// Then prints the names of the devices in the chooser's list, one per line. APPLICATION is the path
 // of the wizard's application on the medium.
 //
 //   chooser_probe APPLICATION SECONDS MODEL…

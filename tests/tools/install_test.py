@@ -1,5 +1,5 @@
-"""Installs a build into a new folder and tries a part of what was installed. Arguments: cmake, and
-the build's folder."""
+"""Installs a build into a new folder, runs the installed preview, and checks that the documents
+link only to installed files. Arguments: cmake, and the build folder."""
 
 import os
 import pathlib

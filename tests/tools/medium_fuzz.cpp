@@ -1,5 +1,5 @@
-// Puts each input in place of one file of the example medium. The input's first byte chooses the
-// file and is left out of it. Then the wizard's own records and the report of onramp-check must
+// Replaces one file of the example medium with each input. The input's first byte chooses the file,
+// and the other bytes become its contents. The wizard's records and onramp-check's report must then
 // agree about the models.
 
 #include <array>
@@ -36,7 +36,7 @@ constexpr const char* kTexts = "MacResources/CDCommonMessage.bundle/Contents/Res
 struct ExampleMedium : recording::MediumFolder {
   ExampleMedium() {
     fs::copy(ONRAMP_EXAMPLE_MEDIUM, path(""), fs::copy_options::recursive);
-    for (const char* language : {"ja", "ko", "zh_CN"})  // reading only two languages is faster
+    for (const char* language : {"ja", "ko", "zh_CN"})  // reading two languages is faster
       fs::remove_all(path(std::string(kTexts) + language + ".lproj"));
     write(kFiles[0], Dictionary{{"CFBundleName", "Onramp OSX"},
                                 {"CommonResourcePath", "MacResources/CDCommonInfo.plist"}});

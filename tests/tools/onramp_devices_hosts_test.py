@@ -1,5 +1,5 @@
-"""Runs "onramp-devices hosts". tests/in_namespace runs this test in a new network namespace.
-Arguments: the program, and the script that sets up a network to search."""
+"""Tests "onramp-devices hosts". Must run under tests/in_namespace. Arguments: the program, and the
+script that sets up a network to search."""
 
 import socket
 import subprocess

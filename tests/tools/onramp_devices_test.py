@@ -1,5 +1,5 @@
-"""Compares onramp-devices with net-snmp's snmpget and with the wizard's own device chooser, on a
-practice network that has a device for nearly every verdict. Arguments: the program, chooser_probe,
+"""Compares onramp-devices with net-snmp's snmpget and with the wizard's own device chooser. The
+practice network has a device for nearly every verdict. Arguments: onramp-devices, chooser_probe,
 and a medium with the application on it."""
 
 import json
@@ -22,8 +22,7 @@ PROGRAM, PROBE, MEDIUM = map(os.path.abspath, sys.argv[1:4])
 OBJECT = "1.3.6.1.4.1.4242.2.4.4.1240.1.2.0"
 MAKER_AND_MODEL = 'maker = "Kestrel"\nmodel = "Model 100"\n'
 
-# For most verdicts, the entries of a device that gets the verdict. The verdict is also the device's
-# name.
+# For most verdicts, a device that gets the verdict. The verdict is also the device's name.
 DEVICES = {
     "listed": MAKER_AND_MODEL,
     "on-cable": MAKER_AND_MODEL + "activeif = 1",
@@ -69,8 +68,8 @@ def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, second
     return answer
 
 
-# Each row has the function that answers (None for a closed port), the outcome and the value in
-# JSON, and a text that snmpget prints.
+# Each row has the function that answers (None for a closed port), the outcome and value that
+# onramp-devices reports, and a text that snmpget prints.
 REPLIES = [
     *((reply(tlv(2, bytes((n & 255,)))), "value", n, f"INTEGER: {n}") for n in (2, 1, -1)),
     *((reply(value), "other-type", None, text) for value, text in (

@@ -51,7 +51,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Tests inside a practice network with DEVICES. A test of FromOutside starts them there."""
+    """Tests that run inside a practice network with DEVICES. FromOutside starts them."""
 
     def setUp(self):
         self.network = PracticeNetwork()
@@ -168,7 +168,7 @@ class FromOutside(unittest.TestCase):
         self.assertEqual(result.returncode, 2)
         self.assertRegex(result.stderr, "^practice-network: /nowhere: cannot be read.*ONRAMP_MAKER")
 
-    @unittest.skipIf(os.getuid(), "without sudo on the path, only root gets that far")
+    @unittest.skipIf(os.getuid(), "the test hides sudo, so only root gets far enough")
     def test_a_missing_program_is_reported_with_its_package(self):
         for program in ("unshare", "setpriv", "mount", "ip"):
             (self.folder / program).symlink_to("/bin/true")

@@ -19,8 +19,9 @@ def model(usb=False, wired=False, wireless=False):
 def make(folder, built, models, tool_status=0, **resources):
     """Makes a medium in `folder`, with the application, messages and pictures of the medium `built`.
 
-    `resources` are additional entries of CDCommonInfo.plist. The set-up tool writes its arguments to
-    the file "tool" in the folder and exits with `tool_status`. Returns the folder's path.
+    `resources` are added to the entries of CDCommonInfo.plist or replace them. The set-up tool
+    writes its arguments to the file "tool" in `folder` and exits with `tool_status`. Returns the
+    folder's path.
     """
     folder, built = pathlib.Path(folder), pathlib.Path(built)
     shutil.copytree(built / "Onramp OSX.app", folder / "Onramp OSX.app")
@@ -50,7 +51,7 @@ def make(folder, built, models, tool_status=0, **resources):
 
 
 def make_tool(folder, status):
-    """Writes a set-up tool that exits with `status` to the medium. Replaces the tool that is there."""
+    """Makes or replaces the set-up tool of the medium in `folder`. The tool exits with `status`."""
     tool = folder / "Setup.app/Contents/Linux/setup"
     tool.parent.mkdir(exist_ok=True)
     tool.write_text(f"#!/bin/sh\nprintf '%s' \"$*\" > '{folder}/tool'\nexit {status}\n")

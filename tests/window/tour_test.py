@@ -1,9 +1,9 @@
-"""Takes the tour of a medium with mistakes on it.
+"""Runs tools/tour on a medium with mistakes.
 
 Usage: tour_test.py MEDIUM
 
-MEDIUM is the folder of a medium with the application on it. The environment variable ONRAMP_CHECK holds
-the path of onramp-check. Without it, the tour uses the release build's onramp-check.
+MEDIUM is the folder of a medium with the application on it. The environment variable ONRAMP_CHECK may
+hold the path of onramp-check. The default is the release build's program.
 """
 
 import pathlib
@@ -19,8 +19,8 @@ from media import model
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TOUR = pathlib.Path(__file__).resolve().parents[2] / "tools/tour"
-# The wizard puts a space between a device's maker and its model. So no device is of one of these models,
-# and the tour is the same with and without a network.
+# These names have no space, but the wizard joins a device's maker and model with a space. So no device
+# matches these models, and the tour is the same with and without a network.
 MODELS = {"Ä/1": model(usb=True, wireless=True), "a-1": model(wireless=True), "Cable": model(usb=True)}
 
 

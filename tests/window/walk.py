@@ -1,5 +1,5 @@
 #!/usr/bin/python3
-"""Random walks over the wizard's real window while devices come and go.
+"""Takes random walks through the wizard's real window while devices come and go.
 
 Usage: walk.py [--seed S] [--count N] MEDIUM
 
@@ -28,17 +28,18 @@ from practice_network import PracticeNetwork
 AT_A_TIME = 4
 STEPS = 14
 PATIENCE = 60
-HANG = 10  # seconds; the devices answer at once, so the main loop should never be busy for so long
+HANG = 10  # seconds; the devices answer at once, so the main loop should never be busy that long
 CLICKABLE = ("push button", "list item", "radio button", "table cell", "menu item")
 KEYS = {"Tab": 1, "shift+Tab": 1, "Return": 3, "space": 1, "Up": 1, "Down": 1, "Home": 1, "End": 1,
         "F10": 0.5, "Escape": 0.2}
 PRINTER = "_pdl-datastream._tcp"
-# A control that is not listed has the weight 1. With equal weights, most walks would end early.
-# Hide is never clicked, because the desktop has no task bar that could bring the window back.
+# The weights of the controls in random clicks. A control that is not listed has the weight 1. With
+# equal weights, most walks would end early. Hide is never clicked, because the desktop has no task
+# bar that could bring the window back.
 WEIGHTS = {"Hide": 0, "Cancel": 0.1, "USB": 0.3, "Kestrel Cable": 0.2, "Onramp OSX": 0.2,
            "Quit": 0.1, "Next": 4, "Actions": 2}
-# What a device reports as its active interface. With each of these values, the device answers at
-# once, so the wizard never waits for an answer.
+# Values for a device's `activeif`. With each of them, the device answers at once, so the wizard
+# never waits for an answer.
 ANSWERS = (2, 2, 2, 1, "missing", "text")
 
 
@@ -115,8 +116,8 @@ class Walk:
                              activeif=self.dice.choice(ANSWERS))
             self.devices[name] = True
         elif self.dice.random() < 0.5:
-            # Changes the device's service type to one that the wizard does not browse for, or back.
-            # The device still answers questions, because the wizard can still ask it.
+            # Switches between the wizard's service type and another one, so the device leaves or
+            # returns. It still answers, because the wizard may still ask it.
             self.devices[name] = not self.devices[name]
             self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
         else:
@@ -136,7 +137,7 @@ class Walk:
             time.sleep(0.05)
 
     def leave(self, person):
-        """Ends the program. Tries repeatedly, because a window cannot be closed during a search."""
+        """Ends the program. Retries, because the window cannot be closed during a search."""
         until = time.monotonic() + PATIENCE
         while person.is_running():
             if time.monotonic() > until:
@@ -161,7 +162,7 @@ class Walk:
 
 
 def take_walks(seeds):
-    """Takes the walks one after the other and returns whether all of them passed."""
+    """Takes one walk after another and returns whether all of them passed."""
     network = PracticeNetwork()
     passed = True
     with Desktop() as desktop:
@@ -186,7 +187,7 @@ def main():
                                   *sys.argv, BUILT])
     shares = [range(options.seed + first, options.seed + options.count, AT_A_TIME)
               for first in range(AT_A_TIME)]
-    sys.argv.append(str(BUILT))  # way.py takes the medium from here in each process
+    sys.argv.append(str(BUILT))  # in each new process, way.py takes the medium from here
     with multiprocessing.get_context("spawn").Pool(AT_A_TIME) as pool:
         return all(pool.map(take_walks, shares))
 

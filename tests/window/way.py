@@ -1,7 +1,7 @@
 """Shared code of the tests that go through the wizard from start to end.
 
 The last argument of each test program is the folder of a medium with the application on it. If the
-application has the Cocoa front end under GNUstep, ONRAMP_GNUSTEP must be in the environment.
+application has the Cocoa front end under GNUstep, set the environment variable ONRAMP_GNUSTEP.
 """
 
 import pathlib
@@ -18,8 +18,8 @@ import media  # noqa: E402
 from onscreen import messages  # noqa: E402
 from onscreen.desktop import Desktop  # noqa: E402
 
-# ON_GNUSTEP tells tests to avoid what the Cocoa front end under GNUstep lacks: the accessibility
-# bus, keys for menus, names of lists, and options.
+# Under GNUstep, the Cocoa front end lacks the accessibility bus, keys for menus, names of lists,
+# and options. Tests avoid these if ON_GNUSTEP is true.
 from tours.person import ON_GNUSTEP, Person  # noqa: E402
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
@@ -31,7 +31,7 @@ OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": Fa
 
 
 class WayTest(unittest.TestCase):
-    """Starts the wizard for a test, on a new medium, with a person who uses it."""
+    """Starts the wizard on a new medium for each test. A Person uses the wizard."""
 
     @classmethod
     def setUpClass(cls):

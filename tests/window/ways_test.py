@@ -68,7 +68,7 @@ class Ways(WayTest):
         self.assert_quit_without_a_trace(person)
 
     @unittest.skipIf(ON_GNUSTEP, "lists have no names under GNUstep")
-    def test_a_list_has_a_name_finds_any_word_and_accepts_a_double_click(self):
+    def test_a_list_has_a_name_and_accepts_typed_words_and_double_clicks(self):
         person = self.start({"Kestrel Photo 1": model(usb=True, wireless=True),
                              "Kestrel Scan 2": model(usb=True, wired=True, wireless=True)})
         person.see("list", TEXT["INST_TXT_MODEL"])

@@ -4,7 +4,7 @@ Usage: wireless_test.py [TEST] MEDIUM
 
 MEDIUM is the folder of a medium with the application on it. TEST is a name such as
 WirelessWays.test_back_and_forth_keeps_list_and_choice. Without TEST, all tests run, each with its own
-process, desktop and devices. Several tests run at a time, because each of them mostly waits.
+process, desktop and devices. Several tests run at a time, because a test mostly waits.
 """
 
 import concurrent.futures
@@ -81,7 +81,7 @@ class WirelessWays(WayTest):
                 "Bonjour": {"name": name, "type": "_pdl-datastream._tcp.", "domain": "local."},
                 "IP address": address}})
 
-    def test_keyboard_alone_or_accessible_tree_alone_chooses_a_device_despite_closed_ports(self):
+    def test_keyboard_alone_or_accessible_tree_alone_can_choose_a_device_despite_closed_ports(self):
         for number in (1, 2, 3):
             self.add(f"closed {number} of {self.kind}", activeif="closed")
         self.add("Büro – 会議室", addresses=["127.0.90.1"], note="2nd floor")
@@ -120,7 +120,7 @@ class WirelessWays(WayTest):
         person.act("table cell", "Büro – 会議室")
         person.act("push button", text["BTN_NEXT"])
 
-    def test_status_3_of_the_tool_and_refresh_in_the_menu_search_again(self):
+    def test_the_search_runs_again_after_tool_status_3_and_after_refresh(self):
         person = self.search(tool_status=3)
         self.see_tool_run()
         person.see("label", TEXT["INST_TXT_DEVLIST"])

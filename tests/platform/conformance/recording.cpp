@@ -4,7 +4,7 @@
 #include "tests/recording/front_end.h"
 
 // Only the tests named MainLoop run on the recording front end. Its timers and alerts do nothing
-// until a test plays the clock and the user, so the other tests do not apply.
+// until a test acts as the clock and the user, so the other tests do not apply.
 
 namespace onramp::conformance {
 

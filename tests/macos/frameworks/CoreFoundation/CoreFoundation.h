@@ -1,7 +1,7 @@
-// A stand-in for the part of Core Foundation that platform/corefoundation, cfnetwork and
-// systemconfiguration use. With the stand-ins in tests/macos/frameworks, these backends compile and
-// run on Linux. The tests show how the backends use the frameworks' objects, not how macOS behaves.
-// In a build with sanitizers, the sanitizers report an object that is released too often or never.
+// A stand-in for the part of Core Foundation that corefoundation, cfnetwork and systemconfiguration
+// in platform/ use. With the stand-ins in tests/macos/frameworks, these backends compile and run on
+// Linux. The tests show how the backends use the frameworks' objects, not how macOS behaves. The
+// sanitizers report an object that a backend releases too often or never.
 #pragma once
 
 #include <cstddef>
@@ -37,7 +37,7 @@ struct Object {
   }
 
   Kind kind;
-  std::string bytes;             // the contents of a string or data
+  std::string bytes;             // the contents of a string or data object
   std::vector<Object*> members;  // owned; in a dictionary, keys and values alternate
   int references = 1;
 };

@@ -18,7 +18,7 @@ struct CFNetServiceClientContext {
 namespace standin {
 
 /// The members that services and browsers have in common. `isScheduled` is true while the object is
-/// scheduled on the main loop in its common modes.
+/// scheduled on the main loop in the common modes.
 template <typename Client>
 struct Scheduled : Object {
   Scheduled() : Object(kOther) {}
