@@ -1,4 +1,4 @@
-"""The command line: starts the network or, with `ctl`, controls the network from inside."""
+"""The command line, which starts a network or, with `ctl`, controls the network around it."""
 
 import argparse
 import importlib.util
@@ -24,7 +24,7 @@ HELP = """
 Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns the exit
 status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespaces of the kernel. No
 packet leaves this machine, and no hardware is needed. The network ends when COMMAND or this tool
-ends, in whatever way.
+ends or is killed.
 
 This command runs the wizard with twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
@@ -49,8 +49,8 @@ there is one table for each device:
     name = "Kestrel Model 100"     the name in the wizard's list; only this entry is required. A
                                    name in a script such as Japanese should have at most 57 bytes,
                                    because Avahi loses devices with longer ones after two minutes.
-    maker = "Kestrel"              maker and model, which make up the medium's model names
-    model = "Model 100"
+    maker = "Kestrel"              maker and model; the wizard lists the device only if the two
+    model = "Model 100"            together, "Kestrel Model 100", are a model's name on the medium
     note = "2nd floor"             the device's location
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
     domain = "annex.local"         default "local"; other domains must end in ".local"
@@ -189,7 +189,8 @@ def _steer(request):
 
 
 def _entry(text):
-    """Reads KEY=VALUE as in a description file, except that a text needs no quotes."""
+    """Returns the key and the value of KEY=VALUE. The value is written as in a description file,
+    except that a text needs no quotes."""
     key, equals, value = text.partition("=")
     if not equals:
         raise ControlError(f'"{text}": write an entry as KEY=VALUE')
