@@ -129,7 +129,7 @@ class Person:
         wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
 
     def open_menu(self, button=None):
-        """Opens the menu of the button named `button`, or of the focused button if it is None.
+        """Opens the menu of the button named `button`, or of the focused button for None.
 
         The accessibility bus does not show the menu, so only the keyboard can use it.
         """

@@ -26,7 +26,7 @@ def _die_with_parent():
 
 
 def start(arguments, package=None, **options):
-    """Starts a program. Raises Missing if it cannot. The error names `package`, the Debian package
+    """Starts a program. Raises Missing if that fails. The error names `package`, the Debian package
     that contains the program."""
     try:
         return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)

@@ -152,7 +152,7 @@ class _Agent:
         return self._log.read_text(errors="replace") if self._log.exists() else ""
 
     def close(self):
-        # A script that delays an answer keeps the agent's socket open, so it has to end, too.
+        # A script that delays an answer keeps the agent's socket open, so the script must end, too.
         if self._process.poll() is None:
             os.killpg(self._process.pid, signal.SIGKILL)
             self._process.wait()

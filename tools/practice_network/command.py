@@ -37,7 +37,7 @@ The tool needs root or sudo. COMMAND runs as the user who started the tool.
 """
 
 DETAILS = """
-the description is a TOML file. One table, which may be left out, is for the network:
+the description is a TOML file. An optional table is for the network:
     [network]
     ipv6 = true                    false: IPv4 only; default true
     interfaces = 2                 1 or 2; default 1. Both see all devices, as Ethernet and Wi-Fi do
@@ -55,14 +55,14 @@ there is one table for each device:
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
     domain = "annex.local"         default "local"; other domains must end in ".local"
     port = 631                     default: the type's usual port, or 9100
-    addresses = ["127.0.1.9"]      or how many addresses the network chooses; default 1
+    addresses = ["127.0.1.9"]      or a number: the network chooses that many; default 1
     activeif = 2                   the number that the device answers; default 2, for wireless.
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
                                    answers with a text. A list gives each address its own value.
                                    IPv6 addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
-    present = false                switched off at the start; default true
+    present = false                false: switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
 inside the network, these commands show and change the devices while COMMAND runs. KEY=VALUE is an
@@ -80,7 +80,7 @@ PracticeNetwork in tools/practice_network offers these commands to Python tests.
 PracticeNetwork find the network through the environment variable ONRAMP_PRACTICE_SOCKET.
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
-do by default. Abstract sockets and TCP connections to the X server do not work inside.
+do by default. Abstract sockets and TCP connections to the X server do not work.
 XDG_RUNTIME_DIR is a new folder. The session bus, Wayland and the accessibility bus of your
 desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 

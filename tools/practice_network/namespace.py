@@ -93,7 +93,7 @@ def inside(options):
 
 def devices(options):
     """Runs as a separate process, on the command's host or on a second host. Starts the devices and
-    carries out requests from `ctl`. Returns only after a failure, with the tool's exit status."""
+    carries out requests. Returns only after a failure, with the tool's exit status."""
     try:
         settings, described = description.load(options["description"])
         if options["hosts"] == 2:
