@@ -40,15 +40,15 @@ DETAILS = """
 the description is a TOML file. An optional table is for the network:
     [network]
     ipv6 = true                    false: IPv4 only; default true
-    interfaces = 2                 1 or 2; default 1. Both see all devices, as Ethernet and Wi-Fi do
-                                   in one network. With --hosts 2 they are practice0 and practice1,
-                                   otherwise lo and practice1.
+    interfaces = 2                 1 or 2; default 1. Each sees all devices, as Ethernet and Wi-Fi do
+                                   in one network. With --hosts 2, their names are practice0 and
+                                   practice1, otherwise lo and practice1.
     domains = ["annex.local"]      domains to browse besides "local"; default none
 there is one table for each device:
     [[device]]
     name = "Kestrel Model 100"     the name in the wizard's list; only this entry is required. A
                                    name in a script such as Japanese should have at most 57 bytes,
-                                   because Avahi loses devices with longer ones after two minutes.
+                                   because Avahi loses devices with longer names after two minutes.
     maker = "Kestrel"              maker and model; the wizard lists the device only if the two
     model = "Model 100"            together, "Kestrel Model 100", are a model's name on the medium
     note = "2nd floor"             the device's location
