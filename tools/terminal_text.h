@@ -9,13 +9,13 @@ namespace onramp {
 /// Returns the number of columns that the UTF-8 text `text` takes on a terminal.
 [[nodiscard]] std::size_t columnsOf(std::string_view text);
 
-/// Returns `text`, in UTF-8, in exactly `columns` columns. A shorter text is padded with spaces. A
-/// longer one is cut and, if there is a column for it, ends with "…".
+/// Returns the UTF-8 text `text`, padded with spaces or cut to exactly `columns` columns. A cut
+/// text ends with "…", unless `columns` is 0.
 [[nodiscard]] std::string fitted(std::string_view text, std::size_t columns);
 
-/// Returns `text` broken at spaces into lines of at most `width` columns. Each line starts with
-/// `indent` spaces, which count as columns, and ends with a line feed. A word that is too wide gets
-/// its own line.
+/// Returns `text`, broken at spaces into lines of at most `width` columns. Each line starts with
+/// `indent` spaces, which count as columns, and ends with a line feed. A word that is too wide for
+/// any line is not broken.
 [[nodiscard]] std::string wrapped(std::string_view text, std::size_t width, std::size_t indent);
 
 }  // namespace onramp

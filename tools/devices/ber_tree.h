@@ -6,9 +6,8 @@
 
 namespace onramp::devices {
 
-/// Returns the elements of an SNMP message as text. Each element is on one line, which is indented
-/// by the element's depth. Bytes that form no element are shown in hexadecimal, so the text
-/// accounts for every byte.
+/// Returns an SNMP message as text, with each element on one line, indented by the element's depth.
+/// Bytes that form no element are shown in hexadecimal.
 [[nodiscard]] std::string berTree(std::span<const std::uint8_t> bytes);
 
 /// Returns the bytes in hexadecimal, sixteen on each line. A line starts with the offset of its

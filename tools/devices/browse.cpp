@@ -84,8 +84,7 @@ void Session::changed(Device& device) {
   }
 }
 
-// Asks a device, unless its record is the same as when it was last asked. The wizard, too, asks a
-// device again when its record has changed.
+// Asks a device unless its record is unchanged since it was last asked. The wizard does the same.
 void Session::ask(Device& device) {
   Dictionary& asked = asked_[&device];
   if (asked == device.record) return;
@@ -156,7 +155,7 @@ int Session::run() {
     progress_.print(jsonOf(all));
     return 0;
   }
-  // Shows the verdicts on the devices that have no row yet, and on those that are gone.
+  // Shows the verdict on each device that has no row yet, and on each that is gone.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));

@@ -7,8 +7,8 @@
 
 namespace onramp::devices {
 
-/// The delay that a device causes in the wizard by answering slowly or not at all. All members are
-/// 0 when the delay is shorter than a second.
+/// The delay that a device causes in the wizard if it answers slowly or not at all. All members are
+/// 0 if the delay is shorter than a second.
 struct Delay {
   double seconds = 0;       ///< how long the wizard's window does not respond
   std::size_t delayed = 0;  ///< how many listed devices appear later because of it
@@ -32,8 +32,8 @@ struct BrowseResult {
   std::vector<Verdict> network{};       ///< problems of the network as a whole
 };
 
-/// Sets the delay that each device causes. Assumes the wizard's first search, in which the wizard
-/// asks one device after another, in the order in which they were resolved.
+/// Sets the delay that each device would cause in the wizard's first search. The wizard asks one
+/// device after another, in the order in which they are resolved.
 void computeDelays(std::vector<JudgedDevice>& devices);
 
 /// Returns the result as JSON, in the form that the manual page describes.

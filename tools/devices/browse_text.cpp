@@ -33,7 +33,7 @@ struct Columns {
   std::size_t model;
 };
 
-// Returns the columns for name and model. They share the width that mark and address do not use.
+// Name and model share the width that mark and address leave.
 Columns columnsFor(const TextStyle& style) {
   const std::size_t width = style.width == 0 ? 100 : std::max(style.width, kNarrowest);
   const std::size_t rest = width - kMarkColumns - kAddressColumns - 3;
@@ -60,7 +60,7 @@ std::string paragraph(const std::string& text, const TextStyle& style) {
   return wrapped(text, style.width == 0 ? kUnlimited : style.width, 2);
 }
 
-// Adds a full stop, unless the text ends with a service type, which has its own dot.
+// Adds a full stop, except after a service type, which already ends with a dot.
 std::string sentence(const std::string& text) {
   return text.ends_with('.') ? text : text + '.';
 }

@@ -13,16 +13,15 @@ struct TextStyle {
   std::size_t width = 0;  ///< columns of the terminal; 0 when the output is not a terminal
 };
 
-/// Returns a style with colours and the terminal's width if standard output is a terminal.
-/// Otherwise the style has no colours, and its width is 0.
+/// Returns the style for standard output: with colours and the terminal's width if it is a
+/// terminal, otherwise without colours and with width 0.
 [[nodiscard]] TextStyle outputStyle(bool isVerbose);
 
 /// Returns the header line of the table of devices.
 [[nodiscard]] std::string tableHead(const TextStyle& style);
 
-/// Returns a device's row in the table and the lines that follow it. If the wizard does not list
-/// the device, the reason follows first. Then come the notes and, in the verbose style, all
-/// details.
+/// Returns a device's row in the table and the lines below the row. These are the reason if the
+/// wizard does not list the device, the notes and, in the verbose style, all details.
 [[nodiscard]] std::string rowOf(const JudgedDevice& device, const TextStyle& style);
 
 /// Returns the row for a device that is no longer announced.

@@ -16,7 +16,7 @@ namespace onramp::devices {
 struct Device {
   std::string name;
   std::string domain;
-  std::string type;                ///< the type of the service that is resolved
+  std::string type;                ///< the type of the service whose addresses are used
   std::vector<std::string> types;  ///< the types of all its announced services
   double found = 0;
   std::optional<double> resolved;
@@ -25,7 +25,7 @@ struct Device {
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
   std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"; empty on macOS
-  std::optional<Answer> answer;     ///< nothing until the asking is finished
+  std::optional<Answer> answer;     ///< nothing until askDevice() has returned
 };
 
 /// The parts of a medium on which the wizard's search depends.

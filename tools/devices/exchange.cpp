@@ -42,7 +42,7 @@ class OwnTable {
 
   [[nodiscard]] mib_table& get() { return table_; }
 
-  /// Returns the names (object identifiers) that the table now holds.
+  /// Returns the object identifiers that the table now holds.
   [[nodiscard]] std::vector<std::vector<std::uint16_t>> names() const {
     std::vector<std::vector<std::uint16_t>> names;
     for (const mib_entry& entry : entries_)
@@ -62,7 +62,7 @@ std::uint64_t nextRequestId() {
 }
 
 // A request that has been sent. The socket stays open after the wait for the reply, so that a late
-// reply is noticed. `exchange` is the index of the request's exchange.
+// reply is noticed. `exchange` is an index into Questioning::exchanges_.
 struct Sent {
   DatagramSocket socket;
   Clock::time_point at;
@@ -105,8 +105,8 @@ bool Questioning::send(snmp_table_request& request, Exchange& exchange) {
   return true;
 }
 
-// Waits for the reply as long as the wizard does, and stores it in `exchange`. Sets the outcome
-// only when the device's host reports that no program uses the port.
+// Waits for the reply as long as the wizard does, and stores the reply in `exchange`. Sets the
+// outcome only if the host reports that no program uses the port.
 void Questioning::await(Sent& sent, Exchange& exchange) {
   const auto deadline = sent.at + kReceiveWait;
   while (!stopped_ && Clock::now() < deadline) {
@@ -185,7 +185,7 @@ std::optional<Dictionary> Questioning::once(const char* address, bool& noReply) 
   return result;
 }
 
-// All outcomes except kValue. Those that say most come first.
+// All outcomes except kValue, the most informative first.
 constexpr std::array kTellingOrder{
     Outcome::kError, Outcome::kOtherType, Outcome::kUnreadable, Outcome::kOtherRequest,
     Outcome::kLate,  Outcome::kRefused,   Outcome::kNone,       Outcome::kUnsent};
@@ -193,8 +193,7 @@ constexpr std::array kTellingOrder{
 }  // namespace
 
 const Exchange* Answer::telling() const {
-  // When the value from an address decides, no further request follows, so the last value is the
-  // deciding one.
+  // The wizard sends no request after the reply whose value decides, so the last value decides.
   const auto last = std::find_if(exchanges.rbegin(), exchanges.rend(),
                                  [](const Exchange& e) { return e.outcome == Outcome::kValue; });
   if (last != exchanges.rend()) return &*last;

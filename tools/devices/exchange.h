@@ -32,8 +32,8 @@ struct Exchange {
   std::uint64_t errorStatus = 0;        ///< for kError; see RFC 1157 section 4.1.1
   std::optional<std::int64_t> value{};  ///< for kValue
   unsigned type = 0;                    ///< for kOtherType; the value's tag
-  /// Whether the reply named an object other than that of the request. If so, the wizard would ask
-  /// all later devices for the object that the reply names.
+  /// Whether the reply named another object than the request did. If so, the wizard would ask all
+  /// later devices for the object that the reply named.
   bool changedQuestion = false;
 };
 
@@ -45,14 +45,14 @@ struct Answer {
   std::vector<Exchange> exchanges;
 
   /// Returns the exchange that best explains the answer: the last one with a value or, if none has
-  /// a value, the one whose outcome says most. Returns null when there is no exchange. The answer
-  /// owns the exchange.
+  /// a value, the first one with the most informative outcome. Returns null when there is no
+  /// exchange. The answer owns the exchange.
   [[nodiscard]] const Exchange* telling() const;
 };
 
-/// Asks the device at `addresses`, an array of strings, exactly as the wizard does, repetitions
-/// included. Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does
-/// not change active_interface_table. May be called on any thread.
+/// Asks the device at `addresses`, an array of strings, as often and in the same order as the
+/// wizard does. Blocks for about 12 seconds for each silent address, or until `stopped` is set.
+/// Does not change active_interface_table. May be called on any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 
 /// Returns the name of an error status (RFC 1157 section 4.1.1), such as "noSuchName", or "error

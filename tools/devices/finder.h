@@ -19,13 +19,12 @@ namespace onramp::devices {
 /// functions must be called on the main thread.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Called when a service of `device` is found or is gone, and when the service that gives the
-  /// addresses is resolved.
+  /// Called when a service of `device` is found or is gone, and when the service whose addresses
+  /// are used is resolved.
   using Changed = std::function<void(Device& device)>;
 
-  /// If a device has services of several types, the finder uses the addresses and TXT record of the
-  /// service whose type is `preferred`, or of the first service that it found if none has that
-  /// type.
+  /// A device may have services of several types. The finder uses the addresses and TXT record of
+  /// the service of type `preferred` or, if there is none, of the service that it found first.
   Finder(std::string preferred, Changed changed);
   Finder(const Finder&) = delete;
   Finder& operator=(const Finder&) = delete;

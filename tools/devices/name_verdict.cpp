@@ -16,14 +16,14 @@ namespace onramp::devices {
 
 namespace {
 
-// TXT keys under which devices announce their maker or their model. The wizard reads only one key
-// of each list; the service type decides which one.
+// TXT keys under which devices announce their maker or model. The wizard reads only one key of each
+// list, which depends on the service type.
 constexpr std::array<std::string_view, 9> kMakerKeys{
     "usb_MFG", "mfg", "usb_MANUFACTURER", "manufacturer", "mfr", "vendor", "make", "ty", "product"};
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
                                                      "modelName", "ty",  "product"};
 
-// Returns `text` without spaces at its ends, and with one space in place of several in a row.
+// Returns `text` without spaces at its ends, and with each run of spaces as one space.
 std::string withSingleBlanks(std::string_view text) {
   std::string out;
   for (const char c : text) {
@@ -42,7 +42,7 @@ std::string textUnder(const Device& device, std::string_view key) {
   return text ? text->value(key).value_or("") : "";
 }
 
-// Returns the first of `keys`, leaving out `wanted`, under which the device announces a text.
+// Returns the first of `keys` except `wanted` under which the device announces a text, or nothing.
 std::optional<std::string_view> otherKey(const Device& device, std::string_view wanted,
                                          std::span<const std::string_view> keys) {
   for (const std::string_view key : keys) {

@@ -6,9 +6,9 @@
 
 namespace onramp::devices {
 
-/// Returns at most one problem of the network as a whole. A missing discovery daemon is always a
-/// problem. If the search found no device, the problem is otherwise that there is no network, that
-/// multicast is blocked, or that nothing was announced. `seconds` is how long the search took.
+/// Returns the first problem of the network as a whole, or no problem. A missing discovery daemon
+/// is always a problem. The other problems count only if the search found no device: no network,
+/// blocked multicast, and no announcement within `seconds`, the duration of the search.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
 /// Returns whether local_address_for_destination() finds a subnet of this computer that contains

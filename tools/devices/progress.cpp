@@ -15,8 +15,7 @@ bool Progress::isShown() {
 void Progress::show(const std::string& text) {
   if (!isShown()) return;
   std::string line = fitted(text, terminalWidth() - 3);
-  // The cursor stays at the end of the text, so there is room on the line for the "^C" of an
-  // interruption.
+  // The cursor stays at the end of the text, so the terminal can show "^C" there.
   while (line.ends_with(' '))
     line.pop_back();
   std::cerr << '\r' << line << "\033[K" << std::flush;

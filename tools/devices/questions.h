@@ -10,8 +10,8 @@
 
 namespace onramp::devices {
 
-/// Asks many devices at once, each on a separate thread. Each device gets the same requests as from
-/// the wizard, although the wizard asks one device after another.
+/// Asks many devices at once, each on a separate thread. The wizard sends each device the same
+/// requests, but asks one device after another.
 class Questions {
  public:
   using Answered = std::function<void(Answer answer)>;
@@ -22,12 +22,12 @@ class Questions {
   /// Calls stop() and waits for the threads to end, which takes a fraction of a second.
   ~Questions();
 
-  /// Asks the device at `addresses`, an array of strings, and returns at once. Later calls
-  /// `answered` with the answer on the main thread. If the system cannot start another thread, asks
-  /// the device first and then returns.
+  /// Starts to ask the device at `addresses`, an array of strings. Later calls `answered` with the
+  /// answer on the main thread. If the system cannot start another thread, this call blocks until
+  /// the device has been asked.
   void ask(const Array& addresses, Answered answered);
 
-  /// Stops asking for good. Each device that is being asked gets an incomplete answer.
+  /// Stops asking for good. The answer of each device that is being asked is then incomplete.
   void stop() { *stopped_ = true; }
 
   /// Returns the number of devices whose `answered` has not been called yet.

@@ -23,7 +23,7 @@ std::string joined(const std::vector<std::string>& texts) {
   return all;
 }
 
-// Returns the verdict on a device that sent the value `value`, but that the wizard does not list.
+// Returns the verdict on a device that answered `value` and that the wizard does not list.
 Verdict judgeValue(std::int64_t value) {
   if (value == kActiveIFWireless) {
     return {.id = "no-answer",

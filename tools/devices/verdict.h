@@ -17,8 +17,9 @@ struct Verdict {
   std::string remedy{};  ///< what to do; can be empty
 };
 
-/// Returns whether the wizard would ask the device which interface it uses: the device is resolved
-/// under the medium's service type, is a model searched for, and has an IPv4 address.
+/// Returns whether the wizard would ask the device which interface it uses. The wizard asks a
+/// device that is resolved under the medium's service type, is a wanted model, and has an IPv4
+/// address.
 [[nodiscard]] bool isAsked(const Device& device, const Medium& medium);
 
 /// Returns the verdict on a device. `isLocal` returns whether an IPv4 address is in a subnet of

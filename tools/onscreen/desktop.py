@@ -11,15 +11,15 @@ from .processes import Missing, start, stop, wait_for
 
 _SIZE = "1366x768"  # the smallest screen that the wizard must fit on
 _TWICE_THE_DENSITY = "2732x1536"
-# The programs, and the Debian packages that contain them.
+# Each program that a desktop needs, and the Debian package that contains it.
 _PROGRAMS = {"Xvfb": "xvfb", "openbox": "openbox", "xprop": "x11-utils", "xdotool": "xdotool",
              "import": "imagemagick", "mogrify": "imagemagick", "dbus-daemon": "dbus"}
 _ACCESSIBILITY_BUS = pathlib.Path("/usr/share/dbus-1/services/org.a11y.Bus.service")
 
 
 def check_packages():
-    """Raises Missing, which names the Debian packages, if something that a desktop or its user
-    needs is not installed."""
+    """Raises Missing if something that Desktop or Person needs is not installed. The error names
+    the Debian packages."""
     packages = {package for name, package in _PROGRAMS.items() if not shutil.which(name)}
     if not _ACCESSIBILITY_BUS.exists():
         packages.add("at-spi2-core")
@@ -36,8 +36,8 @@ def check_packages():
 def _free_display():
     """Returns a random display number that no X server uses.
 
-    An X server in another network namespace does not notice that a number is in use, and removes
-    the socket of the server that uses it. So this function looks for the socket.
+    An X server does not notice that a server in another network namespace has the same number, and
+    removes that server's socket. So this function looks for the socket.
     """
     while True:
         number = random.randrange(100, 50000)
@@ -48,10 +48,10 @@ def _free_display():
 class Desktop:
     """A context manager that starts a desktop, and stops its programs at the end.
 
-    Programs on the desktop find a substitute for xdg-open that only records files and addresses. A
-    process can use only one desktop, because its accessibility library keeps the first desktop's
-    bus. There is no window manager if `window_manager` is false. With `dense`, the screen has room
-    for the wizard at twice the density.
+    On the desktop, xdg-open only records the path or address that it should open. A process can use
+    only one desktop, because its accessibility library stays on the first desktop's bus. If
+    `window_manager` is false, the desktop has no window manager. If `dense` is true, the screen is
+    large enough for the wizard at a scale of 200 %.
     """
 
     def __init__(self, window_manager=True, dense=True):
@@ -88,7 +88,7 @@ class Desktop:
         return self._folder / "local"
 
     def opened(self):
-        """Returns the paths and addresses that were passed to xdg-open so far."""
+        """Returns the paths and addresses that xdg-open has recorded."""
         record = self._folder / "opened"
         return record.read_text().splitlines() if record.exists() else []
 

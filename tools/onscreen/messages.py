@@ -10,7 +10,7 @@ _TRADITIONAL_CHINESE = ("zh_hant", "zh_tw", "zh_hk", "zh_mo")
 
 
 class Texts(dict):
-    """Texts by their keys. For a missing text, gives the key, as the wizard does."""
+    """Texts by their keys. A key without a text is its own text, as in the wizard."""
 
     def __missing__(self, key):
         return key
@@ -19,8 +19,8 @@ class Texts(dict):
 def _fitness(offered, wanted):
     """Returns how well the language `offered` suits a user who wants `wanted`.
 
-    3 means the same name, 2 the same language without a region, 1 the same language with a region,
-    and 0 a language that the user does not read.
+    3 means the same name. 2 means the same language, where `offered` has no region, and 1 means the
+    same language, where `offered` has a region. 0 means another language, or the other Chinese script.
     """
     offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
                        for name in (offered, wanted))
@@ -42,8 +42,8 @@ def languages(medium):
 def language(medium, locales):
     """Returns the language in which the wizard shows the medium's texts to a user.
 
-    `locales` are the user's locales, the preferred one first. If no language of the medium suits
-    any of them, returns the medium's first language, or "en" if it has no texts at all.
+    `locales` are the user's locales, the preferred one first. If none of them suits, returns the
+    first of languages(), or "en" if the medium has no texts.
     """
     offered = languages(medium)
     for wanted in locales:
@@ -59,13 +59,13 @@ def read(medium, language):
 
 
 def read_table(table):
-    """Returns the texts of a strings file, which may be text in UTF-8 or UTF-16, or a property
-    list. Returns no texts if the file is missing or is a damaged property list."""
+    """Returns the texts of a strings file in UTF-8 or UTF-16, or in the form of a property list.
+    Returns no texts if the file is missing or is a damaged property list."""
     data = table.read_bytes() if table.exists() else b""
     if data.startswith((b"<?xml", b"bplist")):
         try:
             content = plistlib.loads(data)
-        except Exception:  # plistlib's errors have nothing in common
+        except Exception:  # plistlib's errors have no other common class
             content = {}
         entries = content.items() if isinstance(content, dict) else ()
         return Texts((key, text) for key, text in entries if isinstance(text, str))

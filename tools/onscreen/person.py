@@ -8,8 +8,8 @@ import time
 from .processes import start, stop, wait_for
 
 _LOOK_SECONDS = 20
-# Whenever a table's cell is looked at, Qt creates an object that it never frees. So a search for one
-# control enters tables only if the control is part of a table.
+# Qt creates an object for each table cell that a search visits, and never frees the object. So a
+# search for a control enters tables only if the control can be part of a table.
 _TABLES = ("list", "table", "tree", "tree table")
 _IN_TABLES = ("list item", "table cell", "table column header")
 _COLUMNS = 3
@@ -18,8 +18,8 @@ _COLUMNS = 3
 def _is(control, role, name):
     """Returns whether the control has the role and the name. If `name` is None, any name will do.
 
-    A heading counts as a label, too. The accessible name of a row's first cell may end with a comma
-    and the row's address, which `name` leaves out.
+    A heading also counts as a label. A table cell may have the accessible name "NAME, ADDRESS", which
+    matches the name "NAME".
     """
     own_role = control.get_role_name()
     if own_role != role and (own_role, role) != ("heading", "label"):
@@ -34,8 +34,8 @@ def _words(role, name):
 
 
 class Person:
-    """A person who uses one program. Creating the object starts the program on a desktop, and
-    leaving the object's context ends it.
+    """A person who uses one program. The constructor starts the program on a desktop, and leaving
+    the object's context ends the program.
     """
 
     follows_desktop = True  # whether the program uses the desktop's text size, scale and colours
@@ -62,7 +62,7 @@ class Person:
     # Looking at the screen.
 
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
-        """Waits until a control of that role and name is on the screen, and returns it.
+        """Waits until a control with this role and name is on the screen, and returns the control.
 
         Raises TimeoutError after `seconds`, and RuntimeError when the program has ended.
         """
@@ -70,23 +70,23 @@ class Person:
                         _words(role, name))
 
     def sees(self, role, name=None):
-        """Returns whether a control of that role and name is on the screen now."""
+        """Returns whether a control with this role and name is on the screen now."""
         return self._look(role, name) is not None
 
     def see_gone(self, role, name=None, seconds=_LOOK_SECONDS):
-        """Waits until no control of that role and name is on the screen."""
+        """Waits until no control with this role and name is on the screen."""
         wait_for(lambda: self._certainly_gone(role, name), seconds,
                  f"{_words(role, name)} to disappear")
 
     def everything(self):
-        """Returns a list with the tuple (role, name, control) of every control on the screen."""
+        """Returns a tuple (role, name, control) for each control on the screen."""
         found = []
         self._visit(self._application(), lambda c: found.append(
             (c.get_role_name(), c.get_name(), c)))
         return found
 
     def rows(self):
-        """Returns the texts of the device table on the screen, as one tuple for each row."""
+        """Returns a tuple of texts for each row of the device table on the screen."""
         cells = [name for role, name, _ in self.everything() if role == "table cell"]
         rows = zip(*(cells[column::_COLUMNS] for column in range(_COLUMNS)))
         return [(row[0].removesuffix(f", {row[-1]}"), *row[1:]) for row in rows]
@@ -96,7 +96,7 @@ class Person:
         return control.get_state_set().contains(getattr(self._atspi.StateType, state.upper()))
 
     def picture(self, path):
-        """Saves a picture of the screen after a short pause, in which the screen settles."""
+        """Waits briefly for the screen to settle, then saves a picture of it."""
         time.sleep(0.3)
         self.desktop.picture(path)
 
@@ -129,9 +129,9 @@ class Person:
         wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
 
     def open_menu(self, button=None):
-        """Opens the menu of the button named `button` or, without a name, of the focused button.
+        """Opens the menu of the button named `button`, or of the focused button for None.
 
-        The menu is not visible on the accessibility bus, so it can be used only by keyboard.
+        The accessibility bus does not show the menu, so only the keyboard can use it.
         """
         windows = self._window_count()
         if button:
@@ -142,7 +142,7 @@ class Person:
                  f"the menu of {repr(button) if button else 'the focused button'} to open")
 
     def choose_from_menu(self, button, item):
-        """Opens a button's menu and chooses the entry with the number `item`, counted from 1."""
+        """Opens a button's menu and chooses entry number `item`, counted from 1."""
         self.open_menu(button)
         self.choose_from_open_menu(item)
 
@@ -150,7 +150,7 @@ class Person:
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):
-        """Presses one key after another. Keys have their X names, such as "Return" or "alt+F4"."""
+        """Presses the keys one after another. They have X names, such as "Return" or "alt+F4"."""
         self.desktop.run(["xdotool", "key", "--clearmodifiers", *keys])
 
     def close_window(self):
@@ -174,7 +174,7 @@ class Person:
     def _resting_place(self, control):
         """Waits until the control no longer moves, and returns its extents on the screen.
 
-        The window manager moves a new window some time after the window appears.
+        The window manager may move a new window shortly after the window appears.
         """
         place = None
 
@@ -188,11 +188,10 @@ class Person:
         return wait_for(rests, _LOOK_SECONDS, f"{control.get_name()!r} to stop moving")
 
     def round_trip(self):
-        """Returns the seconds that the program takes to answer a small request on the accessibility
-        bus.
+        """Returns how many seconds the program takes to answer a small request on the accessibility
+        bus, without the time that the program and this process wait for a processor.
 
-        The time during which the program and this process wait for a processor does not count. If
-        the request fails, returns the time until the failure, or None when the program has ended.
+        If the request fails, returns the time until the failure, or None if the program has ended.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 
@@ -227,9 +226,9 @@ class Person:
         return None
 
     def _certainly_gone(self, role, name):
-        """Returns whether certainly no control of that role and name is on the screen.
+        """Returns True only if it is certain that no control with this role and name is on the screen.
 
-        If the program is too busy to answer, its controls may still be there.
+        A program that is too busy to answer may still show the control.
         """
         self._overlooked = False
         found = self.sees(role, name)
@@ -247,11 +246,11 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` for `control` and all visible controls below it, until a call returns
-        False. Does not call `visit` for the application itself.
+        """Calls `visit` for `control` and all visible controls below it, depth first, until a call
+        returns False. Does not call `visit` for the application itself.
 
-        Goes depth first, skips controls that disappear, and enters tables only if `tables` is set.
-        Returns False if a call returned False, otherwise True.
+        Skips controls that disappear. Enters tables only if `tables` is true. Returns False if a call
+        returned False, otherwise True.
         """
         if control is None:
             self._overlooked = True

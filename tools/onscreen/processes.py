@@ -14,7 +14,7 @@ class Missing(Exception):
 
 
 class InVain(TimeoutError):
-    """Raised after a wait in vain. `what` describes the awaited event."""
+    """Raised when an awaited event does not happen. `what` describes the event."""
 
     def __init__(self, seconds, what):
         super().__init__(f"gave up after waiting {seconds} s for {what}")
@@ -26,8 +26,8 @@ def _die_with_parent():
 
 
 def start(arguments, package=None, **options):
-    """Starts a program. If it is missing, the error names `package`, the Debian package that
-    contains it."""
+    """Starts a program. Raises Missing if that fails. The error names `package`, the Debian package
+    that contains the program."""
     try:
         return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)
     except FileNotFoundError as error:
@@ -51,7 +51,7 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises InVain after `seconds`. `what` describes the awaited event in the error's text.
+    Raises InVain after `seconds`. The error's text contains `what`, which describes the event.
     """
     deadline = time.monotonic() + seconds
     while True:

@@ -1,4 +1,4 @@
-"""The SNMP side of the devices: a net-snmp agent for each address that answers."""
+"""The SNMP side of the made-up devices: a net-snmp agent for each address that answers."""
 
 import functools
 import json
@@ -15,8 +15,8 @@ from practice_network.description import CLOSED, MISSING, SILENT, TEXT, Descript
 
 @functools.cache
 def maker_settings():
-    """Returns the SNMP community and object of the maker's settings. Raises DescriptionError if
-    their file does not give them."""
+    """Returns the SNMP community and object identifier in maker.json, or in the file that the
+    variable ONRAMP_MAKER names. Raises DescriptionError if the file does not have them."""
     path = os.environ.get("ONRAMP_MAKER") or pathlib.Path(__file__).parents[2] / "maker.json"
     try:
         maker = json.loads(pathlib.Path(path).read_text(encoding="utf-8"))
@@ -52,8 +52,8 @@ class Agents:
         self._by_device = {}
 
     def start(self, devices):
-        """Starts the agents of `devices` in parallel, and returns when all of them listen. IPv6
-        addresses get no agent."""
+        """Starts the agents of `devices` in parallel, and returns when all of them listen. Raises
+        AgentError if one does not. IPv6 addresses get no agent."""
         awaited = []
         for device in devices:
             handles = self._by_device[device.name] = []
@@ -73,10 +73,10 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """From now on, forwards each request for `address`, a broadcast address, to every agent
-        that answers.
+        """Starts a thread that forwards each request for the broadcast address `address` to every
+        net-snmp agent.
 
-        The agents do not receive broadcasts, because they listen only at their own addresses.
+        The agents receive no broadcasts, because each listens only at its own address.
         """
         listener = socket.socket(socket.AF_INET, socket.SOCK_DGRAM)
         listener.bind((address, PORT))
@@ -97,7 +97,7 @@ class Agents:
 
 
 def _relay(address, request, sender, seconds=5):
-    """Sends `request` to the agent at `address`, and sends its answer to `sender` from
+    """Sends `request` to the agent at `address`, and forwards the agent's answer to `sender`, from
     `address`."""
     with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as own:
         own.settimeout(seconds)
@@ -152,8 +152,7 @@ class _Agent:
         return self._log.read_text(errors="replace") if self._log.exists() else ""
 
     def close(self):
-        # The script of a slow answer keeps the agent's socket open, so the agent's whole process group
-        # has to end.
+        # A script that delays an answer keeps the agent's socket open, so the script must end, too.
         if self._process.poll() is None:
             os.killpg(self._process.pid, signal.SIGKILL)
             self._process.wait()
@@ -164,8 +163,8 @@ def _override(activeif):
 
 
 def _slow_script(activeif, delay):
-    """Returns a script that net-snmp runs for the object. After `delay` seconds, the script prints
-    the object's name, type and value, or nothing if the agent lacks the object."""
+    """Returns a script that net-snmp runs for each request. After `delay` seconds, the script prints
+    the object's identifier, type and value, or nothing if the agent lacks the object."""
     _, snmp_object = maker_settings()
     answer = {MISSING: "", TEXT: f".{snmp_object}\nstring\ntwo"}.get(
         activeif, f".{snmp_object}\ninteger\n{activeif}")

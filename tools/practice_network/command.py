@@ -1,4 +1,4 @@
-"""The command line: starts the network or, with `ctl`, controls the network from inside."""
+"""The command line, which starts a network or, with `ctl`, controls the network around it."""
 
 import argparse
 import importlib.util
@@ -24,7 +24,7 @@ HELP = """
 Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns the exit
 status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespaces of the kernel. No
 packet leaves this machine, and no hardware is needed. The network ends when COMMAND or this tool
-ends, in whatever way.
+ends or is killed.
 
 This command runs the wizard with twenty devices:
     tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
@@ -37,32 +37,32 @@ The tool needs root or sudo. COMMAND runs as the user who started the tool.
 """
 
 DETAILS = """
-the description is a TOML file. One table, which may be left out, is for the network:
+the description is a TOML file. An optional table is for the network:
     [network]
     ipv6 = true                    false: IPv4 only; default true
-    interfaces = 2                 1 or 2; default 1. Both see all devices, as Ethernet and Wi-Fi do
-                                   in one network. With --hosts 2 they are practice0 and practice1,
-                                   otherwise lo and practice1.
+    interfaces = 2                 1 or 2; default 1. Each sees all devices, as Ethernet and Wi-Fi do
+                                   in one network. With --hosts 2, their names are practice0 and
+                                   practice1, otherwise lo and practice1.
     domains = ["annex.local"]      domains to browse besides "local"; default none
 there is one table for each device:
     [[device]]
     name = "Kestrel Model 100"     the name in the wizard's list; only this entry is required. A
                                    name in a script such as Japanese should have at most 57 bytes,
-                                   because Avahi loses devices with longer ones after two minutes.
-    maker = "Kestrel"              maker and model, which make up the medium's model names
-    model = "Model 100"
+                                   because Avahi loses devices with longer names after two minutes.
+    maker = "Kestrel"              maker and model; the wizard lists the device only if the two
+    model = "Model 100"            together, "Kestrel Model 100", are a model's name on the medium
     note = "2nd floor"             the device's location
     type = "_ipp._tcp"             or a list of types; default "_pdl-datastream._tcp"
     domain = "annex.local"         default "local"; other domains must end in ".local"
     port = 631                     default: the type's usual port, or 9100
-    addresses = ["127.0.1.9"]      or how many addresses the network chooses; default 1
+    addresses = ["127.0.1.9"]      or a number: the network chooses that many; default 1
     activeif = 2                   the number that the device answers; default 2, for wireless.
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
                                    answers with a text. A list gives each address its own value.
                                    IPv6 addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
-    present = false                switched off at the start; default true
+    present = false                false: switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
 inside the network, these commands show and change the devices while COMMAND runs. KEY=VALUE is an
@@ -80,7 +80,7 @@ PracticeNetwork in tools/practice_network offers these commands to Python tests.
 PracticeNetwork find the network through the environment variable ONRAMP_PRACTICE_SOCKET.
 
 programs with windows: DISPLAY works if the X server has its socket in /tmp/.X11-unix, as X servers
-do by default. Abstract sockets and TCP connections to the X server do not work inside.
+do by default. Abstract sockets and TCP connections to the X server do not work.
 XDG_RUNTIME_DIR is a new folder. The session bus, Wayland and the accessibility bus of your
 desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
@@ -189,7 +189,8 @@ def _steer(request):
 
 
 def _entry(text):
-    """Reads KEY=VALUE as in a description file, except that a text needs no quotes."""
+    """Returns the key and the value of KEY=VALUE. The value is written as in a description file,
+    except that a text needs no quotes."""
     key, equals, value = text.partition("=")
     if not equals:
         raise ControlError(f'"{text}": write an entry as KEY=VALUE')

@@ -20,9 +20,8 @@ class PracticeNetwork:
 
     A device is identified by its name. Its entries are those of the description file: `maker`,
     `model`, `note`, `type`, `domain`, `port`, `addresses`, `activeif`, `delay`, `present`, `txt`.
-    An operation returns when the network has carried it out. It may take Avahi another second to
-    publish a new device; settle() waits for that. An operation that the network refuses raises
-    ControlError.
+    An operation returns when the network has carried it out, and raises ControlError if the network
+    refuses it. Avahi may take another second to publish a new device; settle() waits for Avahi.
     """
 
     def __init__(self, path=None):
@@ -32,14 +31,15 @@ class PracticeNetwork:
                                "start one with: practice-network DESCRIPTION")
 
     def add(self, name, **entries):
-        """Changes a known device by `entries` and switches it on, or adds a new device with
-        `entries`."""
+        """Changes `entries` of a known device and switches the device on, or adds a new device with
+        these entries."""
         self._ask("add", name, entries)
 
     def remove(self, name):
         """Switches a device off. Avahi announces that the device is gone, and its agents end.
 
-        Browsers report the device as gone up to a second later, when it leaves their mDNS caches.
+        A browser reports the device as gone when the device leaves the browser's mDNS cache, up to a
+        second later.
         """
         self._ask("remove", name)
 
@@ -47,13 +47,13 @@ class PracticeNetwork:
         self._ask("rename", name, new_name)
 
     def set(self, name, **entries):
-        """Changes a device. A new text or address is published as a change. After a change of name,
-        type, domain or port, the services are withdrawn and published again."""
+        """Changes `entries` of a device. Avahi announces a new text or address as an update. For a
+        new name, type, domain or port, it withdraws the services and publishes them again."""
         self._ask("set", name, entries)
 
     def list(self):
-        """Returns a dictionary for each device: its entries, and its "state", such as
-        "established"."""
+        """Returns a list with a dictionary for each device, which has the device's entries and its
+        "state", such as "established"."""
         return self._ask("list")
 
     def unplug(self, interface):
@@ -104,7 +104,7 @@ OPERATIONS = ("add", "remove", "rename", "set", "list", "unplug", "plug", "stop_
 
 
 def serve(network, listener):
-    """Carries out requests on `network`, one after another. Never returns."""
+    """Carries out the requests that arrive on `listener`, one after another. Never returns."""
     while True:
         connection, _ = listener.accept()
         connection.settimeout(5)

@@ -6,7 +6,7 @@ import ipaddress
 import re
 import tomllib
 
-# The values of `activeif` that are not integers. They say what an address does with an SNMP
+# The values of `activeif` that are not integers. Each is a way in which an address treats an SNMP
 # request.
 SILENT = "silent"    # receives the request and never answers
 CLOSED = "closed"    # has no agent, so the host refuses the packet
@@ -16,7 +16,7 @@ WORDS = (SILENT, CLOSED, MISSING, TEXT)
 
 DEFAULT_TYPE = "_pdl-datastream._tcp"
 DEFAULT_PORTS = {DEFAULT_TYPE: 9100, "_printer._tcp": 515, "_ipp._tcp": 631, "_scanner._tcp": 9500}
-# The TXT keys of maker and model, which differ between scanners and printers.
+# The TXT keys for maker and model. Scanners and printers use different keys.
 SCANNER_KEYS = ("mfg", "mdl")
 PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
@@ -134,8 +134,8 @@ def change(before, table, place):
 
 
 def _read(table, readers, place):
-    """Returns the values of `table`. `readers` has, for each key, the function that checks and
-    converts the value, and a description of valid values."""
+    """Returns the checked and converted values of `table`. For each key, `readers` has a function
+    that checks and converts a value, and a text that describes valid values."""
     values = {}
     for key, value in table.items():
         if key not in readers:

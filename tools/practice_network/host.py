@@ -73,7 +73,7 @@ def take_over_run():
 
 
 def loop_back(second):
-    """Makes the loopback interface the network of the devices and the command.
+    """Sets up the loopback interface as the network of the devices and the command.
 
     `second` is the name of a second interface to create, or None.
     """
@@ -85,9 +85,9 @@ def loop_back(second):
 
 
 def plug_in_cables(names):
-    """Connects this network namespace with the one of process 1 by virtual cables.
+    """Connects this network namespace to that of process 1, with a virtual cable for each name.
 
-    All cables are in one network, like the Ethernet and the Wi-Fi of a computer. When a cable is
+    All cables are in the same network, as a computer's Ethernet and Wi-Fi can be. When a cable is
     unplugged, the next cable carries the traffic.
     """
     for number, name in enumerate(names):
@@ -118,7 +118,7 @@ def _set_kernel(key, value, enter):
 
 
 class Host:
-    """The host that this process's namespaces form. It has a system bus and can start Avahi."""
+    """The host that this process's namespaces form. The constructor starts the host's system bus."""
 
     def __init__(self, name, interfaces, settings):
         self._name = name
@@ -131,8 +131,8 @@ class Host:
         run("ip", "address", "replace", address, "dev", self.interfaces[0])
 
     def plug(self, interface, plugged):
-        """Brings the interface up if `plugged` is true, otherwise down. With two hosts, does the same
-        at the other end of the cable."""
+        """Brings the interface up if `plugged` is true, otherwise down. With two hosts, does so at both
+        ends of the cable."""
         for enter in ((), IN_FIRST_HOST):
             if plugged:
                 _bring_up(interface, self.interfaces.index(interface), enter)
@@ -151,7 +151,7 @@ class Host:
                              "--no-rlimits")
 
     def stop_avahi(self):
-        """Ends the daemon normally, so that it announces that all its services are gone."""
+        """Ends the daemon with SIGTERM, so that it announces that all its services are gone."""
         if self._avahi:
             self._avahi.terminate()
             self._avahi.wait()
@@ -175,7 +175,7 @@ def log(program):
 
 
 def _start(program, *arguments):
-    # Ctrl-C is meant for the command. It does not reach the daemon, which is in another session.
+    # The new session keeps Ctrl-C, which is meant for the command, away from the daemon.
     with open(RUN / f"{program}.log", "ab") as output:
         return subprocess.Popen([program, *arguments], stdin=subprocess.DEVNULL, stdout=output,
                                 stderr=output, start_new_session=True)

@@ -1,4 +1,4 @@
-"""Runs the network in namespaces, which end with the tool."""
+"""Runs the network in namespaces that end with the tool."""
 
 import json
 import os
@@ -61,8 +61,8 @@ def enclose(options):
 
 
 def inside(options):
-    """Runs as the first process in the namespaces. Starts the network and then the command, and
-    returns the exit status."""
+    """Runs as the first process in the namespaces. Starts the network and then the command. Returns
+    the exit status of the tool."""
     # SIG_IGN is unsuitable, because the command would inherit it.
     signal.signal(signal.SIGINT, lambda *_: None)
     try:
@@ -82,7 +82,7 @@ def inside(options):
     except OSError as error:
         print(f"practice-network: {options['command'][0]}: {error.strerror}", file=sys.stderr)
         return 127 if isinstance(error, FileNotFoundError) else 126
-    # The first process in a namespace has to reap all orphans.
+    # The first process in a process namespace has to reap all orphans.
     while True:
         pid, status = os.wait()
         if pid == command.pid:
@@ -92,8 +92,8 @@ def inside(options):
 
 
 def devices(options):
-    """Runs as the process of the devices, on the command's host or on a second host. Starts the
-    devices and carries out requests. Returns only after a failure, with the exit status."""
+    """Runs as a separate process, on the command's host or on a second host. Starts the devices and
+    carries out requests. Returns only after a failure, with the tool's exit status."""
     try:
         settings, described = description.load(options["description"])
         if options["hosts"] == 2:
@@ -128,7 +128,7 @@ def _own_run(user):
     folder = pathlib.Path(variables["XDG_RUNTIME_DIR"])
     folder.mkdir(mode=0o700)
     os.chown(folder, *user)
-    if cookies and not authority.exists():  # The file was in /run.
+    if cookies and not authority.exists():  # The new /run hides the file.
         copy = folder / "Xauthority"
         copy.touch(mode=0o600)
         copy.write_bytes(cookies)

@@ -14,8 +14,8 @@ from practice_network.publisher import Publisher, PublishError
 
 
 class Network:
-    """All known devices. Those that are present, which means switched on, are published, and their
-    agents run."""
+    """All known devices. A device is published, and its agents run, while it is present, that is,
+    switched on."""
 
     def __init__(self, host, subnet):
         self._host = host
@@ -23,12 +23,12 @@ class Network:
         self._agents = Agents(RUN / "agents")
         self._publisher = None
         self._devices = {}
-        # A device has the same host name whenever it is switched on.
+        # A device keeps its host name when it is switched off and on again.
         numbers = itertools.count(1)
         self._host_names = collections.defaultdict(lambda: f"device-{next(numbers)}.local")
 
     def load(self, devices):
-        """Takes the devices of a description, and publishes those that are present."""
+        """Makes `devices` the known devices, and publishes those that are present."""
         self._devices = {device.name: device for device in devices}
         # Devices with fixed addresses come first, so that other devices do not get these addresses.
         for device in sorted(devices, key=lambda one: isinstance(one.addresses, int)):
@@ -78,8 +78,8 @@ class Network:
         self._host.stop_avahi()
 
     def add(self, name, entries):
-        """Changes a known device by `entries` and switches it on, or adds a new device with
-        `entries`."""
+        """Changes `entries` of a known device and switches the device on, or adds a new device with
+        these entries."""
         if name in self._devices:
             self.set(name, entries | {"present": True})
             return
@@ -95,7 +95,7 @@ class Network:
         self.set(name, {"name": new_name})
 
     def set(self, name, entries):
-        """Changes a device, and publishes what the entries change."""
+        """Changes `entries` of a device, and publishes the changes."""
         before = self._devices.get(name)
         if not before:
             raise DescriptionError(f'device "{name}" is unknown; "list" shows the known devices')
@@ -131,8 +131,8 @@ class Network:
                 self._publish(after)
 
     def list(self):
-        """Returns a dictionary for each device: its entries, and its "state", such as
-        "established"."""
+        """Returns a list with a dictionary for each device, which has the device's entries and its
+        "state", such as "established"."""
         return [{key: value for key, value in dataclasses.asdict(device).items()
                  if value is not None}
                 | {"txt": dict(device.txt), "state": self._state(device)}
@@ -157,8 +157,8 @@ class Network:
         self._agents.stop(device)
 
     def _with_addresses(self, device, known_as=None):
-        """Returns the device with addresses, which the network chooses if `addresses` is a number.
-        Adds the addresses to the host. `known_as` is the device's old name if its name changes."""
+        """Returns the device with its addresses, and adds them to the host. Chooses free addresses
+        if `addresses` is a number. `known_as` is the device's old name if its name changes."""
         name = known_as or device.name
         used = {address for key, other in self._devices.items() if key != name
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())

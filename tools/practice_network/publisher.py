@@ -11,9 +11,9 @@ AVAHI = "org.freedesktop.Avahi"
 ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
-# The flags mean: unique, no probes, several records for one name. Probes are unnecessary, because
-# nobody else uses these host names. They would also do harm. On loopback, Avahi receives its own
-# probes. If it has replaced the record since it sent a probe, it treats this probe as a conflict.
+# The flags mean: unique, no probes, several records for one name. Nobody else uses these host names,
+# so probes are unnecessary. They would even do harm: on loopback, Avahi receives its own probes, and
+# treats a probe as a conflict if the record has changed since the probe was sent.
 ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
 ADDRESS_SECONDS = dbus.UInt32(120)  # RFC 6762, section 10
 CLASS_IN, TYPE_A, TYPE_AAAA = dbus.UInt16(1), dbus.UInt16(1), dbus.UInt16(28)
@@ -27,7 +27,8 @@ class PublishError(Exception):
 
 
 def connect(bus_address, seconds=10):
-    """Waits until Avahi runs. Returns a connection to the bus, and Avahi's server object on it."""
+    """Waits until Avahi runs. Returns a connection to the bus, and Avahi's server object on it.
+    Raises PublishError after `seconds`."""
     bus = dbus.bus.BusConnection(bus_address)
     deadline = time.monotonic() + seconds
     while True:
@@ -46,8 +47,8 @@ def connect(bus_address, seconds=10):
 
 @dataclasses.dataclass(frozen=True)
 class _Entry:
-    """The published records of a device. Addresses and services are separate groups, so the
-    addresses can be replaced alone."""
+    """The published records of a device. Addresses and services are separate groups, so that new
+    addresses leave the services as they are."""
 
     host: str
     addresses: dbus.Interface
@@ -101,7 +102,7 @@ class Publisher:
         """Waits until Avahi has finished probing for the device's name, for at most `seconds`.
 
         The device's records must not change during the probes. On loopback, Avahi receives its own
-        probes. If a probe has an older text than the record, Avahi treats the probe as a conflict.
+        probes, and treats a probe whose text differs from the record's as a conflict.
         """
         deadline = time.monotonic() + seconds
         while self.state(device) == "probing" and time.monotonic() < deadline:
@@ -109,7 +110,7 @@ class Publisher:
 
     def state(self, device):
         """Returns "established" if both groups of the device are established, otherwise the state
-        of a group that is not. A device without groups, or without Avahi, is "withdrawn"."""
+        of a group that is not. Returns "withdrawn" if the device has no groups or Avahi has ended."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"
