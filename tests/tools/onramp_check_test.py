@@ -128,6 +128,7 @@ def maximum(major, minor, bug_fix):
 MISTAKES = [
     # Property lists.
     (rename(COMMON, "ModelInfo", "ModellInfo"), "key-misspelt", "ModelInfo", "opens at once"),
+    (rename(COMMON, "BonjourNetwork", "BonjorNetwork"), "key-misspelt", "BonjourNetwork"),
     (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
     (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
     (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "out of the medium"),
@@ -163,7 +164,8 @@ MISTAKES = [
     (both(put(DESCRIPTION, "ContainedModel", {}), put(MODELS, "Model", {}),
           take(COMMON, "BonjourNetwork"), take(COMMON, "WLANtool")), "models-none", "at once"),
     # Systems and packages.
-    (packages(v109=1), "package-none", "no package for 10.6.0 up to, but not including, 10.9.0"),
+    (packages(v109=1), "package-none", "systems: 10.6.0 up to, but not including, 10.9.0"),
+    (both(remove(PACKAGE), write(PACKAGE, b"")), "package-empty", "nothing can be installed"),
     (put(COMMON, "PkgInfo", "PkgName", "None.pkg"), "path-missing", "Packages/None.pkg"),
     (both(packages(v106=1, v107=1, v108=1, v109=1), put(COMMON, "PkgInfo", "108", Path(PACKAGE).stem + "2.pkg")),
      "path-missing", "put it at that path, or correct the path"),
@@ -182,11 +184,14 @@ MISTAKES = [
     (take(f"{TOOL}/Info.plist", "CFBundleDisplayName"), "tool-unnamed", "menu"),
     (replace(f"{TOOL}/Resources/ja.lproj/InfoPlist.strings", "Kestrel", "Lumora"),
      "tool-name-left-over", "Lumora", "without \"Kestrel\""),
+    (remove(f"{TOOL}/Resources/ko.lproj"), "language-not-in-tool", "de, en, ja, zh_CN"),
     (take(COMMON, "WLANtool"), "tool-none", "no set-up tool runs"),
     (put(COMMON, "WLANtool", COMMON), "tool-no-bundle", ".app"),
     # Texts.
     (replace(ENGLISH, '"INST_TXT_WIFI" = "Wireless Network (Wi-Fi)";\n', ""),
      "text-missing", "INST_TXT_WIFI", "de, ja, ko, zh_CN"),
+    (lambda folder: shutil.copy(folder / ENGLISH, folder / ENGLISH.replace("en.", "ja.")),
+     "texts-copied", 'the same texts as in "en"', "translate"),
     (replace(ENGLISH, "INST_TXT_WIFI", "INST_TXT_WFI"), "text-misspelt", "INST_TXT_WIFI"),
     (replace(ENGLISH, "macOS %@", "%@ %@ %@"), "text-placeholders", "3 times", "once or twice"),
     (replace(ENGLISH, "No device was", "100 % no device was"), "text-percent", "macOS"),
@@ -205,6 +210,7 @@ MISTAKES = [
      "language-unknown", "nobody sees"),
     # Pictures.
     (remove(PICTURE), "path-missing", "no picture beside USB"),
+    (remove(f"{APPLICATION}/Resources/Background@2x.png"), "path-missing", "blurred"),
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
      "picture-size", "680 × 480", "192 × 192"),
     (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
@@ -247,6 +253,7 @@ class OnrampCheck(unittest.TestCase):
         result = run("--strict", str(self.medium))
         self.assertEqual((0, ""), (result.returncode, result.stderr), result.stdout)
         for line in ("  Kestrel Model 320   ---  wired  wireless", "Starts with: the model list",
+                     "Application: Onramp OSX.app, identifier com.kestrelimaging.onramp, for macOS only",
                      f": {PACKAGE}", "Languages: " + " ".join(
                          f"{language} (31 texts)" for language in "de en ja ko zh_CN".split()),
                      "0 errors, 0 warnings, 17 models"):
@@ -280,7 +287,8 @@ class OnrampCheck(unittest.TestCase):
         self.assertEqual([0, 1], [run(medium).returncode, run("--strict", medium).returncode])
 
     def test_bad_arguments_fail_with_a_message(self):
-        for arguments in (["/nowhere"], [], ["--jsn", "."], [__file__]):
+        for arguments in (["/nowhere"], [], ["--jsn", "."], [__file__],
+                          [str(self.medium / "MacResources")], [str(self.medium / "Onramp OSX.app")]):
             result = run(*arguments)
             self.assertEqual((2, ""), (result.returncode, result.stdout))
             self.assertTrue(result.stderr)

@@ -30,6 +30,7 @@ Report checkMedium(const std::string& root) {
   }
   const MediumFiles files(folder, application, report);
   const Lists lists = readLists(files);
+  describeApplication(files, lists);
   checkApplication(files, lists);
   checkIdentity(lists, report);
   checkModelNames(lists, report);

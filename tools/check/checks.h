@@ -24,6 +24,9 @@ void checkPackages(const MediumFiles& files, const Lists& lists);
 /// contains the maker's name, checks that every translation of the tool's name does, too.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
+/// Sets the members `identifier` and `platforms` of the report. Checks nothing.
+void describeApplication(const MediumFiles& files, const Lists& lists);
+
 /// Checks the application's program file. If the medium offers the online service, also checks the
 /// application's list of the countries that have the service.
 void checkApplication(const MediumFiles& files, const Lists& lists);

@@ -56,6 +56,7 @@ void checkServiceType(const Lists& lists, Report& report) {
     // readLists() has already reported a value that is not a string.
     if (lists.resources->find(medium::kBonjourNetwork) && !type) return;
     if (!lists.anyWireless()) return;
+    if (report.hasMisspelt(lists.resourcesPath, medium::kBonjourNetwork)) return;
     report.findings.push_back({.id = "service-none",
                                .place = type ? place : Place{.file = lists.resourcesPath},
                                .found = type ? "an empty service type" : "no \"BonjourNetwork\"",

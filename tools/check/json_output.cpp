@@ -59,6 +59,8 @@ void writeJSON(std::ostream& out, const Report& report) {
   const Json json{{"form", kForm},
                   {"medium", report.medium},
                   {"application", report.application},
+                  {"identifier", report.identifier},
+                  {"platforms", report.platforms},
                   {"errors", report.count(Severity::kError)},
                   {"warnings", report.count(Severity::kWarning)},
                   {"findings", std::move(findings)},

@@ -6,11 +6,13 @@
 #include <exception>
 #include <filesystem>
 #include <iostream>
+#include <optional>
 #include <string>
 #include <system_error>
 
 #include "base/maker.h"
 #include "platform/terminal.h"
+#include "tools/check/application.h"
 #include "tools/check/check.h"
 #include "tools/check/output.h"
 
@@ -23,11 +25,26 @@ constexpr int kUnreadable = 2;
 
 constexpr const char* kFooter = R"(Examples:
   onramp-check /Volumes/Setup          print what is wrong with the medium
-  onramp-check --json build/medium     print the same as JSON, for a program
+  onramp-check --json /Volumes/Setup   print the same as JSON, for a program
 
 Exit status: 1 when an error or, with --strict, a warning was found; 2 when the
 medium could not be read, the output could not be written or the command line is
 wrong; otherwise 0.)";
+
+// Returns the folder above `folder` if that is a medium of which `folder` is only a part. Otherwise
+// returns nothing.
+std::optional<std::string> mediumAround(const std::string& folder) {
+  namespace fs = std::filesystem;
+  std::error_code ignored;
+  const fs::path part = fs::canonical(folder, ignored);
+  const auto isMedium = [&](const fs::path& path) {
+    return fs::is_directory(path / "MacResources", ignored);
+  };
+  if (isMedium(part) || !check::findApplication(part.string()).empty() ||
+      !isMedium(part.parent_path()))
+    return std::nullopt;
+  return part.parent_path().string();
+}
 
 // Returns `status` if standard output could be written. Otherwise prints a message and returns
 // kUnreadable.
@@ -74,6 +91,12 @@ int run(int count, char* arguments[]) {
   if (std::filesystem::directory_iterator(medium, ignored); ignored) {
     std::cerr << "onramp-check: " << check::quoted(medium)
               << " cannot be read: " << ignored.message() << '\n';
+    return kUnreadable;
+  }
+  if (const auto whole = mediumAround(medium)) {
+    std::cerr << "onramp-check: " << check::quoted(medium)
+              << " is only a part of a medium; give the whole medium, " << check::quoted(*whole)
+              << '\n';
     return kUnreadable;
   }
   const check::Report report = check::checkMedium(medium);

@@ -1,7 +1,9 @@
 #include <algorithm>
 #include <array>
+#include <filesystem>
 #include <iterator>
 #include <set>
+#include <system_error>
 
 #include "base/ascii.h"
 #include "media/KSInstallerInfo.h"
@@ -232,10 +234,11 @@ class PackageCheck {
     const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
     const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
-        "on " + words(row.from, row.to) + ", the window closes and nothing opens";
+        "the window closes and nothing opens; systems: " + words(row.from, row.to);
     if (!row.package.empty()) {
       const PathUse use{placeOf(medium::kPkgInfo, key), "the package", effect};
-      if (checked_.insert(row.package).second) static_cast<void>(files_.exists(row.package, use));
+      if (checked_.insert(row.package).second && files_.exists(row.package, use))
+        checkContents(row.package, use);
       return;
     }
     // readLists() has already reported a value of the wrong kind and a missing "PkgLocation".
@@ -243,10 +246,21 @@ class PackageCheck {
     report_.findings.push_back(
         {.id = "package-none",
          .place = placeOf(medium::kPkgInfo),
-         .found = "no package for " + words(row.from, row.to),
+         .found = "no package for these systems: " + words(row.from, row.to),
          .expected = key.empty() ? "\"PkgName\"" : "\"PkgName\" or " + quoted(key),
-         .effect = effect,
+         .effect = "the window closes and nothing opens on these systems",
          .remedy = "name the package, or narrow the range of systems"});
+  }
+
+  void checkContents(const std::string& package, const PathUse& use) {
+    std::error_code error;
+    if (!std::filesystem::is_empty(files_.fullPath(package), error) || error) return;
+    report_.findings.push_back({.id = "package-empty",
+                                .place = use.place,
+                                .found = "an empty package at " + quoted(package),
+                                .expected = "an installer package",
+                                .effect = "nothing can be installed",
+                                .remedy = "put the finished package there"});
   }
 
   void checkKeysThatNobodyUses() {

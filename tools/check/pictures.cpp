@@ -25,7 +25,11 @@ constexpr std::array kConnectionPictures{
     Picture{"usb.png", 192, 192, "no picture beside USB"},
     Picture{"wiredLan.png", 192, 192, "no picture beside USB and the wired network"},
 };
-constexpr Picture kBackground{"Background.png", 680, 480, "a window without a background picture"};
+constexpr std::array kBackgrounds{
+    Picture{"Background.png", 680, 480, "a window without a background picture"},
+    Picture{"Background@2x.png", 1360, 960,
+            "a blurred background on screens with two pixels per point"},
+};
 
 // The size of a picture in pixels, and the reason why the picture cannot be shown.
 struct Decoded {
@@ -97,9 +101,9 @@ void checkPictures(const MediumFiles& files) {
   for (const Picture& picture : kConnectionPictures)
     checkPicture(files, "MacResources/Images", picture);
   const std::string& application = files.report().application;
-  if (!application.empty()) {
-    checkPicture(files, application + "/Contents/Resources", kBackground);
-  }
+  if (application.empty()) return;
+  for (const Picture& picture : kBackgrounds)
+    checkPicture(files, application + "/Contents/Resources", picture);
 }
 
 }  // namespace onramp::check

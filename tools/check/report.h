@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "media/connection_type.h"
@@ -34,16 +35,21 @@ struct LanguageRow {
 /// The result of a check: the findings, and what users of the medium will see.
 struct Report {
   std::string medium{};
-  std::string application{};           ///< the name of its bundle; empty when there is none
-  std::vector<Finding> findings{};     ///< in the order in which the checks made them
-  std::vector<ModelRow> models{};      ///< in the order of the wizard's list
-  FirstPage start = FirstPage::kNone;  ///< the page that the wizard begins with
-  std::string systems{};               ///< the supported range, in words
+  std::string application{};             ///< the name of its bundle; empty when there is none
+  std::string identifier{};              ///< of the application's bundle
+  std::vector<std::string> platforms{};  ///< "macOS", "Linux": those with a program for them
+  std::vector<Finding> findings{};       ///< in the order in which the checks made them
+  std::vector<ModelRow> models{};        ///< in the order of the wizard's list
+  FirstPage start = FirstPage::kNone;    ///< the page that the wizard begins with
+  std::string systems{};                 ///< the supported range, in words
   std::vector<PackageRow> packages{};
   std::vector<LanguageRow> languages{};
 
   /// Returns the number of findings with this severity.
   [[nodiscard]] std::size_t count(Severity severity) const;
+
+  /// Returns whether a finding says that a key of the file was probably meant to be `key`.
+  [[nodiscard]] bool hasMisspelt(std::string_view file, std::string_view key) const;
 };
 
 }  // namespace onramp::check

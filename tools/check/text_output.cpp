@@ -118,12 +118,25 @@ const char* nameOf(Need need) {
   return need == Need::kAdvised ? "advised" : "optional";
 }
 
+void writeApplication(std::ostream& out, const Report& report) {
+  if (report.application.empty()) return;
+  out << "\nApplication: " << printable(report.application);
+  if (!report.identifier.empty()) out << ", identifier " << printable(report.identifier);
+  const char* word = ", for ";
+  for (const std::string& platform : report.platforms) {
+    out << word << platform;
+    word = " and ";
+  }
+  out << (report.platforms.size() == 1 ? " only" : "");
+}
+
 }  // namespace
 
 void writeText(std::ostream& out, const Report& report, std::size_t width) {
   for (const Finding& finding : report.findings)
     writeFinding(out, finding, width);
   writeModels(out, report, width);
+  writeApplication(out, report);
   out << "\nStarts with: " << startInWords(report.start)
       << "\nSystems: " << (report.systems.empty() ? "unknown" : report.systems) << '\n';
   for (const PackageRow& row : report.packages) {

@@ -5,6 +5,8 @@
 #include <set>
 #include <system_error>
 
+#include "media/medium.h"
+#include "platform/bundle.h"
 #include "platform/freedesktop/language.h"
 #include "tools/check/checks.h"
 #include "tools/check/shown_texts.h"
@@ -64,8 +66,10 @@ class TextCheck {
       read(language, kEffect);
     for (const auto& [language, table] : tables_)
       check(language, table);
+    checkTranslations();
     checkDevelopmentRegion();
     checkApplicationLanguages();
+    checkToolLanguages();
   }
 
  private:
@@ -206,6 +210,28 @@ class TextCheck {
     finding.remedy = "shorten the text, or see in the wizard whether it fits";
   }
 
+  // Reports each table that equals the English table or the table of a language before it. A new
+  // language usually begins as a copy, and may be left so by mistake.
+  void checkTranslations() {
+    for (const auto& table : tables_) {
+      const std::string code = Language::parse(table.first).code;
+      const auto original = std::find_if(tables_.begin(), tables_.end(), [&](const auto& other) {
+        const std::string otherCode = Language::parse(other.first).code;
+        return otherCode != code && (otherCode == "en" || other.first < table.first) &&
+               other.second == table.second;
+      });
+      if (code == "en" || original == tables_.end() || table.second.empty()) continue;
+      report_.findings.push_back(
+          {.id = "texts-copied",
+           .severity = Severity::kWarning,
+           .place = {.file = tablePath(table.first)},
+           .found = "the same texts as in " + quoted(original->first),
+           .expected = "texts in the language " + quoted(table.first),
+           .effect = "users of " + quoted(table.first) + " see another language",
+           .remedy = "translate the texts, or remove the folder"});
+    }
+  }
+
   void checkDevelopmentRegion() {
     constexpr const char* kKey = "CFBundleDevelopmentRegion";
     const std::string path = kBundle + "/Contents/Info.plist";
@@ -247,21 +273,55 @@ class TextCheck {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";
     const std::vector<std::string> own = languagesIn(files_, resources);
+    for (const std::string& language : languagesBeyond(own)) {
+      reportMissingLanguage(
+          "language-not-in-application", resources, language, own,
+          "read and hear some of the application's texts in English: why the wizard uses the "
+          "network, and the name of the gear button",
+          "have the application built with texts in that language");
+    }
+  }
+
+  // Reports each language that the message bundle has and the set-up tool lacks. A tool without any
+  // language has the same name for all users, so nothing is missing.
+  void checkToolLanguages() {
+    const auto tool = lists_.resources ? lists_.resources->string(medium::kWLANtool) : std::nullopt;
+    const auto bundle = tool ? Bundle::open(files_.fullPath(*tool)) : std::nullopt;
+    if (!bundle) return;
+    const std::string resources = *tool + "/Contents/Resources";
+    const std::vector<std::string> own = languagesIn(files_, resources);
+    if (own.empty()) return;
+    std::vector<std::string> served = own;
+    served.push_back(bundle->infoString("CFBundleDevelopmentRegion").value_or("en"));
+    for (const std::string& language : languagesBeyond(served)) {
+      reportMissingLanguage("language-not-in-tool", resources, language, own,
+                            "see the set-up tool's name in another language",
+                            "add the folder, with the tool's name in its InfoPlist.strings");
+    }
+  }
+
+  // Returns the languages of the message bundle that `served` lacks.
+  [[nodiscard]] std::vector<std::string> languagesBeyond(
+      const std::vector<std::string>& served) const {
+    std::vector<std::string> languages;
     for (const std::string& language : languages_) {
       const bool unknown = Language::parse(language).code.empty();
-      if (unknown || serves(own, language)) continue;
-      report_.findings.push_back(
-          {.id = "language-not-in-application",
-           .severity = Severity::kWarning,
-           .place = {.file = resources},
-           .found = "no " + quoted(language + std::string(kLanguageFolder)),
-           .expected = "the languages of the message bundle; the application has " +
-                       (own.empty() ? "none" : joined(own)),
-           .effect = "users of " + quoted(language) +
-                     " read and hear some of the application's texts in English: why the wizard "
-                     "uses the network, and the name of the gear button",
-           .remedy = "have the application built with texts in that language"});
+      if (!unknown && !serves(served, language)) languages.push_back(language);
     }
+    return languages;
+  }
+
+  void reportMissingLanguage(const char* id, const std::string& resources,
+                             const std::string& language, const std::vector<std::string>& own,
+                             const std::string& effect, const char* remedy) {
+    report_.findings.push_back({.id = id,
+                                .severity = Severity::kWarning,
+                                .place = {.file = resources},
+                                .found = "no " + quoted(language + std::string(kLanguageFolder)),
+                                .expected = "the languages of the message bundle; here are " +
+                                            (own.empty() ? "none" : joined(own)),
+                                .effect = "users of " + quoted(language) + " " + effect,
+                                .remedy = remedy});
   }
 
   const MediumFiles& files_;

@@ -93,6 +93,7 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
   const auto relative = resources.string(medium::kWLANtool);
   if (!relative) {
     if (!lists.resources || resources.find(medium::kWLANtool) || !lists.anyWireless()) return;
+    if (files.report().hasMisspelt(lists.resourcesPath, medium::kWLANtool)) return;
     files.report().findings.push_back({.id = "tool-none",
                                        .severity = Severity::kWarning,
                                        .place = {.file = lists.resourcesPath},
@@ -132,6 +133,20 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
        .effect =
            "the tool's file name in the device list's menu, unless a translation gives a name",
        .remedy = "write the name"});
+}
+
+void describeApplication(const MediumFiles& files, const Lists& lists) {
+  if (!lists.information) return;
+  Report& report = files.report();
+  report.identifier = lists.information->string("CFBundleIdentifier").value_or("");
+  const auto program = lists.information->string("CFBundleExecutable");
+  if (!program) return;
+  const fs::path contents = fs::path(files.application()) / "Contents";
+  std::error_code ignored;
+  if (fs::is_regular_file(contents / "MacOS" / *program, ignored))
+    report.platforms.emplace_back("macOS");
+  if (fs::is_regular_file(contents / "Linux" / *program, ignored))
+    report.platforms.emplace_back("Linux");
 }
 
 void checkApplication(const MediumFiles& files, const Lists& lists) {
