@@ -123,6 +123,8 @@ class Everybody(unittest.TestCase):
         self.assertEqual({one["address"] for one in devices["listed"]["answer"]["exchanges"]},
                          set(devices["listed"]["record"]["IP address list"]))
         self.assertIn("lo IPv4", devices["listed"]["sightings"])
+        self.assertEqual({name: [note["id"] for note in device["notes"]] for name, device in devices.items()
+                          if device["notes"]}, {"two models": ["model-without-search"]})
         self.assertGreater(devices["no-answer"]["delay"]["seconds"], 11)
         self.assertGreater(devices["late"]["answer"]["exchanges"][0]["seconds"], 2.4)
 
@@ -186,6 +188,7 @@ class Everybody(unittest.TestCase):
 class Nobody(unittest.TestCase):
     def problems(self):
         result = run(*browse("-s", "1"))
+        self.assertEqual(result.returncode, 1)
         return [problem["id"] for problem in json.loads(result.stdout)["network"]]
 
     def test_says_what_is_wrong_with_the_network(self):

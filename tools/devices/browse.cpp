@@ -151,15 +151,16 @@ int Session::run() {
   questions_.stop();
 
   const BrowseResult all = result();
+  const int status = all.network.empty() || !all.devices.empty() ? 0 : kNothingFound;
   if (options_.json) {
     progress_.print(jsonOf(all));
-    return 0;
+    return status;
   }
   // Shows the verdict on each device that has no row yet, and on each that is gone.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));
-  return 0;
+  return status;
 }
 
 }  // namespace

@@ -67,7 +67,8 @@ std::string sentence(const std::string& text) {
 
 std::string explanation(const Verdict& verdict) {
   return sentence(verdict.why) +
-         (verdict.remedy.empty() ? "" : " Remedy: " + sentence(verdict.remedy));
+         (verdict.remedy.empty() ? "" : " Remedy: " + sentence(verdict.remedy)) + " [" +
+         verdict.id + "]";
 }
 
 std::string delayText(const Delay& delay) {

@@ -11,6 +11,9 @@ namespace onramp::devices {
 /// no usable answer, or the output cannot be written.
 inline constexpr int kTrouble = 2;
 
+/// The exit status of `browse` when it found no device and knows a reason.
+inline constexpr int kNothingFound = 1;
+
 struct BrowseOptions {
   std::string medium;
   std::vector<std::string> models;

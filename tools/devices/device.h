@@ -30,10 +30,11 @@ struct Device {
 
 /// The parts of a medium on which the wizard's search depends.
 struct Medium {
-  std::string path;                 ///< as the user gave it
-  std::string type;                 ///< the one service type that the wizard looks for
-  std::vector<std::string> models;  ///< all models of the medium
-  std::vector<std::string> wanted;  ///< the models that the wizard searches for
+  std::string path;                          ///< as the user gave it
+  std::string type;                          ///< the one service type that the wizard looks for
+  std::vector<std::string> models;           ///< all models of the medium
+  std::vector<std::string> wanted;           ///< the models that the wizard searches for
+  std::vector<std::string> withoutSearch{};  ///< the models whose users never come to a search
 };
 
 }  // namespace onramp::devices

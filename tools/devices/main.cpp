@@ -16,7 +16,7 @@ using namespace onramp::devices;
 
 // The examples of each command. The program's help shows the examples of all commands.
 const std::string kBrowseExamples = R"(
-  onramp-devices browse --medium build/medium
+  onramp-devices browse --medium /media/setup
       shows which devices the wizard lists, and why it leaves out the others
   onramp-devices browse --medium /media/setup --model "Kestrel Model 100" -v
       explains the list of a user who chose that model, and shows all that is known)";

@@ -6,6 +6,8 @@
 #include <system_error>
 
 #include "media/KSOROSXCD.h"
+#include "media/KSOROSXModel.h"
+#include "media/connection_type.h"
 #include "platform/freedesktop/main_bundle.h"
 #include "tools/check/application.h"
 #include "tools/devices/text.h"
@@ -19,6 +21,20 @@ namespace fs = std::filesystem;
 std::nullopt_t fail(const std::string& path, const std::string& problem) {
   std::cerr << "onramp-devices: " << inQuotes(path) << ' ' << problem << '\n';
   return std::nullopt;
+}
+
+// Returns the models whose users never come to a search. A user who chooses a model without
+// wireless gets the package at once. Only on a medium that begins with the connection page does
+// nobody choose a model, and each search is for all models.
+std::vector<std::string> modelsWithoutSearch(const std::vector<std::string>& models) {
+  const auto information = KSOROSXModel::modelInfo();
+  if (firstPage(models, information) == FirstPage::kConnectionType) return {};
+  std::vector<std::string> found;
+  for (const std::string& model : models) {
+    const Dictionary record = KSOROSXModel::initWithName(model, information);
+    if (!record.boolean(KSOROSXModel::kSupportWiFi).value_or(false)) found.push_back(model);
+  }
+  return found;
 }
 
 }  // namespace
@@ -52,6 +68,7 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
     }
   }
   if (medium.wanted.empty()) medium.wanted = medium.models;
+  medium.withoutSearch = modelsWithoutSearch(medium.models);
   return medium;
 }
 

@@ -84,8 +84,14 @@ std::string edgeBlanks(const std::string& announced) {
                                                    : "differs only in spaces from";
 }
 
-std::string nearestOf(const std::string& announced, const Medium& medium) {
-  const auto nearest = check::Spelling(medium.models).nearest(announced);
+// Returns the medium's model that `announced` most resembles in spelling. If none does, returns one
+// that differs only in its maker. The device announces `model` without the maker.
+std::string nearestOf(const std::string& announced, const std::string& model,
+                      const Medium& medium) {
+  auto nearest = check::Spelling(medium.models).nearest(announced);
+  for (const std::string& known : medium.models) {
+    if (!nearest && asciiLowercased(known).ends_with(' ' + asciiLowercased(model))) nearest = known;
+  }
   return nearest ? "; the nearest model is " + inQuotes(*nearest) : "";
 }
 
@@ -133,10 +139,10 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
       return differs("maker-twice", "repeats the maker, unlike", announced, known);
     }
   }
-  return Verdict{
-      .id = "not-on-medium",
-      .why = inQuotes(announced) + " is not a model of this medium" + nearestOf(announced, medium),
-      .remedy = "use a medium for this model, or add the model to this medium"};
+  return Verdict{.id = "not-on-medium",
+                 .why = inQuotes(announced) + " is not a model of this medium" +
+                        nearestOf(announced, model, medium),
+                 .remedy = "use a medium for this model, or add the model to this medium"};
 }
 
 }  // namespace onramp::devices

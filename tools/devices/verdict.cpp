@@ -149,8 +149,15 @@ Verdict judge(const Device& device, const Medium& medium,
   return judgeAnswer(device, *device.answer, isLocal);
 }
 
-std::vector<Verdict> notesOn(const Device& device, const Medium&) {
+std::vector<Verdict> notesOn(const Device& device, const Medium& medium) {
   std::vector<Verdict> notes;
+  if (isOneOf(medium.withoutSearch, device.record)) {
+    notes.push_back({.id = "model-without-search",
+                     .why = "on the medium, its model has no wireless, so no user who chooses the "
+                            "model comes to a search",
+                     .remedy = "set WirelessLAN to true in ModelInfo.plist if the model has "
+                               "wireless"});
+  }
   if (!device.answer) return notes;
   const auto& exchanges = device.answer->exchanges;
   if (std::any_of(exchanges.begin(), exchanges.end(),
