@@ -57,19 +57,18 @@ void readCommandLine(const QStringList& arguments) {
     std::exit(kUsageError);
   }
   if (parser.isSet(help)) parser.showHelp();
+  static const QRegularExpression form(QStringLiteral("^\\d+(\\.\\d+){0,2}$"));
+  if (parser.isSet(version) && !form.match(parser.value(version)).hasMatch()) {
+    std::fprintf(stderr, "--system-version: \"%s\" is not a version; give numbers, as in 10.15.7\n",
+                 qPrintable(parser.value(version)));
+    std::exit(kUsageError);
+  }
   if (parser.isSet(ownVersion)) {
     std::printf("%s %s\n%s\n", qPrintable(QCoreApplication::applicationName()),
                 qPrintable(QCoreApplication::applicationVersion()), maker::kSettings);
     std::exit(0);
   }
-  if (!parser.isSet(version)) return;
-  static const QRegularExpression form(QStringLiteral("^\\d+(\\.\\d+){0,2}$"));
-  if (!form.match(parser.value(version)).hasMatch()) {
-    std::fprintf(stderr, "--system-version: \"%s\" is not a version; give numbers, as in 10.15.7\n",
-                 qPrintable(parser.value(version)));
-    std::exit(kUsageError);
-  }
-  setSystemVersion(parser.value(version).toStdString());
+  if (parser.isSet(version)) setSystemVersion(parser.value(version).toStdString());
 }
 
 bool asksForInformation(int argc, char** argv) {

@@ -26,10 +26,12 @@ status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespac
 packet leaves this machine, and no hardware is needed. The network ends when COMMAND or this tool
 ends or is killed.
 
-This command runs the wizard with twenty devices:
-    tools/practice-network examples/practice-network.toml "build/medium/Onramp OSX.app/Contents/Linux/Onramp OSX"
+This command runs the wizard of MEDIUM, a medium's folder, with the twenty devices of the example
+practice-network.toml. The example is in examples/ of the source tree and in lib/onramp/examples/ of
+an installation:
+    practice-network practice-network.toml "MEDIUM/Onramp OSX.app/Contents/Linux/Onramp OSX"
 This command starts a shell on the network. The commands after it show the devices there:
-    tools/practice-network examples/practice-network.toml
+    practice-network practice-network.toml
     avahi-browse -rpt _pdl-datastream._tcp
     snmpget -v1 -c corridor 127.0.1.1 1.3.6.1.4.1.4242.2.4.4.1240.1.2.0
 
