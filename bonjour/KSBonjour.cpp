@@ -132,7 +132,8 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
     // Only the first removal after an addition or a resolve lowers the count. So, by design, an
-    // entry that was added three or more times survives several removals in quick succession.
+    // entry that was added three or more times survives any number of removals that come without
+    // an addition or a resolve in between.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {

@@ -10,7 +10,8 @@
 
 namespace onramp {
 
-/// Receives the devices that a search finds, each as a record made by KSDevice.
+/// Receives the devices that a search finds, each as a record made by KSDevice. Below, a service is
+/// known if the table of one of the search's browsers (KSBonjour) contains it.
 class KSDeviceObserver {
  public:
   KSDeviceObserver() = default;
@@ -18,13 +19,13 @@ class KSDeviceObserver {
   KSDeviceObserver& operator=(const KSDeviceObserver&) = delete;
   virtual ~KSDeviceObserver() = default;
 
-  /// Called when a device is resolved and no browser's table contains it.
+  /// Called when a device's service is resolved but is not known.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is resolved or reported gone and a browser's table contains it. Even a
-  /// new device is usually reported here, because a browser stores a resolved service before it
-  /// reports the service. So an observer must add any device that it does not know.
+  /// Called when a device's known service is resolved or reported gone. Even a new device is
+  /// usually reported here, because a browser stores a resolved service before it reports the
+  /// service. So an observer must add any device that is new to it.
   virtual void updateKSDevice(const Dictionary& device) = 0;
-  /// Called when a device is reported gone and no browser's table contains it.
+  /// Called when a device's service is reported gone and is no longer known.
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
@@ -60,7 +61,7 @@ class KSBonjourSearch final : public KSBonjourObserver,
   void stopBrowsing();
 
   /// Returns the types, as strings, of all browsers whose tables contain a service with this name
-  /// and domain. Returns an empty array when an argument is nothing.
+  /// and domain. Returns an empty array if either argument is nothing.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

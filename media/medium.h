@@ -23,9 +23,9 @@ inline constexpr std::string_view kVenderName = "VenderName";
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
 /// at `bundlePath`. If `relativePath` is nothing, returns that folder. `bundlePath` must not end in
-/// "/". If `bundlePath` contains no "/", the result is `relativePath`, or an empty text if that is
-/// nothing. Removes slashes from the result's end, as withoutClosingSlash() does. Does not access
-/// the disk.
+/// "/". If `bundlePath` contains no "/", the result is `relativePath`, or an empty string if
+/// `relativePath` is nothing. Removes slashes from the result's end, as withoutClosingSlash() does.
+/// Does not access the disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 
@@ -38,13 +38,12 @@ inline constexpr std::string_view kVenderName = "VenderName";
 [[nodiscard]] std::optional<Dictionary> loadResourceDictionary();
 
 /// Reads the dictionary in another property list of the medium. The string under `key` in
-/// `resources` is the relative path of that list. Returns nothing when there is no such string or
-/// no such dictionary.
+/// `resources` is the relative path of that list. Returns nothing when `resources` has no string
+/// under `key` or the list has no dictionary.
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 
-/// Returns the vendor name in `resources` without its spaces, or an empty text when `resources` has
-/// no vendor name.
+/// Returns the vendor name in `resources` without its spaces, or an empty string if there is none.
 [[nodiscard]] std::string vendorName(const std::optional<Dictionary>& resources);
 
 }  // namespace onramp::medium

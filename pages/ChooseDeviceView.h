@@ -22,8 +22,9 @@ namespace onramp {
 /// Asks the controller to launch the wireless set-up tool. Carries no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Asks the controller to wait for the device search. The user info holds an int under kWaitTime:
-/// the length of each pause of the wait, in seconds (see app/search_wait.h).
+/// Asks the controller to wait until a device is listed, for a limited time. The user info holds an
+/// int under kWaitTime: how many seconds the controller sleeps before each look at the list (see
+/// app/search_wait.h).
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 
@@ -42,7 +43,8 @@ class ChooseDeviceView final : public Page,
   static constexpr std::string_view kLocation = "location";  ///< string, the first address, if any
   static constexpr std::string_view kKSDevice = "ksdevice";  ///< dictionary, the device record
 
-  /// The length of a pause in the wait that refreshBrowsing() requests.
+  /// How long the controller sleeps before each look at the list, when refreshBrowsing() asks it to
+  /// wait.
   static constexpr std::chrono::seconds kRefreshPause{3};
 
   explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
@@ -72,7 +74,7 @@ class ChooseDeviceView final : public Page,
   /// The selected list entry; nothing when no entry is selected.
   [[nodiscard]] std::optional<Dictionary> choosedDevice() const;
 
-  /// Enables or disables the pop-up button with the page's commands.
+  /// Enables or disables the pop-up button whose menu holds the page's commands.
   void deviceListPopupButtonEnable(bool enable);
 
   /// Shows or hides the spinner and the text beside it, which asks the user to wait.

@@ -10,8 +10,8 @@
 namespace onramp {
 
 /// The owner of an interface file, which describes windows and views. The file binds titles to
-/// texts of its owner, and names the action that the owner performs on each click. The owner must
-/// outlive all objects that are created from the file.
+/// texts of its owner, and names the action that the owner performs when the user clicks a button.
+/// The owner must outlive all objects that are created from the file.
 class InterfaceOwner {
  public:
   InterfaceOwner() = default;
@@ -46,7 +46,7 @@ class Interface {
   [[nodiscard]] View view() const;
 
   /// Returns the class name of the view that view() returns, such as "ModelListView". Returns an
-  /// empty text when there is no view or the file gives it no class.
+  /// empty string when there is no view or the file gives the view no class.
   [[nodiscard]] std::string viewClass() const;
 
   /// Returns a handle to the object that the file calls `name`. Returns an empty handle when there

@@ -2,8 +2,8 @@
 """Measures how long onramp-check takes for media with 10 to 10,000 models.
 
 A medium lists its models in ModelInfo.plist and in CDInfo.plist. On half of the media, both files
-have the same names. On the others, CDInfo.plist misspells every name. Each time is compared with
-the time for 1,000 models, scaled to the same number of models.
+list the same model names. On the others, CDInfo.plist misspells every name. Each measurement is
+compared with the time for 1,000 models, scaled in proportion to the number of models.
 """
 
 import pathlib

@@ -48,8 +48,8 @@ class Chooser(Person):
         self._key = None
 
     def go_there(self):
-        """Chooses wireless on the first page, which must be the connection page. Returns when the
-        first search has ended."""
+        """Clicks Next on the first page, which must be the connection page with wireless selected.
+        Returns when the first search has ended."""
         self.see("radio button", self._text["INST_TXT_WIFI"])
         self.click("push button", self._text["BTN_NEXT"])
         self.see("label", self._text["INST_TXT_DEVLIST"], WAIT_SECONDS)

@@ -25,8 +25,8 @@ class Silence:
 
 
 class Ear:
-    """A context manager that sends requests to the program of a Person from a separate process.
-    The program's window must already be visible."""
+    """A context manager that records the silences of the program that `person` uses. A separate
+    process sends the requests. The program's window must already be visible."""
 
     def __init__(self, person):
         context = multiprocessing.get_context("spawn")
@@ -87,7 +87,7 @@ def _application(atspi, process):
 
 
 def _schedule(files):
-    """Reads schedstat files. Returns how many seconds the thread of the first file computed, and
-    how many seconds all threads waited for a processor."""
+    """Reads schedstat files. Returns the computing time, in seconds, of the thread that the first
+    file describes, and the total time that the threads of all files waited for a processor."""
     times = [[int(field) / 1e9 for field in file.read_text().split()[:2]] for file in files]
     return times[0][0], sum(waited for _, waited in times)

@@ -26,8 +26,8 @@ void Query::ask() {
     isRefused_ = true;  // for example because a text is not UTF-8
     return;
   }
-  // The answer may arrive after this query has been destroyed or sent again. Nobody then uses the
-  // object that the answer names, so the object is freed.
+  // The answer may arrive after this query has been destroyed or sent again. Nothing uses the
+  // object that such a late answer names, so the object is freed.
   asked_ = std::make_shared<char>();
   const auto answer = [this, &daemon = daemon_, interface = interface(),
                        asked = std::weak_ptr(asked_)](sd_bus_message* reply) {

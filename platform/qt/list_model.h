@@ -15,7 +15,7 @@ class ListModel final : public QAbstractTableModel {
   Q_OBJECT
 
  public:
-  /// Assistive programs read out the texts in `spokenColumns` as the name of a row.
+  /// Screen readers announce each row by its texts in the columns `spokenColumns`.
   ListModel(QStringList columns, QStringList spokenColumns, QObject* parent);
 
   /// Returns the height of a row, including some space around its text.
@@ -37,7 +37,7 @@ class ListModel final : public QAbstractTableModel {
                                     int role) const override;
 
  private:
-  /// Returns an empty text if the controller has no such entry or the entry has no such text.
+  /// Returns the string under `column` in the entry of `row`, or an empty string if there is none.
   [[nodiscard]] QString text(int row, const QString& column) const;
 
   [[nodiscard]] QString spokenName(int row) const;

@@ -229,7 +229,7 @@ TEST_F(StartUp, ChecksTheSystemVersionFirst) {
   }
 }
 
-TEST_F(StartUp, FillsTheMinimumVersionIntoOneOrTwoPlaceholders) {
+TEST_F(StartUp, ReplacesOneOrTwoPlaceholdersWithTheMinimumVersion) {
   describeTwoModels(Dictionary{{"SystemMin", version(10, 11, 0)}});
   const std::pair<std::string, std::string> texts[] = {{"%@ to %@.", "10.11 to 10.11."},
                                                        {"%@", "10.11"},

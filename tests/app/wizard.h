@@ -59,7 +59,8 @@ class Wizard : public testing::Test {
     screen.launch(*delegate);
   }
 
-  /// Returns the class of the visible page, or an empty text unless exactly one page is visible.
+  /// Returns the class of the visible page if exactly one page is visible, otherwise an empty
+  /// string.
   [[nodiscard]] std::string page() const {
     const auto& shown = screen.object("mainView").subviews;
     return shown.size() == 1 ? shown.front()->name : "";

@@ -115,7 +115,7 @@ class FromOutside(unittest.TestCase):
         path.write_text(text)
         return str(path)
 
-    def test_the_command_runs_among_the_described_devices(self):
+    def test_the_command_runs_on_a_network_with_the_described_devices(self):
         result = run(TOOL, self.describe(DEVICES), sys.executable, "-B", __file__, "FromInside")
         self.assertEqual(result.returncode, 0, result.stderr)
 
@@ -126,7 +126,7 @@ class FromOutside(unittest.TestCase):
             with self.subTest(command):
                 self.assertEqual(run(TOOL, description, *command).returncode, status)
 
-    def test_no_process_is_left_when_the_tool_is_ended(self):
+    def test_no_process_is_left_after_the_tool_is_killed(self):
         for number, status in ((signal.SIGKILL, -9), (signal.SIGTERM, 143)):
             with self.subTest(number):
                 tool = subprocess.Popen(
@@ -168,7 +168,7 @@ class FromOutside(unittest.TestCase):
         self.assertEqual(result.returncode, 2)
         self.assertRegex(result.stderr, "^practice-network: /nowhere: cannot be read.*ONRAMP_MAKER")
 
-    @unittest.skipIf(os.getuid(), "the test hides sudo, so only root gets far enough")
+    @unittest.skipIf(os.getuid(), "needs root, because the test hides sudo")
     def test_a_missing_program_is_reported_with_its_package(self):
         for program in ("unshare", "setpriv", "mount", "ip"):
             (self.folder / program).symlink_to("/bin/true")

@@ -11,8 +11,8 @@
 
 namespace onramp::check {
 
-/// A model, and its connections as the medium gives them. The wizard may offer a cable that the
-/// model lacks.
+/// A model, and its connections as the medium gives them. The wizard may offer USB for a model
+/// without USB, because the connection page always offers USB.
 struct ModelRow {
   std::string name{};
   bool usb = false;
@@ -37,7 +37,7 @@ struct Report {
   std::string medium{};
   std::string application{};             ///< the name of its bundle; empty when there is none
   std::string identifier{};              ///< of the application's bundle
-  std::vector<std::string> platforms{};  ///< "macOS", "Linux": those with a program for them
+  std::vector<std::string> platforms{};  ///< the systems it has a program for: "macOS", "Linux"
   std::vector<Finding> findings{};       ///< in the order in which the checks made them
   std::vector<ModelRow> models{};        ///< in the order of the wizard's list
   FirstPage start = FirstPage::kNone;    ///< the page that the wizard begins with

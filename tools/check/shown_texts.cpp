@@ -80,7 +80,7 @@ constexpr std::array kTexts{
     ShownText{.key = "INST_TXT_REFRESH", .where = "device list's menu"},
     ShownText{.key = "INST_TXT_USB", .where = "name of a connection", .width = 450},
     ShownText{.key = "INST_TXT_WIFI", .where = "name of a connection", .width = 450},
-    ShownText{.key = "INST_WAIT", .where = "beside the spinner of a search", .width = 588},
+    ShownText{.key = "INST_WAIT", .where = "beside the spinner during a search", .width = 588},
 };
 
 struct Range {

@@ -11,9 +11,9 @@ namespace onramp::check {
 
 /// Finds the known word that was probably meant by a misspelt word. If the two differ only in
 /// capital letters, spaces and punctuation, a hash table finds the known word. Otherwise the
-/// misspelt word is compared with every known word. One object makes a limited number of
-/// comparisons, because comparing two long lists would take too long. After that, nearest() uses
-/// only the hash table.
+/// misspelt word is compared with every known word. Each object limits the total work of these
+/// comparisons, because comparing many misspelt words with many known words would take too long.
+/// Above that limit, nearest() uses only the hash table.
 class Spelling {
  public:
   explicit Spelling(const std::vector<std::string>& known);
@@ -29,8 +29,8 @@ class Spelling {
   std::size_t work_ = 0;
 };
 
-/// Returns the least number of changes that turn `a` into `b`, if no byte is changed twice. A
-/// change inserts, removes or replaces one byte, or swaps two neighbouring bytes. ASCII letters
+/// Returns the smallest number of changes that turn `a` into `b`. A change inserts, removes or
+/// replaces one byte, or swaps two neighbouring bytes. No byte may be changed twice. ASCII letters
 /// that differ only in case are equal. Returns `most` + 1 when more than `most` changes are needed.
 [[nodiscard]] std::size_t editDistance(std::string_view a, std::string_view b, std::size_t most);
 

@@ -16,7 +16,8 @@ namespace {
 constexpr std::string_view kRed = "\033[31m";
 constexpr std::string_view kYellow = "\033[33m";
 constexpr std::string_view kPlain = "\033[0m";
-constexpr std::size_t kConnectionColumns = 24;  // all columns of a model's line except its name
+// The width of a model's line without the name, in columns of the terminal.
+constexpr std::size_t kConnectionColumns = 24;
 
 // Returns `text` with replacement characters for its control characters and damaged bytes, so that
 // the text stays on one line and cannot control the terminal.

@@ -6,12 +6,12 @@ import ipaddress
 import re
 import tomllib
 
-# The values of `activeif` that are not integers. Each is a way in which an address treats an SNMP
-# request.
+# The values of `activeif` that are not integers. Each says how the host at an address responds to
+# an SNMP request.
 SILENT = "silent"    # receives the request and never answers
 CLOSED = "closed"    # has no agent, so the host refuses the packet
 MISSING = "missing"  # has an agent that lacks the object
-TEXT = "text"        # answers with a text instead of an integer
+TEXT = "text"        # answers with a string instead of an integer
 WORDS = (SILENT, CLOSED, MISSING, TEXT)
 
 DEFAULT_TYPE = "_pdl-datastream._tcp"

@@ -1,4 +1,4 @@
-"""Runs the network in namespaces that end with the tool."""
+"""Runs the network in namespaces that disappear when practice-network ends."""
 
 import json
 import os

@@ -48,7 +48,8 @@ class Network:
                     self._publish(device)
 
     def unplug(self, interface):
-        """Takes an interface down for the devices and for the command. plug() brings it back."""
+        """Takes an interface down, both for the devices and for the command that practice-network
+        runs. plug() brings it back."""
         self._plug(interface, False)
 
     def plug(self, interface):
@@ -131,7 +132,7 @@ class Network:
                 self._publish(after)
 
     def list(self):
-        """Returns a list with a dictionary for each device, which has the device's entries and its
+        """Returns a list of dictionaries, one for each device. Each has the device's entries and its
         "state", such as "established"."""
         return [{key: value for key, value in dataclasses.asdict(device).items()
                  if value is not None}

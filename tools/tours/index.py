@@ -25,7 +25,7 @@ pre { overflow: auto; background: var(--soft); padding: .7em; border-radius: 8px
 def write(folder, medium, findings, albums):
     """Writes index.html in `folder`: the `findings` of onramp-check, then a part for each language.
 
-    `albums` has the `content` of each Album.
+    `albums` is a list of dictionaries: the `content` of each Album (see album.py).
     """
     title = _text(f"The wizard of {medium}")
     lines = ['<!DOCTYPE html>', '<html lang="en">', '<meta charset="utf-8">',

@@ -1,4 +1,5 @@
-"""Takes the tour in several languages side by side, each on a practice network of its own."""
+"""Takes the tours of several languages in parallel, each on a separate practice network if networks
+can be created."""
 
 import concurrent.futures
 import json
@@ -27,8 +28,10 @@ def run(arguments, on_network=True, **options):
 
 
 def take_tours(medium, original, pictures, languages, options):
-    """Takes the tours and writes the index. First removes all pictures from the folder
-    `pictures`, but refuses a folder with pictures that has no index. Returns the exit status.
+    """Takes the tours and writes the index. Returns the exit status.
+
+    First removes all pictures from the folder `pictures`. Raises Unsuitable if that folder has
+    pictures but no index.html.
 
     `original` is the folder that onramp-check reads: `medium`, or the folder to which the links in
     `medium` lead.
@@ -68,7 +71,7 @@ def take_tours(medium, original, pictures, languages, options):
 
 
 def _chosen(languages, medium):
-    """Returns the languages to walk in; None stands for the user's own."""
+    """Returns the languages in which to take the tour. None stands for the user's own language."""
     offered = messages.languages(medium)
     wanted = offered if languages == "all" else filter(None, languages.split(","))
     wanted = list(wanted) or [None]
@@ -80,8 +83,8 @@ def _chosen(languages, medium):
 
 
 def _take_one(order):
-    """Runs one tour. Prints the tour's output after its end, so that the output of tours does not
-    mix."""
+    """Runs one tour. Prints the tour's output only when the tour has ended, so that the outputs of
+    parallel tours are not interleaved."""
     done = run([INSIDE, json.dumps(order)], order["has_network"],
                stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True)
     print(f"\n{done.stdout}", end="", flush=True)

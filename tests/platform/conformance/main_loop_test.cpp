@@ -32,7 +32,7 @@ class MainLoop : public testing::Test {
   const std::thread::id mainThread = std::this_thread::get_id();
 };
 
-TEST_F(MainLoop, PerformsActionsOfAnyThreadInOrderWhileAModalLoopRuns) {
+TEST_F(MainLoop, PerformsActionsFromAnyThreadInOrderWhileAModalLoopRuns) {
   std::thread poster([&] {
     performOnMainThread(noting("first"));
     performOnMainThread(noting("second"));
@@ -108,7 +108,7 @@ TEST_F(Alert, SheetReturnsAtOnceAndReportsTheButton) {
 
 constexpr int kEndedAsPromised = 7;
 
-TEST(Termination, EndsModalLoopsAndSleepsAndRunsNothingMore) {
+TEST(Termination, EndsModalLoopsAndInterruptsSleepsAndThenRunsNothing) {
   GTEST_FLAG_SET(death_test_style, "threadsafe");
   const auto terminateInAModalLoop = [] {
     static bool hasRun = false;
