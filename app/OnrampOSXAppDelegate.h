@@ -81,9 +81,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// be read or contains no view.
   [[nodiscard]] std::shared_ptr<Page> loadView(const std::string& name);
 
-  /// Replaces the current page with `page`. If `page` is null, loads a new page from the interface
-  /// file `name` and shows that page instead. If this page cannot be loaded, the window shows no
-  /// page.
+  /// Replaces the current page with `page` or, if `page` is null, with a new page from the
+  /// interface file `name`. If the new page cannot be loaded, the window shows no page.
   void replaceMainView(const std::string& name, std::shared_ptr<Page> page);
 
   /// Shows a new model-list page.
@@ -156,8 +155,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // hand_off.cpp: the files that pass the user's choices to the installer package.
 
-  /// Returns the medium's vendor name without its spaces, or an empty text when the medium names no
-  /// vendor.
+  /// Returns the medium's vendor name without its spaces, or an empty string when the medium names
+  /// no vendor.
   [[nodiscard]] static std::string setVenderName();
 
   /// Returns the path of the package-options file, which passes the medium's options to the
@@ -196,8 +195,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Call launchWLANToolAutomatically() after a search that found no device, and
   /// launchWLANToolManually() when the user asks for the wireless set-up tool. Both hide the wizard
-  /// and return. Half a second later, the tool runs. The wizard then acts on the tool's exit
-  /// status:
+  /// and return. The tool runs half a second later. When the tool has ended, the wizard acts on its
+  /// exit status:
   /// - 1: It reappears. If the tool was started automatically, it shows the connection page with
   ///   the wireless choice selected.
   /// - 2: It terminates.
@@ -216,10 +215,10 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop for up to kMostPauses pauses of length `pause`. Ends the wait after a
-  /// pause if the chooser lists a device by then. Ends the search after the wait. During the wait,
-  /// the user can neither click a button nor close the window, and `page` shows its spinner. `page`
-  /// may be null.
+  /// Waits in a modal loop for up to kMostPauses pauses of length `pause`. Skips the remaining
+  /// pauses as soon as a pause ends with a device on the chooser's list. Ends the search after the
+  /// wait. During the wait, the user can neither click a button nor close the window, and `page`
+  /// shows its spinner. `page` may be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
   /// Sleeps for `pause` up to kMostPauses times, until the chooser lists a device or the
@@ -231,7 +230,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void showProgressAtChooseDeviceView(std::chrono::seconds pause);
 
   /// Calls showProgressAtChooseDeviceView() with the number of seconds under kWaitTime in the
-  /// notification's user info, or with 0 when there is no such number.
+  /// notification's user info, or with 0 if there is no number under that key.
   void showProgressAtChooseDeviceViewByRefresh(const Notification& notification);
 
   /// Tells the user in a sheet that no device was found, and returns at once.

@@ -20,7 +20,7 @@ namespace fs = std::filesystem;
 constexpr const char* kModel = "Model";
 constexpr const char* kInterface = "Interface";
 
-// Returns a name such as "com.vendor.kind.plist".
+// Returns a file name such as "com.vendor.kind.plist".
 std::string fileName(const std::string& vendor, const std::string& kind) {
   return "com." + lowercaseString(vendor) + "." + kind + ".plist";
 }
@@ -56,7 +56,7 @@ bool fontSetOption(const Dictionary& options) {
   return language == "ja" || language == "ko" || language == "zh";
 }
 
-// In medium and device records, an empty text means that the value is unknown.
+// In medium and device records, an empty string means that the value is unknown.
 std::optional<std::string> knownText(const Dictionary& record, std::string_view key) {
   std::optional<std::string> text = record.string(key);
   return text && !text->empty() ? text : std::nullopt;

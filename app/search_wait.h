@@ -4,10 +4,10 @@
 
 namespace onramp {
 
-// How long the wizard waits for the device search. A wait is a series of pauses. It ends after a
-// pause if a device is listed by then.
+// How long the wizard waits for the device search. A wait is a series of pauses. It ends with the
+// first pause after which a device is listed.
 
-/// The number of pauses after which the wait ends even if no device is listed.
+/// The maximum number of pauses in a wait.
 inline constexpr int kMostPauses = 5;
 
 /// The length of each pause after the user clicks Next on the connection page.

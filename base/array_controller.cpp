@@ -8,7 +8,7 @@ namespace onramp {
 
 namespace {
 
-// Returns a view, so that sorting thousands of entries copies no text.
+// Returns a view, so that sorting thousands of entries copies no strings.
 std::string_view sortText(const Dictionary& entry, const std::string& key) {
   const Value* const value = entry.find(key);
   const auto* const text = value ? value->as<std::string>() : nullptr;

@@ -16,8 +16,8 @@ namespace onramp {
 /// must be called on the main thread.
 class ArrayController {
  public:
-  /// Makes rearrange() sort the entries by their strings under `key`. An entry that has no string
-  /// under `key` sorts as if the string were empty. With an empty `key`, which is the default,
+  /// Makes rearrange() sort the entries by their strings under `key`. An entry without a string
+  /// under `key` is sorted as if the string were empty. With an empty `key`, which is the default,
   /// rearrange() does not change the order.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
@@ -49,8 +49,9 @@ class ArrayController {
   /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
   void setSelectedObject(const Dictionary& entry);
 
-  /// Do what setSelectionIndex() and setSelectedObject() do, and record that the user made the
-  /// selection, even if the call clears it. The bound table calls choose().
+  /// choose() selects like setSelectionIndex(), and chooseObject() like setSelectedObject(). Both
+  /// also record that the user made the selection, even if they clear it. The bound table calls
+  /// choose().
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 

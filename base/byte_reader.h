@@ -37,7 +37,7 @@ class ByteReader {
     return taken;
   }
 
-  /// Reads `count` bytes as text. The result is a view of the input.
+  /// Reads `count` bytes as a string. The result is a view of the input.
   [[nodiscard]] std::optional<std::string_view> text(std::uint64_t count) {
     const auto taken = take(count);
     if (!taken) return std::nullopt;

@@ -17,11 +17,11 @@ class KeyValueTexts {
   /// Stores `text` under `key` and passes it to every setter bound to the key.
   void setValueForKey(const std::string& text, std::string_view key);
 
-  /// Returns the text under `key`, or an empty text when none was set.
+  /// Returns the text under `key`, or an empty string if no text has been set.
   [[nodiscard]] std::string valueForKey(std::string_view key) const;
 
-  /// Calls `setter` now if `key` has a text, and later whenever a text is set for the key. A setter
-  /// stays bound as long as this object lives, and must not call bind().
+  /// Calls `setter` now if `key` has a text, and again whenever a text is set for the key. The
+  /// setter stays bound as long as this object lives, and must not call bind().
   void bind(std::string_view key, Setter setter);
 
  private:

@@ -44,9 +44,9 @@ std::optional<char32_t> takeUTF8(std::string_view& text);
 /// malformed.
 [[nodiscard]] std::optional<std::string> decodedText(std::string_view bytes);
 
-/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986). A valid text
-/// contains only characters that these parts may contain, at most one "#", and two hexadecimal
-/// digits after every "%". An empty text is valid.
+/// Whether `text` is valid as the path, query and fragment of a URL (RFC 3986): it contains only
+/// characters that these parts may contain, at most one "#", and two hexadecimal digits after every
+/// "%". An empty string is valid.
 [[nodiscard]] bool isURLText(std::string_view text);
 
 }  // namespace onramp

@@ -27,7 +27,7 @@ struct Date {
 
 using Array = std::vector<Value>;
 
-/// An immutable table of values, each under a text key. Copies share their contents, so passing a
+/// An immutable table of values, each under a string key. Copies share their contents, so passing a
 /// dictionary by value is cheap.
 class Dictionary {
  public:
@@ -44,8 +44,8 @@ class Dictionary {
   [[nodiscard]] const Value* find(std::string_view key) const;
 
   /// Return the value under `key` if it has the type in the function's name. Otherwise array()
-  /// returns null, and string() and dictionary() return nothing. A pointer from array() is valid as
-  /// long as a pointer from find().
+  /// returns null, and string() and dictionary() return nothing. A pointer from array() stays valid
+  /// for as long as one from find().
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;

@@ -86,8 +86,8 @@ class KSBonjour {
                                                  const std::string& domain);
 
   // These functions look up a service in the table. They return false or null when the service is
-  // not in the table or when an argument is nothing. didServiceResolved() also returns false when
-  // the service has not been resolved since it was last added.
+  // not in the table or an argument is nothing. didServiceResolved() also returns false when the
+  // service has not been resolved since it was last added.
   [[nodiscard]] bool isServiceContained(const std::optional<std::string>& name,
                                         const std::optional<std::string>& type,
                                         const std::optional<std::string>& domain) const;

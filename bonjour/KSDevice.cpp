@@ -9,9 +9,9 @@ namespace onramp {
 
 namespace {
 
-// Returns an empty text for a null service, but nothing for a service that lacks the text. So the
-// record's model name is one space for a null service, but empty for a service that lacks the
-// manufacturer or the model.
+// Returns an empty string for a null service, but nothing for a service without the value. So the
+// record's model name is one space for a null service, but empty for a service without a
+// manufacturer or model.
 std::optional<std::string> textOf(const NetServiceRef& service,
                                   std::optional<std::string> (*read)(const NetServiceRef&)) {
   return service ? read(service) : "";

@@ -9,7 +9,7 @@
 namespace onramp {
 
 /// Makes device records. A record is a dictionary of the facts that one of the device's network
-/// services announces. A text or list that the service lacks is empty. The model name is empty if
+/// services announces. A string or list that the service lacks is empty. The model name is empty if
 /// the service lacks the manufacturer or the model. The model name of a null service is one space.
 class KSDevice {
  public:

@@ -8,7 +8,7 @@
 
 namespace onramp {
 
-// Operations on network services. The classes in bonjour/ are built on them. A function that
+// Operations on network services, on which the classes in bonjour/ are built. A function that
 // returns an int returns 0 on success and 1 on failure. A function that reads a service returns
 // nothing or false if the service is null. All functions must be called on the main thread.
 
@@ -56,7 +56,7 @@ int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
                                  std::optional<std::vector<std::string>>* addresses,
                                  double timeout);
 
-/// Returns the resolved service's IPv4 addresses as dotted texts, in the order of
+/// Returns the resolved service's IPv4 addresses in dotted form, in the order of
 /// NetService::addressing(). Returns nothing when the service has none.
 [[nodiscard]] std::optional<std::vector<std::string>> KSNetServiceCopyIPv4Addresses(
     const NetServiceRef& service);

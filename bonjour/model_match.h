@@ -11,7 +11,7 @@ namespace onramp {
 /// model from the record `device`, joined by one space even if either is empty.
 [[nodiscard]] std::string modelTextOf(const Dictionary& device);
 
-/// Returns whether `models` contains exactly the text that modelTextOf(device) returns.
+/// Returns whether `models` contains modelTextOf(device). The comparison is exact.
 [[nodiscard]] bool isOneOf(const std::vector<std::string>& models, const Dictionary& device);
 
 }  // namespace onramp

@@ -21,8 +21,8 @@ if(ONRAMP_FUZZ)
   add_custom_target(fuzzers)
 endif()
 
-# onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room, as this project
-# calls a folder with one task. The files of the library are joined only for the linter, not in other
+# onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room, which is a
+# source folder with one task. The files of the library are joined only for the linter, not in other
 # unity builds. Otherwise, a program would need backends for files that it does not use.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
@@ -34,9 +34,9 @@ function(onramp_library name)
 endfunction()
 
 # onramp_backend(NAME SOURCES… [LINK libraries…]) adds a backend, which implements headers of
-# platform/. A backend is an object library, because it comes before the libraries that use it on the
-# linker's command line. The linker would skip the files of a static library in that place, because
-# nothing needs them yet.
+# platform/. A backend is an object library, because it comes before the libraries that use it on
+# the linker's command line. In that place, the linker would skip the files of a static library,
+# because nothing needs them yet.
 function(onramp_backend name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})

@@ -12,9 +12,9 @@ namespace CommonMessage {
 [[nodiscard]] std::string convertRelativePathToFullPath(
     const std::optional<std::string>& relativePath);
 
-/// Returns the text of `key` in the user's language, or `value` when the medium has no such text.
-/// If `table` is nothing, looks in the message bundle's default table. Every call opens the bundle
-/// again.
+/// Returns the text of `key` in the user's language, or `value` when the medium has no text for
+/// `key`. If `table` is nothing, looks in the message bundle's default table. Every call opens the
+/// bundle again.
 [[nodiscard]] std::string localizedStringForKey(const std::string& key, const std::string& value,
                                                 const std::optional<std::string>& table);
 

@@ -28,8 +28,8 @@ inline constexpr std::string_view kBonjourServiceType =
 /// Makes the record from two dictionaries. `info` is the dictionary in the file that "CDInfo"
 /// names, and `CDCommonInfo` is the medium resource dictionary, from which only the service type is
 /// taken. A value that is absent or has the wrong type gets its default: no models, true for a
-/// package, an empty text. If `info` is nothing, all values get their defaults, even the service
-/// type.
+/// package, or an empty string. If `info` is nothing, all values get their defaults, even the
+/// service type.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
@@ -40,7 +40,7 @@ inline constexpr std::string_view kBonjourServiceType =
 }  // namespace KSOROSXCD
 
 /// Returns the model names under kContainedModels of `record`, in the record's order. Returns an
-/// empty list when the record has no such array.
+/// empty list when the record has no array under that key.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

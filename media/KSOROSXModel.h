@@ -21,15 +21,16 @@ inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< b
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
 /// Returns the model information of the medium that the wizard is on: the dictionary in the file
-/// that "ModelInfo" names. Returns nothing when there is no such dictionary.
+/// that "ModelInfo" names. Returns nothing when the medium names no such file or the file has no
+/// dictionary.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 
 /// Returns the record of the model `name` according to the medium's model information.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
 /// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
-/// there supports USB only and has an empty identifier. A listed model supports USB, but no
-/// network, unless its entry says otherwise. If the entry of a listed model has no identifier
+/// there supports USB only and has an empty identifier. By default, a listed model supports USB,
+/// but no network; its entry may say otherwise. If the entry of a listed model has no identifier
 /// ("KSCID"), the record holds only the name. When `name` is nothing, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);

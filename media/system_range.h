@@ -15,8 +15,8 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-/// Returns the version with these components. A missing component, such as the third one of 10.9,
-/// counts as 0, and so does a component that does not begin with a number.
+/// Returns the version with these components. A component that is missing, such as the third one of
+/// 10.9, or that does not begin with a number counts as 0.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
 /// How a system version compares with the range that the medium supports.

@@ -6,7 +6,7 @@
 namespace onramp {
 
 /// Sorts `texts` in ascending order of their code points, ignoring the case of the letters A to Z.
-/// Texts that differ only in the case of these letters keep their order.
+/// Strings that differ only in the case of these letters keep their order.
 void sortIgnoringCase(std::vector<std::string>& texts);
 
 }  // namespace onramp

@@ -17,11 +17,11 @@ void AddNetworkInterfaceListChangeCallbackSCF();
 /// Returns the cached list, or null when there is none. The returned list never changes.
 [[nodiscard]] local_address_list local_address_cache_copy();
 
-/// Finds the first interface in the cached list whose subnet contains `address_text`, a dotted IPv4
-/// text, and returns that interface's first address. An interface's first address and first mask
-/// define its subnet. Returns nothing when no subnet contains the address, or when `address_text`
-/// is not an IPv4 address. By design, also returns nothing if the search reaches an interface
-/// without a valid address and mask.
+/// Finds the first interface in the cached list whose subnet contains `address_text`, an IPv4
+/// address in dotted form, and returns that interface's first address. An interface's first address
+/// and first mask define its subnet. Returns nothing when no subnet contains the address, or when
+/// `address_text` is not an IPv4 address. By design, also returns nothing if the search reaches an
+/// interface without a valid address and mask.
 [[nodiscard]] std::optional<std::string> local_address_for_destination(
     const std::string& address_text);
 

@@ -16,8 +16,8 @@ namespace onramp {
 namespace {
 
 // Returns the set-up tool's display name in the user's language. If the tool has no display name,
-// returns its file name without the extension. Returns an empty text when the medium cannot be
-// read.
+// returns the tool's file name without the extension. Returns an empty string when the medium
+// cannot be read.
 std::string setupToolName() {
   const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
   if (!tool) return "";
@@ -160,8 +160,8 @@ void ChooseDeviceView::setServiceToList(const Dictionary& device) {
   removeServiceFromList(device);
   deviceArrayController.addObjects({entry});
   deviceArrayController.rearrange();
-  // The first row is selected until the user chooses a row. After that, new reports of devices do
-  // not change the choice.
+  // The first row is selected until the user chooses a row. New reports of devices do not change
+  // the user's choice.
   if (isChoice) {
     deviceArrayController.chooseObject(entry);
   } else if (!deviceArrayController.hasChoice()) {

@@ -52,7 +52,7 @@ class ChooseDeviceView final : public Page,
   ChooseDeviceView& operator=(const ChooseDeviceView&) = delete;
   ~ChooseDeviceView() override;
 
-  /// Sets the models to look for, as texts of the form "manufacturer model".
+  /// Sets the models to look for, as strings of the form "manufacturer model".
   void setSearchModelList(std::vector<std::string> models);
 
   /// Ends any running search and starts a new one. The list keeps its entries.
@@ -100,7 +100,7 @@ class ChooseDeviceView final : public Page,
   void setServiceToList(const Dictionary& device);
 
   /// Removes the entry that setServiceToList() would add for `device`. Does nothing when the list
-  /// has no such entry.
+  /// has no equal entry.
   void removeServiceFromList(const Dictionary& device);
 
  private:

@@ -22,7 +22,8 @@ class ModelListView final : public Page {
   /// Returns the name of the selected model, or nothing when no model is selected.
   [[nodiscard]] std::optional<std::string> choosedModelName() const;
 
-  /// Selects the model called `name`, or clears the selection when the list has no such model.
+  /// Selects the model called `name`, or clears the selection when the list has no model of that
+  /// name.
   void setChoosedModel(const std::string& name);
 
  private:

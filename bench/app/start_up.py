@@ -34,7 +34,7 @@ def measure(build, env, program):
 
 def medium_with(folder, count):
     """Makes a medium with `count` models and returns the path of its wizard. Only the last model
-    has other connections, so the wizard must read all models to choose the first page."""
+    has different connections, so the wizard must read all models to choose the first page."""
     models = {f"Kestrel Model {i:05}": media.model(usb=True, wired=i + 1 < count, wireless=True)
               for i in range(count)}
     medium = media.make(pathlib.Path(folder) / str(count), ROOT / "build/medium", models)

@@ -68,7 +68,7 @@ class Report:
         print(json.dumps(dataclasses.asdict(case)) if self._as_json else line(case), flush=True)
 
     def remark(self, text):
-        """Prints `text`, but not with --json."""
+        """Prints `text`, unless the option --json is set."""
         if not self._as_json:
             print(text, flush=True)
 

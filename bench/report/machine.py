@@ -1,4 +1,4 @@
-"""How busy the machine is, and how much the time of the same work varies on it."""
+"""Measures how busy the machine is, and how much the time of the same work varies."""
 
 import hashlib
 import os
@@ -20,7 +20,7 @@ def describe():
 
 
 def busy_share():
-    """Watches the machine for two seconds. Returns the share of the processors that are busy in
+    """Watches the machine for two seconds. Returns the share of the processors that were busy in
     this time, from 0 to 1. Call this while no benchmark runs."""
     before = _times()
     time.sleep(_WATCH_SECONDS)

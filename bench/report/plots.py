@@ -10,7 +10,7 @@ NOISE_ROW, NOISE_NAMES, NOISE_WIDTH = 20, 470, 920
 
 def cost(cases, axis):
     """Returns an SVG with a panel for each benchmark that has at least two cases along `axis`, or
-    None if there is no such benchmark.
+    None if no benchmark has two.
 
     Points are medians, and bars reach from the lower to the upper quartile. Both axes are
     logarithmic.

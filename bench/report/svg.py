@@ -18,7 +18,7 @@ def _colours(number, ground, ink, faint):
             f".grid {{ stroke: {faint}; }} {series}")
 
 
-# Uses classes, because some SVG viewers do not support CSS variables.
+# Colours come from classes, because some SVG viewers do not support CSS variables.
 _STYLE = f"""
 text {{ font: 12px sans-serif; }} .title {{ font-weight: bold; font-size: 13px; }}
 .line {{ fill: none; stroke-width: 2; }} .bar {{ stroke-width: 1.5; }}
@@ -77,8 +77,8 @@ class LogScale:
         return self._start + part * (self._end - self._start)
 
     def ticks(self):
-        """Returns the powers of ten in the range. If the range is short, also returns the values
-        in it that are 2 or 5 times a power of ten."""
+        """Returns the powers of ten in the range. If the range is short, also returns 2 and 5 times
+        these powers, as far as they are in the range."""
         steps = (1,) if self._high - self._low > 2.2 else (1, 2, 5)
         powers = range(math.floor(self._low), math.ceil(self._high) + 1)
         values = (step * 10.0 ** power for power in powers for step in steps)

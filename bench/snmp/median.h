@@ -31,8 +31,9 @@ class Samples {
 
   [[nodiscard]] double median() const { return quantile(0.5); }
 
-  /// Returns the sample at the quantile `part`, from 0 (the least sample) to 1 (the greatest). If
-  /// the quantile is between two samples, returns the lesser. There must be at least one sample.
+  /// Returns the sample at the quantile `part`, from 0 (the smallest sample) to 1 (the largest). If
+  /// the quantile is between two samples, returns the smaller one. There must be at least one
+  /// sample.
   [[nodiscard]] double quantile(double part) const {
     std::vector<double> sorted = samples_;
     std::sort(sorted.begin(), sorted.end());

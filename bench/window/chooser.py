@@ -82,7 +82,8 @@ class Chooser(Person):
         return self._atspi.CoordType.SCREEN
 
     def table(self):
-        """Returns the table of devices. Reading its number of rows does not make Qt create cells."""
+        """Returns the table of devices. Qt creates no cells when only its number of rows is
+        read."""
         return self.see("tree").get_table_iface()
 
     def names(self):

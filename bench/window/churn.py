@@ -6,7 +6,7 @@ import time
 
 from chooser import MAKER, MODEL
 
-REST = 3          # seconds until no cache has a device that left
+REST = 3          # seconds after which no cache still has a device that left
 STEADY = 4        # wireless devices that never leave
 AT_ONCE = 24      # the most devices that are present at once, besides the steady ones
 _PAUSES = (0.2, 1.0)  # the shortest and the longest time between two changes, in seconds
@@ -40,8 +40,8 @@ class Devices(threading.Thread):
             self._failure = error
 
     def rest(self):
-        """Stops the changes until resume() is called. Returns when all devices are published and
-        no cache has a device that left."""
+        """Stops the changes until resume() is called. Returns when all present devices are
+        published and no cache still has a device that left."""
         self._allowed.acquire()
         self._network.settle(60)
         time.sleep(REST)
@@ -60,7 +60,7 @@ class Devices(threading.Thread):
         return sorted(name for name, answer in self._present.items() if answer == 2)
 
     def bounds(self, moment):
-        """Returns the least and the greatest number of devices that a search from `moment` until
+        """Returns the smallest and the largest number of devices that a search from `moment` until
         now may list. Do not call this between rest() and resume()."""
         with self._allowed:
             changed = [name for when, name, _ in self.changes if when >= moment]
@@ -91,8 +91,8 @@ class Devices(threading.Thread):
         self.changes.append((time.monotonic(), name, change))
 
     def near(self, silence):
-        """Returns a text about the devices that came or left during `silence` or in the second
-        before. Each time in the text is relative to the start of the silence."""
+        """Describes the devices that came or left during `silence` or in the second before. The
+        times in the description are relative to the start of the silence."""
         return ", ".join(f"{name} {change} at {when - silence.began:+.2f} s"
                          for when, name, change in self.changes
                          if -1 < when - silence.began < silence.seconds)

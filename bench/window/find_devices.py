@@ -6,7 +6,7 @@ tools' time is how long avahi-browse takes to resolve the same devices, plus how
 to ask each of them.
 
 The network grows up to 200 devices. The wizard ends a search after three seconds if the list has a
-device by then, so other devices can be missing. The program stops at the first network size for
+device by then, so slower devices can be missing. The program stops at the first network size for
 which a list is incomplete.
 """
 

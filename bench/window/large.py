@@ -61,7 +61,8 @@ class Trial:
             self._network.remove(name)
 
     def search(self, what):
-        """Searches a few times. Returns whether every list had only expected devices, each once.
+        """Searches a few times. Returns whether every list had only expected devices, and none of
+        them twice.
 
         A list may be incomplete: the wizard ends a search after three seconds if the list has a
         device by then.
@@ -86,7 +87,7 @@ class Trial:
 
 def _seconds_until_listed(person, table, count, began):
     """Waits until the list has been emptied and then has `count` rows, or the search has ended.
-    Returns the seconds from `began` to the last change of the list that a look showed."""
+    Returns the seconds from `began` to the last change that was seen in the list."""
     emptied = False
     last, changed = table.get_n_rows(), began
     for look in itertools.count():
@@ -95,7 +96,7 @@ def _seconds_until_listed(person, table, count, began):
         rows = table.get_n_rows()
         if rows != last or searching and not emptied:
             changed = time.monotonic()
-        # A list can be filled again before a look shows that it was empty.
+        # The list may be emptied and filled again between two looks.
         emptied = emptied or searching or rows < last or rows == 0
         last = rows
         if emptied and (rows == count or looks_at_all and not searching):

@@ -6,8 +6,7 @@ Usage: soak.py [--seconds 3600] [--seed 1] [--memory] [MEDIUM]
 MEDIUM is a built medium (default: build/medium of this source tree).
 
 After every search, the program counts the rows of the list. The list must have a row for each
-wireless device that was present all the time. It may have another row for each device that came or
-left.
+wireless device that was present all the time. It may also have rows for devices that came or left.
 
 At every checkpoint, no device comes or goes while the wizard searches up to three times. One of
 these searches must list exactly the wireless devices that are present, and none may list any other
