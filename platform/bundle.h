@@ -32,8 +32,8 @@ class Bundle {
   /// value or the value is not a string.
   [[nodiscard]] std::optional<std::string> infoString(std::string_view key) const;
 
-  /// Returns the text under `key` in the bundle's string table "InfoPlist". If there is no such
-  /// text, returns the result of infoString().
+  /// Returns the string under `key` in the bundle's string table "InfoPlist". If there is none,
+  /// returns the result of infoString().
   [[nodiscard]] std::optional<std::string> localizedInfoString(const std::string& key) const;
 
   /// Returns the path of the resource file `name`.`type`, or of the file `name` if `type` is empty.
@@ -52,7 +52,7 @@ class Bundle {
   /// should be, and others return nothing.
   [[nodiscard]] std::optional<std::string> executablePath() const;
 
-  /// Returns the text under `key` in the string table `table`, or in "Localizable" if `table` is
+  /// Returns the string under `key` in the string table `table`, or in "Localizable" if `table` is
   /// nothing. Returns `value` when the table does not contain `key` or cannot be read. The table is
   /// the file that pathForResource() finds for the table's name and the type "strings". Do not pass
   /// an empty `value`, because macOS would return `key` instead.

@@ -28,7 +28,7 @@ class DatagramSocket {
     DatagramEndpoint sender;
   };
 
-  /// Opens a socket. Returns nothing when the system refuses to open one or to make it
+  /// Opens a socket. Returns nothing when the system refuses to open a socket or to make the socket
   /// non-blocking.
   [[nodiscard]] static std::optional<DatagramSocket> open();
 

@@ -10,8 +10,8 @@ namespace onramp {
 // Call all functions on the main thread.
 
 /// Returns, in English, the reason why the system's service discovery does not work. Returns
-/// nothing when no such reason is known. May block until the system answers. A search can be
-/// started even while discovery does not work, and finds services as soon as it works.
+/// nothing when no reason is known. May block until the system answers. A search can be started
+/// even while discovery does not work, and finds services as soon as it works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
 /// A report that a NetServiceBrowser's search has seen a service on one network interface and

@@ -19,10 +19,10 @@
 /// - the IPv4 entity of an interface. It exists for every interface that is up, is ready for
 ///   traffic (connected and, where required, authenticated) and has an IPv4 address. This includes
 ///   the loopback interface. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold
-///   one dotted text for each address, in the system's order. The array
+///   one string in dotted form for each address, in the system's order. The array
 ///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
 ///   when none is set;
-/// - the global IPv4 entity, which exists while there is a usable default route. Its text
+/// - the global IPv4 entity, which exists while there is a usable default route. Its string
 ///   kSCDynamicStorePropNetPrimaryInterface names the interface of the preferred default route.
 namespace onramp {
 
@@ -74,7 +74,7 @@ using DynamicStoreCallback = std::function<void(const std::vector<std::string>& 
 
 /// Returns the current values of all `keys` and of all keys that match one of `patterns`, each
 /// under its key. The patterns are POSIX extended regular expressions that must match the whole
-/// key. Keys without a value are left out. Returns nothing on failure.
+/// key. Leaves out keys without a value. Returns nothing on failure.
 [[nodiscard]] std::optional<Dictionary> copyMultiple(const DynamicStoreRef& store,
                                                      const std::vector<std::string>& keys,
                                                      const std::vector<std::string>& patterns);
@@ -86,7 +86,7 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
                          const std::vector<std::string>& patterns);
 
 /// Creates a source for the session's notifications. If the run loop orders its sources, it handles
-/// those with a lower `order` first. Returns null on failure.
+/// a source with a lower `order` first. Returns null on failure.
 [[nodiscard]] DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int order);
 
 /// Adds `source` to the main run loop. The source works even while a modal window is shown. The

@@ -19,7 +19,8 @@ class InterfaceOwner {
   InterfaceOwner& operator=(const InterfaceOwner&) = delete;
   virtual ~InterfaceOwner() = default;
 
-  /// Performs the action with the name `action`. Does nothing when the owner has no such action.
+  /// Performs the action with the name `action`. Does nothing when the owner has no action of that
+  /// name.
   virtual void performAction(std::string_view action) = 0;
 
   /// Returns the texts to which the interface file binds titles.
@@ -49,9 +50,9 @@ class Interface {
   /// empty string when there is no view or the file gives the view no class.
   [[nodiscard]] std::string viewClass() const;
 
-  /// Returns a handle to the object that the file calls `name`. Returns an empty handle when there
-  /// is no such object or it is not of the handle's kind. On macOS, finds no menus, no menu items,
-  /// and no windows except the one called "window".
+  /// Returns a handle to the object that the file calls `name`. Returns an empty handle when no
+  /// object has that name or the object is not of the handle's kind. On macOS, finds no menus, no
+  /// menu items, and no windows except the one called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

@@ -33,8 +33,8 @@ inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
 /// The service is gone. Without this flag, the service has been found.
 inline constexpr unsigned long kNetServiceFlagRemove = 8;
 
-/// Searches for services with DNS Service Discovery. The responder, a program of the system, does
-/// the actual work. Main thread only. The client is called on the main thread, even while a modal
+/// Searches for services with DNS Service Discovery. The responder, a system program, does the
+/// actual work. Main thread only. The client is called on the main thread, even while a modal
 /// window is shown. Destroying a browser has the same effect as invalidate().
 class NetServiceBrowser {
  public:
@@ -97,24 +97,24 @@ class NetService {
   virtual ~NetService() = default;
 
   /// Returns the service's name in UTF-8 without escapes, such as "Office Printer". name(), type()
-  /// and domain() return nothing when the system does not report the text.
+  /// and domain() return nothing when the system does not report the value.
   [[nodiscard]] virtual std::optional<std::string> name() const = 0;
   /// Returns the type with its trailing dot, such as "_ipp._tcp.".
   [[nodiscard]] virtual std::optional<std::string> type() const = 0;
   /// Returns the domain with its trailing dot, such as "local.".
   [[nodiscard]] virtual std::optional<std::string> domain() const = 0;
 
-  /// Returns the addresses that the last resolve found, in the responder's order. The list is empty
-  /// unless the last resolve has succeeded. IPv6 addresses may be missing when the host has IPv4
-  /// addresses. Each address is a socket address in the BSD layout, even on a system with another
-  /// layout. Byte 0 is the length, byte 1 the family (2 for IPv4, 30 for IPv6), and bytes 2 and 3
-  /// are the port in network order. The four bytes of an IPv4 address start at byte 4. The sixteen
-  /// bytes of an IPv6 address start at byte 8. Bytes 24 to 27 are the scope of the IPv6 address, in
-  /// the machine's byte order.
+  /// Returns the addresses that the last resolve found, in the responder's order. If the last
+  /// resolve has not succeeded, the list is empty. IPv6 addresses may be missing when the host has
+  /// IPv4 addresses. Each address is a socket address in the BSD layout, even on a system with
+  /// another layout. Byte 0 is the length, byte 1 the family (2 for IPv4, 30 for IPv6), and bytes 2
+  /// and 3 are the port in network order. The four bytes of an IPv4 address start at byte 4. The
+  /// sixteen bytes of an IPv6 address start at byte 8. Bytes 24 to 27 are the scope of the IPv6
+  /// address, in the machine's byte order.
   [[nodiscard]] virtual std::vector<Data> addressing() const = 0;
 
   /// Returns the data of the TXT record that the last resolve found, in the wire format (RFC 6763
-  /// section 6). Returns nothing unless the last resolve has succeeded.
+  /// section 6). Returns nothing if the last resolve has not succeeded.
   [[nodiscard]] virtual std::optional<Data> txtData() const = 0;
 
   /// Sets the client, which is called when a resolve ends. A null `client` removes the client.

@@ -19,8 +19,7 @@ class OperationQueue {
       thread.join();
   }
 
-  /// Starts `operation`. Returns false when the system provides no thread; the operation is then
-  /// not run.
+  /// Starts `operation`. Returns false, and does not run it, when the system provides no thread.
   [[nodiscard]] bool addOperation(std::function<void()> operation) {
     try {
       threads_.emplace_back(std::move(operation));

@@ -53,7 +53,7 @@ class View : public Outlet {
 
   void setHidden(bool hidden) const;
 
-  /// Returns the first of the views directly inside this one, or an empty handle when there is
+  /// Returns the first of the views directly inside this view, or an empty handle when there is
   /// none.
   [[nodiscard]] View firstSubview() const;
 
@@ -85,7 +85,7 @@ class TextField : public View {
 };
 
 /// A push button. The interface file binds the button's title to a text of the file's owner, and
-/// names the action that the owner performs on a click.
+/// names the action that the owner performs when the button is clicked.
 class Button : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kButton;
@@ -99,7 +99,7 @@ class RadioMatrix : public Control {
   using Control::Control;
 
   /// Sets the title of the button at `row` and `column`, which count from 0. Does nothing when
-  /// there is no such button.
+  /// there is no button at that place.
   void setTitle(int row, int column, const std::string& title) const;
   /// Selects the button at `row` and `column`, which must exist, and deselects all others.
   void selectCell(int row, int column) const;
@@ -113,13 +113,13 @@ class RadioMatrix : public Control {
 struct Image {
   std::string path;
 
-  /// Returns the image `fileName` in the resources of the application's bundle, or nothing when
-  /// there is no such file.
+  /// Returns the image `fileName` in the resources of the application's bundle, or nothing when the
+  /// file does not exist.
   [[nodiscard]] static std::optional<Image> named(const std::string& fileName);
 };
 
 enum class ImageScaling {
-  kProportionallyDown,  ///< shown at its own size, or scaled down to fit the view
+  kProportionallyDown,  ///< shown in the image's size, or scaled down to fit the view
   kAxesIndependently,   ///< stretched to fill the view
 };
 
@@ -158,7 +158,8 @@ class TableView : public Control {
   /// Set whether the user may move columns, and whether a click on a header selects the column.
   void setAllowsColumnReordering(bool allows) const;
   void setAllowsColumnSelection(bool allows) const;
-  /// Shows `title` above the column `identifier`. Does nothing when the table has no such column.
+  /// Shows `title` above the column `identifier`. Does nothing when the table has no column with
+  /// that identifier.
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
   /// Sets whether the user may edit the texts in the column `identifier`. Does nothing in a front
   /// end whose tables are always read-only.
@@ -174,8 +175,8 @@ class PopUpButton : public Control {
 
   /// Returns the number of items, including item 0.
   [[nodiscard]] std::size_t numberOfItems() const;
-  /// Removes the command at `index`, which must be at least 1. Does nothing when there is no such
-  /// item.
+  /// Removes the command at `index`, which must be at least 1. Does nothing when the menu has no
+  /// item at `index`.
   void removeItem(std::size_t index) const;
 
   /// Adds a command to the end of the menu. When the user chooses the command, `action` runs on the

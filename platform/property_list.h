@@ -14,12 +14,12 @@ namespace onramp {
 // refuses XML lists that would take too many steps to read, such as one with more than about 23,000
 // keys in one dictionary.
 
-/// The maximum size of a file in bytes. It also limits the total size of all texts and data in a
+/// The maximum size of a file in bytes. It also limits the total size of all strings and data in a
 /// list. A shared object of a binary list counts once for each reference to it.
 inline constexpr std::size_t kMostPropertyListBytes = std::size_t{16} << 20;
 
-/// The maximum number of objects in a list. Containers count, and in some backends the keys of
-/// dictionaries count, too. A shared object counts once for each reference to it.
+/// The maximum number of objects in a list. Containers count as objects. In some backends, the keys
+/// of dictionaries count, too. A shared object counts once for each reference to it.
 inline constexpr std::uint64_t kMostPropertyListObjects = std::uint64_t{1} << 18;
 
 /// The maximum nesting depth of containers.
@@ -31,8 +31,8 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 
 /// Writes `dictionary` to `path` as an XML property list. The write is atomic: the data goes to a
 /// temporary file in the same folder, which is then renamed to `path`. Returns false on failure,
-/// for example when the folder is missing. An existing file at `path` is then unchanged. Each
-/// backend treats characters that XML does not allow in its own way.
+/// for example when the folder is missing. An existing file at `path` is then unchanged. Backends
+/// differ in their treatment of characters that XML does not allow.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
 /// Removes the file at `path`, or the folder and its contents. Also removes the temporary files of

@@ -10,8 +10,8 @@ namespace onramp {
 /// Returns whether standard error is a terminal that understands escape sequences.
 [[nodiscard]] bool isErrorTerminal();
 
-/// Returns the width in columns of the terminal that shows standard output, or 80 when the width is
-/// unknown.
+/// Returns the width, in columns, of the terminal that shows standard output, or 80 when the width
+/// is unknown.
 [[nodiscard]] std::size_t terminalWidth();
 
 /// Returns how many columns a character takes on a terminal, according to the process's locale.

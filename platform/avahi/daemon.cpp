@@ -103,7 +103,7 @@ bool Daemon::watchDaemon() {
          });
 }
 
-// Asks the bus to start the daemon, which works on systems that start the daemon on demand. The bus
+// Asks the bus to start the daemon. This works on systems that start the daemon on demand. The bus
 // reports when the daemon has arrived.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");

@@ -90,7 +90,7 @@ bool Service::startResolve(TimeLimit timeLimit) {
   return true;
 }
 
-// Uses a separate connection, so that no other client is called in the meantime.
+// Uses a separate connection, so that no other client is called while this call blocks.
 bool Service::resolveNow(TimeLimit timeLimit) {
   const auto daemon = Daemon::create();
   if (!daemon) return false;

@@ -23,7 +23,7 @@ void Query::ask() {
   if (asked_ || isRefused_) return;
   const Message call = daemon_.newCall((std::string(kind_) + "Prepare").c_str());
   if (call && arguments_(call.get()) < 0) {
-    isRefused_ = true;  // for example because a text is not UTF-8
+    isRefused_ = true;  // for example because an argument is not UTF-8
     return;
   }
   // The answer may arrive after this query has been destroyed or sent again. Nothing uses the

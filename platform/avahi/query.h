@@ -31,15 +31,15 @@ class Query {
   /// Appends the arguments of the *Prepare method to `call`. Returns a negative number on failure.
   using Arguments = std::function<int(sd_bus_message* call)>;
 
-  /// `kind` is the kind of the object in the daemon, such as "RecordBrowser". `daemon` and the text
-  /// `kind`, which is not copied, must outlive the query.
+  /// `kind` is the kind of the object in the daemon, such as "RecordBrowser". `daemon` and the
+  /// string `kind`, which is not copied, must outlive the query.
   Query(Daemon& daemon, const char* kind, Arguments arguments, Handler handler);
   Query(const Query&) = delete;
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Returns whether the daemon has called the question invalid or the question could not be put
-  /// into a message. Such a question gets no result and is not repeated.
+  /// Returns whether the question failed for good, because the daemon called it invalid or because
+  /// it could not be put into a message. The query then gets no result and is not sent again.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:

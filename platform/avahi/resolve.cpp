@@ -13,8 +13,8 @@ namespace {
 // time, the daemon can repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 
-// Tells a service resolver not to look up an address. It would find only one, but Records finds
-// all.
+// Tells a service resolver not to look up an address. The resolver would find only one address, but
+// Records finds all of them.
 constexpr unsigned kNoAddress = 8;
 
 // Reads a service resolver's Found signal. Builds the data of the TXT record (RFC 1035 section
@@ -71,7 +71,7 @@ void Resolve::begin() {
   service_.emplace(
       daemon_, "ServiceResolver",
       [this](sd_bus_message* call) {
-        // Without a name, the daemon would look up the type itself instead of a service.
+        // If the name were empty, the daemon would look up the type itself instead of a service.
         if (instance_.name.empty() || instance_.domain.empty()) return -EINVAL;
         return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
                                      instance_.name.c_str(), instance_.type.c_str(),

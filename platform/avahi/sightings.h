@@ -16,14 +16,14 @@ using Place = std::pair<std::int32_t, std::int32_t>;
 template <typename Thing>
 class Sightings {
  public:
-  /// Adds a sighting, unless it is already known. Returns whether it is the thing's first one.
+  /// Adds a sighting, if it is new. Returns whether it is the thing's first sighting.
   bool add(const Thing& thing, Place place) {
     auto& places = places_[thing];
     const bool isNew = places.insert(place).second;
     return isNew && places.size() == 1;
   }
 
-  /// Removes a sighting. Returns whether it was the thing's last one.
+  /// Removes a sighting. Returns whether it was the thing's last sighting.
   bool remove(const Thing& thing, Place place) {
     const auto found = places_.find(thing);
     if (found == places_.end()) return false;

@@ -25,7 +25,7 @@ class Timer {
 
   /// Starts the wait, or restarts it if it is already running.
   void start(std::chrono::milliseconds wait);
-  /// Starts the wait unless it is already running.
+  /// Starts the wait, if it is not running yet.
   void ensure(std::chrono::milliseconds wait);
   /// Ends the wait without calling the action. Does nothing when the timer is not running.
   void stop();

@@ -16,7 +16,7 @@ using corefoundation::toString;
 
 class CFService;
 
-// Returns the existing handles. Each is stored under the framework's object that it owns.
+// Returns the table of existing handles. Its keys are the framework's objects that the handles own.
 std::map<CFNetServiceRef, std::weak_ptr<CFService>>& liveServices() {
   static std::map<CFNetServiceRef, std::weak_ptr<CFService>> services;
   return services;
@@ -99,8 +99,8 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   Reference<CFNetServiceRef> service_;
   Client client_ = nullptr;
   void* info_ = nullptr;
-  /// Whether the last resolve has succeeded. If it has not, the framework may still return the
-  /// results of an earlier resolve.
+  /// Whether the last resolve has succeeded. After a failed resolve, the framework may still return
+  /// the results of an earlier one.
   bool isResolved_ = false;
 };
 

@@ -6,8 +6,8 @@ namespace onramp::cocoa {
 
 /// Makes `window` as large as its contents need, up to the size of the screen. The window never
 /// shrinks, and its middle stays in place as far as the screen allows. Also arranges the contents,
-/// as described below. Call this after every change of a text or of the visible views. Does nothing
-/// when `window` is nil.
+/// as described below. Call this whenever a text has changed or a view has been shown or hidden.
+/// Does nothing when `window` is nil.
 ///
 /// A text field that is attached to the top of its superview grows downwards. Any other text field
 /// grows upwards. A list in the same superview makes room by getting shorter, down to six rows. If

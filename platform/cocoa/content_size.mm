@@ -127,8 +127,8 @@ CGFloat neededWidth(NSTableView* list) {
   return width;
 }
 
-// Returns how much wider `view` must be to fit every list and radio matrix in it. The result can be
-// negative if `view` itself is a list or a matrix.
+// Returns how much wider `view` must be so that every list and radio matrix in it fits. The result
+// can be negative if `view` itself is a list or a matrix.
 CGFloat missingWidth(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {
     return neededWidth(static_cast<NSMatrix*>(view)) - NSWidth([view frame]);
@@ -227,8 +227,8 @@ void growFields(NSView* view) {
   }
 }
 
-// Returns where a line of `length` must start to lie between `least` and `greatest`, as near as
-// possible to `start`. Returns `least` if the line is too long.
+// Returns where a line of `length` must start, so that it lies between `least` and `greatest` and
+// starts as close as possible to `start`. Returns `least` if the line is too long.
 CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat length) {
   return std::max(least, std::min(std::floor(start), greatest - length));
 }

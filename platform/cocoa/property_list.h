@@ -13,8 +13,8 @@ namespace onramp::cocoa {
 /// exceeds the limits in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> toDictionary(id object);
 
-/// Converts `value` to an autoreleased property-list object. A text that is not valid UTF-8 becomes
-/// an empty string.
+/// Converts `value` to an autoreleased property-list object. A string that is not valid UTF-8
+/// becomes an empty string.
 [[nodiscard]] id toPropertyList(const Value& value);
 
 }  // namespace onramp::cocoa

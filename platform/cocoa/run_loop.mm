@@ -20,7 +20,7 @@ NSArray* allModes() {
                                    NSEventTrackingRunLoopMode, nil];
 }
 
-// The number of running modal loops, and whether the innermost one was asked to end. Main thread
+// The number of running modal loops, and whether the innermost loop was asked to end. Main thread
 // only.
 int modalLoops = 0;
 bool isModalAborted = false;
@@ -48,8 +48,8 @@ void post(std::function<void()> action) {
   }
 }
 
-// Drops the clicks and keys that arrived while the main thread was busy, because the user meant
-// them for the page that was shown then. No timer or posted action runs in the loop mode used here.
+// Drops the clicks and keys that arrived while the main thread was busy. The user meant them for
+// the page that was shown at that time. No timer or posted action runs in the loop mode used here.
 void dropWaitingInput() {
   const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
                            NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;

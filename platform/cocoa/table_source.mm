@@ -158,8 +158,8 @@ CGFloat leastNameWidth(NSCell* cell) {
   return onramp::cocoa::toNSString(entries[index].string(key).value_or(""));
 }
 
-// Returns the first row, from `startRow` to `endRow`, whose name has a word that starts with
-// `typed`. After the last row of the table, continues at row 0. Returns -1 if no row matches.
+// Searches from `startRow` to `endRow`, continuing at row 0 after the last row of the table.
+// Returns the first row whose name has a word that starts with `typed`, or -1 if no row matches.
 - (NSInteger)tableView:(NSTableView*)table
     nextTypeSelectMatchFromRow:(NSInteger)startRow
                          toRow:(NSInteger)endRow

@@ -7,7 +7,7 @@
 
 namespace onramp::cocoa {
 
-/// Converts `text` to a string object. The result is empty when `text` is not valid UTF-8.
+/// Converts `text` to an NSString. The result is empty when `text` is not valid UTF-8.
 [[nodiscard]] inline NSString* toNSString(std::string_view text) {
   NSString* const string = [[NSString alloc] initWithBytes:text.data()
                                                     length:text.size()

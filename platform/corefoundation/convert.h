@@ -10,14 +10,14 @@
 
 namespace onramp::corefoundation {
 
-/// Converts `text` to a string object. Returns null when `text` is not valid UTF-8.
+/// Converts `text` to a CFString. Returns null when `text` is not valid UTF-8.
 [[nodiscard]] Reference<CFStringRef> toCFString(std::string_view text);
 
-/// Converts `texts` to an array of string objects. Leaves out texts that are not valid UTF-8.
+/// Converts `texts` to an array of CFStrings. Leaves out strings that are not valid UTF-8.
 [[nodiscard]] Reference<CFArrayRef> toCFArray(const std::vector<std::string>& texts);
 
-/// Returns the text of a string object in UTF-8. Returns nothing when `object` is null or is not a
-/// string.
+/// Returns the contents of a CFString in UTF-8. Returns nothing when `object` is null or is not a
+/// CFString.
 [[nodiscard]] std::optional<std::string> toString(CFTypeRef object);
 
 /// Returns a copy of the bytes of `data`, which must not be null.

@@ -15,8 +15,8 @@ std::string environment(const char* name) {
   return value ? value : "";
 }
 
-// Returns the locale that the environment names for messages, or an empty text when it names no
-// locale, or the locale C or POSIX.
+// Returns the locale that the environment names for messages. Returns an empty string when the
+// environment names no locale, or the locale C or POSIX.
 std::string messagesLocale() {
   for (const char* const name : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
     const std::string locale = environment(name);

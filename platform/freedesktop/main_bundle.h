@@ -5,12 +5,12 @@
 namespace onramp {
 
 /// Makes the folder at `path` the running application's bundle. `path` must be absolute and have no
-/// trailing "/". For tests, and for tools that examine another application.
+/// trailing "/". Only tests, and tools that examine another application, call this function.
 void setMainBundlePath(std::string path);
 
-/// Returns the path of the running application's bundle, without a trailing "/". Unless
-/// setMainBundlePath() has set the path, the bundle is the folder that holds
-/// Contents/<system>/<executable>. If the executable is not in such a folder, the bundle is the
+/// Returns the path of the running application's bundle, without a trailing "/". If
+/// setMainBundlePath() has not set the path, the bundle is the folder that holds
+/// Contents/<system>/<executable>. If the executable has no path of this form, the bundle is the
 /// executable's folder.
 [[nodiscard]] std::string mainBundlePath();
 

@@ -200,7 +200,7 @@ class Parser {
   std::string_view text_;
   std::string_view rest_;
   ParseProblem& problem_;
-  std::size_t lastEnd_ = 0;  ///< end of the last key or text, where missing punctuation is reported
+  std::size_t lastEnd_ = 0;  ///< end of the last key or text; missing punctuation is reported there
 };
 
 }  // namespace

@@ -102,8 +102,8 @@ class BinaryWalk {
     Cost cost;
   };
 
-  // Returns a reader for the bytes from the object to the table of offsets. The reader is empty
-  // when the object does not lie before the table.
+  // Returns a reader for the bytes from the object to the table of offsets. The reader is empty if
+  // the object is not before the table.
   [[nodiscard]] ByteReader objectAt(std::size_t index) const {
     const std::uint64_t offset = offsets_[index];
     return ByteReader(objects_.substr(std::min<std::uint64_t>(offset, objects_.size())));
@@ -160,7 +160,7 @@ class BinaryWalk {
     }
   }
 
-  // Returns the number of items in a container, or of units in a text or data object. Returns
+  // Returns the number of items in a container, or of units in a string or data object. Returns
   // UINT64_MAX, which exceeds every limit, when this number is malformed.
   static std::uint64_t count(std::uint64_t low, ByteReader& object) {
     if (low < 0xF) return low;
@@ -176,7 +176,7 @@ class BinaryWalk {
     return object.skip(cost.bytes);
   }
 
-  // Refuses every UTF-16 text that contains a null character, because libplist ends the process
+  // Refuses every UTF-16 string that contains a null character, because libplist ends the process
   // when a key contains one.
   static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
     ByteReader text = object;

@@ -27,7 +27,7 @@ using Owned = std::unique_ptr<T, Free>;
 
 // libplist's functions for integers do not distinguish -1 from 2^64-1, and its functions for dates
 // keep only 32 bits. A binary list keeps every bit, so each integer and date is converted through a
-// binary list of one object. In such a list, an 8-byte integer begins with kInteger8, a 16-byte
+// binary list of one object. In a binary list, an 8-byte integer begins with kInteger8, a 16-byte
 // integer with kInteger16, and a date with kDate8.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
@@ -60,7 +60,7 @@ Node created(Node node) {
 }
 
 // Converts `node` to a binary list of one object, and returns the bytes after the list's header.
-// These bytes begin with the object. Returns an empty text on failure.
+// These bytes begin with the object. Returns an empty string on failure.
 std::string objectOf(plist_t node) {
   char* bytes = nullptr;
   std::uint32_t size = 0;

@@ -9,12 +9,12 @@
 namespace onramp::libplist {
 
 /// Returns the value in `bytes`, an XML property list (in UTF-8 or UTF-16) or a binary one. Returns
-/// nothing when `bytes` are not such a list or exceed a limit. `problem` then gets the place and
-/// the reason, unless the check finds no fault and only libplist fails.
+/// nothing when `bytes` are malformed or exceed a limit. `problem` then gets the place and the
+/// reason, but stays empty if only libplist, and not our own check, finds a fault.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 
-/// Formats `dictionary` as an XML property list. Returns an empty text on failure.
+/// Formats `dictionary` as an XML property list. Returns an empty string on failure.
 [[nodiscard]] std::string formatPropertyList(const Dictionary& dictionary);
 
 }  // namespace onramp::libplist

@@ -14,10 +14,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// Limits the steps of libplist whose number grows quadratically with the size of the list. The keys
-// of a dictionary cause such steps, because libplist hashes them into a fixed number of chains. The
-// entities in a text also cause such steps, because libplist moves the rest of the text at each
-// entity.
+// Limits the work of libplist that grows quadratically with the size of the list. One cause is a
+// dictionary with many keys, which libplist hashes into a fixed number of chains. The other is a
+// text with many entities, because libplist moves the rest of the text at each entity.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {
@@ -69,8 +68,8 @@ class XMLWalk {
   }
 
   // Moves past the first `end` that begins at least `from` characters from here. Sets `skipped_` to
-  // the markup before that `end`, without the first `from` characters. Refuses the list when there
-  // is no such `end`.
+  // the markup before that `end`, without the first `from` characters. Refuses the list when no
+  // `end` follows.
   bool skipPast(std::string_view end, std::size_t from) {
     const std::size_t found = text_.find(end, at_ + from);
     if (found == kNone) {

@@ -31,7 +31,7 @@ std::string temporaryStem(const fs::path& path) {
 // Creates a file with an unused name next to `path`, and stores the new file's path in `name`. The
 // umask determines the file's access rights. Returns an empty descriptor on failure.
 Descriptor createBeside(const fs::path& path, std::string& name) {
-  constexpr int kMostTries = 100;  // processes that were killed may have left files with such names
+  constexpr int kMostTries = 100;  // killed processes may have left files with these names
   const std::string stem =
       (path.parent_path() / temporaryStem(path)).string() + std::to_string(getpid()) + "-";
   for (int i = 0; i < kMostTries; ++i) {

@@ -9,8 +9,8 @@
 namespace onramp {
 
 enum class Session {
-  kOwn,     ///< a new session: the started program survives the end of the caller's terminal
-  kShared,  ///< the caller's session: the started program may end with the terminal
+  kOwn,  ///< a new session, so that the started program survives the end of the caller's terminal
+  kShared,  ///< the caller's session, so that the started program may end with the terminal
 };
 
 /// Starts the program at `executable` with `arguments`. The program starts with no signal blocked

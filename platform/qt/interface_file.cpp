@@ -33,7 +33,7 @@ QString textOf(std::string_view text) {
 }
 
 // Creates the widgets of an interface file, including those that this front end defines. In the
-// file, the root widget of a page has the page's class, which is not a widget class. For such a
+// file, the root widget of a page has the page's class, which is not a widget class. For a page's
 // class, creates a plain widget and stores the name of the class in the property kViewClass.
 class Loader final : public QUiLoader {
  public:
@@ -70,8 +70,8 @@ class Loader final : public QUiLoader {
 
  private:
   // Creates the loader while Qt's list of library paths is empty. Otherwise, QUiLoader's
-  // constructor would load every Designer plug-in in these paths, and with them many libraries of
-  // Qt.
+  // constructor would load every Designer plug-in in these paths, and these plug-ins would load
+  // many libraries of Qt.
   static Loader* makeWithoutPlugIns() {
     const QStringList paths = QCoreApplication::libraryPaths();
     QCoreApplication::setLibraryPaths({});

@@ -27,7 +27,8 @@ class ListModel final : public QAbstractTableModel {
   /// Call this when the controller's entries have changed.
   void reload();
 
-  /// Sets the title of the column `identifier`. Does nothing if there is no such column.
+  /// Sets the title of the column `identifier`. Does nothing if there is no column with that
+  /// identifier.
   void setHeader(const QString& identifier, const QString& title);
 
   [[nodiscard]] int rowCount(const QModelIndex& parent = {}) const override;

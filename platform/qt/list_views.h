@@ -14,8 +14,8 @@ namespace onramp::qt {
 /// Returns the minimum width of a column of names.
 [[nodiscard]] int leastNameWidth();
 
-/// A view that also redraws its frame when it gets or loses the focus, because the frame shows the
-/// focus. Qt's own views redraw only their rows.
+/// A view that redraws its frame when it gets or loses the focus, because the frame shows the
+/// focus. Qt's views redraw only their rows.
 template <typename View>
 class FramedView : public View {
  public:
@@ -70,7 +70,7 @@ class ColumnsWidget final : public FramedView<QTreeView> {
   /// Returns the width that shows all texts of the column in full.
   [[nodiscard]] int neededWidth(int column) const;
 
-  /// Returns the total width that the columns after the first one need.
+  /// Returns the total width that all columns except the first one need.
   [[nodiscard]] int neededWidthOfOthers() const;
 
   void adjustWidths();

@@ -5,8 +5,8 @@
 
 namespace onramp::qt {
 
-/// A wheel of spokes that turns from start() to stop(). For assistive programs, the turning spinner
-/// is an indeterminate progress bar. If the spinner is turning when it appears, it takes the
+/// A wheel of spokes that turns from start() to stop(). Assistive programs see the turning spinner
+/// as an indeterminate progress bar. If the spinner is turning when it appears, it takes the
 /// keyboard focus, so that these programs read out what the user is waiting for.
 class Spinner final : public QProgressBar {
   Q_OBJECT

@@ -120,7 +120,8 @@ void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, 
   }
 }
 
-// Makes disabled text readable. In some high-contrast palettes, it has the colour of the window.
+// Makes disabled text readable. In some high-contrast palettes, this text has the colour of the
+// window.
 void Style::drawItemText(QPainter* painter, const QRect& rectangle, int flags,
                          const QPalette& palette, bool isEnabled, const QString& text,
                          QPalette::ColorRole role) const {
@@ -146,8 +147,8 @@ QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, con
   const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
   // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
-  // Fusion draws a column for check marks that is as wide as the item is high. If the text is
-  // large, the width that Fusion computes has no room for this column.
+  // In front of the text, Fusion draws a column for check marks, which is as wide as the item is
+  // high. If the text is large, the width that Fusion computes has no room for this column.
   if (type == CT_MenuItem) return normal + QSize(normal.height(), 0);
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

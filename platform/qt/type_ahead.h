@@ -7,8 +7,8 @@ class QAbstractItemView;
 
 namespace onramp::qt {
 
-/// Selects a row of a list when the user types a text. A row matches if any word in its first
-/// column starts with the text, ignoring case.
+/// Selects a row of a list when the user types. A row matches if any word in its first column
+/// starts with the typed text, ignoring case.
 class TypeAhead {
  public:
   /// Call this when the user has typed `text`. Joins texts that are typed in quick succession, and

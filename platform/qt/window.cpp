@@ -10,7 +10,8 @@ namespace onramp {
 
 using qt::nativeOf;
 
-// A window without a resize indicator must not be resizable, so ContentSize fixes its size.
+// A window without a resize indicator must not be resizable, so ContentSize fixes the window's
+// size.
 void Window::setShowsResizeIndicator(bool shows) const {
   auto* const window = nativeOf<QMainWindow>(*this);
   if (window && !shows) qt::makeChild<qt::ContentSize>(window);

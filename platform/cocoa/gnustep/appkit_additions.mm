@@ -18,7 +18,7 @@ BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
   return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
 }
 
-// Implements two setters that GNUstep lacks. Both have nothing to do: GNUstep shows no resize
+// Implements two setters that GNUstep lacks. Neither has anything to do: GNUstep shows no resize
 // indicator on a window of fixed size, and no GNUstep window prevents termination.
 void ignore(id, SEL, BOOL) {}
 
@@ -81,8 +81,8 @@ NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
       .size;
 }
 
-// Prevents GNUstep from starting its daemon for notifications between applications. The wizard
-// needs no such notifications, and would fail to launch if the daemon were slow to answer.
+// Prevents GNUstep from starting its daemon for notifications between applications. The wizard does
+// not use these notifications, and would fail to launch if the daemon were slow to answer.
 id noDistributedCenter(id, SEL) {
   return nil;
 }
@@ -104,8 +104,8 @@ BOOL openURL(id, SEL, NSURL* url) {
 }  // namespace
 
 /// Stands for an accessibility relation between controls in an interface file. GNUstep creates an
-/// object for each element of the file, and rejects the whole file if the class of one element is
-/// missing.
+/// object for each element of the file, and rejects the whole file if it lacks the class of any
+/// element.
 @interface IBAccessibilityConnection : NSObject
 @end
 

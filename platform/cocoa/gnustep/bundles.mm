@@ -45,7 +45,7 @@ NSArray* resourcePaths(id self, SEL selector, NSString* rootPath, NSString* subP
   NSString* const first = localization ? nil : firstLanguageFolder(contents, subPath);
   if (!first || [paths count] == 0) return paths;
   NSMutableArray* const all = [NSMutableArray arrayWithArray:paths];
-  [all insertObject:first atIndex:1];  // after the folder of resources that have no language
+  [all insertObject:first atIndex:1];  // after the folder of resources without a language
   return all;
 }
 

@@ -11,7 +11,7 @@ namespace {
 using SetTime = void(id, SEL, unsigned long);
 
 // Times are milliseconds in 32 bits, and restart at 0 after the largest number. A step back of at
-// least this size is such a restart.
+// least this size means that they have restarted.
 constexpr unsigned long kGreatestStepBack = 0xF0000000UL;
 
 SetTime* originalSetLastTime = nullptr;

@@ -13,8 +13,8 @@ Implementation* replaceMethod(Class owner, SEL selector, Implementation* replace
       class_getInstanceMethod(owner, selector), reinterpret_cast<IMP>(replacement)));
 }
 
-/// Adds an instance method to the class `owner`. If the class already has a method with that
-/// selector, replaces the method. The method takes one BOOL and has no result.
+/// Adds an instance method to the class `owner`. Replaces any method that the class already has for
+/// that selector. The method takes one BOOL and has no result.
 inline void addMethod(Class owner, SEL selector, void (*implementation)(id, SEL, BOOL)) {
   class_replaceMethod(owner, selector, reinterpret_cast<IMP>(implementation), "v@:c");
 }
