@@ -12,7 +12,8 @@ namespace onramp {
 /// encoding in `out_length`. Sets the `encoded_length` of each encoded binding. Replaces each
 /// negative integer in `message`, except the values of types 65 to 67, with the unsigned number
 /// that has the same bytes (ber_put_int()). For example, -1 becomes 255, so a second call encodes
-/// 255. Encodes a binding without a value unless its `type` is 1, 2, 4, 5, 6 or 64 to 68.
+/// 255. If the `type` of a binding is not 1, 2, 4, 5, 6 or 64 to 68, encodes the binding without a
+/// value.
 ///
 /// Returns SNMP_ERR_CODEC when:
 /// - the message does not fit in the buffer or is longer than 65,535 bytes,

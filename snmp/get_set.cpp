@@ -12,9 +12,8 @@ namespace {
 
 constexpr std::size_t kStringStride = 16;
 
-// Holds the strings of a request, and later the strings of its reply. The strings of the request,
-// and those of the reply, may take up to kReplySize bytes. The destructor clears the bindings'
-// pointers to this storage.
+// Holds the strings of a request, and later the strings of its reply: up to kReplySize bytes of
+// each. The destructor clears the bindings' pointers to this storage.
 class string_storage {
  public:
   explicit string_storage(std::span<snmp_varbind> bindings)

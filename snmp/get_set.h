@@ -19,11 +19,11 @@ struct snmp_result_slot {
 };
 
 /// Asks the device at `address` for the objects that the bindings of `message` name, and copies the
-/// values in the reply to `results`. There must be one slot for each binding. Sends a get-next
-/// request when `pdu_type` is kPduGetNext, otherwise a get request. `address` and `mode` are those
-/// of snmp_exchange(). A zero byte follows a copied string if the slot has room for it. Values of
-/// types 6, 64 and 68 are not copied; the contents of their slots are undefined. The `octets_value`
-/// of each binding is null afterwards.
+/// values in the reply to the slots in `results`. There must be one slot for each binding. Sends a
+/// get-next request when `pdu_type` is kPduGetNext, otherwise a get request. snmp_exchange()
+/// describes `address` and `mode`. A zero byte follows a copied string if the slot has room for it.
+/// Values of types 6, 64 and 68 are not copied; the contents of their slots are undefined. The
+/// `octets_value` of each binding is null afterwards.
 ///
 /// If the exchange fails, returns the status of snmp_exchange(). Otherwise returns the reply's
 /// error status, which is 0 on success. Returns SNMP_ERR_CODEC when there are more slots than
@@ -36,8 +36,7 @@ struct snmp_result_slot {
 /// binding's `index` must be the index of its slot in `results`. The binding takes its type from
 /// the slot. If the type is 4, the binding also takes its value from the slot; otherwise it keeps
 /// its own value. Like snmp_get(), copies the values in the reply to the slots and returns a
-/// status. The reply's first value goes to the first slot, the second to the second, and so on,
-/// whatever `index` was.
+/// status. The reply's values go to the slots in order, regardless of `index`.
 ///
 /// A string here is a value of type 4, 64 or 68. The strings are copied to a buffer of kReplySize
 /// bytes, where each starts at a multiple of 16. The `octets_value` of a binding with a string is

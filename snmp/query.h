@@ -48,8 +48,8 @@ constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's 
 constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
 /// The table that asks for kActiveIFObject. The name in each reply overwrites the name in this
-/// table, and later requests ask for the new name. After a reply with a shorter name, the table
-/// accepts only names of at most that length.
+/// table, and later requests ask for the new name. After a reply with a shorter name, longer names
+/// are refused.
 extern mib_table active_interface_table;
 
 /// Stores an INTEGER under `name` as a 32-bit number and returns 0. Returns 1 for a value of any
@@ -87,18 +87,18 @@ class snmp_table_request {
   snmp_message message_;
 };
 
-/// Asks the device at `address`, a dotted IPv4 text, for the objects of `table`. Returns nothing
-/// when `table` or `address` is null, when the request fails, when the reply has an error status,
-/// and when snmp_table_request::result() returns nothing for the reply. A request fails when it
-/// cannot be sent or gets no valid reply. A failed request sets `out_no_reply` to true; nothing
-/// sets it to false. Stores the error status and index of a reply in the last two arguments, each
-/// of which may be null. Blocks as snmp_exchange() does.
+/// Asks the device at `address`, an IPv4 address in dotted form, for the objects of `table`.
+/// Returns nothing when `table` or `address` is null, when the request fails, when the reply has an
+/// error status, and when snmp_table_request::result() returns nothing for the reply. A request
+/// fails when it cannot be sent or gets no valid reply. A failed request sets `out_no_reply` to
+/// true; otherwise it is unchanged. Stores the error status and index of a reply in the last two
+/// arguments, each of which may be null. May block as long as snmp_exchange().
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
                                                          std::int32_t* out_error_index);
 
-/// Calls snmp_query_table(), and calls it a second time if the first call returns nothing.
+/// Calls snmp_query_table(), and calls it again if the first call returns nothing.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table_retry(mib_table* table,
                                                                const char* address,
                                                                bool& out_no_reply,
@@ -118,8 +118,8 @@ class snmp_table_request {
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
 /// Makes one request to the device at `address`, which is null if the entry in the list of
-/// addresses is not a string. Returns what snmp_query_table() returns, and sets `no_reply` to true
-/// when snmp_query_table() sets `out_no_reply`.
+/// addresses is not a string. Returns the result of snmp_query_table(), and passes on its
+/// `out_no_reply` in `no_reply`.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
 /// Does what snmp_active_interface_is_wireless() above does, but calls `ask` to make each request.

@@ -65,13 +65,14 @@ struct snmp_message {
 };
 
 /// Makes `message` an SNMPv1 request with the community kCommunity of snmp/protocol.h. Sets
-/// `varbind_count`, and sets the type of that many bindings to NULL, or of all bindings if the
-/// array has fewer. Leaves `request_id` and `pdu_type` unchanged.
+/// `varbind_count`, and sets the type of that many bindings to NULL. If the array has fewer, sets
+/// the type of all bindings. Leaves `request_id` and `pdu_type` unchanged.
 void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
 /// Compares two object identifiers arc by arc. At the first difference, returns -1 when the arc of
-/// `first` is less, and 1 when it is greater. If there is no difference, returns -1 when `first` is
-/// shorter, and 0 otherwise, even when `second` is shorter. The program does not use this function.
+/// `first` is smaller, and 1 when it is larger. If there is no difference, returns -1 when `first`
+/// is shorter, and 0 otherwise, even when `second` is shorter. The program does not use this
+/// function.
 [[nodiscard]] int snmp_oid_compare(const snmp_oid& first, const snmp_oid& second);
 
 }  // namespace onramp

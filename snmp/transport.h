@@ -18,7 +18,8 @@ constexpr std::uint16_t kReplySize = 1500;
 /// A buffer for one encoded message.
 using snmp_packet = std::array<std::uint8_t, 1536>;
 
-/// The longest time to wait until a request can be sent, and until its reply arrives.
+/// The maximum time to wait until a request can be sent, and the maximum time to wait for its
+/// reply.
 constexpr std::chrono::seconds kSendWait{2};
 constexpr std::chrono::seconds kReceiveWait{2};
 
@@ -37,19 +38,19 @@ extern std::int64_t snmp_request_counter_ext;
 
 /// Returns `text` with each of its dot-separated parts replaced by the decimal number at the start
 /// of that part, or by 0 if it does not start with a number. This removes leading zeros, which
-/// would mark a part as octal. Returns nothing for a null or empty text, and when the result would
-/// be longer than 31 characters.
+/// would mark a part as octal. Returns nothing for a null pointer or an empty string, and when the
+/// result would be longer than 31 characters.
 [[nodiscard]] std::optional<std::string> snmp_normalize_ipv4(const char* text);
 
-/// Returns the endpoint of the SNMP agent at `address`, a dotted IPv4 text. For any other text, the
-/// endpoint's address is 255.255.255.255.
+/// Returns the endpoint of the SNMP agent at `address`, an IPv4 address in dotted form. For any
+/// other string, the endpoint's address is 255.255.255.255.
 [[nodiscard]] DatagramEndpoint snmp_agent_at(const std::string& address);
 
-/// Sends `message` to the SNMP port of `address`, a dotted IPv4 text, and decodes the reply into
-/// `message`. Sends nothing if `address` is null or not an IPv4 address. Blocks for at most
-/// kSendWait plus kReceiveWait. The wait ends early when the host reports that the port is closed.
-/// `message.community` keeps its value, because the reply's community does not outlive the call.
-/// The reply's identifier is stored in `message.request_id` but not checked.
+/// Sends `message` to the SNMP port of `address`, an IPv4 address in dotted form, and decodes the
+/// reply into `message`. Sends nothing if `address` is null or not an IPv4 address. Blocks for at
+/// most kSendWait plus kReceiveWait. The wait ends early when the host reports that the port is
+/// closed. `message.community` keeps its value, because the reply's community does not outlive the
+/// call. The reply's identifier is stored in `message.request_id` but not checked.
 ///
 /// Returns SNMP_OK for a valid reply, SNMP_ERR_TRANSPORT when no socket can be opened, and
 /// SNMP_ERR_CODEC when the message cannot be encoded or the wait ends without a valid reply. With

@@ -46,7 +46,8 @@ class BlindChooser:
         stop(self.process)
 
     def go_there(self):
-        """Chooses wireless on the first page. Returns when the first search has ended."""
+        """Presses Return on the first page, which must be the connection page with wireless
+        selected. Returns when the first search has ended."""
         self._desktop.run(["xdotool", "search", "--sync", "--onlyvisible", "--pid",
                            str(self.process.pid)], timeout=WAIT_SECONDS)
         time.sleep(2)
@@ -75,7 +76,7 @@ class BlindChooser:
     @staticmethod
     def _try(act, has_begun):
         """Calls `act` until a search begins, because a click that comes too early is lost. Raises
-        TimeoutError after several calls."""
+        TimeoutError if no search begins after several calls."""
         for _ in range(_TRIES):
             act()
             try:

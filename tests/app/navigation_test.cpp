@@ -183,7 +183,7 @@ TEST_F(Navigation, AToolThatAsksToGoBackLeadsToTheConnectionPageWithWirelessSele
   EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedColumn, 0);
   EXPECT_EQ(screen.log, (Strings{"unhide", "activate", "key and front"}));
 
-  // The tool runs again after another search that finds nothing.
+  // A second search that finds nothing runs the tool again.
   screen.log.clear();
   screen.click("rightMostButton");
   EXPECT_EQ(screen.log.back(), "hide");

@@ -11,7 +11,7 @@ namespace {
 
 using namespace std::literals;
 
-// Reads the characters of `bytes` and writes them again. A byte that is not part of a valid
+// Decodes the characters of `bytes` and encodes them again. A byte that is not part of a valid
 // character becomes "?".
 std::string readAndWritten(std::string_view bytes) {
   std::string text;

@@ -1,5 +1,5 @@
 // Parses each input as a device URI and as a URL. Then makes a device URI of a service with the
-// input as its name, and reads the name back unless it is ambiguous or not UTF-8.
+// input as its name. If the name is UTF-8 and not ambiguous, also reads it back.
 
 #include <cstdint>
 #include <cstdlib>

@@ -12,11 +12,11 @@ import time
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent.parent
 PRACTICE_NETWORK = ROOT / "tools" / "practice-network"
-PATIENCE = 30  # the seconds after which a missing event counts as a failure
+PATIENCE = 30  # seconds to wait for an event before the test fails
 
 
 def enclose(description):
-    """Restarts this program on a practice network of two hosts, unless it already runs on one.
+    """Restarts this program on a practice network of two hosts, if it does not run on one yet.
 
     `description` is the network's description file.
     """

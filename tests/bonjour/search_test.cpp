@@ -92,7 +92,7 @@ TEST_F(BrowserTest, ADuplicateIsCountedAndTheNewestObjectIsKept) {
                           Event{"remove", onTwo}, Event{"remove", onTwo}));
 }
 
-TEST_F(BrowserTest, RemovalsInQuickSuccessionCountOnce) {
+TEST_F(BrowserTest, RemovalsWithoutAResolveInBetweenCountOnce) {
   for (const auto& service : {onOne, onTwo, onThree})
     network.found(service);
   for (const auto& service : {onOne, onTwo, onThree})

@@ -60,7 +60,7 @@ class GNUstepPerson(Person):
         # Holds the mouse button down until the application has counted the press, for at most
         # `patience` seconds. If the button were released sooner, GNUstep could find it up when it
         # handles the press. The application cannot count a press inside an open menu, because the
-        # menu grabs the mouse. So the wait for such a press is short.
+        # menu grabs the mouse. So callers wait only briefly there.
         patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
         deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:

@@ -31,11 +31,12 @@ void begin(const Failure& failure);
 std::vector<std::string> end();
 
 /// Runs `work` again and again. In the first run, the first call fails; in the second run, the
-/// second; and so on until no call fails or the test has failed. Does this for each of `errors`,
-/// first with single failures, then with lasting failures (except for EINTR). Lasting failures also
-/// keep `work` from cleaning up, as if the process were killed. After each run, expects that no
-/// descriptor is left open, and calls `check` with the name of the first call that failed and the
-/// failure. The name is empty if no call failed. Returns the names of all calls.
+/// second call; and so on until a run has no call left to fail or the test has failed. Does this
+/// for each of `errors`, first with single failures, then with lasting failures (except for EINTR).
+/// Lasting failures also keep `work` from cleaning up, as if the process were killed. After each
+/// run, expects that no descriptor is left open, and calls `check` with the name of the first call
+/// that failed and the failure. The name is empty if no call failed. Returns the names of all
+/// calls.
 template <typename Work, typename Check>
 std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Work& work,
                                     const Check& check) {
@@ -46,7 +47,7 @@ std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Wor
   std::set<std::string> seen;
   for (const int error : errors) {
     for (const bool isLasting : {false, true}) {
-      if (isLasting && error == EINTR) continue;  // callers rightly repeat such a call for ever
+      if (isLasting && error == EINTR) continue;  // callers rightly repeat the call for ever
       std::string failed = "?";
       for (std::size_t number = 1; !failed.empty() && !testing::Test::HasFailure(); ++number) {
         const Failure failure{number, error, isLasting};

@@ -21,7 +21,7 @@ struct Store {
   Dictionary contents;
   std::string failing;  ///< the step that fails: "create", "key" or "copy"
   int error = 0;
-  DynamicStoreCallback callback;  ///< the latest callback
+  DynamicStoreCallback callback;  ///< the callback that was set last
   bool hasAddedNull = false;      ///< whether the source added last was null
 
   void change(Dictionary newContents) {

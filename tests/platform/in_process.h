@@ -10,7 +10,7 @@
 namespace onramp {
 
 /// Calls `action` in a child process and returns the child's wait status, which is 0 if `action`
-/// returned true. Stores the child's resource usage in `usage` unless `usage` is null.
+/// returned true. If `usage` is not null, stores the child's resource usage there.
 inline int inProcess(const std::function<bool()>& action, rusage* usage = nullptr) {
   const pid_t process = fork();
   if (process == 0) _exit(action() ? 0 : 1);

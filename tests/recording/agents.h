@@ -41,8 +41,8 @@ class Agents {
   std::size_t room = 0;            ///< the size of the program's reply buffer, in bytes
   std::vector<std::chrono::nanoseconds> waits;  ///< the time limit of every wait
 
-  /// Returns the next value of `address` in `answers`, and removes it unless it is the last one.
-  /// Returns kSilent when the address has no values.
+  /// Returns the next value of `address` in `answers`. Removes the value, except when it is the
+  /// last one. Returns kSilent when the address has no values.
   [[nodiscard]] int nextAnswer(const std::string& address);
 };
 

@@ -28,7 +28,7 @@ class MediumFolder {
     return root_ / "medium/" + relative;
   }
 
-  /// Write a file on the medium, and create its folder if that is missing.
+  /// Write a file on the medium. If the file's folder is missing, create it.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   /// Makes a file on the medium executable by its owner.
@@ -43,7 +43,7 @@ class MediumFolder {
   /// Adds a set-up tool to the medium. The tool records its arguments and exits with `status`.
   void addSetUpTool(int status) const;
 
-  /// Returns the arguments of the tool's last run, or an empty text when the tool has not run.
+  /// Returns the arguments of the tool's last run, or an empty string when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
   /// optionsFile() and modelFile() return the contents of the two files that the wizard writes for

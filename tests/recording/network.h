@@ -17,7 +17,7 @@ class Network {
   /// Restores the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
-  /// Makes a service like those that a browser passes to its client.
+  /// Makes a service such as a browser passes to its client.
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
                                              const std::string& domain = "local.");
 
@@ -48,7 +48,7 @@ class Network {
 };
 
 /// Return a socket address in the layout that NetService::addressing() describes. ipv6Address()
-/// returns that of the loopback interface.
+/// returns the address of the loopback interface.
 [[nodiscard]] Data ipv4Address(unsigned char a, unsigned char b, unsigned char c, unsigned char d);
 [[nodiscard]] Data ipv6Address();
 

@@ -15,7 +15,8 @@ TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
 NO_BINDINGS = SEVEN[:27] + b"\0"
 
 # The datagrams of the kinds that answer many times, each after its time in seconds since the
-# request. A search listens for 5 to 8 seconds, so it must miss the last datagram of "stutter".
+# request. A search listens for 5 to 8 seconds, so it must hear the datagram of "stutter" that comes
+# after 4.5 seconds, and miss the last one.
 REPLIES = {
     "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)),
                 (0, TEXT), (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN),

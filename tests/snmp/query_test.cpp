@@ -43,7 +43,7 @@ class Query : public testing::Test {
 };
 
 // Queries `address` and returns the results as text: the keys and numbers, or "nothing"; "no reply"
-// if that flag is set; the error status; and the error index.
+// if `out_no_reply` is set; the error status; and the error index.
 std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
   bool noReply = false;
   std::int32_t status = -1;
@@ -185,7 +185,7 @@ class GetSet : public testing::Test {
  protected:
   void SetUp() override {
     agents.reset();
-    // The agent sends the request back unless the test sets `reply`.
+    // If the test does not set `reply`, the agent sends the request back.
     agents.reply = [this](const Agents::Bytes& request) {
       sent = request;
       return reply.empty() ? request : reply;

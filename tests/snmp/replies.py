@@ -1,4 +1,4 @@
-"""Makes SNMPv1 replies like those of devices."""
+"""Makes SNMPv1 replies as devices send them."""
 
 _ACTIVE_IF = bytes.fromhex("06 0f 2b 06 01 04 01 a1 12 02 04 04 89 58 01 02 00")
 

@@ -1,6 +1,6 @@
 // Uses each input as an agent's reply to a query, a get and a set. The caller's storage has no
-// spare room, so the sanitizers report a write past its end. If the input can be decoded, also
-// encodes the result and decodes it again, unless one of its values or names does not allow that.
+// spare room, so the sanitizers report a write past its end. If the input can be decoded and the
+// encoder supports all its names and values, also encodes the result and decodes it again.
 
 #include <algorithm>
 #include <array>
@@ -58,7 +58,7 @@ void exchangeStrings(bool set) {
 }
 
 // Returns whether the decoder can read `binding` after the encoder has written it. The decoder
-// cannot read a value of an unknown type, because the encoder leaves it out. It also cannot read
+// cannot read a value of an unknown type, because the encoder leaves it out. Nor can it read
 // unsigned numbers of 2^31 or more, because they take 5 bytes.
 bool isReadable(const snmp_varbind& binding) {
   const std::uint64_t type = binding.type;

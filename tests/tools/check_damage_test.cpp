@@ -113,16 +113,16 @@ std::string startOfTheWizard() {
   return start;
 }
 
-// Returns the name of the first page that `report` predicts, or an empty text for no page. `start`,
-// the result of startOfTheWizard(), says whether the wizard refuses the system and so shows no
-// page.
+// Returns the name of the first page that `report` predicts, or an empty string for no page.
+// `start`, the result of startOfTheWizard(), says whether the wizard refuses the system and so
+// shows no page.
 std::string pageIn(const check::Report& report, const std::string& start) {
   if (start == " refused" || report.start == FirstPage::kNone) return "";
   return report.start == FirstPage::kModelList ? "ModelListView" : "ConnectionTypeView";
 }
 
 // Damages the medium 100 times, or as often as the environment variable ONRAMP_DAMAGES says.
-TEST(OnrampCheck, ReportsEveryDamageThatChangesTheStart) {
+TEST(OnrampCheck, ReportsAllDamageThatChangesTheStart) {
   const char* const wanted = std::getenv("ONRAMP_DAMAGES");
   const unsigned long count = wanted ? std::strtoul(wanted, nullptr, 10) : 100;
   const TemporaryFolder support;

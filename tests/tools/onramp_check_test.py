@@ -39,8 +39,8 @@ def run(*arguments, **options):
                           check=False, **options)
 
 
-# Most of the next functions return a breaker: a function that makes one mistake in a medium. Its
-# argument is the medium's folder.
+# Most of the functions below return a breaker: a function that makes one mistake in a medium. A
+# breaker's argument is the medium's folder.
 
 def edit(path, change, form=plistlib.FMT_XML):
     def breaker(folder):

@@ -132,7 +132,7 @@ class Everybody(unittest.TestCase):
         with open(pathlib.Path(MEDIUM, "MacResources", "CDInfo.plist"), "rb") as file:
             models = list(plistlib.load(file)["ContainedModel"])
         searches = [[model] for model in models] + [models]
-        for seconds in ("6", "40"):  # the second search is for a busy machine
+        for seconds in ("6", "40"):  # on a busy machine, the first search may miss a device
             explained = [start(*browse("-s", seconds, *(f"--model={model}" for model in wanted)))
                          for wanted in searches]
             shown = [start(PROBE, f"{MEDIUM}/Onramp OSX.app", seconds, *wanted) for wanted in searches]

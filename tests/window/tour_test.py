@@ -19,8 +19,8 @@ from media import model
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
 TOUR = pathlib.Path(__file__).resolve().parents[2] / "tools/tour"
-# These names have no space, but the wizard joins a device's maker and model with a space. So no device
-# matches these models, and the tour is the same with and without a network.
+# These names have no space, but the wizard joins a device's maker and model with a space. So no
+# device matches these models, and the network makes no difference to the tour.
 MODELS = {"Ä/1": model(usb=True, wireless=True), "a-1": model(wireless=True), "Cable": model(usb=True)}
 
 

@@ -162,7 +162,7 @@ class Walk:
 
 
 def take_walks(seeds):
-    """Takes one walk after another and returns whether all of them passed."""
+    """Takes walks one after another. Returns whether all of them passed."""
     network = PracticeNetwork()
     passed = True
     with Desktop() as desktop:

@@ -10,8 +10,8 @@ inline constexpr const char* kUsualName = "Onramp OSX.app";
 
 /// Returns the name of the application in `root`, the medium's top folder. If there are several,
 /// takes the first in alphabetical order whose name is kUsualName or whose Info.plist has
-/// "CommonResourcePath". Without such an application, takes the first of all. Returns an empty
-/// string when there is no application.
+/// "CommonResourcePath". If none of them qualifies, takes the first of all. Returns an empty string
+/// when there is no application.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
 }  // namespace onramp::check

@@ -21,7 +21,7 @@ void describeModels(const Lists& lists, Report& report);
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
 /// Checks that the wireless set-up tool exists and has a program and a name. If the tool's name
-/// contains the maker's name, checks that every translation of the tool's name does, too.
+/// contains the maker's name, checks that every translation of the tool's name also contains it.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
 /// Sets the members `identifier` and `platforms` of the report. Checks nothing.
@@ -32,8 +32,8 @@ void describeApplication(const MediumFiles& files, const Lists& lists);
 void checkApplication(const MediumFiles& files, const Lists& lists);
 
 /// Checks the values that the wizard passes to the network and to other programs: the service type,
-/// the vendor's name and the series code. Checks that the application declares the service type,
-/// unless the type itself is missing or wrong.
+/// the vendor's name and the series code. If the service type is valid, also checks that the
+/// application declares it.
 void checkIdentity(const Lists& lists, Report& report);
 
 /// Checks the texts of every language. Sets the report's member `languages`.

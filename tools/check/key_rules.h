@@ -21,8 +21,8 @@ struct KeyRule {
   std::string_view key;
   Kind kind;
   Need need;
-  const char* otherwise;     ///< the effect of an absent key and of a value of another kind
-  const char* meaning = "";  ///< says more about the expected value than its kind does
+  const char* otherwise;     ///< the effect if the key is absent or its value is of another kind
+  const char* meaning = "";  ///< describes the expected value more precisely than its kind
 };
 
 /// The location of a dictionary: its file, and the keys that lead to it from the outermost
@@ -44,7 +44,8 @@ enum class OtherKeys { kReported, kAllowed };
 void checkKeys(const Dictionary& dictionary, const DictionaryPlace& place,
                std::span<const KeyRule> rules, OtherKeys otherKeys, Report& report);
 
-/// Returns the value's kind in words. For a boolean, a number or a text, the value itself follows.
+/// Returns the value's kind in words. For a boolean, a number or a string, the value itself
+/// follows.
 [[nodiscard]] std::string described(const Value& value);
 
 }  // namespace onramp::check

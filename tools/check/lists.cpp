@@ -134,7 +134,7 @@ bool isPackageVersion(const std::string& key) {
   return !key.empty() && std::all_of(key.begin(), key.end(), isASCIIDigit);
 }
 
-// Returns `package` without the version keys that have no rule. checkPackages() reports such keys.
+// Returns `package` without the version keys that have no rule. checkPackages() reports these keys.
 Dictionary withoutOtherVersions(const Dictionary& package) {
   std::vector<Dictionary::Pair> pairs;
   for (const auto& pair : package) {

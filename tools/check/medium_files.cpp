@@ -57,7 +57,7 @@ std::string joined(const std::string& folder, const std::string& name) {
 bool isInside(const std::string& path, const std::string& root) {
   std::error_code error;
   const fs::path real = fs::canonical(path, error);
-  if (error) return true;  // there is no such file; exists() reports that
+  if (error) return true;  // there is no file; exists() reports that
   const fs::path realRoot = fs::canonical(root, error);
   return error || std::mismatch(realRoot.begin(), realRoot.end(), real.begin(), real.end()).first ==
                       realRoot.end();
@@ -68,8 +68,8 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
-// `nearest` is a name on the medium that resembles `missing`, if there is one. `isWritten` says
-// whether `missing` is written in a file on the medium, and not fixed in the wizard.
+// `nearest` is a name on the medium that resembles `missing`, if there is one. `isWritten` is true
+// if a file on the medium names `missing`, and false if the path is fixed in the wizard.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
                              bool isWritten) {
   if (!nearest)

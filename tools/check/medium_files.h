@@ -14,7 +14,7 @@ namespace onramp::check {
 
 /// The wizard's use of a file or folder. Findings about the file quote these texts.
 struct PathUse {
-  Place place{};         ///< where its path is written; no key if the path is fixed in the wizard
+  Place place{};  ///< where the path is written; without a key if the path is fixed in the wizard
   std::string what{};    ///< the file's role, such as "the medium description"
   std::string effect{};  ///< what users see when the file is missing or unusable
 };
@@ -54,8 +54,8 @@ class MediumFiles {
   /// folder cannot be read.
   [[nodiscard]] std::vector<std::string> names(const std::string& relative) const;
 
-  /// Removes each proposal to use another file in place of a missing one, if that file has been
-  /// found under its own name, because something else needs it. Call this after all the checks.
+  /// Removes each proposal to use an existing file in place of a missing one, if the existing file
+  /// turned out to be needed under its own name. Call this after all the checks.
   void withdrawUsedNames() const;
 
   /// Adds line numbers to the report's findings about keys of XML property lists, where the lines

@@ -163,8 +163,8 @@ class ModelCheck {
   }
 
   // Compares the maker, which is the first word of the model's name, with the first word of the
-  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but
-  // reports it once.
+  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but no
+  // spelling twice.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));

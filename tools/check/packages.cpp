@@ -48,7 +48,7 @@ Version boundOf(const Dictionary& bound) {
 }
 
 // Makes `version` the system's version. Returns the key under which the wizard then looks for the
-// package, or an empty text when there is none.
+// package, or an empty string when there is none.
 std::string versionKey(const Version& version) {
   setSystemVersion(std::to_string(version[0]) + "." + std::to_string(version[1]) + "." +
                    std::to_string(version[2]));
@@ -152,9 +152,9 @@ class PackageCheck {
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }
 
-  // Warns when the maximum's "BugFix" is a number, because the wizard refuses the release that such
-  // a maximum names. Does not warn when that release is the first of a major version, because this
-  // is the usual way to exclude the whole version.
+  // Warns when the maximum's "BugFix" is a number, because the wizard refuses the release with that
+  // number. Does not warn when that release is the first of a major version, because this is the
+  // usual way to exclude the whole version.
   void checkNamedMaximum() {
     const Dictionary& maximum = info_.supportSystemMax();
     const auto text = maximum.string("BugFix");
@@ -193,7 +193,7 @@ class PackageCheck {
   }
 
   // Returns the package that the wizard opens on `version`, as a path from the medium's top folder.
-  // Returns an empty text when there is none.
+  // Returns an empty string when no package opens.
   [[nodiscard]] std::string packageFor(const Version& version) {
     usedKeys_.insert(versionKey(version));
     info_.loadPkgURL(lists_.resources);

@@ -10,7 +10,7 @@ namespace onramp::check {
 
 namespace {
 
-constexpr double kTitleSize = 17 * 1.06;  // 17 points, and 6 % more because the letters are bold
+constexpr double kTitleSize = 17 * 1.06;  // 17 points, plus 6 % because the letters are bold
 constexpr double kPage = 616;
 constexpr double kButton = 84;
 constexpr double kHeader = 11;
@@ -88,7 +88,7 @@ struct Range {
   char32_t last;
 };
 
-// Ranges of characters most of which are as wide as they are high.
+// Ranges of characters that are mostly as wide as they are high.
 constexpr std::array kSquare{
     Range{0x1100, 0x115F}, Range{0x2E80, 0xA4CF},   Range{0xAC00, 0xD7A3},
     Range{0xF900, 0xFAFF}, Range{0xFE30, 0xFE4F},   Range{0xFF00, 0xFF60},

@@ -211,7 +211,7 @@ class TextCheck {
   }
 
   // Reports each table that equals the English table or the table of a language before it. A new
-  // language usually begins as a copy, and may be left so by mistake.
+  // language usually begins as a copy, and may remain untranslated by mistake.
   void checkTranslations() {
     for (const auto& table : tables_) {
       const std::string code = Language::parse(table.first).code;

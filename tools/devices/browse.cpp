@@ -84,7 +84,7 @@ void Session::changed(Device& device) {
   }
 }
 
-// Asks a device unless its record is unchanged since it was last asked. The wizard does the same.
+// Asks a device, but not again while its record is unchanged. The wizard does the same.
 void Session::ask(Device& device) {
   Dictionary& asked = asked_[&device];
   if (asked == device.record) return;
@@ -156,7 +156,7 @@ int Session::run() {
     progress_.print(jsonOf(all));
     return status;
   }
-  // Shows the verdict on each device that has no row yet, and on each that is gone.
+  // Shows the verdict on each device that has no row yet, and on each device that is gone.
   for (const JudgedDevice& one : all.devices)
     show(*one.device);
   progress_.print(summaryOf(all, style_));

@@ -11,8 +11,8 @@ namespace onramp::devices {
 /// 0 if the delay is shorter than a second.
 struct Delay {
   double seconds = 0;       ///< how long the wizard's window does not respond
-  std::size_t delayed = 0;  ///< how many listed devices appear later because of it
-  std::size_t hidden = 0;   ///< how many of those the wizard's search misses
+  std::size_t delayed = 0;  ///< how many listed devices appear later because of this delay
+  std::size_t hidden = 0;   ///< how many of these devices the wizard's search misses
 };
 
 /// A device, and the verdict on it.

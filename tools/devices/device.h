@@ -17,14 +17,14 @@ struct Device {
   std::string name;
   std::string domain;
   std::string type;                ///< the type of the service whose addresses are used
-  std::vector<std::string> types;  ///< the types of all its announced services
+  std::vector<std::string> types;  ///< the types of all services that the device announces
   double found = 0;
   std::optional<double> resolved;
   std::optional<double> gone;
   Dictionary record;                ///< a KSDevice record; empty until the first resolve
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
-  std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"; empty on macOS
+  std::set<std::string> sightings;  ///< places where it is seen: "eth0 IPv4"; empty on macOS
   std::optional<Answer> answer;     ///< nothing until askDevice() has returned
 };
 

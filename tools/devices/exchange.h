@@ -39,7 +39,7 @@ struct Exchange {
 
 /// The result of asking one device.
 struct Answer {
-  bool isWireless = false;  ///< as the wizard decides
+  bool isWireless = false;  ///< by the wizard's rules
   bool isComplete = false;  ///< false when askDevice() was stopped before the end
   double seconds = 0;       ///< how long the wizard's window would not respond
   std::vector<Exchange> exchanges;
@@ -50,9 +50,9 @@ struct Answer {
   [[nodiscard]] const Exchange* telling() const;
 };
 
-/// Asks the device at `addresses`, an array of strings, as often and in the same order as the
-/// wizard does. Blocks for about 12 seconds for each silent address, or until `stopped` is set.
-/// Does not change active_interface_table. May be called on any thread.
+/// Asks the device at `addresses`, an array of strings, with the same requests in the same order as
+/// the wizard. Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does
+/// not change active_interface_table. May be called on any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 
 /// Returns the name of an error status (RFC 1157 section 4.1.1), such as "noSuchName", or "error

@@ -12,8 +12,8 @@ namespace onramp::devices {
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
 /// Returns whether local_address_for_destination() finds a subnet of this computer that contains
-/// `address`, a dotted IPv4 text. Returns false before AddNetworkInterfaceListChangeCallbackSCF()
-/// has been called.
+/// `address`, an IPv4 address in dotted form. Returns false before
+/// AddNetworkInterfaceListChangeCallbackSCF() has been called.
 [[nodiscard]] bool isInLocalSubnet(const std::string& address);
 
 }  // namespace onramp::devices

@@ -30,7 +30,7 @@ class Questions {
   /// Stops asking for good. The answer of each device that is being asked is then incomplete.
   void stop() { *stopped_ = true; }
 
-  /// Returns the number of devices whose `answered` has not been called yet.
+  /// Returns the number of devices for which `answered` has not been called yet.
   [[nodiscard]] std::size_t pending() const { return *pending_; }
 
  private:

@@ -10,7 +10,8 @@ _TRADITIONAL_CHINESE = ("zh_hant", "zh_tw", "zh_hk", "zh_mo")
 
 
 class Texts(dict):
-    """Texts by their keys. A key without a text is its own text, as in the wizard."""
+    """A dictionary of texts by their keys. As in the wizard, the text of an unknown key is the key
+    itself."""
 
     def __missing__(self, key):
         return key

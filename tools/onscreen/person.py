@@ -246,7 +246,7 @@ class Person:
         return match[0] if match else None
 
     def _visit(self, control, visit, tables=True):
-        """Calls `visit` for `control` and all visible controls below it, depth first, until a call
+        """Calls `visit` for `control` and all visible controls inside it, depth first, until a call
         returns False. Does not call `visit` for the application itself.
 
         Skips controls that disappear. Enters tables only if `tables` is true. Returns False if a call

@@ -47,17 +47,19 @@ class PracticeNetwork:
         self._ask("rename", name, new_name)
 
     def set(self, name, **entries):
-        """Changes `entries` of a device. Avahi announces a new text or address as an update. For a
-        new name, type, domain or port, it withdraws the services and publishes them again."""
+        """Changes `entries` of a device. Avahi announces a new TXT entry or address as an update.
+        For a new name, type, domain or port, Avahi withdraws the services and publishes them
+        again."""
         self._ask("set", name, entries)
 
     def list(self):
-        """Returns a list with a dictionary for each device, which has the device's entries and its
-        "state", such as "established"."""
+        """Returns a list of dictionaries, one for each device. Each has the device's entries and
+        its "state", such as "established"."""
         return self._ask("list")
 
     def unplug(self, interface):
-        """Takes an interface down for the devices and for the command. plug() brings it back."""
+        """Takes an interface down, both for the devices and for the command that practice-network
+        runs. plug() brings it back."""
         self._ask("unplug", interface)
 
     def plug(self, interface):

@@ -14,8 +14,8 @@ from practice_network.publisher import Publisher, PublishError
 
 
 class Network:
-    """All known devices. A device is published, and its agents run, while it is present, that is,
-    switched on."""
+    """All known devices. While a device is present, that is, switched on, it is published and its
+    agents run."""
 
     def __init__(self, host, subnet):
         self._host = host
@@ -28,7 +28,7 @@ class Network:
         self._host_names = collections.defaultdict(lambda: f"device-{next(numbers)}.local")
 
     def load(self, devices):
-        """Makes `devices` the known devices, and publishes those that are present."""
+        """Makes `devices` the known devices, and publishes the devices that are present."""
         self._devices = {device.name: device for device in devices}
         # Devices with fixed addresses come first, so that other devices do not get these addresses.
         for device in sorted(devices, key=lambda one: isinstance(one.addresses, int)):

@@ -22,8 +22,8 @@ GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 
 
 
 class PublishError(Exception):
-    """Raised when Avahi does not start, and when it does not publish a device in time. The text
-    says which."""
+    """Raised when Avahi does not start, and when it does not publish a device within a time limit.
+    The text says which of these happened."""
 
 
 def connect(bus_address, seconds=10):
@@ -76,7 +76,7 @@ class Publisher:
         entry.services.Commit()
 
     def publish_addresses(self, device):
-        """Replaces the published addresses by those in `device`."""
+        """Replaces the published addresses with those in `device`."""
         entry = self._entries[device.name]
         entry.addresses.Reset()
         for address in map(ipaddress.ip_address, device.addresses):
@@ -87,7 +87,7 @@ class Publisher:
         entry.addresses.Commit()
 
     def publish_txt(self, device):
-        """Replaces the published TXT records by those of `device`."""
+        """Replaces the published TXT records with those of `device`."""
         services = self._entries[device.name].services
         for service_type in device.type:
             services.UpdateServiceTxt(ANY_INTERFACE, ANY_PROTOCOL, NO_FLAGS, device.name,

@@ -1,4 +1,4 @@
-"""The pictures of one language, in sections, with what the tour has to say about them."""
+"""The pictures of one language, in sections, with the tour's notes and problems."""
 
 import pathlib
 import re

@@ -19,7 +19,7 @@ class Unsuitable(Exception):
 
 @dataclasses.dataclass(frozen=True)
 class Model:
-    """A model with the connections that its users get."""
+    """A model, and its connections as the medium gives them."""
 
     name: str
     usb: bool
@@ -60,7 +60,7 @@ class Facts:
         return [model.name for model in self.models]
 
     def kinds(self):
-        """Returns one model for each combination of connections, if possible one whose name a
+        """Returns one model for each combination of connections. Prefers a model whose name a
         device can announce: a maker, a space and a model."""
         chosen = {}
         for model in self.models:

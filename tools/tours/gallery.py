@@ -150,7 +150,7 @@ class Gallery:
             self._let_devices_answer(_WIRELESS)
 
     def _search(self, person):
-        """Searches until devices are listed. On a busy machine, the first search may be in vain."""
+        """Searches until devices are listed. On a busy machine, the first search may find none."""
         title = self._text["INST_TXT_DEVLIST"]
         for _ in range(_SEARCHES):
             person.press("Return")

@@ -1,11 +1,11 @@
-"""The wireless way of the tour, on a network of made-up devices."""
+"""The wireless part of the tour, on a network of made-up devices."""
 
 from onscreen.processes import wait_for
 from practice_network.names import shortened
 
 from .visit import CONNECTION, DEVICES, GEAR_REFRESH, WentWrong
 
-_SEARCHES = 3  # on a busy machine, the first search may be in vain
+_SEARCHES = 3  # on a busy machine, the first search may find nothing
 _LONGEST_SEARCH = 75  # seconds; the wizard pauses for at most 15, but the machine may be busy
 
 
@@ -55,8 +55,8 @@ def matches_devices(model):
 
 
 def find_devices(visit, medium, step=None):
-    """Searches from the connection page until devices are listed. Raises WentWrong if none are. If
-    `step` is set, it names a picture of the first search."""
+    """Searches from the connection page until devices are listed. Raises WentWrong if no device
+    appears. If `step` is set, it names a picture of the first search."""
     for number in range(_SEARCHES):
         visit.next()
         wait_for(lambda: visit.person.sees("progress bar"), 20, "the search to begin")
@@ -84,7 +84,8 @@ def _can_connect(visit):
 
 
 def search_in_vain(visit, devices, gear):
-    """Shows the menu of the device list, a search in vain, and a search that finds devices."""
+    """Shows the menu of the device list, a search that finds nothing, and a search that finds
+    devices."""
     person = visit.person
     devices.leave()
     person.open_menu(gear)

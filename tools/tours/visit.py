@@ -10,8 +10,8 @@ from .person import Person
 
 GEAR_REFRESH = 2
 MODELS, CONNECTION, DEVICES, ALERT = "model list", "connection page", "device list", "alert"
-# The roles by which a page is recognised, whatever its texts are. The page has a control of one of
-# these roles, and no other page has one.
+# The roles by which a page is recognised in any language. The page has a control with one of these
+# roles, and no other page has one.
 _ROLES = {MODELS: ("list",), CONNECTION: ("radio button",), DEVICES: ("tree", "tree table", "table"),
           ALERT: ("alert",)}
 _TITLES = {MODELS: "INST_TXT_MODEL", CONNECTION: "INST_TXT_CONNECTIONTYPE",
@@ -87,7 +87,8 @@ class Visit:
         self._album.picture(self.person, step, caption)
 
     def first_page(self):
-        """Waits for the first page and returns which it is; None if the wizard ended without one."""
+        """Waits for the first page and returns its name, or None if the wizard ended without a
+        page."""
         def shown():
             if not self.person.is_running():
                 return "none"
