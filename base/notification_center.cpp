@@ -27,7 +27,7 @@ void NotificationCenter::post(const Notification& notification) {
     const auto found = std::find_if(observations_.begin(), observations_.end(),
                                     [&](const Observation& o) { return o.id == id; });
     if (found == observations_.end()) continue;
-    const Handler handler = found->handler;  // a copy: a handler may remove its own observer
+    const Handler handler = found->handler;  // a copy; a handler may remove its own observer
     handler(notification);
   }
 }

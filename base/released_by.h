@@ -2,7 +2,7 @@
 
 namespace onramp {
 
-/// A deleter for std::unique_ptr that frees an object of a C library by calling `release`.
+/// A deleter for std::unique_ptr. Frees an object of a C library by calling `release`.
 template <auto release>
 struct ReleasedBy {
   template <typename Object>

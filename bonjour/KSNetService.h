@@ -103,14 +103,14 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 [[nodiscard]] bool KSNetServiceSupportsURF(const NetServiceRef& service);
 
 /// The client function of every browser. `info` is null or points to a ServiceClientCallbacks.
-/// Calls its `add` or `remove`, or neither if `error` reports a failure.
+/// Calls the `add` or `remove` of `info`, or neither if `error` reports a failure.
 void KSNetServiceBrowseCallBack(const NetServiceBrowserRef& browser, unsigned long flags,
                                 const NetServiceRef& service, const NetServiceError& error,
                                 void* info);
 
 /// The client function of every asynchronous resolve. `info` is null or points to a
-/// ServiceClientCallbacks. Calls its `resolved` after a success. Starts the resolve again after a
-/// failure.
+/// ServiceClientCallbacks. After a success, calls the `resolved` of `info`. After a failure, starts
+/// the resolve again.
 void KSNetServiceResolveCallBack(const NetServiceRef& service, const NetServiceError& error,
                                  void* info);
 

@@ -29,10 +29,10 @@ class KSInstallerInfo {
   KSInstallerInfo();
 
   /// Sets all values from the medium resource dictionary `common`. When `common` is nothing, sets
-  /// them to their defaults.
+  /// all values to their defaults.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
-  // The three steps of setCDCommonInfoValue().
+  // setCDCommonInfoValue() calls these three functions.
   void loadPkgURL(const std::optional<Dictionary>& common);
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);
@@ -48,8 +48,9 @@ class KSInstallerInfo {
   [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
 
   /// The bounds of the supported system versions. system_range.h defines how they are compared.
-  /// Each is a dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A key
-  /// that the medium omits counts as 0. A "Major" of 0, the default, means that there is no bound.
+  /// Each bound is a dictionary with "Major", "Minor" and "BugFix", which are strings or numbers. A
+  /// key that the medium omits counts as 0. A "Major" of 0, the default, means that there is no
+  /// bound.
   [[nodiscard]] const Dictionary& supportSystemMin() const { return mSystemMin; }
   [[nodiscard]] const Dictionary& supportSystemMax() const { return mSystemMax; }
 

@@ -10,7 +10,7 @@
 namespace onramp {
 
 /// Fills the cache if it is empty. From then on, until the process ends, replaces the cached list
-/// whenever an interface's IPv4 configuration changes. Does not report failures, which leave the
+/// whenever an interface's IPv4 configuration changes. Failures are not reported; they leave the
 /// cache empty or out of date.
 void AddNetworkInterfaceListChangeCallbackSCF();
 

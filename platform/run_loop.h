@@ -13,7 +13,7 @@ namespace onramp {
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action);
 
 /// Runs `action` once on the main thread, even while a modal window is shown. Actions never run
-/// inside this function. They run in the order of the calls, unless abortModal() delays them. If
+/// inside this function. They run in the order of the calls, but abortModal() can delay them. If
 /// the application terminates, `action` may never run. Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 

@@ -16,7 +16,7 @@ struct Termination {
   bool begun = false;
 };
 
-// Returns the only Termination object. It is never destroyed, because a thread may still be
+// Returns the only Termination object. The object is never destroyed, because a thread may still be
 // sleeping while the process exits.
 Termination& termination() {
   static Termination* const instance = std::make_unique<Termination>().release();

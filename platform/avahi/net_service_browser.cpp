@@ -56,7 +56,8 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   bool isScheduled_ = false;
   unsigned long search_ = 0;  ///< the search's number; events of earlier searches are ignored
   std::string type_;
-  /// The services that have been found. When one is gone, the client gets the same object again.
+  /// The services that have been found. When a service is gone, the client gets the same object as
+  /// when it was found.
   std::map<Instance, NetServiceRef> services_;
   std::shared_ptr<Daemon> daemon_;         ///< held while a search runs
   std::map<std::string, Browse> browses_;  ///< the searches, by domain

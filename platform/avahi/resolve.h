@@ -56,7 +56,7 @@ class Resolve {
   Daemon& daemon_;
   Instance instance_;
   Report report_;
-  Timer check_;  ///< runs after a change, once all messages have been read
+  Timer check_;  ///< runs after a change, when all waiting messages have been read
   Timer timeUp_;
   Timer graceForIPv4_;
   bool isGraceOver_ = false;

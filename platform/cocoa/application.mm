@@ -40,7 +40,7 @@
   return _delegate->applicationShouldTerminateAfterLastWindowClosed();
 }
 
-// Lets the user quit only if the window may close. Always quits after terminateApplication().
+// Lets the user quit only if the window may close. After terminateApplication(), always quits.
 - (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
   if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
   NSBeep();

@@ -11,7 +11,7 @@ namespace {
 constexpr CGFloat kUnlimited = 1e6;
 constexpr CGFloat kRoomBesideTitle = 10;
 constexpr CGFloat kButtonGap = -2;  // AppKit draws a push button smaller than its frame
-constexpr CGFloat kLeastGap = 8;    // between the views at the top and those at the bottom
+constexpr CGFloat kLeastGap = 8;    // between the views at the top and the views at the bottom
 constexpr CGFloat kScrollerRoom = 20;
 constexpr NSInteger kLeastRows = 6;
 

@@ -92,8 +92,9 @@ CGFloat leastNameWidth(NSCell* cell) {
 }
 
 // Makes every column except the first one at least as wide as its texts. The first column shows
-// names. It gets narrower if necessary, but keeps room for its title and for 24 letters. If the
-// table is still too narrow, makes the window wider. Does nothing if there is only one column.
+// names. If necessary, this column gets narrower, but it keeps room for its title and for 24
+// letters. If the table is still too narrow, makes the window wider. Does nothing if there is only
+// one column.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;

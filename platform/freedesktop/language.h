@@ -19,8 +19,8 @@ struct Language {
   [[nodiscard]] static Language parse(std::string_view identifier);
 };
 
-/// Returns the languages in which to look for a resource, spelled as in `offered`. They come in
-/// this order:
+/// Returns the languages in which to look for a resource, spelled as in `offered`. The languages
+/// come in this order:
 /// - the matches of the first language in `preferred` that has a match: first the match with the
 ///   same region, then one without a region, then those with other regions;
 /// - the matches of `development`;

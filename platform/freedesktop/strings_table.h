@@ -9,14 +9,14 @@
 
 namespace onramp {
 
-/// Returns the texts in the ".strings" file at `path`. The file may be a text in UTF-8 or UTF-16,
-/// or an XML or binary property list. Returns nothing when the file cannot be read, is malformed,
-/// or exceeds a limit in platform/property_list.h.
+/// Returns the texts in the ".strings" file at `path`. The file may be text in UTF-8 or UTF-16, or
+/// an XML or binary property list. Returns nothing when the file cannot be read, is malformed, or
+/// exceeds a limit in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> loadStringsTable(const std::string& path);
 
 /// Parses the content of a ".strings" file: pairs `"key" = "text";` in the grammar of old-style
 /// property lists, and comments. If a key has no text, the key is also the text. When a key occurs
-/// more than once, its last text counts. Returns nothing when the content violates the grammar or
+/// more than once, the last text is used. Returns nothing when the content violates the grammar or
 /// has more than kMostPropertyListObjects pairs. `problem` then gets the place and the reason.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);

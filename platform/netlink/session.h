@@ -66,8 +66,8 @@ struct DynamicStore {
   /// Calls `callback` with the keys in `notified` whose values have changed, if there are any.
   void tellChanges();
 
-  /// Makes `watch` call `changesArrived`, if both are set. Destroys `watch` and returns false when
-  /// the system provides no thread.
+  /// If `watch` and `changesArrived` are set, makes `watch` call `changesArrived`. Destroys `watch`
+  /// and returns false when the system provides no thread.
   bool startWatch();
 };
 

@@ -27,8 +27,8 @@ sockaddr_in socketAddress(const DatagramEndpoint& endpoint) {
   return address;
 }
 
-// Waits at most `timeout` for `event` or an error on the descriptor. A signal does not shorten the
-// wait. Returns false when the time is up or the wait fails.
+// Waits for `event` or an error on the descriptor, but at most for `timeout`. A signal does not
+// shorten the wait. Returns false when the time is up or the wait fails.
 bool waitFor(int descriptor, short event, std::chrono::nanoseconds timeout) {
   using std::chrono::steady_clock;
   const auto deadline = steady_clock::now() + timeout;

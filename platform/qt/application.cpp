@@ -80,7 +80,7 @@ bool asksForInformation(int argc, char** argv) {
 
 // Handles Qt's messages while the application object is created. Qt sends a fatal message if there
 // is no display, and would then abort the process. This function prints an error and exits instead.
-// Drops all other messages unless QT_DEBUG_PLUGINS is set.
+// Also drops all other messages, except when QT_DEBUG_PLUGINS is set.
 void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
   if (type == QtFatalMsg) {
     std::fprintf(stderr,

@@ -46,9 +46,9 @@ class ListWidget final : public FramedView<QListView> {
   TypeAhead typeAhead_;
 };
 
-/// A list with several columns. The first column gets the width that the other columns leave, but
-/// at least leastNameWidth(). Every other column is as wide as its contents. Once the user has
-/// dragged a column's edge, the widths are no longer adjusted.
+/// A list with several columns. The first column gets the rest of the width, but at least
+/// leastNameWidth(). Every other column is as wide as its contents. Once the user has dragged a
+/// column's edge, the widths are no longer adjusted.
 class ColumnsWidget final : public FramedView<QTreeView> {
   Q_OBJECT
 

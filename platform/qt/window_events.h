@@ -25,7 +25,7 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Beeps. If a spinner is visible, the title bar also shows the text beside the spinner until the
+  /// Beeps. If a spinner is visible, also shows the text beside it in the title bar until the
   /// spinner stops.
   void explainRefusal();
 

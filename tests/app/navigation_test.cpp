@@ -140,7 +140,7 @@ TEST_F(Navigation, TheSearchAfterTheToolFindsTheChosenModelsDevice) {
   expectPackageOpenedAndQuit();
 }
 
-TEST_F(Navigation, WithoutAModelListTheChooserLeadsBackToTheConnectionPage) {
+TEST_F(Navigation, WithoutAModelListBackOnTheChooserShowsTheConnectionPage) {
   describe({{"Kestrel Model 100", model(true, true, true)}});
   launch();
   const std::string shared = expectedConnectionPage("wiredLan.png", kUSBAndWired);

@@ -105,7 +105,7 @@ TEST_F(NetServiceTest, ManufacturerAndModelComeFromTheKeysOfTheServiceType) {
   }
 }
 
-TEST_F(NetServiceTest, UnusableTxtDataGivesNoValues) {
+TEST_F(NetServiceTest, UnusableTxtDataHasNoValues) {
   Data cutShort = txtData({"usb_MDL=Model 100", "note=here"});
   cutShort.pop_back();
   const Data notTexts = txtData({"usb_MDL=\xff", "note=\xc0\x80", "pdl"});
@@ -133,7 +133,7 @@ TEST_F(NetServiceTest, TheSystemVersionDeterminesTheURIScheme) {
   EXPECT_EQ(KSNetServiceCopyDeviceURI(nullptr), std::nullopt);
 }
 
-TEST_F(NetServiceTest, ADeviceURILeadsBackToItsDevice) {
+TEST_F(NetServiceTest, ADeviceURIIsResolvedToItsDevice) {
   for (const std::string name : {"50% off; #1 @ \"home\" <a>|b\\c^`{d}", "Büro 3. Stock", "_udp"}) {
     network.answers = {{name + "._pdl-datastream._tcp.local.", {ipv4Address(192, 0, 2, 7)}}};
     std::optional<std::vector<std::string>> addresses;
@@ -148,7 +148,7 @@ TEST_F(NetServiceTest, ADeviceURILeadsBackToItsDevice) {
             "dnssd://%28%29%3B%3A%40%26%3D%2B%2C%2F%3F!*'$~%23%5B%5D.t.d.");
 }
 
-TEST_F(NetServiceTest, AURIThatLeadsToNoDeviceGivesNoAddresses) {
+TEST_F(NetServiceTest, AURIThatNamesNoDeviceHasNoAddresses) {
   network.answers = {{"Kestrel._ipp._tcp.local.", {ipv6Address()}}};
   std::optional<std::vector<std::string>> addresses;
   for (const char* uri :

@@ -91,7 +91,7 @@ class Reader {
   }
 
   // Adds the state "cut off" if the text of `cell` does not fit into `room`. Skips texts in panels,
-  // because GNUstep itself lays panels out.
+  // because GNUstep, not the wizard, lays out panels.
   void checkRoom(NSCell* cell, NSRect room, NSMutableArray* states) {
     const NSSize needed = [cell cellSizeForBounds:NSMakeRect(0, 0, NSWidth(room), kUnlimited)];
     const bool fits = needed.width <= NSWidth(room) && needed.height <= NSHeight(room);

@@ -69,7 +69,7 @@ TEST(ModelRecord, IsReadFromTheModelInformation) {
   EXPECT_EQ(KSOROSXModel::initWithName(std::nullopt, info), Dictionary());
 }
 
-TEST(InstallerInformation, PicksThePackageForTheRunningSystem) {
+TEST(InstallerInformation, ChoosesThePackageForTheRunningSystem) {
   const Dictionary byVersion{{"PkgLocation", "Packages/"},
                              {"104", "4"},
                              {"105", "5"},

@@ -144,7 +144,7 @@ TEST_F(Netconfig, FailuresEmptyTheCacheAndOnlyTheListReportsThem) {
   EXPECT_TRUE(store.hasAddedNull);
 }
 
-TEST_F(Netconfig, DestinationIsReachedFromTheFirstInterfaceInItsSubnet) {
+TEST_F(Netconfig, LocalAddressIsThatOfTheFirstInterfaceInTheDestinationsSubnet) {
   const Dictionary home = state("192.168.1.5", "255.255.255.0");
   const Dictionary wide = state("192.168.0.1", "255.255.0.0");
   const Dictionary maskless = {{"Addresses", Array{"192.168.7.1"}}};

@@ -122,7 +122,8 @@ TEST_F(Chooser, TheFirstAddressThatAnswersEveryRequestDecides) {
       {{{kSilent}, {kWired}, {kWireless}}, {6, 1, 0}, false},
       {{{kSilent}, {kSilent}, {kWireless}}, {6, 6, 1}, true},
       // An address that leaves any request unanswered is tried three times, even if it answers
-      // later requests. If every address does so, the last try of the last address decides.
+      // later requests. If every address leaves requests unanswered, the last try of the last
+      // address decides.
       {{{kSilent, kWireless}}, {4}, true},
       {{{kSilent, kWireless}, {kWired}}, {4, 1}, false},
       {{{kSilent, kWireless}, {kSilent}}, {4, 6}, false},

@@ -106,7 +106,7 @@ TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   EXPECT_FALSE(hasChildren());
 }
 
-TEST(Desktop, OpensNothingWithoutAnOpener) {
+TEST(Desktop, OpensNothingIfXdgOpenCannotBeRun) {
   recording::MediumFolder medium;
   medium.write("bin/xdg-open", std::string("not executable"));
   for (const std::string& path : {medium.path("bin") + ":", std::string()}) {

@@ -45,8 +45,8 @@ std::string dictionaryOver(std::size_t count,
   return binary(objects);
 }
 
-// Returns a binary list of `depth` nested arrays. Each array contains the next array `times` times.
-// The last array contains a text `times` times.
+// Returns a binary list of `depth` nested arrays. Each array contains the next one `times` times.
+// The innermost array contains a string `times` times.
 std::string arrays(std::size_t depth, std::size_t times) {
   return dictionaryOver(depth + 1, [&](std::size_t i) {
     return i == depth + 2 ? std::string("\x51t")

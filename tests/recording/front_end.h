@@ -61,8 +61,8 @@ class FrontEnd {
   /// Restores the state of a new process, but keeps the objects of pages that still exist.
   void reset();
 
-  /// Launches the application for `delegate` as the platform does, up to the point where it waits
-  /// for the user. The delegate must exist until the next reset().
+  /// Launches the application for `delegate` as a real front end does, up to the point where it
+  /// waits for the user. The delegate must exist until the next reset().
   void launch(ApplicationDelegate& delegate);
 
   /// Returns the most recently loaded object with that name. Aborts the process when there is none.

@@ -9,7 +9,7 @@
 namespace onramp::recording {
 
 /// A scripted network. A test reports services as found, resolved and gone, and sees what the
-/// program asked for. The program gets each event at once, as if from the main loop.
+/// program asked for. The program gets each event at once, as if the main loop had delivered it.
 class Network {
  public:
   static Network& instance();

@@ -129,7 +129,7 @@ class InterfaceFiles(unittest.TestCase):
                 columns = set() if page == "ConnectionTypeView" else wanted_columns(page)
                 self.assertEqual(columns, file.columns, f"{made.__name__} {page}")
 
-    def test_every_button_performs_its_action_and_shows_its_title(self):
+    def test_every_button_has_its_action_and_its_title(self):
         buttons = {name for name, kind in wanted_outlets("MainMenu").items() if kind == "Button"}
         actions = {name: f"{name}Clicked" for name in buttons}
         titles = {name: f"{name}Title" for name in (*buttons, "window")}

@@ -30,8 +30,8 @@ inline std::vector<std::uint8_t> realReply() {
 }
 
 /// Returns the bytes of a reply to request 7. `bindings` is the hexadecimal text of the reply's
-/// bindings, at most 255 bytes. The reply declares some lengths as 0, but the decoder ignores
-/// those.
+/// bindings, at most 255 bytes. The reply declares some lengths as 0, but the decoder ignores these
+/// lengths.
 inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8_t errorStatus = 0,
                                            std::uint8_t errorIndex = 0) {
   const auto list = hex(bindings);

@@ -69,7 +69,7 @@ def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, second
 
 
 # Each row has the function that answers (None for a closed port), the outcome and value that
-# onramp-devices reports, and a text that snmpget prints.
+# onramp-devices reports, and a part of what snmpget prints.
 REPLIES = [
     *((reply(tlv(2, bytes((n & 255,)))), "value", n, f"INTEGER: {n}") for n in (2, 1, -1)),
     *((reply(value), "other-type", None, text) for value, text in (

@@ -39,7 +39,7 @@ class Ways(WayTest):
         person = self.start({"Cable": model(usb=True, wired=True)})
         self.assert_installer_opened(person, None)
 
-    def test_the_escape_key_the_close_button_and_cancel_each_quit(self):
+    def test_escape_and_the_close_button_and_cancel_all_quit(self):
         for leave in (lambda p: p.press("Escape"), lambda p: p.close_window(),
                       lambda p: p.click("push button", TEXT["BTN_CANCEL"])):
             with self.subTest(leave=leave):

@@ -43,9 +43,9 @@ struct Lists {
   [[nodiscard]] bool anyWireless() const;
 };
 
-/// Reads the lists, except those whose paths are unknown. Adds to files.report() why a list cannot
-/// be read, and mistakes in the lists' keys and in the kinds of their values. If the medium has no
-/// application, reads the resource dictionary at its usual path.
+/// Reads the lists whose paths are known. Reports to files.report() why a list cannot be read, and
+/// which keys are wrong or have values of the wrong kind. If the medium has no application, reads
+/// the resource dictionary at its usual path.
 [[nodiscard]] Lists readLists(const MediumFiles& files);
 
 }  // namespace onramp::check

@@ -42,7 +42,8 @@ std::string textUnder(const Device& device, std::string_view key) {
   return text ? text->value(key).value_or("") : "";
 }
 
-// Returns the first of `keys` except `wanted` under which the device announces a text, or nothing.
+// Returns the first of `keys`, other than `wanted`, under which the device announces a string, or
+// nothing.
 std::optional<std::string_view> otherKey(const Device& device, std::string_view wanted,
                                          std::span<const std::string_view> keys) {
   for (const std::string_view key : keys) {

@@ -11,7 +11,7 @@ namespace onramp::devices {
 /// printable text becomes "\xNN", where NN is its value in hexadecimal.
 [[nodiscard]] std::string inQuotes(std::string_view name);
 
-/// Returns a duration, given in seconds, as text such as "0.4 ms" or "12.1 s".
+/// Returns a duration, given in seconds, as a string such as "0.4 ms" or "12.1 s".
 [[nodiscard]] std::string durationText(double seconds);
 
 }  // namespace onramp::devices

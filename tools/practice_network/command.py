@@ -192,7 +192,7 @@ def _steer(request):
 
 def _entry(text):
     """Returns the key and the value of KEY=VALUE. The value is written as in a description file,
-    except that a text needs no quotes."""
+    except that a string needs no quotes."""
     key, equals, value = text.partition("=")
     if not equals:
         raise ControlError(f'"{text}": write an entry as KEY=VALUE')

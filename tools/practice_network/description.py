@@ -135,7 +135,7 @@ def change(before, table, place):
 
 def _read(table, readers, place):
     """Returns the checked and converted values of `table`. For each key, `readers` has a function
-    that checks and converts a value, and a text that describes valid values."""
+    that checks and converts a value, and a description of the valid values."""
     values = {}
     for key, value in table.items():
         if key not in readers:

@@ -17,7 +17,7 @@ _FAILED_BEFORE = "The tour leaves out the wireless way, because it went wrong wi
 class Tour:
     """Takes pictures for `album`. `network` is a practice network without devices, or None.
 
-    Each start of the wizard gets `options`.
+    `options` are passed to the wizard at each start.
     """
 
     def __init__(self, desktop, medium, album, network, options=()):
@@ -45,7 +45,7 @@ class Tour:
     def _visit(self, *options):
         return Visit(self._desktop, self._medium, self._album, [*self._options, *options])
 
-    # The menu, on whatever page comes first.
+    # The menu, shown on the first page.
 
     _first = None
 

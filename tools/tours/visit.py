@@ -171,7 +171,8 @@ class Visit:
         return [path.removeprefix(f"{self._medium.folder}/") for path in self._desktop.opened()]
 
     def _files(self):
-        """Returns the files that the wizard wrote for the package, those for all users first."""
+        """Returns the files that the wizard wrote for the package. The files for all users come
+        first."""
         return sorted(self._desktop.local_folder.rglob("*.plist")) + sorted(
             self._desktop.user_folder.rglob("*.plist"))
 
