@@ -132,6 +132,7 @@ MISTAKES = [
     (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
     (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
     (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "out of the medium"),
+    (put(COMMON, "CDInfo", __file__), "path-outside", "from the medium's top"),
     (put(COMMON, "Comment", "x"), "key-unknown", "does not read"),
     (take(COMMON, "PkgInfo"), "key-missing", "PkgInfo", "nothing opens"),
     (put(COMMON, "SystemMin", "10.6"), "value-kind", 'the string "10.6"', "a dictionary"),
@@ -175,15 +176,20 @@ MISTAKES = [
     (maximum("10", "15", "7"), "range-excludes-maximum", "10.15.7 itself is refused",
      "10.6.0 up to, but not including, 10.15.7"),
     (maximum("10", "5", "x"), "range-empty", "every system is refused"),
+    (maximum("14", "0", "x"), "range-stops-at-minor", "14.1 is refused", "write 15, 0, 0"),
+    (maximum("14", "x", "x"), "version-number", "write 15, 0, 0"),
     (maximum("10", "16", "last"), "version-number", '"last"', '"x"'),
     (maximum("10", "14", "x"), "range-before-application", "10.15 and later"),
     # The set-up tool.
     (remove(PROGRAM_OF_TOOL), "program-missing", "Contents/MacOS/Kestrel Wireless Setup"),
     (lambda folder: os.chmod(folder / PROGRAM_OF_TOOL, 0o644), "program-not-executable", "chmod"),
+    (write(PROGRAM_OF_TOOL, b"#!/bin/sh\r\n"), "program-line-ends", "carriage return"),
     (take(f"{TOOL}/Info.plist", "CFBundleExecutable"), "program-unnamed", "CFBundleExecutable"),
     (take(f"{TOOL}/Info.plist", "CFBundleDisplayName"), "tool-unnamed", "menu"),
     (replace(f"{TOOL}/Resources/ja.lproj/InfoPlist.strings", "Kestrel", "Lumora"),
      "tool-name-left-over", "Lumora", "without \"Kestrel\""),
+    (replace(f"{TOOL}/Resources/ja.lproj/InfoPlist.strings", "CFBundleDisplayName", "CFBundleName"),
+     "tool-name-untranslated", "Kestrel Wireless Setup"),
     (remove(f"{TOOL}/Resources/ko.lproj"), "language-not-in-tool", "de, en, ja, zh_CN"),
     (take(COMMON, "WLANtool"), "tool-none", "no set-up tool runs"),
     (put(COMMON, "WLANtool", COMMON), "tool-no-bundle", ".app"),
@@ -191,7 +197,7 @@ MISTAKES = [
     (replace(ENGLISH, '"INST_TXT_WIFI" = "Wireless Network (Wi-Fi)";\n', ""),
      "text-missing", "INST_TXT_WIFI", "de, ja, ko, zh_CN"),
     (lambda folder: shutil.copy(folder / ENGLISH, folder / ENGLISH.replace("en.", "ja.")),
-     "texts-copied", 'the same texts as in "en"', "translate"),
+     "texts-copied", '31 texts that are the same in "en"', "translate"),
     (replace(ENGLISH, "INST_TXT_WIFI", "INST_TXT_WFI"), "text-misspelt", "INST_TXT_WIFI"),
     (replace(ENGLISH, "macOS %@", "%@ %@ %@"), "text-placeholders", "3 times", "once or twice"),
     (replace(ENGLISH, "No device was", "100 % no device was"), "text-percent", "macOS"),
@@ -208,6 +214,7 @@ MISTAKES = [
     (replace(ENGLISH, '"BTN_NEXT"', '"OTHER" = "x";\n"BTN_NEXT"'), "text-unknown", "not show"),
     (lambda folder: (folder / MESSAGES / "Resources/Klingonese.lproj").mkdir(),
      "language-unknown", "nobody sees"),
+    (lambda folder: (folder / MESSAGES / "Resources/jp.lproj").mkdir(), "language-unknown", "ja.lproj"),
     # Pictures.
     (remove(PICTURE), "path-missing", "no picture beside USB"),
     (remove(f"{APPLICATION}/Resources/Background@2x.png"), "path-missing", "blurred"),
@@ -288,7 +295,7 @@ class OnrampCheck(unittest.TestCase):
 
     def test_bad_arguments_fail_with_a_message(self):
         for arguments in (["/nowhere"], [], ["--jsn", "."], [__file__],
-                          [str(self.medium / "MacResources")], [str(self.medium / "Onramp OSX.app")]):
+                          [str(self.medium.parent)], [str(self.medium / "MacResources")], [str(self.medium / "Onramp OSX.app")]):
             result = run(*arguments)
             self.assertEqual((2, ""), (result.returncode, result.stdout))
             self.assertTrue(result.stderr)

@@ -20,8 +20,9 @@ void describeModels(const Lists& lists, Report& report);
 /// members `systems` and `packages`.
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
-/// Checks that the wireless set-up tool exists and has a program and a name. If the tool's name
-/// contains the maker's name, checks that every translation of the tool's name also contains it.
+/// Checks that the wireless set-up tool exists, has a program and a name, and translates the name
+/// in each of its languages. If the tool's name contains the maker's name, checks that every
+/// translation does, too.
 void checkTool(const MediumFiles& files, const Lists& lists);
 
 /// Sets the members `identifier` and `platforms` of the report. Checks nothing.

@@ -6,7 +6,6 @@
 #include <exception>
 #include <filesystem>
 #include <iostream>
-#include <optional>
 #include <string>
 #include <system_error>
 
@@ -31,19 +30,29 @@ Exit status: 1 when an error or, with --strict, a warning was found; 2 when the
 medium could not be read, the output could not be written or the command line is
 wrong; otherwise 0.)";
 
-// Returns the folder above `folder` if that is a medium of which `folder` is only a part. Otherwise
-// returns nothing.
-std::optional<std::string> mediumAround(const std::string& folder) {
-  namespace fs = std::filesystem;
+bool isMedium(const std::filesystem::path& folder) {
   std::error_code ignored;
-  const fs::path part = fs::canonical(folder, ignored);
-  const auto isMedium = [&](const fs::path& path) {
-    return fs::is_directory(path / "MacResources", ignored);
-  };
-  if (isMedium(part) || !check::findApplication(part.string()).empty() ||
-      !isMedium(part.parent_path()))
-    return std::nullopt;
-  return part.parent_path().string();
+  return std::filesystem::is_directory(folder / "MacResources", ignored) ||
+         !check::findApplication(folder.string()).empty();
+}
+
+// Returns why `folder` is not a medium, and what to give in its place. Returns an empty string if
+// it may be a medium.
+std::string reasonAgainst(const std::string& folder) {
+  namespace fs = std::filesystem;
+  std::error_code error;
+  const fs::path path = fs::canonical(folder, error);
+  if (isMedium(path)) return "";
+  if (fs::is_directory(path.parent_path() / "MacResources", error)) {
+    return "is only a part of a medium; give the whole medium, " +
+           check::quoted(path.parent_path().string());
+  }
+  fs::directory_iterator entry(path, error);
+  for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
+    if (isMedium(entry->path()))
+      return "contains a medium, but is not one; give " + check::quoted(entry->path().string());
+  }
+  return "contains neither an application nor MacResources; give the medium's folder";
 }
 
 // Returns `status` if standard output could be written. Otherwise prints a message and returns
@@ -93,10 +102,8 @@ int run(int count, char* arguments[]) {
               << " cannot be read: " << ignored.message() << '\n';
     return kUnreadable;
   }
-  if (const auto whole = mediumAround(medium)) {
-    std::cerr << "onramp-check: " << check::quoted(medium)
-              << " is only a part of a medium; give the whole medium, " << check::quoted(*whole)
-              << '\n';
+  if (const std::string reason = reasonAgainst(medium); !reason.empty()) {
+    std::cerr << "onramp-check: " << check::quoted(medium) << ' ' << reason << '\n';
     return kUnreadable;
   }
   const check::Report report = check::checkMedium(medium);

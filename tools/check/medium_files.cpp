@@ -63,6 +63,17 @@ bool isInside(const std::string& path, const std::string& root) {
                       realRoot.end();
 }
 
+// Returns the offset of the first byte of `bytes` that is not part of a character in UTF-8, or the
+// number of bytes if there is none.
+std::size_t malformedAt(const std::string& bytes) {
+  std::string_view rest = bytes;
+  while (!rest.empty()) {
+    const std::size_t left = rest.size();
+    if (!takeUTF8(rest)) return bytes.size() - left;
+  }
+  return bytes.size();
+}
+
 bool isXML(const std::string& text) {
   const std::size_t first = text.find_first_not_of(" \t\r\n");
   return first != std::string::npos && text[first] == '<';
@@ -96,6 +107,9 @@ void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   finding.found = problem.reason;
   if (text) {
     finding.place.line = lineOf(*text, problem.offset);
+  } else if (isStrings && !bytes.starts_with("bplist")) {
+    finding.place.line = lineOf(bytes, malformedAt(bytes));
+    finding.remedy = "save the file as UTF-8";
   } else {
     finding.place.byte = problem.offset;
   }
@@ -121,7 +135,10 @@ std::vector<std::string> MediumFiles::names(const std::string& relative) const {
 bool MediumFiles::exists(const std::string& relative, const PathUse& use) const {
   Finding finding{.id = "path-outside", .place = use.place, .effect = use.effect};
   const auto parts = components(relative);
-  if (!parts || !isInside(fullPath(relative), root_)) {
+  std::error_code ignored;
+  const bool isElsewhere = relative.starts_with('/') && fs::exists(relative, ignored) &&
+                           !fs::exists(fullPath(relative), ignored);
+  if (!parts || isElsewhere || !isInside(fullPath(relative), root_)) {
     finding.found = use.what + " at " + quoted(relative) + ", which leads out of the medium";
     finding.expected = "a path inside the medium";
     finding.remedy = "put the file on the medium and write its path from the medium's top";

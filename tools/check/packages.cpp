@@ -55,6 +55,12 @@ std::string versionKey(const Version& version) {
   return std::string(packageKey(gestaltSystemVersion().value_or(0)).value_or(""));
 }
 
+// Returns the remedy for a maximum that should include all of one major version.
+std::string supportAllOf(std::int64_t major) {
+  return "to support all of " + std::to_string(major) + ", write " + std::to_string(major + 1) +
+         ", 0, 0; otherwise, write a number";
+}
+
 bool takesAllBugFixes(const Dictionary& maximum) {
   Version beyond = boundOf(maximum);
   beyond[2] = INT64_MAX;
@@ -74,6 +80,7 @@ class PackageCheck {
     checkNumbers(medium::kSystemMax, info_.supportSystemMax());
     checkEmptyRange();
     checkNamedMaximum();
+    checkFirstMinorVersion();
     checkApplicationsOwnMinimum();
     if (!lists_.resources->dictionary(medium::kPkgInfo)) return;
     findPackages();
@@ -137,7 +144,9 @@ class PackageCheck {
                            ? "a number, or \"x\" for all of that minor version"
                            : "a number",
            .effect = "the value counts as " + std::to_string(leadingInteger(*text)),
-           .remedy = "write a number"});
+           .remedy = which == medium::kSystemMax && key == std::string_view("Minor")
+                         ? supportAllOf(bound.integerValue("Major"))
+                         : "write a number"});
     }
   }
 
@@ -172,6 +181,26 @@ class PackageCheck {
                      std::to_string(named[1]) + ", or the first release that is refused",
          .effect = name + " itself is refused as too new",
          .remedy = "keep this only if " + name + " is meant to be refused"});
+  }
+
+  // Warns when the range ends with the first minor version of macOS 11 or later. Before macOS 11,
+  // each yearly release was a minor version, so there a range may well end with one.
+  void checkFirstMinorVersion() {
+    constexpr std::int64_t kFirstYearlyMajor = 11;
+    const Dictionary& maximum = info_.supportSystemMax();
+    const Version last = boundOf(maximum);
+    if (!isBound(maximum) || !takesAllBugFixes(maximum) || last[0] < kFirstYearlyMajor ||
+        last[1] != 0 || !maximum.find("Minor") || maximum.string("Minor").value_or("0") != "0") {
+      return;
+    }
+    const std::string major = std::to_string(last[0]);
+    report_.findings.push_back({.id = "range-stops-at-minor",
+                                .severity = Severity::kWarning,
+                                .place = placeOf(medium::kSystemMax, "Minor"),
+                                .found = "the supported systems: " + report_.systems,
+                                .expected = "a range to the last release of macOS " + major,
+                                .effect = major + ".1 is refused as too new",
+                                .remedy = supportAllOf(last[0])});
   }
 
   void checkApplicationsOwnMinimum() {
@@ -293,7 +322,9 @@ class PackageCheck {
          .found = "a key that no system uses",
          .expected = "\"104\" to \"109\"",
          .effect = "10.9 and every later system get the package that \"109\" names",
-         .remedy = "move the name to \"109\", or remove the key"});
+         .remedy = lists_.resources->dictionary(medium::kPkgInfo)->find("109")
+                       ? "remove the key; a distribution package can choose by the system's version"
+                       : "move the name to \"109\", or remove the key"});
   }
 
   void unsupported(const std::string& key) {

@@ -1,9 +1,12 @@
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <filesystem>
 #include <map>
+#include <optional>
 #include <set>
 #include <system_error>
+#include <utility>
 
 #include "media/medium.h"
 #include "platform/bundle.h"
@@ -17,6 +20,25 @@ namespace onramp::check {
 namespace {
 
 constexpr std::string_view kLanguageFolder = ".lproj";
+
+// Codes of countries that are easily taken for the code of the country's language. None of them is
+// the code of a language.
+constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountries{{{"jp", "ja"},
+                                                                                   {"cn", "zh"},
+                                                                                   {"kr", "ko"},
+                                                                                   {"cz", "cs"},
+                                                                                   {"dk", "da"},
+                                                                                   {"gr", "el"},
+                                                                                   {"ua", "uk"},
+                                                                                   {"vn", "vi"}}};
+
+// Returns the code of the language that the folder's author probably meant. Returns nothing when
+// `code` is not the code of a country.
+std::optional<std::string> languageOfCountry(std::string_view code) {
+  const auto found = std::find_if(kCountries.begin(), kCountries.end(),
+                                  [&](const auto& pair) { return pair.first == code; });
+  return found == kCountries.end() ? std::nullopt : std::optional(std::string(found->second));
+}
 const std::string kBundle = "MacResources/CDCommonMessage.bundle";
 
 std::vector<std::string> languagesIn(const MediumFiles& files, const std::string& resources) {
@@ -26,6 +48,11 @@ std::vector<std::string> languagesIn(const MediumFiles& files, const std::string
     languages.push_back(name.substr(0, name.size() - kLanguageFolder.size()));
   }
   return languages;
+}
+
+bool isLanguage(const std::string& name) {
+  const std::string code = Language::parse(name).code;
+  return !code.empty() && !languageOfCountry(code);
 }
 
 std::size_t placeholders(const std::string& text) {
@@ -80,13 +107,15 @@ class TextCheck {
 
   void read(const std::string& language, const std::string& effect) {
     const std::string path = tablePath(language);
-    if (Language::parse(language).code.empty()) {
+    if (!isLanguage(language)) {
+      const auto meant = languageOfCountry(Language::parse(language).code);
       report_.findings.push_back({.id = "language-unknown",
                                   .severity = Severity::kWarning,
                                   .place = {.file = kBundle + "/Contents/Resources/" + language +
                                                     std::string(kLanguageFolder)},
                                   .found = "a folder whose name is not a language",
                                   .expected = "a code such as \"de\" or \"zh_TW\"",
+                                  .nearest = meant ? *meant + std::string(kLanguageFolder) : "",
                                   .effect = "nobody sees its texts",
                                   .remedy = "rename the folder"});
       return;
@@ -210,26 +239,36 @@ class TextCheck {
     finding.remedy = "shorten the text, or see in the wizard whether it fits";
   }
 
-  // Reports each table that equals the English table or the table of a language before it. A new
-  // language usually begins as a copy, and may remain untranslated by mistake.
+  // Reports each language that has at least half of its texts in common with English or with a
+  // language before it. A new language usually begins as a copy, and some texts may be left so by
+  // mistake.
   void checkTranslations() {
-    for (const auto& table : tables_) {
-      const std::string code = Language::parse(table.first).code;
-      const auto original = std::find_if(tables_.begin(), tables_.end(), [&](const auto& other) {
-        const std::string otherCode = Language::parse(other.first).code;
-        return otherCode != code && (otherCode == "en" || other.first < table.first) &&
-               other.second == table.second;
-      });
-      if (code == "en" || original == tables_.end() || table.second.empty()) continue;
-      report_.findings.push_back(
-          {.id = "texts-copied",
-           .severity = Severity::kWarning,
-           .place = {.file = tablePath(table.first)},
-           .found = "the same texts as in " + quoted(original->first),
-           .expected = "texts in the language " + quoted(table.first),
-           .effect = "users of " + quoted(table.first) + " see another language",
-           .remedy = "translate the texts, or remove the folder"});
+    for (const auto& [language, texts] : tables_) {
+      for (const auto& [other, originals] : tables_) {
+        const std::string code = Language::parse(language).code;
+        const std::string otherCode = Language::parse(other).code;
+        const bool isFirst = otherCode == "en" || (code != "en" && other < language);
+        const std::size_t same = code == otherCode || !isFirst ? 0 : commonTexts(texts, originals);
+        if (same == 0 || same < texts.size() / 2) continue;
+        report_.findings.push_back(
+            {.id = "texts-copied",
+             .severity = Severity::kWarning,
+             .place = {.file = tablePath(language)},
+             .found = std::to_string(same) + " texts that are the same in " + quoted(other),
+             .expected = "texts in the language " + quoted(language),
+             .effect = "users of " + quoted(language) + " see texts in another language",
+             .remedy = "translate these texts"});
+        break;
+      }
     }
+  }
+
+  static std::size_t commonTexts(const Dictionary& texts, const Dictionary& others) {
+    return static_cast<std::size_t>(
+        std::count_if(texts.begin(), texts.end(), [&](const Dictionary::Pair& pair) {
+          const Value* const other = others.find(pair.key);
+          return other && *other == pair.value;
+        }));
   }
 
   void checkDevelopmentRegion() {
@@ -272,7 +311,11 @@ class TextCheck {
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";
-    const std::vector<std::string> own = languagesIn(files_, resources);
+    std::vector<std::string> own = languagesIn(files_, resources);
+    std::erase_if(own, [&](const std::string& language) {
+      const auto names = files_.names(resources + "/" + language + std::string(kLanguageFolder));
+      return !std::binary_search(names.begin(), names.end(), "InfoPlist.strings");
+    });
     for (const std::string& language : languagesBeyond(own)) {
       reportMissingLanguage(
           "language-not-in-application", resources, language, own,
@@ -305,8 +348,7 @@ class TextCheck {
       const std::vector<std::string>& served) const {
     std::vector<std::string> languages;
     for (const std::string& language : languages_) {
-      const bool unknown = Language::parse(language).code.empty();
-      if (!unknown && !serves(served, language)) languages.push_back(language);
+      if (isLanguage(language) && !serves(served, language)) languages.push_back(language);
     }
     return languages;
   }

@@ -1,4 +1,6 @@
 #include <filesystem>
+#include <fstream>
+#include <string>
 #include <system_error>
 
 #include "base/ascii.h"
@@ -22,6 +24,13 @@ bool isExecutable(const std::string& path) {
   std::error_code ignored;
   const fs::perms any = fs::perms::owner_exec | fs::perms::group_exec | fs::perms::others_exec;
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
+}
+
+// The system takes the carriage return for a part of the interpreter's name.
+bool isScriptWithCarriageReturn(const std::string& path) {
+  std::ifstream file(path, std::ios::binary);
+  std::string line;
+  return std::getline(file, line) && line.starts_with("#!") && line.ends_with('\r');
 }
 
 // Reports a bundle whose program is not named in its Info.plist, is missing or is not executable.
@@ -49,19 +58,24 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
                     quoted(program->substr(files.fullPath("").size() + 1));
     finding.expected = "a file that everyone may execute";
     finding.remedy = "chmod a+x, and master the medium on a file system that keeps the permission";
+  } else if (isScriptWithCarriageReturn(*program)) {
+    finding.id = "program-line-ends";
+    finding.found = "a script whose first line ends with a carriage return";
+    finding.expected = "lines that end with a line feed only";
+    finding.remedy = "save the script with the line ends of Unix";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// Reports translations of the tool's name that lack the maker's name, although the tool's name has
-// it. Such translations are probably left over from another maker's medium.
+// Reports each language in which the tool has translated texts, but no name. If the tool's name
+// contains the maker's name, also reports translations without the maker's name, which are probably
+// left over from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor) {
   const std::string maker = firstWord(vendor);
   const auto names = [&](const std::string& text) {
     return asciiLowercased(text).find(asciiLowercased(maker)) != std::string::npos;
   };
-  if (maker.empty() || !names(name)) return;
   const std::string resources = relative + "/Contents/Resources";
   for (const std::string& folder : files.names(resources)) {
     const std::string table = (fs::path(resources) / folder / "InfoPlist.strings").string();
@@ -70,8 +84,19 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
     const auto texts = files.strings(
         table,
         {{.file = table}, "the tool's translated names", "the tool's untranslated name on macOS"});
-    const auto translated = texts ? texts->string(kDisplayName) : std::nullopt;
-    if (!translated || names(*translated)) continue;
+    if (!texts) continue;
+    const auto translated = texts->string(kDisplayName);
+    if (!translated) {
+      files.report().findings.push_back(
+          {.id = "tool-name-untranslated",
+           .severity = Severity::kWarning,
+           .place = {.file = table},
+           .found = "no text under " + quoted(kDisplayName),
+           .expected = "a translation of " + quoted(name),
+           .effect = "users of this file's language see the name " + quoted(name),
+           .remedy = "write the translation"});
+    }
+    if (!translated || maker.empty() || !names(name) || names(*translated)) continue;
     files.report().findings.push_back(
         {.id = "tool-name-left-over",
          .severity = Severity::kWarning,
