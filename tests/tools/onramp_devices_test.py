@@ -213,7 +213,7 @@ class CommandLine(unittest.TestCase):
     def test_refuses_bad_arguments_with_a_remedy(self):
         for words, message in (("browse", "--medium is required"), ("browse -m /proc", "contains no application"),
                                ("ask", "ADDRESS is required"), ("ask no-such", "neither an IPv4 address"),
-                               ("serch", "--help")):
+                               ("serch", 'no command "serch"'), ("browse --medum x", "--medum")):
             with self.subTest(words):
                 result = run(PROGRAM, *words.split())
                 self.assertEqual((result.returncode, message in result.stderr), (2, True), result.stderr)

@@ -140,7 +140,7 @@ int Session::run() {
     finishIfDone();
   });
   AddNetworkInterfaceListChangeCallbackSCF();
-  if (!options_.json) progress_.print(tableHead(style_));
+  if (!options_.json) progress_.print(tableHead(medium_, style_));
   finder_->start(typesToBrowse(medium_), options_.allTypes);
   scheduleTimer(std::chrono::milliseconds(static_cast<std::int64_t>(options_.seconds * 1000)),
                 [this] { stopListening(); });

@@ -129,8 +129,14 @@ TextStyle outputStyle(bool isVerbose) {
       .isColoured = isTerminal, .isVerbose = isVerbose, .width = isTerminal ? terminalWidth() : 0};
 }
 
-std::string tableHead(const TextStyle& style) {
-  return row(fitted("", kMarkColumns), "NAME", "MODEL", "ADDRESS", style);
+std::string tableHead(const Medium& medium, const TextStyle& style) {
+  const bool isForAll = medium.choosesModel && medium.wanted.size() == medium.models.size();
+  return (isForAll ? paragraph("Users of this medium choose a model first, and the wizard then "
+                               "lists only devices of that model. Add --model to see the list of "
+                               "one user.",
+                               style)
+                   : "") +
+         row(fitted("", kMarkColumns), "NAME", "MODEL", "ADDRESS", style);
 }
 
 std::string rowOf(const JudgedDevice& judged, const TextStyle& style) {

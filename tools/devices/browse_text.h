@@ -17,8 +17,9 @@ struct TextStyle {
 /// terminal, otherwise without colours and with width 0.
 [[nodiscard]] TextStyle outputStyle(bool isVerbose);
 
-/// Returns the header line of the table of devices.
-[[nodiscard]] std::string tableHead(const TextStyle& style);
+/// Returns the header line of the table of devices. If the search is for all models, but the wizard
+/// on `medium` searches for one model at a time, a paragraph before the line says so.
+[[nodiscard]] std::string tableHead(const Medium& medium, const TextStyle& style);
 
 /// Returns a device's row in the table and the lines below the row. These are the reason if the
 /// wizard does not list the device, the notes and, in the verbose style, all details.

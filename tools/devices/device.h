@@ -34,6 +34,7 @@ struct Medium {
   std::string type;                          ///< the one service type that the wizard looks for
   std::vector<std::string> models;           ///< all models of the medium
   std::vector<std::string> wanted;           ///< the models that the wizard searches for
+  bool choosesModel = false;                 ///< whether the wizard begins with the model list
   std::vector<std::string> withoutSearch{};  ///< the models whose users never come to a search
 };
 

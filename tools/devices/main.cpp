@@ -34,8 +34,8 @@ void addBrowse(CLI::App& app, BrowseOptions& options) {
   CLI::App* const command = app.add_subcommand(
       "browse", "Show the announced devices, and explain which of them the wizard lists");
   command->footer("Examples:" + kBrowseExamples);
+  // If the option were required, CLI11 would report it as missing when it is only misspelt.
   command->add_option("-m,--medium", options.medium, "The folder that contains the application")
-      ->required()
       ->type_name("DIR");
   command->add_option("--model", options.models, "Search only for this model; may be repeated")
       ->type_name("NAME")
@@ -98,7 +98,16 @@ int run(int count, char* arguments[]) {
   addURI(app, uriOptions);
   addHosts(app, hostsOptions);
   try {
+    const std::string first = count > 1 ? arguments[1] : "";
+    const auto isFirst = [&](CLI::App* command) { return command->get_name() == first; };
+    if (!first.empty() && !first.starts_with('-') && app.get_subcommands(isFirst).empty()) {
+      throw CLI::ExtrasError(
+          "there is no command \"" + first + "\"; the commands are browse, ask, uri and hosts",
+          CLI::ExitCodes::ExtrasError);
+    }
     app.parse(count, arguments);
+    if (app.got_subcommand("browse") && browseOptions.medium.empty())
+      throw CLI::RequiredError("--medium");
   } catch (const CLI::ParseError& error) {
     return app.exit(error) == 0 ? 0 : kTrouble;
   }

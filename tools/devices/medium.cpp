@@ -10,6 +10,7 @@
 #include "media/connection_type.h"
 #include "platform/freedesktop/main_bundle.h"
 #include "tools/check/application.h"
+#include "tools/check/spelling.h"
 #include "tools/devices/text.h"
 
 namespace onramp::devices {
@@ -64,10 +65,15 @@ std::optional<Medium> readMedium(const std::string& path, const std::vector<std:
   if (medium.models.empty()) return fail(path, "has no models in CDInfo.plist; try onramp-check");
   for (const std::string& model : wanted) {
     if (std::find(medium.models.begin(), medium.models.end(), model) == medium.models.end()) {
-      return fail(path, "has no model " + inQuotes(model) + "; its models are in CDInfo.plist");
+      const auto nearest = check::Spelling(medium.models).nearest(model);
+      return fail(path, "is a medium without a model " + inQuotes(model) +
+                            (nearest ? "; did you mean " + inQuotes(*nearest) + '?'
+                                     : "; its models are in CDInfo.plist"));
     }
   }
   if (medium.wanted.empty()) medium.wanted = medium.models;
+  medium.choosesModel =
+      firstPage(medium.models, KSOROSXModel::modelInfo()) == FirstPage::kModelList;
   medium.withoutSearch = modelsWithoutSearch(medium.models);
   return medium;
 }

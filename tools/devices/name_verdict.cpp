@@ -87,13 +87,13 @@ std::string edgeBlanks(const std::string& announced) {
 
 // Returns the medium's model that `announced` most resembles in spelling. If none does, returns one
 // that differs only in its maker. The device announces `model` without the maker.
-std::string nearestOf(const std::string& announced, const std::string& model,
-                      const Medium& medium) {
+std::optional<std::string> nearestOf(const std::string& announced, const std::string& model,
+                                     const Medium& medium) {
   auto nearest = check::Spelling(medium.models).nearest(announced);
   for (const std::string& known : medium.models) {
     if (!nearest && asciiLowercased(known).ends_with(' ' + asciiLowercased(model))) nearest = known;
   }
-  return nearest ? "; the nearest model is " + inQuotes(*nearest) : "";
+  return nearest;
 }
 
 }  // namespace
@@ -140,10 +140,15 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
       return differs("maker-twice", "repeats the maker, unlike", announced, known);
     }
   }
-  return Verdict{.id = "not-on-medium",
-                 .why = inQuotes(announced) + " is not a model of this medium" +
-                        nearestOf(announced, model, medium),
-                 .remedy = "use a medium for this model, or add the model to this medium"};
+  const auto nearest = nearestOf(announced, model, medium);
+  return Verdict{
+      .id = "not-on-medium",
+      .why = inQuotes(announced) + " is not a model of this medium" +
+             (nearest ? "; the nearest model is " + inQuotes(*nearest) : ""),
+      .remedy = std::string("use a medium for this model, or add the model to this medium") +
+                (nearest ? "; if the nearest model is the same, write it on the medium exactly as "
+                           "the device announces it"
+                         : "")};
 }
 
 }  // namespace onramp::devices
