@@ -1,4 +1,4 @@
-"""Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM
+"""Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM [CLASS]
 
 The tests run on one of two hosts. Two cables, each with IPv4 and IPv6, connect the hosts. On the
 other host, Avahi announces devices. One test announces a device from this host with zeroconf,
@@ -44,7 +44,7 @@ def asked(seen, last):
     return addresses
 
 
-class NetworkTest(unittest.TestCase):
+class Network(unittest.TestCase):
     def setUp(self):
         self.network = PracticeNetwork()
         self.avahi = Avahi()
@@ -59,6 +59,8 @@ class NetworkTest(unittest.TestCase):
                                 stdout=subprocess.PIPE).stdout
         self.assertEqual(answer.strip().split("\t")[1:], ["addresses", address])
 
+
+class Devices(Network):
     def test_devices_with_unusual_names_are_found_and_those_without_dots_also_by_uri(self):
         names = ["Bldg. 2, 3rd floor", "A B (1)", "Büro – 会議室", "🖨️ Drucker", "100% & more?",
                  "Osprey #2", "x" * 63]
@@ -175,6 +177,8 @@ class NetworkTest(unittest.TestCase):
             search.wait_for("remove", "Farther")
             self.assertEqual(search.events("remove", "Far"), [])
 
+
+class Daemons(Network):
     def test_many_devices_are_found_even_by_a_daemon_with_a_low_limit(self):
         self.addCleanup(self.avahi.restart)
         for limit, count in (("5", 6), ("1024", 200)):
