@@ -10,9 +10,9 @@ namespace onramp {
 
 /// A resource bundle: a folder that holds Contents/Info.plist and Contents/Resources. The resources
 /// include one folder of string tables for each language. An application's bundle also holds the
-/// executable, in a subfolder of Contents named after the operating system. A Bundle object
-/// stores only the path, and every query reads the disk. However, macOS caches what it has read
-/// from a bundle, so the running program may not see later changes to the bundle.
+/// executable, in a subfolder of Contents named after the operating system. A Bundle object stores
+/// only the path, and every query reads the disk. However, macOS caches what it has read from a
+/// bundle, so the running program may not see later changes to the bundle.
 class Bundle {
  public:
   /// Returns the bundle of the running application.
@@ -42,9 +42,7 @@ class Bundle {
   /// - the folder for the user's most preferred language among those that the bundle offers;
   /// - the folder for the bundle's development language;
   /// - if neither exists, the English folder;
-  /// - if the English folder does not exist either, the folder for any one of the languages that
-  /// the
-  ///   bundle offers.
+  /// - if there is no English folder either, the folder for any language that the bundle offers.
   /// Returns nothing when none of these folders holds the file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
                                                            const std::string& type) const;

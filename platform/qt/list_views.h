@@ -55,9 +55,9 @@ class ColumnsWidget final : public FramedView<QTreeView> {
  public:
   explicit ColumnsWidget(QWidget* parent = nullptr);
 
-  /// Call this whenever the contents or a header changes. Adjusts the column widths at
-  /// once, or after a short pause if the last adjustment was only a moment ago. All calls during
-  /// the pause share one adjustment.
+  /// Call this whenever the contents or a header changes. Adjusts the column widths at once, or
+  /// after a short pause if the last adjustment was only a moment ago. All calls during the pause
+  /// share one adjustment.
   void fitColumns();
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }
