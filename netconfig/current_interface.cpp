@@ -6,7 +6,7 @@ namespace onramp {
 
 namespace {
 
-// Returns the dictionary under `key` in the dynamic store. Returns nothing when `key` is nothing,
+// Returns the dictionary under `key` in the dynamic store. Returns nothing when `key` has no value,
 // when the store has no dictionary there, and when the store cannot be read. The store reads `key`
 // as a regular expression.
 std::optional<Dictionary> stateUnder(const std::string& storeName,

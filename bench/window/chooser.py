@@ -38,7 +38,7 @@ def enter_network(description="/dev/null"):
 class Chooser(Person):
     """A simulated person who opens the wizard's chooser and searches for devices.
 
-    `text` is a dictionary of the medium's English texts.
+    `text` is a dictionary of the medium's English strings.
     """
 
     def __init__(self, desktop, medium, text):

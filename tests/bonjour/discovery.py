@@ -90,7 +90,7 @@ class Avahi:
         deadline = time.monotonic() + PATIENCE
         while process.exists():
             if time.monotonic() > deadline:
-                raise AssertionError("avahi-daemon does not end")
+                raise AssertionError("avahi-daemon does not exit")
             time.sleep(0.01)
 
     def freeze(self):
@@ -101,7 +101,7 @@ class Avahi:
 
     def start(self, **settings):
         """Starts the daemon. Each of `settings` replaces the setting of the same name in the
-        configuration file. In the arguments' names, "_" stands for "-"."""
+        configuration file. In the names of the arguments, "_" replaces "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

@@ -104,7 +104,7 @@ class Layout : public testing::TestWithParam<int> {
     }
   }
 
-  // Expects that the menu's texts look the same in a wider menu. A text that is elided in the usual
+  // Expects that the menu's text looks the same in a wider menu. A text that is elided in the usual
   // menu would look different.
   static void expectMenuFits(QMenu& menu) {
     const QSize size = menu.sizeHint();

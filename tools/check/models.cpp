@@ -126,8 +126,8 @@ class ModelCheck {
   }
 
   // Reports a name that no printer can announce, and a name with suspicious spaces. A device
-  // announces maker and model as two texts, which the wizard joins with a space. Each text has at
-  // most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
+  // announces maker and model as two strings, which the wizard joins with a space. Each string has
+  // at most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
     const std::size_t space = name.find(' ');

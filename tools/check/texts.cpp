@@ -86,7 +86,7 @@ class TextCheck {
       : files_(files), lists_(lists), report_(files.report()) {}
 
   void run() {
-    constexpr const char* kEffect = "keys such as \"INST_TXT_MODEL\" instead of texts";
+    constexpr const char* kEffect = "keys such as \"INST_TXT_MODEL\" instead of text";
     if (!files_.exists(kBundle, {{.file = kBundle}, "the message bundle", kEffect})) return;
     languages_ = languagesIn(files_, kBundle + "/Contents/Resources");
     for (const std::string& language : languages_)
@@ -256,7 +256,7 @@ class TextCheck {
              .place = {.file = tablePath(language)},
              .found = std::to_string(same) + " texts that are the same in " + quoted(other),
              .expected = "texts in the language " + quoted(language),
-             .effect = "users of " + quoted(language) + " see texts in another language",
+             .effect = "users of " + quoted(language) + " see text in the wrong language",
              .remedy = "translate these texts"});
         break;
       }
@@ -278,7 +278,7 @@ class TextCheck {
                                    ? "users without texts in their language see another language "
                                      "that their system picks, usually English"
                                    : "users without texts in their language may see keys such as "
-                                     "\"INST_TXT_MODEL\" instead of texts";
+                                     "\"INST_TXT_MODEL\" instead of text";
     const auto information =
         files_.list(path, {{.file = path}, "the message bundle's Info.plist", effect});
     if (!information) return;
@@ -321,7 +321,7 @@ class TextCheck {
           "language-not-in-application", resources, language, own,
           "read and hear some of the application's texts in English: why the wizard uses the "
           "network, and the name of the gear button",
-          "have the application built with texts in that language");
+          "have the application built with text in that language");
     }
   }
 

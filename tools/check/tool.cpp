@@ -26,7 +26,7 @@ bool isExecutable(const std::string& path) {
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
 }
 
-// The system takes the carriage return for a part of the interpreter's name.
+// The system treats the carriage return as part of the interpreter's name.
 bool isScriptWithCarriageReturn(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
   std::string line;

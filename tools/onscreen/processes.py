@@ -1,4 +1,4 @@
-"""Child processes that end when this process does."""
+"""Child processes that are killed when this process exits."""
 
 import ctypes
 import signal
@@ -38,7 +38,7 @@ def start(arguments, package=None, **options):
 
 
 def stop(process):
-    """Ends a process that start() returned. Kills it if it has not ended after five seconds."""
+    """Terminates a process that start() returned. Kills it if it is still running after five seconds."""
     if process.poll() is None:
         process.terminate()
         try:

@@ -110,7 +110,7 @@ class Publisher:
 
     def state(self, device):
         """Returns "established" if both groups of the device are established, otherwise the state
-        of a group that is not. Returns "withdrawn" if the device has no groups or Avahi has ended."""
+        of a group that is not. Returns "withdrawn" if the device has no groups or Avahi has stopped."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"

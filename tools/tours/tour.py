@@ -214,5 +214,5 @@ class Tour:
                 visit.picture(step, f"The alert on {system} system, macOS {version}")
                 visit.next()
                 if not visit.left_nothing():
-                    self._album.problem("after the alert, the wizard did not end cleanly, or it "
+                    self._album.problem("after the alert, the wizard did not exit cleanly, or it "
                                         "wrote files")
