@@ -59,7 +59,8 @@ class ArrayController {
   /// false again when the selected entry is removed or removeAllObjects() is called.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
-  /// Return the selected entry's index and the entry itself, or nothing when no entry is selected.
+  /// These functions return the selected entry's index and the entry itself, or nothing when no
+  /// entry is selected.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 

@@ -43,9 +43,9 @@ class Dictionary {
   /// dictionary and all its copies have been destroyed or assigned to.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
-  /// Return the value under `key` if it has the type in the function's name. Otherwise array()
-  /// returns null, and string() and dictionary() return nothing. A pointer from array() stays valid
-  /// for as long as one from find().
+  /// These functions return the value under `key` if it has the type in the function's name.
+  /// Otherwise array() returns null, and string() and dictionary() return nothing. A pointer from
+  /// array() stays valid for as long as one from find().
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;

@@ -84,10 +84,10 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 /// service lacks counts as empty.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyDeviceURI(const NetServiceRef& service);
 
-/// Return the USB model and the USB manufacturer from the service's TXT record. The keys in the
-/// record depend on the service's type; see identity_keys.h. Return nothing when the value is
-/// absent or not UTF-8, when the record is absent or malformed, and when identity_keys.h does not
-/// list the type.
+/// These functions return the USB model and the USB manufacturer from the service's TXT record. The
+/// keys in the record depend on the service's type; see identity_keys.h. They return nothing when
+/// the value is absent or not UTF-8, when the record is absent or malformed, and when
+/// identity_keys.h does not list the type.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyModel(const NetServiceRef& service);
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyManufacturer(const NetServiceRef& service);
 

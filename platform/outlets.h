@@ -155,7 +155,8 @@ class TableView : public Control {
   /// once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 
-  /// Set whether the user may move columns, and whether a click on a header selects the column.
+  /// These functions set whether the user may move columns, and whether a click on a header selects
+  /// the column.
   void setAllowsColumnReordering(bool allows) const;
   void setAllowsColumnSelection(bool allows) const;
   /// Shows `title` above the column `identifier`. Does nothing when the table has no column with

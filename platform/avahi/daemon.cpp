@@ -104,7 +104,7 @@ bool Daemon::watchDaemon() {
 }
 
 // Asks the bus to start the daemon. This works on systems that start the daemon on demand. The bus
-// reports when the daemon has arrived.
+// reports when the daemon has started.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");
   if (request && sd_bus_message_append(request.get(), "su", kAvahi, 0U) >= 0) {

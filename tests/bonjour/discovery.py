@@ -55,8 +55,8 @@ class Search:
                 if word in (None, event[1]) and name in (None, event[2])]
 
     def wait(self, condition):
-        """Waits until `condition()` is true, and returns its value. Raises AssertionError after
-        PATIENCE seconds."""
+        """Waits until `condition()` is true, and returns its value. Raises AssertionError
+        if that takes longer than PATIENCE seconds."""
         with self._news:
             if not self._news.wait_for(condition, PATIENCE):
                 raise AssertionError(f"the expected event is not among these: {self._events}")

@@ -28,7 +28,7 @@ class MediumFolder {
     return root_ / "medium/" + relative;
   }
 
-  /// Write a file to the medium, and create its folder if it is missing.
+  /// Writes a file to the medium, creating its folder if needed.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   /// Makes a file on the medium executable by its owner.

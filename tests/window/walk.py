@@ -137,7 +137,7 @@ class Walk:
             time.sleep(0.05)
 
     def leave(self, person):
-        """Ends the program. Retries, because the window cannot be closed during a search."""
+        """Closes the program. Retries, because the window cannot be closed during a search."""
         until = time.monotonic() + PATIENCE
         while person.is_running():
             if time.monotonic() > until:

@@ -21,8 +21,8 @@ namespace {
 
 constexpr std::string_view kLanguageFolder = ".lproj";
 
-// Codes of countries that are easily taken for the code of the country's language. None of them is
-// the code of a language.
+// Country codes that are easily mistaken for the code of the country's language. None of them is a
+// language code.
 constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountries{{{"jp", "ja"},
                                                                                    {"cn", "zh"},
                                                                                    {"kr", "ko"},
@@ -33,7 +33,7 @@ constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountrie
                                                                                    {"vn", "vi"}}};
 
 // Returns the code of the language that the folder's author probably meant. Returns nothing when
-// `code` is not the code of a country.
+// `code` is not a country code.
 std::optional<std::string> languageOfCountry(std::string_view code) {
   const auto found = std::find_if(kCountries.begin(), kCountries.end(),
                                   [&](const auto& pair) { return pair.first == code; });
@@ -239,8 +239,8 @@ class TextCheck {
     finding.remedy = "shorten the text, or see in the wizard whether it fits";
   }
 
-  // Reports each language that has at least half of its texts in common with English or with a
-  // language before it. A new language usually begins as a copy, and some texts may be left so by
+  // Reports each language that has at least half of its texts in common with English or with an
+  // earlier language. A new language usually begins as a copy, and some texts may be left so by
   // mistake.
   void checkTranslations() {
     for (const auto& [language, texts] : tables_) {

@@ -67,9 +67,9 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// Reports each language in which the tool has translated texts, but no name. If the tool's name
-// contains the maker's name, also reports translations without the maker's name, which are probably
-// left over from another maker's medium.
+// Reports each language in which the tool has translated text, but no translated name. If the
+// tool's name contains the maker's name, also reports translations without the maker's name, which
+// are probably left over from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor) {
   const std::string maker = firstWord(vendor);

@@ -10,7 +10,7 @@ _libc = ctypes.CDLL(None, use_errno=True)
 
 
 class Missing(Exception):
-    """Raised when a program is not installed or does not start. The text names the program."""
+    """Raised when a program is not installed or does not start. The message names the program."""
 
 
 class InVain(TimeoutError):
@@ -51,7 +51,7 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises InVain after `seconds`. The error's text contains `what`, which describes the event.
+    Raises InVain if that takes longer than `seconds`. The error's message contains `what`, which describes the event.
     """
     deadline = time.monotonic() + seconds
     while True:

@@ -34,7 +34,7 @@ MODULES = "override,pass,vacm_conf,vacm_context"
 
 
 class AgentError(Exception):
-    """Raised when an agent does not start. The text says why."""
+    """Raised when an agent does not start. The message says why."""
 
 
 def listens(address):

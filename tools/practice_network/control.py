@@ -11,8 +11,8 @@ SOCKET_VARIABLE = "ONRAMP_PRACTICE_SOCKET"
 
 
 class ControlError(Exception):
-    """Raised when the network refuses a request, and when there is no network. The text says
-    why."""
+    """Raised when the network refuses a request, and when there is no network. The message
+    says why."""
 
 
 class PracticeNetwork:

@@ -22,7 +22,7 @@ PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
 
 class DescriptionError(Exception):
-    """Raised for a bad description or request. The text says what is wrong."""
+    """Raised for a bad description or request. The message says what is wrong."""
 
 
 @dataclasses.dataclass(frozen=True)
@@ -109,7 +109,7 @@ def load(path):
 
 
 def device(table, place):
-    """Returns the device that `table` describes. The text of an error begins with `place`."""
+    """Returns the device that `table` describes. An error message begins with `place`."""
     return change(None, table, place)
 
 

@@ -77,7 +77,7 @@ def _is_searching(visit):
 
 
 def _can_connect(visit):
-    """Returns whether the connection page takes keys: no set-up tool is running."""
+    """Returns whether the connection page accepts keys: no set-up tool is running."""
     return visit.shows(CONNECTION) and any(
         visit.person.has_state(control, "focused")
         for role, _, control in visit.person.everything() if role == "radio button")

@@ -21,7 +21,7 @@ _TOLD = ("heading", "label", "push button", "radio button", "alert")
 
 
 class WentWrong(Exception):
-    """The wizard did not do what it should. The text says what, in terms of the medium."""
+    """The wizard did not do what it should. The message says what, in terms of the medium."""
 
 
 def choose_model(person, models, model):
@@ -55,7 +55,7 @@ def _selected_model(person):
 
 
 class Visit:
-    """Starts the wizard with `options`, and ends it at the end of the `with` statement.
+    """Starts the wizard with `options`, and stops it at the end of the `with` statement.
 
     What goes wrong in between is raised as WentWrong.
     """
@@ -180,7 +180,7 @@ class Visit:
         if not self.person.is_running():
             return (f"the wizard exited with status {self.person.process.returncode}, "
                     f"and {self.opened_in_words()}")
-        self.picture("last", "What the screen showed when the tour could not go on")
+        self.picture("last", "What the screen showed when the tour could not continue")
         wanted = getattr(error, "what", None)
         why = f"the tour expected {wanted}" if wanted else f"the window could not be used ({error})"
         return f"{why}. {self._on_screen()}"
