@@ -121,7 +121,7 @@ class TextCheck {
       return;
     }
     const auto table = files_.strings(path, {{.file = path},
-                                             "the texts of " + quoted(language),
+                                             "the " + quoted(language) + " texts",
                                              "users of " + quoted(language) + " see " + effect});
     if (table) tables_.emplace(language, *table);
   }
@@ -214,7 +214,7 @@ class TextCheck {
     } else if (shown.where == "sheet when no device is found" &&
                text.find('%') != std::string::npos) {
       finding.id = "text-percent";
-      finding.found = "a \"%\", which macOS takes for the beginning of a placeholder";
+      finding.found = "a \"%\", which macOS treats as the beginning of a placeholder";
       finding.expected = "a text without \"%\"";
       finding.effect = "a damaged text, or a crash, on macOS";
       finding.remedy = "write a word instead";
@@ -297,7 +297,8 @@ class TextCheck {
       finding.place.key = {kKey};
       finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
       finding.expected = "one of " + offered;
-      finding.remedy = "name one of the expected languages, or add the texts of " + quoted(*region);
+      finding.remedy =
+          "name one of the expected languages, or add the " + quoted(*region) + " texts";
     } else if (information->find(kKey)) {
       finding.place.key = {kKey};
       finding.found = "a value that is not a string";

@@ -62,7 +62,7 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
     finding.id = "program-line-ends";
     finding.found = "a script whose first line ends with a carriage return";
     finding.expected = "lines that end with a line feed only";
-    finding.remedy = "save the script with the line ends of Unix";
+    finding.remedy = "save the script with Unix line endings";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }

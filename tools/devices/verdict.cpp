@@ -154,7 +154,7 @@ std::vector<Verdict> notesOn(const Device& device, const Medium& medium) {
   if (isOneOf(medium.withoutSearch, device.record)) {
     notes.push_back({.id = "model-without-search",
                      .why = "on the medium, its model has no wireless, so no user who chooses the "
-                            "model comes to a search",
+                            "model reaches a search",
                      .remedy = "set WirelessLAN to true in ModelInfo.plist if the model has "
                                "wireless"});
   }

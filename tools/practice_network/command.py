@@ -61,14 +61,14 @@ there is one table for each device:
     activeif = 2                   the number that the device answers; default 2, for wireless.
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
-                                   answers with a text. A list gives each address its own value.
+                                   answers with a string. A list gives each address its own value.
                                    IPv6 addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
     present = false                false: switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
 inside the network, these commands show and change the devices while COMMAND runs. KEY=VALUE is an
-entry as in the file, but a text needs no quotes:
+entry as in the file, but a string needs no quotes:
     practice-network ctl list                         prints the devices, with their states
     practice-network ctl add NAME [KEY=VALUE ...]     switches on a known device, or adds a new one
     practice-network ctl set NAME KEY=VALUE ...       changes a device, such as: activeif=silent

@@ -245,7 +245,7 @@ READERS = {
                             "or a list of these with one for each address"),
     "delay": (_delay, "a number of seconds from 0 to 3600"),
     "present": (_truth, "true or false"),
-    "txt": (_txt, 'a table of texts such as {rp = "auto"}'),
+    "txt": (_txt, 'a table of strings such as {rp = "auto"}'),
 }
 
 SETTING_READERS = {
