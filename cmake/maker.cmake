@@ -9,7 +9,7 @@ endif()
 set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${ONRAMP_MAKER})
 file(READ ${ONRAMP_MAKER} onramp_maker)
 
-# onramp_maker_check(KEY VALUE FORM EXAMPLE) ends the configuration with a message if VALUE, the
+# onramp_maker_check(KEY VALUE FORM EXAMPLE) stops the configuration with a message if VALUE, the
 # value of KEY, does not match the regular expression FORM. The message shows EXAMPLE.
 function(onramp_maker_check key value form example)
   if(NOT value MATCHES "${form}")

@@ -82,7 +82,7 @@ void checkServiceType(const Lists& lists, Report& report) {
     finding.expected = "\"_name._tcp.\", with a name of at most 15 letters, digits and hyphens";
   } else if (!identityKeysOf(*type)) {
     finding.id = "service-unknown";
-    finding.found += ", for which the wizard reads no maker and model";
+    finding.found += ", for which the wizard cannot read a maker or model";
     finding.expected = "one of _pdl-datastream._tcp., _printer._tcp., _ipp._tcp., _scanner._tcp.";
   }
   if (finding.id.empty()) {
