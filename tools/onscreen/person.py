@@ -64,7 +64,8 @@ class Person:
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits until a control with this role and name is on the screen, and returns the control.
 
-        Raises TimeoutError if that takes longer than `seconds`, and RuntimeError when the program has exited.
+        Raises TimeoutError if that takes longer than `seconds`, and RuntimeError when the program
+        has exited.
         """
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
                         _words(role, name))

@@ -51,7 +51,8 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises InVain if that takes longer than `seconds`. The error's message contains `what`, which describes the event.
+    Raises InVain if that takes longer than `seconds`. The error's message contains `what`, which
+    describes the event.
     """
     deadline = time.monotonic() + seconds
     while True:
