@@ -131,7 +131,7 @@ MISTAKES = [
     (rename(COMMON, "BonjourNetwork", "BonjorNetwork"), "key-misspelt", "BonjourNetwork"),
     (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
     (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
-    (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "out of the medium"),
+    (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "outside the medium"),
     (put(COMMON, "CDInfo", __file__), "path-outside", "from the medium's top"),
     (put(COMMON, "Comment", "x"), "key-unknown", "does not read"),
     (take(COMMON, "PkgInfo"), "key-missing", "PkgInfo", "nothing opens"),
