@@ -36,7 +36,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   OnrampOSXAppDelegate& operator=(const OnrampOSXAppDelegate&) = delete;
   ~OnrampOSXAppDelegate() override;
 
-  // start_up.cpp: start, end and the choice of the first page.
+  // start_up.cpp: start-up, closing and the choice of the first page.
 
   void setOutlets(const Interface& mainInterface) override;
 
@@ -68,7 +68,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// USB and wired Ethernet.
   [[nodiscard]] static ConnectionType isIFType(bool usb, bool ethernet);
 
-  /// Returns the type of the model called `model`, or kNeither when `model` is nothing.
+  /// Returns the type of the model called `model`, or kNeither when `model` has no value.
   [[nodiscard]] static ConnectionType isIFType(const std::optional<std::string>& model);
 
   /// Returns the type that all of `models` share. Returns kNeither when any two models differ, or
@@ -100,7 +100,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// - In all other cases: shows the chooser and searches.
   void showChooseDeviceView();
 
-  /// Makes `image` the window's background, stretched to fit. Does nothing if `image` is nothing.
+  /// Makes `image` the window's background, stretched to fit. Does nothing if `image` has no value.
   void setBackGroundView(const std::optional<Image>& image);
 
   /// Each of these functions sets up the buttons for one page: their titles, and whether they are
@@ -177,9 +177,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] static Dictionary instmodelPlistNotWiFi(const std::string& model);
 
   /// Returns the model file's contents for the wireless device whose KSDevice record is `property`.
-  /// Falls back to instmodelPlistNotWiFi() when `property` is nothing or lacks a name or an
+  /// Falls back to instmodelPlistNotWiFi() when `property` has no value or lacks a name or an
   /// address, and when the medium names no service type. The fallback uses the name `model`, or an
-  /// empty name if `model` is nothing.
+  /// empty name if `model` has no value.
   [[nodiscard]] static Dictionary instmodelPlistWiFi(const std::optional<std::string>& model,
                                                      const std::optional<Dictionary>& property);
 
@@ -195,12 +195,12 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Call launchWLANToolAutomatically() after a search that found no device, and
   /// launchWLANToolManually() when the user asks for the wireless set-up tool. Both hide the wizard
-  /// and return. The tool runs half a second later. When the tool has ended, the wizard acts on its
-  /// exit status:
-  /// - 1: It reappears. If the tool was started automatically, it shows the connection page with
-  ///   the wireless choice selected.
-  /// - 2: It terminates.
-  /// - Any other status, or a tool that cannot be run: It reappears, shows the chooser and
+  /// and return. The tool runs half a second later. When the tool has exited, the wizard acts on
+  /// the exit status:
+  /// - 1: The wizard reappears. If the tool was started automatically, it shows the connection page
+  ///   with the wireless choice selected.
+  /// - 2: The wizard terminates.
+  /// - Any other status, or the tool cannot be run: The wizard reappears, shows the chooser and
   ///   searches.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
@@ -210,15 +210,15 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// contains a space.
   [[nodiscard]] static std::optional<std::string> FAQ_URL();
 
-  /// Opens `url` in the user's browser. Does nothing if `url` is nothing.
+  /// Opens `url` in the user's browser. Does nothing if `url` has no value.
   static void openURL(const std::optional<std::string>& url);
 
   // search_wait.cpp: the wait for the device search.
 
   /// Waits in a modal loop for up to kMostPauses pauses of length `pause`. Skips the remaining
-  /// pauses as soon as a pause ends with a device on the chooser's list. Ends the search after the
-  /// wait. During the wait, the user can neither click a button nor close the window, and `page`
-  /// shows its spinner. `page` may be null.
+  /// pauses as soon as a pause ends and the chooser lists a device. Ends the search after the wait.
+  /// During the wait, the user can neither click a button nor close the window, and `page` shows
+  /// its spinner. `page` may be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
   /// Sleeps for `pause` up to kMostPauses times, until the chooser lists a device or the
@@ -229,8 +229,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// not, disables Next and tells the user in a sheet that no device was found.
   void showProgressAtChooseDeviceView(std::chrono::seconds pause);
 
-  /// Calls showProgressAtChooseDeviceView() with the number of seconds under kWaitTime in the
-  /// notification's user info, or with 0 if there is no number under that key.
+  /// Calls showProgressAtChooseDeviceView() with the number of seconds stored under kWaitTime in
+  /// the notification's user info, or with 0 if none is stored.
   void showProgressAtChooseDeviceViewByRefresh(const Notification& notification);
 
   /// Tells the user in a sheet that no device was found, and returns at once.
@@ -265,7 +265,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   void backToModelList();
   void backToConnectionType();
 
-  /// Ends the wizard: writes `modelFile`, if there is one, opens the package and quits.
+  /// Finishes the wizard's work: writes `modelFile` if it has a value, opens the package and quits.
   void handOverAndQuit(const std::optional<Dictionary>& modelFile);
 
   void launchWLANTool(ToolStart start);
@@ -284,7 +284,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   ImageView mBackGroundView;
   KSInstallerInfo mKSInstallerInfo;
   Dictionary mKSCD;
-  std::optional<std::string> mChoosedModel;  ///< nothing until the user chooses a model
+  std::optional<std::string> mChoosedModel;  ///< no value until the user chooses a model
   std::uint32_t mContainedModelCount = 0;
   /// Becomes true when the wizard starts the set-up tool automatically. Becomes false again if the
   /// tool then asks to go back to the connection page.

@@ -22,8 +22,8 @@ void showProgressOn(Page* page, bool on) {
   }
 }
 
-// The medium's texts are format strings, in which "%%" stands for a percent sign. The sheet shows
-// plain text, so this function replaces "%%" with "%".
+// The medium's texts are format strings, in which "%%" means a percent sign. The sheet shows plain
+// text, so this function replaces "%%" with "%".
 std::string textOfFormat(std::string format) {
   for (std::size_t at = format.find("%%"); at != std::string::npos; at = format.find("%%", at)) {
     format.erase(at++, 1);

@@ -12,13 +12,13 @@
 namespace onramp {
 
 /// Holds the entries of a list, their order and the selection. A table that is bound to the
-/// controller shows the list and is told about every change. All functions except arrangedCount()
+/// controller shows the list and is notified of every change. All functions except arrangedCount()
 /// must be called on the main thread.
 class ArrayController {
  public:
-  /// Makes rearrange() sort the entries by their strings under `key`. An entry without a string
-  /// under `key` is sorted as if the string were empty. With an empty `key`, which is the default,
-  /// rearrange() does not change the order.
+  /// Makes rearrange() sort the entries by the string that each has under `key`. An entry without a
+  /// string under `key` is sorted as if the string were empty. With an empty `key`, which is the
+  /// default, rearrange() does not change the order.
   void setSortKey(std::string key) { sortKey_ = std::move(key); }
 
   /// Appends `entries` without sorting the list. If the list was empty, selects the first of them.
@@ -33,8 +33,8 @@ class ArrayController {
   /// Removes all entries and clears the selection.
   void removeAllObjects();
 
-  /// Sorts the entries by their strings under the sort key, in ascending byte order. Entries with
-  /// equal strings keep their order. The selected entry stays selected.
+  /// Sorts the entries by the strings that they have under the sort key, in ascending byte order.
+  /// Entries with equal strings keep their order. The selected entry stays selected.
   void rearrange();
 
   /// The entries in the list's order.
@@ -46,7 +46,7 @@ class ArrayController {
   /// Selects the entry at `index`. An index past the end clears the selection.
   void setSelectionIndex(std::size_t index);
 
-  /// Selects the first entry equal to `entry`. Clears the selection when no entry is equal.
+  /// Selects the first entry equal to `entry`. Clears the selection when there is none.
   void setSelectedObject(const Dictionary& entry);
 
   /// choose() selects like setSelectionIndex(), and chooseObject() like setSelectedObject(). Both
@@ -59,7 +59,8 @@ class ArrayController {
   /// false again when the selected entry is removed or removeAllObjects() is called.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 
-  /// Return the selected entry's index and the entry itself, or nothing when no entry is selected.
+  /// These functions return the selected entry's index and the entry itself, or nothing when no
+  /// entry is selected.
   [[nodiscard]] std::optional<std::size_t> selectionIndex() const { return selection_; }
   [[nodiscard]] std::optional<Dictionary> selectedObject() const;
 

@@ -22,7 +22,7 @@ namespace onramp {
   return isASCIILetter(c) || isASCIIDigit(c);
 }
 
-/// Returns the value of a hexadecimal digit of either case; nothing for any other character.
+/// Returns the value of a hexadecimal digit of either case, or nothing for any other character.
 [[nodiscard]] constexpr std::optional<unsigned> hexDigitValue(char c) {
   if (c >= '0' && c <= '9') return static_cast<unsigned>(c - '0');
   if (c >= 'a' && c <= 'f') return static_cast<unsigned>(c - 'a') + 10;

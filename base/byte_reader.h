@@ -9,7 +9,7 @@
 namespace onramp {
 
 /// Reads untrusted bytes, such as those from the network or the medium, from front to back and
-/// never past their end. A read of more bytes than remain returns nothing and does not move the
+/// never past their end. Reading more bytes than remain returns nothing and does not move the
 /// reader. A copy of a reader moves independently of the original, so a copy can be used to look
 /// ahead. The bytes must outlive the reader, its copies and all views that the functions return.
 class ByteReader {

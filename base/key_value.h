@@ -8,8 +8,8 @@
 
 namespace onramp {
 
-/// A table of texts, each under a key. An interface file binds controls to keys; a bound control
-/// shows the text under its key. All functions must be called on the main thread.
+/// A table that maps keys to texts. An interface file binds controls to keys; a bound control shows
+/// the text for its key. All functions must be called on the main thread.
 class KeyValueTexts {
  public:
   using Setter = std::function<void(const std::string&)>;
@@ -17,7 +17,7 @@ class KeyValueTexts {
   /// Stores `text` under `key` and passes it to every setter bound to the key.
   void setValueForKey(const std::string& text, std::string_view key);
 
-  /// Returns the text under `key`, or an empty string if no text has been set.
+  /// Returns the text for `key`, or an empty string if no text has been set.
   [[nodiscard]] std::string valueForKey(std::string_view key) const;
 
   /// Calls `setter` now if `key` has a text, and again whenever a text is set for the key. The

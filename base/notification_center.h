@@ -9,8 +9,8 @@
 
 namespace onramp {
 
-/// The data of a notification. The keys and the types of their values depend on the notification's
-/// name and are documented where the name is declared.
+/// The data that a notification carries. The keys and the types of their values depend on the
+/// notification's name and are documented where the name is declared.
 using UserInfo = std::map<std::string, std::any, std::less<>>;
 
 struct Notification {
@@ -29,9 +29,9 @@ class NotificationCenter {
   /// Returns the centre that the whole process shares.
   [[nodiscard]] static NotificationCenter& defaultCenter();
 
-  /// Adds `handler` for all notifications called `name`, whoever posts them. `observer` identifies
-  /// the handler for removeObserver() and is never dereferenced. An observer may have several
-  /// handlers.
+  /// Adds `handler` for all notifications called `name`, regardless of who posts them. `observer`
+  /// identifies the handler for removeObserver() and is never dereferenced. An observer may have
+  /// several handlers.
   void addObserver(const void* observer, std::string_view name, Handler handler);
 
   /// Removes all handlers of `observer`. During a delivery, a handler that is removed before its

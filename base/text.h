@@ -7,7 +7,7 @@
 
 namespace onramp {
 
-/// The replacement character, U+FFFD, which stands for a character that cannot be decoded.
+/// The replacement character, U+FFFD, which replaces a character that cannot be decoded.
 inline constexpr char32_t kReplacementCharacter = 0xFFFD;
 
 /// Appends `character` to `text` in UTF-8. Appends the replacement character for a surrogate or a

@@ -27,7 +27,7 @@ struct Date {
 
 using Array = std::vector<Value>;
 
-/// An immutable table of values, each under a string key. Copies share their contents, so passing a
+/// An immutable map from string keys to values. Copies share their contents, so passing a
 /// dictionary by value is cheap.
 class Dictionary {
  public:
@@ -43,20 +43,22 @@ class Dictionary {
   /// dictionary and all its copies have been destroyed or assigned to.
   [[nodiscard]] const Value* find(std::string_view key) const;
 
-  /// Return the value under `key` if it has the type in the function's name. Otherwise array()
-  /// returns null, and string() and dictionary() return nothing. A pointer from array() stays valid
-  /// for as long as one from find().
+  /// These functions return the value under `key` if it has the type in the function's name.
+  /// Otherwise array() returns null, and string() and dictionary() return nothing. A pointer from
+  /// array() stays valid for as long as one from find().
   [[nodiscard]] std::optional<std::string> string(std::string_view key) const;
   [[nodiscard]] std::optional<Dictionary> dictionary(std::string_view key) const;
   [[nodiscard]] const Array* array(std::string_view key) const;
 
-  /// Returns the value under `key` converted by Value::boolean(); nothing when there is no value.
+  /// Returns the value under `key`, converted by Value::boolean(), or nothing when there is no
+  /// value.
   [[nodiscard]] std::optional<bool> boolean(std::string_view key) const;
 
-  /// Returns the value under `key` converted by Value::integerValue(); 0 when there is no value.
+  /// Returns the value under `key`, converted by Value::integerValue(), or 0 when there is no
+  /// value.
   [[nodiscard]] std::int64_t integerValue(std::string_view key) const;
 
-  /// Returns a copy with `value` under `key`, in place of any earlier value.
+  /// Returns a copy in which `key` maps to `value`, replacing any earlier value.
   [[nodiscard]] Dictionary with(std::string_view key, Value value) const;
 
   [[nodiscard]] std::size_t size() const;

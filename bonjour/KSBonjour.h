@@ -13,9 +13,9 @@
 namespace onramp {
 
 // All browsers post these notifications on the default notification centre, with a null `object`,
-// and observe them there. Each notification carries a NetServiceRef under kServiceInfo. The browse
-// flags, an unsigned long, are under kAddFlagInfo in kAddNotification, and under kRemoveFlagsInfo
-// in kRemoveNotification.
+// and observe them there. Each notification carries a NetServiceRef under kServiceInfo. It carries
+// the browse flags, an unsigned long, under kAddFlagInfo in kAddNotification, and under
+// kRemoveFlagsInfo in kRemoveNotification.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
 inline constexpr std::string_view kRemoveNotification = "removeNotificationInternal";
 inline constexpr std::string_view kResolvedNotification = "resolveNotificationInternal";
@@ -48,7 +48,7 @@ class KSBonjourObserver {
 /// called on the main thread.
 class KSBonjour {
  public:
-  /// Creates an idle browser for `type`. If `type` is nothing, the browser never starts.
+  /// Creates an idle browser for `type`. If `type` has no value, the browser never starts.
   [[nodiscard]] static std::shared_ptr<KSBonjour> initWithType(std::optional<std::string> type);
 
   KSBonjour(const KSBonjour&) = delete;
@@ -68,7 +68,7 @@ class KSBonjour {
   void notifyResolvedToKSBonjourObserver(const NetServiceRef& service) const;
 
   /// Starts to browse all domains that the computer is configured to browse. Stops first if the
-  /// browser is running. The table is empty at first. If the browse cannot start, the browser still
+  /// browser is running. The table is empty at first. If browsing cannot start, the browser still
   /// forwards the events of other browsers.
   void startBrowsing();
 
@@ -86,7 +86,7 @@ class KSBonjour {
                                                  const std::string& domain);
 
   // These functions look up a service in the table. They return false or null when the service is
-  // not in the table or an argument is nothing. didServiceResolved() also returns false when the
+  // not in the table or an argument has no value. didServiceResolved() also returns false when the
   // service has not been resolved since it was last added.
   [[nodiscard]] bool isServiceContained(const std::optional<std::string>& name,
                                         const std::optional<std::string>& type,
@@ -99,7 +99,7 @@ class KSBonjour {
  private:
   struct Entry {
     NetServiceRef service;
-    int referenceCount = 0;    ///< additions, minus the removals that found isValid true
+    int referenceCount = 0;    ///< additions, minus the removals made while isValid was true
     bool didResolved = false;  ///< whether the service has been resolved since its last addition
     bool isValid = true;       ///< false from a removal until the next addition or resolve
   };

@@ -43,7 +43,7 @@ void KSBonjourSearch::removeKSDeviceObserver(const KSDeviceObserver* observer) {
   std::erase_if(_aryObserver, [&](const auto& candidate) { return candidate.get() == observer; });
 }
 
-// An observer may remove itself when it is called, so each loop below runs over a copy of the
+// An observer may remove itself when it is called, so each loop below iterates over a copy of the
 // array.
 
 void KSBonjourSearch::notifyAddToKSDeviceObserver(const Dictionary& device) const {

@@ -61,7 +61,7 @@ class KSBonjourSearch final : public KSBonjourObserver,
   void stopBrowsing();
 
   /// Returns the types, as strings, of all browsers whose tables contain a service with this name
-  /// and domain. Returns an empty array if either argument is nothing.
+  /// and domain. Returns an empty array if either argument has no value.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

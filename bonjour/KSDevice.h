@@ -9,8 +9,9 @@
 namespace onramp {
 
 /// Makes device records. A record is a dictionary of the facts that one of the device's network
-/// services announces. A string or list that the service lacks is empty. The model name is empty if
-/// the service lacks the manufacturer or the model. The model name of a null service is one space.
+/// services announces. If the service lacks a value, the record holds an empty string or list in
+/// its place. The model name is empty if the service lacks the manufacturer or the model. The model
+/// name of a null service is one space.
 class KSDevice {
  public:
   KSDevice() = delete;
@@ -27,8 +28,8 @@ class KSDevice {
   static constexpr std::string_view kIPAddressList = "IP address list";  ///< array of strings
 
   /// Makes the record of `service`, which may be null. `types` becomes the record's
-  /// kBonjourServiceType: the service types under which the device was found. If `types` is
-  /// nothing, this array is empty.
+  /// kBonjourServiceType: the service types under which the device was found. If `types` has no
+  /// value, this array is empty.
   [[nodiscard]] static Dictionary initWithService(const NetServiceRef& service,
                                                   const std::optional<Array>& types);
 };

@@ -12,9 +12,9 @@ namespace onramp {
 // returns an int returns 0 on success and 1 on failure. A function that reads a service returns
 // nothing or false if the service is null. All functions must be called on the main thread.
 
-/// Callbacks for browses and resolves. They are called when a service is found, is gone or has been
-/// resolved. Each pointer may be null. `flags` are the flags in platform/net_service.h. The
-/// structure must outlive every browse and resolve that is started with it.
+/// Callbacks for browsing and resolving. They are called when a service is found, is gone or has
+/// been resolved. Each pointer may be null. `flags` are the flags in platform/net_service.h. The
+/// structure must outlive every search and resolve that is started with it.
 struct ServiceClientCallbacks {
   void (*add)(const NetServiceRef& service, unsigned long flags) = nullptr;
   void (*remove)(const NetServiceRef& service, unsigned long flags) = nullptr;
@@ -23,7 +23,7 @@ struct ServiceClientCallbacks {
 
 /// Creates a browser, stores it in `browser` and starts to browse `domain` for services of `type`.
 /// An empty domain means all domains that the computer is configured to browse. `callbacks` may be
-/// null. If `type` is nothing, returns 1 and leaves `browser` unchanged. After any other failure,
+/// null. If `type` has no value, returns 1 and leaves `browser` unchanged. After any other failure,
 /// `browser` is null.
 int KSNetServiceBrowserStart(NetServiceBrowserRef& browser, const std::string& domain,
                              const std::optional<std::string>& type,
@@ -47,9 +47,9 @@ int KSNetServiceCancelResolve(const NetServiceRef& service);
 int KSNetServiceResolveSync(const NetServiceRef& service, double timeout);
 
 /// Resolves the service with this name, type and domain. Blocks as KSNetServiceResolveSync() does.
-/// On success, sets `addresses` to the service's IPv4 addresses, or to nothing if it has none.
-/// Returns 1 and leaves `addresses` unchanged if the resolve fails or times out, or if an argument
-/// is nothing or null.
+/// On success, stores the service's IPv4 addresses in `addresses`, or resets `addresses` if there
+/// are none. Returns 1 and leaves `addresses` unchanged if the resolve fails or times out, or if an
+/// argument is null or has no value.
 int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
                                  const std::optional<std::string>& type,
                                  const std::optional<std::string>& domain,
@@ -65,7 +65,7 @@ int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
 /// "mdns://" URI must name a service in the domain "local.", which KSNetServiceCreateAndResolve()
 /// resolves. For any other URL, looks up the host and stores its first address; `timeout` does not
 /// limit the look-up. Returns 1 and leaves `addresses` unchanged in these cases:
-/// - `uri` is nothing, malformed or a "usb://" URI, or `addresses` is null.
+/// - `uri` has no value, is malformed or is a "usb://" URI, or `addresses` is null.
 /// - The host's name is longer than 1,024 bytes, or the look-up finds no IPv4 address.
 /// - The resolve fails or times out.
 int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
@@ -84,10 +84,10 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 /// service lacks counts as empty.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyDeviceURI(const NetServiceRef& service);
 
-/// Return the USB model and the USB manufacturer from the service's TXT record. The record's keys
-/// for them depend on the service's type; see identity_keys.h. Return nothing when the value is
-/// absent or not UTF-8, when the record is absent or malformed, and when identity_keys.h does not
-/// list the type.
+/// These functions return the USB model and the USB manufacturer from the service's TXT record. The
+/// keys in the record depend on the service's type; see identity_keys.h. They return nothing when
+/// the value is absent or not UTF-8, when the record is absent or malformed, and when
+/// identity_keys.h does not list the type.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyModel(const NetServiceRef& service);
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyManufacturer(const NetServiceRef& service);
 

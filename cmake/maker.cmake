@@ -9,7 +9,7 @@ endif()
 set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${ONRAMP_MAKER})
 file(READ ${ONRAMP_MAKER} onramp_maker)
 
-# onramp_maker_check(KEY VALUE FORM EXAMPLE) ends the configuration with a message if VALUE, the
+# onramp_maker_check(KEY VALUE FORM EXAMPLE) stops the configuration with a message if VALUE, the
 # value of KEY, does not match the regular expression FORM. The message shows EXAMPLE.
 function(onramp_maker_check key value form example)
   if(NOT value MATCHES "${form}")
@@ -42,7 +42,7 @@ onramp_maker_setting(ONRAMP_BUNDLE_NAME bundleName "${plain}" "\"Onramp OSX\"")
 onramp_maker_setting(ONRAMP_BUNDLE_IDENTIFIER bundleIdentifier "^[A-Za-z0-9-]+(\\.[A-Za-z0-9-]+)+$"
   "\"com.kestrelimaging.onramp\"")
 onramp_maker_setting(ONRAMP_SUPPORT_SITE supportSite "^https?://[A-Za-z0-9.:-]+(/[A-Za-z0-9._~/-]*[A-Za-z0-9._~-])?$"
-  "\"http://support.kestrel.example\", without a closing slash")
+  "\"http://support.kestrel.example\", without a trailing slash")
 onramp_maker_setting(ONRAMP_SNMP_COMMUNITY snmpCommunity "^[A-Za-z0-9._-]+$" "\"corridor\"")
 onramp_maker_setting(ONRAMP_ACTIVE_IF_OBJECT activeIFObject "^[012](\\.(0|[1-9][0-9]?[0-9]?[0-9]?[0-9]?))+$"
   "\"1.3.6.1.4.1.4242.2.4.4.1240.1.2.0\", with numbers up to 65535")

@@ -25,10 +25,10 @@ struct FileURL {
 /// the medium supports. Only the constructor reads the medium.
 class KSInstallerInfo {
  public:
-  /// Reads the medium that the wizard is on.
+  /// Reads the medium from which the wizard is running.
   KSInstallerInfo();
 
-  /// Sets all values from the medium resource dictionary `common`. When `common` is nothing, sets
+  /// Sets all values from the medium resource dictionary `common`. When `common` has no value, sets
   /// all values to their defaults.
   void setCDCommonInfoValue(const std::optional<Dictionary>& common);
 
@@ -37,14 +37,14 @@ class KSInstallerInfo {
   void loadSupportSystem(const std::optional<Dictionary>& common);
   void loadWLANToolURL(const std::optional<Dictionary>& common);
 
-  /// The package to open, which may not exist. Nothing when the medium resource dictionary could
-  /// not be read, or when its "PkgInfo" is missing or lacks the folder or the package name for the
-  /// running system.
+  /// The package to open, which may not exist. Has no value when the medium resource dictionary
+  /// could not be read, or when its "PkgInfo" is missing or lacks the folder or the package name
+  /// for the running system.
   [[nodiscard]] const std::optional<FileURL>& pkgURL() const { return mPkgURL; }
 
   /// The path of the set-up tool's application bundle, which may not exist. When the medium
-  /// resource dictionary names no tool, this is the folder that holds the wizard. Nothing when the
-  /// dictionary could not be read.
+  /// resource dictionary names no tool, this is the folder that holds the wizard. Has no value when
+  /// the dictionary could not be read.
   [[nodiscard]] const std::optional<FileURL>& WLANtoolURL() const { return mWLANToolURL; }
 
   /// The bounds of the supported system versions. system_range.h defines how they are compared.

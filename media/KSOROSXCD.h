@@ -9,9 +9,9 @@
 
 namespace onramp {
 
-/// Makes a record of the medium: the models that the medium serves, whether it has a printer
-/// package and a scanner package, the series code at the support centre, and the service type to
-/// search the network for.
+/// Builds a dictionary that describes the medium: the models that the medium supports, whether it
+/// has a printer package and a scanner package, the series code that the support site uses, and the
+/// service type to search the network for.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.
@@ -22,14 +22,15 @@ inline constexpr std::string_view kKSCSeriesCode = "KSC Series Code";           
 inline constexpr std::string_view kBonjourServiceType =
     "bonjour service type for browsing";  ///< string
 
-/// Returns the record of the medium that the wizard is on. Every call reads the medium again.
+/// Returns the record of the medium from which the wizard is running. Every call reads the medium
+/// again.
 [[nodiscard]] Dictionary initWithCDInfo();
 
-/// Makes the record from two dictionaries. `info` is the dictionary in the file that "CDInfo"
-/// names, and `CDCommonInfo` is the medium resource dictionary, from which only the service type is
-/// taken. A value that is absent or has the wrong type gets its default: no models, true for a
-/// package, or an empty string. If `info` is nothing, all values get their defaults, even the
-/// service type.
+/// Makes the record from two dictionaries. `CDCommonInfo` is the medium resource dictionary, from
+/// which only the service type is read. `info` is the dictionary in the file that the "CDInfo"
+/// entry of `CDCommonInfo` names. A value that is absent or has the wrong type gets its default: no
+/// models, true for a package, or an empty string. If `info` is not given, all values get their
+/// defaults, even the service type.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
@@ -39,8 +40,8 @@ inline constexpr std::string_view kBonjourServiceType =
 
 }  // namespace KSOROSXCD
 
-/// Returns the model names under kContainedModels of `record`, in the record's order. Returns an
-/// empty list when the record has no array under that key.
+/// Returns the model names that `record` stores under kContainedModels, in the stored order.
+/// Returns an empty list when the record has no array under that key.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

@@ -8,9 +8,9 @@
 
 namespace onramp {
 
-/// Makes a record of one model: its connections and its support-centre identifier. To query many
-/// models, call modelInfo() once and pass its result to initWithName(). Otherwise initWithName()
-/// reads the medium on every call.
+/// Builds a dictionary that describes one model: its name, its connections and its identifier at
+/// the support centre. To query many models, call modelInfo() once and pass its result to
+/// initWithName(). Otherwise initWithName() reads the medium on every call.
 namespace KSOROSXModel {
 
 // Keys of the record.
@@ -20,9 +20,9 @@ inline constexpr std::string_view kSupportUSB = "support USB";            ///< b
 inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< boolean
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
-/// Returns the model information of the medium that the wizard is on: the dictionary in the file
-/// that "ModelInfo" names. Returns nothing when the medium names no such file or the file has no
-/// dictionary.
+/// Returns the model information of the medium from which the wizard is running: the dictionary in
+/// the file that the medium's "ModelInfo" entry names. Returns nothing when the medium names no
+/// such file or the file has no dictionary.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 
 /// Returns the record of the model `name` according to the medium's model information.
@@ -31,7 +31,7 @@ inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< b
 /// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
 /// there supports USB only and has an empty identifier. By default, a listed model supports USB,
 /// but no network; its entry may say otherwise. If the entry of a listed model has no identifier
-/// ("KSCID"), the record holds only the name. When `name` is nothing, the record is empty.
+/// ("KSCID"), the record holds only the name. When `name` has no value, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);
 

@@ -18,14 +18,14 @@ inline constexpr std::string_view kSystemMax = "SystemMax";
 inline constexpr std::string_view kWLANtool = "WLANtool";
 inline constexpr std::string_view kVenderName = "VenderName";
 
-/// Returns `path` without the slashes at its end, but leaves the root "/" as it is.
+/// Returns `path` without trailing slashes, but leaves the root "/" unchanged.
 [[nodiscard]] std::string withoutClosingSlash(std::string path);
 
 /// Returns the full path of `relativePath`, which is relative to the folder that holds the bundle
-/// at `bundlePath`. If `relativePath` is nothing, returns that folder. `bundlePath` must not end in
-/// "/". If `bundlePath` contains no "/", the result is `relativePath`, or an empty string if
-/// `relativePath` is nothing. Removes slashes from the result's end, as withoutClosingSlash() does.
-/// Does not access the disk.
+/// at `bundlePath`. If `relativePath` is not given, returns that folder. `bundlePath` must not end
+/// in "/". If `bundlePath` contains no "/", the result is `relativePath`, or an empty string if
+/// `relativePath` is not given. Removes trailing slashes from the result, as withoutClosingSlash()
+/// does. Does not access the disk.
 [[nodiscard]] std::string fullPath(std::string_view bundlePath,
                                    const std::optional<std::string>& relativePath);
 

@@ -6,9 +6,9 @@ namespace onramp {
 
 namespace {
 
-// Returns the dictionary under `key` in the dynamic store. Returns nothing when `key` is nothing,
-// when the store has no dictionary there, and when the store cannot be read. The store reads `key`
-// as a regular expression.
+// Returns the dictionary that the dynamic store has under `key`. Returns nothing when `key` has no
+// value, when the store has no such dictionary, and when the store cannot be read. The store reads
+// `key` as a regular expression.
 std::optional<Dictionary> stateUnder(const std::string& storeName,
                                      const std::optional<std::string>& key) {
   if (!key) return std::nullopt;

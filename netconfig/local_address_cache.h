@@ -9,7 +9,7 @@
 /// the main thread.
 namespace onramp {
 
-/// Fills the cache if it is empty. From then on, until the process ends, replaces the cached list
+/// Fills the cache if it is empty. From then on, until the process exits, replaces the cached list
 /// whenever an interface's IPv4 configuration changes. Failures are not reported; they leave the
 /// cache empty or out of date.
 void AddNetworkInterfaceListChangeCallbackSCF();

@@ -23,7 +23,7 @@ namespace onramp {
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
 /// Asks the controller to wait until a device is listed, for a limited time. The user info holds an
-/// int under kWaitTime: how many seconds the controller sleeps before each look at the list (see
+/// int under kWaitTime: how many seconds the controller sleeps before each check of the list (see
 /// app/search_wait.h).
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";
 inline constexpr std::string_view kWaitTime = "WAIT_TIME";
@@ -31,8 +31,8 @@ inline constexpr std::string_view kWaitTime = "WAIT_TIME";
 /// The page that lists the devices found on the network. It lists a device if the device's model
 /// was passed to setSearchModelList() and the device reports that it is using its wireless
 /// interface. The wizard creates this page only once. While the window shows another page, this
-/// page keeps its list, and a running search goes on. A running search shares ownership of the page
-/// until stopBrowsing() is called.
+/// page keeps its list, and a running search continues. A running search shares ownership of the
+/// page until stopBrowsing() is called.
 class ChooseDeviceView final : public Page,
                                public KSDeviceObserver,
                                public std::enable_shared_from_this<ChooseDeviceView> {
@@ -43,8 +43,8 @@ class ChooseDeviceView final : public Page,
   static constexpr std::string_view kLocation = "location";  ///< string, the first address, if any
   static constexpr std::string_view kKSDevice = "ksdevice";  ///< dictionary, the device record
 
-  /// How long the controller sleeps before each look at the list, when refreshBrowsing() asks it to
-  /// wait.
+  /// How long the controller sleeps before each check of the list, when refreshBrowsing() asks it
+  /// to wait.
   static constexpr std::chrono::seconds kRefreshPause{3};
 
   explicit ChooseDeviceView(std::unique_ptr<Interface> interface);
@@ -71,7 +71,7 @@ class ChooseDeviceView final : public Page,
   /// The number of devices listed. Callable from any thread.
   [[nodiscard]] std::size_t deviceArrayControllerCnt() const;
 
-  /// The selected list entry; nothing when no entry is selected.
+  /// Returns the selected list entry, or nothing when no entry is selected.
   [[nodiscard]] std::optional<Dictionary> choosedDevice() const;
 
   /// Enables or disables the pop-up button whose menu holds the page's commands.
@@ -95,7 +95,7 @@ class ChooseDeviceView final : public Page,
   /// record has no addresses. Blocks for about 12 seconds for each address that does not respond.
   [[nodiscard]] static bool doesWiFi(const Dictionary& device);
 
-  /// Adds the device's entry to the list, in place of any equal entry. The entry that the user has
+  /// Adds the device's entry to the list, replacing any equal entry. The entry that the user has
   /// chosen stays selected. Until the user chooses an entry, the first one is selected.
   void setServiceToList(const Dictionary& device);
 

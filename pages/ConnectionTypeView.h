@@ -20,7 +20,7 @@ class ConnectionTypeView final : public Page {
   explicit ConnectionTypeView(std::unique_ptr<Interface> interface);
 
   /// Sets the titles and images of both choices. The wired choice is USB and Ethernet for
-  /// kUSBAndEthernet, and only USB for every other type. The selection does not change.
+  /// kUSBAndEthernet, and only USB for any other type. The selection does not change.
   void setConnectionType(ConnectionType type);
 
   /// The selected row: kWirelessRow or kWiredRow.

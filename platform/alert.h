@@ -16,7 +16,8 @@ inline constexpr int kAlertOtherReturn = -1;
 void runCriticalAlert(const std::string& messageText, const std::string& informativeText,
                       const std::string& buttonTitle);
 
-/// The texts of a sheet (an alert that is attached to a window) with two buttons.
+/// The title, message and button titles of a sheet (an alert attached to a window) with two
+/// buttons.
 struct AlertSheet {
   std::string title;
   std::string message;

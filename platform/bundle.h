@@ -10,9 +10,9 @@ namespace onramp {
 
 /// A resource bundle: a folder that holds Contents/Info.plist and Contents/Resources. The resources
 /// include one folder of string tables for each language. An application's bundle also holds the
-/// executable, in a folder of Contents that is named after the operating system. A Bundle object
-/// stores only the path, and every query reads the disk. However, macOS caches what it has read of
-/// a bundle, so the running program may not see later changes to the bundle.
+/// executable, in a subfolder of Contents named after the operating system. A Bundle object stores
+/// only the path, and every query reads the disk. However, macOS caches what it has read from a
+/// bundle, so the running program may not see later changes to the bundle.
 class Bundle {
  public:
   /// Returns the bundle of the running application.
@@ -39,10 +39,10 @@ class Bundle {
   /// Returns the path of the resource file `name`.`type`, or of the file `name` if `type` is empty.
   /// Searches these folders in this order:
   /// - the resources folder itself;
-  /// - the folder of the user's most preferred language among those that the bundle offers;
-  /// - the folder of the bundle's development language;
-  /// - if the bundle offers neither language, the folder of English;
-  /// - if the bundle does not offer English either, the folder of one other language.
+  /// - the folder for the user's most preferred language among those that the bundle offers;
+  /// - the folder for the bundle's development language;
+  /// - if neither exists, the English folder;
+  /// - if there is no English folder either, the folder for any language that the bundle offers.
   /// Returns nothing when none of these folders holds the file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
                                                            const std::string& type) const;
@@ -53,9 +53,9 @@ class Bundle {
   [[nodiscard]] std::optional<std::string> executablePath() const;
 
   /// Returns the string under `key` in the string table `table`, or in "Localizable" if `table` is
-  /// nothing. Returns `value` when the table does not contain `key` or cannot be read. The table is
-  /// the file that pathForResource() finds for the table's name and the type "strings". Do not pass
-  /// an empty `value`, because macOS would return `key` instead.
+  /// not given. Returns `value` when the table does not contain `key` or cannot be read. The table
+  /// is the file that pathForResource() finds for the table's name and the type "strings". Do not
+  /// pass an empty `value`, because macOS would return `key` instead.
   [[nodiscard]] std::string localizedString(const std::string& key, const std::string& value,
                                             const std::optional<std::string>& table) const;
 

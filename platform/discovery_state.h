@@ -9,7 +9,7 @@ namespace onramp {
 // Information about service discovery for diagnostic programs. The wizard does not use this header.
 // Call all functions on the main thread.
 
-/// Returns, in English, the reason why the system's service discovery does not work. Returns
+/// Returns the reason, in English, why the system's service discovery does not work. Returns
 /// nothing when no reason is known. May block until the system answers. A search can be started
 /// even while discovery does not work, and finds services as soon as it works.
 [[nodiscard]] std::optional<std::string> discoveryProblem();
@@ -19,16 +19,16 @@ namespace onramp {
 /// sighting and of the loss of its last one.) Services are not reported as gone when the search
 /// ends, when it stops covering their domain, or when discovery stops working.
 struct ServiceSighting {
-  std::string name;       ///< as NetService::name()
-  std::string type;       ///< as NetService::type()
-  std::string domain;     ///< as NetService::domain()
+  std::string name;       ///< see NetService::name()
+  std::string type;       ///< see NetService::type()
+  std::string domain;     ///< see NetService::domain()
   std::string interface;  ///< the network interface's name, or its number if the interface is gone
   bool isIPv6 = false;    ///< whether the protocol is IPv6 rather than IPv4
   bool isGone = false;    ///< whether the service is no longer seen on this interface and protocol
 };
 
 /// Makes all searches call `watch` on the main thread for each sighting. Replaces the function that
-/// an earlier call has set. A null `watch` ends the calls. The backend for macOS never calls
+/// an earlier call has set. A null `watch` stops the calls. The backend for macOS never calls
 /// `watch`, because macOS does not report the interface of a sighting.
 void watchSightings(std::function<void(const ServiceSighting&)> watch);
 

@@ -41,9 +41,9 @@ inline constexpr int kSCStatusFailed = 1001;
 inline constexpr int kSCStatusInvalidArgument = 1002;
 inline constexpr int kSCStatusNoStoreSession = 2001;
 
-/// A session with the store. The linked backend defines this type. A function that gets a null
-/// session fails with kSCStatusNoStoreSession. Only one thread at a time may use a session, and
-/// only the main thread may use a session that has a callback.
+/// A session with the store. The linked backend defines this type. A function that is called with a
+/// null session fails with kSCStatusNoStoreSession. Only one thread at a time may use a session,
+/// and only the main thread may use a session that has a callback.
 struct DynamicStore;
 using DynamicStoreRef = std::shared_ptr<DynamicStore>;
 
@@ -55,7 +55,7 @@ using DynamicStoreSourceRef = std::shared_ptr<DynamicStoreSource>;
 using DynamicStoreCallback = std::function<void(const std::vector<std::string>& changedKeys)>;
 
 /// Creates a session. The system uses `name` only for diagnostics. `callback` is called on the main
-/// thread for changes of the keys that setNotificationKeys() has selected. The calls begin when the
+/// thread when keys change that setNotificationKeys() has selected. The calls begin when the
 /// session's source is on the run loop. Returns null on failure.
 [[nodiscard]] DynamicStoreRef createDynamicStore(const std::string& name,
                                                  DynamicStoreCallback callback = nullptr);
@@ -90,12 +90,12 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
 [[nodiscard]] DynamicStoreSourceRef createRunLoopSource(const DynamicStoreRef& store, int order);
 
 /// Adds `source` to the main run loop. The source works even while a modal window is shown. The
-/// loop keeps the source until the process ends. Does nothing when `source` is null or when a
+/// loop keeps the source until the process exits. Does nothing when `source` is null or when a
 /// source of the same session has already been added. If the system provides no thread, the
 /// session's callback is not called until setNotificationKeys() is called again and succeeds.
 void addSourceToMainLoop(const DynamicStoreSourceRef& source);
 
-/// Returns the error code of the last function of this header that failed on the calling thread, or
+/// Returns the error code of the last function in this header that failed on the calling thread, or
 /// kSCStatusOK when no failure is known.
 [[nodiscard]] int lastDynamicStoreError();
 

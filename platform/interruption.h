@@ -5,9 +5,9 @@
 namespace onramp {
 
 /// Passes `action` to performOnMainThread() on SIGINT (an interrupt from the terminal) or SIGTERM
-/// (a request to terminate). A second such signal ends the program at once; the exit status is 128
-/// plus the signal's number. If the system provides no thread to wait for signals, the first signal
-/// ends the program. Call this once, before the program starts other threads.
+/// (a request to terminate). A second such signal terminates the program at once; the exit status
+/// is 128 plus the signal's number. If the system provides no thread to wait for signals, the first
+/// signal terminates the program. Call this once, before the program starts other threads.
 void onInterruption(std::function<void()> action);
 
 }  // namespace onramp

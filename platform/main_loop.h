@@ -9,8 +9,8 @@ namespace onramp {
 /// called.
 void runMainLoop();
 
-/// Makes runMainLoop() return soon after the running action has ended. Has no effect while the loop
-/// is not running. Main thread only.
+/// Makes runMainLoop() return soon after the running action has returned. Has no effect while the
+/// loop is not running. Main thread only.
 void endMainLoop();
 
 }  // namespace onramp

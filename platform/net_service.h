@@ -68,10 +68,10 @@ class NetServiceBrowser {
   /// automatically.
   virtual bool searchForServices(const std::string& domain, const std::string& type) = 0;
 
-  /// Ends the browser for good. The client is not called again.
+  /// Stops the browser for good. The client is not called again.
   virtual void invalidate() = 0;
 
-  /// Ends the running search, if there is one. The search's services are not reported as gone.
+  /// Stops the running search, if there is one. The search's services are not reported as gone.
   virtual void stopSearch() = 0;
 };
 
@@ -106,7 +106,7 @@ class NetService {
 
   /// Returns the addresses that the last resolve found, in the responder's order. If the last
   /// resolve has not succeeded, the list is empty. IPv6 addresses may be missing when the host has
-  /// IPv4 addresses. Each address is a socket address in the BSD layout, even on a system with
+  /// IPv4 addresses. Each address is a socket address in the BSD layout, even on a system that uses
   /// another layout. Byte 0 is the length, byte 1 the family (2 for IPv4, 30 for IPv6), and bytes 2
   /// and 3 are the port in network order. The four bytes of an IPv4 address start at byte 4. The
   /// sixteen bytes of an IPv6 address start at byte 8. Bytes 24 to 27 are the scope of the IPv6

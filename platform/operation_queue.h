@@ -7,8 +7,8 @@
 
 namespace onramp {
 
-/// Runs each operation on a separate thread. The destructor waits until all operations have ended,
-/// so everything that an operation refers to must exist until then.
+/// Runs each operation on a separate thread. The destructor waits until all operations have
+/// finished, so everything that an operation refers to must exist until then.
 class OperationQueue {
  public:
   OperationQueue() = default;

@@ -128,7 +128,7 @@ class ImageView : public View {
   static constexpr OutletKind kKind = OutletKind::kImageView;
   using View::View;
 
-  /// Shows `image`, or nothing when its file is missing or is not an image.
+  /// Shows `image`, or leaves the view blank when its file is missing or is not an image.
   void setImage(const Image& image) const;
   void setImageScaling(ImageScaling scaling) const;
 };
@@ -144,7 +144,7 @@ class ProgressIndicator : public View {
 };
 
 /// A list with columns. The interface file gives each column an identifier. A column shows the text
-/// that each entry has under the column's identifier.
+/// that each entry stores under the column's identifier.
 class TableView : public Control {
  public:
   static constexpr OutletKind kKind = OutletKind::kTableView;
@@ -155,13 +155,14 @@ class TableView : public Control {
   /// once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 
-  /// Set whether the user may move columns, and whether a click on a header selects the column.
+  /// These functions set whether the user may move columns, and whether a click on a header selects
+  /// the column.
   void setAllowsColumnReordering(bool allows) const;
   void setAllowsColumnSelection(bool allows) const;
   /// Shows `title` above the column `identifier`. Does nothing when the table has no column with
   /// that identifier.
   void setColumnHeader(std::string_view identifier, const std::string& title) const;
-  /// Sets whether the user may edit the texts in the column `identifier`. Does nothing in a front
+  /// Sets whether the user may edit the text in the column `identifier`. Does nothing in a front
   /// end whose tables are always read-only.
   void setColumnEditable(std::string_view identifier, bool editable) const;
 };

@@ -9,10 +9,10 @@
 
 namespace onramp {
 
-// Limits for reading property lists. For comparison, a ModelInfo.plist with 5,000 models has about
-// 1.3 megabytes, 60,000 objects (including keys) and a depth of four. The backend libplist also
-// refuses XML lists that would take too many steps to read, such as one with more than about 23,000
-// keys in one dictionary.
+// Limits for reading property lists. For comparison, a ModelInfo.plist with 5,000 models has a size
+// of about 1.3 megabytes, 60,000 objects (including keys) and a depth of four. The backend libplist
+// also rejects XML lists that would take too many steps to read, such as one with more than about
+// 23,000 keys in one dictionary.
 
 /// The maximum size of a file in bytes. It also limits the total size of all strings and data in a
 /// list. A shared object of a binary list counts once for each reference to it.

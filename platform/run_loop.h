@@ -22,12 +22,12 @@ void performOnMainThread(std::function<void()> action);
 /// handle. Must be called on the main thread.
 void runModalForWindow(const Window& window);
 
-/// Ends the innermost call of runModalForWindow(), if there is one. Until that call has ended, the
-/// waiting actions of performOnMainThread() do not run. Callable from any thread.
+/// Ends the innermost call of runModalForWindow(), if there is one. Until that call has returned,
+/// the waiting actions of performOnMainThread() do not run. Callable from any thread.
 void abortModal();
 
 /// Blocks the calling thread for `duration` and then returns true. If the application terminates,
-/// returns false at once, and the caller must end its thread. Must not be called on the main
+/// returns false at once, and the caller must let its thread finish. Must not be called on the main
 /// thread.
 bool sleepOffMainThread(std::chrono::milliseconds duration);
 

@@ -1,6 +1,6 @@
 // Starts a program on an empty display. Prints the milliseconds until the middle of the screen
 // changes, and the program's peak resident memory 0.3 seconds later, in KiB. Then kills the
-// program. Fails if the program ends first, or if it draws nothing within 30 seconds.
+// program. Fails if the program exits first, or if it draws nothing within 30 seconds.
 
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>

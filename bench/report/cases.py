@@ -88,7 +88,7 @@ def parser(description, usage=None):
 
 
 def require(paths, remedy):
-    """Ends the program if one of `paths` is missing, with a message that ends in `remedy`."""
+    """Exits if one of `paths` is missing, with a message that ends in `remedy`."""
     for path in paths:
         if not path.exists():
             sys.exit(f"{sys.argv[0]}: {path} is missing; {remedy}")

@@ -60,8 +60,8 @@ int main(int argc, char** argv) {
     return 0;
   }
   const auto microseconds = [](double nanoseconds) { return nanoseconds / 1000; };
-  std::printf("Medians of %d on loopback [5 %%, 95 %%]\n", kQueries);
-  std::printf("query  %.1f us [%.1f, %.1f]   bare exchange  %.1f us [%.1f, %.1f]   %.3f times\n",
+  std::printf("Medians of %d queries on loopback [5 %%, 95 %%]\n", kQueries);
+  std::printf("query  %.1f us [%.1f, %.1f]   bare exchange  %.1f us [%.1f, %.1f]   ratio  %.3f\n",
               microseconds(query.median()), microseconds(query.quantile(0.05)),
               microseconds(query.quantile(0.95)), microseconds(bare.median()),
               microseconds(bare.quantile(0.05)), microseconds(bare.quantile(0.95)),

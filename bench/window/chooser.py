@@ -21,7 +21,7 @@ BEGIN_SECONDS = 5  # for a search to begin
 
 
 def require_medium(folder):
-    """Returns the medium's full path. Ends the program if the wizard is not on the medium."""
+    """Returns the medium's full path. Exits if the wizard is not on the medium."""
     medium = pathlib.Path(folder).resolve()
     require([medium / PROGRAM],
             "build it: cmake --preset release && cmake --build --preset release --target medium")
@@ -38,7 +38,7 @@ def enter_network(description="/dev/null"):
 class Chooser(Person):
     """A simulated person who opens the wizard's chooser and searches for devices.
 
-    `text` is a dictionary of the medium's English texts.
+    `text` is a dictionary of the medium's English strings.
     """
 
     def __init__(self, desktop, medium, text):

@@ -49,7 +49,7 @@ class Ear:
         while self._heard.poll():
             self._silences.append(self._heard.recv())
         if not self._process.is_alive():
-            raise RuntimeError("the process that listens to the wizard's main loop has ended")
+            raise RuntimeError("the process that listens to the wizard's main loop has exited")
         return [one for one in self._silences if one.began >= since]
 
     def longest(self, since=0):

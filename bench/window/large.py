@@ -31,7 +31,7 @@ from onscreen.processes import wait_for
 from practice_network import PracticeNetwork
 
 SEARCHES = 3
-LOOKS_AT_ALL = 25  # one look in so many reads the whole window; the others read only the list
+LOOKS_AT_ALL = 25  # one in this many looks reads the whole window; the others read only the list
 
 
 class Trial:

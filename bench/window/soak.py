@@ -79,7 +79,7 @@ class Record:
 
     def report(self):
         print(f"{self.seconds():.0f} s, {self.searches} searches, {len(self._devices.changes)} "
-              "changes of the network")
+              "network changes")
         counted = [one for one in self._memory if one[0] >= WARM_UP * self.seconds()]
         if len(counted) > 1:
             hourly = slope([(seconds / 3600, kibibytes) for seconds, _, kibibytes in counted])

@@ -23,8 +23,8 @@ constexpr const char* kOwnerChanges =
 // processor busy.
 constexpr std::chrono::milliseconds kRetryPause{1000};
 
-// Calls need no time limit. A daemon that hangs answers when it resumes, and the bus answers for a
-// daemon that has died.
+// Calls need no time limit. A hung daemon answers once it resumes, and the bus answers on behalf of
+// a dead one.
 constexpr std::uint64_t kForever = std::numeric_limits<std::uint64_t>::max();
 
 }  // namespace
@@ -76,7 +76,7 @@ void Daemon::retryLater() {
 void Daemon::add(Query* query) {
   queries_.push_back(query);
   if (isPresent_) query->ask();
-  runSoon();  // arms the timers that the query's resolve may have started
+  runSoon();  // makes the loop notice new timers, such as a Resolve's time limit
 }
 
 void Daemon::remove(Query* query) {
@@ -104,7 +104,7 @@ bool Daemon::watchDaemon() {
 }
 
 // Asks the bus to start the daemon. This works on systems that start the daemon on demand. The bus
-// reports when the daemon has arrived.
+// reports when the daemon has started.
 void Daemon::startDaemon() {
   const Message request = newBusCall("StartServiceByName");
   if (request && sd_bus_message_append(request.get(), "su", kAvahi, 0U) >= 0) {
@@ -138,8 +138,6 @@ int Daemon::onOwnerChanged(sd_bus_message* message, void* self, sd_bus_error*) {
   return 0;
 }
 
-// In lost(), a query's handler may destroy other queries, which removes them from `queries_`. Here
-// and in lost(), the loop therefore runs over a copy and skips the removed queries.
 void Daemon::arrived() {
   isPresent_ = true;
   for (Query* const query : std::vector(queries_)) {
@@ -147,6 +145,8 @@ void Daemon::arrived() {
   }
 }
 
+// A query's handler may destroy other queries, which removes them from `queries_`. The loop
+// therefore iterates over a copy and skips the removed queries.
 void Daemon::lost() {
   isPresent_ = false;
   ++losses_;

@@ -20,7 +20,7 @@ class LoopThread : public std::enable_shared_from_this<LoopThread> {
 
   LoopThread(const LoopThread&) = delete;
   LoopThread& operator=(const LoopThread&) = delete;
-  /// Ends the thread and waits until it has ended. This takes up to a second if the thread is
+  /// Stops the thread and waits for it to finish. This takes up to a second if the thread is
   /// pausing after a failure.
   ~LoopThread();
 
@@ -37,7 +37,7 @@ class LoopThread : public std::enable_shared_from_this<LoopThread> {
 
   sd_event* loop_;
   int descriptor_;            ///< the loop's descriptor; readable when the loop has something to do
-  posix::Descriptor resume_;  ///< an eventfd; readable when the thread must continue or end
+  posix::Descriptor resume_;  ///< an eventfd; readable when the thread must continue or stop
   bool isRunSoon_ = false;    ///< runSoon() has asked for a run that has not begun yet
   std::atomic<bool> hasFailed_ = false;
   std::atomic<bool> isEnding_ = false;

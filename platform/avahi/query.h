@@ -39,7 +39,7 @@ class Query {
   ~Query();
 
   /// Returns whether the question failed for good, because the daemon called it invalid or because
-  /// it could not be put into a message. The query then gets no result and is not sent again.
+  /// it could not be encoded in a message. The query then gets no result and is not sent again.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:

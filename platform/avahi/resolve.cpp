@@ -9,7 +9,7 @@ namespace onramp::avahi {
 
 namespace {
 
-// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. In this
+// How long a resolve waits for IPv4 addresses before it accepts IPv6 addresses instead. During this
 // time, the daemon can repeat the question once if the first answer was lost.
 constexpr std::chrono::milliseconds kGraceForIPv4{2000};
 

@@ -32,11 +32,11 @@ struct Server {
 /// resolve starts again when the daemon is back.
 class Resolve {
  public:
-  /// Called when the resolve ends, at most once, from inside sd-event's loop. The argument is
-  /// nothing when the time is up. The function must not destroy the resolve.
+  /// Called when the resolve ends, at most once, from inside sd-event's loop. The argument has no
+  /// value when the time is up. The function must not destroy the resolve.
   using Report = std::function<void(std::optional<Resolution>)>;
 
-  /// The daemon must outlive the resolve. Without a `timeLimit`, the resolve may run for ever.
+  /// The daemon must outlive the resolve. Without a `timeLimit`, the resolve may run forever.
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
@@ -61,7 +61,7 @@ class Resolve {
   Timer graceForIPv4_;
   bool isGraceOver_ = false;
   unsigned losses_ = 0;           ///< the daemon's losses() when the resolve last began
-  std::optional<Server> server_;  ///< nothing until the daemon has named the host
+  std::optional<Server> server_;  ///< no value until the daemon has named the host
   // This query is destroyed as soon as it is answered, because the daemon limits the number of
   // queries that a program may have open.
   std::optional<Query> service_;

@@ -3,7 +3,7 @@
 namespace onramp {
 
 // Always returns nothing, because macOS restarts mDNSResponder, its program for service discovery,
-// whenever that program ends.
+// whenever that program exits.
 std::optional<std::string> discoveryProblem() {
   return std::nullopt;
 }

@@ -88,8 +88,8 @@ class CFService final : public NetService, public std::enable_shared_from_this<C
   void cancel() override { CFNetServiceCancel(service_.get()); }
 
  private:
-  // `self` keeps the object alive during the call, because the client may release every other
-  // handle to it.
+  // `self` keeps the object alive during the call, because the client may release all other handles
+  // to it.
   static void resolved(CFNetServiceRef, CFStreamError* error, void* info) {
     const auto self = static_cast<CFService*>(info)->shared_from_this();
     self->isResolved_ = !error || error->error == 0;

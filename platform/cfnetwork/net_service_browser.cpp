@@ -75,8 +75,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
     ++search_;
   }
 
-  // `self` keeps the object alive during the call, because the client may release every other
-  // handle to it.
+  // `self` keeps the object alive during the call, because the client may release all other handles
+  // to it.
   static void browsed(CFNetServiceBrowserRef, CFOptionFlags flags, CFTypeRef found,
                       CFStreamError* error, void* info) {
     const auto self = static_cast<CFBrowser*>(info)->shared_from_this();
@@ -115,7 +115,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   }
 
   // Reports all services as gone, reports the error, and restarts the search after a pause. A
-  // search fails, for instance, when the responder ends. The new search finds the services again.
+  // search fails, for instance, when the responder exits. The new search finds the services again.
   // Stopping the failed search may cause another error, which this function ignores.
   void failed(NetServiceError error) {
     if (isFailed_ || !domain_) return;

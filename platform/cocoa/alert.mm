@@ -7,8 +7,8 @@
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
-/// The delegate of one sheet. When the sheet ends, calls the function with kAlertOtherReturn or
-/// kAlertDefaultReturn, and releases itself.
+/// The delegate of one sheet. When the sheet closes, calls the function given to the initializer
+/// with kAlertOtherReturn or kAlertDefaultReturn, and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }
@@ -26,7 +26,7 @@
          returnCode:(NSInteger)returnCode
         contextInfo:(void*)contextInfo {
   [self autorelease];
-  // Code outside this file can also end the sheet, with a return code that belongs to no button.
+  // Code outside this file can also close the sheet, with a return code that belongs to no button.
   _didEnd(returnCode == NSAlertSecondButtonReturn ? onramp::kAlertOtherReturn
                                                   : onramp::kAlertDefaultReturn);
 }
@@ -65,7 +65,7 @@ void beginAlertSheet(const AlertSheet& sheet, const Window& window,
   const Retained<NSAlert> alert = makeAlert(sheet.title, sheet.message);
   [alert.get() addButtonWithTitle:toNSString(sheet.defaultButton)];
   [alert.get() addButtonWithTitle:toNSString(sheet.otherButton)];
-  // Without this call, AppKit would refuse to quit while the sheet is shown.
+  // Without this call, AppKit would not let the application quit while the sheet is open.
   [[alert.get() window] setPreventsApplicationTerminationWhenModal:NO];
   [alert.get() beginSheetModalForWindow:cocoa::nativeOf<NSWindow>(window)
                           modalDelegate:[[OnrampSheetEnd alloc] initWithFunction:std::move(didEnd)]

@@ -4,7 +4,7 @@
 
 namespace onramp::cocoa {
 
-/// Makes `window` as large as its contents need, up to the size of the screen. The window never
+/// Makes `window` as large as its contents require, up to the size of the screen. The window never
 /// shrinks, and its middle stays in place as far as the screen allows. Also arranges the contents,
 /// as described below. Call this whenever a text has changed or a view has been shown or hidden.
 /// Does nothing when `window` is nil.

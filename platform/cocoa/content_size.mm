@@ -250,7 +250,7 @@ void enlarge(NSWindow* window, CGFloat width, CGFloat height) {
 
 }  // namespace
 
-// Sets the width first, because the height of wrapped texts depends on it.
+// Sets the width first, because the height of wrapped text depends on it.
 void fitWindow(NSWindow* window) {
   NSView* const content = [window contentView];
   if (!content) return;

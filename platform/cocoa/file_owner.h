@@ -6,7 +6,7 @@
 
 /// Represents an InterfaceOwner in AppKit, where the owner of an interface file must be an
 /// Objective-C object. If the file binds a control to a key of this object, the control shows the
-/// InterfaceOwner's text under that key.
+/// InterfaceOwner's text for that key.
 @interface OnrampFileOwner : NSObject {
   onramp::InterfaceOwner* _owner;
   NSMutableSet* _boundKeys;

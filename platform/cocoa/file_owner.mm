@@ -29,8 +29,8 @@
   _window = window;
 }
 
-// A binding calls this function to get the text under its key. After the first call for a key, this
-// object reports every change of that text. Each binding to the key then calls this function again.
+// A binding calls this function to get the text for its key. After the first call for a key, this
+// object reports every change to that text. Each binding to the key then calls this function again.
 - (id)valueForUndefinedKey:(NSString*)key {
   const std::string name = onramp::cocoa::toStdString(key);
   if (![_boundKeys containsObject:key]) {

@@ -67,8 +67,8 @@ NSView* findView(NSView* view, NSString* identifier, Class kind) {
   return nil;
 }
 
-// Makes each page title a heading for assistive programs. A page title is a text field whose
-// identifier ends in "Title". AppKit has no constant for the role of a heading.
+// Marks each page title as a heading for assistive technology. A page title is a text field whose
+// identifier ends in "Title". AppKit has no constant for the heading role.
 void describe(NSView* view) {
   if ([view isKindOfClass:[NSTextField class]] && [[view identifier] hasSuffix:@"Title"]) {
     [NSAccessibilityUnignoredDescendant(view) setAccessibilityRole:@"AXHeading"];
@@ -89,8 +89,8 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// Makes each button perform its action on `owner`. These buttons have no target yet, because the
-// interface file sends their actions to the first responder.
+// Makes buttons perform their actions on `owner`. Skips buttons that have no action or already have
+// a target. The interface file connects the other buttons to the first responder, not to a target.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {
@@ -109,8 +109,8 @@ void connectActions(NSView* view, InterfaceOwner& owner,
     connectActions(subview, owner, actions);
 }
 
-// Returns the file's top-level objects, or nil if the file is missing or damaged. AppKit reports a
-// failure with an exception or with the result NO.
+// Returns the file's top-level objects, or nil if the file is missing or damaged. AppKit reports
+// failure either by throwing an exception or by returning NO.
 NSArray* instantiate(NSString* name, OnrampFileOwner* owner) {
   NSArray* topLevelObjects = nil;
   @try {
@@ -145,8 +145,8 @@ std::unique_ptr<Interface> Interface::load(const std::string& name, InterfaceOwn
     connectActions(view, owner, tree->actions);
   }
   if (NSWindow* const window = [tree->owner.get() window]) {
-    // Without this call, AppKit would refuse to quit during a modal loop or a sheet. With it,
-    // AppKit asks the delegate.
+    // Without this call, AppKit would not let the application quit while a modal loop is running or
+    // a sheet is open. With it, AppKit asks the delegate.
     [window setPreventsApplicationTerminationWhenModal:NO];
     localize([window contentView], name);
     connectActions([window contentView], owner, tree -> actions);
@@ -158,8 +158,8 @@ View Interface::view() const {
   return View(cocoa::toNative(rootView(tree_->topLevelObjects.get())));
 }
 
-// The file stores the page's class in the root view's identifier, because AppKit does not know page
-// classes.
+// The file stores the page's class in the root view's identifier, because AppKit has no concept of
+// a page class.
 std::string Interface::viewClass() const {
   return toStdString([rootView(tree_->topLevelObjects.get()) identifier]);
 }

@@ -97,7 +97,7 @@ void performOnMainThread(std::function<void()> action) {
 }
 
 // Starts AppKit's loop again if it ends without a call of abortModal(), for example because the
-// user has pressed a key that cancels.
+// user has pressed a key that cancels the loop.
 void runModalForWindow(const Window& window) {
   // The loop counts as running before the window is shown, because showing the window may run a
   // posted action that calls abortModal().

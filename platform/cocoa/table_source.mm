@@ -91,7 +91,7 @@ CGFloat leastNameWidth(NSCell* cell) {
   [self showSelection];
 }
 
-// Makes every column except the first one at least as wide as its texts. The first column shows
+// Makes every column except the first one at least as wide as its text. The first column shows
 // names. If necessary, this column gets narrower, but it keeps room for its title and for 24
 // letters. If the table is still too narrow, makes the window wider. Does nothing if there is only
 // one column.

@@ -9,7 +9,7 @@ using cocoa::nativeOf;
 
 namespace {
 
-// Asks a screen reader to read the text of `field` aloud. Without this request, it might not read a
+// Asks a screen reader to read the text of `field` aloud. Without this request, it might not read
 // text that appears away from the keyboard focus.
 void announce(NSTextField* field) {
   NSDictionary* const announcement = [NSDictionary

@@ -16,7 +16,7 @@ class Reference {
   /// returned. Does not retain `object`, which may be null.
   explicit Reference(Ref object) : object_(object) {}
 
-  /// Retains `object`, which somebody else owns and which may be null.
+  /// Retains `object`, which the caller does not own and which may be null.
   [[nodiscard]] static Reference retaining(Ref object) {
     if (object) CFRetain(object);
     return Reference(object);

@@ -21,10 +21,10 @@ struct Language {
 
 /// Returns the languages in which to look for a resource, spelled as in `offered`. The languages
 /// come in this order:
-/// - the matches of the first language in `preferred` that has a match: first the match with the
+/// - the matches for the first language in `preferred` that has a match: first the match with the
 ///   same region, then one without a region, then those with other regions;
-/// - the matches of `development`;
-/// - if there are none of these, the matches of English;
+/// - the matches for `development`;
+/// - if there are none of these, the matches for English;
 /// - if there are none of these either, the alphabetically first well-formed language in `offered`.
 /// Two languages whose scripts are known and differ never match. The result is empty when `offered`
 /// has no well-formed language.

@@ -14,7 +14,7 @@ namespace onramp {
 
 namespace {
 
-// Octal escapes stand for characters of the NEXTSTEP character set. The lower half of that set is
+// Octal escapes encode characters of the NEXTSTEP character set. The lower half of that set is
 // ASCII, and this table is the upper half.
 constexpr std::array<char16_t, 128> kNextStepUpperHalf = {
     0x00A0, 0x00C0, 0x00C1, 0x00C2, 0x00C3, 0x00C4, 0x00C5, 0x00C7, 0x00C8, 0x00C9, 0x00CA, 0x00CB,

@@ -176,8 +176,8 @@ class BinaryWalk {
     return object.skip(cost.bytes);
   }
 
-  // Refuses every UTF-16 string that contains a null character, because libplist ends the process
-  // when a key contains one.
+  // Refuses every UTF-16 string that contains a null character, because libplist terminates the
+  // process when a key contains one.
   static bool measureUTF16(std::uint64_t units, ByteReader& object, Cost& cost) {
     ByteReader text = object;
     if (!measureBytes(units, 2, object, cost)) return false;

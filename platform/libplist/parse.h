@@ -9,8 +9,9 @@
 namespace onramp::libplist {
 
 /// Returns the value in `bytes`, an XML property list (in UTF-8 or UTF-16) or a binary one. Returns
-/// nothing when `bytes` are malformed or exceed a limit. `problem` then gets the place and the
-/// reason, but stays empty if only libplist, and not our own check, finds a fault.
+/// nothing when `bytes` are malformed or exceed a limit. In that case, stores the place and the
+/// reason in `problem`, but leaves it empty if libplist finds a fault that our own check has
+/// missed.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 

@@ -15,7 +15,7 @@ namespace onramp::libplist {
 /// - `text` has a null character or containers that are not properly nested;
 /// - `text` has markup that libplist might parse differently from this check, such as a document
 ///   type with an internal subset.
-/// `problem` then gets the place and the reason.
+/// In these cases, stores the place and the reason in `problem`.
 [[nodiscard]] std::optional<std::string> admittedXML(std::string text, ParseProblem& problem);
 
 }  // namespace onramp::libplist

@@ -15,9 +15,9 @@ namespace onramp::netlink {
 
 namespace {
 
-// Reads and discards all messages that wait on the socket. The error ENOBUFS counts as a message:
-// the kernel has dropped messages for which the socket's buffer was too small. Returns false when
-// the socket is unusable.
+// Reads and discards all messages waiting on the socket. The error ENOBUFS counts as a message: the
+// kernel has dropped messages for which the socket's buffer was too small. Returns false when the
+// socket is unusable.
 bool drain(int socket) {
   for (;;) {
     std::uint8_t byte = 0;

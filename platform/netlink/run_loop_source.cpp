@@ -17,8 +17,8 @@ void addSourceToMainLoop(const DynamicStoreSourceRef& source) {
   static std::vector<DynamicStoreSourceRef> sourcesOnLoop;
   sourcesOnLoop.push_back(source);
 
-  // Makes the main thread look for changes. If the kernel reports more changes before the main
-  // thread looks, one look covers all of them.
+  // Makes the main thread check for changes. If the kernel reports more changes before the main
+  // thread does so, a single check covers all of them.
   const auto posted = std::make_shared<std::atomic<bool>>(false);
   store->changesArrived = [posted, weak = std::weak_ptr(store)] {
     if (posted->exchange(true)) return;

@@ -9,8 +9,8 @@
 namespace onramp {
 
 enum class Session {
-  kOwn,  ///< a new session, so that the started program survives the end of the caller's terminal
-  kShared,  ///< the caller's session, so that the started program may end with the terminal
+  kOwn,  ///< a new session, so that the started program survives when the caller's terminal closes
+  kShared,  ///< the caller's session, so that the program may be killed when the terminal closes
 };
 
 /// Starts the program at `executable` with `arguments`. The program starts with no signal blocked
@@ -20,8 +20,8 @@ enum class Session {
                                                 const std::vector<std::string>& arguments,
                                                 Session session);
 
-/// Blocks until `process` ends. Returns the exit status, or nothing when a signal ended the process
-/// or the wait failed.
+/// Blocks until `process` exits. Returns the exit status, or nothing when a signal terminated the
+/// process or the wait failed.
 std::optional<int> waitForProcess(pid_t process);
 
 }  // namespace onramp

@@ -2,7 +2,7 @@
 
 namespace onramp::qt {
 
-/// Lets assistive programs recognise headings and groups of radio buttons. Call this once, before
+/// Lets assistive technology recognise headings and groups of radio buttons. Call this once, before
 /// the first interface file is loaded.
 void describeControls();
 

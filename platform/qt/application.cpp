@@ -40,8 +40,8 @@ std::vector<QPointer<QWidget>>& hiddenWindows() {
   return windows;
 }
 
-// Reads the options. Ends the process after --help or --version, or with an error message if an
-// option is invalid.
+// Reads the options. Exits after --help or --version, and with an error message if an option is
+// invalid.
 void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
   parser.setApplicationDescription(
@@ -92,7 +92,7 @@ void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString
   if (isVerbose) std::fprintf(stderr, "%s\n", qPrintable(message));
 }
 
-// Creates the application object. Ends the process with a message if there is no display.
+// Creates the application object. Exits with a message if there is no display.
 std::unique_ptr<QApplication> makeApplication(int& argc, char** argv) {
   const QtMessageHandler usual = qInstallMessageHandler(exitWithoutDisplay);
   auto application = std::make_unique<QApplication>(argc, argv);

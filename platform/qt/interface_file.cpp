@@ -71,7 +71,7 @@ class Loader final : public QUiLoader {
  private:
   // Creates the loader while Qt's list of library paths is empty. Otherwise, QUiLoader's
   // constructor would load every Designer plug-in in these paths, and these plug-ins would load
-  // many libraries of Qt.
+  // many Qt libraries.
   static Loader* makeWithoutPlugIns() {
     const QStringList paths = QCoreApplication::libraryPaths();
     QCoreApplication::setLibraryPaths({});

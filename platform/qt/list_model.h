@@ -15,7 +15,7 @@ class ListModel final : public QAbstractTableModel {
   Q_OBJECT
 
  public:
-  /// Screen readers announce each row by its texts in the columns `spokenColumns`.
+  /// Screen readers announce each row by its text in the columns `spokenColumns`.
   ListModel(QStringList columns, QStringList spokenColumns, QObject* parent);
 
   /// Returns the height of a row, including some space around its text.
@@ -38,7 +38,8 @@ class ListModel final : public QAbstractTableModel {
                                     int role) const override;
 
  private:
-  /// Returns the string under `column` in the entry of `row`, or an empty string if there is none.
+  /// Returns the string that the entry in `row` has under `column`, or an empty string if there is
+  /// none.
   [[nodiscard]] QString text(int row, const QString& column) const;
 
   [[nodiscard]] QString spokenName(int row) const;
@@ -47,7 +48,7 @@ class ListModel final : public QAbstractTableModel {
   const QStringList spokenColumns_;
   QStringList headers_;
   const ArrayController* controller_ = nullptr;
-  int rows_ = 0;  ///< the number of rows that the views know of
+  int rows_ = 0;  ///< the number of rows last reported to the views
 };
 
 }  // namespace qt

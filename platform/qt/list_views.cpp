@@ -88,7 +88,7 @@ void ColumnsWidget::resizeEvent(QResizeEvent* event) {
   adjustWidths();
 }
 
-// The user may make only the first column too narrow for its texts.
+// The user may make only the first column too narrow for its text.
 void ColumnsWidget::sectionResized(int column, int width) {
   if (QGuiApplication::mouseButtons() == Qt::NoButton) return;
   isUsersLayout_ = true;

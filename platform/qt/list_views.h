@@ -8,7 +8,7 @@
 
 namespace onramp::qt {
 
-/// Returns the minimum height of the rows of a list, without its frame and header.
+/// Returns the minimum height of a list's row area, excluding the frame and header.
 [[nodiscard]] int leastListHeight();
 
 /// Returns the minimum width of a column of names.
@@ -46,18 +46,18 @@ class ListWidget final : public FramedView<QListView> {
   TypeAhead typeAhead_;
 };
 
-/// A list with several columns. The first column gets the rest of the width, but at least
-/// leastNameWidth(). Every other column is as wide as its contents. Once the user has dragged a
-/// column's edge, the widths are no longer adjusted.
+/// A list with several columns. The first column gets the width that the other columns leave, but
+/// at least leastNameWidth(). Each other column is as wide as its contents. Once the user has
+/// dragged a column's edge, the widths are no longer adjusted.
 class ColumnsWidget final : public FramedView<QTreeView> {
   Q_OBJECT
 
  public:
   explicit ColumnsWidget(QWidget* parent = nullptr);
 
-  /// Call this after every change of the contents or of a header. Adjusts the column widths at
-  /// once, or after a short pause if the last adjustment was only a moment ago. All calls during
-  /// the pause share one adjustment.
+  /// Call this whenever the contents or a header changes. Adjusts the column widths at once, or
+  /// after a short pause if the last adjustment was only a moment ago. All calls during the pause
+  /// share one adjustment.
   void fitColumns();
 
   void keyboardSearch(const QString& text) override { typeAhead_.type(*this, text); }
@@ -67,7 +67,7 @@ class ColumnsWidget final : public FramedView<QTreeView> {
   void resizeEvent(QResizeEvent* event) override;
 
  private:
-  /// Returns the width that shows all texts of the column in full.
+  /// Returns the width needed to show every cell of the column in full.
   [[nodiscard]] int neededWidth(int column) const;
 
   /// Returns the total width that all columns except the first one need.

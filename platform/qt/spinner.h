@@ -5,9 +5,9 @@
 
 namespace onramp::qt {
 
-/// A wheel of spokes that turns from start() to stop(). Assistive programs see the turning spinner
-/// as an indeterminate progress bar. If the spinner is turning when it appears, it takes the
-/// keyboard focus, so that these programs read out what the user is waiting for.
+/// A wheel of spokes that turns from start() to stop(). Assistive technology sees the turning
+/// spinner as an indeterminate progress bar. If the spinner is turning when it appears, it takes
+/// the keyboard focus, so that screen readers announce what the user is waiting for.
 class Spinner final : public QProgressBar {
   Q_OBJECT
 

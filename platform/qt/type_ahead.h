@@ -11,7 +11,7 @@ namespace onramp::qt {
 /// starts with the typed text, ignoring case.
 class TypeAhead {
  public:
-  /// Call this when the user has typed `text`. Joins texts that are typed in quick succession, and
+  /// Call this when the user has typed `text`. Joins text that is typed in quick succession, and
   /// selects the first row that matches. The search starts at the current row, or at the next one
   /// if the user types the same text again after a pause. After the last row, it continues at the
   /// first row. If one letter was typed several times quickly and no row matches the joined

@@ -213,7 +213,7 @@ TEST_F(Navigation, TheSheetAfterAnEmptySearchOffersTheSupportPage) {
   EXPECT_THAT(screen.opened, ElementsAre("http://support.kestrel.example/g/d/c2f2/KS7/ja/jp/"));
   EXPECT_EQ(buttons(), "[BTN_CANCEL](BTN_NEXT)");
 
-  // The message text is a format string, in which "%%" stands for a percent sign.
+  // The message text is a format string, in which "%%" means a percent sign.
   medium.setEnvironment("LANG", "en_US.UTF-8");
   medium.write(kEnglishTexts,
                std::string("INST_TXT_ALERT_WIFI_DEVICENOTFOUND = \"100%% of 5%%\";"));

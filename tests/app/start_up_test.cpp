@@ -111,7 +111,7 @@ void leaveFile(const std::string& file) {
 
 TEST_F(StartUp, RemovesTheFilesThatEarlierRunsLeft) {
   describeTwoModels();
-  const pid_t ended = fork();  // the identifier of a process that has ended
+  const pid_t ended = fork();  // the identifier of a process that has exited
   if (ended == 0) _exit(0);
   waitpid(ended, nullptr, 0);
   std::vector<std::string> kept;
@@ -162,10 +162,10 @@ TEST_F(StartUp, CopesWithMissingAndInvalidFiles) {
       const auto before = filesBelow(medium.path(""));
       launch();
       if (file == kEnglishTexts) {
-        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "buttons show the keys of missing texts";
+        EXPECT_EQ(buttons(), "[BTN_CANCEL][BTN_NEXT]") << "buttons show keys of missing strings";
         screen.click("rightButton");
       } else {
-        // No wireless model can be read from such a medium, so the wizard shows no page and ends.
+        // No wireless model can be read from such a medium, so the wizard shows no page and quits.
         EXPECT_EQ(page(), "");
         screen.runTimers();
       }

@@ -136,7 +136,7 @@ class Wizard : public testing::Test {
   }
 
   /// Expects that the desktop was asked to open the package and nothing else, and that the
-  /// application ends a second later.
+  /// application terminates a second later.
   void expectPackageOpenedAndQuit() {
     EXPECT_EQ(screen.opened, std::vector{medium.path("Pkg/Kestrel.pkg")});
     EXPECT_FALSE(screen.terminated);

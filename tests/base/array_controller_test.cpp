@@ -67,7 +67,7 @@ TEST(ArrayController, SortsStablyByTheSortKeyAndKeepsTheSelection) {
   list.setSelectedObject(entry("b", "150"));
   list.addObjects({entry("a"), entry("B")});
   list.rearrange();
-  EXPECT_EQ(shown(list), sorted + "aB") << "without a sort key, the order stays";
+  EXPECT_EQ(shown(list), sorted + "aB") << "without a sort key, the order does not change";
   list.setSortKey("name");
   list.rearrange();
   EXPECT_EQ(shown(list), "Ba" + sorted);

@@ -55,8 +55,8 @@ class Search:
                 if word in (None, event[1]) and name in (None, event[2])]
 
     def wait(self, condition):
-        """Waits until `condition()` is true, and returns its value. Raises AssertionError after
-        PATIENCE seconds."""
+        """Waits until `condition()` is true, and returns its value. Raises AssertionError
+        if that takes longer than PATIENCE seconds."""
         with self._news:
             if not self._news.wait_for(condition, PATIENCE):
                 raise AssertionError(f"the expected event is not among these: {self._events}")
@@ -90,7 +90,7 @@ class Avahi:
         deadline = time.monotonic() + PATIENCE
         while process.exists():
             if time.monotonic() > deadline:
-                raise AssertionError("avahi-daemon does not end")
+                raise AssertionError("avahi-daemon does not exit")
             time.sleep(0.01)
 
     def freeze(self):
@@ -101,7 +101,7 @@ class Avahi:
 
     def start(self, **settings):
         """Starts the daemon. Each of `settings` replaces the setting of the same name in the
-        configuration file. In the arguments' names, "_" stands for "-"."""
+        configuration file. In the names of the arguments, "_" replaces "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

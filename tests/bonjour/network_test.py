@@ -120,7 +120,7 @@ class Devices(Network):
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
                         # Before Avahi announces a new device, it checks the device's name. During
-                        # this check, all sightings of the removed device end.
+                        # this check, all sightings of the removed device disappear.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],
@@ -221,7 +221,7 @@ class Daemons(Network):
             search.wait_for("update", "Kestrel")
             self.avahi.freeze()
             self.addCleanup(self.avahi.thaw)
-            # Calls on the message bus time out after 25 seconds. The probe must end sooner.
+            # Calls on the message bus time out after 25 seconds. The probe must finish sooner.
             self.assertEqual(subprocess.run(
                 [PROBE, "addresses", "dnssd://Kestrel._ipp._tcp.local.", "1"], check=False,
                 stdout=subprocess.DEVNULL, timeout=20).returncode, 1)

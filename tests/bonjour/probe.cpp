@@ -1,5 +1,5 @@
 // Searches for services or looks up addresses, and prints a line for each event: the seconds since
-// the start, a word for the event, and details. A search ends when the standard input ends. Tests
+// the start, a word for the event, and details. A search stops at the end of standard input. Tests
 // and benchmarks run this program on a practice network.
 //
 //   bonjour_probe search TYPE            searches for services of TYPE with KSBonjourSearch

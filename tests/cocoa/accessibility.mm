@@ -5,11 +5,11 @@
 // The environment variable ONRAMP_ACCESSIBILITY_FILE names the answer file. To ask, the test
 // creates a question file, whose name is the answer file's name with ".question" appended. The
 // application's main loop removes the question file and writes the answer file. The answer is a
-// JSON array. Its first object stands for the application, and has the keys "role" (with the value
+// JSON array. Its first object describes the application, and has the keys "role" (with the value
 // "application"), "name", "states" and "presses" (the number of left mouse button presses in its
-// windows so far). Every other object stands for a visible window or control, and has the keys
-// "role", "name", "states", "x", "y", "width" and "height". Roles and states have their AT-SPI
-// names, except that the state "cut off" marks a text that lacks room. Lengths are in pixels, and x
+// windows so far). Each of the remaining objects describes a visible window or control, and has the
+// keys "role", "name", "states", "x", "y", "width" and "height". Roles and states have their AT-SPI
+// names, except that the state "cut off" marks text that does not fit. Lengths are in pixels, and x
 // and y start at the screen's upper left corner.
 
 #include <unistd.h>

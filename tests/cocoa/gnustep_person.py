@@ -22,7 +22,7 @@ _MENU_BAR_ITEM = "Onramp OSX"
 
 
 class GNUstepPerson(Person):
-    """Starts a program on a desktop and uses its window. A `with` statement ends the program."""
+    """Starts a program on a desktop and uses its window. A `with` statement terminates the program."""
 
     follows_desktop = False
     errors = ()  # using a control that is gone raises no error
@@ -130,7 +130,7 @@ class GNUstepPerson(Person):
         """Returns an entry for the application and then the visible controls.
 
         Waits while the program's main loop is busy. Returns only the entry for the application if
-        the program has ended. Fails if a text is cut off.
+        the program has exited. Fails if any text is cut off.
         """
         self._answer.unlink(missing_ok=True)
         self._question.touch()
@@ -141,7 +141,7 @@ class GNUstepPerson(Person):
         except FileNotFoundError:
             return [{"role": "application", "name": "", "states": [], "presses": 0}]
         for control in controls:
-            assert "cut off" not in control["states"], f"a text is cut off: {control}"
+            assert "cut off" not in control["states"], f"text is cut off: {control}"
         return controls
 
     def _configure(self, folder):

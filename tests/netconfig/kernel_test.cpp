@@ -126,7 +126,7 @@ TEST_F(Kernel, ListsTheAddressesAndThePrimaryInterface) {
   EXPECT_THAT(none, ::testing::Pointee(Array{}));
 }
 
-// Only one test may install the cache's callback, which stays until the process ends.
+// Only one test may install the cache's callback, which stays until the process exits.
 TEST_F(Kernel, CacheFollowsAddressesThatComeAndGo) {
   AddNetworkInterfaceListChangeCallbackSCF();
   std::vector<std::string> expected = {kLoopback};

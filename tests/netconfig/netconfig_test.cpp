@@ -92,7 +92,7 @@ class Netconfig : public ::testing::Test {
  protected:
   void SetUp() override {
     store = Store{};
-    AddNetworkInterfaceListChangeCallbackSCF();  // the callback stays until the process ends
+    AddNetworkInterfaceListChangeCallbackSCF();  // the callback stays until the process exits
   }
 
   Store& store = script();

@@ -192,7 +192,7 @@ TEST_F(Chooser, OneSearchAtATimeFillsTheListAndOnlyARefreshEmptiesIt) {
 
   page->startBrowsing();
   chooseMenuItem(1);
-  EXPECT_THAT(network.browsers, IsEmpty()) << "the set-up tool's command ends the search";
+  EXPECT_THAT(network.browsers, IsEmpty()) << "the set-up tool's command stops the search";
 
   int asked = 0;
   NotificationCenter::defaultCenter().addObserver(

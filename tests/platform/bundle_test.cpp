@@ -72,7 +72,7 @@ TEST_F(BundleOnMedium, UsesTheUsersLanguageAndReadsTheFilesEachTime) {
                Dictionary{{"CFBundleDevelopmentRegion", "zh_CN"}});
   EXPECT_EQ(text("k"), "简体");
   resource("ko.lproj/Localizable.strings", "k = ");
-  EXPECT_EQ(text("k"), "fallback") << "a table that cannot be read has no texts";
+  EXPECT_EQ(text("k"), "fallback") << "a table that cannot be read is empty";
   resource("ko.lproj/Localizable.strings", "k = korean;");
   EXPECT_EQ(text("k"), "korean");
 }

@@ -5,7 +5,7 @@
 #include "platform/libplist/parse.h"
 
 // Parses each input, writes it as XML, and parses the XML. A second round must change nothing. The
-// first round may change texts and dates, because XML cannot hold all of them.
+// first round may change strings and dates, because XML cannot hold all of them.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* bytes, std::size_t size) {
   using namespace onramp;
   const auto value =

@@ -104,7 +104,7 @@ class Layout : public testing::TestWithParam<int> {
     }
   }
 
-  // Expects that the menu's texts look the same in a wider menu. A text that is elided in the usual
+  // Expects that the menu's text looks the same in a wider menu. Text that is elided in the usual
   // menu would look different.
   static void expectMenuFits(QMenu& menu) {
     const QSize size = menu.sizeHint();
@@ -119,7 +119,7 @@ class Layout : public testing::TestWithParam<int> {
   }
 
   void expectEverythingFits() const {
-    // Sizes need a few rounds to settle, because a wider text makes the window wider, and a wider
+    // Sizes need a few rounds to settle, because wider text makes the window wider, and a wider
     // window moves the other controls.
     for (int round = 0; round < 5; ++round)
       QApplication::processEvents();

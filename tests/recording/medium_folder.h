@@ -17,7 +17,7 @@ namespace onramp::recording {
 class MediumFolder {
  public:
   /// Makes a medium that holds only an application bundle. Sets the environment variables that
-  /// select the application-support folders, English texts and macOS 10.9.5.
+  /// set the application-support folders, select English and simulate macOS 10.9.5.
   MediumFolder();
   MediumFolder(const MediumFolder&) = delete;
   MediumFolder& operator=(const MediumFolder&) = delete;
@@ -28,14 +28,14 @@ class MediumFolder {
     return root_ / "medium/" + relative;
   }
 
-  /// Write a file on the medium. If the file's folder is missing, create it.
+  /// Writes a file to the medium, creating its folder if needed.
   void write(const std::string& relative, const std::string& bytes) const;
   void write(const std::string& relative, const Dictionary& dictionary) const;
   /// Makes a file on the medium executable by its owner.
   void makeExecutable(const std::string& relative) const;
 
-  /// Writes the medium's three property lists. To `resources`, adds the entries "CDInfo",
-  /// "ModelInfo" and "VenderName" ("Kestrel Imaging"). `modelInfo` maps models' names to their
+  /// Writes the medium's three property lists. Adds the entries "CDInfo", "ModelInfo" and
+  /// "VenderName" ("Kestrel Imaging") to `resources`. `modelInfo` maps models' names to their
   /// entries.
   void describe(const Dictionary& resources, const Dictionary& cdInfo,
                 const Dictionary& modelInfo) const;
@@ -66,7 +66,7 @@ class MediumFolder {
   std::map<std::string, std::optional<std::string>> before_;
 };
 
-/// Returns a model's entry in the model information, with the identifier "k1".
+/// Returns a model-information entry for a model whose identifier is "k1".
 [[nodiscard]] Dictionary model(bool usb, bool wired, bool wireless);
 
 /// Returns the contents of a CDInfo.plist that lists the models with these names.

@@ -21,12 +21,13 @@ class Network {
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
                                              const std::string& domain = "local.");
 
-  /// Tell every running browser for the service's type that the service was found or is gone.
+  /// These functions tell every running browser for the service's type that the service was found
+  /// or is gone.
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// End the service's running resolve: resolves() with these results, and failsToResolve() with
-  /// kNetServiceErrorTimeout. Both do nothing when no resolve is running.
+  /// These functions end the service's running resolve: resolves() with these results, and
+  /// failsToResolve() with kNetServiceErrorTimeout. Both do nothing when no resolve is running.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);
 
@@ -47,8 +48,8 @@ class Network {
   std::vector<NetServiceBrowser*> browsers;  ///< the browsers that are searching
 };
 
-/// Return a socket address in the layout that NetService::addressing() describes. ipv6Address()
-/// returns the address of the loopback interface.
+/// These functions return a socket address in the layout that NetService::addressing() describes.
+/// ipv6Address() returns the address of the loopback interface.
 [[nodiscard]] Data ipv4Address(unsigned char a, unsigned char b, unsigned char c, unsigned char d);
 [[nodiscard]] Data ipv6Address();
 

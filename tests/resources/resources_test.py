@@ -24,7 +24,7 @@ REFERENCES = ("destination", "target", "headerView", "selectedItem", "firstRespo
 VIEWS = ("customView", "textField", "button", "imageView", "matrix", "popUpButton",
          "progressIndicator", "scrollView", "clipView", "scroller", "tableView", "tableHeaderView")
 
-# The keys of the texts that macOS shows when it asks the user for permission.
+# The keys of the strings that macOS shows when it asks the user for permission.
 REASONS = {"NSLocalNetworkUsageDescription", "NSRemovableVolumesUsageDescription"}
 
 # The kind of outlet for each class in Qt's interface files and for each tag in Cocoa's.

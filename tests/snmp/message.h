@@ -9,7 +9,7 @@
 
 namespace onramp {
 
-/// Returns the bytes that the hexadecimal digits in `text` stand for. Spaces are ignored.
+/// Returns the bytes that the hexadecimal digits in `text` encode. Spaces are ignored.
 inline std::vector<std::uint8_t> hex(std::string_view text) {
   std::vector<std::uint8_t> bytes;
   int digits = 0;

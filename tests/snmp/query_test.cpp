@@ -58,7 +58,7 @@ std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
          " " + std::to_string(index);
 }
 
-// Returns the hexadecimal text of a binding with the name 1.3 and the hexadecimal value `value`.
+// Returns the hexadecimal text of a binding named 1.3 with the hexadecimal value `value`.
 std::string binding(const std::string& value) {
   return "30 00 06 01 2B " + value;
 }

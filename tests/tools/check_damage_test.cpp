@@ -69,8 +69,8 @@ class DamagedMedium {
   }
 
   // Returns a copy of `dictionary` in which one random key, at any depth, is removed, renamed or
-  // given a value of another kind. A new name may equal the old one. Appends a description of the
-  // change to `what`.
+  // given a value of a different kind. A new name may equal the old one. Appends a description of
+  // the change to `what`.
   Dictionary damagedCopy(const Dictionary& dictionary, std::string& what) {
     std::vector<Dictionary::Pair> pairs(dictionary.begin(), dictionary.end());
     if (pairs.empty()) return dictionary;

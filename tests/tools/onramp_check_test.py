@@ -131,7 +131,7 @@ MISTAKES = [
     (rename(COMMON, "BonjourNetwork", "BonjorNetwork"), "key-misspelt", "BonjourNetwork"),
     (put(COMMON, "CDInfo", "MacResources/cdinfo.plist"), "path-capitals", "CDInfo.plist"),
     (put(COMMON, "CDInfo", "MacResources/none.plist"), "path-missing", "none.plist"),
-    (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "out of the medium"),
+    (put(COMMON, "CDInfo", "../CDInfo.plist"), "path-outside", "outside the medium"),
     (put(COMMON, "CDInfo", __file__), "path-outside", "from the medium's top"),
     (put(COMMON, "Comment", "x"), "key-unknown", "does not read"),
     (take(COMMON, "PkgInfo"), "key-missing", "PkgInfo", "nothing opens"),
@@ -224,7 +224,7 @@ MISTAKES = [
     # Names on the network and in files.
     (put(COMMON, "BonjourNetwork", "_pdl-datastream._tcp"), "service-dot", "_pdl-datastream._tcp.", "add the dot"),
     (put(COMMON, "BonjourNetwork", "pdl-datastream.tcp."), "service-malformed", "15 letters"),
-    (put(COMMON, "BonjourNetwork", "_http._tcp."), "service-unknown", "no maker and model"),
+    (put(COMMON, "BonjourNetwork", "_http._tcp."), "service-unknown", "cannot read a maker or model"),
     (take(COMMON, "BonjourNetwork"), "service-none", 'no "BonjourNetwork"'),
     (put(COMMON, "BonjourNetwork", ""), "service-none", "an empty service type", "BonjourNetwork"),
     (put(f"{APPLICATION}/Info.plist", "NSBonjourServices", ["_ipp._tcp"]), "service-undeclared", "_pdl-"),

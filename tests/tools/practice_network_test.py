@@ -184,7 +184,7 @@ def processes_in(namespace):
             if os.readlink(path) == namespace:
                 found.append(path)
         except OSError:
-            pass  # The process has ended, or belongs to another user.
+            pass  # The process has exited, or belongs to another user.
     return found
 
 

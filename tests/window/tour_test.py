@@ -37,7 +37,7 @@ class Tour(unittest.TestCase):
             done = subprocess.run([TOUR, "--languages", "de,zh_CN", medium, pictures],
                                   capture_output=True, text=True)
             self.assertEqual(done.returncode, 1, done.stdout + done.stderr)
-            for said in ("goes on with macOS 11.3.0", "the medium has no limit SystemMax",
+            for said in ("continues with macOS 11.3.0", "the medium has no limit SystemMax",
                          "By cable, users see nothing, because Packages/Kestrel.pkg is not on"):
                 self.assertEqual(done.stdout.lower().count(said.lower()) > 1, True, said)
             steps = ["1-models", "2-connection", "3-cable"]

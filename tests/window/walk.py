@@ -124,7 +124,7 @@ class Walk:
             self.network.set(name, note=f"after step {len(self.steps)}")
 
     def listen(self, person, seconds):
-        """Waits for `seconds`, or until the program ends. Raises Wrong if the main loop hangs."""
+        """Waits for `seconds`, or until the program exits. Raises Wrong if the main loop hangs."""
         until = time.monotonic() + seconds
         while True:
             silent = person.round_trip()
@@ -137,7 +137,7 @@ class Walk:
             time.sleep(0.05)
 
     def leave(self, person):
-        """Ends the program. Retries, because the window cannot be closed during a search."""
+        """Closes the program. Retries, because the window cannot be closed during a search."""
         until = time.monotonic() + PATIENCE
         while person.is_running():
             if time.monotonic() > until:
@@ -146,7 +146,7 @@ class Walk:
             person.close_window()
             time.sleep(0.3)
         if person.wait_for_end() != 0:
-            raise Wrong(f"the program ended with status {person.wait_for_end()}")
+            raise Wrong(f"the program exited with status {person.wait_for_end()}")
 
     def check_files(self):
         for folder in (self.desktop.user_folder, self.desktop.local_folder):

@@ -9,9 +9,9 @@ namespace onramp::check {
 inline constexpr const char* kUsualName = "Onramp OSX.app";
 
 /// Returns the name of the application in `root`, the medium's top folder. If there are several,
-/// takes the first in alphabetical order whose name is kUsualName or whose Info.plist has
-/// "CommonResourcePath". If none of them qualifies, takes the first of all. Returns an empty string
-/// when there is no application.
+/// returns the first in alphabetical order whose name is kUsualName or whose Info.plist has
+/// "CommonResourcePath". If none of them qualifies, returns the first of all. Returns an empty
+/// string when there is no application.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
 }  // namespace onramp::check

@@ -37,7 +37,7 @@ void checkApplication(const MediumFiles& files, const Lists& lists);
 /// application declares it.
 void checkIdentity(const Lists& lists, Report& report);
 
-/// Checks the texts of every language. Sets the report's member `languages`.
+/// Checks the texts in every language. Sets the report's member `languages`.
 void checkTexts(const MediumFiles& files, const Lists& lists);
 
 /// Checks the pictures of the connections and the application's background picture.

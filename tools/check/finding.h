@@ -18,8 +18,8 @@ struct Place {
   std::string file{};  ///< relative to the medium
   std::vector<std::string>
       key{};  ///< the keys that lead to the value in a property list or strings table
-  std::optional<std::size_t> line{};  ///< from 1
-  std::optional<std::size_t> byte{};  ///< from 0, in a file that is not text
+  std::optional<std::size_t> line{};  ///< counted from 1
+  std::optional<std::size_t> byte{};  ///< counted from 0, in a file that is not text
 };
 
 /// One mistake on a medium. `found`, `expected`, `effect` and `remedy` are phrases without a full

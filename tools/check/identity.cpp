@@ -44,7 +44,7 @@ void checkDeclared(const Lists& lists, const std::string& type, Report& report) 
   report.findings.push_back({.id = "service-undeclared",
                              .place = {.file = lists.informationPath, .key = {kDeclared}},
                              .found = "no " + quoted(bare),
-                             .expected = "the medium's service type, without its closing dot",
+                             .expected = "the medium's service type, without its trailing dot",
                              .effect = "on macOS 15 and later, " + std::string(kNoDevice),
                              .remedy = "add the type"});
 }
@@ -70,10 +70,10 @@ void checkServiceType(const Lists& lists, Report& report) {
   Finding finding{.place = place,
                   .found = "the service type " + quoted(*type),
                   .effect = kNoDevice,
-                  .remedy = "write the type that the devices announce, with its closing dot"};
+                  .remedy = "write the type that the devices announce, with its trailing dot"};
   if (isServiceType(*type + ".")) {
     finding.id = "service-dot";
-    finding.found += " without its closing dot";
+    finding.found += " without its trailing dot";
     finding.nearest = *type + ".";
     finding.remedy = "add the dot";
   } else if (!isServiceType(*type)) {
@@ -82,7 +82,7 @@ void checkServiceType(const Lists& lists, Report& report) {
     finding.expected = "\"_name._tcp.\", with a name of at most 15 letters, digits and hyphens";
   } else if (!identityKeysOf(*type)) {
     finding.id = "service-unknown";
-    finding.found += ", under which the wizard reads no maker and model";
+    finding.found += ", for which the wizard cannot read a maker or model";
     finding.expected = "one of _pdl-datastream._tcp., _printer._tcp., _ipp._tcp., _scanner._tcp.";
   }
   if (finding.id.empty()) {
@@ -125,8 +125,8 @@ void checkVendor(const Lists& lists, Report& report) {
     finding.found = quoted(*written) + ", with characters outside ASCII";
     finding.expected = "only the letters A to Z, digits and spaces";
     finding.effect =
-        "a folder and files whose names some programs may not find, because they "
-        "encode the letters in another way";
+        "some programs may fail to find the folder and its files, because they encode the letters "
+        "differently";
   }
   if (!finding.id.empty()) report.findings.push_back(std::move(finding));
 }
@@ -139,8 +139,9 @@ void checkSeries(const Lists& lists, Report& report) {
                              .place = {.file = lists.descriptionPath, .key = {"KSCSeriesCode"}},
                              .found = "the series code " + quoted(series),
                              .expected = "letters and digits",
-                             .effect = opens ? "the button for the support page opens another page"
-                                             : "the button for the support page opens nothing",
+                             .effect = opens
+                                           ? "the button for the support page opens the wrong page"
+                                           : "the button for the support page opens nothing",
                              .remedy = "write the code as the support site does"});
 }
 

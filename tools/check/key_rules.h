@@ -21,7 +21,7 @@ struct KeyRule {
   std::string_view key;
   Kind kind;
   Need need;
-  const char* otherwise;     ///< the effect if the key is absent or its value is of another kind
+  const char* otherwise;     ///< the effect if the key is absent or its value is of the wrong kind
   const char* meaning = "";  ///< describes the expected value more precisely than its kind
 };
 

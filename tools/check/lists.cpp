@@ -16,10 +16,10 @@ namespace {
 
 constexpr const char* kPackageAtOnce =
     "every model counts as one without wireless, so the package opens at once, without any page";
-constexpr const char* kNothing = "the wizard ends at once, without any page, and no package opens";
+constexpr const char* kNothing = "the wizard quits at once, without any page, and no package opens";
 constexpr const char* kNoModels =
     "the medium has no models, so the package opens at once, without any page";
-constexpr const char* kNoPackage = "nothing opens when the wizard ends";
+constexpr const char* kNoPackage = "nothing opens when the wizard quits";
 constexpr const char* kNoVersionPackage = "nothing opens on the systems that use this key";
 
 constexpr std::array kInformationRules{
@@ -87,7 +87,7 @@ constexpr std::array kOptionRules{
     KeyRule{"PKG_WebLink", Kind::kBoolean, Need::kOptional,
             "the package does not get the intended value"},
     KeyRule{"PKG_KestrelOnline", Kind::kBoolean, Need::kOptional,
-            "an absent key counts as false, a value of another kind as true"},
+            "an absent key counts as false, a value of the wrong kind as true"},
     KeyRule{"PKG_RemoteTool", Kind::kBoolean, Need::kOptional,
             "the package does not get the intended value"},
     KeyRule{"PKG_LabelTool", Kind::kBoolean, Need::kOptional,
@@ -115,7 +115,7 @@ constexpr std::array kInterfaceRules{
             "the model counts as one without wireless"},
 };
 
-// "NAME" stands for a model's name.
+// "NAME" is a placeholder for a model's name.
 constexpr std::array kGroups{
     KeyGroup{"Info.plist", "", kInformationRules},
     KeyGroup{"CDCommonInfo.plist", "", kResourceRules},

@@ -19,8 +19,8 @@ struct KeyGroup {
   std::span<const KeyRule> rules;
 };
 
-/// Returns the keys of all dictionaries that have rules. In a path, "NAME" stands for a model's
-/// name.
+/// Returns the keys of all dictionaries that have rules. In a path, "NAME" is a placeholder for a
+/// model's name.
 [[nodiscard]] std::span<const KeyGroup> keyGroups();
 
 /// The main property lists of a medium. A list that cannot be read has no value. All paths are

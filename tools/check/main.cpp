@@ -36,8 +36,8 @@ bool isMedium(const std::filesystem::path& folder) {
          !check::findApplication(folder.string()).empty();
 }
 
-// Returns why `folder` is not a medium, and what to give in its place. Returns an empty string if
-// it may be a medium.
+// Returns why `folder` is not a medium, and what to give instead. Returns an empty string if it may
+// be a medium.
 std::string reasonAgainst(const std::string& folder) {
   namespace fs = std::filesystem;
   std::error_code error;

@@ -36,7 +36,7 @@ std::vector<std::string> namesIn(const std::string& folder) {
 }
 
 // Returns the components of a relative path with "." and ".." resolved. Returns nothing when the
-// path leads out of its starting folder.
+// path leads outside its starting folder.
 std::optional<std::vector<std::string>> components(const std::string& path) {
   std::vector<std::string> parts;
   for (const fs::path& part : fs::path(path)) {
@@ -139,7 +139,7 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
   const bool isElsewhere = relative.starts_with('/') && fs::exists(relative, ignored) &&
                            !fs::exists(fullPath(relative), ignored);
   if (!parts || isElsewhere || !isInside(fullPath(relative), root_)) {
-    finding.found = use.what + " at " + quoted(relative) + ", which leads out of the medium";
+    finding.found = use.what + " at " + quoted(relative) + ", which leads outside the medium";
     finding.expected = "a path inside the medium";
     finding.remedy = "put the file on the medium and write its path from the medium's top";
     finding.effect = "on a computer that lacks this file, " + use.effect;

@@ -12,7 +12,7 @@
 
 namespace onramp::check {
 
-/// The wizard's use of a file or folder. Findings about the file quote these texts.
+/// The wizard's use of a file or folder. Findings about the file quote these strings.
 struct PathUse {
   Place place{};  ///< where the path is written; without a key if the path is fixed in the wizard
   std::string what{};    ///< the file's role, such as "the medium description"
@@ -34,9 +34,9 @@ class MediumFiles {
   /// Returns the full path at which the wizard looks for `relative`.
   [[nodiscard]] std::string fullPath(const std::string& relative) const;
 
-  /// Returns whether the medium has a file or folder at `relative`. Capital and small letters
-  /// differ, even on a file system that ignores the difference. Reports a path that leads out of
-  /// the medium or to nothing, and returns false for it.
+  /// Returns whether the medium has a file or folder at `relative`. The comparison is
+  /// case-sensitive, even on a case-insensitive file system. Reports a path that is missing or
+  /// leads outside the medium, and returns false for it.
   bool exists(const std::string& relative, const PathUse& use) const;
 
   /// Returns the property list at `relative`. If it is an XML list, reports each repetition of a

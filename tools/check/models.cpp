@@ -40,7 +40,7 @@ class ModelCheck {
   ModelCheck(const Lists& lists, Report& report) : lists_(lists), report_(report) {}
 
   // Reports names that only the medium description has or only the model information has. If two of
-  // these names, one from each list, are almost equal, they make one finding.
+  // these names, one from each list, are almost equal, they are reported as one finding.
   void compareLists() {
     const auto contained = lists_.description->dictionary(kContained);
     const auto described = lists_.models->dictionary("Model");
@@ -126,8 +126,8 @@ class ModelCheck {
   }
 
   // Reports a name that no printer can announce, and a name with suspicious spaces. A device
-  // announces maker and model as two texts, which the wizard joins with a space. Each text has at
-  // most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
+  // announces maker and model as two strings, which the wizard joins with a space. Each string has
+  // at most 255 bytes, including the key in front, which for a printer is "usb_MFG=" or "usb_MDL=".
   void announceable(const std::string& name) {
     constexpr std::size_t kMostBytes = 2 * (255 - 8) + 1;
     const std::size_t space = name.find(' ');
@@ -163,8 +163,8 @@ class ModelCheck {
   }
 
   // Compares the maker, which is the first word of the model's name, with the first word of the
-  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but no
-  // spelling twice.
+  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but
+  // reports each spelling only once.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));

@@ -22,7 +22,7 @@ void writeJSON(std::ostream& out, const Report& report);
 void writeKeys(std::ostream& out);
 
 /// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
-/// room for it, what is shown if the medium lacks it, how often "%@" has to occur in it, and the
+/// room for it, what is shown if the medium lacks it, how often "%@" must occur in it, and the
 /// place where it is shown.
 void writeTexts(std::ostream& out);
 

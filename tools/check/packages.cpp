@@ -99,7 +99,7 @@ class PackageCheck {
            SystemSupport::kSupported;
   }
 
-  // Returns the first version above the range. Returns nothing when the range has no upper end.
+  // Returns the first version above the range. Returns nothing when the range has no upper bound.
   [[nodiscard]] std::optional<Version> end() const {
     const Dictionary& maximum = info_.supportSystemMax();
     if (!isBound(maximum)) return std::nullopt;
@@ -114,7 +114,7 @@ class PackageCheck {
   }
 
   // Returns the range from `from` to `to` in words, such as "10.13.0 up to, but not including,
-  // 13.0". Without `to`, the range has no upper end.
+  // 13.0". Without `to`, the range has no upper bound.
   [[nodiscard]] std::string words(const Version& from, const std::optional<Version>& to) const {
     const std::string first = from == Version{} ? "" : dotted(from);
     if (!to) return first.empty() ? "every system" : first + " and later";

@@ -29,7 +29,7 @@ struct PackageRow {
 /// A language of the message bundle.
 struct LanguageRow {
   std::string name{};
-  std::size_t texts = 0;  ///< how many of the wizard's texts the language has
+  std::size_t texts = 0;  ///< how many of the wizard's texts exist in the language
 };
 
 /// The result of a check: the findings, and what users of the medium will see.

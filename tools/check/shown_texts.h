@@ -17,7 +17,7 @@ struct ShownText {
   int lines = 1;             ///< how many lines there is room for
   /// The maximum number of "%@". If it is not 0, at least one "%@" is required.
   std::size_t mostPlaceholders = 0;
-  /// Whether an English text, rather than the key, is shown when the bundle lacks the text.
+  /// Whether English text, rather than the key, is shown when the bundle lacks the text.
   bool hasFallback = false;
 };
 

@@ -8,7 +8,7 @@ namespace onramp::check {
 
 namespace {
 
-// The number of pairs of bytes after which an object makes no further comparison.
+// The number of pairs of bytes after which an object makes no further comparisons.
 constexpr std::size_t kMostWork = 20'000'000;
 
 std::string lettersOf(std::string_view word) {

@@ -73,7 +73,7 @@ void writeModels(std::ostream& out, const Report& report, std::size_t terminal) 
   const auto cell = [](bool has, const char* word) {
     return has ? std::string(word) : std::string(std::string_view(word).size(), '-');
   };
-  out << "\nModels (their devices have to announce exactly these names):\n";
+  out << "\nModels (their devices must announce exactly these names):\n";
   for (const ModelRow& model : report.models) {
     out << "  " << fitted(printable(model.name), width) << "  " << cell(model.usb, "USB") << "  "
         << cell(model.wired, "wired") << "  " << cell(model.wireless, "wireless") << '\n';

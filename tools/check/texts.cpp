@@ -21,8 +21,8 @@ namespace {
 
 constexpr std::string_view kLanguageFolder = ".lproj";
 
-// Codes of countries that are easily taken for the code of the country's language. None of them is
-// the code of a language.
+// Country codes that are easily mistaken for the code of the country's language. None of them is a
+// language code.
 constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountries{{{"jp", "ja"},
                                                                                    {"cn", "zh"},
                                                                                    {"kr", "ko"},
@@ -33,7 +33,7 @@ constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountrie
                                                                                    {"vn", "vi"}}};
 
 // Returns the code of the language that the folder's author probably meant. Returns nothing when
-// `code` is not the code of a country.
+// `code` is not a country code.
 std::optional<std::string> languageOfCountry(std::string_view code) {
   const auto found = std::find_if(kCountries.begin(), kCountries.end(),
                                   [&](const auto& pair) { return pair.first == code; });
@@ -86,7 +86,7 @@ class TextCheck {
       : files_(files), lists_(lists), report_(files.report()) {}
 
   void run() {
-    constexpr const char* kEffect = "keys such as \"INST_TXT_MODEL\" instead of texts";
+    constexpr const char* kEffect = "keys such as \"INST_TXT_MODEL\" instead of text";
     if (!files_.exists(kBundle, {{.file = kBundle}, "the message bundle", kEffect})) return;
     languages_ = languagesIn(files_, kBundle + "/Contents/Resources");
     for (const std::string& language : languages_)
@@ -121,7 +121,7 @@ class TextCheck {
       return;
     }
     const auto table = files_.strings(path, {{.file = path},
-                                             "the texts of " + quoted(language),
+                                             "the " + quoted(language) + " texts",
                                              "users of " + quoted(language) + " see " + effect});
     if (table) tables_.emplace(language, *table);
   }
@@ -214,7 +214,7 @@ class TextCheck {
     } else if (shown.where == "sheet when no device is found" &&
                text.find('%') != std::string::npos) {
       finding.id = "text-percent";
-      finding.found = "a \"%\", which macOS takes for the beginning of a placeholder";
+      finding.found = "a \"%\", which macOS treats as the beginning of a placeholder";
       finding.expected = "a text without \"%\"";
       finding.effect = "a damaged text, or a crash, on macOS";
       finding.remedy = "write a word instead";
@@ -239,8 +239,8 @@ class TextCheck {
     finding.remedy = "shorten the text, or see in the wizard whether it fits";
   }
 
-  // Reports each language that has at least half of its texts in common with English or with a
-  // language before it. A new language usually begins as a copy, and some texts may be left so by
+  // Reports each language that has at least half of its texts in common with English or with an
+  // earlier language. A new language usually begins as a copy, and some texts may be left so by
   // mistake.
   void checkTranslations() {
     for (const auto& [language, texts] : tables_) {
@@ -256,7 +256,7 @@ class TextCheck {
              .place = {.file = tablePath(language)},
              .found = std::to_string(same) + " texts that are the same in " + quoted(other),
              .expected = "texts in the language " + quoted(language),
-             .effect = "users of " + quoted(language) + " see texts in another language",
+             .effect = "users of " + quoted(language) + " see text in the wrong language",
              .remedy = "translate these texts"});
         break;
       }
@@ -278,7 +278,7 @@ class TextCheck {
                                    ? "users without texts in their language see another language "
                                      "that their system picks, usually English"
                                    : "users without texts in their language may see keys such as "
-                                     "\"INST_TXT_MODEL\" instead of texts";
+                                     "\"INST_TXT_MODEL\" instead of text";
     const auto information =
         files_.list(path, {{.file = path}, "the message bundle's Info.plist", effect});
     if (!information) return;
@@ -297,7 +297,8 @@ class TextCheck {
       finding.place.key = {kKey};
       finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
       finding.expected = "one of " + offered;
-      finding.remedy = "name one of the expected languages, or add the texts of " + quoted(*region);
+      finding.remedy =
+          "name one of the expected languages, or add the " + quoted(*region) + " texts";
     } else if (information->find(kKey)) {
       finding.place.key = {kKey};
       finding.found = "a value that is not a string";
@@ -321,7 +322,7 @@ class TextCheck {
           "language-not-in-application", resources, language, own,
           "read and hear some of the application's texts in English: why the wizard uses the "
           "network, and the name of the gear button",
-          "have the application built with texts in that language");
+          "have the application built with text in that language");
     }
   }
 

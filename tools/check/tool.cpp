@@ -26,7 +26,7 @@ bool isExecutable(const std::string& path) {
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
 }
 
-// The system takes the carriage return for a part of the interpreter's name.
+// The system treats the carriage return as part of the interpreter's name.
 bool isScriptWithCarriageReturn(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
   std::string line;
@@ -62,14 +62,14 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
     finding.id = "program-line-ends";
     finding.found = "a script whose first line ends with a carriage return";
     finding.expected = "lines that end with a line feed only";
-    finding.remedy = "save the script with the line ends of Unix";
+    finding.remedy = "save the script with Unix line endings";
   }
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// Reports each language in which the tool has translated texts, but no name. If the tool's name
-// contains the maker's name, also reports translations without the maker's name, which are probably
-// left over from another maker's medium.
+// Reports each language in which the tool has translated text, but no translated name. If the
+// tool's name contains the maker's name, also reports translations without the maker's name, which
+// are probably left over from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor) {
   const std::string maker = firstWord(vendor);

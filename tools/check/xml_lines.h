@@ -19,7 +19,7 @@ struct XMLLines {
   /// out.
   std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;
   std::string problem;          ///< the first mistake; empty when there is none
-  std::size_t problemLine = 0;  ///< from 1
+  std::size_t problemLine = 0;  ///< counted from 1
 };
 
 /// Parses `xml`, which must be UTF-8. A mistake in `xml` is described in the result.

@@ -66,8 +66,8 @@ Answer askedAt(const std::string& address, Progress& progress) {
   });
   progress.show("waiting for " + address);
   runMainLoop();
-  // After an interruption, stop() ends the asking, and the second loop waits for the incomplete
-  // answer.
+  // After an interruption, stop() cancels the questions, and the second loop waits for the
+  // incomplete answer.
   questions.stop();
   if (questions.pending() != 0) runMainLoop();
   progress.clear();

@@ -26,7 +26,7 @@ constexpr std::size_t kMostArcs = 128;
 constexpr std::size_t kBytesPerLine = 16;
 
 // The names of an SNMP message's elements and of its PDU's elements, in order (RFC 1157 section 4).
-// The empty name stands for the PDU, which pduName() names.
+// The empty name is for the PDU, which pduName() names.
 constexpr std::array<std::string_view, 3> kMessageFields{"version", "community", ""};
 constexpr std::array<std::string_view, 4> kPduFields{"request", "error status", "error index",
                                                      "bindings"};

@@ -28,7 +28,8 @@ void computeDelays(std::vector<JudgedDevice>& devices) {
   for (std::size_t i = 0; i < asked.size(); ++i) {
     const double cost = asked[i]->device->answer->seconds;
     clock = std::max(clock, asked[i]->device->resolved.value_or(0)) + cost;
-    // The wizard's search lasts for whole pauses, and ends with the first that lists a device.
+    // The wizard's search lasts a whole number of pauses. It ends after the first pause in which a
+    // device is listed.
     if (asked[i]->verdict.isListed) end = std::min(end, std::ceil(clock / kPause) * kPause);
     if (cost < kNoticeable) continue;
     asked[i]->delay.seconds = cost;

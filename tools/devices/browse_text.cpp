@@ -33,14 +33,14 @@ struct Columns {
   std::size_t model;
 };
 
-// Name and model share the width that mark and address leave.
+// The name and the model share the width that the mark and the address leave.
 Columns columnsFor(const TextStyle& style) {
   const std::size_t width = style.width == 0 ? 100 : std::max(style.width, kNarrowest);
   const std::size_t rest = width - kMarkColumns - kAddressColumns - 3;
   return {rest - rest / 2, rest / 2};
 }
 
-// Returns `text` in `columns` columns. If the output is not a terminal, a longer text is not cut.
+// Returns `text` in `columns` columns. If the output is not a terminal, longer text is not cut.
 std::string cell(std::string_view text, std::size_t columns, const TextStyle& style) {
   if (style.width == 0 && columnsOf(text) > columns) return std::string(text);
   return fitted(text, columns);

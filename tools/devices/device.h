@@ -25,7 +25,7 @@ struct Device {
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
   std::set<std::string> sightings;  ///< places where it is seen: "eth0 IPv4"; empty on macOS
-  std::optional<Answer> answer;     ///< nothing until askDevice() has returned
+  std::optional<Answer> answer;     ///< no value until askDevice() has returned
 };
 
 /// The parts of a medium on which the wizard's search depends.
@@ -35,7 +35,7 @@ struct Medium {
   std::vector<std::string> models;           ///< all models of the medium
   std::vector<std::string> wanted;           ///< the models that the wizard searches for
   bool choosesModel = false;                 ///< whether the wizard begins with the model list
-  std::vector<std::string> withoutSearch{};  ///< the models whose users never come to a search
+  std::vector<std::string> withoutSearch{};  ///< the models whose users never reach a search
 };
 
 }  // namespace onramp::devices

@@ -30,15 +30,15 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   Finder& operator=(const Finder&) = delete;
   ~Finder() override = default;
 
-  /// Starts to browse `types` and, if `all` is true, every other type that is announced. The finder
-  /// and its browsers keep each other alive until stop() is called.
+  /// Starts to browse `types` and, if `all` is true, all other announced types. The finder and its
+  /// browsers keep each other alive until stop() is called.
   void start(const std::vector<std::string>& types, bool all);
 
   /// Stops browsing. The devices found so far remain.
   void stop();
 
-  /// Returns all devices found so far, including those that are gone, in the order of their names.
-  /// The finder owns them.
+  /// Returns all devices found so far, including those that are gone, sorted by name. The finder
+  /// owns them.
   [[nodiscard]] std::vector<Device*> devices();
 
   /// Returns the seconds since start().

@@ -17,7 +17,7 @@ namespace onramp::devices {
 [[nodiscard]] std::string outcomeName(Exchange::Outcome outcome);
 
 /// Returns the strings, such as "note=Attic", of a TXT record in wire format (RFC 6763 section 6).
-/// Omits a last string that is cut off.
+/// Omits the last string if it is cut off.
 [[nodiscard]] std::vector<std::string> txtStrings(const std::optional<Data>& txt);
 
 /// Returns `json` as indented text that ends with a line feed. Bytes that are not UTF-8 become

@@ -44,8 +44,8 @@ void addBrowse(CLI::App& app, BrowseOptions& options) {
       ->capture_default_str()
       ->type_name("N")
       ->check(CLI::Range(0.1, 86400.0));
-  command->add_flag("-a,--all-types", options.allTypes, "Also look for every other announced type");
-  command->add_flag("--json", options.json, "Print JSON when the search has ended");
+  command->add_flag("-a,--all-types", options.allTypes, "Also look for all other announced types");
+  command->add_flag("--json", options.json, "Print JSON when the search is over");
   command->add_flag("-v,--verbose", options.verbose,
                     "Show records, TXT data and the SNMP exchanges");
 }

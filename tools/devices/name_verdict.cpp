@@ -117,7 +117,7 @@ std::optional<Verdict> judgeName(const Device& device, const Medium& medium) {
     return Verdict{
         .id = "other-type",
         .why = "announced as " + device.type +
-               ", a type under which the wizard reads no maker and model",
+               ", a type for which the wizard cannot read a maker or model",
         .remedy = device.type == medium.type
                       ? "write another of the device's types into the medium's BonjourNetwork"
                       : "switch on the device's " + medium.type + " service"};

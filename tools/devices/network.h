@@ -6,9 +6,10 @@
 
 namespace onramp::devices {
 
-/// Returns the first problem of the network as a whole, or no problem. A missing discovery daemon
-/// is always a problem. The other problems count only if the search found no device: no network,
-/// blocked multicast, and no announcement within `seconds`, the duration of the search.
+/// Returns the first problem of the network as a whole, or an empty list if there is none. A
+/// missing discovery daemon is always a problem. The other problems count only if the search found
+/// no device: no network, blocked multicast, and no announcement within `seconds`, the duration of
+/// the search.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);
 
 /// Returns whether local_address_for_destination() finds a subnet of this computer that contains

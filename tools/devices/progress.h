@@ -16,8 +16,7 @@ class Progress {
   /// Returns whether standard error is a terminal.
   [[nodiscard]] static bool isShown();
 
-  /// Shows the line with `text`, in place of its previous text. Does nothing when isShown() is
-  /// false.
+  /// Shows the line with `text`, replacing its previous text. Does nothing when isShown() is false.
   void show(const std::string& text);
 
   /// Removes the line if it is shown.

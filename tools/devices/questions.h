@@ -19,7 +19,7 @@ class Questions {
   Questions() = default;
   Questions(const Questions&) = delete;
   Questions& operator=(const Questions&) = delete;
-  /// Calls stop() and waits for the threads to end, which takes a fraction of a second.
+  /// Calls stop() and waits for the threads to finish, which takes a fraction of a second.
   ~Questions();
 
   /// Starts to ask the device at `addresses`, an array of strings. Later calls `answered` with the

@@ -17,8 +17,8 @@ void appendEscaped(std::string& out, char byte) {
   out += text.data();
 }
 
-// Returns whether the character is invisible: a control character, a separator of lines or
-// paragraphs, a space or joiner without width, or a mark that changes the direction of text.
+// Returns whether the character is invisible: a control character, a line or paragraph separator, a
+// zero-width space or joiner, or a mark that changes the text direction.
 bool isUnprintable(char32_t character) {
   return character < 0x20 || (character >= 0x7f && character < 0xa0) ||
          (character >= 0x200b && character <= 0x200f) ||

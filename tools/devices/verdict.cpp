@@ -72,18 +72,18 @@ Verdict judgeAnswer(const Device& device, const Answer& answer,
                      " when asked which interface it uses",
               .remedy = "update the firmware; this version does not support the request"};
     case Outcome::kOtherType:
-      return {
-          .id = "wrong-type",
-          .why = "answers with " +
-                 std::string(told->type == kTagOctetString ? "a text" : "a value of another type") +
-                 " where a number is expected",
-          .remedy = "update the firmware; this version returns a value of the wrong type"};
+      return {.id = "wrong-type",
+              .why = "answers with " +
+                     std::string(told->type == kTagOctetString ? "a string"
+                                                               : "a value of another type") +
+                     " where a number is expected",
+              .remedy = "update the firmware; this version returns a value of the wrong type"};
     case Outcome::kUnreadable:
     case Outcome::kOtherRequest:
       return {.id = "unreadable-reply",
               .why = told->outcome == Outcome::kUnreadable
                          ? "answers with bytes that are not a proper reply"
-                         : "answers with the identifier of another request",
+                         : "answers with another request's identifier",
               .remedy = "\"onramp-devices ask\" shows the bytes; the firmware must be corrected"};
     case Outcome::kLate:
       return {
@@ -154,7 +154,7 @@ std::vector<Verdict> notesOn(const Device& device, const Medium& medium) {
   if (isOneOf(medium.withoutSearch, device.record)) {
     notes.push_back({.id = "model-without-search",
                      .why = "on the medium, its model has no wireless, so no user who chooses the "
-                            "model comes to a search",
+                            "model reaches a search",
                      .remedy = "set WirelessLAN to true in ModelInfo.plist if the model has "
                                "wireless"});
   }
@@ -162,12 +162,12 @@ std::vector<Verdict> notesOn(const Device& device, const Medium& medium) {
   const auto& exchanges = device.answer->exchanges;
   if (std::any_of(exchanges.begin(), exchanges.end(),
                   [](const Exchange& e) { return e.changedQuestion; })) {
-    notes.push_back({.id = "changed-question",
-                     .why = "its reply names another object, and the wizard asks all later devices "
-                            "for that object",
-                     .remedy =
-                         "switch the device off while others are set up; the fault is in its "
-                         "firmware, which must repeat the object's name (OID) from the request"});
+    notes.push_back(
+        {.id = "changed-question",
+         .why = "its reply names a different object, and the wizard asks all later devices "
+                "for that object",
+         .remedy = "switch the device off while others are set up; the fault is in its "
+                   "firmware, which must repeat the object's name (OID) from the request"});
   }
   return notes;
 }

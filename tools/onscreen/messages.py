@@ -21,7 +21,7 @@ def _fitness(offered, wanted):
     """Returns how well the language `offered` suits a user who wants `wanted`.
 
     3 means the same name. 2 means the same language, where `offered` has no region, and 1 means the
-    same language, where `offered` has a region. 0 means another language, or the other Chinese script.
+    same language, where `offered` has a region. 0 means a different language, or the other Chinese script.
     """
     offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
                        for name in (offered, wanted))

@@ -35,7 +35,7 @@ def _words(role, name):
 
 class Person:
     """A person who uses one program. The constructor starts the program on a desktop, and leaving
-    the object's context ends the program.
+    the object's context stops the program.
     """
 
     follows_desktop = True  # whether the program uses the desktop's text size, scale and colours
@@ -64,7 +64,8 @@ class Person:
     def see(self, role, name=None, seconds=_LOOK_SECONDS):
         """Waits until a control with this role and name is on the screen, and returns the control.
 
-        Raises TimeoutError after `seconds`, and RuntimeError when the program has ended.
+        Raises TimeoutError if that takes longer than `seconds`, and RuntimeError when the program
+        has exited.
         """
         return wait_for(lambda: self._alive() and self._look(role, name), seconds,
                         _words(role, name))
@@ -158,7 +159,7 @@ class Person:
         self.press("alt+F4")
 
     def wait_for_end(self, seconds=_LOOK_SECONDS):
-        """Waits for the program to end and returns its exit status."""
+        """Waits for the program to exit and returns its exit status."""
         return self.process.wait(seconds)
 
     def is_running(self):
@@ -168,7 +169,7 @@ class Person:
 
     def _alive(self):
         if self.process.poll() is not None:
-            raise RuntimeError(f"the program has ended with status {self.process.returncode}")
+            raise RuntimeError(f"the program has exited with status {self.process.returncode}")
         return True
 
     def _resting_place(self, control):
@@ -191,7 +192,7 @@ class Person:
         """Returns how many seconds the program takes to answer a small request on the accessibility
         bus, without the time that the program and this process wait for a processor.
 
-        If the request fails, returns the time until the failure, or None if the program has ended.
+        If the request fails, returns the time until the failure, or None if the program has exited.
         """
         waits = [pathlib.Path(f"/proc/{pid}/schedstat") for pid in (self.process.pid, "self")]
 

@@ -1,4 +1,4 @@
-"""Child processes that end when this process does."""
+"""Child processes that are killed when this process exits."""
 
 import ctypes
 import signal
@@ -10,7 +10,7 @@ _libc = ctypes.CDLL(None, use_errno=True)
 
 
 class Missing(Exception):
-    """Raised when a program is not installed or does not start. The text names the program."""
+    """Raised when a program is not installed or does not start. The message names the program."""
 
 
 class InVain(TimeoutError):
@@ -38,7 +38,7 @@ def start(arguments, package=None, **options):
 
 
 def stop(process):
-    """Ends a process that start() returned. Kills it if it has not ended after five seconds."""
+    """Terminates a process that start() returned. Kills it if it is still running after five seconds."""
     if process.poll() is None:
         process.terminate()
         try:
@@ -51,7 +51,8 @@ def stop(process):
 def wait_for(condition, seconds, what):
     """Calls `condition` until it returns a true value, and returns this value.
 
-    Raises InVain after `seconds`. The error's text contains `what`, which describes the event.
+    Raises InVain if that takes longer than `seconds`. The error's message contains `what`, which
+    describes the event.
     """
     deadline = time.monotonic() + seconds
     while True:

@@ -34,7 +34,7 @@ MODULES = "override,pass,vacm_conf,vacm_context"
 
 
 class AgentError(Exception):
-    """Raised when an agent does not start. The text says why."""
+    """Raised when an agent does not start. The message says why."""
 
 
 def listens(address):
@@ -145,14 +145,14 @@ class _Agent:
 
     def is_listening(self):
         if self._process.poll() is not None:
-            raise AgentError(f"snmpd at {self.address} ended at once:\n{self.log()}")
+            raise AgentError(f"snmpd at {self.address} exited at once:\n{self.log()}")
         return listens(self.address)
 
     def log(self):
         return self._log.read_text(errors="replace") if self._log.exists() else ""
 
     def close(self):
-        # A script that delays an answer keeps the agent's socket open, so the script must end, too.
+        # A script that delays an answer keeps the agent's socket open, so the script must be killed, too.
         if self._process.poll() is None:
             os.killpg(self._process.pid, signal.SIGKILL)
             self._process.wait()

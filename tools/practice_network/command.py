@@ -23,8 +23,8 @@ PACKAGES = {"unshare": "util-linux", "setpriv": "util-linux", "nsenter": "util-l
 HELP = """
 Runs COMMAND (default: a shell) on a network of made-up printers and scanners, and returns the exit
 status of COMMAND. Real Avahi and net-snmp daemons play the devices, in namespaces of the kernel. No
-packet leaves this machine, and no hardware is needed. The network ends when COMMAND or this tool
-ends or is killed.
+packet leaves this machine, and no hardware is needed. The network disappears when COMMAND or this
+tool exits or is killed.
 
 This command runs the wizard of MEDIUM, a medium's folder, with the twenty devices of the example
 practice-network.toml. The example is in examples/ of the source tree and in lib/onramp/examples/ of
@@ -61,14 +61,14 @@ there is one table for each device:
     activeif = 2                   the number that the device answers; default 2, for wireless.
                                    "silent": receives the request and never answers. "closed": has
                                    no agent. "missing": has an agent without the object. "text":
-                                   answers with a text. A list gives each address its own value.
+                                   answers with a string. A list gives each address its own value.
                                    IPv6 addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
     present = false                false: switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries
 
 inside the network, these commands show and change the devices while COMMAND runs. KEY=VALUE is an
-entry as in the file, but a text needs no quotes:
+entry as in the file, but a string needs no quotes:
     practice-network ctl list                         prints the devices, with their states
     practice-network ctl add NAME [KEY=VALUE ...]     switches on a known device, or adds a new one
     practice-network ctl set NAME KEY=VALUE ...       changes a device, such as: activeif=silent
@@ -86,9 +86,9 @@ do by default. Abstract sockets and TCP connections to the X server do not work.
 XDG_RUNTIME_DIR is a new folder. The session bus, Wayland and the accessibility bus of your
 desktop cannot be reached. Start what you need inside, for instance with "dbus-run-session -- COMMAND".
 
-exit status: the status of COMMAND, or 128 + n if signal n ended COMMAND or the tool; 2 for a bad
+exit status: the status of COMMAND, or 128 + n if signal n killed COMMAND or the tool; 2 for a bad
 description or command line, 77 if namespaces cannot be created, 125 if the network did not start or
-ended before COMMAND, 126 or 127 if COMMAND could not be run. ctl returns 0 if the network did what
+stopped before COMMAND, 126 or 127 if COMMAND could not be run. ctl returns 0 if the network did what
 was asked, 1 if not, and 2 for a bad command line.
 """
 

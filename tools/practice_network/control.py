@@ -11,8 +11,8 @@ SOCKET_VARIABLE = "ONRAMP_PRACTICE_SOCKET"
 
 
 class ControlError(Exception):
-    """Raised when the network refuses a request, and when there is no network. The text says
-    why."""
+    """Raised when the network refuses a request, and when there is no network. The message
+    says why."""
 
 
 class PracticeNetwork:
@@ -31,12 +31,13 @@ class PracticeNetwork:
                                "start one with: practice-network DESCRIPTION")
 
     def add(self, name, **entries):
-        """Changes `entries` of a known device and switches the device on, or adds a new device with
-        these entries."""
+        """Updates the given entries of a known device and switches the device on. If the device is
+        unknown, adds it with these entries."""
         self._ask("add", name, entries)
 
     def remove(self, name):
-        """Switches a device off. Avahi announces that the device is gone, and its agents end.
+        """Switches a device off. Avahi announces that the device is gone, and the device's
+        agents exit.
 
         A browser reports the device as gone when the device leaves the browser's mDNS cache, up to a
         second later.
@@ -47,9 +48,9 @@ class PracticeNetwork:
         self._ask("rename", name, new_name)
 
     def set(self, name, **entries):
-        """Changes `entries` of a device. Avahi announces a new TXT entry or address as an update.
-        For a new name, type, domain or port, Avahi withdraws the services and publishes them
-        again."""
+        """Updates the given entries of a device. Avahi announces a new TXT entry or address as an
+        update. For a new name, type, domain or port, Avahi withdraws the services and publishes
+        them again."""
         self._ask("set", name, entries)
 
     def list(self):
@@ -77,7 +78,7 @@ class PracticeNetwork:
 
     def settle(self, seconds=30):
         """Waits until Avahi has published every device that is switched on. Raises ControlError
-        after `seconds`."""
+        if that takes longer than `seconds`."""
         deadline = time.monotonic() + seconds
         while waiting := [one for one in self.list()
                           if one["present"] and one["state"] != "established"]:
@@ -93,7 +94,8 @@ class PracticeNetwork:
                 with connection.makefile("rwb") as stream:
                     stream.write(json.dumps([operation, *arguments]).encode() + b"\n")
                     stream.flush()
-                    answer = json.loads(stream.readline() or b'{"error": "the network ended"}')
+                    answer = json.loads(stream.readline() or
+                                        b'{"error": "the network has shut down"}')
         except OSError as error:
             raise ControlError(f"{self._path}: {error.strerror}; is the network running?") from None
         if "error" in answer:
@@ -129,5 +131,5 @@ def _answer(network, line):
         return {"error": f"not a request: {error}"}
     except DescriptionError as error:
         return {"error": str(error)}
-    except Exception as error:  # A failed request must not end the network.
+    except Exception as error:  # A failed request must not stop the network.
         return {"error": f"{type(error).__name__}: {error}"}

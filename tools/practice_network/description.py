@@ -22,7 +22,7 @@ PRINTER_KEYS = ("usb_MFG", "usb_MDL")
 
 
 class DescriptionError(Exception):
-    """Raised for a bad description or request. The text says what is wrong."""
+    """Raised for a bad description or request. The message says what is wrong."""
 
 
 @dataclasses.dataclass(frozen=True)
@@ -109,7 +109,7 @@ def load(path):
 
 
 def device(table, place):
-    """Returns the device that `table` describes. The text of an error begins with `place`."""
+    """Returns the device that `table` describes. An error message begins with `place`."""
     return change(None, table, place)
 
 
@@ -245,7 +245,7 @@ READERS = {
                             "or a list of these with one for each address"),
     "delay": (_delay, "a number of seconds from 0 to 3600"),
     "present": (_truth, "true or false"),
-    "txt": (_txt, 'a table of texts such as {rp = "auto"}'),
+    "txt": (_txt, 'a table of strings such as {rp = "auto"}'),
 }
 
 SETTING_READERS = {

@@ -52,7 +52,7 @@ publish-workstation=no
 
 
 class HostError(Exception):
-    """Raised when a command fails or a daemon does not start. The text names the program and the
+    """Raised when a command fails or a daemon does not start. The message names the program and the
     reason."""
 
 
@@ -151,7 +151,7 @@ class Host:
                              "--no-rlimits")
 
     def stop_avahi(self):
-        """Ends the daemon with SIGTERM, so that it announces that all its services are gone."""
+        """Stops the daemon with SIGTERM, so that it announces that all its services are gone."""
         if self._avahi:
             self._avahi.terminate()
             self._avahi.wait()

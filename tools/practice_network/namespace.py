@@ -1,4 +1,4 @@
-"""Runs the network in namespaces that disappear when practice-network ends."""
+"""Runs the network in namespaces that disappear when practice-network exits."""
 
 import json
 import os
@@ -42,7 +42,7 @@ def why_not_enclosed():
 def enclose(options):
     """Runs the network and the command in new namespaces. Returns the command's exit status."""
     # Ctrl-C is meant for the command, which also receives SIGINT from the terminal. SIGTERM and
-    # SIGHUP end everything.
+    # SIGHUP stop everything.
     signal.signal(signal.SIGINT, lambda *_: None)
     process = subprocess.Popen(
         ["setpriv", "--pdeathsig", "KILL", *ENCLOSE,
@@ -82,13 +82,13 @@ def inside(options):
     except OSError as error:
         print(f"practice-network: {options['command'][0]}: {error.strerror}", file=sys.stderr)
         return 127 if isinstance(error, FileNotFoundError) else 126
-    # The first process in a process namespace has to reap all orphans.
+    # The first process in a process namespace must reap all orphans.
     while True:
         pid, status = os.wait()
         if pid == command.pid:
             return _status(os.waitstatus_to_exitcode(status))
         if pid == devices.pid:
-            return _fail("the process that ran the made-up devices has ended")
+            return _fail("the process that ran the made-up devices has exited")
 
 
 def devices(options):

@@ -62,8 +62,8 @@ class Network:
         self._host.plug(interface, plugged)
 
     def settle(self, seconds=30):
-        """Waits until Avahi has published every device that is present. Raises PublishError after
-        `seconds`."""
+        """Waits until Avahi has published every device that is present. Raises PublishError
+        if that takes longer than `seconds`."""
         deadline = time.monotonic() + seconds
         for device in self._devices.values():
             while device.present and (state := self._state(device)) != "established":
@@ -79,8 +79,8 @@ class Network:
         self._host.stop_avahi()
 
     def add(self, name, entries):
-        """Changes `entries` of a known device and switches the device on, or adds a new device with
-        these entries."""
+        """Updates the given entries of a known device and switches the device on. If the device is
+        unknown, adds it with these entries."""
         if name in self._devices:
             self.set(name, entries | {"present": True})
             return
@@ -96,7 +96,7 @@ class Network:
         self.set(name, {"name": new_name})
 
     def set(self, name, entries):
-        """Changes `entries` of a device, and publishes the changes."""
+        """Updates the given entries of a device, and publishes the changes."""
         before = self._devices.get(name)
         if not before:
             raise DescriptionError(f'device "{name}" is unknown; "list" shows the known devices')

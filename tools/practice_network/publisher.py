@@ -23,12 +23,12 @@ GROUP_STATES = {0: "withdrawn", 1: "probing", 2: "established", 3: "collision", 
 
 class PublishError(Exception):
     """Raised when Avahi does not start, and when it does not publish a device within a time limit.
-    The text says which of these happened."""
+    The message says which of these happened."""
 
 
 def connect(bus_address, seconds=10):
     """Waits until Avahi runs. Returns a connection to the bus, and Avahi's server object on it.
-    Raises PublishError after `seconds`."""
+    Raises PublishError if that takes longer than `seconds`."""
     bus = dbus.bus.BusConnection(bus_address)
     deadline = time.monotonic() + seconds
     while True:
@@ -110,7 +110,7 @@ class Publisher:
 
     def state(self, device):
         """Returns "established" if both groups of the device are established, otherwise the state
-        of a group that is not. Returns "withdrawn" if the device has no groups or Avahi has ended."""
+        of a group that is not. Returns "withdrawn" if the device has no groups or Avahi has stopped."""
         entry = self._entries.get(device.name)
         if not entry:
             return "withdrawn"

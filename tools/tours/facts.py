@@ -14,7 +14,7 @@ _BUILT = pathlib.Path(__file__).resolve().parents[2] / "build/release/tools/onra
 
 
 class Unsuitable(Exception):
-    """The tour cannot walk through this medium's wizard. The text says why."""
+    """The tour cannot walk through this medium's wizard. The message says why."""
 
 
 @dataclasses.dataclass(frozen=True)

@@ -164,7 +164,7 @@ class Gallery:
 
     @staticmethod
     def _can_connect(person):
-        """Returns whether the connection page takes keys: no search and no set-up tool is running."""
+        """Returns whether the connection page accepts keys: no search and no set-up tool is running."""
         return any(role == "radio button" and person.has_state(control, "enabled") and
                    person.has_state(control, "focused")
                    for role, _, control in person.everything())

@@ -52,7 +52,7 @@ class Medium:
 
     @property
     def service_type(self):
-        """The service type that the wizard looks for, without the closing dot; "" for none."""
+        """The service type that the wizard looks for, without the trailing dot; "" for none."""
         return _text(self._resources, "BonjourNetwork", "").rstrip(".")
 
     def oldest_system(self):

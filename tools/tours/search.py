@@ -77,7 +77,7 @@ def _is_searching(visit):
 
 
 def _can_connect(visit):
-    """Returns whether the connection page takes keys: no set-up tool is running."""
+    """Returns whether the connection page accepts keys: no set-up tool is running."""
     return visit.shows(CONNECTION) and any(
         visit.person.has_state(control, "focused")
         for role, _, control in visit.person.everything() if role == "radio button")
@@ -94,10 +94,10 @@ def search_in_vain(visit, devices, gear):
     person.choose_from_menu(gear, GEAR_REFRESH)
     wait_for(lambda: _is_searching(visit), 20, "a new search to begin")
     wait_for(lambda: person.sees("alert"), _LONGEST_SEARCH, "the alert that no device was found")
-    visit.picture("7-not-found", "A search in vain: the alert")
+    visit.picture("7-not-found", "A search that found no device: the alert")
     person.press("Return")
     person.see_gone("alert")
-    visit.picture("8-nothing", "The device list after a search in vain")
+    visit.picture("8-nothing", "The device list after a search that found no device")
     devices.come_back()
     person.choose_from_menu(gear, GEAR_REFRESH)
     wait_for(lambda: _is_searching(visit), 20, "a new search to begin")

@@ -30,7 +30,7 @@ class Tour:
         self._options = list(options)
 
     def take(self):
-        """Takes the whole tour. When one section goes wrong, the tour goes on with the next."""
+        """Takes the whole tour. When one section goes wrong, the tour continues with the next."""
         self._section("Menu and About", "menu", self._menu)
         if self._first in (CONNECTION, MODELS):
             self._models()
@@ -87,14 +87,14 @@ class Tour:
         return person.see("popup menu")
 
     def _take_a_supported_system(self):
-        """Goes on with the oldest system that the medium names. Only adds a note if the options
+        """Continues with the oldest system that the medium names. Only adds a note if the options
         name a system or the medium names none."""
         oldest = self._medium.oldest_system()
         if any(option.startswith("--system-version") for option in self._options) or not oldest:
             self._album.note("The medium does not support this system, so there is no page.")
             return
         self._album.note("The medium does not support the version of macOS that the preview "
-                         f"assumes, so the tour goes on with macOS {oldest}.")
+                         f"assumes, so the tour continues with macOS {oldest}.")
         self._options += ["--system-version", oldest]
         with self._visit() as visit:
             self._first = visit.first_page()
@@ -214,5 +214,5 @@ class Tour:
                 visit.picture(step, f"The alert on {system} system, macOS {version}")
                 visit.next()
                 if not visit.left_nothing():
-                    self._album.problem("after the alert, the wizard did not end cleanly, or it "
+                    self._album.problem("after the alert, the wizard did not exit cleanly, or it "
                                         "wrote files")

@@ -21,7 +21,7 @@ _TOLD = ("heading", "label", "push button", "radio button", "alert")
 
 
 class WentWrong(Exception):
-    """The wizard did not do what it should. The text says what, in terms of the medium."""
+    """The wizard did not do what it should. The message says what, in terms of the medium."""
 
 
 def choose_model(person, models, model):
@@ -55,7 +55,7 @@ def _selected_model(person):
 
 
 class Visit:
-    """Starts the wizard with `options`, and ends it at the end of the `with` statement.
+    """Starts the wizard with `options`, and stops it at the end of the `with` statement.
 
     What goes wrong in between is raised as WentWrong.
     """
@@ -87,7 +87,7 @@ class Visit:
         self._album.picture(self.person, step, caption)
 
     def first_page(self):
-        """Waits for the first page and returns its name, or None if the wizard ended without a
+        """Waits for the first page and returns its name, or None if the wizard exited without a
         page."""
         def shown():
             if not self.person.is_running():
@@ -104,7 +104,7 @@ class Visit:
         """Waits for a page."""
         wait_for(lambda: not self.person.is_running() or self.shows(page), _PATIENCE, f"the {page}")
         if not self.person.is_running():
-            raise WentWrong(f"the {page} did not appear, because the wizard ended; "
+            raise WentWrong(f"the {page} did not appear, because the wizard exited; "
                             f"it {self.opened_in_words()}")
         self._compare_title(page)
 
@@ -129,14 +129,14 @@ class Visit:
         wait_for(lambda: self.person.has_state(cable, "checked"), 10, "the cable to be chosen")
 
     def see_package_open(self, files, way):
-        """Waits for the wizard to end, and compares what it left with what it should leave.
+        """Waits for the wizard to exit, and compares what it left with what it should leave.
 
         `files` is the number of files that the wizard should write for the package. `way` says how
         the user came here, such as "By cable".
         """
         status = self._end()
         if status:
-            raise WentWrong(f"the wizard ended with status {status}")
+            raise WentWrong(f"the wizard exited with status {status}")
         written = self._files()
         for file in written:
             self._album.file(f"{way}: {file.name}",
@@ -155,12 +155,12 @@ class Visit:
                                 f"this system. {self._medium.facts.about('PkgInfo')}")
 
     def left_nothing(self):
-        """Waits for the wizard to end. Returns whether it ended well, without files."""
+        """Waits for the wizard to exit. Returns whether it exited well, without files."""
         return self._end() == 0 and not self._files()
 
     def _end(self):
-        """Waits for the wizard to end, and returns its status."""
-        wait_for(lambda: not self.person.is_running(), _PATIENCE, "the wizard to end")
+        """Waits for the wizard to exit, and returns its status."""
+        wait_for(lambda: not self.person.is_running(), _PATIENCE, "the wizard to exit")
         return self.person.process.returncode
 
     def opened_in_words(self):
@@ -178,9 +178,9 @@ class Visit:
 
     def _explained(self, error):
         if not self.person.is_running():
-            return (f"the wizard ended with status {self.person.process.returncode}, "
+            return (f"the wizard exited with status {self.person.process.returncode}, "
                     f"and {self.opened_in_words()}")
-        self.picture("last", "What the screen showed when the tour could not go on")
+        self.picture("last", "What the screen showed when the tour could not continue")
         wanted = getattr(error, "what", None)
         why = f"the tour expected {wanted}" if wanted else f"the window could not be used ({error})"
         return f"{why}. {self._on_screen()}"

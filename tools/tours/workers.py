@@ -71,7 +71,7 @@ def take_tours(medium, original, pictures, languages, options):
 
 
 def _chosen(languages, medium):
-    """Returns the languages in which to take the tour. None stands for the user's own language."""
+    """Returns the languages in which to take the tour. None means the user's own language."""
     offered = messages.languages(medium)
     wanted = offered if languages == "all" else filter(None, languages.split(","))
     wanted = list(wanted) or [None]
@@ -83,7 +83,7 @@ def _chosen(languages, medium):
 
 
 def _take_one(order):
-    """Runs one tour. Prints the tour's output only when the tour has ended, so that the outputs of
+    """Runs one tour. Prints the tour's output only when the tour has finished, so that the outputs of
     parallel tours are not interleaved."""
     done = run([INSIDE, json.dumps(order)], order["has_network"],
                stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True)

@@ -18,7 +18,7 @@ BOOL performKeyEquivalent(id self, SEL selector, NSEvent* event) {
   return ![self isHiddenOrHasHiddenAncestor] && originalPerformKey(self, selector, event);
 }
 
-// Implements two setters that GNUstep lacks. Neither has anything to do: GNUstep shows no resize
+// Implements two setters that GNUstep lacks. Neither needs to do anything: GNUstep shows no resize
 // indicator on a window of fixed size, and no GNUstep window prevents termination.
 void ignore(id, SEL, BOOL) {}
 
@@ -58,7 +58,7 @@ void ignore(id, SEL, BOOL) {}
 namespace {
 
 // Returns at once, as in AppKit, and opens the sheet in the next iteration of the main loop.
-// GNUstep's own function runs a modal loop until the sheet ends, and only then returns.
+// GNUstep's own function runs a modal loop until the sheet closes, and only then returns.
 void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) {
   OnrampWaitingSheet* const sheet = [[[OnrampWaitingSheet alloc] init] autorelease];
   sheet->_alert = [self retain];
@@ -87,7 +87,7 @@ id noDistributedCenter(id, SEL) {
   return nil;
 }
 
-// Opens `url` with xdg-open, because GNUstep's own function knows only GNUstep programs.
+// Opens `url` with xdg-open, because GNUstep's own function uses only GNUstep programs.
 BOOL openURL(id, SEL, NSURL* url) {
   NSTask* const task = [[[NSTask alloc] init] autorelease];
   NSString* const address = [url isFileURL] ? [url path] : [url absoluteString];
@@ -103,7 +103,7 @@ BOOL openURL(id, SEL, NSURL* url) {
 
 }  // namespace
 
-/// Stands for an accessibility relation between controls in an interface file. GNUstep creates an
+/// Represents an accessibility relation between controls in an interface file. GNUstep creates an
 /// object for each element of the file, and rejects the whole file if it lacks the class of any
 /// element.
 @interface IBAccessibilityConnection : NSObject

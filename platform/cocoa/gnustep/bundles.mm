@@ -25,7 +25,7 @@ NSString* contentsOf(NSString* bundlePath) {
   return isFolder(contents) ? contents : bundlePath;
 }
 
-// Returns the folder of the user's first language, or nil if the bundle lacks that folder.
+// Returns the folder for the user's first language, or nil if the bundle lacks that folder.
 // GNUstep's own search misses "zh_CN.lproj", because it looks for names such as
 // "SimplifiedChinese.lproj".
 NSString* firstLanguageFolder(NSString* rootPath, NSString* subPath) {
