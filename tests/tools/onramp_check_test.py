@@ -198,7 +198,7 @@ MISTAKES = [
      "text-missing", "INST_TXT_WIFI", "de, ja, ko, zh_CN"),
     (lambda folder: shutil.copy(folder / ENGLISH, folder / ENGLISH.replace("en.", "ja.")),
      "texts-copied", '31 texts that are the same in "en"', "translate"),
-    (replace(ENGLISH, "INST_TXT_WIFI", "INST_TXT_WFI"), "text-misspelt", "INST_TXT_WIFI"),
+    (replace(ENGLISH, "INST_TXT_WIFI", "INST_TXT_WFI"), "text-misspelt", "INST_TXT_WIFI", "line "),
     (replace(ENGLISH, "macOS %@", "%@ %@ %@"), "text-placeholders", "3 times", "once or twice"),
     (replace(ENGLISH, "No device was", "100 % no device was"), "text-percent", "macOS"),
     (replace(ENGLISH, "Wireless Network", "Wireless Network, " * 5), "text-wide", "450 points"),
@@ -294,7 +294,7 @@ class OnrampCheck(unittest.TestCase):
         self.assertEqual([0, 1], [run(medium).returncode, run("--strict", medium).returncode])
 
     def test_bad_arguments_fail_with_a_message(self):
-        for arguments in (["/nowhere"], [], ["--jsn", "."], [__file__],
+        for arguments in (["/nowhere"], [], ["--jsn", "."], ["--keys", "."], [__file__],
                           [str(self.medium.parent)], [str(self.medium / "MacResources")], [str(self.medium / "Onramp OSX.app")]):
             result = run(*arguments)
             self.assertEqual((2, ""), (result.returncode, result.stdout))

@@ -75,11 +75,14 @@ int run(int count, char* arguments[]) {
   bool strict = false;
   bool keys = false;
   bool texts = false;
-  app.add_option("MEDIUM", medium, "The folder that contains the application");
+  CLI::Option* const place =
+      app.add_option("MEDIUM", medium, "The folder that contains the application");
   app.add_flag("--json", json, "Print JSON");
   app.add_flag("--strict", strict, "Exit with status 1 even if there are only warnings");
-  app.add_flag("--keys", keys, "Print the keys that the wizard reads from property lists");
-  app.add_flag("--texts", texts, "Print the keys of the texts that the wizard shows");
+  app.add_flag("--keys", keys, "Print the keys that the wizard reads from property lists")
+      ->excludes(place);
+  app.add_flag("--texts", texts, "Print the keys of the texts that the wizard shows")
+      ->excludes(place);
   try {
     app.parse(count, arguments);
   } catch (const CLI::ParseError& error) {

@@ -74,6 +74,15 @@ std::size_t malformedAt(const std::string& bytes) {
   return bytes.size();
 }
 
+// Returns the line of `key` in the strings table at `path`. Returns nothing when the table does not
+// have the key in quotation marks.
+std::optional<std::size_t> lineOfString(const std::string& path, const std::string& key) {
+  const auto bytes = posix::readFile(path, kMostPropertyListBytes);
+  const auto text = bytes ? decodedText(*bytes) : std::nullopt;
+  const std::size_t at = text ? text->find(quoted(key)) : std::string::npos;
+  return at == std::string::npos ? std::nullopt : std::optional(lineOf(*text, at));
+}
+
 bool isXML(const std::string& text) {
   const std::size_t first = text.find_first_not_of(" \t\r\n");
   return first != std::string::npos && text[first] == '<';
@@ -257,7 +266,10 @@ void MediumFiles::withdrawUsedNames() const {
 void MediumFiles::addLines() const {
   for (Finding& finding : report_.findings) {
     Place& place = finding.place;
-    if (place.line || place.key.empty() || !place.file.ends_with(".plist")) continue;
+    if (place.line || place.key.empty()) continue;
+    if (place.file.ends_with(".strings"))
+      place.line = lineOfString(fullPath(place.file), place.key.front());
+    if (!place.file.ends_with(".plist")) continue;
     const XMLLines& lines = linesOf(place.file);
     const auto line = lines.keys.find(place.key);
     if (line != lines.keys.end()) place.line = line->second;

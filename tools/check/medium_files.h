@@ -58,8 +58,8 @@ class MediumFiles {
   /// turned out to be needed under its own name. Call this after all the checks.
   void withdrawUsedNames() const;
 
-  /// Adds line numbers to the report's findings about keys of XML property lists, where the lines
-  /// are known.
+  /// Adds line numbers to the report's findings about keys of XML property lists and strings
+  /// tables, where the lines are known.
   void addLines() const;
 
  private:

@@ -118,9 +118,11 @@ def _run(program, arguments):
                              "192.0.2.0/24, joined by a cable for each interface. Each host has "
                              "its own Avahi; ctl controls the Avahi of the devices")
     parser.add_argument("--invoker", help=argparse.SUPPRESS)
-    parser.add_argument("description", metavar="DESCRIPTION")
+    parser.add_argument("description", metavar="DESCRIPTION", nargs="?")
     parser.add_argument("command", metavar="COMMAND", nargs=argparse.REMAINDER)
     options = parser.parse_args(arguments)
+    if options.description is None:
+        parser.error("DESCRIPTION is missing; give a TOML file, or /dev/null for a network without devices")
 
     try:
         description.load(options.description)
