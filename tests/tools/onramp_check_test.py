@@ -166,6 +166,7 @@ MISTAKES = [
           take(COMMON, "BonjourNetwork"), take(COMMON, "WLANtool")), "models-none", "at once"),
     # Systems and packages.
     (packages(v109=1), "package-none", "systems: 10.6.0 up to, but not including, 10.9.0"),
+    (put(COMMON, "PkgInfo", "PkgName", ""), "package-unnamed", "an empty name"),
     (both(remove(PACKAGE), write(PACKAGE, b"")), "package-empty", "nothing can be installed"),
     (put(COMMON, "PkgInfo", "PkgName", "None.pkg"), "path-missing", "Packages/None.pkg"),
     (both(packages(v106=1, v107=1, v108=1, v109=1), put(COMMON, "PkgInfo", "108", Path(PACKAGE).stem + "2.pkg")),
@@ -217,7 +218,7 @@ MISTAKES = [
     (lambda folder: (folder / MESSAGES / "Resources/jp.lproj").mkdir(), "language-unknown", "ja.lproj"),
     # Pictures.
     (remove(PICTURE), "path-missing", "no picture beside USB"),
-    (remove(f"{APPLICATION}/Resources/Background@2x.png"), "path-missing", "blurred"),
+    (remove(f"{APPLICATION}/Resources/Background@2x.png"), "picture-not-dense", "blurred"),
     (lambda folder: shutil.copy(ROOT / "resources/Background.png", folder / PICTURE),
      "picture-size", "680 × 480", "192 × 192"),
     (lambda folder: os.truncate(folder / PICTURE, 900), "picture-unreadable", "not an intact PNG"),
@@ -233,6 +234,28 @@ MISTAKES = [
     (put(COMMON, "VenderName", "Kestrél"), "vendor-letters", "outside ASCII"),
     (put(COMMON, "VenderName", " "), "vendor-empty", "an empty name"),
     (put(DESCRIPTION, "KSCSeriesCode", "K S"), "series-address", "opens nothing"),
+]
+
+
+def name_tool(text, *languages):
+    return lambda folder: [(folder / TOOL / f"Resources/{language}.lproj/InfoPlist.strings").write_text(text)
+                           for language in languages]
+
+
+def norwegian(folder):
+    for resources, name in ((f"{MESSAGES}/Resources", "nb"), (f"{APPLICATION}/Resources", "no"),
+                            (f"{TOOL}/Resources", "no")):
+        (folder / resources / "ko.lproj").rename(folder / resources / f"{name}.lproj")
+
+
+# Breakers that break nothing.
+HARMLESS = [
+    norwegian,
+    both(*(remove(f"{TOOL}/Resources/{language}.lproj") for language in ("de", "ja", "ko", "zh_CN"))),
+    name_tool('NSHumanReadableCopyright = "Kestrel";', "en"),
+    name_tool("/* no name */", "de", "en", "ja", "ko", "zh_CN"),
+    write(f"{MESSAGES}/Resources/._de.lproj", b""),
+    both(maximum("14", "0", "x"), put(COMMON, "SystemMin", {"Major": "14", "Minor": "0", "BugFix": "0"})),
 ]
 
 
@@ -277,6 +300,11 @@ class OnrampCheck(unittest.TestCase):
                 self.assertTrue(findings[0]["effect"] and findings[0]["remedy"], findings)
                 self.assertEqual(1, result.returncode)
 
+    def test_reports_nothing_about_unusual_but_correct_media(self):
+        for breaker in HARMLESS:
+            result = run("--json", self.broken(breaker))
+            self.assertEqual([], json.loads(result.stdout)["findings"])
+
     def test_every_rule_is_among_the_mistakes(self):
         sources = "".join(path.read_text() for path in (ROOT / "tools/check").glob("*.cpp"))
         rules = set(re.findall(r'\bid = (?:\w+ \? )?"([a-z-]+)"', sources))
@@ -295,7 +323,7 @@ class OnrampCheck(unittest.TestCase):
 
     def test_bad_arguments_fail_with_a_message(self):
         for arguments in (["/nowhere"], [], ["--jsn", "."], ["--keys", "."], [__file__],
-                          [str(self.medium.parent)], [str(self.medium / "MacResources")], [str(self.medium / "Onramp OSX.app")]):
+                          [str(self.medium.parent)], [str(self.medium / "MacResources/Images")], [str(self.medium / "Onramp OSX.app")]):
             result = run(*arguments)
             self.assertEqual((2, ""), (result.returncode, result.stdout))
             self.assertTrue(result.stderr)

@@ -14,4 +14,8 @@ inline constexpr const char* kUsualName = "Onramp OSX.app";
 /// string when there is no application.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
+/// Returns whether the application `name` in the folder `root` is a wizard: its name is kUsualName,
+/// or its Info.plist has "CommonResourcePath".
+[[nodiscard]] bool isWizard(const std::string& root, const std::string& name);
+
 }  // namespace onramp::check

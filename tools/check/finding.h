@@ -40,4 +40,12 @@ struct Finding {
   return '"' + std::move(text) + '"';
 }
 
+/// Returns `words` with commas between them.
+[[nodiscard]] inline std::string joined(const std::vector<std::string>& words) {
+  std::string text;
+  for (const std::string& word : words)
+    text += (text.empty() ? "" : ", ") + word;
+  return text;
+}
+
 }  // namespace onramp::check

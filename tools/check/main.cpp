@@ -6,6 +6,7 @@
 #include <exception>
 #include <filesystem>
 #include <iostream>
+#include <set>
 #include <string>
 #include <system_error>
 
@@ -32,27 +33,31 @@ wrong; otherwise 0.)";
 
 bool isMedium(const std::filesystem::path& folder) {
   std::error_code ignored;
+  const std::string application = check::findApplication(folder.string());
   return std::filesystem::is_directory(folder / "MacResources", ignored) ||
-         !check::findApplication(folder.string()).empty();
+         (!application.empty() && check::isWizard(folder.string(), application));
 }
 
-// Returns why `folder` is not a medium, and what to give instead. Returns an empty string if it may
-// be a medium.
+// Returns why `folder` is not a medium, and what to give in its place. Returns an empty string if
+// it may be a medium.
 std::string reasonAgainst(const std::string& folder) {
   namespace fs = std::filesystem;
   std::error_code error;
   const fs::path path = fs::canonical(folder, error);
   if (isMedium(path)) return "";
-  if (fs::is_directory(path.parent_path() / "MacResources", error)) {
-    return "is only a part of a medium; give the whole medium, " +
-           check::quoted(path.parent_path().string());
+  for (fs::path above = path.parent_path(); above.has_relative_path();
+       above = above.parent_path()) {
+    if (isMedium(above))
+      return "is only a part of a medium; give the whole medium, " + check::quoted(above.string());
   }
+  std::set<std::string> media;
   fs::directory_iterator entry(path, error);
   for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
-    if (isMedium(entry->path()))
-      return "contains a medium, but is not one; give " + check::quoted(entry->path().string());
+    if (isMedium(entry->path())) media.insert(entry->path().string());
   }
-  return "contains neither an application nor MacResources; give the medium's folder";
+  if (!media.empty())
+    return "contains a medium, but is not one; give " + check::quoted(*media.begin());
+  return "contains neither the wizard nor MacResources; give the medium's folder";
 }
 
 // Returns `status` if standard output could be written. Otherwise prints a message and returns

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <sstream>
 #include <system_error>
 #include <utility>
 
@@ -50,7 +51,7 @@ std::optional<std::vector<std::string>> components(const std::string& path) {
   return parts;
 }
 
-std::string joined(const std::string& folder, const std::string& name) {
+std::string inFolder(const std::string& folder, const std::string& name) {
   return folder.empty() ? name : folder + "/" + name;
 }
 
@@ -74,13 +75,17 @@ std::size_t malformedAt(const std::string& bytes) {
   return bytes.size();
 }
 
-// Returns the line of `key` in the strings table at `path`. Returns nothing when the table does not
-// have the key in quotation marks.
+// Returns the line of the strings table at `path` that begins with `key` in quotation marks.
+// Returns nothing when there is no such line.
 std::optional<std::size_t> lineOfString(const std::string& path, const std::string& key) {
   const auto bytes = posix::readFile(path, kMostPropertyListBytes);
-  const auto text = bytes ? decodedText(*bytes) : std::nullopt;
-  const std::size_t at = text ? text->find(quoted(key)) : std::string::npos;
-  return at == std::string::npos ? std::nullopt : std::optional(lineOf(*text, at));
+  std::istringstream text(bytes ? decodedText(*bytes).value_or("") : "");
+  std::string line;
+  for (std::size_t number = 1; std::getline(text, line); ++number) {
+    const std::size_t start = std::min(line.find_first_not_of(" \t"), line.size());
+    if (line.compare(start, key.size() + 2, quoted(key)) == 0) return number;
+  }
+  return std::nullopt;
 }
 
 bool isXML(const std::string& text) {
@@ -147,7 +152,15 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
   std::error_code ignored;
   const bool isElsewhere = relative.starts_with('/') && fs::exists(relative, ignored) &&
                            !fs::exists(fullPath(relative), ignored);
-  if (!parts || isElsewhere || !isInside(fullPath(relative), root_)) {
+  if (isElsewhere) {
+    finding.found = use.what + " at " + quoted(relative) + ", which is a path on this computer";
+    finding.expected = "a path from the medium's top";
+    finding.remedy = "put the file on the medium and write its path from the medium's top";
+    if (relative.starts_with(root_ + "/")) finding.nearest = relative.substr(root_.size() + 1);
+    report_.findings.push_back(std::move(finding));
+    return false;
+  }
+  if (!parts || !isInside(fullPath(relative), root_)) {
     finding.found = use.what + " at " + quoted(relative) + ", which leads outside the medium";
     finding.expected = "a path inside the medium";
     finding.remedy = "put the file on the medium and write its path from the medium's top";
@@ -170,13 +183,13 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
                                         : quoted(part) + " in " + quoted(folder);
       if (nearest) {
         finding.nearest = *nearest;
-        guesses_.push_back({report_.findings.size(), joined(folder, *nearest), part});
+        guesses_.push_back({report_.findings.size(), inFolder(folder, *nearest), part});
       }
       finding.remedy = remedyForMissing(part, nearest, !use.place.key.empty());
       report_.findings.push_back(std::move(finding));
       return false;
     }
-    folder = joined(folder, part);
+    folder = inFolder(folder, part);
     used_.insert(folder);
   }
   return true;

@@ -55,10 +55,10 @@ std::string versionKey(const Version& version) {
   return std::string(packageKey(gestaltSystemVersion().value_or(0)).value_or(""));
 }
 
-// Returns the remedy for a maximum that should include all of one major version.
+// Returns how to write a maximum that includes all of the major version `major`.
 std::string supportAllOf(std::int64_t major) {
   return "to support all of " + std::to_string(major) + ", write " + std::to_string(major + 1) +
-         ", 0, 0; otherwise, write a number";
+         ", 0, 0";
 }
 
 bool takesAllBugFixes(const Dictionary& maximum) {
@@ -130,6 +130,9 @@ class PackageCheck {
   void describeRange() { report_.systems = words(begin(), end()); }
 
   void checkNumbers(std::string_view which, const Dictionary& bound) {
+    constexpr std::int64_t kNewestMajor = 1000;
+    const std::int64_t major = bound.integerValue("Major");
+    const bool isMajor = major > 0 && major < kNewestMajor;
     for (const char* const key : {"Major", "Minor", "BugFix"}) {
       const auto text = bound.string(key);
       if (!text) continue;
@@ -144,8 +147,8 @@ class PackageCheck {
                            ? "a number, or \"x\" for all of that minor version"
                            : "a number",
            .effect = "the value counts as " + std::to_string(leadingInteger(*text)),
-           .remedy = which == medium::kSystemMax && key == std::string_view("Minor")
-                         ? supportAllOf(bound.integerValue("Major"))
+           .remedy = which == medium::kSystemMax && key == std::string_view("Minor") && isMajor
+                         ? supportAllOf(major) + "; otherwise, write a number"
                          : "write a number"});
     }
   }
@@ -183,14 +186,18 @@ class PackageCheck {
          .remedy = "keep this only if " + name + " is meant to be refused"});
   }
 
-  // Warns when the range ends with the first minor version of macOS 11 or later. Before macOS 11,
-  // each yearly release was a minor version, so there a range may well end with one.
+  // Warns when the range begins with an earlier version and ends with the first minor version of
+  // macOS 11 or later. Before macOS 11, each yearly release was a minor version, so there a range
+  // may well end with one.
   void checkFirstMinorVersion() {
     constexpr std::int64_t kFirstYearlyMajor = 11;
     const Dictionary& maximum = info_.supportSystemMax();
     const Version last = boundOf(maximum);
-    if (!isBound(maximum) || !takesAllBugFixes(maximum) || last[0] < kFirstYearlyMajor ||
-        last[1] != 0 || !maximum.find("Minor") || maximum.string("Minor").value_or("0") != "0") {
+    const Value* const minor = maximum.find("Minor");
+    const auto text = maximum.string("Minor");
+    const bool isNumber = text ? isVersionNumber(*text) : minor && !minor->boolean();
+    if (!isBound(maximum) || !takesAllBugFixes(maximum) || !isNumber || !isSupported(begin()) ||
+        last[0] < kFirstYearlyMajor || last[1] != 0 || begin()[0] == last[0]) {
       return;
     }
     const std::string major = std::to_string(last[0]);
@@ -200,7 +207,7 @@ class PackageCheck {
                                 .found = "the supported systems: " + report_.systems,
                                 .expected = "a range to the last release of macOS " + major,
                                 .effect = major + ".1 is refused as too new",
-                                .remedy = supportAllOf(last[0])});
+                                .remedy = supportAllOf(last[0]) + "; otherwise, keep it"});
   }
 
   void checkApplicationsOwnMinimum() {
@@ -264,6 +271,15 @@ class PackageCheck {
     const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
         "the window closes and nothing opens; systems: " + words(row.from, row.to);
+    if (package.string(key) == "") {
+      report_.findings.push_back({.id = "package-unnamed",
+                                  .place = placeOf(medium::kPkgInfo, key),
+                                  .found = "an empty name",
+                                  .expected = "the package's name",
+                                  .effect = effect,
+                                  .remedy = "name the package"});
+      return;
+    }
     if (!row.package.empty()) {
       const PathUse use{placeOf(medium::kPkgInfo, key), "the package", effect};
       if (checked_.insert(row.package).second && files_.exists(row.package, use))

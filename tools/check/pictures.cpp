@@ -1,5 +1,6 @@
 #include <png.h>
 
+#include <algorithm>
 #include <array>
 #include <filesystem>
 #include <string_view>
@@ -25,11 +26,9 @@ constexpr std::array kConnectionPictures{
     Picture{"usb.png", 192, 192, "no picture beside USB"},
     Picture{"wiredLan.png", 192, 192, "no picture beside USB and the wired network"},
 };
-constexpr std::array kBackgrounds{
-    Picture{"Background.png", 680, 480, "a window without a background picture"},
-    Picture{"Background@2x.png", 1360, 960,
-            "a blurred background on screens with two pixels per point"},
-};
+constexpr Picture kBackground{"Background.png", 680, 480, "a window without a background picture"};
+constexpr Picture kDenseBackground{"Background@2x.png", 1360, 960,
+                                   "a blurred background on screens with two pixels per point"};
 
 // The size of a picture in pixels, and the reason why the picture cannot be shown.
 struct Decoded {
@@ -102,8 +101,20 @@ void checkPictures(const MediumFiles& files) {
     checkPicture(files, "MacResources/Images", picture);
   const std::string& application = files.report().application;
   if (application.empty()) return;
-  for (const Picture& picture : kBackgrounds)
-    checkPicture(files, application + "/Contents/Resources", picture);
+  const std::string resources = application + "/Contents/Resources";
+  checkPicture(files, resources, kBackground);
+  const std::vector<std::string> names = files.names(resources);
+  if (std::binary_search(names.begin(), names.end(), kDenseBackground.name)) {
+    checkPicture(files, resources, kDenseBackground);
+    return;
+  }
+  files.report().findings.push_back({.id = "picture-not-dense",
+                                     .severity = Severity::kWarning,
+                                     .place = {.file = resources},
+                                     .found = "no " + quoted(kDenseBackground.name),
+                                     .expected = "a background of 1360 × 960 pixels",
+                                     .effect = kDenseBackground.effect,
+                                     .remedy = "add the picture"});
 }
 
 }  // namespace onramp::check

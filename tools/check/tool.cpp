@@ -2,11 +2,14 @@
 #include <fstream>
 #include <string>
 #include <system_error>
+#include <utility>
+#include <vector>
 
 #include "base/ascii.h"
 #include "media/medium.h"
 #include "platform/bundle.h"
 #include "tools/check/checks.h"
+#include "tools/check/languages.h"
 
 namespace onramp::check {
 
@@ -67,36 +70,40 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
   if (!finding.id.empty()) files.report().findings.push_back(std::move(finding));
 }
 
-// Reports each language in which the tool has translated text, but no translated name. If the
-// tool's name contains the maker's name, also reports translations without the maker's name, which
-// are probably left over from another maker's medium.
+// Checks the translations of the tool's name. If some languages have a translation, reports the
+// tables without one, except the table of `region`, whose users see the right name anyway. If the
+// name contains the maker's name, reports the translations that do not, because they are probably
+// left over from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
-                       const std::string& name, const std::string& vendor) {
+                       const std::string& name, const std::string& vendor,
+                       const std::string& region) {
   const std::string maker = firstWord(vendor);
   const auto names = [&](const std::string& text) {
     return asciiLowercased(text).find(asciiLowercased(maker)) != std::string::npos;
   };
+  const bool namesMaker = !maker.empty() && names(name);
+  std::vector<Finding> missing;
+  bool isTranslated = false;
   const std::string resources = relative + "/Contents/Resources";
-  for (const std::string& folder : files.names(resources)) {
-    const std::string table = (fs::path(resources) / folder / "InfoPlist.strings").string();
-    std::error_code ignored;
-    if (!folder.ends_with(".lproj") || !fs::exists(files.fullPath(table), ignored)) continue;
+  for (const std::string& language : languagesIn(files, resources, "InfoPlist.strings")) {
+    const std::string table =
+        (fs::path(resources) / (language + ".lproj") / "InfoPlist.strings").string();
     const auto texts = files.strings(
         table,
         {{.file = table}, "the tool's translated names", "the tool's untranslated name on macOS"});
     if (!texts) continue;
     const auto translated = texts->string(kDisplayName);
-    if (!translated) {
-      files.report().findings.push_back(
-          {.id = "tool-name-untranslated",
-           .severity = Severity::kWarning,
-           .place = {.file = table},
-           .found = "no text under " + quoted(kDisplayName),
-           .expected = "a translation of " + quoted(name),
-           .effect = "users of this file's language see the name " + quoted(name),
-           .remedy = "write the translation"});
+    isTranslated = isTranslated || translated;
+    if (!translated && !isSameLanguage(language, region)) {
+      missing.push_back({.id = "tool-name-untranslated",
+                         .severity = Severity::kWarning,
+                         .place = {.file = table},
+                         .found = "no text under " + quoted(kDisplayName),
+                         .expected = "a translation of " + quoted(name),
+                         .effect = "users of " + quoted(language) + " see the name " + quoted(name),
+                         .remedy = "write the translation"});
     }
-    if (!translated || maker.empty() || !names(name) || names(*translated)) continue;
+    if (!translated || !namesMaker || names(*translated)) continue;
     files.report().findings.push_back(
         {.id = "tool-name-left-over",
          .severity = Severity::kWarning,
@@ -106,6 +113,9 @@ void checkTranslations(const MediumFiles& files, const std::string& relative,
          .effect = "on macOS, users of this file's language see the name " + quoted(*translated),
          .remedy = "translate the tool's current name"});
   }
+  if (!isTranslated) return;
+  for (Finding& finding : missing)
+    files.report().findings.push_back(std::move(finding));
 }
 
 }  // namespace
@@ -147,7 +157,8 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
   checkProgram(files, *bundle, *relative, kEffect);
   const auto name = information->string(kDisplayName);
   if (name) {
-    checkTranslations(files, *relative, *name, resources.string(medium::kVenderName).value_or(""));
+    checkTranslations(files, *relative, *name, resources.string(medium::kVenderName).value_or(""),
+                      information->string("CFBundleDevelopmentRegion").value_or("en"));
     return;
   }
   files.report().findings.push_back(

@@ -130,7 +130,8 @@ TextStyle outputStyle(bool isVerbose) {
 }
 
 std::string tableHead(const Medium& medium, const TextStyle& style) {
-  const bool isForAll = medium.choosesModel && medium.wanted.size() == medium.models.size();
+  const bool isForAll = medium.choosesModel && medium.models.size() > 1 &&
+                        medium.wanted.size() == medium.models.size();
   return (isForAll ? paragraph("Users of this medium choose a model first, and the wizard then "
                                "lists only devices of that model. Add --model to see the list of "
                                "one user.",

@@ -91,7 +91,8 @@ std::optional<std::string> nearestOf(const std::string& announced, const std::st
                                      const Medium& medium) {
   auto nearest = check::Spelling(medium.models).nearest(announced);
   for (const std::string& known : medium.models) {
-    if (!nearest && asciiLowercased(known).ends_with(' ' + asciiLowercased(model))) nearest = known;
+    const std::string withoutMaker = known.substr(known.find(' ') + 1);
+    if (!nearest && asciiLowercased(withoutMaker) == asciiLowercased(model)) nearest = known;
   }
   return nearest;
 }

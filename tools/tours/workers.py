@@ -40,7 +40,11 @@ def take_tours(medium, original, pictures, languages, options):
     facts = Facts(original)
     wanted = _chosen(languages, medium)
     folder = pathlib.Path(pictures)
-    folder.mkdir(parents=True, exist_ok=True)
+    try:
+        folder.mkdir(parents=True, exist_ok=True)
+    except OSError as error:
+        raise Unsuitable(f"{folder} cannot hold the pictures ({error.strerror}); "
+                         "give another folder") from error
     if any(folder.glob("*.png")) and not (folder / "index.html").exists():
         raise Unsuitable(f"{folder} has pictures, but no index.html of an earlier tour; "
                          "empty the folder, or give another one")

@@ -1,0 +1,240 @@
+#include "tools/check/languages.h"
+
+#include <algorithm>
+#include <array>
+#include <filesystem>
+#include <utility>
+
+#include "media/medium.h"
+#include "platform/bundle.h"
+#include "platform/freedesktop/language.h"
+#include "tools/check/shown_texts.h"
+
+namespace onramp::check {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr const char* kNameTable = "InfoPlist.strings";
+
+// Codes of countries that are easily taken for the code of the country's language. None of them is
+// the code of a language.
+constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountries{{{"jp", "ja"},
+                                                                                   {"cn", "zh"},
+                                                                                   {"kr", "ko"},
+                                                                                   {"cz", "cs"},
+                                                                                   {"dk", "da"},
+                                                                                   {"gr", "el"},
+                                                                                   {"ua", "uk"},
+                                                                                   {"vn", "vi"}}};
+
+// Returns the code of the language `name`. "no" and "nb" are both names of Norwegian Bokmål.
+std::string codeOf(const std::string& name) {
+  const std::string code = Language::parse(name).code;
+  return code == "no" ? "nb" : code;
+}
+
+// Returns whether `offered` contains the language `wanted`, in any region. A related language does
+// not count, even if the system would use it instead.
+bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
+  const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
+  if (found.empty() || !isSameLanguage(found.front(), wanted)) return false;
+  const std::string first = Language::parse(found.front()).script;
+  const std::string second = Language::parse(wanted).script;
+  return first.empty() || second.empty() || first == second;
+}
+
+// Returns how many of the texts that the wizard shows are the same in two tables.
+std::size_t commonTexts(const Dictionary& a, const Dictionary& b) {
+  return static_cast<std::size_t>(
+      std::count_if(shownTexts().begin(), shownTexts().end(), [&](const ShownText& shown) {
+        const auto text = a.string(shown.key);
+        return text && text == b.string(shown.key);
+      }));
+}
+
+class LanguageCheck {
+ public:
+  LanguageCheck(const MediumFiles& files, const Lists& lists,
+                const std::map<std::string, Dictionary>& tables)
+      : files_(files),
+        lists_(lists),
+        report_(files.report()),
+        tables_(tables),
+        languages_(languagesIn(files, std::string(kMessageBundle) + "/Contents/Resources")) {}
+
+  void run() {
+    checkTranslations();
+    checkDevelopmentRegion();
+    checkApplicationLanguages();
+    checkToolLanguages();
+  }
+
+ private:
+  // Reports each language that has at least half of its texts in common with English. A new
+  // language usually begins as a copy of the English table, and some texts may be left so by
+  // mistake.
+  void checkTranslations() {
+    const auto english = std::find_if(tables_.begin(), tables_.end(), [](const auto& table) {
+      return isSameLanguage(table.first, "en");
+    });
+    if (english == tables_.end()) return;
+    for (const auto& [language, texts] : tables_) {
+      const std::size_t same = commonTexts(texts, english->second);
+      if (isSameLanguage(language, "en") || 2 * same < shownTexts().size()) continue;
+      report_.findings.push_back(
+          {.id = "texts-copied",
+           .severity = Severity::kWarning,
+           .place = {.file = messageTable(language)},
+           .found = std::to_string(same) + " texts that are the same in " + quoted(english->first),
+           .expected = "texts in the language " + quoted(language),
+           .effect = "users of " + quoted(language) + " see text in the wrong language",
+           .remedy = "translate these texts"});
+    }
+  }
+
+  void checkDevelopmentRegion() {
+    constexpr const char* kKey = "CFBundleDevelopmentRegion";
+    const std::string path = std::string(kMessageBundle) + "/Contents/Info.plist";
+    const std::string effect = serves(languages_, "en")
+                                   ? "users without texts in their language see another language "
+                                     "that their system picks, usually English"
+                                   : "users without texts in their language may see keys such as "
+                                     "\"INST_TXT_MODEL\" instead of text";
+    const auto information =
+        files_.list(path, {{.file = path}, "the message bundle's Info.plist", effect});
+    if (!information) return;
+    const auto region = information->string(kKey);
+    const std::string offered =
+        languages_.empty() ? "the languages that you add to the bundle" : joined(languages_);
+    Finding finding{.id = "region-missing",
+                    .place = {.file = path},
+                    .found = "no \"CFBundleDevelopmentRegion\"",
+                    .expected = "the language for users without texts in their own, such as \"en\"",
+                    .effect = effect,
+                    .remedy = "add \"CFBundleDevelopmentRegion\" with one of " + offered};
+    if (region) {
+      if (serves(languages_, *region)) return;
+      finding.id = "region-without-texts";
+      finding.place.key = {kKey};
+      finding.found = "the language " + quoted(*region) + ", which the bundle does not have";
+      finding.expected = "one of " + offered;
+      finding.remedy =
+          "name one of the expected languages, or add the " + quoted(*region) + " texts";
+    } else if (information->find(kKey)) {
+      finding.place.key = {kKey};
+      finding.found = "a value that is not a string";
+      finding.remedy = "write one of " + offered;
+    }
+    report_.findings.push_back(std::move(finding));
+  }
+
+  // Reports each language that the message bundle has and the application lacks. The message bundle
+  // cannot supply the application's texts.
+  void checkApplicationLanguages() {
+    if (!lists_.information) return;
+    const std::string resources = report_.application + "/Contents/Resources";
+    const std::vector<std::string> own = languagesIn(files_, resources, kNameTable);
+    for (const std::string& language : languagesBeyond(own)) {
+      reportMissingLanguage(
+          "language-not-in-application", resources, language, own,
+          "read and hear some of the application's texts in English: why the wizard uses the "
+          "network, and the name of the gear button",
+          "have the application built with text in that language");
+    }
+  }
+
+  // Reports each language that the message bundle has and the set-up tool lacks. A tool without
+  // translations has the same name for all users, so nothing is missing.
+  void checkToolLanguages() {
+    const auto tool = lists_.resources ? lists_.resources->string(medium::kWLANtool) : std::nullopt;
+    const auto bundle = tool ? Bundle::open(files_.fullPath(*tool)) : std::nullopt;
+    if (!bundle) return;
+    const std::string resources = *tool + "/Contents/Resources";
+    const std::string region = bundle->infoString("CFBundleDevelopmentRegion").value_or("en");
+    const std::vector<std::string> own = languagesIn(files_, resources, kNameTable);
+    const bool isTranslated = std::any_of(own.begin(), own.end(), [&](const std::string& language) {
+      return !isSameLanguage(language, region);
+    });
+    if (!isTranslated) return;
+    std::vector<std::string> served = own;
+    served.push_back(region);
+    for (const std::string& language : languagesBeyond(served)) {
+      reportMissingLanguage("language-not-in-tool", resources, language, own,
+                            "see the set-up tool's name in another language",
+                            "add the folder, with the tool's name in its InfoPlist.strings");
+    }
+  }
+
+  // Returns the languages of the message bundle that `served` lacks.
+  [[nodiscard]] std::vector<std::string> languagesBeyond(
+      const std::vector<std::string>& served) const {
+    std::vector<std::string> languages;
+    for (const std::string& language : languages_) {
+      if (isLanguage(language) && !serves(served, language)) languages.push_back(language);
+    }
+    return languages;
+  }
+
+  void reportMissingLanguage(const char* id, const std::string& resources,
+                             const std::string& language, const std::vector<std::string>& own,
+                             const std::string& effect, const char* remedy) {
+    report_.findings.push_back({.id = id,
+                                .severity = Severity::kWarning,
+                                .place = {.file = resources},
+                                .found = "no " + quoted(language + std::string(kLanguageFolder)),
+                                .expected = "the languages of the message bundle; here are " +
+                                            (own.empty() ? "none" : joined(own)),
+                                .effect = "users of " + quoted(language) + " " + effect,
+                                .remedy = remedy});
+  }
+
+  const MediumFiles& files_;
+  const Lists& lists_;
+  Report& report_;
+  const std::map<std::string, Dictionary>& tables_;
+  std::vector<std::string> languages_;
+};
+
+}  // namespace
+
+std::string messageTable(const std::string& language) {
+  return std::string(kMessageBundle) + "/Contents/Resources/" + language +
+         std::string(kLanguageFolder) + "/Localizable.strings";
+}
+
+std::vector<std::string> languagesIn(const MediumFiles& files, const std::string& resources,
+                                     const std::string& table) {
+  std::vector<std::string> languages;
+  for (const std::string& name : files.names(resources)) {
+    // macOS writes files whose names begin with "._" to file systems that lack its attributes.
+    if (!name.ends_with(kLanguageFolder) || name.starts_with('.') || name == "Base.lproj") continue;
+    const std::vector<std::string> contents = files.names((fs::path(resources) / name).string());
+    if (table.empty() || std::binary_search(contents.begin(), contents.end(), table))
+      languages.push_back(name.substr(0, name.size() - kLanguageFolder.size()));
+  }
+  return languages;
+}
+
+bool isLanguage(const std::string& name) {
+  return !Language::parse(name).code.empty() && !languageOfCountry(name);
+}
+
+std::optional<std::string> languageOfCountry(const std::string& name) {
+  const std::string code = Language::parse(name).code;
+  const auto found = std::find_if(kCountries.begin(), kCountries.end(),
+                                  [&](const auto& pair) { return pair.first == code; });
+  return found == kCountries.end() ? std::nullopt : std::optional(std::string(found->second));
+}
+
+bool isSameLanguage(const std::string& a, const std::string& b) {
+  return codeOf(a) == codeOf(b);
+}
+
+void checkLanguages(const MediumFiles& files, const Lists& lists,
+                    const std::map<std::string, Dictionary>& tables) {
+  LanguageCheck(files, lists, tables).run();
+}
+
+}  // namespace onramp::check
