@@ -50,8 +50,8 @@ class ArrayController {
   void setSelectedObject(const Dictionary& entry);
 
   /// choose() selects like setSelectionIndex(), and chooseObject() like setSelectedObject(). Both
-  /// also record that the user made the selection, even if they clear it. The bound table calls
-  /// choose().
+  /// also record that the user made a choice, even if the choice clears the selection. The bound
+  /// table calls choose().
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 

@@ -15,8 +15,8 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-/// Returns the version with these components. A component that is missing, such as the third one of
-/// 10.9, or that does not begin with a number counts as 0.
+/// Returns the version with these components. A component counts as 0 if it is missing, as the
+/// third one of 10.9 is, or does not begin with a number.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
 /// How a system version compares with the range that the medium supports.

@@ -19,10 +19,10 @@ class Case:
     benchmark: str      # such as "Time from start to first page"
     name: str           # what distinguishes this case, such as "100 models"
     peer_name: str      # what Onramp is compared with, such as "avahi-browse"
-    unit: str           # of all values: "s" or "MiB"
+    unit: str           # the unit of `ours` and `peer`: "s" or "MiB"
     ours: list[float]
     peer: list[float]
-    axis: str = ""      # what the x axis of the plot counts, such as "models"; empty: no plot
+    axis: str = ""      # the label of the plot's x axis, such as "models"; if empty, there is no plot
     size: int = 0       # the number on the x axis
 
     def ratio(self):

@@ -1,7 +1,7 @@
 """Controls the wizard's chooser (its list of devices) without the accessibility bus.
 
-This is necessary to measure the wizard's memory. With the accessibility bus, Qt creates an object
-for a cell whenever the selected row changes, and never frees it.
+This is necessary to measure the wizard's memory. While the accessibility bus is in use, Qt creates
+an object for a table cell whenever the selected row changes, and never frees it.
 """
 
 import pathlib
@@ -22,9 +22,9 @@ def descriptors(process):
 class BlindChooser:
     """A context manager that starts the wizard and controls it without reading the screen.
 
-    The constructor first runs the wizard once with the accessibility bus, to find the button of the
-    menu. The wizard has more open descriptors while it searches, so their number shows whether a
-    search is running.
+    The constructor first runs the wizard once with the accessibility bus, to find out where the menu
+    button is. The wizard has more open descriptors while it searches, so their number shows whether
+    a search is running.
     """
 
     def __init__(self, desktop, medium, text):

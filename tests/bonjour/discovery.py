@@ -16,7 +16,7 @@ PATIENCE = 30  # seconds to wait for an event before the test fails
 
 
 def enclose(description):
-    """Restarts this program on a practice network of two hosts, if it does not run on one yet.
+    """Restarts this program on a practice network of two hosts, unless it is already running on one.
 
     `description` is the network's description file.
     """
@@ -101,7 +101,7 @@ class Avahi:
 
     def start(self, **settings):
         """Starts the daemon. Each of `settings` replaces the setting of the same name in the
-        configuration file. In the names of the arguments, "_" replaces "-"."""
+        configuration file. The arguments' names have "_" where the settings' names have "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

@@ -17,8 +17,8 @@ namespace onramp::faults {
 /// Says which calls fail, and how. Only functions that system_calls.cpp replaces can fail.
 struct Failure {
   std::size_t first = 0;  ///< the number of the first call that fails, counted from 1
-  /// The error number of a call that fails. With ENOMEM, only allocations are counted and fail;
-  /// with any other value, only calls of the other functions.
+  /// The error number of a call that fails. With ENOMEM, only allocations are counted and can fail.
+  /// With any other value, only calls of functions that do not allocate are counted and can fail.
   int error = 0;
   bool isLasting = false;  ///< whether all later calls fail, too
 };
@@ -26,16 +26,16 @@ struct Failure {
 /// Starts counting this thread's calls, and makes calls fail as `failure` says.
 void begin(const Failure& failure);
 
-/// Stops counting, and lets all calls succeed again. Returns the function's name for every counted
-/// call since begin(), in order.
+/// Stops counting, and lets all calls succeed again. Returns the names of the functions called
+/// since begin(), one for each counted call, in order.
 std::vector<std::string> end();
 
 /// Runs `work` again and again. In the first run, the first call fails; in the second run, the
 /// second call; and so on until a run has no call left to fail or the test has failed. Does this
 /// for each of `errors`, first with single failures, then with lasting failures (except for EINTR).
 /// Lasting failures also keep `work` from cleaning up, as if the process were killed. After each
-/// run, expects that no descriptor is left open, and calls `check` with the name of the first call
-/// that failed and the failure. The name is empty if no call failed. Returns the names of all
+/// run, expects that no descriptor is left open. Then calls `check` with the name of the first call
+/// that failed, and with the failure. The name is empty if no call failed. Returns the names of all
 /// calls.
 template <typename Work, typename Check>
 std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Work& work,

@@ -69,7 +69,7 @@ void deliver(CFOptionFlags flags, CFTypeRef found, std::int32_t code) {
   browser.client(&browser, flags, found, &error, browser.info);
 }
 
-TEST(CFNetworkBrowser, ReportsAServiceAtItsFirstSightingAndAfterItsLast) {
+TEST(CFNetworkBrowser, ReportsAServiceWhenItIsFirstSeenAndWhenItsLastInstanceIsGone) {
   Seen seen;
   seen.browser = NetServiceBrowser::create(Seen::browsed, &seen);
   seen.browser->schedule();
@@ -163,12 +163,12 @@ TEST(CFNetworkService, ResolvesToAddressesAndTxtDataAndCanBeReleasedByItsClient)
   EXPECT_FALSE(native->isScheduled || native->isRunning || native->client);
 }
 
-TEST(CFNetworkService, IsNotCreatedFromTextsThatAreNotUTF8) {
+TEST(CFNetworkService, RejectsStringsThatAreNotUTF8) {
   EXPECT_EQ(NetService::create("local.", "_ipp._tcp.", "B\xFCro", 0), nullptr);
   EXPECT_EQ(corefoundation::toCFArray({"a", "\xFF", "b"}).get()->members.size(), 2U);
 }
 
-TEST(SystemConfigurationStore, MakesKeysQueriesPatternsAndOmitsValuesOfUnknownTypes) {
+TEST(SystemConfigurationStore, MakesKeysAndPatternsAndOmitsValuesOfUnknownTypes) {
   const DynamicStoreRef store = createDynamicStore("test");
   const auto key = createNetworkInterfaceEntityKey("State:", "en0", "IPv4");
   EXPECT_EQ(key, "State:/Network/Interface/en0/IPv4");

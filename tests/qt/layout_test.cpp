@@ -104,8 +104,8 @@ class Layout : public testing::TestWithParam<int> {
     }
   }
 
-  // Expects that the menu's text looks the same in a wider menu. Text that is elided in the usual
-  // menu would look different.
+  // Expects that the menu's text looks the same in a wider menu. Text that is elided at the menu's
+  // normal width would look different.
   static void expectMenuFits(QMenu& menu) {
     const QSize size = menu.sizeHint();
     menu.resize(size);
@@ -153,7 +153,7 @@ class Layout : public testing::TestWithParam<int> {
   QWidget* window = nullptr;
 };
 
-TEST_P(Layout, ControlsHaveRoomForTheirTextsFitTheScreenAndDoNotOverlap) {
+TEST_P(Layout, ControlsFitTheirTextAndTheScreenWithoutOverlapping) {
   delegate->showModelListView();
   delegate->setModelListViewButton();
   expectEverythingFits();

@@ -6,12 +6,12 @@ from practice_network.names import shortened
 from .visit import CONNECTION, DEVICES, GEAR_REFRESH, WentWrong
 
 _SEARCHES = 3  # on a busy machine, the first search may find nothing
-_LONGEST_SEARCH = 75  # seconds; the wizard pauses for at most 15, but the machine may be busy
+_LONGEST_SEARCH = 75  # seconds; a search takes at most 15, but longer on a busy machine
 
 
 class Devices:
-    """Makes up devices of the medium's models on the practice network `network`. A device has its
-    model's name, shortened if the name is too long for a device."""
+    """Adds made-up devices to the practice network `network`. Their models are models of the medium.
+    A device has its model's name, shortened if the name is too long for a device."""
 
     def __init__(self, network, service_type):
         self._network = network
@@ -49,14 +49,15 @@ def second_of(model, service_type):
 
 
 def matches_devices(model):
-    """Returns whether a device can announce the model's name: a maker, a space and a model."""
+    """Returns whether a device can announce the name `model`. The name must consist of a maker, a
+    space and a model."""
     maker, space, kind = model.partition(" ")
     return bool(maker and space and kind)
 
 
 def find_devices(visit, medium, step=None):
     """Searches from the connection page until devices are listed. Raises WentWrong if no device
-    appears. If `step` is set, it names a picture of the first search."""
+    appears. If `step` is set, takes a picture of the first search under that name."""
     for number in range(_SEARCHES):
         visit.next()
         wait_for(lambda: visit.person.sees("progress bar"), 20, "the search to begin")
@@ -77,7 +78,7 @@ def _is_searching(visit):
 
 
 def _can_connect(visit):
-    """Returns whether the connection page accepts keys: no set-up tool is running."""
+    """Returns whether the connection page accepts keys, that is, whether no set-up tool is running."""
     return visit.shows(CONNECTION) and any(
         visit.person.has_state(control, "focused")
         for role, _, control in visit.person.everything() if role == "radio button")
