@@ -150,8 +150,8 @@ MISTAKES = [
     (put(f"{APPLICATION}/Info.plist", "CommonResourcePath", 5), "value-kind", "a path"),
     (remove("Onramp OSX.app"), "application-missing", "double-click"),
     (remove(f"{APPLICATION}/MacOS/Onramp OSX"), "program-missing", "does not start"),
-    (replace(COMMON, "<key>CDInfo</key>", "<key>CDInfo</key><string>x</string><key>CDInfo</key>"),
-     "key-twice", "every key once"),
+    (replace(MODELS, f"<key>{MODEL}</key>", f"<key>{MODEL}</key><dict><key>KSCID</key><string>x</string></dict>"
+             f"<key>{MODEL}</key>"), "key-twice", "every key once"),
     # The models.
     (rename(DESCRIPTION, MODEL, "Kestrel Model 10 0", "ContainedModel"), "model-undescribed", MODEL),
     (take(MODELS, "Model", MODEL), "model-undescribed", "does not have", "USB only"),
@@ -168,7 +168,7 @@ MISTAKES = [
     (packages(v109=1), "package-none", "systems: 10.6.0 up to, but not including, 10.9.0"),
     (put(COMMON, "PkgInfo", "PkgName", ""), "package-unnamed", "an empty name"),
     (both(remove(PACKAGE), write(PACKAGE, b"")), "package-empty", "nothing can be installed"),
-    (put(COMMON, "PkgInfo", "PkgName", "None.pkg"), "path-missing", "Packages/None.pkg"),
+    (put(COMMON, "PkgInfo", "PkgName", PACKAGE), "path-missing", f'"Packages/{PACKAGE}"', f'has "{PACKAGE}"'),
     (both(packages(v106=1, v107=1, v108=1, v109=1), put(COMMON, "PkgInfo", "108", Path(PACKAGE).stem + "2.pkg")),
      "path-missing", "put it at that path, or correct the path"),
     (put(COMMON, "PkgInfo", "109", "Old.pkg"), "package-shadowed", '"109"', "every system gets"),

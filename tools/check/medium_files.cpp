@@ -93,6 +93,23 @@ bool isXML(const std::string& text) {
   return first != std::string::npos && text[first] == '<';
 }
 
+// Returns the path of the only file or folder in `root` that is named `name`, relative to `root`.
+// Returns nothing if there is none, several, or so many files that the search would take long.
+std::optional<std::string> onlyPathOf(const std::string& name, const std::string& root) {
+  constexpr int kMostFiles = 10'000;
+  std::optional<std::string> only;
+  std::error_code error;
+  fs::recursive_directory_iterator entry(root, error);
+  for (int files = 0; !error && entry != fs::recursive_directory_iterator();
+       entry.increment(error)) {
+    if (++files > kMostFiles) return std::nullopt;
+    if (entry->path().filename() != name) continue;
+    if (only) return std::nullopt;
+    only = entry->path().lexically_relative(root).string();
+  }
+  return only;
+}
+
 // `nearest` is a name on the medium that resembles `missing`, if there is one. `isWritten` is true
 // if a file on the medium names `missing`, and false if the path is fixed in the wizard.
 std::string remedyForMissing(const std::string& missing, const std::optional<std::string>& nearest,
@@ -172,27 +189,36 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
   for (const std::string& part : *parts) {
     const std::vector<std::string> there = names(folder);
     if (!std::binary_search(there.begin(), there.end(), part)) {
-      const auto nearest = Spelling(there).nearest(part);
-      const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
-      finding.id = capitals ? "path-capitals" : "path-missing";
-      finding.found =
-          use.what + " at " + quoted(relative) +
-          (capitals ? ", which differs from the name on the medium only in capital letters"
-                    : ", which does not exist");
-      finding.expected = folder.empty() ? quoted(part) + " at the medium's top"
-                                        : quoted(part) + " in " + quoted(folder);
-      if (nearest) {
-        finding.nearest = *nearest;
-        guesses_.push_back({report_.findings.size(), inFolder(folder, *nearest), part});
-      }
-      finding.remedy = remedyForMissing(part, nearest, !use.place.key.empty());
-      report_.findings.push_back(std::move(finding));
+      reportMissing(relative, folder, part, use);
       return false;
     }
     folder = inFolder(folder, part);
     used_.insert(folder);
   }
   return true;
+}
+
+void MediumFiles::reportMissing(const std::string& relative, const std::string& folder,
+                                const std::string& part, const PathUse& use) const {
+  const auto nearest = Spelling(names(folder)).nearest(part);
+  const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
+  Finding finding{.id = capitals ? "path-capitals" : "path-missing",
+                  .place = use.place,
+                  .found = use.what + " at " + quoted(relative) +
+                           (capitals ? ", which differs from the name on the medium only in "
+                                       "capital letters"
+                                     : ", which does not exist"),
+                  .expected = quoted(part) +
+                              (folder.empty() ? " at the medium's top" : " in " + quoted(folder)),
+                  .nearest = nearest.value_or(""),
+                  .effect = use.effect,
+                  .remedy = remedyForMissing(part, nearest, !use.place.key.empty())};
+  if (nearest) {
+    guesses_.push_back({report_.findings.size(), inFolder(folder, *nearest), part});
+  } else if (const auto only = onlyPathOf(fs::path(relative).filename().string(), root_)) {
+    finding.found += "; the medium has " + quoted(*only);
+  }
+  report_.findings.push_back(std::move(finding));
 }
 
 void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& use,

@@ -40,8 +40,8 @@ class MediumFiles {
   bool exists(const std::string& relative, const PathUse& use) const;
 
   /// Returns the property list at `relative`. If it is an XML list, reports each repetition of a
-  /// key in its dictionary, except inside arrays. When exists() returns false or the wizard cannot
-  /// read the list, reports why and returns nothing.
+  /// key in its dictionary, except inside arrays and inside the value of a repeated key. When
+  /// exists() returns false or the wizard cannot read the list, reports why and returns nothing.
   [[nodiscard]] std::optional<Dictionary> list(const std::string& relative,
                                                const PathUse& use) const;
 
@@ -68,6 +68,10 @@ class MediumFiles {
     std::string path{};       ///< of the file that was probably meant
     std::string missing{};
   };
+
+  /// Reports that `folder` on the medium has no entry `part`, a component of the path `relative`.
+  void reportMissing(const std::string& relative, const std::string& folder,
+                     const std::string& part, const PathUse& use) const;
 
   void reportUnreadable(const std::string& relative, const PathUse& use, bool isStrings) const;
 

@@ -87,9 +87,16 @@ class Walk {
     path_.back() = text_;
     // `path_` has no array indexes, so the dictionaries in an array would seem to be one dictionary
     // that repeats its keys.
-    if (arrays_ == 0 && !lines_.keys.emplace(path_, keyLine_).second) {
+    if (arrays_ == 0 && !lines_.keys.emplace(path_, keyLine_).second && !isInRepetition()) {
       lines_.twice.emplace_back(path_, keyLine_);
     }
+  }
+
+  // Returns whether an enclosing dictionary is the value of the last key that was repeated.
+  [[nodiscard]] bool isInRepetition() const {
+    if (lines_.twice.empty()) return false;
+    const std::vector<std::string>& last = lines_.twice.back().first;
+    return last.size() < path_.size() && std::equal(last.begin(), last.end(), path_.begin());
   }
 
   void characters(std::string_view text) {

@@ -36,6 +36,10 @@ std::string questionText(const std::string& address) {
 std::string conclusionOf(const Answer& answer) {
   const Exchange* const told = answer.telling();
   if (!answer.isComplete) return "interrupted before the device answered\n";
+  if (told && told->outcome == Exchange::Outcome::kUnsent) {
+    return "this computer could not send the question; check the address, and this computer's "
+           "network connection and firewall\n";
+  }
   if (answer.isWireless) return "wireless\n";
   if (!told || !told->value) return "no usable answer: not in the wizard's list\n";
   if (*told->value == kActiveIFWireless) {

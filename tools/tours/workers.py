@@ -64,8 +64,12 @@ def take_tours(medium, original, pictures, languages, options):
         orders = [{"medium": medium, "original": original, "pictures": pictures, "language": language,
                    "options": options, "has_network": status == 0,
                    "result": f"{results}/{number}"} for number, language in enumerate(wanted)]
+        statuses = []
         with concurrent.futures.ThreadPoolExecutor(_AT_A_TIME) as pool:
-            statuses = list(pool.map(_take_one, orders))
+            # The tours' outputs are printed whole and in the order of the index.
+            for done in pool.map(_take_one, orders):
+                print(f"\n{done.stdout}", end="", flush=True)
+                statuses.append(done.returncode)
         files = [pathlib.Path(order["result"]) for order in orders]
         albums = [json.loads(file.read_text(encoding="utf-8")) for file in files if file.exists()]
     index.write(folder, original, facts.findings, albums)
@@ -87,9 +91,6 @@ def _chosen(languages, medium):
 
 
 def _take_one(order):
-    """Runs one tour. Prints the tour's output only when the tour has finished, so that the outputs of
-    parallel tours are not interleaved."""
-    done = run([INSIDE, json.dumps(order)], order["has_network"],
+    """Runs one tour in a separate process. Returns that process, with its output."""
+    return run([INSIDE, json.dumps(order)], order["has_network"],
                stdout=subprocess.PIPE, stderr=subprocess.STDOUT, text=True)
-    print(f"\n{done.stdout}", end="", flush=True)
-    return done.returncode
