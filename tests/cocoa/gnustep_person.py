@@ -67,6 +67,9 @@ class GNUstepPerson(Person):
             pass
         self.desktop.run(["xdotool", "mouseup", "1"])
 
+    def _has_keyboard(self):
+        return True  # nothing tells which of GNUstep's windows has the focus
+
     def _noticed_presses(self):
         return self._read()[0]["presses"] if self.is_running() else 0
 

@@ -3,6 +3,7 @@ uses mouse and keyboard."""
 
 import os
 import pathlib
+import subprocess
 import time
 
 from .processes import start, stop, wait_for
@@ -151,7 +152,9 @@ class Person:
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):
-        """Presses the keys one after another. They have X names, such as "Return" or "alt+F4"."""
+        """Waits until the program has the keyboard, and presses the keys one after another. They have
+        X names, such as "Return" or "alt+F4"."""
+        wait_for(self._has_keyboard, _LOOK_SECONDS, "the program to get the keyboard")
         self.desktop.run(["xdotool", "key", "--clearmodifiers", *keys])
 
     def close_window(self):
@@ -171,6 +174,13 @@ class Person:
         if self.process.poll() is not None:
             raise RuntimeError(f"the program has exited with status {self.process.returncode}")
         return True
+
+    def _has_keyboard(self):
+        """Returns whether a window of the program has the X input focus. Also returns true when the
+        program has exited, because then nothing is worth waiting for."""
+        owner = subprocess.run(["xdotool", "getwindowfocus", "getwindowpid"], env=self.desktop.env,
+                               capture_output=True, text=True)
+        return not self.is_running() or owner.stdout.strip() == str(self.process.pid)
 
     def _resting_place(self, control):
         """Waits until the control no longer moves, and returns its extents on the screen.
