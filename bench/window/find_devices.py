@@ -43,7 +43,7 @@ def time_of_tools(count):
         fields = browser.stdout.readline().split(";")
         if fields[0] == "=":
             addresses[fields[3]] = fields[7]
-    community, snmp_object = maker_settings()
+    community, snmp_object, _ = maker_settings()
     for address in addresses.values():
         subprocess.run(["snmpget", "-v1", "-c", community, address, snmp_object], check=True,
                        stdout=subprocess.DEVNULL, env=os.environ | {"MIBS": ""})

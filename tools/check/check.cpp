@@ -34,7 +34,9 @@ Report checkMedium(const std::string& root) {
   checkApplication(files, lists);
   checkIdentity(lists, report);
   checkModelNames(lists, report);
+  checkConnections(lists, report);
   describeModels(lists, report);
+  checkRange(lists, report);
   checkPackages(files, lists);
   checkTool(files, lists);
   checkTexts(files, lists);

@@ -16,8 +16,13 @@ void checkModelNames(const Lists& lists, Report& report);
 /// Sets the members `models` and `start` of the report. Checks nothing.
 void describeModels(const Lists& lists, Report& report);
 
-/// Checks the range of systems that the medium supports, and the packages. Sets the report's
-/// members `systems` and `packages`.
+/// Reports models whose connections are all switched off in the model information.
+void checkConnections(const Lists& lists, Report& report);
+
+/// Checks the range of systems that the medium supports. Sets the report's member `systems`.
+void checkRange(const Lists& lists, Report& report);
+
+/// Checks the packages for the supported systems. Sets the report's member `packages`.
 void checkPackages(const MediumFiles& files, const Lists& lists);
 
 /// Checks that the wireless set-up tool exists, has a program and a name, and translates the name

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <filesystem>
+#include <regex>
 #include <utility>
 
 #include "media/medium.h"
@@ -65,6 +66,7 @@ class LanguageCheck {
         languages_(languagesIn(files, std::string(kMessageBundle) + "/Contents/Resources")) {}
 
   void run() {
+    checkFolderNames(std::string(kMessageBundle) + "/Contents/Resources", "Localizable.strings");
     checkTranslations();
     checkDevelopmentRegion();
     checkApplicationLanguages();
@@ -91,6 +93,27 @@ class LanguageCheck {
            .expected = "texts in the language " + quoted(language),
            .effect = "users of " + quoted(language) + " see text in the wrong language",
            .remedy = "translate these texts"});
+    }
+  }
+
+  // Reports each folder in `resources` that has a table, but whose name is not that of a language.
+  void checkFolderNames(const std::string& resources, const std::string& table) {
+    for (const std::string& name : files_.names(resources)) {
+      const std::string folder = (fs::path(resources) / name).string();
+      const std::vector<std::string> contents = files_.names(folder);
+      if (name.ends_with(kLanguageFolder) ||
+          !std::binary_search(contents.begin(), contents.end(), table))
+        continue;
+      const std::string language = fs::path(name).stem().string();
+      report_.findings.push_back(
+          {.id = "language-folder",
+           .severity = Severity::kWarning,
+           .place = {.file = folder},
+           .found = "a folder with " + quoted(table) + " whose name does not end in \".lproj\"",
+           .expected = "a name such as \"de.lproj\"",
+           .nearest = isLanguage(language) ? language + std::string(kLanguageFolder) : "",
+           .effect = "nobody sees its texts",
+           .remedy = "rename the folder"});
     }
   }
 
@@ -135,6 +158,7 @@ class LanguageCheck {
   void checkApplicationLanguages() {
     if (!lists_.information) return;
     const std::string resources = report_.application + "/Contents/Resources";
+    checkFolderNames(resources, kNameTable);
     const std::vector<std::string> own = languagesIn(files_, resources, kNameTable);
     for (const std::string& language : languagesBeyond(own)) {
       reportMissingLanguage(
@@ -152,6 +176,7 @@ class LanguageCheck {
     const auto bundle = tool ? Bundle::open(files_.fullPath(*tool)) : std::nullopt;
     if (!bundle) return;
     const std::string resources = *tool + "/Contents/Resources";
+    checkFolderNames(resources, kNameTable);
     const std::string region = bundle->infoString("CFBundleDevelopmentRegion").value_or("en");
     const std::vector<std::string> own = languagesIn(files_, resources, kNameTable);
     const bool isTranslated = std::any_of(own.begin(), own.end(), [&](const std::string& language) {
@@ -163,7 +188,7 @@ class LanguageCheck {
     for (const std::string& language : languagesBeyond(served)) {
       reportMissingLanguage("language-not-in-tool", resources, language, own,
                             "see the set-up tool's name in another language",
-                            "add the folder, with the tool's name in its InfoPlist.strings");
+                            "add the tool's name in that language, in its InfoPlist.strings");
     }
   }
 
@@ -180,10 +205,15 @@ class LanguageCheck {
   void reportMissingLanguage(const char* id, const std::string& resources,
                              const std::string& language, const std::vector<std::string>& own,
                              const std::string& effect, const char* remedy) {
+    const std::string folder = language + std::string(kLanguageFolder);
+    const std::vector<std::string> all = files_.names(resources);
+    const bool isThere = std::binary_search(all.begin(), all.end(), folder);
     report_.findings.push_back({.id = id,
                                 .severity = Severity::kWarning,
                                 .place = {.file = resources},
-                                .found = "no " + quoted(language + std::string(kLanguageFolder)),
+                                .found = isThere
+                                             ? "no " + quoted(kNameTable) + " in " + quoted(folder)
+                                             : "no " + quoted(folder),
                                 .expected = "the languages of the message bundle; here are " +
                                             (own.empty() ? "none" : joined(own)),
                                 .effect = "users of " + quoted(language) + " " + effect,
@@ -218,7 +248,13 @@ std::vector<std::string> languagesIn(const MediumFiles& files, const std::string
 }
 
 bool isLanguage(const std::string& name) {
-  return !Language::parse(name).code.empty() && !languageOfCountry(name);
+  // A code, then perhaps a script of four letters, then perhaps a region of two letters or three
+  // digits. Old media have English names such as "German".
+  static const std::regex form(
+      "[A-Z][a-z]+|[a-z]{2,3}([-_][A-Za-z]{4})?([-_]([A-Za-z]{2}|[0-9]{3}))?",
+      std::regex::optimize);
+  return std::regex_match(name, form) && !Language::parse(name).code.empty() &&
+         !languageOfCountry(name);
 }
 
 std::optional<std::string> languageOfCountry(const std::string& name) {

@@ -29,8 +29,8 @@ inline constexpr std::string_view kLanguageFolder = ".lproj";
                                                    const std::string& resources,
                                                    const std::string& table = "");
 
-/// Returns whether `name` is well formed as the name of a language, and is not the code of a
-/// country that is easily taken for a language.
+/// Returns whether `name` is well formed as the name of a language, such as "de", "zh_TW",
+/// "zh-Hans-CN" or "German", and is not the code of a country that is easily taken for a language.
 [[nodiscard]] bool isLanguage(const std::string& name);
 
 /// Returns the code of the language that the author of the folder `name` probably meant. Returns

@@ -172,7 +172,25 @@ void checkDescription(const Dictionary& description, const std::string& path, Re
   checkInner(description, top, "InstallPKG", kOptionRules, OtherKeys::kAllowed, report);
 }
 
+// Returns whether `list` has no "Model", and all its values look like descriptions of models.
+bool isWithoutModelKey(const Dictionary& list) {
+  return list.size() != 0 && std::all_of(list.begin(), list.end(), [](const auto& pair) {
+           const auto* const entry = pair.value.template as<Dictionary>();
+           return pair.key != "Model" && entry &&
+                  (entry->find("KSCID") || entry->find("Interfaces"));
+         });
+}
+
 void checkModels(const Dictionary& models, const std::string& path, Report& report) {
+  if (isWithoutModelKey(models)) {
+    report.findings.push_back({.id = "model-key-missing",
+                               .place = {.file = path},
+                               .found = "the models at the top of the list",
+                               .expected = "one key, \"Model\", with a dictionary of all models",
+                               .effect = kPackageAtOnce,
+                               .remedy = "put the models into a dictionary under \"Model\""});
+    return;
+  }
   checkKeys(models, {path, {}}, kModelInformationRules, OtherKeys::kReported, report);
   const Dictionary entries = models.dictionary("Model").value_or(Dictionary());
   for (const auto& [name, value] : entries) {

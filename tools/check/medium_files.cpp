@@ -10,21 +10,16 @@
 #include "base/text.h"
 #include "media/medium.h"
 #include "platform/freedesktop/strings_table.h"
-#include "platform/libplist/parse.h"
 #include "platform/posix/file.h"
 #include "platform/property_list.h"
 #include "tools/check/spelling.h"
+#include "tools/check/unreadable.h"
 
 namespace onramp::check {
 
 namespace {
 
 namespace fs = std::filesystem;
-
-std::size_t lineOf(const std::string& text, std::size_t offset) {
-  const auto end = text.begin() + static_cast<std::ptrdiff_t>(std::min(offset, text.size()));
-  return 1 + static_cast<std::size_t>(std::count(text.begin(), end, '\n'));
-}
 
 std::vector<std::string> namesIn(const std::string& folder) {
   std::vector<std::string> names;
@@ -64,17 +59,6 @@ bool isInside(const std::string& path, const std::string& root) {
                       realRoot.end();
 }
 
-// Returns the offset of the first byte of `bytes` that is not part of a character in UTF-8, or the
-// number of bytes if there is none.
-std::size_t malformedAt(const std::string& bytes) {
-  std::string_view rest = bytes;
-  while (!rest.empty()) {
-    const std::size_t left = rest.size();
-    if (!takeUTF8(rest)) return bytes.size() - left;
-  }
-  return bytes.size();
-}
-
 // Returns the line of the strings table at `path` that begins with `key` in quotation marks.
 // Returns nothing when there is no such line.
 std::optional<std::size_t> lineOfString(const std::string& path, const std::string& key) {
@@ -86,11 +70,6 @@ std::optional<std::size_t> lineOfString(const std::string& path, const std::stri
     if (line.compare(start, key.size() + 2, quoted(key)) == 0) return number;
   }
   return std::nullopt;
-}
-
-bool isXML(const std::string& text) {
-  const std::size_t first = text.find_first_not_of(" \t\r\n");
-  return first != std::string::npos && text[first] == '<';
 }
 
 // Returns the path of the only file or folder in `root` that is named `name`, relative to `root`.
@@ -119,35 +98,6 @@ std::string remedyForMissing(const std::string& missing, const std::optional<std
   const std::string rename = "rename " + quoted(*nearest) + " to " + quoted(missing);
   return "put it at that path, or " + rename +
          (isWritten ? ", or write " + quoted(*nearest) : std::string());
-}
-
-// Adds to `finding` the reason why the wizard cannot read `bytes`, a file's contents, and the
-// mistake's line or byte. `isStrings` says whether the file is a strings table.
-void explain(const std::string& bytes, bool isStrings, Finding& finding) {
-  ParseProblem problem;
-  const auto text = bytes.starts_with("bplist") ? std::nullopt : decodedText(bytes);
-  const auto value = isStrings && text && !isXML(*text)
-                         ? std::optional<Value>()
-                         : libplist::parsePropertyList(bytes, problem);
-  if (isStrings && text && !isXML(*text)) static_cast<void>(parseStrings(*text, problem));
-  if (value) {
-    finding.found = "a property list whose outermost value is not a dictionary";
-    finding.expected = "a dictionary";
-    return;
-  }
-  finding.found = problem.reason;
-  if (text) {
-    finding.place.line = lineOf(*text, problem.offset);
-  } else if (isStrings && !bytes.starts_with("bplist")) {
-    finding.place.line = lineOf(bytes, malformedAt(bytes));
-    finding.remedy = "save the file as UTF-8";
-  } else {
-    finding.place.byte = problem.offset;
-  }
-  if (!finding.found.empty()) return;
-  const XMLLines lines = text ? xmlLines(*text) : XMLLines();
-  finding.found = lines.problem.empty() ? "not a property list" : lines.problem;
-  if (lines.problemLine > 0) finding.place.line = lines.problemLine;
 }
 
 }  // namespace
@@ -200,7 +150,12 @@ bool MediumFiles::exists(const std::string& relative, const PathUse& use) const 
 
 void MediumFiles::reportMissing(const std::string& relative, const std::string& folder,
                                 const std::string& part, const PathUse& use) const {
-  const auto nearest = Spelling(names(folder)).nearest(part);
+  const std::vector<std::string> there = names(folder);
+  const auto sameStem = std::find_if(there.begin(), there.end(), [&](const std::string& name) {
+    return fs::path(name).stem() == part;
+  });
+  const auto nearest =
+      sameStem == there.end() ? Spelling(there).nearest(part) : std::optional(*sameStem);
   const bool capitals = nearest && asciiLowercased(*nearest) == asciiLowercased(part);
   Finding finding{.id = capitals ? "path-capitals" : "path-missing",
                   .place = use.place,
@@ -226,34 +181,7 @@ void MediumFiles::reportUnreadable(const std::string& relative, const PathUse& u
   Finding finding{.id = isStrings ? "strings-unreadable" : "list-unreadable",
                   .place = {.file = relative},
                   .effect = use.effect};
-  const std::string path = fullPath(relative);
-  std::error_code ignored;
-  if (fs::is_directory(path, ignored)) {
-    finding.found = "a folder";
-    finding.expected = "a property list";
-  } else if (const auto size = fs::file_size(path, ignored);
-             !ignored && size > kMostPropertyListBytes) {
-    finding.found = std::to_string(size) + " bytes";
-    finding.expected = "at most " + std::to_string(kMostPropertyListBytes) + " bytes";
-    finding.remedy =
-        "remove what the wizard does not read, or divide the models among several media";
-  } else if (const auto bytes = posix::readFile(path, kMostPropertyListBytes); !bytes) {
-    finding.found = "a file that cannot be read";
-    finding.remedy = "let everyone read it (chmod a+r)";
-  } else if (bytes->empty()) {
-    finding.found = "an empty file";
-  } else {
-    explain(*bytes, isStrings, finding);
-  }
-  const bool isSyntax = isStrings && finding.place.line;
-  if (finding.expected.empty() && !isSyntax) {
-    finding.expected =
-        isStrings ? "lines of the form \"key\" = \"text\";" : "a property list, XML or binary";
-  }
-  if (finding.remedy.empty()) {
-    finding.remedy = finding.place.line ? "correct that line or the one before it"
-                                        : "replace the file with an undamaged copy";
-  }
+  explainUnreadable(fullPath(relative), isStrings, finding);
   report_.findings.push_back(std::move(finding));
 }
 

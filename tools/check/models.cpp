@@ -1,4 +1,5 @@
 #include <algorithm>
+#include <array>
 #include <iterator>
 #include <map>
 #include <set>
@@ -18,6 +19,7 @@ namespace onramp::check {
 namespace {
 
 constexpr std::string_view kContained = "ContainedModel";
+constexpr std::array kInterfaces{"USB", "WiredLAN", "WirelessLAN"};
 
 std::vector<std::string> keysOf(const Dictionary& dictionary) {
   std::vector<std::string> keys;
@@ -193,6 +195,28 @@ void checkModelNames(const Lists& lists, Report& report) {
   ModelCheck check(lists, report);
   check.names();
   if (lists.models) check.compareLists();
+}
+
+void checkConnections(const Lists& lists, Report& report) {
+  const Dictionary models =
+      lists.models.value_or(Dictionary()).dictionary("Model").value_or(Dictionary());
+  for (const auto& [name, value] : models) {
+    const auto* const entry = value.as<Dictionary>();
+    const auto interfaces = entry ? entry->dictionary("Interfaces") : std::nullopt;
+    if (!interfaces) continue;
+    const bool hasNone = std::all_of(kInterfaces.begin(), kInterfaces.end(), [&](const char* key) {
+      return interfaces->boolean(key) == false;
+    });
+    if (!hasNone) continue;
+    report.findings.push_back(
+        {.id = "model-unconnected",
+         .severity = Severity::kWarning,
+         .place = {.file = lists.modelsPath, .key = {"Model", name, "Interfaces"}},
+         .found = "a model without any connection",
+         .expected = "at least one connection that is true",
+         .effect = "the package opens as soon as the model is chosen, as for a model with USB only",
+         .remedy = "write <true/> for the connections that the model has"});
+  }
 }
 
 void describeModels(const Lists& lists, Report& report) {

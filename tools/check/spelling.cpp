@@ -10,6 +10,8 @@ namespace {
 
 // The number of pairs of bytes after which an object makes no further comparisons.
 constexpr std::size_t kMostWork = 20'000'000;
+// Shorter words often have the same letters by chance.
+constexpr std::size_t kFewestToSwap = 6;
 
 std::string lettersOf(std::string_view word) {
   std::string letters;
@@ -17,6 +19,13 @@ std::string lettersOf(std::string_view word) {
     const bool ignored = static_cast<unsigned char>(c) < 0x80 && !isASCIILetterOrDigit(c);
     if (!ignored) letters += asciiLowercased(c);
   }
+  return letters;
+}
+
+// Returns the letters in alphabetical order. Words whose parts are swapped then become equal.
+std::string sortedLettersOf(std::string_view word) {
+  std::string letters = lettersOf(word);
+  std::sort(letters.begin(), letters.end());
   return letters;
 }
 
@@ -51,6 +60,8 @@ std::size_t editDistance(std::string_view a, std::string_view b, std::size_t mos
 Spelling::Spelling(const std::vector<std::string>& known) : known_(known) {
   for (std::size_t i = 0; i < known_.size(); ++i)
     byLetters_.try_emplace(lettersOf(known_[i]), i);
+  for (std::size_t i = 0; i < known_.size(); ++i)
+    bySortedLetters_.try_emplace(sortedLettersOf(known_[i]), i);
 }
 
 std::optional<std::string> Spelling::nearest(std::string_view word) {
@@ -68,7 +79,9 @@ std::optional<std::string> Spelling::nearest(std::string_view word) {
     nearest = candidate;
     if (best == 0) break;
   }
-  return nearest;
+  const auto swapped = bySortedLetters_.find(sortedLettersOf(word));
+  const bool isSwapped = swapped != bySortedLetters_.end() && letters.size() >= kFewestToSwap;
+  return !nearest && isSwapped ? known_[swapped->second] : nearest;
 }
 
 }  // namespace onramp::check

@@ -20,12 +20,14 @@ class Spelling {
 
   /// Returns the known word that is most similar to `word`, or nothing if none is similar enough. A
   /// word from the hash table counts as the most similar. If several words are equally similar,
-  /// returns the first of them.
+  /// returns the first of them. If none is, returns a word with the same letters in another order,
+  /// such as "SystemMin" for "MinSystem".
   [[nodiscard]] std::optional<std::string> nearest(std::string_view word);
 
  private:
   const std::vector<std::string> known_;
   std::unordered_map<std::string, std::size_t> byLetters_;
+  std::unordered_map<std::string, std::size_t> bySortedLetters_;
   std::size_t work_ = 0;
 };
 

@@ -118,6 +118,11 @@ class Walk {
 
 }  // namespace
 
+bool isXML(const std::string& text) {
+  const std::size_t first = text.find_first_not_of(" \t\r\n");
+  return first != std::string::npos && text[first] == '<';
+}
+
 XMLLines xmlLines(const std::string& xml) {
   XMLLines lines;
   const Parser parser(XML_ParserCreate("UTF-8"));

@@ -22,6 +22,9 @@ struct XMLLines {
   std::size_t problemLine = 0;  ///< counted from 1
 };
 
+/// Returns whether `text` begins like XML.
+[[nodiscard]] bool isXML(const std::string& text);
+
 /// Parses `xml`, which must be UTF-8. A mistake in `xml` is described in the result.
 [[nodiscard]] XMLLines xmlLines(const std::string& xml);
 

@@ -5,6 +5,7 @@
 #include <cmath>
 
 #include "app/search_wait.h"
+#include "tools/devices/text.h"
 
 namespace onramp::devices {
 
@@ -14,6 +15,11 @@ constexpr double kNoticeable = 1;  // seconds
 constexpr double kPause = std::chrono::duration<double>(kFirstSearchPause).count();
 
 }  // namespace
+
+bool isMissed(const JudgedDevice& device) {
+  return std::any_of(device.notes.begin(), device.notes.end(),
+                     [](const Verdict& note) { return note.id == "missed"; });
+}
 
 void computeDelays(std::vector<JudgedDevice>& devices) {
   std::vector<JudgedDevice*> asked;
@@ -36,7 +42,15 @@ void computeDelays(std::vector<JudgedDevice>& devices) {
     for (std::size_t later = i + 1; later < asked.size(); ++later) {
       if (!asked[later]->verdict.isListed) continue;
       ++asked[i]->delay.delayed;
-      if (clock >= end) ++asked[i]->delay.hidden;
+      if (clock < end) continue;
+      ++asked[i]->delay.hidden;
+      if (isMissed(*asked[later])) continue;
+      asked[later]->notes.push_back(
+          {.id = "missed",
+           .why = "the wizard's first search ends before the wizard asks this device, because it "
+                  "waits for " +
+                  inQuotes(asked[i]->device->name),
+           .remedy = "correct or switch off " + inQuotes(asked[i]->device->name)});
     }
   }
 }

@@ -32,8 +32,12 @@ struct BrowseResult {
   std::vector<Verdict> network{};       ///< problems of the network as a whole
 };
 
-/// Sets the delay that each device would cause in the wizard's first search. The wizard asks one
-/// device after another, in the order in which they are resolved.
+/// Returns whether the wizard's first search misses the device, although it passes every check.
+[[nodiscard]] bool isMissed(const JudgedDevice& device);
+
+/// Sets the delay that each device would cause in the wizard's first search, and adds the note
+/// "missed" to the devices that the search misses because of it. The wizard asks one device after
+/// another, in the order in which they are resolved.
 void computeDelays(std::vector<JudgedDevice>& devices);
 
 /// Returns the result as JSON, in the form that the manual page describes.

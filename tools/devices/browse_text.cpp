@@ -160,19 +160,27 @@ std::string goneRow(const Device& device, const TextStyle& style) {
 }
 
 std::string summaryOf(const BrowseResult& result, const TextStyle& style) {
-  const auto listed = std::count_if(result.devices.begin(), result.devices.end(),
-                                    [](const auto& one) { return one.verdict.isListed; });
+  const auto listed =
+      std::count_if(result.devices.begin(), result.devices.end(),
+                    [](const auto& one) { return one.verdict.isListed && !isMissed(one); });
+  const auto missed = std::count_if(result.devices.begin(), result.devices.end(), isMissed);
   std::string out;
   for (const JudgedDevice& one : result.devices) {
     const std::string text = delayText(one.delay);
     if (!text.empty()) out += paragraph(inQuotes(one.device->name) + ": " + text, style);
+  }
+  for (const JudgedDevice& one : result.devices) {
+    if (isMissed(one)) {
+      out += paragraph(inQuotes(one.device->name) + ": " + explanation(one.notes.back()), style);
+    }
   }
   for (const Verdict& problem : result.network)
     out += paragraph(coloured(kYellow, "Network: ", style) + explanation(problem), style);
   out += (result.isInterrupted ? "Interrupted after " : "After ") + durationText(result.seconds) +
          ": " + std::to_string(result.devices.size()) +
          (result.devices.size() == 1 ? " device, " : " devices, ") + std::to_string(listed) +
-         " in the wizard's list\n";
+         " in the wizard's list" +
+         (missed == 0 ? "" : ", " + std::to_string(missed) + " missed by its first search") + '\n';
   return out;
 }
 

@@ -86,13 +86,12 @@ std::string edgeBlanks(const std::string& announced) {
 }
 
 // Returns the medium's model that `announced` most resembles in spelling. If none does, returns one
-// that differs only in its maker. The device announces `model` without the maker.
+// whose name ends with `model`, which the device announces without the maker.
 std::optional<std::string> nearestOf(const std::string& announced, const std::string& model,
                                      const Medium& medium) {
   auto nearest = check::Spelling(medium.models).nearest(announced);
   for (const std::string& known : medium.models) {
-    const std::string withoutMaker = known.substr(known.find(' ') + 1);
-    if (!nearest && asciiLowercased(withoutMaker) == asciiLowercased(model)) nearest = known;
+    if (!nearest && asciiLowercased(known).ends_with(' ' + asciiLowercased(model))) nearest = known;
   }
   return nearest;
 }

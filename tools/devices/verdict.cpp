@@ -53,11 +53,13 @@ Verdict judgeSilence(const Device& device, const Answer& answer,
                 "put the device and this computer into the same subnet; "
                 "\"onramp-devices hosts\" shows this computer's addresses"};
   }
-  return {.id = "no-answer",
-          .why = cost,
-          .remedy =
-              "switch on SNMP v1 for reading in the device, set its community to the one that "
-              "\"onramp-devices ask -v\" shows, and let UDP port 161 through firewalls"};
+  return {
+      .id = "no-answer",
+      .why = cost,
+      .remedy = "switch on SNMP v1 for reading in the device, set its community to " +
+                inQuotes(kCommunity) +
+                " unless the medium's wizard was built for another, and let UDP port 161 through "
+                "firewalls"};
 }
 
 Verdict judgeAnswer(const Device& device, const Answer& answer,

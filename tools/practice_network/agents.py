@@ -10,21 +10,26 @@ import subprocess
 import threading
 import time
 
-from practice_network.description import CLOSED, MISSING, SILENT, TEXT, DescriptionError
+from practice_network.description import CLOSED, MISSING, SILENT, TEXT, WIRELESS, DescriptionError
 
 
 @functools.cache
 def maker_settings():
-    """Returns the SNMP community and object identifier in maker.json, or in the file that the
-    variable ONRAMP_MAKER names. Raises DescriptionError if the file does not have them."""
+    """Returns the SNMP community, the object identifier and the value that means wireless. They are in
+    maker.json, or in the file that the variable ONRAMP_MAKER names. Raises DescriptionError if the
+    file does not have them."""
     path = os.environ.get("ONRAMP_MAKER") or pathlib.Path(__file__).parents[2] / "maker.json"
     try:
         maker = json.loads(pathlib.Path(path).read_text(encoding="utf-8"))
-        return maker["snmpCommunity"], maker["activeIFObject"]
+        return maker["snmpCommunity"], maker["activeIFObject"], int(maker["activeIFWireless"])
     except OSError as error:
         problem = f"cannot be read: {error.strerror}"
-    except (ValueError, KeyError, TypeError):
-        problem = 'is not JSON with the texts "snmpCommunity" and "activeIFObject"'
+    except KeyError as error:
+        problem = f"has no {error.args[0]!r}"
+    except ValueError as error:
+        problem = f"is not correct JSON: {error}"
+    except TypeError:
+        problem = 'has no JSON object, or its "activeIFWireless" is no number'
     raise DescriptionError(f"{path}: {problem}; set ONRAMP_MAKER to a copy of maker.json, or unset it")
 
 
@@ -126,7 +131,9 @@ class _Agent:
         self.address = address
         self._log = folder / f"{address}.log"
         configuration = folder / f"{address}.conf"
-        community, snmp_object = maker_settings()
+        community, snmp_object, wireless = maker_settings()
+        if activeif == WIRELESS:
+            activeif = wireless
         lines = [f"rocommunity {community}", f"agentAddress udp:{address}:{PORT}"]
         if delay:
             script = folder / f"{address}.sh"
@@ -165,7 +172,7 @@ def _override(activeif):
 def _slow_script(activeif, delay):
     """Returns a script that net-snmp runs for each request. After `delay` seconds, the script prints
     the object's identifier, type and value, or nothing if the agent lacks the object."""
-    _, snmp_object = maker_settings()
+    _, snmp_object, _ = maker_settings()
     answer = {MISSING: "", TEXT: f".{snmp_object}\nstring\ntwo"}.get(
         activeif, f".{snmp_object}\ninteger\n{activeif}")
     return f"#!/bin/sh\nsleep {delay}\n[ \"$1\" = -g ] && [ \"$2\" = .{snmp_object} ] || exit 0\n" \

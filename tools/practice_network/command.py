@@ -58,11 +58,12 @@ there is one table for each device:
     domain = "annex.local"         default "local"; other domains must end in ".local"
     port = 631                     default: the type's usual port, or 9100
     addresses = ["127.0.1.9"]      or a number: the network chooses that many; default 1
-    activeif = 2                   the number that the device answers; default 2, for wireless.
-                                   "silent": receives the request and never answers. "closed": has
-                                   no agent. "missing": has an agent without the object. "text":
-                                   answers with a string. A list gives each address its own value.
-                                   IPv6 addresses have no agent.
+    activeif = 1                   the number that the device answers, or a word. The default,
+                                   "wireless", is the maker's number for wireless. "silent":
+                                   receives the request and never answers. "closed": has no agent.
+                                   "missing": has an agent without the object. "text": answers with
+                                   a string. A list gives each address its own value. IPv6
+                                   addresses have no agent.
     delay = 1.5                    seconds before each SNMP answer; default 0
     present = false                false: switched off at the start; default true
     txt = {rp = "auto"}            more TXT entries

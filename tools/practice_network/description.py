@@ -8,11 +8,12 @@ import tomllib
 
 # The values of `activeif` that are not integers. Each says how the host at an address responds to
 # an SNMP request.
-SILENT = "silent"    # receives the request and never answers
-CLOSED = "closed"    # has no agent, so the host refuses the packet
-MISSING = "missing"  # has an agent that lacks the object
-TEXT = "text"        # answers with a string instead of an integer
-WORDS = (SILENT, CLOSED, MISSING, TEXT)
+WIRELESS = "wireless"  # answers with the maker's number for wireless
+SILENT = "silent"      # receives the request and never answers
+CLOSED = "closed"      # has no agent, so the host refuses the packet
+MISSING = "missing"    # has an agent that lacks the object
+TEXT = "text"          # answers with a string instead of an integer
+WORDS = (WIRELESS, SILENT, CLOSED, MISSING, TEXT)
 
 DEFAULT_TYPE = "_pdl-datastream._tcp"
 DEFAULT_PORTS = {DEFAULT_TYPE: 9100, "_printer._tcp": 515, "_ipp._tcp": 631, "_scanner._tcp": 9500}
@@ -46,7 +47,7 @@ class Device:
     domain: str = "local"
     port: int | None = None
     addresses: int | tuple[str, ...] = 1
-    activeif: tuple[int | str, ...] = (2,)
+    activeif: tuple[int | str, ...] = (WIRELESS,)
     delay: float = 0
     present: bool = True
     txt: tuple[tuple[str, str], ...] = ()
@@ -241,7 +242,7 @@ READERS = {
     "port": (lambda value: _whole(value, 1, 65535), "a whole number from 1 to 65535"),
     "addresses": (_addresses, 'a number from 1 to 32, or a list of different addresses of single '
                               'hosts, such as ["127.0.1.9"]'),
-    "activeif": (_activeif, 'a whole number, "silent", "closed", "missing" or "text", '
+    "activeif": (_activeif, 'a whole number, "wireless", "silent", "closed", "missing" or "text", '
                             "or a list of these with one for each address"),
     "delay": (_delay, "a number of seconds from 0 to 3600"),
     "present": (_truth, "true or false"),

@@ -180,6 +180,7 @@ class Tour:
             visit.person.see("table cell", shortened(model.name, self._medium.service_type))
             visit.picture("5-devices", "The devices that were found")
             if not is_first:
+                self._album.note(f"The search and the rest of the way are shown for {self._searched[0]}.")
                 return
             if effect := self._facts.without_tool():
                 self._album.note(f"The medium has no wireless set-up tool. Effect: {effect}.")
