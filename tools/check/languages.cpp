@@ -3,9 +3,9 @@
 #include <algorithm>
 #include <array>
 #include <filesystem>
-#include <regex>
 #include <utility>
 
+#include "base/ascii.h"
 #include "media/medium.h"
 #include "platform/bundle.h"
 #include "platform/freedesktop/language.h"
@@ -29,6 +29,40 @@ constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountrie
                                                                                    {"gr", "el"},
                                                                                    {"ua", "uk"},
                                                                                    {"vn", "vi"}}};
+
+bool areLetters(std::string_view text) {
+  return std::all_of(text.begin(), text.end(), isASCIILetter);
+}
+
+// Returns the parts of `name` between its hyphens and underscores.
+std::vector<std::string_view> partsOf(std::string_view name) {
+  std::vector<std::string_view> parts;
+  for (std::size_t end = name.find_first_of("-_"); end != std::string_view::npos;
+       end = name.find_first_of("-_")) {
+    parts.push_back(name.substr(0, end));
+    name.remove_prefix(end + 1);
+  }
+  parts.push_back(name);
+  return parts;
+}
+
+// Returns whether `name` is a code of two or three letters, then perhaps a script of four letters,
+// then perhaps a region of two letters or three digits. Old media have English names instead, such
+// as "German".
+bool hasFormOfLanguage(std::string_view name) {
+  const std::vector<std::string_view> parts = partsOf(name);
+  const std::string_view code = parts.front();
+  if (!areLetters(code) || code.size() < 2) return false;
+  if (code.size() > 3) return parts.size() == 1;
+  std::size_t next = 1;
+  if (next < parts.size() && parts[next].size() == 4 && areLetters(parts[next])) ++next;
+  if (next < parts.size()) {
+    const std::string_view region = parts[next];
+    const bool isNumber = std::all_of(region.begin(), region.end(), isASCIIDigit);
+    if ((region.size() == 2 && areLetters(region)) || (region.size() == 3 && isNumber)) ++next;
+  }
+  return next == parts.size();
+}
 
 // Returns the code of the language `name`. "no" and "nb" are both names of Norwegian Bokmål.
 std::string codeOf(const std::string& name) {
@@ -248,13 +282,7 @@ std::vector<std::string> languagesIn(const MediumFiles& files, const std::string
 }
 
 bool isLanguage(const std::string& name) {
-  // A code, then perhaps a script of four letters, then perhaps a region of two letters or three
-  // digits. Old media have English names such as "German".
-  static const std::regex form(
-      "[A-Z][a-z]+|[a-z]{2,3}([-_][A-Za-z]{4})?([-_]([A-Za-z]{2}|[0-9]{3}))?",
-      std::regex::optimize);
-  return std::regex_match(name, form) && !Language::parse(name).code.empty() &&
-         !languageOfCountry(name);
+  return hasFormOfLanguage(name) && !Language::parse(name).code.empty() && !languageOfCountry(name);
 }
 
 std::optional<std::string> languageOfCountry(const std::string& name) {

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <filesystem>
-#include <regex>
 #include <sstream>
 #include <string_view>
 #include <system_error>
@@ -52,15 +51,25 @@ std::string remedyForQuotes(std::string_view text, std::size_t offset) {
   return "";
 }
 
+// Returns whether `line` has an "&" that begins no entity such as "&amp;" or "&#38;".
+bool hasBareAmpersand(std::string_view line) {
+  for (std::size_t at = line.find('&'); at != std::string_view::npos; at = line.find('&', at + 1)) {
+    const std::string_view rest = line.substr(at + 1);
+    const auto* const end = std::find_if_not(
+        rest.begin(), rest.end(), [](char c) { return c == '#' || isASCIILetterOrDigit(c); });
+    if (end == rest.begin() || end == rest.end() || *end != ';') return true;
+  }
+  return false;
+}
+
 // Returns the remedy for a mistake on line `number` of the XML text `text`, or an empty string if
-// the line has no "&" outside an entity.
+// it is none of the usual ones.
 std::string remedyForAmpersand(const std::string& text, std::size_t number) {
-  static const std::regex bare("&(?!#?[A-Za-z0-9]+;)", std::regex::optimize);
   std::istringstream lines(text);
   std::string line;
   for (std::size_t i = 0; i < number; ++i)
     std::getline(lines, line);
-  return std::regex_search(line, bare) ? "write \"&\" as \"&amp;\"" : "";
+  return hasBareAmpersand(line) ? "write \"&\" as \"&amp;\"" : "";
 }
 
 // Adds to `finding` the reason why the wizard cannot read `bytes`, a file's contents, and the
