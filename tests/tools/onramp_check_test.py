@@ -172,7 +172,7 @@ MISTAKES = [
           take(COMMON, "BonjourNetwork"), take(COMMON, "WLANtool")), "models-none", "at once"),
     # Systems and packages.
     (packages(v109=1), "package-none", "systems: 10.6.0 up to, but not including, 10.9.0"),
-    (put(COMMON, "PkgInfo", "PkgName", ""), "package-unnamed", "an empty name"),
+    (put(COMMON, "PkgInfo", {"PkgLocation": "", "PkgName": ""}), "package-unnamed", "an empty name"),
     (both(remove(PACKAGE), write(PACKAGE, b"")), "package-empty", "nothing can be installed"),
     (put(COMMON, "PkgInfo", "PkgName", PACKAGE), "path-missing", f'"Packages/{PACKAGE}"', f'has "{PACKAGE}"'),
     (both(packages(v106=1, v107=1, v108=1, v109=1), put(COMMON, "PkgInfo", "108", Path(PACKAGE).stem + "2.pkg")),
@@ -185,7 +185,7 @@ MISTAKES = [
     (maximum("10", "15", "7"), "range-excludes-maximum", "10.15.7 itself is refused",
      "10.6.0 up to, but not including, 10.15.7"),
     (maximum("10", "5", "x"), "range-empty", "every system is refused"),
-    (maximum("14", "0", "x"), "range-stops-at-minor", "14.1 is refused", "write 15, 0, 0"),
+    (maximum(14, 0, "x"), "range-stops-at-minor", "14.1 is refused", "write 15, 0, 0"),
     (maximum("14", "x", "x"), "version-number", "write 15, 0, 0"),
     (maximum("10", "16", "last"), "version-number", '"last"', '"x"'),
     (maximum("10", "14", "x"), "range-before-application", "10.15 and later"),
@@ -214,7 +214,7 @@ MISTAKES = [
     (replace(ENGLISH, '"Next";', '"";'), "text-empty", "button"),
     (replace(ENGLISH, '"Next";', '"Next"'), "strings-unreadable", '";" expected', "line 9"),
     (replace(ENGLISH, '"Next"', "“Next”"), "strings-unreadable", "straight quotation marks"),
-    (replace(ENGLISH, '"Next"', '"Go "next""'), "strings-unreadable", "inside a text as \\\""),
+    (replace(ENGLISH, '"Next"', '"Go „on" now"'), "strings-unreadable", "inside a text as \\\""),
     (take(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion"), "region-missing", "usually English"),
     (both(take(f"{MESSAGES}/Info.plist", "CFBundleDevelopmentRegion"), remove(ENGLISH.rsplit("/", 1)[0])),
      "region-missing", 'keys such as "INST_TXT_MODEL"'),
@@ -266,6 +266,8 @@ HARMLESS = [
     name_tool('NSHumanReadableCopyright = "Kestrel";', "en"),
     name_tool("/* no name */", "de", "en", "ja", "ko", "zh_CN"),
     write(f"{MESSAGES}/Resources/._de.lproj", b""),
+    both(*((lambda folder, name=name: shutil.copytree(folder / name / "de.lproj", folder / name / "de-1996.lproj"))
+           for name in (f"{MESSAGES}/Resources", f"{APPLICATION}/Resources", f"{TOOL}/Resources"))),
     both(maximum("14", "0", "x"), put(COMMON, "SystemMin", {"Major": "14", "Minor": "0", "BugFix": "0"})),
 ]
 

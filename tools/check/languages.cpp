@@ -47,8 +47,8 @@ std::vector<std::string_view> partsOf(std::string_view name) {
 }
 
 // Returns whether `name` is a code of two or three letters, then perhaps a script of four letters,
-// then perhaps a region of two letters or three digits. Old media have English names instead, such
-// as "German".
+// then perhaps a region of two letters or three digits, then perhaps variants such as "valencia" or
+// "1996". Old media have English names instead, such as "German".
 bool hasFormOfLanguage(std::string_view name) {
   const std::vector<std::string_view> parts = partsOf(name);
   const std::string_view code = parts.front();
@@ -61,6 +61,12 @@ bool hasFormOfLanguage(std::string_view name) {
     const bool isNumber = std::all_of(region.begin(), region.end(), isASCIIDigit);
     if ((region.size() == 2 && areLetters(region)) || (region.size() == 3 && isNumber)) ++next;
   }
+  const auto isVariant = [](std::string_view part) {
+    return (part.size() >= 5 || (part.size() == 4 && isASCIIDigit(part[0]))) &&
+           std::all_of(part.begin(), part.end(), isASCIILetterOrDigit);
+  };
+  while (next < parts.size() && isVariant(parts[next]))
+    ++next;
   return next == parts.size();
 }
 
@@ -147,7 +153,7 @@ class LanguageCheck {
            .expected = "a name such as \"de.lproj\"",
            .nearest = isLanguage(language) ? language + std::string(kLanguageFolder) : "",
            .effect = "nobody sees its texts",
-           .remedy = "rename the folder"});
+           .remedy = "rename the folder, or remove it if it is only a copy"});
     }
   }
 

@@ -172,13 +172,12 @@ void checkDescription(const Dictionary& description, const std::string& path, Re
   checkInner(description, top, "InstallPKG", kOptionRules, OtherKeys::kAllowed, report);
 }
 
-// Returns whether `list` has no "Model", and all its values look like descriptions of models.
+// Returns whether `list` has no "Model", but a value that looks like the description of a model.
 bool isWithoutModelKey(const Dictionary& list) {
-  return list.size() != 0 && std::all_of(list.begin(), list.end(), [](const auto& pair) {
-           const auto* const entry = pair.value.template as<Dictionary>();
-           return pair.key != "Model" && entry &&
-                  (entry->find("KSCID") || entry->find("Interfaces"));
-         });
+  return !list.find("Model") && std::any_of(list.begin(), list.end(), [](const auto& pair) {
+    const auto* const entry = pair.value.template as<Dictionary>();
+    return entry && (entry->find("KSCID") || entry->find("Interfaces"));
+  });
 }
 
 void checkModels(const Dictionary& models, const std::string& path, Report& report) {

@@ -61,7 +61,9 @@ class PackageCheck {
     usedKeys_.insert(versionKey(version));
     info_.loadPkgURL(lists_.resources);
     const std::optional<FileURL>& url = info_.pkgURL();
-    return url ? url->path.substr(files_.fullPath("").size() + 1) : std::string();
+    if (!url) return "";
+    // Without a folder and a name, the path is that of the medium itself.
+    return url->path.substr(std::min(files_.fullPath("").size() + 1, url->path.size()));
   }
 
   void findPackages() {

@@ -102,7 +102,7 @@ class RangeCheck {
     const Version last = boundOf(maximum);
     const Value* const minor = maximum.find("Minor");
     const auto text = maximum.string("Minor");
-    const bool isNumber = text ? isVersionNumber(*text) : minor && !minor->boolean();
+    const bool isNumber = text ? isVersionNumber(*text) : minor && !minor->as<bool>();
     if (!isBound(maximum) || !range_.takesAllBugFixes() || !isNumber ||
         !range_.contains(range_.begin()) || last[0] < kFirstYearlyMajor || last[1] != 0 ||
         range_.begin()[0] == last[0]) {

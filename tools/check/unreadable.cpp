@@ -39,15 +39,16 @@ std::size_t malformedAt(const std::string& bytes) {
 // Returns the remedy for a mistake at `offset` of the strings table `text`, or an empty string if
 // the mistake is none of the usual ones with quotation marks.
 std::string remedyForQuotes(std::string_view text, std::size_t offset) {
-  const std::string_view rest = text.substr(std::min(offset, text.size()));
-  for (const char* const mark : {"\u201C", "\u201D", "\u201E", "\u00AB", "\u00BB"}) {
-    if (rest.starts_with(mark)) return "write straight quotation marks (\") around keys and texts";
-  }
+  std::string_view rest = text.substr(std::min(offset, text.size()));
+  rest.remove_prefix(std::min(rest.find_first_not_of(" \t"), rest.size()));
   const bool isAfterMark = offset > 0 && offset <= text.size() && text[offset - 1] == '"';
   const bool isBeforeWord =
       !rest.empty() && (isASCIILetterOrDigit(rest.front()) || (rest.front() & 0x80) != 0);
   if (isAfterMark && isBeforeWord)
     return "write a quotation mark inside a text as \\\", or put the missing \";\" there";
+  for (const char* const mark : {"\u201C", "\u201D", "\u201E", "\u00AB", "\u00BB"}) {
+    if (rest.starts_with(mark)) return "write straight quotation marks (\") around keys and texts";
+  }
   return "";
 }
 
@@ -101,7 +102,8 @@ void explain(const std::string& bytes, bool isStrings, Finding& finding) {
   finding.found = lines.problem.empty() ? "not a property list" : lines.problem;
   if (lines.problemLine == 0) return;
   finding.place.line = lines.problemLine;
-  finding.remedy = remedyForAmpersand(*text, lines.problemLine);
+  if (lines.problem.starts_with("not well-formed"))
+    finding.remedy = remedyForAmpersand(*text, lines.problemLine);
 }
 
 }  // namespace
