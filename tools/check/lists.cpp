@@ -230,6 +230,12 @@ std::vector<std::string> Lists::modelNames() const {
   return containedModels(KSOROSXCD::initWithCDInfoPlist(description, resources));
 }
 
+Place Lists::resourcePlace(std::string_view dictionary, std::string_view key) const {
+  Place place{.file = resourcesPath, .key = {std::string(dictionary)}};
+  if (!key.empty()) place.key.emplace_back(key);
+  return place;
+}
+
 bool Lists::anyWireless() const {
   return anySupportsWiFi(modelNames(), models);
 }

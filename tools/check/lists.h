@@ -39,6 +39,10 @@ struct Lists {
   /// Returns the names of the medium's models in the order in which the wizard shows them.
   [[nodiscard]] std::vector<std::string> modelNames() const;
 
+  /// Returns the place of the dictionary `dictionary` in the resource dictionary or, if `key` is
+  /// given, the place of that key in it.
+  [[nodiscard]] Place resourcePlace(std::string_view dictionary, std::string_view key = "") const;
+
   /// Returns whether any model supports wireless.
   [[nodiscard]] bool anyWireless() const;
 };

@@ -49,12 +49,6 @@ class PackageCheck {
   }
 
  private:
-  [[nodiscard]] Place placeOf(std::string_view dictionary, std::string_view key = "") const {
-    Place place{.file = lists_.resourcesPath, .key = {std::string(dictionary)}};
-    if (!key.empty()) place.key.emplace_back(key);
-    return place;
-  }
-
   // Returns the package that the wizard opens on `version`, as a path from the medium's top folder.
   // Returns an empty string when no package opens.
   [[nodiscard]] std::string packageFor(const Version& version) {
@@ -100,14 +94,14 @@ class PackageCheck {
     const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
         "the window closes and nothing opens; systems: " + range_.words(row.from, row.to);
-    const PathUse location{placeOf(medium::kPkgInfo, "PkgLocation"), "the packages' folder",
-                           effect};
+    const PathUse location{lists_.resourcePlace(medium::kPkgInfo, "PkgLocation"),
+                           "the packages' folder", effect};
     const auto folder = package.string("PkgLocation");
     if (folder && checked_.insert(*folder).second) hasFolder_ = files_.exists(*folder, location);
     if (!hasFolder_) return;
     if (package.string(key) == "") {
       report_.findings.push_back({.id = "package-unnamed",
-                                  .place = placeOf(medium::kPkgInfo, key),
+                                  .place = lists_.resourcePlace(medium::kPkgInfo, key),
                                   .found = "an empty name",
                                   .expected = "the package's name",
                                   .effect = effect,
@@ -115,7 +109,7 @@ class PackageCheck {
       return;
     }
     if (!row.package.empty()) {
-      const PathUse use{placeOf(medium::kPkgInfo, key), "the package", effect};
+      const PathUse use{lists_.resourcePlace(medium::kPkgInfo, key), "the package", effect};
       if (checked_.insert(row.package).second && files_.exists(row.package, use))
         checkContents(row.package, use);
       return;
@@ -124,7 +118,7 @@ class PackageCheck {
     if (package.find(key) || !package.string("PkgLocation")) return;
     report_.findings.push_back(
         {.id = "package-none",
-         .place = placeOf(medium::kPkgInfo),
+         .place = lists_.resourcePlace(medium::kPkgInfo),
          .found = "no package for these systems: " + range_.words(row.from, row.to),
          .expected = key.empty() ? "\"PkgName\"" : "\"PkgName\" or " + quoted(key),
          .effect = "the window closes and nothing opens on these systems",
@@ -158,7 +152,7 @@ class PackageCheck {
     if (shadowed.empty()) return;
     report_.findings.push_back(
         {.id = "package-shadowed",
-         .place = placeOf(medium::kPkgInfo, "PkgName"),
+         .place = lists_.resourcePlace(medium::kPkgInfo, "PkgName"),
          .found = "\"PkgName\" beside " + shadowed,
          .expected = "either \"PkgName\" or packages by version",
          .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
@@ -168,7 +162,7 @@ class PackageCheck {
   void neverUsed(const std::string& key) {
     report_.findings.push_back(
         {.id = "package-key-unknown",
-         .place = placeOf(medium::kPkgInfo, key),
+         .place = lists_.resourcePlace(medium::kPkgInfo, key),
          .found = "a key that no system uses",
          .expected = "\"104\" to \"109\"",
          .effect = "10.9 and every later system get the package that \"109\" names",
@@ -188,7 +182,7 @@ class PackageCheck {
   void unsupported(const std::string& key) {
     report_.findings.push_back({.id = "package-key-unused",
                                 .severity = Severity::kWarning,
-                                .place = placeOf(medium::kPkgInfo, key),
+                                .place = lists_.resourcePlace(medium::kPkgInfo, key),
                                 .found = "a key for systems outside the supported range",
                                 .expected = "packages for " + report_.systems,
                                 .effect = "the package that the key names never opens",

@@ -30,12 +30,6 @@ class RangeCheck {
   }
 
  private:
-  [[nodiscard]] Place placeOf(std::string_view bound, std::string_view key = "") const {
-    Place place{.file = lists_.resourcesPath, .key = {std::string(bound)}};
-    if (!key.empty()) place.key.emplace_back(key);
-    return place;
-  }
-
   void checkNumbers(std::string_view which, const Dictionary& bound) {
     constexpr std::int64_t kNewestMajor = 1000;
     const std::int64_t major = bound.integerValue("Major");
@@ -48,7 +42,7 @@ class RangeCheck {
       if (isVersionNumber(*text) || every) continue;
       report_.findings.push_back(
           {.id = "version-number",
-           .place = placeOf(which, key),
+           .place = lists_.resourcePlace(which, key),
            .found = "the string " + quoted(*text),
            .expected = which == medium::kSystemMax && key == std::string_view("BugFix")
                            ? "a whole number, or \"x\" for all of that minor version"
@@ -64,7 +58,7 @@ class RangeCheck {
     if (!isBound(range_.maximum())) return;
     if (range_.contains(range_.begin())) return;
     report_.findings.push_back({.id = "range-empty",
-                                .place = placeOf(medium::kSystemMax),
+                                .place = lists_.resourcePlace(medium::kSystemMax),
                                 .found = "a range that contains no system: " + report_.systems,
                                 .expected = "a maximum later than the minimum",
                                 .effect = "every system is refused",
@@ -85,7 +79,7 @@ class RangeCheck {
     report_.findings.push_back(
         {.id = "range-excludes-maximum",
          .severity = Severity::kWarning,
-         .place = placeOf(medium::kSystemMax, "BugFix"),
+         .place = lists_.resourcePlace(medium::kSystemMax, "BugFix"),
          .found = "the supported systems: " + report_.systems,
          .expected = "\"x\" for \"BugFix\" to accept all of " + std::to_string(named[0]) + "." +
                      std::to_string(named[1]) + ", or the first release that is refused",
@@ -111,7 +105,7 @@ class RangeCheck {
     const std::string major = std::to_string(last[0]);
     report_.findings.push_back({.id = "range-stops-at-minor",
                                 .severity = Severity::kWarning,
-                                .place = placeOf(medium::kSystemMax, "Minor"),
+                                .place = lists_.resourcePlace(medium::kSystemMax, "Minor"),
                                 .found = "the supported systems: " + report_.systems,
                                 .expected = "a range to the last release of macOS " + major,
                                 .effect = major + ".1 is refused as too new",
