@@ -77,10 +77,11 @@ class PackageCheck {
         rows_.push_back({*start, to, package});
       }
     }
-    for (const Row& row : rows_) {
+    for (const Row& row : rows_)
       report_.packages.push_back({range_.words(row.from, row.to), row.package});
+    if (!hasFolder()) return;
+    for (const Row& row : rows_)
       checkPackage(row);
-    }
   }
 
   struct Row {
@@ -89,16 +90,19 @@ class PackageCheck {
     std::string package;
   };
 
+  // Returns whether the packages' folder exists. Returns true when the list names no folder.
+  [[nodiscard]] bool hasFolder() const {
+    const auto folder = lists_.resources->dictionary(medium::kPkgInfo)->string("PkgLocation");
+    return !folder ||
+           files_.exists(*folder, {lists_.resourcePlace(medium::kPkgInfo, "PkgLocation"),
+                                   "the packages' folder", "the window closes and nothing opens"});
+  }
+
   void checkPackage(const Row& row) {
     const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
     const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
         "the window closes and nothing opens; systems: " + range_.words(row.from, row.to);
-    const PathUse location{lists_.resourcePlace(medium::kPkgInfo, "PkgLocation"),
-                           "the packages' folder", effect};
-    const auto folder = package.string("PkgLocation");
-    if (folder && checked_.insert(*folder).second) hasFolder_ = files_.exists(*folder, location);
-    if (!hasFolder_) return;
     if (package.string(key) == "") {
       report_.findings.push_back({.id = "package-unnamed",
                                   .place = lists_.resourcePlace(medium::kPkgInfo, key),
@@ -200,8 +204,7 @@ class PackageCheck {
   std::vector<Row> rows_;
   std::set<std::string> knownKeys_;
   std::set<std::string> usedKeys_;  ///< keys that supported systems use
-  std::set<std::string> checked_;   ///< the packages and the folder that were looked for
-  bool hasFolder_ = true;           ///< whether the packages' folder exists
+  std::set<std::string> checked_;   ///< packages that were looked for
 };
 
 }  // namespace
