@@ -62,9 +62,9 @@ int KSNetServiceCreateAndResolve(const std::optional<std::string>& name,
     const NetServiceRef& service);
 
 /// Stores in `addresses` the IPv4 addresses of the device that `uri` names. A "dnssd://" or
-/// "mdns://" URI must name a service in the domain "local.", which KSNetServiceCreateAndResolve()
-/// resolves. For any other URL, looks up the host and stores its first address; `timeout` does not
-/// limit the look-up. Returns 1 and leaves `addresses` unchanged in these cases:
+/// "mdns://" URI must name a service in the domain "local."; KSNetServiceCreateAndResolve()
+/// resolves this service. For any other URI, looks up the host and stores its first address;
+/// `timeout` does not limit the look-up. Returns 1 and leaves `addresses` unchanged in these cases:
 /// - `uri` has no value, is malformed or is a "usb://" URI, or `addresses` is null.
 /// - The host's name is longer than 1,024 bytes, or the look-up finds no IPv4 address.
 /// - The resolve fails or times out.
@@ -98,8 +98,8 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 /// Returns the service's name. Returns nothing when the service is null or has no name.
 [[nodiscard]] std::optional<std::string> KSNetServiceGetNameSafe(const NetServiceRef& service);
 
-/// Returns whether "pdl" in the service's TXT record, a list of page description languages,
-/// contains "image/urf", ignoring case. The program does not use this function.
+/// Returns whether the service's TXT record lists "image/urf" in any case under the key "pdl",
+/// which names page description languages. The program does not use this function.
 [[nodiscard]] bool KSNetServiceSupportsURF(const NetServiceRef& service);
 
 /// The client function of every browser. `info` is null or points to a ServiceClientCallbacks.

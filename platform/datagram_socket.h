@@ -40,7 +40,7 @@ class DatagramSocket {
 
   /// Restricts the socket to `peer`: send() sends to `peer`, and the system drops datagrams from
   /// other senders. Returns false when the system refuses, for example because it has no route to
-  /// `peer`. On a connected socket, the system also reports that the peer's host has refused a
+  /// `peer`. On a connected socket, the system also reports when the peer's host refuses a
   /// datagram because no program uses the port. After such a report, waitReadable() returns true,
   /// and the next call of send() or receive() fails.
   [[nodiscard]] bool connect(const DatagramEndpoint& peer);

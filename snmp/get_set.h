@@ -41,8 +41,8 @@ struct snmp_result_slot {
 /// A string here is a value of type 4, 64 or 68. The strings are copied to a buffer of kReplySize
 /// bytes, where each starts at a multiple of 16. The `octets_value` of a binding with a string is
 /// null after the exchange. Returns SNMP_ERR_CODEC and sends nothing when `varbind_count` exceeds
-/// the size of the array, when a binding has no slot, when a string has no record, and when the
-/// strings do not fit in the buffer.
+/// the size of the array, when a binding has no slot, when the snmp_octets pointer for a string is
+/// null, and when the strings do not fit in the buffer.
 [[nodiscard]] snmp_status snmp_set(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 

@@ -27,7 +27,7 @@ constexpr std::uint64_t kPduSet = 3;
 /// An object identifier, whose arcs are in the caller's storage. Arcs above 65,535 cannot be
 /// represented.
 struct snmp_oid {
-  std::uint16_t count = 0;     ///< the number of arcs in use; before decoding, the number that fit
+  std::uint16_t count = 0;     ///< the number of arcs; before decoding, the most arcs to accept
   std::uint16_t capacity = 0;  ///< size of the storage, in arcs
   std::uint16_t* arcs = nullptr;
 };

@@ -9,7 +9,7 @@
 /// The times of an operation, in nanoseconds.
 class Samples {
  public:
-  /// Runs `work` `times` times, and adds the mean time as one sample.
+  /// Runs `work` as often as `times` says, and adds the mean duration as one sample.
   template <typename Work>
   void measure(int times, Work work) {
     const auto start = std::chrono::steady_clock::now();

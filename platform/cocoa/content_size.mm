@@ -227,8 +227,8 @@ void growFields(NSView* view) {
   }
 }
 
-// Returns where a line of `length` must start, so that it lies between `least` and `greatest` and
-// starts as close as possible to `start`. Returns `least` if the line is too long.
+// Returns where one side of a window, `length` long, must start so that it lies between `least` and
+// `greatest` and starts as close as possible to `start`. Returns `least` if the side is too long.
 CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat length) {
   return std::max(least, std::min(std::floor(start), greatest - length));
 }

@@ -109,7 +109,8 @@ void localize(QWidget& root, const std::string& interfaceName) {
   }
 }
 
-// Makes a button or window show the owner's text that its property "titleBinding" names.
+// The property "titleBinding" of a button or window names one of the owner's texts. Makes the
+// widget show this text.
 void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   const QString key = widget->property("titleBinding").toString();
   if (key.isEmpty()) return;

@@ -17,7 +17,7 @@ class Network {
   /// Restores the initial state. Earlier browsers get no more events.
   void reset() { *this = Network(); }
 
-  /// Makes a service such as a browser passes to its client.
+  /// Creates a service like those that a browser passes to its client.
   [[nodiscard]] static NetServiceRef service(const std::string& name, const std::string& type,
                                              const std::string& domain = "local.");
 
@@ -26,14 +26,15 @@ class Network {
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// These functions end the service's running resolve: resolves() with these results, and
-  /// failsToResolve() with kNetServiceErrorTimeout. Both do nothing when no resolve is running.
+  /// These functions end the service's running resolve: resolves() with `addresses` and
+  /// `txt` as its results, and failsToResolve() with kNetServiceErrorTimeout. Both do nothing when
+  /// no resolve is running.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);
 
   [[nodiscard]] static bool isResolving(const NetServiceRef& service);
 
-  /// Gives the service addresses and TXT data without a resolve.
+  /// Sets the service's addresses and TXT data without a resolve.
   static void fill(const NetServiceRef& service, std::vector<Data> addresses,
                    std::optional<Data> txt);
 

@@ -172,7 +172,7 @@ void checkDescription(const Dictionary& description, const std::string& path, Re
   checkInner(description, top, "InstallPKG", kOptionRules, OtherKeys::kAllowed, report);
 }
 
-// Returns whether `list` has no "Model", but a value that looks like the description of a model.
+// Returns whether `list` lacks "Model" but has a value that looks like the description of a model.
 bool isWithoutModelKey(const Dictionary& list) {
   return !list.find("Model") && std::any_of(list.begin(), list.end(), [](const auto& pair) {
     const auto* const entry = pair.value.template as<Dictionary>();

@@ -39,8 +39,8 @@ struct Lists {
   /// Returns the names of the medium's models in the order in which the wizard shows them.
   [[nodiscard]] std::vector<std::string> modelNames() const;
 
-  /// Returns the place of the dictionary `dictionary` in the resource dictionary or, if `key` is
-  /// given, the place of that key in it.
+  /// Returns the place of the resource dictionary's key `dictionary` or, if `key` is given, the
+  /// place of `key` in the dictionary under that key.
   [[nodiscard]] Place resourcePlace(std::string_view dictionary, std::string_view key = "") const;
 
   /// Returns whether any model supports wireless.

@@ -39,8 +39,8 @@ class MediumFiles {
   /// leads outside the medium, and returns false for it.
   bool exists(const std::string& relative, const PathUse& use) const;
 
-  /// Returns the property list at `relative`. If it is an XML list, reports each repetition of a
-  /// key in its dictionary, except inside arrays and inside the value of a repeated key. When
+  /// Returns the property list at `relative`. If it is an XML list, reports each key that a
+  /// dictionary in it repeats. Does not look into arrays or into the value of a repeated key. When
   /// exists() returns false or the wizard cannot read the list, reports why and returns nothing.
   [[nodiscard]] std::optional<Dictionary> list(const std::string& relative,
                                                const PathUse& use) const;

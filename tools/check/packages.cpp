@@ -27,8 +27,8 @@ std::set<Version> differentSystems() {
   return systems;
 }
 
-// Makes `version` the system's version. Returns the key under which the wizard then looks for the
-// package, or an empty string when there is none.
+// Sets the stand-in system's version to `version`. Returns the key under which the wizard then
+// looks for the package, or an empty string when there is none.
 std::string versionKey(const Version& version) {
   setSystemVersion(std::to_string(version[0]) + "." + std::to_string(version[1]) + "." +
                    std::to_string(version[2]));

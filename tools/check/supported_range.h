@@ -17,7 +17,8 @@ using Version = std::array<std::int64_t, 3>;
 /// Returns the version that the bound `bound`, "SystemMin" or "SystemMax", names.
 [[nodiscard]] Version boundOf(const Dictionary& bound);
 
-/// Returns the version with dots, such as "10.13.0". A first release is only "11.0".
+/// Returns the version with dots, such as "10.13.4". Omits the last number of a major version's
+/// first release, as in "11.0".
 [[nodiscard]] std::string dotted(const Version& version);
 
 /// Returns whether `text` consists of digits only.
@@ -27,7 +28,7 @@ using Version = std::array<std::int64_t, 3>;
 /// Info.plist does not name one.
 [[nodiscard]] std::optional<SystemVersion> applicationsMinimum(const Lists& lists);
 
-/// The range of systems that the medium supports, as the wizard decides.
+/// The range of systems on which the wizard accepts the medium.
 class SupportedRange {
  public:
   /// `lists.resources` must have a value.

@@ -42,8 +42,8 @@ std::string textUnder(const Device& device, std::string_view key) {
   return text ? text->value(key).value_or("") : "";
 }
 
-// Returns the first of `keys`, other than `wanted`, under which the device announces a string, or
-// nothing.
+// Returns the first of `keys`, other than `wanted`, under which the device announces a string.
+// Returns nothing when there is no such key.
 std::optional<std::string_view> otherKey(const Device& device, std::string_view wanted,
                                          std::span<const std::string_view> keys) {
   for (const std::string_view key : keys) {
@@ -85,8 +85,9 @@ std::string edgeBlanks(const std::string& announced) {
                                                    : "differs only in spaces from";
 }
 
-// Returns the medium's model that `announced` most resembles in spelling. If none does, returns one
-// whose name ends with `model`, which the device announces without the maker.
+// Returns the medium's model whose spelling is nearest to `announced`. If none is near, returns one
+// whose name ends with `model`, the model that the device announces without its maker. Returns
+// nothing when there is no such model either.
 std::optional<std::string> nearestOf(const std::string& announced, const std::string& model,
                                      const Medium& medium) {
   auto nearest = check::Spelling(medium.models).nearest(announced);

@@ -73,7 +73,7 @@ def take_over_run():
 
 
 def loop_back(second):
-    """Sets up the loopback interface, which connects the devices and the command.
+    """Sets up the loopback interface, which connects the devices and the user's command.
 
     `second` is the name of a second interface to create, or None.
     """
@@ -131,8 +131,8 @@ class Host:
         run("ip", "address", "replace", address, "dev", self.interfaces[0])
 
     def plug(self, interface, plugged):
-        """Brings the interface up if `plugged` is true, otherwise down. With two hosts, sets both
-        ends of the cable."""
+        """Brings the interface up if `plugged` is true, otherwise down. With two hosts,
+        brings both ends of the cable up or down."""
         for enter in ((), IN_FIRST_HOST):
             if plugged:
                 _bring_up(interface, self.interfaces.index(interface), enter)

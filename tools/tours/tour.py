@@ -77,8 +77,8 @@ class Tour:
         visit.picture("2-about", "The About panel")
 
     def _take_a_supported_system(self):
-        """Continues with the oldest system that the medium names. Only adds a note if the options
-        name a system or the medium names none."""
+        """Continues with the oldest system that the medium names. If the options name a
+        system or the medium names none, adds a note instead."""
         oldest = self._medium.oldest_system()
         if any(option.startswith("--system-version") for option in self._options) or not oldest:
             self._album.note("The medium does not support this system, so there is no page.")
