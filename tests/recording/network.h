@@ -26,8 +26,8 @@ class Network {
   void found(const NetServiceRef& service);
   void gone(const NetServiceRef& service);
 
-  /// These functions end the service's running resolve: resolves() with `addresses` and
-  /// `txt` as its results, and failsToResolve() with kNetServiceErrorTimeout. Both do nothing when
+  /// These functions end the service's running resolve: resolves() with `addresses` and `txt`
+  /// as its results, and failsToResolve() with kNetServiceErrorTimeout. Both do nothing when
   /// no resolve is running.
   void resolves(const NetServiceRef& service, std::vector<Data> addresses, Data txt = {});
   void failsToResolve(const NetServiceRef& service);

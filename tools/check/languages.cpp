@@ -19,8 +19,8 @@ namespace fs = std::filesystem;
 
 constexpr const char* kNameTable = "InfoPlist.strings";
 
-// Codes of countries that are easily taken for the code of the country's language. Only "kr"
-// is also the code of a language, Kanuri.
+// Codes of countries that are easily taken for the code of the country's language. Only "kr" is
+// also the code of a language, Kanuri.
 constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountries{{{"jp", "ja"},
                                                                                    {"cn", "zh"},
                                                                                    {"kr", "ko"},
@@ -48,8 +48,8 @@ std::vector<std::string_view> partsOf(std::string_view name) {
 
 // Returns whether `name` is a code of two or three letters, then perhaps a script of four letters,
 // then perhaps a region of two letters or three digits, then perhaps variants such as "valencia" or
-// "1996". Returns true also for one longer word, because old
-// media have English names, such as "German".
+// "1996". Returns true also for one longer word, because old media have English names, such
+// as "German".
 bool hasFormOfLanguage(std::string_view name) {
   const std::vector<std::string_view> parts = partsOf(name);
   const std::string_view code = parts.front();
@@ -116,8 +116,8 @@ class LanguageCheck {
 
  private:
   // Reports each language that has at least half of its texts in common with English. A new
-  // language usually begins as a copy of the English table, and some texts may be left
-  // untranslated by mistake.
+  // language usually begins as a copy of the English table, and some texts may be left untranslated
+  // by mistake.
   void checkTranslations() {
     const auto english = std::find_if(tables_.begin(), tables_.end(), [](const auto& table) {
       return isSameLanguage(table.first, "en");

@@ -10,8 +10,8 @@
 
 namespace onramp::devices {
 
-/// Asks many devices at once, each on a separate thread. The wizard sends a device
-/// the same requests, but asks one device after another.
+/// Asks many devices at once, each on a separate thread. The wizard sends a device the same
+/// requests, but asks one device after another.
 class Questions {
  public:
   using Answered = std::function<void(Answer answer)>;
