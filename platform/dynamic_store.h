@@ -55,8 +55,8 @@ using DynamicStoreSourceRef = std::shared_ptr<DynamicStoreSource>;
 using DynamicStoreCallback = std::function<void(const std::vector<std::string>& changedKeys)>;
 
 /// Creates a session. The system uses `name` only for diagnostics. `callback` is called on the main
-/// thread when keys change that setNotificationKeys() has selected. The calls begin when the
-/// session's source is on the run loop. Returns null on failure.
+/// thread with the keys that setNotificationKeys() has selected and whose values have changed. The
+/// calls begin when the session's source is on the run loop. Returns null on failure.
 [[nodiscard]] DynamicStoreRef createDynamicStore(const std::string& name,
                                                  DynamicStoreCallback callback = nullptr);
 

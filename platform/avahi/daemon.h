@@ -73,7 +73,7 @@ class Daemon {
   EventLoop loop_;
   Timer retry_;
   std::vector<Query*> queries_;
-  std::map<std::string, Query*> listeners_;  ///< by the path of the query's object
+  std::map<std::string, Query*> listeners_;  ///< by the path of the query's object in the daemon
   unsigned losses_ = 0;
   bool isPresent_ = false;    ///< the daemon is on the bus
   bool isConnected_ = false;  ///< `bus_` is set and works

@@ -38,8 +38,8 @@ class Query {
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Returns whether the question failed for good, because the daemon called it invalid or because
-  /// it could not be encoded in a message. The query then gets no result and is not sent again.
+  /// Returns whether the request failed for good, because it could not be put into a message or the
+  /// daemon called it invalid. The query then gets no result and is not sent again.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:

@@ -18,7 +18,7 @@ namespace onramp {
 /// property lists, and comments. If a key has no text, the key is also the text. When a key occurs
 /// more than once, the last text is used. Returns nothing when the content violates the grammar or
 /// has more than kMostPropertyListObjects pairs. In that case, stores the place and the reason in
-/// `problem`.
+/// `problem`, if given.
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text);
 [[nodiscard]] std::optional<Dictionary> parseStrings(std::string_view text, ParseProblem& problem);
 

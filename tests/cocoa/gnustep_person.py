@@ -1,7 +1,7 @@
 """Lets tests use the Cocoa front end under GNUstep as a person would.
 
 GNUstep does not support AT-SPI. So this module asks the program itself which controls are visible.
-accessibility.mm describes the files with the question and the answer.
+accessibility.mm describes the question file and the answer file.
 """
 
 import itertools
@@ -161,7 +161,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """Turns options into environment variables, because the Cocoa front end has no options."""
+        """Turns options into environment variables, as the Cocoa front end has no command-line options."""
         if not arguments:
             return {}
         option, value = arguments

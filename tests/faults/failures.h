@@ -31,8 +31,8 @@ void begin(const Failure& failure);
 std::vector<std::string> end();
 
 /// Runs `work` again and again. In the first run, the first call fails; in the second run, the
-/// second call; and so on until a run has no call left to fail or the test has failed. Does this
-/// for each of `errors`, first with single failures, then with lasting failures (except for EINTR).
+/// second call; and so on until no call is left to fail or the test has failed. Does this for
+/// each of `errors`, first with single failures, then with lasting failures (except for EINTR).
 /// Lasting failures also keep `work` from cleaning up, as if the process were killed. After each
 /// run, expects that no descriptor is left open. Then calls `check` with the name of the first call
 /// that failed, and with the failure. The name is empty if no call failed. Returns the names of all

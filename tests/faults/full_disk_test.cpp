@@ -15,7 +15,7 @@ TEST(FullDisk, KeepsTheOldFileAndLeavesNoTemporaryFile) {
   const auto run = [&](const std::string& command) {
     EXPECT_EQ(std::system(("cd '" + folder / "' && " + command).c_str()), 0) << command;
   };
-  // Each case has mount options and a command. After the command, writing a list fails.
+  // Each case has mount options and a command. Once the command has run, writing a list must fail.
   const std::pair<std::string, const char*> failures[] = {
       {"size=64k", "! head -c 1M /dev/zero > fill"},
       {"size=64k", "! head -c 1M /dev/zero > fill; truncate -s -8192 fill"},

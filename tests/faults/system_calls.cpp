@@ -44,8 +44,8 @@ template <typename Result, typename... Parameters>
 Result call(const char* name, Result failure, Parameters... arguments) {
   const bool isFailing = fails(name);
   Result result{};
-  // Linux closes a descriptor even when close() reports an error, so a failing close() closes it
-  // here, too. fsync() never flushes, because flushing would take most of the tests' time, and the
+  // Linux closes a descriptor even when close() reports an error, so the replacement does the
+  // same. fsync() never flushes, because flushing would take most of the tests' time, and the
   // tests could not see its effect.
   if ((!isFailing && std::string_view(name) != "fsync") || std::string_view(name) == "close") {
     result = original<Result(Parameters...)>(name)(arguments...);

@@ -19,7 +19,7 @@ def model(usb=False, wired=False, wireless=False):
 def make(folder, built, models, tool_status=0, **resources):
     """Makes a medium in `folder`, with the application, messages and pictures of the medium `built`.
 
-    `resources` are added to the entries of CDCommonInfo.plist or replace them. The set-up tool
+    Adds `resources` to CDCommonInfo.plist, replacing entries with the same keys. The set-up tool
     writes its arguments to the file "tool" in `folder` and exits with `tool_status`. Returns the
     folder's path.
     """

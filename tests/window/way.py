@@ -19,7 +19,7 @@ from onscreen import messages  # noqa: E402
 from onscreen.desktop import Desktop  # noqa: E402
 
 # Under GNUstep, the Cocoa front end lacks the accessibility bus, keys for menus, names of lists,
-# and options. Tests avoid these if ON_GNUSTEP is true.
+# and command-line options. Tests avoid these if ON_GNUSTEP is true.
 from tours.person import ON_GNUSTEP, Person  # noqa: E402
 
 BUILT = pathlib.Path(sys.argv.pop()).resolve()
@@ -55,7 +55,7 @@ class WayTest(unittest.TestCase):
             person.press("F10")
 
     def files(self):
-        """Returns the contents of the files for the package under short names, such as "instmodel"."""
+        """Returns the contents of the files for the package, keyed by short names like "instmodel"."""
         found = {}
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
             for path in folder.rglob("com.kestrelimaging.*"):
