@@ -31,7 +31,7 @@ class Reader {
 
  private:
   // Only two Boolean objects exist, so comparing pointers recognises a Boolean. For any other
-  // number, the C type tells whether it is real.
+  // number, the C type tells whether it is a floating-point number.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
     if (number == [NSNumber numberWithBool:NO]) return Value(false);

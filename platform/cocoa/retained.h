@@ -6,7 +6,7 @@
 
 namespace onramp::cocoa {
 
-/// Owns one reference to an Objective-C object, or none.
+/// Owns at most one reference to an Objective-C object.
 template <typename Class>
 class Retained {
  public:

@@ -38,8 +38,8 @@ bool isMedium(const std::filesystem::path& folder) {
          (!application.empty() && check::isWizard(folder.string(), application));
 }
 
-// Returns why `folder` is not a medium, and what to give in its place. Returns an empty string if
-// it may be a medium.
+// Returns why `folder` is not a medium, and which folder the user should give instead. Returns an
+// empty string if it may be a medium.
 std::string reasonAgainst(const std::string& folder) {
   namespace fs = std::filesystem;
   std::error_code error;

@@ -73,7 +73,8 @@ std::optional<std::size_t> lineOfString(const std::string& path, const std::stri
 }
 
 // Returns the path of the only file or folder in `root` that is named `name`, relative to `root`.
-// Returns nothing if there is none, several, or so many files that the search would take long.
+// Returns nothing if there is no such path, if there are several, or if `root` has so many files
+// that the search would take long.
 std::optional<std::string> onlyPathOf(const std::string& name, const std::string& root) {
   constexpr int kMostFiles = 10'000;
   std::optional<std::string> only;

@@ -41,8 +41,8 @@ class ModelCheck {
  public:
   ModelCheck(const Lists& lists, Report& report) : lists_(lists), report_(report) {}
 
-  // Reports names that only the medium description has or only the model information has. If two of
-  // these names, one from each list, are almost equal, they are reported as one finding.
+  // Reports names that are in the medium description or the model information, but not in both. If
+  // two of these names, one from each list, are almost equal, they are reported as one finding.
   void compareLists() {
     const auto contained = lists_.description->dictionary(kContained);
     const auto described = lists_.models->dictionary("Model");
@@ -165,8 +165,8 @@ class ModelCheck {
   }
 
   // Compares the maker, which is the first word of the model's name, with the first word of the
-  // vendor's name. Reports each spelling of the maker that differs only in capital letters, but
-  // reports each spelling only once.
+  // vendor's name. If the two differ only in capital letters, reports this spelling of the maker
+  // once.
   void spelledLikeTheVendor(const std::string& name) {
     const auto vendor = lists_.resources->string(medium::kVenderName);
     const std::string maker = name.substr(0, name.find(' '));

@@ -11,8 +11,8 @@
 
 namespace onramp::check {
 
-/// A model, and its connections as the medium gives them. The wizard may offer USB for a model
-/// without USB, because the connection page always offers USB.
+/// A model, and the connections that it has according to the medium. The wizard may offer USB for a
+/// model without USB, because the connection page always offers USB.
 struct ModelRow {
   std::string name{};
   bool usb = false;

@@ -8,7 +8,7 @@ namespace onramp::check {
 
 namespace {
 
-// The number of pairs of bytes after which an object makes no further comparisons.
+// The number of pairs of bytes after which a Spelling object makes no more comparisons.
 constexpr std::size_t kMostWork = 20'000'000;
 // Shorter words often have the same letters by chance.
 constexpr std::size_t kFewestToSwap = 6;

@@ -13,15 +13,15 @@ namespace onramp::check {
 /// capital letters, spaces and punctuation, a hash table finds the known word. Otherwise the
 /// misspelt word is compared with every known word. Each object limits the total work of these
 /// comparisons, because comparing many misspelt words with many known words would take too long.
-/// Above that limit, nearest() uses only the hash table.
+/// Above that limit, nearest() finds only words with the same letters, in any order.
 class Spelling {
  public:
   explicit Spelling(const std::vector<std::string>& known);
 
-  /// Returns the known word that is most similar to `word`, or nothing if none is similar enough. A
-  /// word from the hash table counts as the most similar. If several words are equally similar,
-  /// returns the first of them. If none is, returns a word with the same letters in another order,
-  /// such as "SystemMin" for "MinSystem".
+  /// Returns the known word that is most similar to `word`. A word from the hash table counts as
+  /// the most similar. If several words are equally similar, returns the first of them. If no word
+  /// is similar enough, returns one with the same letters in another order, such as "SystemMin" for
+  /// "MinSystem". Returns nothing if there is none of these either.
   [[nodiscard]] std::optional<std::string> nearest(std::string_view word);
 
  private:

@@ -72,8 +72,8 @@ void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::str
 
 // Checks the translations of the tool's name. If some languages have a translation, reports the
 // tables without one, except the table of `region`, whose users see the right name anyway. If the
-// name contains the maker's name, reports the translations that do not, because they are probably
-// left over from another maker's medium.
+// name contains the maker's name, reports the translations that do not contain it, because they are
+// probably left over from another maker's medium.
 void checkTranslations(const MediumFiles& files, const std::string& relative,
                        const std::string& name, const std::string& vendor,
                        const std::string& region) {

@@ -37,7 +37,7 @@ std::size_t malformedAt(const std::string& bytes) {
 }
 
 // Returns the remedy for a mistake at `offset` of the strings table `text`, or an empty string if
-// the mistake is none of the usual ones with quotation marks.
+// the mistake is not a usual one with quotation marks.
 std::string remedyForQuotes(std::string_view text, std::size_t offset) {
   std::string_view rest = text.substr(std::min(offset, text.size()));
   rest.remove_prefix(std::min(rest.find_first_not_of(" \t"), rest.size()));
@@ -64,7 +64,7 @@ bool hasBareAmpersand(std::string_view line) {
 }
 
 // Returns the remedy for a mistake on line `number` of the XML text `text`, or an empty string if
-// it is none of the usual ones.
+// that line has no bare "&".
 std::string remedyForAmpersand(const std::string& text, std::size_t number) {
   std::istringstream lines(text);
   std::string line;

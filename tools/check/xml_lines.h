@@ -15,8 +15,8 @@ struct XMLLines {
   /// The line on which a key occurs first. The key's path, from the outermost dictionary to the key
   /// itself, is the map's key. Keys inside arrays are left out.
   std::map<std::vector<std::string>, std::size_t> keys;
-  /// The path and line of each repetition of a key in its dictionary. Keys inside arrays and inside
-  /// the value of a repeated key are left out.
+  /// The path and line of each key that repeats an earlier key of the same dictionary. Keys inside
+  /// arrays and inside the value of a repeated key are left out.
   std::vector<std::pair<std::vector<std::string>, std::size_t>> twice;
   std::string problem;          ///< the first mistake; empty when there is none
   std::size_t problemLine = 0;  ///< counted from 1

@@ -7,7 +7,7 @@
 
 namespace onramp::devices {
 
-/// The delay that a device causes in the wizard if it answers slowly or not at all. All members are
+/// The delay that a device causes in the wizard by answering slowly or not at all. All members are
 /// 0 if the delay is shorter than a second.
 struct Delay {
   double seconds = 0;       ///< how long the wizard's window does not respond
@@ -32,12 +32,12 @@ struct BrowseResult {
   std::vector<Verdict> network{};       ///< problems of the network as a whole
 };
 
-/// Returns whether the wizard's first search misses the device, although it passes every check.
+/// Returns whether the wizard's first search misses a device that passes every check.
 [[nodiscard]] bool isMissed(const JudgedDevice& device);
 
 /// Sets the delay that each device would cause in the wizard's first search, and adds the note
-/// "missed" to the devices that the search misses because of it. The wizard asks one device after
-/// another, in the order in which they are resolved.
+/// "missed" to the devices that the search misses because of a delay. The wizard asks one device
+/// after another, in the order in which they are resolved.
 void computeDelays(std::vector<JudgedDevice>& devices);
 
 /// Returns the result as JSON, in the form that the manual page describes.

@@ -21,8 +21,8 @@ struct TextStyle {
 /// on `medium` searches for one model at a time, a paragraph before the line says so.
 [[nodiscard]] std::string tableHead(const Medium& medium, const TextStyle& style);
 
-/// Returns a device's row in the table and the lines below the row. These are the reason if the
-/// wizard does not list the device, the notes and, in the verbose style, all details.
+/// Returns a device's row in the table and the lines below the row: the reason (if the
+/// wizard does not list the device), the notes and (in the verbose style) all details.
 [[nodiscard]] std::string rowOf(const JudgedDevice& device, const TextStyle& style);
 
 /// Returns the row for a device that is no longer announced.

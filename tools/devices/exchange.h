@@ -32,8 +32,8 @@ struct Exchange {
   std::uint64_t errorStatus = 0;        ///< for kError; see RFC 1157 section 4.1.1
   std::optional<std::int64_t> value{};  ///< for kValue
   unsigned type = 0;                    ///< for kOtherType; the value's tag
-  /// Whether the reply named a different object than the request. If so, the wizard would ask all
-  /// later devices for the object that the reply named.
+  /// Whether the reply named a different SNMP object than the request. If so, the wizard would ask
+  /// all later devices for the object that the reply named.
   bool changedQuestion = false;
 };
 

@@ -27,8 +27,8 @@ struct Verdict {
 [[nodiscard]] Verdict judge(const Device& device, const Medium& medium,
                             const std::function<bool(const std::string& address)>& isLocal);
 
-/// Returns notes on how the device's replies change the requests to other devices. There are no
-/// notes when the device was not asked.
+/// Returns notes on a device whose model never leads to a search, and on a device whose reply
+/// changes the wizard's requests to later devices.
 [[nodiscard]] std::vector<Verdict> notesOn(const Device& device, const Medium& medium);
 
 }  // namespace onramp::devices

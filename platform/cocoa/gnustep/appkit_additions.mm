@@ -104,8 +104,8 @@ BOOL openURL(id, SEL, NSURL* url) {
 }  // namespace
 
 /// Represents an accessibility relation between controls in an interface file. GNUstep creates an
-/// object for each element of the file, and rejects the whole file if it lacks the class of any
-/// element.
+/// object for each element of the file, and rejects the whole file if the class of any element
+/// is missing.
 @interface IBAccessibilityConnection : NSObject
 @end
 
