@@ -161,7 +161,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """Turns options into environment variables, as the Cocoa front end has no command-line options."""
+        """Turns options into environment variables, as the Cocoa front end has no options."""
         if not arguments:
             return {}
         option, value = arguments

@@ -40,9 +40,9 @@ inline constexpr std::string_view kLanguageFolder = ".lproj";
 /// Returns whether two names are those of the same language, in any region and script.
 [[nodiscard]] bool isSameLanguage(const std::string& a, const std::string& b);
 
-/// Checks that the languages of the message bundle are translated and complete: the bundle has the
-/// language for all other users, and the application and the set-up tool have the bundle's
-/// languages. `tables` maps each language to its strings.
+/// Checks that the languages of the message bundle are translated and complete: the bundle must
+/// have the language that users of all other languages see, and the application and the set-up
+/// tool must have the bundle's languages. `tables` maps each language to its strings.
 void checkLanguages(const MediumFiles& files, const Lists& lists,
                     const std::map<std::string, Dictionary>& tables);
 

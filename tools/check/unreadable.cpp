@@ -36,8 +36,8 @@ std::size_t malformedAt(const std::string& bytes) {
   return bytes.size();
 }
 
-// Returns the remedy for a mistake at `offset` of the strings table `text`, or an empty string if
-// the mistake is not a usual one with quotation marks.
+// Returns the remedy for a common mistake with quotation marks at `offset` of the strings table
+// `text`. Returns an empty string if there is no such mistake.
 std::string remedyForQuotes(std::string_view text, std::size_t offset) {
   std::string_view rest = text.substr(std::min(offset, text.size()));
   rest.remove_prefix(std::min(rest.find_first_not_of(" \t"), rest.size()));

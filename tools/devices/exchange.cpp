@@ -193,7 +193,7 @@ constexpr std::array kTellingOrder{
 }  // namespace
 
 const Exchange* Answer::telling() const {
-  // The wizard stops asking when a value decides the answer, so only the last value can decide.
+  // The wizard asks until a value decides the answer, so only the last value can decide.
   const auto last = std::find_if(exchanges.rbegin(), exchanges.rend(),
                                  [](const Exchange& e) { return e.outcome == Outcome::kValue; });
   if (last != exchanges.rend()) return &*last;
