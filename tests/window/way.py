@@ -55,7 +55,7 @@ class WayTest(unittest.TestCase):
             person.press("F10")
 
     def files(self):
-        """Returns the contents of the files for the package, keyed by short names like "instmodel"."""
+        """Returns the contents of the files for the package by short names such as "instmodel"."""
         found = {}
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
             for path in folder.rglob("com.kestrelimaging.*"):
