@@ -1,5 +1,4 @@
-# Sets ONRAMP_BACKENDS to the backends of the wizard, which are libraries that implement the headers of
-# platform/.
+# Sets ONRAMP_BACKENDS to the wizard's backends: the libraries that implement the headers of platform/.
 
 if(APPLE)
   set(ONRAMP_UI cocoa)

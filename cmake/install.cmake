@@ -1,5 +1,6 @@
 # Installs the application, the command-line tools, an example medium and the documents. cpack puts
-# these files into a Debian package and into the media kit, a tarball that runs without installation.
+# these files into a Debian package and into the media kit, a tarball whose programs run without
+# installation.
 #
 # LIBDIR/onramp holds the scripts from tools/, and the example medium with the application on it. Each
 # command in BINDIR is a program or a link to one of these scripts.
@@ -41,7 +42,7 @@ foreach(modules IN ITEMS onscreen practice_network tours)
 endforeach()
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/examples/medium DESTINATION ${home} USE_SOURCE_PERMISSIONS)
 install(FILES ${PROJECT_SOURCE_DIR}/examples/practice-network.toml DESTINATION ${home}/examples)
-# The practice network reads the maker's settings, so that its devices answer like the maker's.
+# The practice network reads the maker's settings, so that its devices answer as the maker's devices do.
 install(FILES ${ONRAMP_MAKER} RENAME maker.json DESTINATION ${home})
 
 foreach(tool IN ITEMS check devices)

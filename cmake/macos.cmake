@@ -1,5 +1,5 @@
-# Builds the application for macOS. The target medium assembles a medium with the application in the
-# folder ONRAMP_MEDIUM. The target dmg makes a disc image of that medium.
+# Builds the application for macOS. The target `medium` assembles a medium, with the application on it,
+# in the folder ONRAMP_MEDIUM. The target `dmg` makes a disc image of that medium.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_application "${ONRAMP_MEDIUM}/Onramp OSX.app")

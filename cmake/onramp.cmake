@@ -7,11 +7,11 @@ target_compile_options(onramp_options INTERFACE
   # GCC 12 wrongly warns that string concatenation in the standard library copies overlapping
   # memory.
   $<$<COMPILE_LANG_AND_ID:CXX,GNU>:-Wno-restrict>
-  # macOS deprecates its C functions for network services and for the system's version, but has no
-  # other C functions for them.
+  # macOS deprecates its C functions for network services and for the system's version, but offers
+  # no others in C.
   $<$<PLATFORM_ID:Darwin>:-Wno-deprecated-declarations>)
 
-# These options are global, so that all code is instrumented, including that of third-party headers.
+# These options are global, so that all code is instrumented, including third-party headers.
 if(ONRAMP_SANITIZE)
   add_compile_options(-fsanitize=${ONRAMP_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
   add_link_options(-fsanitize=${ONRAMP_SANITIZE})
@@ -21,9 +21,9 @@ if(ONRAMP_FUZZ)
   add_custom_target(fuzzers)
 endif()
 
-# onramp_library(NAME SOURCES… [LINK libraries…]) adds the static library of a room, which is a
-# source folder with one task. The files of the library are joined only for the linter, not in other
-# unity builds. Otherwise, a program would need backends for files that it does not use.
+# onramp_library(NAME SOURCES… [LINK libraries…]) adds a static library for a room. A room is a source
+# folder with one task. Only the linter's unity build joins the library's files. If other builds joined
+# them, a program would need backends for files that it does not use.
 function(onramp_library name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} STATIC ${ARG_UNPARSED_ARGUMENTS})
@@ -34,9 +34,9 @@ function(onramp_library name)
 endfunction()
 
 # onramp_backend(NAME SOURCES… [LINK libraries…]) adds a backend, which implements headers of
-# platform/. A backend is an object library, because it comes before the libraries that use it on
-# the linker's command line. In that place, the linker would skip the files of a static library,
-# because nothing needs them yet.
+# platform/. On the linker's command line, a backend comes before the libraries that use it. The linker
+# would skip the files of a static library there, because nothing needs them yet. So a backend is an
+# object library.
 function(onramp_backend name)
   cmake_parse_arguments(ARG "" "" "LINK" ${ARGN})
   add_library(${name} OBJECT ${ARG_UNPARSED_ARGUMENTS})

@@ -113,7 +113,8 @@ class Wizard : public testing::Test {
     return shown;
   }
 
-  /// Returns the connection page's heading, explanation, pictures and choices, one on each line.
+  /// Returns the connection page's heading, explanation, pictures and choices, each followed by a
+  /// line feed.
   [[nodiscard]] std::string connectionPage() const {
     auto& choices = screen.object("connectionTypeRadioButton").cells;
     std::string shown;

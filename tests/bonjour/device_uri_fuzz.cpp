@@ -1,5 +1,5 @@
-// Parses each input as a device URI and as a URL. Then makes a device URI of a service with the
-// input as its name. If the name is UTF-8 and not ambiguous, also reads it back.
+// Parses each input as a device URI and as a URL. Then escapes and unescapes the input. If it is
+// UTF-8 and not ambiguous as a service's name, also makes and parses the service's device URI.
 
 #include <cstdint>
 #include <cstdlib>

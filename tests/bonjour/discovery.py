@@ -100,8 +100,8 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts the daemon. Each of `settings` replaces the setting of the same name in the
-        configuration file. The arguments' names have "_" where the settings' names have "-"."""
+        """Starts the daemon. Each of `settings` replaces a setting in the configuration file. The
+        argument's name has "_" where the name in the file has "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

@@ -119,8 +119,8 @@ class Devices(Network):
                         self.assertEqual(search.wait_for("update", "Dual")[6], "192.0.2.66")
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
-                        # Before Avahi announces a new device, it checks the device's name. During
-                        # this check, all sightings of the removed device disappear.
+                        # Before Avahi announces a new device, it checks that the name is free.
+                        # Meanwhile, all sightings of the removed device disappear.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],

@@ -99,8 +99,8 @@ TEST_F(BrowserTest, RemovalsWithoutAResolveInBetweenCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // Only the first of the three removals counted. After the next resolve, two more removals remove
-  // the service.
+  // Only the first of the three removals counted. After the next resolve, the service is gone only
+  // after two more removals.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());

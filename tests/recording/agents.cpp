@@ -20,7 +20,7 @@ namespace recording {
 
 namespace {
 
-// Returns a reply with `value` to a request for one object.
+// Returns a reply with `value` to `request`, which asks for one SNMP object.
 Agents::Bytes answerTo(const Agents::Bytes& request, int value) {
   Message message(1);
   if (message.decode(request)) std::abort();

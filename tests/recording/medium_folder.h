@@ -16,8 +16,8 @@ namespace onramp::recording {
 /// variables that this object has changed.
 class MediumFolder {
  public:
-  /// Makes a medium that holds only an application bundle. Sets the environment variables that
-  /// set the application-support folders, select English and simulate macOS 10.9.5.
+  /// Makes a medium that holds only an application bundle. Changes environment variables to choose
+  /// the application-support folders and English, and to simulate macOS 10.9.5.
   MediumFolder();
   MediumFolder(const MediumFolder&) = delete;
   MediumFolder& operator=(const MediumFolder&) = delete;
@@ -46,9 +46,8 @@ class MediumFolder {
   /// Returns the arguments of the tool's last run, or an empty string when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// optionsFile() and modelFile() return the contents of the two files that the wizard writes for
-  /// the package, or nothing when a file cannot be read. The other two functions return the files'
-  /// paths.
+  /// The two files that the wizard writes for the package. optionsFile() and modelFile() return a
+  /// file's contents, or nothing when it cannot be read. The other two functions return its path.
   [[nodiscard]] auto optionsFile() const { return loadDictionary(optionsFilePath()); }
   [[nodiscard]] auto modelFile() const { return loadDictionary(modelFilePath()); }
   [[nodiscard]] std::string optionsFilePath() const {

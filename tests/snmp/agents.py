@@ -20,8 +20,8 @@ def bound_to(address, port=161):
 
 
 def serve(address, number, seconds=0, strangers=()):
-    """Starts an agent that answers each request with `number` after `seconds`. Just before each of
-    these answers, each socket in `strangers` answers with 1."""
+    """Starts an agent at `address` that answers each request with `number` after `seconds`. Just
+    before each of these answers, each socket in `strangers` answers with 1."""
     agent = bound_to(address)
 
     def answer():

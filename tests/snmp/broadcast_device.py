@@ -1,7 +1,7 @@
 """Simulates a device that answers one SNMP request: broadcast_device.py KIND
 
-KIND is the number to answer with. The kinds "stutter" and "flood" answer many times instead. Some
-of the replies of "stutter" are malformed."""
+KIND is the number to answer with, or "stutter" or "flood". Devices of these two kinds answer many
+times. Some of the replies of "stutter" are malformed."""
 
 import socket
 import sys
@@ -14,9 +14,9 @@ SEVEN = reply(IDENTIFIER, 7)
 TEXT = SEVEN.replace(b"\2\2\0\7", b"\4\2\0\7")
 NO_BINDINGS = SEVEN[:27] + b"\0"
 
-# The datagrams of the kinds that answer many times, each after its time in seconds since the
-# request. A search listens for 5 to 8 seconds, so it must hear the datagram of "stutter" that comes
-# after 4.5 seconds, and miss the last one.
+# For each kind that answers many times: its datagrams, each with the seconds between the request and
+# the datagram. A search listens for 5 to 8 seconds, so it must hear the datagram of "stutter" that
+# comes after 4.5 seconds, and miss the last one.
 REPLIES = {
     "stutter": [(0, b""), (0, b"no message"), (0, SEVEN[:-1]), (0, reply(IDENTIFIER, 7, status=2)),
                 (0, TEXT), (0, SEVEN), (0, NO_BINDINGS), (0, SEVEN), (4.5, SEVEN),

@@ -25,7 +25,7 @@ std::vector<std::uint8_t> written(Put put) {
 
 TEST(Integers, TakeTheFewestBytesAndAreSignExtendedDependingOnTheirSize) {
   // Each row has a number, its encoding, and the numbers that ber_get_int() and ber_get_uint() read
-  // from the encoding. ber_put_int() sets its argument to the last number.
+  // from the encoding. ber_put_int() sets its argument to the row's last number.
   const std::tuple<std::int64_t, const char*, std::int64_t, std::uint64_t> cases[] = {
       {127, "02 01 7F", 127, 127},
       {128, "02 02 00 80", 128, 128},

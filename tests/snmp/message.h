@@ -22,7 +22,7 @@ inline std::vector<std::uint8_t> hex(std::string_view text) {
   return bytes;
 }
 
-/// Returns a reply that net-snmp sent to request 7 for ActiveIF. The value is 2.
+/// Returns net-snmp's reply to a request for ActiveIF with the identifier 7. The value is 2.
 inline std::vector<std::uint8_t> realReply() {
   return hex(
       "30 30 02 01 00 04 08 63 6f 72 72 69 64 6f 72 a2 21 02 01 07 02 01 00 02 01 00 30 16 30 14 "
@@ -43,9 +43,9 @@ inline std::vector<std::uint8_t> replyWith(std::string_view bindings, std::uint8
   return reply;
 }
 
-/// A request whose `bindings` bindings have the value NULL and the name 1.3.1.1…, and the storage
-/// for a reply. Each name has room for `arcsEach` arcs. All strings share `stringBytes` bytes. The
-/// heap blocks have no spare room, so the sanitizers report an access past the end.
+/// A request, and the storage for a reply. Each of the `bindings` bindings has the name 1.3.1.1…
+/// and the value NULL. Each name has room for `arcsEach` arcs. All strings share `stringBytes`
+/// bytes. The heap blocks have no spare room, so the sanitizers report an access past their end.
 struct Message {
   explicit Message(std::size_t bindings, std::uint16_t arcsEach = 14,
                    std::uint16_t stringBytes = 1500)

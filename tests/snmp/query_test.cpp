@@ -58,7 +58,7 @@ std::string outcome(mib_table* table, const char* address = "192.0.2.1") {
          " " + std::to_string(index);
 }
 
-// Returns the hexadecimal text of a binding named 1.3 with the hexadecimal value `value`.
+// Returns the hexadecimal text of a binding with the name 1.3 and the encoded value `value`.
 std::string binding(const std::string& value) {
   return "30 00 06 01 2B " + value;
 }
@@ -226,8 +226,8 @@ class GetSet : public testing::Test {
 
 TEST_F(GetSet, CopyValuesIntoTheirSlotsAndNeverPastThem) {
   const std::string abc = "30 00 06 01 2B 04 03 61 62 63 ", five = "30 00 06 01 2B 02 01 05 ";
-  // Each row has a name, the reply's bindings, the capacity of the second slot, and the later
-  // contents of the second slot. A refused reply does not change the second slot.
+  // Each row has a name, the reply's bindings, the capacity of the second slot, and the contents of
+  // that slot after the reply. A refused reply does not change the slot.
   const std::tuple<const char*, std::string, std::uint16_t, std::string> cases[] = {
       {"room for the zero", abc + abc + five, 4, std::string("abc\0##", 6)},
       {"no room for the zero", abc + abc + five, 3, "abc##"},

@@ -1,5 +1,5 @@
 """Checks that the documents for makers list exactly the keys, texts, settings, pictures and
-verdicts of the sources. Argument: the program onramp-check."""
+verdicts that the sources have. Argument: the program onramp-check."""
 
 import re
 import subprocess

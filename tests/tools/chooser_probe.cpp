@@ -1,6 +1,6 @@
-// Runs the wizard's own device chooser for SECONDS seconds, with the models MODEL… to search for.
-// Then prints the names of the devices in the chooser's list, one per line. APPLICATION is the path
-// of the wizard's application on the medium.
+// Runs the wizard's own device chooser for SECONDS seconds, and lets it search for the models
+// MODEL…. Then prints the names of the devices in the chooser's list, one per line. APPLICATION is
+// the path of the wizard's application on the medium.
 //
 //   chooser_probe APPLICATION SECONDS MODEL…
 

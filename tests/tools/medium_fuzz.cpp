@@ -1,6 +1,6 @@
 // Replaces one file of the example medium with each input. The input's first byte chooses the file,
-// and the other bytes become its contents. The wizard's records and onramp-check's report must then
-// agree about the models.
+// and the other bytes become its contents. The models that the wizard then reads from the medium
+// must be those that onramp-check reports.
 
 #include <array>
 #include <cstdint>

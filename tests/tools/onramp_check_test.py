@@ -259,7 +259,7 @@ def norwegian(folder):
         (folder / resources / "ko.lproj").rename(folder / resources / f"{name}.lproj")
 
 
-# Breakers that break nothing.
+# Breakers that make the medium unusual but leave it correct.
 HARMLESS = [
     norwegian,
     both(*(remove(f"{TOOL}/Resources/{language}.lproj") for language in ("de", "ja", "ko", "zh_CN"))),

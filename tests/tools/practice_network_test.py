@@ -41,7 +41,7 @@ def run(*command, **options):
 
 
 def browse(service_type):
-    """Returns the services of the type as a dictionary: name → (address, port, set of TXT entries)."""
+    """Returns the services of a type as a dictionary: name → (address, port, set of TXT entries)."""
     output = run("avahi-browse", "-rptk", service_type).stdout
     rows = [line.split(";", 9) for line in output.splitlines() if line.startswith("=")]
     unescape = lambda text: re.sub(rb"\\(\d{3})", lambda match: bytes([int(match[1])]),
@@ -51,7 +51,7 @@ def browse(service_type):
 
 
 class FromInside(unittest.TestCase):
-    """Tests that run inside a practice network with DEVICES. FromOutside starts them."""
+    """These tests run inside a practice network with DEVICES. FromOutside starts them."""
 
     def setUp(self):
         self.network = PracticeNetwork()
