@@ -15,10 +15,6 @@ namespace {
 
 constexpr const char* kNoDevice = "no device is ever found on the network";
 
-Place inResources(const Lists& lists, std::string_view key) {
-  return {.file = lists.resourcesPath, .key = {std::string(key)}};
-}
-
 // Returns whether `type` is "_name._tcp." or "_name._udp." with a name that RFC 6335 section 5.1
 // allows.
 bool isServiceType(std::string_view type) {
@@ -50,7 +46,7 @@ void checkDeclared(const Lists& lists, const std::string& type, Report& report) 
 }
 
 void checkServiceType(const Lists& lists, Report& report) {
-  const Place place = inResources(lists, medium::kBonjourNetwork);
+  const Place place = lists.resourcePlace(medium::kBonjourNetwork);
   const auto type = lists.resources->string(medium::kBonjourNetwork);
   if (!type || type->empty()) {
     // readLists() has already reported a value that is not a string.
@@ -99,7 +95,7 @@ void checkVendor(const Lists& lists, Report& report) {
   if (!written) return;
   const std::string name = medium::vendorName(lists.resources);
   const std::string file = "com." + lowercaseString(name) + ".installpkginfo.plist";
-  Finding finding{.place = inResources(lists, medium::kVenderName),
+  Finding finding{.place = lists.resourcePlace(medium::kVenderName),
                   .effect = "the package does not find the files that the wizard writes for it",
                   .remedy = "write the maker's name in letters, digits and spaces"};
   const auto isControl = [](char c) { return static_cast<unsigned char>(c) < 0x20 || c == 0x7F; };

@@ -217,7 +217,7 @@ std::optional<Dictionary> namedList(const MediumFiles& files, const Lists& lists
   const auto named = lists.resources ? lists.resources->string(key) : std::nullopt;
   if (!named) return std::nullopt;
   path = *named;
-  return files.list(path, {DictionaryPlace{lists.resourcesPath, {}}.of(key), what, effect});
+  return files.list(path, {lists.resourcePlace(key), what, effect});
 }
 
 }  // namespace
@@ -230,9 +230,9 @@ std::vector<std::string> Lists::modelNames() const {
   return containedModels(KSOROSXCD::initWithCDInfoPlist(description, resources));
 }
 
-Place Lists::resourcePlace(std::string_view dictionary, std::string_view key) const {
-  Place place{.file = resourcesPath, .key = {std::string(dictionary)}};
-  if (!key.empty()) place.key.emplace_back(key);
+Place Lists::resourcePlace(std::string_view key, std::string_view inner) const {
+  Place place{.file = resourcesPath, .key = {std::string(key)}};
+  if (!inner.empty()) place.key.emplace_back(inner);
   return place;
 }
 

@@ -39,9 +39,9 @@ struct Lists {
   /// Returns the names of the medium's models in the order in which the wizard shows them.
   [[nodiscard]] std::vector<std::string> modelNames() const;
 
-  /// Returns the place of the resource dictionary's key `dictionary` or, if `key` is given, the
-  /// place of `key` in the dictionary under that key.
-  [[nodiscard]] Place resourcePlace(std::string_view dictionary, std::string_view key = "") const;
+  /// Returns the place of `key` in the resource dictionary or, if `inner` is given, the place of
+  /// `inner` in the dictionary under `key`.
+  [[nodiscard]] Place resourcePlace(std::string_view key, std::string_view inner = "") const;
 
   /// Returns whether any model supports wireless.
   [[nodiscard]] bool anyWireless() const;

@@ -4,6 +4,7 @@
 #include <iterator>
 #include <set>
 #include <system_error>
+#include <utility>
 
 #include "media/KSInstallerInfo.h"
 #include "media/medium.h"
@@ -37,13 +38,16 @@ std::string versionKey(const Version& version) {
 
 class PackageCheck {
  public:
-  PackageCheck(const MediumFiles& files, const Lists& lists)
-      : files_(files), lists_(lists), report_(files.report()), range_(lists) {
+  PackageCheck(const MediumFiles& files, const Lists& lists, Dictionary packages)
+      : files_(files),
+        lists_(lists),
+        packages_(std::move(packages)),
+        report_(files.report()),
+        range_(lists) {
     info_.setCDCommonInfoValue(lists.resources);
   }
 
   void run() {
-    if (!lists_.resources->dictionary(medium::kPkgInfo)) return;
     findPackages();
     checkKeysThatNobodyUses();
   }
@@ -92,18 +96,17 @@ class PackageCheck {
 
   // Returns whether the packages' folder exists. Returns true when the list names no folder.
   [[nodiscard]] bool hasFolder() const {
-    const auto folder = lists_.resources->dictionary(medium::kPkgInfo)->string("PkgLocation");
+    const auto folder = packages_.string("PkgLocation");
     return !folder ||
            files_.exists(*folder, {lists_.resourcePlace(medium::kPkgInfo, "PkgLocation"),
                                    "the packages' folder", "the window closes and nothing opens"});
   }
 
   void checkPackage(const Row& row) {
-    const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
-    const std::string key = package.find("PkgName") ? "PkgName" : versionKey(row.from);
+    const std::string key = packages_.find("PkgName") ? "PkgName" : versionKey(row.from);
     const std::string effect =
         "the window closes and nothing opens; systems: " + range_.words(row.from, row.to);
-    if (package.string(key) == "") {
+    if (packages_.string(key) == "") {
       report_.findings.push_back({.id = "package-unnamed",
                                   .place = lists_.resourcePlace(medium::kPkgInfo, key),
                                   .found = "an empty name",
@@ -119,7 +122,7 @@ class PackageCheck {
       return;
     }
     // readLists() has already reported a value of the wrong kind and a missing "PkgLocation".
-    if (package.find(key) || !package.string("PkgLocation")) return;
+    if (packages_.find(key) || !packages_.string("PkgLocation")) return;
     report_.findings.push_back(
         {.id = "package-none",
          .place = lists_.resourcePlace(medium::kPkgInfo),
@@ -141,13 +144,12 @@ class PackageCheck {
   }
 
   void checkKeysThatNobodyUses() {
-    const Dictionary package = *lists_.resources->dictionary(medium::kPkgInfo);
     std::string shadowed;
-    for (const auto& [key, value] : package) {
+    for (const auto& [key, value] : packages_) {
       if (!isVersionNumber(key)) continue;
       if (!knownKeys_.contains(key)) {
         neverUsed(key);
-      } else if (package.find("PkgName")) {
+      } else if (packages_.find("PkgName")) {
         shadowed += (shadowed.empty() ? "" : ", ") + quoted(key);
       } else if (!usedKeys_.contains(key)) {
         unsupported(key);
@@ -159,7 +161,7 @@ class PackageCheck {
          .place = lists_.resourcePlace(medium::kPkgInfo, "PkgName"),
          .found = "\"PkgName\" beside " + shadowed,
          .expected = "either \"PkgName\" or packages by version",
-         .effect = "every system gets " + quoted(package.string("PkgName").value_or("")),
+         .effect = "every system gets " + quoted(packages_.string("PkgName").value_or("")),
          .remedy = "remove \"PkgName\", or the keys that it takes precedence over"});
   }
 
@@ -170,7 +172,7 @@ class PackageCheck {
          .found = "a key that no system uses",
          .expected = "\"104\" to \"109\"",
          .effect = "10.9 and every later system get the package that \"109\" names",
-         .remedy = lists_.resources->dictionary(medium::kPkgInfo)->find("109")
+         .remedy = packages_.find("109")
                        ? "remove the key; a distribution package can choose by the system's version"
                        : "move the name to \"109\", or remove the key"});
   }
@@ -198,6 +200,7 @@ class PackageCheck {
 
   const MediumFiles& files_;
   const Lists& lists_;
+  const Dictionary packages_;  ///< the dictionary under "PkgInfo"
   Report& report_;
   SupportedRange range_;
   KSInstallerInfo info_;
@@ -210,7 +213,9 @@ class PackageCheck {
 }  // namespace
 
 void checkPackages(const MediumFiles& files, const Lists& lists) {
-  if (lists.resources) PackageCheck(files, lists).run();
+  if (!lists.resources) return;
+  if (const auto packages = lists.resources->dictionary(medium::kPkgInfo))
+    PackageCheck(files, lists, *packages).run();
 }
 
 }  // namespace onramp::check

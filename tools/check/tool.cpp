@@ -124,7 +124,7 @@ void checkTool(const MediumFiles& files, const Lists& lists) {
   constexpr const char* kEffect =
       "when no wireless device is found, no set-up tool runs; the search begins again instead";
   const Dictionary resources = lists.resources.value_or(Dictionary());
-  const Place place{.file = lists.resourcesPath, .key = {std::string(medium::kWLANtool)}};
+  const Place place = lists.resourcePlace(medium::kWLANtool);
   const auto relative = resources.string(medium::kWLANtool);
   if (!relative) {
     if (!lists.resources || resources.find(medium::kWLANtool) || !lists.anyWireless()) return;
