@@ -41,7 +41,7 @@ class Bundle {
   /// - the resources folder itself;
   /// - the folder for the user's most preferred language among those that the bundle offers;
   /// - the folder for the bundle's development language;
-  /// - if neither exists, the English folder;
+  /// - if the bundle has neither of these two language folders, the English folder;
   /// - if there is no English folder either, the folder for any language that the bundle offers.
   /// Returns nothing when none of these folders holds the file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,

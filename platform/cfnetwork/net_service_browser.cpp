@@ -96,8 +96,8 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
 
   // Adds a sighting of the service if `isSeen` is true, and removes one otherwise. The framework
   // may report a service once for each network interface, with a different object each time.
-  // Returns the object of the first sighting when this call has added the first sighting or removed
-  // the last one. Returns null otherwise.
+  // If this call adds the service's first sighting or removes its last one, returns the object with
+  // which the service was first reported. Returns null otherwise.
   NetServiceRef count(const NetServiceRef& service, bool isSeen) {
     const auto known = std::find_if(found_.begin(), found_.end(), [&](const Found& found) {
       return found.service->name() == service->name() && found.service->type() == service->type() &&

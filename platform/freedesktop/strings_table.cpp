@@ -57,7 +57,8 @@ class Parser {
       refuse(braces ? "text after the closing \"}\"" : "a \"}\" without a \"{\"", at());
     }
     if (!problem_.reason.empty()) return std::nullopt;
-    std::reverse(pairs.begin(), pairs.end());  // the dictionary keeps the first pair of each key
+    // The last pair of a key in the file must win, but a dictionary keeps the first one.
+    std::reverse(pairs.begin(), pairs.end());
     return Dictionary(std::move(pairs));
   }
 

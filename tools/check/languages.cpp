@@ -48,7 +48,7 @@ std::vector<std::string_view> partsOf(std::string_view name) {
 
 // Returns whether `name` is a code of two or three letters, then perhaps a script of four letters,
 // then perhaps a region of two letters or three digits, then perhaps variants such as "valencia" or
-// "1996". Returns true also for one longer word, because old media have English names, such
+// "1996". Also returns true for a single longer word, because old media have English names, such
 // as "German".
 bool hasFormOfLanguage(std::string_view name) {
   const std::vector<std::string_view> parts = partsOf(name);

@@ -59,8 +59,8 @@ bool isInside(const std::string& path, const std::string& root) {
                       realRoot.end();
 }
 
-// Returns the line of the strings table at `path` that begins with `key` in quotation marks.
-// Returns nothing when there is no such line.
+// Returns the number of the first line in the strings table at `path` that begins with `key` in
+// quotation marks, after any spaces and tabs. Returns nothing when there is no such line.
 std::optional<std::size_t> lineOfString(const std::string& path, const std::string& key) {
   const auto bytes = posix::readFile(path, kMostPropertyListBytes);
   std::istringstream text(bytes ? decodedText(*bytes).value_or("") : "");
@@ -74,7 +74,7 @@ std::optional<std::size_t> lineOfString(const std::string& path, const std::stri
 
 // Returns the path of the only file or folder in `root` that is named `name`, relative to `root`.
 // Returns nothing if there is no such path, if there are several, or if `root` has so many files
-// that the search would take long.
+// that the search would take too long.
 std::optional<std::string> onlyPathOf(const std::string& name, const std::string& root) {
   constexpr int kMostFiles = 10'000;
   std::optional<std::string> only;

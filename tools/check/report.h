@@ -48,7 +48,7 @@ struct Report {
   /// Returns the number of findings with this severity.
   [[nodiscard]] std::size_t count(Severity severity) const;
 
-  /// Returns whether a finding says that a key of the file was probably meant to be `key`.
+  /// Returns whether a finding suggests that a misspelt key in `file` should be `key`.
   [[nodiscard]] bool hasMisspelt(std::string_view file, std::string_view key) const;
 };
 

@@ -172,8 +172,8 @@ void writeTexts(std::ostream& out) {
     } else {
       out << '-' << "    ";
     }
-    out << (text.hasFallback ? "  English  " : "  key      ")
-        << (text.mostPlaceholders > 0 ? "%@ once or twice, " : "") << text.where << '\n';
+    out << (text.hasFallback ? "  English  " : "  key      ") << text.where
+        << (text.mostPlaceholders > 0 ? "; %@ once or twice" : "") << '\n';
   }
 }
 

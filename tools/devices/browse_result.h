@@ -32,7 +32,8 @@ struct BrowseResult {
   std::vector<Verdict> network{};       ///< problems of the network as a whole
 };
 
-/// Returns whether the wizard's first search misses a device that passes every check.
+/// Returns whether `device` has the note "missed": it passes every check, but the wizard's first
+/// search misses it.
 [[nodiscard]] bool isMissed(const JudgedDevice& device);
 
 /// Sets the delay that each device would cause in the wizard's first search, and adds the note

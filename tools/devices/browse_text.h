@@ -35,7 +35,8 @@ struct TextStyle {
 /// request or reply without bytes is left out.
 [[nodiscard]] std::string packetsOf(const Exchange& exchange, std::size_t indent);
 
-/// Returns an exchange as one line without a line feed, such as "127.0.1.5: 2 after 0.4 ms".
+/// Returns an exchange as one line without a line feed: the address, the value or what went wrong,
+/// and the duration, such as "127.0.1.5: 2 after 0.4 ms".
 [[nodiscard]] std::string exchangeLine(const Exchange& exchange);
 
 }  // namespace onramp::devices

@@ -40,7 +40,8 @@ def why_not_enclosed():
 
 
 def enclose(options):
-    """Runs the network and the command in new namespaces. Returns the command's exit status."""
+    """Runs the network and the command in new namespaces. Returns the tool's exit status, which is
+    the command's unless the network fails or a signal ends the tool."""
     # Ctrl-C is meant for the command, which also receives SIGINT from the terminal. SIGTERM and
     # SIGHUP stop everything.
     signal.signal(signal.SIGINT, lambda *_: None)
