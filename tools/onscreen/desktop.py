@@ -109,7 +109,7 @@ class Desktop:
         """Saves a picture of the windows on the screen, without the empty desktop around them."""
         path.parent.mkdir(parents=True, exist_ok=True)
         self.run(["import", "-silent", "-window", "root", str(path)])
-        self.run(["mogrify", "-bordercolor", "black", "-border", "1", "-trim", "+repage",
+        self.run(["mogrify", "-bordercolor", "white", "-border", "1", "-trim", "+repage",
                   str(path)])
 
     def _make_home(self):
@@ -149,7 +149,7 @@ class Desktop:
     def _start_display(self):
         display = self._start(
             ["Xvfb", f":{_free_display()}", "-displayfd", "1", "-screen", "0", f"{self._size}x24",
-             "-noreset", "-nolisten", "tcp"],
+             "-noreset", "-wr", "-nolisten", "tcp"],
             stdout=subprocess.PIPE, text=True)
         number = display.stdout.readline().strip()
         if not number:
