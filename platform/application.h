@@ -36,16 +36,17 @@ class ApplicationDelegate : public InterfaceOwner {
 
 /// Creates the controller with `makeDelegate`, loads the interface file `mainInterfaceName` for the
 /// controller, and runs the main loop until the application terminates. Returns the process's exit
-/// status. If the interface file cannot be loaded, prints a message that names the file; the exit
-/// status is then 1. On some systems, the process exits inside this function when the application
+/// status. If the interface file cannot be loaded, prints a message that names the file; the result
+/// is then 1. On some systems, the process exits inside this function when the application
 /// terminates. With Qt, the process also exits inside this function when there is no display, and
 /// after an invalid option, --help or --version.
 int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
-/// Terminates the application. The main loop and any modal loop stop, and no more timers, posted
-/// actions or events are handled. On some systems, the process exits inside this function. On other
-/// systems, the function returns, and the caller must then return without doing anything else.
+/// Terminates the application. The main loop and any modal loop stop, and no more timers, events or
+/// actions of performOnMainThread() are handled. On some systems, the process exits inside this
+/// function. On other systems, the function returns, and the caller must then return without doing
+/// anything else.
 void terminateApplication();
 
 /// hideApplication() hides all windows, and unhideApplication() shows them again. Do not call

@@ -42,14 +42,15 @@ class Bundle {
   /// - the folder for the user's most preferred language among those that the bundle offers;
   /// - the folder for the bundle's development language;
   /// - if the bundle has neither of these two language folders, the English folder;
-  /// - if there is no English folder either, the folder for any language that the bundle offers.
+  /// - if there is no English folder either, one of the bundle's other language folders.
   /// Returns nothing when none of these folders holds the file.
   [[nodiscard]] std::optional<std::string> pathForResource(const std::string& name,
                                                            const std::string& type) const;
 
   /// Returns the path of the bundle's executable. Returns nothing when the information dictionary
-  /// names no executable. If the named file does not exist, some backends return the path where it
-  /// should be, and others return nothing.
+  /// names no executable and, on macOS, no executable has the bundle's name. If the file that the
+  /// dictionary names does not exist, some backends return the path where it should be, and others
+  /// return nothing.
   [[nodiscard]] std::optional<std::string> executablePath() const;
 
   /// Returns the string under `key` in the string table `table`, or in "Localizable" if `table` is

@@ -48,9 +48,9 @@ class DatagramSocket {
   /// Allows sendTo() to send to broadcast addresses. Returns false when the system refuses.
   [[nodiscard]] bool permitBroadcast();
 
-  /// Asks the system for a buffer of this many bytes for datagrams that receive() has not fetched
-  /// yet. The system may provide a smaller buffer, and its overhead for each datagram also takes
-  /// space in the buffer.
+  /// Asks the system for a buffer of `bytes` bytes for datagrams that receive() has not fetched
+  /// yet. The system may provide a smaller buffer, and also stores its own data about each datagram
+  /// in the buffer.
   void setReceiveBufferSize(std::size_t bytes);
 
   /// waitWritable() waits until the socket can send a datagram or has an error to report.

@@ -16,13 +16,13 @@
 /// uses that framework. The backend for Linux obtains the entries described below from the kernel.
 ///
 /// Callers can rely on two kinds of entries, both in the domain kSCDynamicStoreDomainState:
-/// - the IPv4 entity of an interface. It exists for every interface that is up, is ready for
+/// - The IPv4 entity of an interface. It exists for every interface that is up, is ready for
 ///   traffic (connected and, where required, authenticated) and has an IPv4 address. This includes
 ///   the loopback interface. The arrays kSCPropNetIPv4Addresses and kSCPropNetIPv4SubnetMasks hold
 ///   one string in dotted form for each address, in the system's order. The array
 ///   kSCPropNetIPv4BroadcastAddresses holds the broadcast addresses that are set, and is absent
-///   when none is set;
-/// - the global IPv4 entity, which exists while there is a usable default route. Its string
+///   when none is set.
+/// - The global IPv4 entity. It exists while there is a usable default route. Its string
 ///   kSCDynamicStorePropNetPrimaryInterface names the interface of the preferred default route.
 namespace onramp {
 
@@ -42,13 +42,14 @@ inline constexpr int kSCStatusInvalidArgument = 1002;
 inline constexpr int kSCStatusNoStoreSession = 2001;
 
 /// A session with the store. The linked backend defines this type. A function that is called with a
-/// null session fails with kSCStatusNoStoreSession. Only one thread at a time may use a session,
-/// and only the main thread may use a session that has a callback.
+/// null session fails with kSCStatusNoStoreSession, except that on macOS, copyMultiple() then uses
+/// a temporary session. Only one thread at a time may use a session, and only the main thread may
+/// use a session that has a callback.
 struct DynamicStore;
 using DynamicStoreRef = std::shared_ptr<DynamicStore>;
 
-/// Delivers a session's change notifications once addSourceToMainLoop() has added the source to the
-/// run loop. A source keeps its session alive.
+/// Delivers a session's change notifications once addSourceToMainLoop() has added this source to
+/// the main run loop. A source keeps its session alive.
 struct DynamicStoreSource;
 using DynamicStoreSourceRef = std::shared_ptr<DynamicStoreSource>;
 
@@ -56,7 +57,8 @@ using DynamicStoreCallback = std::function<void(const std::vector<std::string>& 
 
 /// Creates a session. The system uses `name` only for diagnostics. `callback` is called on the main
 /// thread with the keys that setNotificationKeys() has selected and whose values have changed. The
-/// calls begin when the session's source is on the run loop. Returns null on failure.
+/// calls begin when the session's source has been added to the main run loop. Returns null on
+/// failure.
 [[nodiscard]] DynamicStoreRef createDynamicStore(const std::string& name,
                                                  DynamicStoreCallback callback = nullptr);
 

@@ -10,7 +10,7 @@ enum class FolderDomain {
 };
 
 /// Returns the absolute path of the domain's application-support folder, without a trailing "/".
-/// Tries to create the folder if it does not exist, but does not report a failure to do so. On
+/// If the folder does not exist, tries to create it, but does not report a failure to do so. On
 /// macOS, returns an empty string when the system names no folder for the domain.
 [[nodiscard]] std::string applicationSupportFolder(FolderDomain domain);
 

@@ -9,7 +9,7 @@
 
 namespace onramp {
 
-/// The owner of an interface file, which describes windows and views. The file binds titles to
+/// The owner of an interface file. Such a file describes windows and views. It binds titles to
 /// texts of its owner, and names the action that the owner performs when the user clicks a button.
 /// The owner must outlive all objects that are created from the file.
 class InterfaceOwner {
@@ -50,9 +50,9 @@ class Interface {
   /// empty string when there is no view or the file gives the view no class.
   [[nodiscard]] std::string viewClass() const;
 
-  /// Returns a handle to the object that the file calls `name`. Returns an empty handle when no
-  /// object has that name or the object is not of the handle's kind. On macOS, finds no menus, no
-  /// menu items, and no windows except the one called "window".
+  /// Returns a handle to the object that has the handle's kind and that the file calls `name`.
+  /// Returns an empty handle when there is no such object. With Cocoa, finds no menus, no menu
+  /// items, and no windows except the one called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

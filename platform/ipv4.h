@@ -15,8 +15,8 @@ struct IPv4Address {
 
 /// Reads `text` as inet_aton does. An address has one to four parts with dots between them. Each
 /// part is decimal, octal (with a leading 0) or hexadecimal (with a leading 0x). The last part
-/// fills the remaining bytes, so "10.1" means 10.0.0.1. White space may follow the address, and
-/// everything after it is ignored, so "10.0.0.1 x" is valid. Returns nothing for any other string,
+/// fills the remaining bytes, so "10.1" means 10.0.0.1. If white space follows the address, the
+/// rest of `text` is ignored, so "10.0.0.1 x" is valid. Returns nothing for any other string,
 /// including the empty string.
 [[nodiscard]] std::optional<IPv4Address> parseIPv4(const std::string& text);
 

@@ -28,7 +28,7 @@ inline constexpr std::int32_t kNetServiceErrorTimeout = -72007;
 
 // The flags that a NetServiceBrowser passes to its client.
 
-/// The client will be called again at once. Only the backend for macOS sets this flag.
+/// More calls of the client may follow at once. Only the backend for macOS sets this flag.
 inline constexpr unsigned long kNetServiceFlagMoreComing = 1;
 /// The service is gone. Without this flag, the service has been found.
 inline constexpr unsigned long kNetServiceFlagRemove = 8;
@@ -40,10 +40,11 @@ class NetServiceBrowser {
  public:
   /// Called when a service is found and when it is gone. Both calls pass the same `service`. A
   /// service is identified by its name, type and domain. It is found when it first appears on any
-  /// network interface and protocol, and gone when it has disappeared from all of them. When a
-  /// running search fails, all its services are reported as gone, and the search restarts
-  /// automatically. Some backends report the failure in one more call, with a null `service` and an
-  /// `error` whose code is not 0. The client may call invalidate() or destroy the browser.
+  /// network interface and protocol, and gone when it has disappeared from all of them or the
+  /// search stops covering its domain. When a running search fails, all its services are reported
+  /// as gone, and the search restarts automatically. Some backends report the failure in one more
+  /// call, with a null `service` and an `error` whose code is not 0. The client may call
+  /// invalidate() or destroy the browser.
   using Client = void (*)(const NetServiceBrowserRef& browser, unsigned long flags,
                           const NetServiceRef& service, const NetServiceError& error, void* info);
 
@@ -61,11 +62,11 @@ class NetServiceBrowser {
   virtual void unschedule() = 0;
 
   /// Starts a search for services of this `type`, such as "_ipp._tcp.", in `domain`, such as
-  /// "local.". An empty `domain` means "local." and all other domains that the computer is
-  /// configured to browse. Returns false when the search cannot start, for example because this
-  /// browser is already searching. A search can start even if the responder is not running, and
-  /// finds services once the responder runs. When the responder restarts, the search restarts
-  /// automatically.
+  /// "local.". An empty `domain` means "local." and all other domains that the computer or its
+  /// network recommends for browsing (RFC 6763 section 11). Returns false when the search cannot
+  /// start, for example because this browser is already searching. A search can start even if the
+  /// responder is not running, and finds services once the responder runs. When the responder
+  /// restarts, the search restarts automatically.
   virtual bool searchForServices(const std::string& domain, const std::string& type) = 0;
 
   /// Stops the browser for good. The client is not called again.

@@ -120,7 +120,7 @@ struct Image {
 
 enum class ImageScaling {
   kProportionallyDown,  ///< shown in the image's size, or scaled down to fit the view
-  kAxesIndependently,   ///< stretched to fill the view
+  kAxesIndependently,   ///< stretched to fill the view; Qt hides it in a dark colour scheme
 };
 
 class ImageView : public View {
@@ -128,7 +128,7 @@ class ImageView : public View {
   static constexpr OutletKind kKind = OutletKind::kImageView;
   using View::View;
 
-  /// Shows `image`, or leaves the view blank when its file is missing or is not an image.
+  /// Shows `image`, or leaves the view blank when the file is missing or is not an image.
   void setImage(const Image& image) const;
   void setImageScaling(ImageScaling scaling) const;
 };
@@ -190,15 +190,15 @@ class Window : public Outlet {
   static constexpr OutletKind kKind = OutletKind::kWindow;
   using Outlet::Outlet;
 
-  /// Shows or hides the window's resize handle, if the system's windows have one. With Qt, hiding
-  /// it also prevents the user from resizing the window.
+  /// Shows or hides the window's resize handle, if the system's windows have one. With Qt, a call
+  /// with false prevents the user from resizing the window, and a call with true does nothing.
   void setShowsResizeIndicator(bool shows) const;
 
   /// Centres the window on its screen.
   void center() const;
   /// Makes this the window that receives what the user types.
   void makeKeyWindow() const;
-  /// Shows the window, if it is hidden, and puts it in front of other windows.
+  /// Shows the window, if it is hidden, and puts it in front of the application's other windows.
   void orderFront() const;
   /// Does what orderFront() and makeKeyWindow() do.
   void makeKeyAndOrderFront() const;

@@ -29,14 +29,14 @@ inline constexpr std::size_t kMostPropertyListDepth = 128;
 /// is absent, unreadable or malformed, holds something other than a dictionary, or exceeds a limit.
 [[nodiscard]] std::optional<Dictionary> loadDictionary(const std::string& path);
 
-/// Writes `dictionary` to `path` as an XML property list. The write is atomic: the data goes to a
-/// temporary file in the same folder, which is then renamed to `path`. Returns false on failure,
-/// for example when the folder is missing. An existing file at `path` is then unchanged. Backends
-/// differ in their treatment of characters that XML does not allow.
+/// Writes `dictionary` to `path` as an XML property list. The write is atomic: it creates a
+/// temporary file in the same folder, and then renames the file to `path`. Returns false on
+/// failure, for example when the folder is missing. An existing file at `path` is then unchanged.
+/// Backends differ in their treatment of characters that XML does not allow.
 bool writeDictionaryAtomically(const Dictionary& dictionary, const std::string& path);
 
-/// Removes the file at `path`, or the folder and its contents. Also removes the temporary files of
-/// processes that were killed while writing to `path`. Ignores failures.
+/// Removes the file at `path`, or the folder at `path` with its contents. Also removes the
+/// temporary files of processes that were killed while writing to `path`. Ignores failures.
 void removeDictionary(const std::string& path);
 
 }  // namespace onramp

@@ -6,9 +6,9 @@
 
 namespace onramp {
 
-/// Returns the version of macOS, such as "10.15.7". With the backend standin, this is the version
-/// that the program assumes instead of the running one. Returns nothing when the system does not
-/// report its version.
+/// Returns the version of macOS, such as "10.15.7". With the backend standin, the program assumes
+/// this version, whatever system it runs on. Returns nothing when the system does not report its
+/// version.
 [[nodiscard]] std::optional<std::string> productVersion();
 
 /// Returns the same version in binary-coded decimal, in the format that Gestalt() of macOS uses for

@@ -145,7 +145,7 @@ void Daemon::arrived() {
   }
 }
 
-// A query's handler may destroy other queries, which removes them from `queries_`. The loop
+// A query's handler may destroy other queries, which removes them from `queries_`. This function
 // therefore iterates over a copy and skips the removed queries.
 void Daemon::lost() {
   isPresent_ = false;

@@ -22,7 +22,7 @@ class Query;
 /// explains how the parts of this backend work together.
 class Daemon {
  public:
-  /// Returns the connection that all callers share, or creates it if there is none. The connection
+  /// Returns the connection that all callers share. If there is none, creates it. The connection
   /// runs on the main loop. Returns null when the system provides no descriptor or thread.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 

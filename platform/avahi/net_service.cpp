@@ -62,7 +62,7 @@ class Service final : public NetService, public std::enable_shared_from_this<Ser
   Client client_ = nullptr;
   void* info_ = nullptr;
   bool isScheduled_ = false;
-  std::shared_ptr<Daemon> daemon_;  ///< held while a resolve runs
+  std::shared_ptr<Daemon> daemon_;  ///< held while a resolve with a client runs
   std::unique_ptr<Resolve> resolve_;
   // The number of the newest resolve. A late report from an earlier resolve is ignored.
   unsigned long resolves_ = 0;

@@ -54,7 +54,7 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   Client client_;
   void* info_;
   bool isScheduled_ = false;
-  unsigned long search_ = 0;  ///< the search's number; events of earlier searches are ignored
+  unsigned long search_ = 0;  ///< this search's number; events of earlier searches are ignored
   std::string type_;
   /// The services that have been found. When a service is gone, the client gets the same object as
   /// when it was found.
@@ -65,8 +65,8 @@ class Browser final : public NetServiceBrowser, public std::enable_shared_from_t
   std::unique_ptr<Query> domainQuery_;
 };
 
-// If `domain` is empty, a DomainBrowser query finds the domains that the computer or the network is
-// configured to browse. The query never reports the local domain, so that domain is always browsed.
+// If `domain` is empty, a DomainBrowser query finds the domains that the computer or its network
+// recommends for browsing. The query never reports the local domain, so this function adds it.
 bool Browser::searchForServices(const std::string& domain, const std::string& type) {
   if (!client_ || daemon_) return false;
   daemon_ = Daemon::shared();

@@ -13,10 +13,10 @@ namespace onramp::avahi {
 inline constexpr int kAnyInterface = -1;
 inline constexpr int kAnyProtocol = -1;
 
-/// A request to the daemon, which stays active as long as this object exists. For each request,
-/// the daemon holds an object: a browser or a resolver. Queries create these objects with the
-/// *Prepare methods of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms before it
-/// starts an object that was created with an older method.)
+/// A request that stays active in the daemon as long as the Query exists. For each request, the
+/// daemon holds an object: a browser or a resolver. Queries create these objects with the *Prepare
+/// methods of version 0.8 of Avahi's D-Bus interface. (The daemon waits 10 ms before it starts an
+/// object that was created with an older method.)
 class Query {
  public:
   enum class Event {

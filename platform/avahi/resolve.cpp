@@ -71,7 +71,8 @@ void Resolve::begin() {
   service_.emplace(
       daemon_, "ServiceResolver",
       [this](sd_bus_message* call) {
-        // If the name were empty, the daemon would look up the type itself instead of a service.
+        // For an empty name, the daemon would look up the type itself instead of a service. For an
+        // empty domain, it would use its own default domain.
         if (instance_.name.empty() || instance_.domain.empty()) return -EINVAL;
         return sd_bus_message_append(call, "iisssiu", kAnyInterface, kAnyProtocol,
                                      instance_.name.c_str(), instance_.type.c_str(),

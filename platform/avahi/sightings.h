@@ -11,8 +11,8 @@ namespace onramp::avahi {
 /// The daemon's numbers for the interface and the protocol on which a service or domain is seen.
 using Place = std::pair<std::int32_t, std::int32_t>;
 
-/// Keeps track of the interfaces and protocols on which each thing (a service or a domain) is seen.
-/// A thing is present from its first sighting until its last sighting is removed.
+/// Keeps track of sightings: the interfaces and protocols on which each thing (a service or a
+/// domain) is seen. A thing is present from its first sighting until its last sighting is removed.
 template <typename Thing>
 class Sightings {
  public:

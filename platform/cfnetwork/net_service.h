@@ -6,8 +6,8 @@
 
 namespace onramp::cfnetwork {
 
-/// Returns the existing handle for `service`, or creates one, which retains `service`. Returns null
-/// when `service` is null. Main thread only.
+/// Returns the handle for `service`. If there is none yet, creates one, which retains `service`.
+/// Returns null when `service` is null. Main thread only.
 [[nodiscard]] NetServiceRef handleOf(CFNetServiceRef service);
 
 }  // namespace onramp::cfnetwork

@@ -150,7 +150,7 @@ class CFBrowser final : public NetServiceBrowser, public std::enable_shared_from
   Reference<CFStringRef> domain_;  ///< null while there is no search
   Reference<CFStringRef> type_;
   std::vector<Found> found_;
-  unsigned long search_ = 0;  ///< the search's number; earlier searches are not retried
+  unsigned long search_ = 0;  ///< this search's number; earlier searches are not retried
   bool isFailed_ = false;     ///< a retry is pending
 };
 

@@ -13,18 +13,18 @@ namespace onramp::netlink {
 /// changed. It does not say what has changed, so the caller must ask the kernel for the new state.
 class ChangeWatch {
  public:
-  /// Creates a watch, which notices all changes from this call on. It notices route changes only if
-  /// `withRoutes` is true. Returns null on failure.
+  /// Creates a watch that notices changes from this call on, but route changes only if `withRoutes`
+  /// is true. Returns null on failure.
   [[nodiscard]] static std::unique_ptr<ChangeWatch> create(bool withRoutes);
 
   ChangeWatch(const ChangeWatch&) = delete;
   ChangeWatch& operator=(const ChangeWatch&) = delete;
   ~ChangeWatch();
 
-  /// Starts a thread that calls `changed` after every burst of changes, and once for the changes
-  /// since the watch was created. The destructor stops the calls and waits for a running call to
-  /// return. If the socket to the kernel fails, the calls stop for good without a report. Returns
-  /// false when the system provides no thread. Must not be called twice.
+  /// Starts a thread that calls `changed` after every burst of changes. Changes since create() also
+  /// count. The destructor stops the calls and waits for a running call to return. If the socket to
+  /// the kernel fails, the calls stop for good without a report. Returns false when the system
+  /// provides no thread. Must not be called twice.
   [[nodiscard]] bool start(std::function<void()> changed);
 
  private:

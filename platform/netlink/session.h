@@ -20,7 +20,7 @@ namespace netlink {
 /// The keys that a request to the store selects.
 class Selection {
  public:
-  /// Selects nothing.
+  /// Creates an empty selection.
   Selection() = default;
 
   /// Creates the selection that copyMultiple() in platform/dynamic_store.h describes. Returns
@@ -60,8 +60,9 @@ struct DynamicStore {
   DynamicStoreCallback callback;
   netlink::Selection notified;
   Dictionary known;                      ///< the entries that `notified` selects, as last read
-  std::function<void()> changesArrived;  ///< empty until the session's source is on the loop
-  std::unique_ptr<netlink::ChangeWatch> watch;  ///< null until setNotificationKeys()
+  std::function<void()> changesArrived;  ///< empty until addSourceToMainLoop()
+  /// Null before setNotificationKeys(), and after startWatch() has failed.
+  std::unique_ptr<netlink::ChangeWatch> watch;
 
   /// Calls `callback` with the keys in `notified` whose values have changed, if there are any.
   void tellChanges();

@@ -21,8 +21,8 @@ namespace {
 namespace fs = std::filesystem;
 
 // Returns ".NAME.", with which the names of all temporary files for `path` begin. A full name is
-// ".NAME.PROCESS-NUMBER", where PROCESS is a process ID. NAME is cut short so that the full name
-// has at most 255 bytes, the usual limit on file names.
+// ".NAME.PROCESS-NUMBER", where NAME is the file name in `path`, and PROCESS is a process ID. NAME
+// is cut short so that the full name has at most 255 bytes, the usual limit on file names.
 std::string temporaryStem(const fs::path& path) {
   constexpr std::size_t kMostNameBytes = 200;
   return "." + path.filename().string().substr(0, kMostNameBytes) + ".";

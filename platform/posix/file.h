@@ -16,8 +16,8 @@ namespace onramp::posix {
 /// and an existing file at `path` is unchanged.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
 
-/// Removes the file at `path`, or the folder and its contents. Also removes the temporary files
-/// left behind by processes that were killed while writing `path`. Ignores failures.
+/// Removes the file at `path`, or the folder at `path` with its contents. Also removes the
+/// temporary files of processes that were killed while writing to `path`. Ignores failures.
 void removeWithTemporaries(const std::string& path);
 
 }  // namespace onramp::posix

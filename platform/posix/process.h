@@ -10,7 +10,7 @@ namespace onramp {
 
 enum class Session {
   kOwn,  ///< a new session, so that the started program survives when the caller's terminal closes
-  kShared,  ///< the caller's session, so that the program may be killed when the terminal closes
+  kShared,  ///< the caller's session; the program may be killed when the terminal closes
 };
 
 /// Starts the program at `executable` with `arguments`. The program starts with no signal blocked

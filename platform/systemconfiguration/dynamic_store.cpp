@@ -35,8 +35,8 @@ void changed(SCDynamicStoreRef, CFArrayRef changedKeys, void* callback) {
   (*static_cast<const DynamicStoreCallback*>(callback))(keys);
 }
 
-// The framework calls this function when it creates a session. The session owns the copy, and the
-// framework calls releaseCallback() when it destroys the session.
+// The framework calls this function when it creates a session. The session owns the returned copy,
+// and the framework calls releaseCallback() when it destroys the session.
 const void* copyCallback(const void* callback) {
   return std::make_unique<DynamicStoreCallback>(*static_cast<const DynamicStoreCallback*>(callback))
       .release();
