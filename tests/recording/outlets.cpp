@@ -105,7 +105,7 @@ std::size_t PopUpButton::numberOfItems() const {
 
 void PopUpButton::removeItem(std::size_t index) const {
   auto& items = object(*this).items;
-  items.erase(items.begin() + static_cast<std::ptrdiff_t>(index));
+  if (index < items.size()) items.erase(items.begin() + static_cast<std::ptrdiff_t>(index));
 }
 
 void PopUpButton::addItem(const std::string& title, std::function<void()> action) const {
