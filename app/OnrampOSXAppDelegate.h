@@ -135,9 +135,9 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   /// Each of these functions compares the running system's version with one bound of the range that
   /// the medium supports. supportedOSMaxCheck() returns kNewerThanMaximum if isNewerThan() returns
-  /// true. supportedOSMinCheck() returns kOlderThanMinimum if isOlderThan() returns true. In all
-  /// other cases, both return kSupported. Unlike installationCheck(), they do not skip a bound
-  /// whose "Major" is 0.
+  /// true. supportedOSMinCheck() returns kOlderThanMinimum if isOlderThan() returns true.
+  /// Otherwise, each function returns kSupported. Unlike installationCheck(), they do not skip a
+  /// bound whose "Major" is 0.
   [[nodiscard]] SystemSupport supportedOSMaxCheck() const;
   [[nodiscard]] SystemSupport supportedOSMinCheck() const;
 
@@ -168,8 +168,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// file's folder if it is missing. Ignores failures.
   [[nodiscard]] static std::string instmodelPlistURL();
 
-  /// Writes the package-options file. It holds the options under "InstallPKG" in the medium
-  /// description, and the five standard options that docs/mastering-a-medium.md describes. Ignores
+  /// Writes the package-options file. It holds the options that the medium description has under
+  /// "InstallPKG", and the five standard options that docs/mastering-a-medium.md describes. Ignores
   /// failures.
   static void copyCDInfo();
 
@@ -197,11 +197,11 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// launchWLANToolManually() when the user asks for the wireless set-up tool. Both hide the wizard
   /// and return. The tool runs half a second later. When the tool has exited, the wizard acts on
   /// the exit status:
-  /// - 1: The wizard reappears. If the tool was started automatically, it shows the connection page
-  ///   with the wireless choice selected.
+  /// - 1: The wizard reappears. If the tool was started automatically, the wizard then shows the
+  ///   connection page with the wireless choice selected.
   /// - 2: The wizard terminates.
-  /// - Any other status, or the tool cannot be run: The wizard reappears, shows the chooser and
-  ///   searches.
+  /// - Any other status, or none because the tool could not be run or was killed: The wizard
+  ///   reappears, shows the chooser and searches.
   void launchWLANToolAutomatically();
   void launchWLANToolManually();
 
@@ -215,14 +215,15 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
 
   // search_wait.cpp: the wait for the device search.
 
-  /// Waits in a modal loop for up to kMostPauses pauses of length `pause`. Skips the remaining
-  /// pauses as soon as a pause ends and the chooser lists a device. Ends the search after the wait.
+  /// Waits in a modal loop for up to kMostPauses pauses of length `pause`. If the chooser lists a
+  /// device at the end of a pause, skips the remaining pauses. Ends the search after the wait.
   /// During the wait, the user can neither click a button nor close the window, and `page` shows
   /// its spinner. `page` may be null.
   void showProgress(const std::shared_ptr<Page>& page, std::chrono::seconds pause);
 
-  /// Sleeps for `pause` up to kMostPauses times, until the chooser lists a device or the
-  /// application terminates. Then ends the modal loop. Must not be called on the main thread.
+  /// Sleeps for `pause` up to kMostPauses times. Stops early if the chooser lists a device after a
+  /// sleep, or if the application terminates. Then ends the modal loop. Must not be called on the
+  /// main thread.
   void waitDeviceSearchTask(std::chrono::seconds pause) const;
 
   /// Calls showProgress() with the chooser as the page. Then enables Next if a device is listed. If

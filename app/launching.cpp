@@ -25,8 +25,8 @@ constexpr std::chrono::milliseconds kQuitDelay{1000};
 // while the tool runs, so the window must disappear first.
 constexpr std::chrono::milliseconds kHideBeforeToolDelay{500};
 
-// Exit statuses of the set-up tool. After any other status, or if the tool cannot be run, the
-// wizard searches again.
+// Exit statuses of the set-up tool. After any other status, and when there is none, the wizard
+// searches again.
 constexpr int kToolAsksToGoBack = 1;
 constexpr int kToolAsksToQuit = 2;
 

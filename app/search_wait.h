@@ -4,8 +4,8 @@
 
 namespace onramp {
 
-// How long the wizard waits for the device search. A wait is a series of pauses. It ends with the
-// first pause after which a device is listed.
+// How long the wizard waits for the device search. A wait is a series of pauses. It ends early if a
+// device is listed at the end of a pause.
 
 /// The maximum number of pauses in a wait.
 inline constexpr int kMostPauses = 5;

@@ -55,7 +55,7 @@ class ArrayController {
   void choose(std::size_t index);
   void chooseObject(const Dictionary& entry);
 
-  /// Whether the user has made a selection. choose() and chooseObject() make this true. It becomes
+  /// Whether the user has made a choice. choose() and chooseObject() make this true. It becomes
   /// false again when the selected entry is removed or removeAllObjects() is called.
   [[nodiscard]] bool hasChoice() const { return hasChoice_; }
 

@@ -7,7 +7,7 @@
 
 namespace onramp {
 
-/// The replacement character, U+FFFD, which replaces a character that cannot be decoded.
+/// Unicode's replacement character, which stands for a character that is invalid or not allowed.
 inline constexpr char32_t kReplacementCharacter = 0xFFFD;
 
 /// Appends `character` to `text` in UTF-8. Appends the replacement character for a surrogate or a

@@ -28,8 +28,7 @@ std::int64_t leadingInteger(std::string_view text) {
   const bool negative = text[at] == '-';
   if (negative || text[at] == '+') ++at;
 
-  // Accumulates a negative number, because the range has one more negative number than positive
-  // ones.
+  // Accumulates a negative number, because -2^63 is in the range, but 2^63 is not.
   constexpr std::int64_t kMin = std::numeric_limits<std::int64_t>::min();
   std::int64_t number = 0;
   for (; at < text.size() && text[at] >= '0' && text[at] <= '9'; ++at) {

@@ -96,8 +96,8 @@ class Value {
 
   [[nodiscard]] const Storage& storage() const { return storage_; }
 
-  /// Returns the content if it is of type `Kind`, otherwise null. The pointer is valid until the
-  /// value is assigned to or destroyed.
+  /// Returns a pointer to the content if it is of type `Kind`, otherwise null. The pointer is valid
+  /// until the value is assigned to or destroyed.
   template <typename Kind>
   [[nodiscard]] const Kind* as() const {
     return std::get_if<Kind>(&storage_);

@@ -9,9 +9,9 @@
 
 namespace onramp {
 
-/// Builds a dictionary that describes the medium: the models that the medium supports, whether it
-/// has a printer package and a scanner package, the series code that the support site uses, and the
-/// service type to search the network for.
+/// Builds the medium's record, a dictionary that describes the medium: the models that the medium
+/// supports, whether it has a printer package and a scanner package, the series code that the
+/// support site uses, and the service type to search the network for.
 namespace KSOROSXCD {
 
 // Keys of the record; all five are always present.

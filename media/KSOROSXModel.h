@@ -8,9 +8,9 @@
 
 namespace onramp {
 
-/// Builds a dictionary that describes one model: its name, its connections and its identifier at
-/// the support centre. To query many models, call modelInfo() once and pass its result to
-/// initWithName(). Otherwise initWithName() reads the medium on every call.
+/// Builds a model's record, a dictionary that describes the model: its name, its connections and
+/// its identifier at the support centre. To query many models, call modelInfo() once and pass its
+/// result to initWithName(). Otherwise initWithName() reads the medium on every call.
 namespace KSOROSXModel {
 
 // Keys of the record.
@@ -21,16 +21,16 @@ inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< b
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
 /// Returns the model information of the medium from which the wizard is running: the dictionary in
-/// the file that the medium's "ModelInfo" entry names. Returns nothing when the medium names no
-/// such file or the file has no dictionary.
+/// the file that the "ModelInfo" entry of the medium resource dictionary (media/medium.h) names.
+/// Returns nothing when the medium names no such file or the file cannot be read as a dictionary.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 
 /// Returns the record of the model `name` according to the medium's model information.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
 /// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
-/// there supports USB only and has an empty identifier. By default, a listed model supports USB,
-/// but no network; its entry may say otherwise. If the entry of a listed model has no identifier
+/// there supports USB only and has an empty identifier. By default, a listed model also supports
+/// USB only; its entry may say otherwise. If the entry of a listed model has no identifier
 /// ("KSCID"), the record holds only the name. When `name` has no value, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);

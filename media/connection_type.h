@@ -16,16 +16,17 @@ enum class ConnectionType : unsigned char {
   kUSBAndEthernet = 4,
 };
 
-/// Returns the type of a model that supports USB if `usb` is true, and wired Ethernet if `ethernet`
-/// is true.
+/// Returns the type of a model. `usb` and `ethernet` say whether the model supports USB and wired
+/// Ethernet.
 [[nodiscard]] ConnectionType connectionType(bool usb, bool ethernet);
 
 /// Returns the type of the model with the KSOROSXModel record `model`. A flag that is missing from
 /// the record counts as false.
 [[nodiscard]] ConnectionType connectionType(const Dictionary& model);
 
-/// Returns the type that all of `models` share according to `modelInfo`. Returns kNeither when any
-/// two models differ, or when there are no models.
+/// Returns the type that all of `models` share according to `modelInfo`, the result of
+/// KSOROSXModel::modelInfo(). Returns kNeither when any two models differ, or when there are no
+/// models.
 [[nodiscard]] ConnectionType sharedConnectionType(const std::vector<std::string>& models,
                                                   const std::optional<Dictionary>& modelInfo);
 

@@ -39,7 +39,7 @@ inline constexpr std::string_view kVenderName = "VenderName";
 
 /// Reads the dictionary in another property list of the medium. The string under `key` in
 /// `resources` is the relative path of that list. Returns nothing when `resources` has no string
-/// under `key` or the list has no dictionary.
+/// under `key` or the list cannot be read as a dictionary.
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 

@@ -15,8 +15,8 @@ struct SystemVersion {
   std::int64_t bugFix = 0;
 };
 
-/// Returns the version with these components. A component counts as 0 if it is missing, as the
-/// third one of 10.9 is, or does not begin with a number.
+/// Returns the version with these components. A component counts as 0 if it does not begin with a
+/// number or is missing, like the third component of 10.9.
 [[nodiscard]] SystemVersion systemVersion(const std::vector<std::string>& components);
 
 /// How a system version compares with the range that the medium supports.

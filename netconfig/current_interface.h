@@ -7,7 +7,7 @@ namespace onramp {
 
 /// Returns the first IPv4 address of the interface named `interface_name`, in dotted form. Returns
 /// nothing when the interface has no IPv4 entity in the dynamic store (platform/dynamic_store.h),
-/// for example because it is down, and when the store cannot be read.
+/// for example because the interface is down, and when the store cannot be read.
 [[nodiscard]] std::optional<std::string> KSSCcurrentAddressWithInterfaceName(
     const std::string& interface_name);
 

@@ -15,9 +15,9 @@ namespace onramp {
 
 namespace {
 
-// Returns the set-up tool's display name in the user's language. If the tool has no display name,
-// returns the tool's file name without the extension. Returns an empty string when the medium
-// cannot be read.
+// Returns the set-up tool's display name in the user's language. If there is none, returns the last
+// part of the tool's path without the extension. Returns an empty string when the medium cannot be
+// read.
 std::string setupToolName() {
   const std::optional<FileURL> tool = KSInstallerInfo().WLANtoolURL();
   if (!tool) return "";
