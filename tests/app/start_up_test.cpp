@@ -122,7 +122,7 @@ TEST_F(StartUp, RemovesTheFilesThatEarlierRunsLeft) {
     leaveFile(temporary + std::to_string(ended) + "-0");
     leaveFile(temporary + std::to_string(getpid()) + "-12");
     for (const std::string& other : {temporary + "1-0", temporary + "x-0", file + ".other"}) {
-      leaveFile(other);  // belongs to a running writer or to another program
+      leaveFile(other);  // may belong to a running process or to another program
       kept.push_back(other);
     }
   }

@@ -19,7 +19,7 @@ inline constexpr const char* kEnglishTexts =
     "MacResources/CDCommonMessage.bundle/Contents/Resources/en.lproj/Localizable.strings";
 
 /// Runs the wizard from a temporary medium on a scripted network. The functions prepare the medium
-/// and the network, and read and use the wizard's window as a person does.
+/// and the network, and read and operate the wizard's window as a person does.
 class Wizard : public testing::Test {
  protected:
   void SetUp() override {
@@ -30,7 +30,7 @@ class Wizard : public testing::Test {
   void TearDown() override { screen.reset(); }
 
   /// Writes the property lists of a medium with a package and two models: "All" (USB, wired,
-  /// wireless) and "Cable" (USB only). `more` holds further entries of Common.plist.
+  /// wireless) and "Cable" (USB only). `more` holds further entries of the resource dictionary.
   void describeTwoModels(const Dictionary& more = {}) const {
     describe({{"All", recording::model(true, true, true)},
               {"Cable", recording::model(true, false, false)}},
@@ -38,7 +38,7 @@ class Wizard : public testing::Test {
   }
 
   /// Writes the property lists of a medium with a package and `models`. Each model is a pair of a
-  /// name and a result of recording::model().
+  /// name and an entry for the model information, such as recording::model() returns.
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
     names.reserve(models.size());

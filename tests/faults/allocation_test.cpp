@@ -16,8 +16,9 @@
 namespace onramp {
 namespace {
 
-// Makes the allocations of `work` fail. Expects `work` to throw std::bad_alloc, or to return the
-// same result as without a failure. The address sanitizer reports leaks.
+// Makes the allocations of `work` fail as failEveryCall() does. Expects each run of `work` to throw
+// std::bad_alloc or to return the same result as without a failure. In builds with the address
+// sanitizer, a leak also fails the test.
 template <typename Work>
 void failEveryAllocation(const Work& work) {
   const auto expected = work();

@@ -17,8 +17,8 @@ namespace onramp::faults {
 /// Says which calls fail, and how. Only functions that system_calls.cpp replaces can fail.
 struct Failure {
   std::size_t first = 0;  ///< the number of the first call that fails, counted from 1
-  /// The error number of a call that fails. With ENOMEM, only allocations are counted and can fail.
-  /// With any other value, only calls of functions that do not allocate are counted and can fail.
+  /// The error number of a call that fails. With ENOMEM, only calls of `operator new` are counted
+  /// and can fail; with any other value, only calls of the other replaced functions.
   int error = 0;
   bool isLasting = false;  ///< whether all later calls fail, too
 };
@@ -36,7 +36,7 @@ std::vector<std::string> end();
 /// Lasting failures also keep `work` from cleaning up, as if the process were killed. After each
 /// run, expects that no descriptor is left open. Then calls `check` with the name of the first call
 /// that failed, and with the failure. The name is empty if no call failed. Returns the names of all
-/// calls.
+/// functions that were called and counted.
 template <typename Work, typename Check>
 std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Work& work,
                                     const Check& check) {
@@ -47,7 +47,7 @@ std::set<std::string> failEveryCall(std::initializer_list<int> errors, const Wor
   std::set<std::string> seen;
   for (const int error : errors) {
     for (const bool isLasting : {false, true}) {
-      if (isLasting && error == EINTR) continue;  // callers rightly repeat the call for ever
+      if (isLasting && error == EINTR) continue;  // callers would rightly repeat the call for ever
       std::string failed = "?";
       for (std::size_t number = 1; !failed.empty() && !testing::Test::HasFailure(); ++number) {
         const Failure failure{number, error, isLasting};

@@ -59,7 +59,8 @@ TEST(Scarcity, MakesAFunctionFailAndDoesNoOtherHarm) {
   }
 }
 
-// The main loop keeps the source's descriptors open, so this test cannot use failEveryCall().
+// The main loop keeps the descriptors of the store's source open. failEveryCall() would report
+// them, so this test does not use that function.
 TEST(Scarcity, LeavesAStoreWithoutNotifications) {
   const std::vector<std::string> keys{"State:/Network/Global/IPv4"};
   const DynamicStoreRef store = createDynamicStore("test");

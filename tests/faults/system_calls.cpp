@@ -38,15 +38,15 @@ Function* original(const char* name) {
   return reinterpret_cast<Function*>(dlsym(RTLD_NEXT, name));
 }
 
-// If the call must fail, sets `errno` and returns `failure`. Otherwise returns the result of the
-// original function `name`.
+// If the call must fail, sets `errno` and returns `failure`. Otherwise calls the original function
+// `name` and returns its result; for fsync(), returns 0 instead.
 template <typename Result, typename... Parameters>
 Result call(const char* name, Result failure, Parameters... arguments) {
   const bool isFailing = fails(name);
   Result result{};
   // Linux closes a descriptor even when close() reports an error, so the replacement does the
-  // same. fsync() never flushes, because flushing would take most of the tests' time, and the
-  // tests could not see its effect.
+  // same. fsync() never flushes, because flushing would take most of the tests' time and have no
+  // effect that the tests could see.
   if ((!isFailing && std::string_view(name) != "fsync") || std::string_view(name) == "close") {
     result = original<Result(Parameters...)>(name)(arguments...);
   }

@@ -16,8 +16,8 @@ namespace onramp::recording {
 /// variables that this object has changed.
 class MediumFolder {
  public:
-  /// Makes a medium that holds only an application bundle. Changes environment variables to choose
-  /// the application-support folders and English, and to simulate macOS 10.9.5.
+  /// Makes a medium that holds only an application bundle. Sets environment variables that put the
+  /// application-support folders here, choose English and simulate macOS 10.9.5.
   MediumFolder();
   MediumFolder(const MediumFolder&) = delete;
   MediumFolder& operator=(const MediumFolder&) = delete;
@@ -46,8 +46,9 @@ class MediumFolder {
   /// Returns the arguments of the tool's last run, or an empty string when the tool has not run.
   [[nodiscard]] std::string setUpToolArguments() const;
 
-  /// The two files that the wizard writes for the package. optionsFile() and modelFile() return a
-  /// file's contents, or nothing when it cannot be read. The other two functions return its path.
+  /// The two files that the wizard writes for the package. optionsFile() and modelFile() return the
+  /// files' contents, or nothing for a file that cannot be read. The other two functions return the
+  /// files' paths.
   [[nodiscard]] auto optionsFile() const { return loadDictionary(optionsFilePath()); }
   [[nodiscard]] auto modelFile() const { return loadDictionary(modelFilePath()); }
   [[nodiscard]] std::string optionsFilePath() const {
@@ -57,7 +58,7 @@ class MediumFolder {
     return root_ / "user/KestrelImaging/com.kestrelimaging.instmodel.plist";
   }
 
-  /// Sets or unsets an environment variable until the destructor restores it.
+  /// Sets an environment variable, or unsets it if `value` is nothing. The destructor restores it.
   void setEnvironment(const std::string& name, const std::optional<std::string>& value);
 
  private:

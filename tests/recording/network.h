@@ -39,7 +39,7 @@ class Network {
                    std::optional<Data> txt);
 
   /// The addresses that a resolve without a client finds. A key is a service's full name, such as
-  /// "Office._ipp._tcp.local.". A resolve of any other service fails if it has no client.
+  /// "Office._ipp._tcp.local.". For any other service, a resolve without a client fails.
   std::map<std::string, std::vector<Data>> answers;
 
   bool searchesStart = true;                 ///< when false, no search can be started
@@ -50,7 +50,7 @@ class Network {
 };
 
 /// These functions return a socket address in the layout that NetService::addressing() describes.
-/// ipv6Address() returns the address of the loopback interface.
+/// ipv6Address() returns the loopback address, ::1.
 [[nodiscard]] Data ipv4Address(unsigned char a, unsigned char b, unsigned char c, unsigned char d);
 [[nodiscard]] Data ipv6Address();
 

@@ -97,8 +97,8 @@ class DamagedMedium {
   std::minstd_rand random_;
 };
 
-// Starts the wizard and returns the name of its first page, then " opens " and the path for each
-// file that the wizard opens at once. Returns " refused" if the wizard shows an alert.
+// Starts the wizard and returns the name of its first page, followed by " opens " and a path for
+// each file that the wizard opens at once. Returns " refused" if the wizard shows an alert.
 std::string startOfTheWizard() {
   recording::FrontEnd& screen = recording::FrontEnd::instance();
   screen.reset();

@@ -1,6 +1,6 @@
-// Replaces one file of the example medium with each input. The input's first byte chooses the file,
-// and the other bytes become its contents. The models that the wizard then reads from the medium
-// must be those that onramp-check reports.
+// For each input, replaces one file in a copy of the example medium. The input's first byte chooses
+// the file, and the other bytes become its contents. onramp-check must then report the models that
+// the wizard reads, and the same wireless support for each model.
 
 #include <array>
 #include <cstdint>
@@ -36,7 +36,7 @@ constexpr const char* kTexts = "MacResources/CDCommonMessage.bundle/Contents/Res
 struct ExampleMedium : recording::MediumFolder {
   ExampleMedium() {
     fs::copy(ONRAMP_EXAMPLE_MEDIUM, path(""), fs::copy_options::recursive);
-    for (const char* language : {"ja", "ko", "zh_CN"})  // reading two languages is faster
+    for (const char* language : {"ja", "ko", "zh_CN"})  // two languages are read faster than five
       fs::remove_all(path(std::string(kTexts) + language + ".lproj"));
     write(kFiles[0], Dictionary{{"CFBundleName", "Onramp OSX"},
                                 {"CommonResourcePath", "MacResources/CDCommonInfo.plist"}});

@@ -1,6 +1,6 @@
-"""Compares onramp-devices with net-snmp's snmpget and with the wizard's own device chooser. The
-practice network has a device for nearly every verdict. Arguments: onramp-devices, chooser_probe,
-and a medium with the application on it."""
+"""Compares onramp-devices with net-snmp's snmpget and with the wizard's own device chooser, on
+simulated networks. DEVICES has a simulated device for nearly every verdict. Arguments:
+onramp-devices, chooser_probe, and a medium with the application on it."""
 
 import json
 import os
@@ -54,9 +54,10 @@ def tlv(tag, *parts):
 
 
 def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
-    """Returns a function that turns a request into a reply with these parts. If `number` is not 0,
-    the reply's identifier differs from the request's. The reply keeps the first `arcs` of the 14
-    arcs of the object's name, and comes after `seconds` seconds."""
+    """Returns a function that waits `seconds` seconds and turns a request into a reply with the
+    error status `status`. The reply has the first `arcs` of the 14 arcs of the object's name and
+    the value `value`, or neither if `binding` is false. If `number` is not 0, the reply's
+    identifier differs from the request's."""
     def answer(request):
         time.sleep(seconds)
         at = request.index(b"corridor") + 12
@@ -180,7 +181,7 @@ class Wizard(unittest.TestCase):
         with open(pathlib.Path(MEDIUM, "MacResources", "CDInfo.plist"), "rb") as file:
             models = list(plistlib.load(file)["ContainedModel"])
         searches = [[model] for model in models] + [models]
-        for seconds in ("6", "40"):  # on a busy machine, the first search may miss a device
+        for seconds in ("6", "40"):  # on a busy machine, the shorter search may miss a device
             explained = [start(*browse("-s", seconds, *(f"--model={model}" for model in wanted)))
                          for wanted in searches]
             shown = [start(PROBE, f"{MEDIUM}/Onramp OSX.app", seconds, *wanted) for wanted in searches]

@@ -1,4 +1,4 @@
-"""Tests the practice network with avahi-browse and snmpget."""
+"""Tests practice-network, which simulates a network of devices, with avahi-browse and snmpget."""
 
 import os
 import pathlib

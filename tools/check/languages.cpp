@@ -19,8 +19,8 @@ namespace fs = std::filesystem;
 
 constexpr const char* kNameTable = "InfoPlist.strings";
 
-// Codes of countries that are easily taken for the code of the country's language. Only "kr" is
-// also the code of a language, Kanuri.
+// Country codes that are easily taken for language codes, each with the code of the country's
+// language. Only "kr" is also the code of a language, Kanuri.
 constexpr std::array<std::pair<std::string_view, std::string_view>, 8> kCountries{{{"jp", "ja"},
                                                                                    {"cn", "zh"},
                                                                                    {"kr", "ko"},
@@ -46,10 +46,10 @@ std::vector<std::string_view> partsOf(std::string_view name) {
   return parts;
 }
 
-// Returns whether `name` is a code of two or three letters, then perhaps a script of four letters,
-// then perhaps a region of two letters or three digits, then perhaps variants such as "valencia" or
-// "1996". Also returns true for a single longer word, because old media have English names, such
-// as "German".
+// Returns whether `name` consists of a code of two or three letters, then perhaps a script of four
+// letters, then perhaps a region of two letters or three digits, then perhaps variants such as
+// "valencia" or "1996". Also returns true for a single longer word, because old media have English
+// names, such as "German".
 bool hasFormOfLanguage(std::string_view name) {
   const std::vector<std::string_view> parts = partsOf(name);
   const std::string_view code = parts.front();
@@ -71,14 +71,14 @@ bool hasFormOfLanguage(std::string_view name) {
   return next == parts.size();
 }
 
-// Returns the code of the language `name`. "no" and "nb" are both names of Norwegian Bokmål.
+// Returns the code of the language `name`, but "nb" instead of "no": both mean Norwegian Bokmål.
 std::string codeOf(const std::string& name) {
   const std::string code = Language::parse(name).code;
   return code == "no" ? "nb" : code;
 }
 
-// Returns whether `offered` contains the language `wanted`, in any region. A related language does
-// not count, even if the system would use it instead.
+// Returns whether `offered` contains the language `wanted`, in any region. Another script or a
+// related language does not count, even if the system would use it instead.
 bool serves(const std::vector<std::string>& offered, const std::string& wanted) {
   const std::vector<std::string> found = languagesToSearch(offered, {wanted}, "");
   if (found.empty() || !isSameLanguage(found.front(), wanted)) return false;
@@ -115,9 +115,9 @@ class LanguageCheck {
   }
 
  private:
-  // Reports each language that has at least half of its texts in common with English. A new
-  // language usually begins as a copy of the English table, and some texts may be left untranslated
-  // by mistake.
+  // Reports each language in which at least half of the wizard's texts are the same as in English.
+  // A new language usually begins as a copy of the English table, and some texts may be left
+  // untranslated by mistake.
   void checkTranslations() {
     const auto english = std::find_if(tables_.begin(), tables_.end(), [](const auto& table) {
       return isSameLanguage(table.first, "en");
@@ -279,7 +279,7 @@ std::vector<std::string> languagesIn(const MediumFiles& files, const std::string
                                      const std::string& table) {
   std::vector<std::string> languages;
   for (const std::string& name : files.names(resources)) {
-    // macOS writes files whose names begin with "._" to file systems that lack its attributes.
+    // macOS writes files whose names begin with "._" to file systems without extended attributes.
     if (!name.ends_with(kLanguageFolder) || name.starts_with('.') || name == "Base.lproj") continue;
     const std::vector<std::string> contents = files.names((fs::path(resources) / name).string());
     if (table.empty() || std::binary_search(contents.begin(), contents.end(), table))

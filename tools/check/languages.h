@@ -29,20 +29,21 @@ inline constexpr std::string_view kLanguageFolder = ".lproj";
                                                    const std::string& resources,
                                                    const std::string& table = "");
 
-/// Returns whether `name` is well formed as the name of a language, such as "de", "zh_TW",
-/// "zh-Hans-CN" or "German", and is not the code of a country that is easily taken for a language.
+/// Returns whether `name` is the name of a language, such as "de", "zh_TW", "zh-Hans-CN" or
+/// "German". Returns false if `name` begins with a country code that is easily taken for a language
+/// code, such as "jp".
 [[nodiscard]] bool isLanguage(const std::string& name);
 
-/// Returns the code of the language that the author of the folder `name` probably meant. Returns
-/// nothing when `name` is not the code of a country that is easily taken for a language.
+/// If `name` begins with a country code that is easily taken for a language code, returns the code
+/// of the country's language, such as "ja" for "jp". Otherwise returns nothing.
 [[nodiscard]] std::optional<std::string> languageOfCountry(const std::string& name);
 
 /// Returns whether two names are those of the same language, in any region and script.
 [[nodiscard]] bool isSameLanguage(const std::string& a, const std::string& b);
 
-/// Checks that the languages of the message bundle are translated and complete: the bundle must
-/// have the language that users of all other languages see, and the application and the set-up
-/// tool must have the bundle's languages. `tables` maps each language to its strings.
+/// Checks that the message bundle's texts are translated, that the bundle has the language for
+/// users without texts in their own language, and that the application and the set-up tool have all
+/// of the bundle's languages. `tables` maps each language of the bundle to its strings.
 void checkLanguages(const MediumFiles& files, const Lists& lists,
                     const std::map<std::string, Dictionary>& tables);
 

@@ -24,8 +24,8 @@ struct KeyGroup {
 [[nodiscard]] std::span<const KeyGroup> keyGroups();
 
 /// The main property lists of a medium. A list that cannot be read has no value. All paths are
-/// relative to the medium. An unknown path is empty, except that `resourcesPath` is then the usual
-/// path.
+/// relative to the medium. A path that is not known is empty; an unknown `resourcesPath` is the
+/// usual path.
 struct Lists {
   std::string informationPath;  ///< of the application's Info.plist
   std::optional<Dictionary> information;
@@ -47,9 +47,9 @@ struct Lists {
   [[nodiscard]] bool anyWireless() const;
 };
 
-/// Reads the lists whose paths are known. Reports to files.report() why a list cannot be read, and
-/// which keys are wrong or have values of the wrong kind. If the medium has no application, reads
-/// the resource dictionary at its usual path.
+/// Reads the lists whose paths are known. Reports to files.report() why a list cannot be read,
+/// which keys are unknown, misspelt or missing, and which values are of the wrong kind. If the
+/// medium has no application, reads the resource dictionary at its usual path.
 [[nodiscard]] Lists readLists(const MediumFiles& files);
 
 }  // namespace onramp::check

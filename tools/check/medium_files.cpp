@@ -72,7 +72,7 @@ std::optional<std::size_t> lineOfString(const std::string& path, const std::stri
   return std::nullopt;
 }
 
-// Returns the path of the only file or folder in `root` that is named `name`, relative to `root`.
+// Returns the path, relative to `root`, of the only file or folder named `name` anywhere in `root`.
 // Returns nothing if there is no such path, if there are several, or if `root` has so many files
 // that the search would take too long.
 std::optional<std::string> onlyPathOf(const std::string& name, const std::string& root) {

@@ -104,9 +104,9 @@ class ModelCheck {
            (nearest ? ", where the nearest name is " + quoted(*nearest) : "");
   }
 
-  // `meant` is the name that is almost equal to `name` and that only the model information has, if
-  // there is one. `nearest` is the most
-  // similar of all names in the model information.
+  // Reports that the model information lacks `name`. `meant` is an almost equal name that only the
+  // model information has. `nearest` is the most similar of all names in the model information.
+  // Each is nothing if no such name is similar enough.
   void undescribed(const std::string& name, const std::optional<std::string>& meant,
                    const std::optional<std::string>& nearest) {
     add(name,

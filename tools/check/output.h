@@ -8,8 +8,8 @@
 namespace onramp::check {
 
 /// Writes the findings, then a description of what users will see, then a summary. If `width` is
-/// not 0, `out` is a terminal of `width` columns. Then the findings are wrapped, the words "error:"
-/// and "warning:" are coloured, and long names of models are cut. Otherwise each finding takes one
+/// not 0, `out` is a terminal of `width` columns: the findings are wrapped, the words "error:" and
+/// "warning:" are coloured, and long names of models are cut. Otherwise each finding takes one
 /// line.
 void writeText(std::ostream& out, const Report& report, std::size_t width);
 
@@ -22,8 +22,8 @@ void writeJSON(std::ostream& out, const Report& report);
 void writeKeys(std::ostream& out);
 
 /// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
-/// room for it, what is shown if the medium lacks it, how often "%@" must occur in it, and the
-/// place where it is shown.
+/// room for it, what is shown if the medium lacks it, where it is shown and, if "%@" must occur in
+/// it, how often.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check

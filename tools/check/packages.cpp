@@ -19,7 +19,7 @@ namespace onramp::check {
 namespace {
 
 // Returns the first releases of 10.0 to 10.16, and 11.0. The wizard's choice of a package changes
-// at no other version.
+// at no other version below 101. From 101 on, no version key applies.
 std::set<Version> differentSystems() {
   constexpr std::int64_t kLastMinor = 16;
   std::set<Version> systems{{11, 0, 0}};
@@ -94,7 +94,8 @@ class PackageCheck {
     std::string package;
   };
 
-  // Returns whether the packages' folder exists. Returns true when the list names no folder.
+  // Returns whether the packages' folder exists, and reports a missing one. Returns true when
+  // "PkgInfo" names no folder.
   [[nodiscard]] bool hasFolder() const {
     const auto folder = packages_.string("PkgLocation");
     return !folder ||

@@ -65,9 +65,9 @@ class RangeCheck {
                                 .remedy = "correct \"SystemMin\" or \"SystemMax\""});
   }
 
-  // Warns when the maximum's "BugFix" is a number, because the wizard refuses the release with that
-  // number. Does not warn when that release is the first of a major version, because this is the
-  // usual way to exclude the whole version.
+  // Warns when the maximum's "BugFix" is a number, because the wizard refuses the very release that
+  // such a maximum names. Does not warn when that release is the first of a major version, because
+  // this is the usual way to exclude the whole major version.
   void checkNamedMaximum() {
     const Dictionary& maximum = range_.maximum();
     const auto text = maximum.string("BugFix");
@@ -87,9 +87,9 @@ class RangeCheck {
          .remedy = "keep this only if " + name + " is meant to be refused"});
   }
 
-  // Warns when the range begins with an earlier version and ends with the first minor version of
-  // macOS 11 or later. Before macOS 11, each yearly release was a minor version, so there a range
-  // may well end with one.
+  // Warns when the range ends with minor version 0 of macOS 11 or later, such as 14.0, but begins
+  // in an earlier major version. Leaves out maximums before macOS 11, because there each yearly
+  // release was a minor version.
   void checkFirstMinorVersion() {
     constexpr std::int64_t kFirstYearlyMajor = 11;
     const Dictionary& maximum = range_.maximum();

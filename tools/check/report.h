@@ -35,7 +35,7 @@ struct LanguageRow {
 /// The result of a check: the findings, and what users of the medium will see.
 struct Report {
   std::string medium{};
-  std::string application{};             ///< the name of its bundle; empty when there is none
+  std::string application{};             ///< the bundle's name; empty when there is none
   std::string identifier{};              ///< of the application's bundle
   std::vector<std::string> platforms{};  ///< the systems it has a program for: "macOS", "Linux"
   std::vector<Finding> findings{};       ///< in the order in which the checks made them

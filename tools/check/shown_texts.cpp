@@ -94,7 +94,7 @@ constexpr std::array kSquare{
     Range{0xF900, 0xFAFF}, Range{0xFE30, 0xFE4F},   Range{0xFF00, 0xFF60},
     Range{0xFFE0, 0xFFE6}, Range{0x1F300, 0x1FAFF}, Range{0x20000, 0x3FFFD}};
 
-// Returns the estimated width of a character, as a fraction of the letters' size.
+// Returns the estimated width of a character, as a fraction of the font size.
 double relativeWidth(char32_t character) {
   constexpr std::string_view kNarrow = " !'(),.:;I[]fijlrt|";
   constexpr std::string_view kWide = "%@MWmw";

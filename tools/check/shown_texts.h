@@ -24,8 +24,8 @@ struct ShownText {
 /// Returns all texts that the wizard shows from the message bundle, in the order of their keys.
 [[nodiscard]] std::span<const ShownText> shownTexts();
 
-/// Returns the approximate width, in points, of `text` (UTF-8) in a font of `size` points. The
-/// estimate uses no font, but an average width for each class of characters.
+/// Returns the approximate width, in points, of `text` (UTF-8) in a font of `size` points. Instead
+/// of a font, the estimate uses an average width for each class of characters.
 [[nodiscard]] double estimatedWidth(std::string_view text, double size);
 
 /// Returns the approximate number of lines that `text` takes in a font of `size` points, if a line

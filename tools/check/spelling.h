@@ -9,19 +9,19 @@
 
 namespace onramp::check {
 
-/// Finds the known word that was probably meant by a misspelt word. If the two differ only in
-/// capital letters, spaces and punctuation, a hash table finds the known word. Otherwise the
-/// misspelt word is compared with every known word. Each object limits the total work of these
-/// comparisons, because comparing many misspelt words with many known words would take too long.
-/// Above that limit, nearest() finds only words with the same letters, in any order.
+/// Finds the known word for which a misspelt word probably stands. If the two differ only in case,
+/// spaces and punctuation, a hash table finds the known word. Otherwise the misspelt word is
+/// compared with every known word. Each object limits the total work of these comparisons, because
+/// comparing many misspelt words with many known words would take too long. Above that limit,
+/// nearest() finds only words with the same letters, in any order.
 class Spelling {
  public:
   explicit Spelling(const std::vector<std::string>& known);
 
   /// Returns the known word that is most similar to `word`. A word from the hash table counts as
   /// the most similar. If several words are equally similar, returns the first of them. If no word
-  /// is similar enough, returns one with the same letters in another order, such as "SystemMin" for
-  /// "MinSystem". Returns nothing if there is none of these either.
+  /// is similar enough and `word` has at least six letters, returns a word with the same letters in
+  /// another order, such as "SystemMin" for "MinSystem". Returns nothing if there is no such word.
   [[nodiscard]] std::optional<std::string> nearest(std::string_view word);
 
  private:

@@ -11,17 +11,17 @@
 
 namespace onramp::check {
 
-/// The major, minor and bug-fix number of a system.
+/// The major, minor and bug-fix numbers of a system's version.
 using Version = std::array<std::int64_t, 3>;
 
-/// Returns the version that the bound `bound`, "SystemMin" or "SystemMax", names.
+/// Returns the version that the dictionary `bound` ("SystemMin" or "SystemMax") names.
 [[nodiscard]] Version boundOf(const Dictionary& bound);
 
 /// Returns the version with dots, such as "10.13.4". Omits the last number of a major version's
 /// first release, as in "11.0".
 [[nodiscard]] std::string dotted(const Version& version);
 
-/// Returns whether `text` consists of digits only.
+/// Returns whether `text` consists of one or more digits.
 [[nodiscard]] bool isVersionNumber(const std::string& text);
 
 /// Returns the oldest system on which the application starts. Returns nothing if the application's

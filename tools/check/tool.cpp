@@ -29,14 +29,16 @@ bool isExecutable(const std::string& path) {
   return (fs::status(path, ignored).permissions() & any) != fs::perms::none;
 }
 
-// The system treats the carriage return as part of the interpreter's name.
+// The system cannot start such a script, because it treats the carriage return as part of the
+// interpreter's name.
 bool isScriptWithCarriageReturn(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
   std::string line;
   return std::getline(file, line) && line.starts_with("#!") && line.ends_with('\r');
 }
 
-// Reports a bundle whose program is not named in its Info.plist, is missing or is not executable.
+// Reports a bundle whose Info.plist names no program, or whose program is missing, is not
+// executable or is a script with a carriage return in its first line.
 void checkProgram(const MediumFiles& files, const Bundle& bundle, const std::string& relative,
                   const char* effect) {
   const std::string list = relative + "/Contents/Info.plist";

@@ -52,7 +52,7 @@ std::string remedyForQuotes(std::string_view text, std::size_t offset) {
   return "";
 }
 
-// Returns whether `line` has an "&" that begins no entity such as "&amp;" or "&#38;".
+// Returns whether `line` has an "&" that does not begin an entity such as "&amp;" or "&#38;".
 bool hasBareAmpersand(std::string_view line) {
   for (std::size_t at = line.find('&'); at != std::string_view::npos; at = line.find('&', at + 1)) {
     const std::string_view rest = line.substr(at + 1);
