@@ -23,7 +23,7 @@ constexpr std::array<std::string_view, 9> kMakerKeys{
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
                                                      "modelName", "ty",  "product"};
 
-// Returns `text` without spaces at its ends, and with each run of spaces as one space.
+// Returns `text` without spaces at its ends, and with each run of spaces replaced by one space.
 std::string withSingleBlanks(std::string_view text) {
   std::string out;
   for (const char c : text) {

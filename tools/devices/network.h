@@ -6,8 +6,8 @@
 
 namespace onramp::devices {
 
-/// Returns the first problem of the network as a whole, or an empty list if there is none. A
-/// missing discovery daemon is always a problem. The other problems count only if the search found
+/// Returns a list with the first problem of the network as a whole, or an empty list. A missing
+/// discovery daemon is always a problem. The other problems count only if the search found
 /// no device: no network, blocked multicast, and no announcement within `seconds`, the duration of
 /// the search.
 [[nodiscard]] std::vector<Verdict> networkProblems(bool hasFoundDevices, double seconds);

@@ -70,7 +70,8 @@ class Facts:
         return list(chosen.values())
 
     def about(self, key):
-        """Returns what is wrong with the value of a key, in sentences; "" if nothing is."""
+        """Returns what is wrong with the value of a key, in sentences; "" if nothing is
+        wrong."""
         said = [f"{finding['file']}: {key}: {finding['found']}. Effect: {finding['effect']}."
                 for finding in self.findings if key in finding["key"]]
         return " ".join(said)

@@ -109,8 +109,8 @@ class Gallery:
     def _add_devices(self, model, service_type):
         maker, kind = model.split(" ", 1)
         for number in range(DEVICES):
-            # The number comes first, so that the first picture of the sorted list has every kind of
-            # name.
+            # The number comes first, so that the top of the sorted list, which the picture shows, has
+            # every kind of name.
             name = shortened(f"{number:02} {crowded.LONG_NAMES[number % len(crowded.LONG_NAMES)]}",
                              service_type)
             self._network.add(name, maker=maker, model=kind, type=service_type)

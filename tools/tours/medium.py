@@ -92,7 +92,7 @@ def _read(path):
     """Returns the dictionary in a property list, or an empty one if the list cannot be read."""
     try:
         content = plistlib.loads(path.read_bytes())
-    except Exception:  # plistlib's errors have nothing in common
+    except Exception:  # plistlib's errors have no other common class
         return {}
     return content if isinstance(content, dict) else {}
 

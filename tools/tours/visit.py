@@ -155,7 +155,8 @@ class Visit:
                                 f"this system. {self._medium.facts.about('PkgInfo')}")
 
     def left_nothing(self):
-        """Waits for the wizard to exit. Returns whether it exited well, without files."""
+        """Waits for the wizard to exit. Returns whether its status was 0 and it left
+        no files."""
         return self._end() == 0 and not self._files()
 
     def _end(self):
