@@ -28,7 +28,8 @@ struct TextStyle {
 /// Returns the row for a device that is no longer announced.
 [[nodiscard]] std::string goneRow(const Device& device, const TextStyle& style);
 
-/// Returns the last lines of the output: delays, network problems and the numbers of devices.
+/// Returns the last lines of the output: delays, missed devices, network problems and the numbers
+/// of devices.
 [[nodiscard]] std::string summaryOf(const BrowseResult& result, const TextStyle& style);
 
 /// Returns a request and its reply as trees and in hexadecimal, indented by `indent` spaces. A

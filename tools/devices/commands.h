@@ -11,7 +11,7 @@ namespace onramp::devices {
 /// no usable answer, or the output cannot be written.
 inline constexpr int kTrouble = 2;
 
-/// The exit status of `browse` when it found no device and a reason is known.
+/// The exit status of `browse` when it finds no device.
 inline constexpr int kNothingFound = 1;
 
 struct BrowseOptions {

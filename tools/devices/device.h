@@ -24,7 +24,7 @@ struct Device {
   Dictionary record;                ///< a KSDevice record; empty until the first resolve
   std::optional<Data> txt;          ///< the TXT record as it was received
   std::vector<std::string> ipv6;    ///< IPv6 addresses, which the wizard does not use
-  std::set<std::string> sightings;  ///< places where it is seen: "eth0 IPv4"; empty on macOS
+  std::set<std::string> sightings;  ///< where it is seen, such as "eth0 IPv4"; empty on macOS
   std::optional<Answer> answer;     ///< no value until askDevice() has returned
 };
 

@@ -105,8 +105,8 @@ bool Questioning::send(snmp_table_request& request, Exchange& exchange) {
   return true;
 }
 
-// Waits for the reply as long as the wizard does, and stores the reply in `exchange`. Sets the
-// outcome only if the host reports that no program uses the port.
+// Waits for the reply as long as the wizard does, or until `stopped_` is set. Stores the reply in
+// `exchange`. Sets the outcome only if the host reports that no program uses the port.
 void Questioning::await(Sent& sent, Exchange& exchange) {
   const auto deadline = sent.at + kReceiveWait;
   while (!stopped_ && Clock::now() < deadline) {

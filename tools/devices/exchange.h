@@ -10,7 +10,7 @@
 
 namespace onramp::devices {
 
-/// One request for a device's active interface, and its reply.
+/// One request for a device's active interface, and the reply.
 struct Exchange {
   enum class Outcome {
     kValue,         ///< the reply has an integer
@@ -19,9 +19,9 @@ struct Exchange {
     kUnreadable,    ///< the reply is malformed
     kOtherRequest,  ///< the reply has another request's identifier
     kRefused,       ///< the host reported that no program uses the port
-    kLate,          ///< the reply came after the time that the wizard waits for it
+    kLate,          ///< the reply came after the wizard would have stopped waiting
     kNone,          ///< no reply came
-    kUnsent,        ///< nothing was sent, because there was no valid address, socket or route
+    kUnsent,        ///< nothing was sent, for example because there was no valid address or route
   };
 
   std::string address{};
@@ -40,7 +40,7 @@ struct Exchange {
 /// The result of asking one device.
 struct Answer {
   bool isWireless = false;  ///< by the wizard's rules
-  bool isComplete = false;  ///< false when askDevice() was stopped before the end
+  bool isComplete = false;  ///< false when askDevice() was stopped
   double seconds = 0;       ///< how long the wizard's window would not respond
   std::vector<Exchange> exchanges;
 

@@ -61,8 +61,8 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   std::vector<std::shared_ptr<KSBonjour>> browsers_;
   NetServiceBrowserRef typeBrowser_;
   std::map<std::pair<std::string, std::string>, Device> devices_;
-  // The sightings by name and domain. They are not in `devices_`, because a service may be sighted
-  // before its device is found.
+  // The sightings by name and domain. `devices_` cannot hold them all, because a service may be
+  // sighted before its device is found.
   std::map<std::pair<std::string, std::string>, std::set<std::string>> sightings_;
 };
 

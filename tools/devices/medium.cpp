@@ -25,8 +25,8 @@ std::nullopt_t fail(const std::string& path, const std::string& problem) {
 }
 
 // Returns the models whose users never reach a search. A user who chooses a model without wireless
-// gets the package at once. On a medium that begins with the connection page, nobody chooses a
-// model, and each search is for all models.
+// gets the package at once. If the wizard begins with the connection page, nobody chooses a model,
+// and each search is for all models.
 std::vector<std::string> modelsWithoutSearch(const std::vector<std::string>& models) {
   const auto information = KSOROSXModel::modelInfo();
   if (firstPage(models, information) == FirstPage::kConnectionType) return {};

@@ -17,13 +17,13 @@ namespace onramp::devices {
 namespace {
 
 // TXT keys under which devices announce their maker or model. The wizard reads only one key of each
-// list, which depends on the service type.
+// list; the service type decides which.
 constexpr std::array<std::string_view, 9> kMakerKeys{
     "usb_MFG", "mfg", "usb_MANUFACTURER", "manufacturer", "mfr", "vendor", "make", "ty", "product"};
 constexpr std::array<std::string_view, 8> kModelKeys{"usb_MDL",   "mdl", "usb_MODEL", "model", "md",
                                                      "modelName", "ty",  "product"};
 
-// Returns `text` without spaces at its ends, and with each run of spaces replaced by one space.
+// Returns `text` without spaces at its ends, and with each run of spaces reduced to one.
 std::string withSingleBlanks(std::string_view text) {
   std::string out;
   for (const char c : text) {
@@ -85,9 +85,9 @@ std::string edgeBlanks(const std::string& announced) {
                                                    : "differs only in spaces from";
 }
 
-// Returns the medium's model whose spelling is nearest to `announced`. If none is near, returns one
-// whose name ends with `model`, the model that the device announces without its maker. Returns
-// nothing when there is no such model either.
+// Returns the medium's model whose spelling is nearest to `announced`. If none is near, returns the
+// first whose last words are `model`, ignoring case. `model` is the announced model without the
+// maker. Returns nothing when there is no such model either.
 std::optional<std::string> nearestOf(const std::string& announced, const std::string& model,
                                      const Medium& medium) {
   auto nearest = check::Spelling(medium.models).nearest(announced);

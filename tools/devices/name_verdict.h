@@ -10,7 +10,7 @@ namespace onramp::devices {
 /// nothing when they match one. The device must be resolved.
 [[nodiscard]] std::optional<Verdict> judgeName(const Device& device, const Medium& medium);
 
-/// Returns the IPv4 addresses in `record`, which KSDevice made, in dotted form.
+/// Returns the IPv4 addresses in the KSDevice record `record`, in dotted form.
 [[nodiscard]] std::vector<std::string> ipv4AddressesOf(const Dictionary& record);
 
 }  // namespace onramp::devices

@@ -27,7 +27,8 @@ class Questions {
   /// the device has been asked.
   void ask(const Array& addresses, Answered answered);
 
-  /// Stops asking for good. The answer of each device that is being asked is then incomplete.
+  /// Stops asking, permanently. The answers of devices that are still being asked, or are asked
+  /// later, are incomplete.
   void stop() { *stopped_ = true; }
 
   /// Returns the number of devices for which `answered` has not been called yet.

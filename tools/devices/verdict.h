@@ -27,8 +27,8 @@ struct Verdict {
 [[nodiscard]] Verdict judge(const Device& device, const Medium& medium,
                             const std::function<bool(const std::string& address)>& isLocal);
 
-/// Returns notes on a device whose model never leads to a search, and on a device whose reply
-/// changes the wizard's requests to later devices.
+/// Returns a note if the device's model never leads to a search, and a note if a reply of the
+/// device changes the wizard's requests to later devices.
 [[nodiscard]] std::vector<Verdict> notesOn(const Device& device, const Medium& medium);
 
 }  // namespace onramp::devices

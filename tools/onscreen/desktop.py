@@ -99,8 +99,8 @@ class Desktop:
         (self._folder / "opened").unlink(missing_ok=True)
 
     def run(self, arguments, **options):
-        """Runs a program to its end and returns its output. Raises an error if the program
-        fails."""
+        """Runs a program to its end and returns its output. Raises CalledProcessError if the
+        program fails."""
         done = subprocess.run(arguments, env=self.env, check=True, stdout=subprocess.PIPE,
                               text=True, **options)
         return done.stdout

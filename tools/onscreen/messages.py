@@ -20,8 +20,8 @@ class Texts(dict):
 def _fitness(offered, wanted):
     """Returns how well the language `offered` suits a user who wants `wanted`.
 
-    3 means the same name. 2 means the same language, where `offered` has no region, and 1 means the
-    same language, where `offered` has a region. 0 means a different language, or the other Chinese script.
+    3 means the same name, and 2 the same language without a region in `offered`. 1 means the same
+    language with a region in `offered`. 0 means a different language, or the other Chinese script.
     """
     offered, wanted = (re.split(r"[.@]", name)[0].replace("-", "_").lower()
                        for name in (offered, wanted))
@@ -60,7 +60,7 @@ def read(medium, language):
 
 
 def read_table(table):
-    """Returns the texts of a strings file in UTF-8 or UTF-16, or in the form of a property list.
+    """Returns the texts of a strings file: text in UTF-8 or UTF-16, or a property list.
     Returns no texts if the file is missing or is a damaged property list."""
     data = table.read_bytes() if table.exists() else b""
     if data.startswith((b"<?xml", b"bplist")):

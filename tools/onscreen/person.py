@@ -132,9 +132,9 @@ class Person:
         wait_for(acts, _LOOK_SECONDS, f"the action of {role} {name!r}")
 
     def open_menu(self, button=None):
-        """Opens the menu of the button named `button`, or of the focused button for None.
+        """Opens the menu of the button named `button` or, if that is None, of the focused button.
 
-        The accessibility bus does not show the menu, so only the keyboard can use it.
+        The menu does not appear on the accessibility bus, so a person can only use it by keyboard.
         """
         windows = self._window_count()
         if button:
@@ -154,11 +154,11 @@ class Person:
 
     def press(self, *keys):
         """Waits a while for the program to get the keyboard, and presses the keys one after another.
-        They have X names, such as "Return" or "alt+F4"."""
+        Each key is given by its X name, such as "Return" or "alt+F4"."""
         try:
             wait_for(self._has_keyboard, _KEYBOARD_SECONDS, "the program to get the keyboard")
         except InVain:
-            pass  # the keys are pressed anyway, because the focus may be impossible to learn
+            pass  # pressed anyway, because it is not always possible to learn who has the keyboard
         self.desktop.run(["xdotool", "key", "--clearmodifiers", *keys])
 
     def close_window(self):
@@ -181,7 +181,7 @@ class Person:
 
     def _has_keyboard(self):
         """Returns whether a window of the program has the X input focus. Also returns true when the
-        program has exited, because then nothing is worth waiting for."""
+        program has exited, because then there is nothing to wait for."""
         owner = subprocess.run(["xdotool", "getwindowfocus", "getwindowpid"], env=self.desktop.env,
                                capture_output=True, text=True)
         return not self.is_running() or owner.stdout.strip() == str(self.process.pid)

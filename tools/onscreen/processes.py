@@ -14,7 +14,7 @@ class Missing(Exception):
 
 
 class InVain(TimeoutError):
-    """Raised when an awaited event does not happen. `what` describes the event."""
+    """Raised when an awaited event does not happen in time. `what` describes the event."""
 
     def __init__(self, seconds, what):
         super().__init__(f"gave up after waiting {seconds} s for {what}")
@@ -26,8 +26,8 @@ def _die_with_parent():
 
 
 def start(arguments, package=None, **options):
-    """Starts a program. Raises Missing if that fails. The error names `package`, the Debian package
-    that contains the program."""
+    """Starts a program. Raises Missing if that fails. If the program is not installed, the error
+    names `package`, the Debian package that contains it."""
     try:
         return subprocess.Popen(arguments, preexec_fn=_die_with_parent, **options)
     except FileNotFoundError as error:

@@ -16,8 +16,8 @@ from practice_network.description import CLOSED, MISSING, SILENT, TEXT, WIRELESS
 @functools.cache
 def maker_settings():
     """Returns the SNMP community, the object identifier and the value that means wireless. They are in
-    maker.json, or in the file that the variable ONRAMP_MAKER names. Raises DescriptionError if the
-    file does not have them."""
+    maker.json, or in the file that the environment variable ONRAMP_MAKER names. Raises
+    DescriptionError if the file does not have them."""
     path = os.environ.get("ONRAMP_MAKER") or pathlib.Path(__file__).parents[2] / "maker.json"
     try:
         maker = json.loads(pathlib.Path(path).read_text(encoding="utf-8"))
@@ -102,8 +102,8 @@ class Agents:
 
 
 def _relay(address, request, sender, seconds=5):
-    """Sends `request` to the agent at `address`, and forwards the agent's answer to `sender`, from
-    `address`."""
+    """Sends `request` to the agent at `address`, and forwards the agent's answer to `sender`. The
+    answer's source is `address`."""
     with socket.socket(socket.AF_INET, socket.SOCK_DGRAM) as own:
         own.settimeout(seconds)
         try:

@@ -1,4 +1,4 @@
-"""The command line, which starts a network or, with `ctl`, controls the network around it."""
+"""The command line, which starts a network or, with `ctl`, controls the network that it runs in."""
 
 import argparse
 import importlib.util

@@ -83,7 +83,7 @@ def inside(options):
     except OSError as error:
         print(f"practice-network: {options['command'][0]}: {error.strerror}", file=sys.stderr)
         return 127 if isinstance(error, FileNotFoundError) else 126
-    # The first process in a process namespace must reap all orphans.
+    # The first process in a PID namespace must reap all orphans.
     while True:
         pid, status = os.wait()
         if pid == command.pid:
@@ -120,7 +120,7 @@ def devices(options):
 
 
 def _own_run(user):
-    """Takes over /run. Returns the command's environment, which refers to the new /run."""
+    """Mounts a new /run. Returns the command's environment, which refers to the new /run."""
     variables = {SOCKET_VARIABLE: str(RUN / "socket"), "DBUS_SYSTEM_BUS_ADDRESS": BUS_ADDRESS,
                  "XDG_RUNTIME_DIR": str(RUN / "user")}
     authority = pathlib.Path(os.environ.get("XAUTHORITY", "/nowhere"))

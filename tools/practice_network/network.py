@@ -158,8 +158,9 @@ class Network:
         self._agents.stop(device)
 
     def _with_addresses(self, device, known_as=None):
-        """Returns the device with its addresses, and adds them to the host. Chooses free addresses
-        if `addresses` is a number. `known_as` is the device's old name if its name changes."""
+        """Returns the device with its addresses. Chooses free addresses if `device.addresses` is a
+        number. Adds the IPv4 addresses to the host, except loopback addresses. `known_as` is the
+        device's old name if its name changes."""
         name = known_as or device.name
         used = {address for key, other in self._devices.items() if key != name
                 for address, behaviour in zip(_list(other.addresses), other.behaviour())

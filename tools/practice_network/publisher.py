@@ -11,7 +11,7 @@ AVAHI = "org.freedesktop.Avahi"
 ANY_INTERFACE = dbus.Int32(-1)
 ANY_PROTOCOL = dbus.Int32(-1)
 NO_FLAGS = dbus.UInt32(0)
-# The flags mean: unique, no probes, several records for one name. Nobody else uses these host names,
+# The flags mean: unique, no probes, several records for one name. Nobody else uses the host names,
 # so probes are unnecessary. They would even do harm: on loopback, Avahi receives its own probes, and
 # treats a probe as a conflict if the record has changed since the probe was sent.
 ADDRESS_FLAGS = dbus.UInt32(1 | 2 | 8)
@@ -47,8 +47,8 @@ def connect(bus_address, seconds=10):
 
 @dataclasses.dataclass(frozen=True)
 class _Entry:
-    """The published records of a device. Addresses and services are separate groups, so that new
-    addresses leave the services as they are."""
+    """The published records of a device. Addresses and services are in separate groups of Avahi, so
+    that new addresses leave the services as they are."""
 
     host: str
     addresses: dbus.Interface

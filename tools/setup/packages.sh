@@ -1,6 +1,6 @@
 # The scripts `run` and `test` source this file.
 
-# Installs the missing packages of a list. The argument is the file with the list.
+# Installs those packages of a list that are missing. The argument is the file with the list.
 install_packages() {
   local list=$1 missing
   missing=$(sed 's/[[:space:]]*#.*//; /^$/d' "$list" | while read -r package; do

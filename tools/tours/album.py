@@ -6,7 +6,8 @@ import unicodedata
 
 
 def file_names(names):
-    """Returns a part of a file name for each name. The parts differ even if case is ignored."""
+    """Returns a dictionary that has a part of a file name for each name. The parts differ even if
+    case is ignored."""
     result, used = {}, set()
     for name in names:
         letters = unicodedata.normalize("NFKD", name).encode("ascii", "ignore").decode()
@@ -33,7 +34,7 @@ class Album:
         self.problems = 0
 
     def begin(self, title, name):
-        """Begins a section. The names of its pictures begin with `name`."""
+        """Begins a section. The names of its pictures' files contain `name`."""
         self._name = name
         self._section = {"title": title, "pictures": [], "notes": [], "problems": [], "files": []}
         self.content["sections"].append(self._section)

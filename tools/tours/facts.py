@@ -1,7 +1,7 @@
 """The facts about a medium.
 
 They come from onramp-check, which reads media with the wizard's own code. The environment variable
-ONRAMP_CHECK names that program. Without the variable, the release build's is used.
+ONRAMP_CHECK names that program. Without the variable, the release build's onramp-check is used.
 """
 
 import dataclasses
@@ -14,7 +14,7 @@ _BUILT = pathlib.Path(__file__).resolve().parents[2] / "build/release/tools/onra
 
 
 class Unsuitable(Exception):
-    """The tour cannot walk through this medium's wizard. The message says why."""
+    """Raised when the tour cannot begin. The message says why."""
 
 
 @dataclasses.dataclass(frozen=True)

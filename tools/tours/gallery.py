@@ -88,8 +88,8 @@ class Gallery:
         self._network = network
 
     def take(self, model, service_type, version):
-        """Takes all pictures. The search finds devices of `model`. `version` is a system that the
-        medium does not support, or None."""
+        """Takes all pictures. The search finds devices of `model`. `version` is a version of
+        macOS that the medium does not support, or None."""
         self._add_devices(model, service_type)
         with tempfile.TemporaryDirectory() as folder:
             for look in all_looks(Person.follows_desktop):
@@ -134,7 +134,7 @@ class Gallery:
             person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
             self._take(person, "2-connection")
             self._search(person)
-            # The devices are listed while the wait goes on.
+            # The device list appears before the wait ends.
             person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
             with contextlib.suppress(TimeoutError):  # on a busy machine, few devices answer in time
                 wait_for(lambda: len(person.rows()) >= _ROWS, _ANSWER_SECONDS, "devices in the list")

@@ -41,7 +41,7 @@ class Medium:
         return programs[0].parents[2]
 
     def _locales(self):
-        """Returns the locales that the user prefers, followed by their substitutes."""
+        """Returns the user's preferred locales, then the message bundle's language and English."""
         names = ("LC_ALL", "LC_MESSAGES", "LANG")
         locale = next((os.environ[name] for name in names if os.environ.get(name)), "C")
         preferred = []

@@ -1,4 +1,5 @@
-"""Takes the tour in one language. Each tour has its own process, which can use only one desktop."""
+"""Takes the tour in one language. Each tour has its own process, because a process can use only one
+desktop."""
 
 import json
 import pathlib

@@ -6,12 +6,12 @@ from practice_network.names import shortened
 from .visit import CONNECTION, DEVICES, GEAR_REFRESH, WentWrong
 
 _SEARCHES = 3  # on a busy machine, the first search may find nothing
-_LONGEST_SEARCH = 75  # seconds; a search takes at most 15, but longer on a busy machine
+_LONGEST_SEARCH = 75  # seconds; a search takes at most 15, except on a busy machine
 
 
 class Devices:
-    """Adds made-up devices to the practice network `network`. Their models are models of the medium.
-    A device has its model's name, shortened if the name is too long for a device."""
+    """Adds made-up devices of the medium's models to the practice network `network`. A device's
+    name contains the model's name, and is cut if it is too long for a device."""
 
     def __init__(self, network, service_type):
         self._network = network
@@ -56,8 +56,8 @@ def matches_devices(model):
 
 
 def find_devices(visit, medium, step=None):
-    """Searches from the connection page until devices are listed. Raises WentWrong if no device
-    appears. If `step` is set, takes a picture of the first search under that name."""
+    """Searches from the connection page until devices are listed. Raises WentWrong if several
+    searches find no device. If `step` is set, takes a picture of the first search as step `step`."""
     for number in range(_SEARCHES):
         visit.next()
         wait_for(lambda: visit.person.sees("progress bar"), 20, "the search to begin")

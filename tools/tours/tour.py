@@ -112,7 +112,7 @@ class Tour:
             self._section(title, name, lambda: self._walk(model))
 
     def _make_devices(self, models):
-        """Makes up devices, or says why there are none."""
+        """Makes up devices, or sets `_no_devices` to the reason why there are none."""
         self._searched = [model for model in models if matches_devices(model)]
         self._devices = None
         self._no_devices = ""
@@ -156,7 +156,7 @@ class Tour:
             self._album.note(self._no_devices or _UNMATCHED)
 
     def _go_to_list(self, visit, model, pictures=False):
-        """Goes to the model list and chooses the model there, if the medium has a list."""
+        """Waits for the first page and, if it is the model list, chooses the model there."""
         page = visit.first_page()
         if page == MODELS:
             visit.choose_model(model.name)

@@ -16,7 +16,7 @@ _ROLES = {MODELS: ("list",), CONNECTION: ("radio button",), DEVICES: ("tree", "t
           ALERT: ("alert",)}
 _TITLES = {MODELS: "INST_TXT_MODEL", CONNECTION: "INST_TXT_CONNECTIONTYPE",
            DEVICES: "INST_TXT_DEVLIST"}
-_PATIENCE = 60  # seconds; an idle machine needs one
+_PATIENCE = 60  # seconds; one is enough on an idle machine
 _TOLD = ("heading", "label", "push button", "radio button", "alert")
 
 
@@ -155,8 +155,8 @@ class Visit:
                                 f"this system. {self._medium.facts.about('PkgInfo')}")
 
     def left_nothing(self):
-        """Waits for the wizard to exit. Returns whether its status was 0 and it left
-        no files."""
+        """Waits for the wizard to exit. Returns whether it exited with status 0, and wrote no
+        files."""
         return self._end() == 0 and not self._files()
 
     def _end(self):

@@ -17,7 +17,7 @@ from .facts import Facts, Unsuitable
 
 INSIDE = "--inside"
 _TOOLS = pathlib.Path(__file__).resolve().parents[1]
-_AT_A_TIME = 3  # a tour mostly waits, so this many need little more time than one
+_AT_A_TIME = 3  # a tour mostly waits, so three at once take little longer than one
 
 
 def run(arguments, on_network=True, **options):
