@@ -144,13 +144,6 @@ class TextCheck {
       finding.effect = filled && count == 0 ? "an alert that does not say which version is needed"
                                             : "a literal \"%@\" (" + std::string(shown.where) + ")";
       finding.remedy = filled ? "write \"%@\" exactly where a version belongs" : "remove \"%@\"";
-    } else if (shown.where == "sheet when no device is found" &&
-               text.find('%') != std::string::npos) {
-      finding.id = "text-percent";
-      finding.found = "a \"%\", which macOS treats as the beginning of a placeholder";
-      finding.expected = "a text without \"%\"";
-      finding.effect = "a damaged text, or a crash, on macOS";
-      finding.remedy = "write a word instead";
     } else {
       tooWide(shown, text, finding);
     }
