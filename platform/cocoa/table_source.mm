@@ -176,8 +176,8 @@ CGFloat leastNameWidth(NSCell* cell) {
   return -1;
 }
 
-// Passes the user's selection to the controller. If the user has deselected the row, selects it
-// again.
+// Passes the user's selection to the controller. If no row is selected now, selects the
+// controller's row again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;
   const NSInteger row = [_table selectedRow];
