@@ -15,7 +15,7 @@ struct Renamed {
   std::string_view to;
 };
 
-// Language names that bundles used before there were language codes, and codes that have since been
+// The language names that bundles used before they used codes, and codes that have since been
 // replaced.
 constexpr std::array kRenamed = {
     Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},
