@@ -8,7 +8,7 @@
 #import "platform/cocoa/text.h"
 
 /// The delegate of one sheet. When the sheet closes, passes kAlertOtherReturn or
-/// kAlertDefaultReturn to the initializer's function, and releases itself.
+/// kAlertDefaultReturn to `_didEnd`, and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }
