@@ -43,7 +43,7 @@ class ButtonRow {
   explicit ButtonRow(NSView* content) : content_(content) {}
 
   /// Returns how much wider the content view must be for the visible buttons. The result is
-  /// negative if it is wider than necessary.
+  /// negative if the view is wider than necessary.
   [[nodiscard]] CGFloat missingWidth() const {
     CGFloat needed = leftEdge() + NSWidth([content_ bounds]) - rightEdge();
     CGFloat gap = 0;
@@ -202,7 +202,8 @@ CGFloat missingHeightInside(NSView* view) {
   return missingHere > 0 ? std::max(missing, missingHere - spareHeight(view)) : missing;
 }
 
-// Makes a text field taller by `height`, and moves or shortens the other views in `parent`.
+// Makes a text field taller by `height`, and moves or shortens the views in `parent` that are in
+// the way.
 void grow(NSView* field, CGFloat height, NSView* parent) {
   const NSRect old = [field frame];
   const bool isOnTop = hangsOnTop(field);
@@ -227,14 +228,15 @@ void growFields(NSView* view) {
   }
 }
 
-// Returns where one side of a window, `length` long, must start so that it lies between `least` and
-// `greatest` and starts as close as possible to `start`. Returns `least` if the side is too long.
+// Returns where one side of a window must start so that the side lies between `least` and
+// `greatest`, as close as possible to `start`. `length` is the length of the side. If the side is
+// too long, returns `least`.
 CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat length) {
   return std::max(least, std::min(std::floor(start), greatest - length));
 }
 
-// Enlarges a window by `width` and `height`, but not beyond the size of the screen. Keeps the
-// window's middle in place as far as possible.
+// Enlarges a window by `width` and `height`, but not beyond the size of the screen. Treats negative
+// lengths as 0. Keeps the window's middle in place as far as possible.
 void enlarge(NSWindow* window, CGFloat width, CGFloat height) {
   NSScreen* const screen = [window screen] ? [window screen] : [NSScreen mainScreen];
   const NSRect bounds = [screen visibleFrame];

@@ -5,8 +5,8 @@
 #include "platform/interface_file.h"
 
 /// Represents an InterfaceOwner in AppKit, where the owner of an interface file must be an
-/// Objective-C object. If the file binds a control to a key of this object, the control shows the
-/// InterfaceOwner's text for that key.
+/// Objective-C object. If the file binds the title of a control or window to a key of this object,
+/// the title is the InterfaceOwner's text for that key.
 @interface OnrampFileOwner : NSObject {
   onramp::InterfaceOwner* _owner;
   NSMutableSet* _boundKeys;

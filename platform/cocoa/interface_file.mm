@@ -89,8 +89,9 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// Makes buttons perform their actions on `owner`. Skips buttons that have no action or already have
-// a target. The interface file connects the other buttons to the first responder, not to a target.
+// The selector of a button names one of the owner's actions. Makes a click on the button perform
+// this action. Skips buttons that have no selector or already have a target. The interface file
+// connects all other buttons to the first responder, not to a target.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {

@@ -1,7 +1,6 @@
-// Makes macOS ask the user for access to the local network while the first page is shown. Since
-// macOS 15, the system asks for this consent when a program first uses the local network. Without
-// this file, the device search would be the first use, and it might end before the user has
-// answered.
+// Makes macOS ask the user for permission to use the local network while the first page is shown.
+// macOS 15 and later ask when a program first uses the local network. Without this file, the device
+// search would be the first use, and the search might end before the user has answered.
 
 #import <AppKit/AppKit.h>
 

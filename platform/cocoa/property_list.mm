@@ -66,8 +66,8 @@ class Reader {
     return Value(Data(bytes, bytes + [data length]));
   }
 
-  // Leaves out members that are not property-list objects, because some versions of macOS put an
-  // NSURL into the information dictionary of a bundle.
+  // array() and dictionary() leave out members that are not property-list objects, because some
+  // versions of macOS put an NSURL into the information dictionary of a bundle.
   std::optional<Value> array(NSArray* array, std::size_t depth) {
     Array values;
     for (id object in array) {

@@ -26,8 +26,8 @@ int modalLoops = 0;
 bool isModalAborted = false;
 
 // True from abortModal() until the modal loop has returned, or until the main thread has found that
-// no loop is running. Meanwhile, posted actions wait for the end of the loop, because each of them
-// could block the main thread for seconds.
+// no loop is running. Meanwhile, actions of performOnMainThread() wait for the end of the loop,
+// because each of them could delay this end by seconds.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while
@@ -96,7 +96,7 @@ void performOnMainThread(std::function<void()> action) {
   });
 }
 
-// Starts AppKit's loop again if it ends without a call of abortModal(), for example because the
+// Starts AppKit's loop again if it ends without a call to abortModal(), for example because the
 // user has pressed a key that cancels the loop.
 void runModalForWindow(const Window& window) {
   // The loop counts as running before the window is shown, because showing the window may run a

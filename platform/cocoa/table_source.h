@@ -6,8 +6,8 @@ namespace onramp {
 class ArrayController;
 }
 
-/// Shows an array controller's entries in a table, and keeps the table's selection the same as the
-/// controller's. A double-click on a row clicks the window's default button.
+/// Shows an array controller's entries in a table, and keeps the selections of the table and of the
+/// controller in sync. A double-click on a row clicks the window's default button.
 @interface OnrampTableSource : NSObject <NSTableViewDataSource, NSTableViewDelegate> {
   NSTableView* _table;
   onramp::ArrayController* _controller;

@@ -91,10 +91,10 @@ CGFloat leastNameWidth(NSCell* cell) {
   [self showSelection];
 }
 
-// Makes every column except the first one at least as wide as its text. The first column shows
-// names. If necessary, this column gets narrower, but it keeps room for its title and for 24
-// letters. If the table is still too narrow, makes the window wider. Does nothing if there is only
-// one column.
+// Makes every column except the first one at least as wide as its title and its texts. The first
+// column shows names. If necessary, this column gets narrower, but it keeps room for its title and
+// for 24 letters. If the table is still too narrow, makes the window wider. Does nothing if there
+// is only one column.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;
@@ -176,8 +176,8 @@ CGFloat leastNameWidth(NSCell* cell) {
   return -1;
 }
 
-// Passes the user's selection to the controller. If the user has deselected the row, selects it
-// again.
+// Passes the user's selection to the controller. If no row is selected now, selects the
+// controller's row again.
 - (void)tableViewSelectionDidChange:(NSNotification*)notification {
   if (_isShowingSelection) return;
   const NSInteger row = [_table selectedRow];

@@ -46,7 +46,7 @@ std::function<void()> nextAction() {
   if (!hasAction()) return std::move(loop.timers.extract(loop.timers.begin()).mapped());
   std::function<void()> action = std::move(loop.actions.front());
   loop.actions.pop_front();
-  // A due timer must not wait forever because actions keep arriving.
+  // Without this, a due timer might never run while actions keep arriving.
   if (!loop.timers.empty() && loop.timers.begin()->first <= Clock::now()) {
     loop.actions.push_back(std::move(loop.timers.extract(loop.timers.begin()).mapped()));
   }

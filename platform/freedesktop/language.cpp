@@ -15,8 +15,7 @@ struct Renamed {
   std::string_view to;
 };
 
-// Language names that bundles used before there were language codes, and codes that have since been
-// replaced.
+// Language names that bundles used before they used codes, and outdated codes.
 constexpr std::array kRenamed = {
     Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},
     Renamed{"japanese", "ja"},  Renamed{"italian", "it"}, Renamed{"spanish", "es"},

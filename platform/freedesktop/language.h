@@ -10,8 +10,8 @@ namespace onramp {
 /// media, "German".
 struct Language {
   std::string code;  ///< ISO 639, in lower case; empty when the identifier is malformed
-  /// ISO 15924, such as "Hans"; empty when not given. For Chinese without a script, this is the
-  /// usual script of the region.
+  /// ISO 15924, such as "Hans"; empty when not given. For Chinese without a script, this is "Hant"
+  /// if the region is TW, HK or MO, and "Hans" otherwise.
   std::string script;
   std::string region;  ///< ISO 3166, in upper case; empty when not given
 

@@ -6,7 +6,7 @@
 
 namespace onramp::libplist {
 
-/// Returns whether `bytes` are a binary property list that libplist can build within the limits in
+/// Returns whether `bytes` are a binary property list that libplist can read within the limits in
 /// platform/property_list.h. The format is "bplist00": a header, objects, a table of their offsets
 /// and a trailer of 32 bytes. Every object that can be reached from the root must be of a known
 /// kind and lie before the table. Keys must be strings, and no UTF-16 string may contain a null

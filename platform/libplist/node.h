@@ -22,7 +22,7 @@ using Node = std::unique_ptr<std::remove_pointer_t<plist_t>, NodeFree>;
 
 /// Converts `value` to a node that XML can express. Malformed UTF-8 and characters that XML does
 /// not allow become the replacement character. Dates are rounded down to whole seconds and limited
-/// to the years 1 to 9999.
+/// to the years 1 to 9999. A date that is not a number becomes the reference date.
 [[nodiscard]] Node nodeOf(const Value& value);
 
 }  // namespace onramp::libplist

@@ -40,8 +40,8 @@ std::vector<QPointer<QWidget>>& hiddenWindows() {
   return windows;
 }
 
-// Reads the options. Exits after --help or --version, and with an error message if an option is
-// invalid.
+// Reads the options, and sets the system version if they give one. Exits after --help or --version.
+// If an option is invalid, prints an error and exits.
 void readCommandLine(const QStringList& arguments) {
   QCommandLineParser parser;
   parser.setApplicationDescription(
@@ -80,7 +80,7 @@ bool asksForInformation(int argc, char** argv) {
 
 // Handles Qt's messages while the application object is created. Qt sends a fatal message if there
 // is no display, and would then abort the process. This function prints an error and exits instead.
-// Also drops all other messages, except when QT_DEBUG_PLUGINS is set.
+// Drops all other messages, unless QT_DEBUG_PLUGINS is set.
 void exitWithoutDisplay(QtMsgType type, const QMessageLogContext&, const QString& message) {
   if (type == QtFatalMsg) {
     std::fprintf(stderr,

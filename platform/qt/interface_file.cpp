@@ -39,8 +39,8 @@ class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;
 
-  /// Returns the loader that all interface files share. Creating a loader takes as long as loading
-  /// a file.
+  /// Returns the loader that all interface files share. Without sharing, each file would take twice
+  /// as long to load.
   static Loader& shared() {
     static Loader* const loader = makeWithoutPlugIns();
     return *loader;
@@ -123,7 +123,8 @@ void bindTitle(QWidget* widget, KeyValueTexts& texts) {
   });
 }
 
-// Makes a click on a button perform the owner's action that its property "action" names.
+// The property "action" of a button names one of the owner's actions. Makes a click on the button
+// perform this action.
 void connectAction(QWidget* widget, InterfaceOwner& owner) {
   auto* const button = qobject_cast<QAbstractButton*>(widget);
   const std::string action = widget->property("action").toString().toStdString();
@@ -163,7 +164,7 @@ bool isOfKind(const QObject* object, OutletKind kind) {
 }  // namespace
 
 // Owns the root widget. While a page is shown, its root widget is also a child of the window. If
-// the window is destroyed before the page, it destroys the root widget, and `root` becomes null.
+// the window is destroyed first, the root widget is destroyed with it, and `root` becomes null.
 struct Interface::Tree {
   explicit Tree(QWidget* widget) : root(widget) {}
   Tree(const Tree&) = delete;

@@ -67,7 +67,7 @@ class ColumnsWidget final : public FramedView<QTreeView> {
   void resizeEvent(QResizeEvent* event) override;
 
  private:
-  /// Returns the width needed to show every cell of the column in full.
+  /// Returns the width that the column needs to show its header and all its cells in full.
   [[nodiscard]] int neededWidth(int column) const;
 
   /// Returns the total width that all columns except the first one need.

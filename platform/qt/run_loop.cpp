@@ -23,8 +23,8 @@ std::vector<QEventLoop*>& modalLoops() {
 }
 
 // True from abortModal() until the modal loop has returned, or until the main thread has found that
-// no loop is running. Meanwhile, posted actions wait for the end of the loop, because each of them
-// could block the main thread for seconds.
+// no loop is running. Meanwhile, actions of performOnMainThread() wait for the end of the loop,
+// because each of them could delay this end by seconds.
 std::atomic<bool> isAborting = false;
 
 }  // namespace

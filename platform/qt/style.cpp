@@ -115,7 +115,7 @@ void Style::drawPrimitive(PrimitiveElement element, const QStyleOption* option, 
   if (element != PE_FrameFocusRect) {
     QProxyStyle::drawPrimitive(element, option, painter, widget);
     if (element == PE_IndicatorRadioButton) drawOutline(*painter, *option);
-  } else if (!isList(widget)) {  // drawControl() draws a list's ring around all rows
+  } else if (!isList(widget)) {  // drawControl() draws a focused list's ring, around all rows
     drawRing(*painter, option->rect, option->palette.color(QPalette::Highlight));
   }
 }
@@ -147,8 +147,8 @@ QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, con
   const QSize normal = QProxyStyle::sizeFromContents(type, option, size, widget);
   // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
-  // In front of the text, Fusion draws a column for check marks, which is as wide as the item is
-  // high. If the text is large, the width that Fusion computes has no room for this column.
+  // In front of the text, Fusion reserves a column that is as wide as the item is high, for check
+  // marks. If the text is large, the width that Fusion computes leaves no room for this column.
   if (type == CT_MenuItem) return normal + QSize(normal.height(), 0);
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

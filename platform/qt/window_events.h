@@ -25,8 +25,8 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Beeps. If a spinner is visible, also shows the text beside it in the title bar until the
-  /// spinner stops.
+  /// Beeps. If a spinner is visible, also adds the text beside the spinner to the window's title
+  /// until the spinner stops.
   void explainRefusal();
 
   /// Returns whether the key did anything.
@@ -42,7 +42,7 @@ class WindowEvents final : public QObject {
 
   QWidget* window_;
   ApplicationDelegate& delegate_;
-  bool isExplained_ = false;  ///< the title bar shows the text beside the spinner
+  bool isExplained_ = false;  ///< the window's title includes the text beside the spinner
 };
 
 }  // namespace qt

@@ -4,7 +4,7 @@
 
 #import <AppKit/AppKit.h>
 
-// Declares the AppKit methods that the front end uses but GNUstep's headers lack.
+// Declares the AppKit methods that the front end and its interface files use but GNUstep lacks.
 
 @interface NSView (OnrampIdentification)
 - (NSString*)identifier;

@@ -1,7 +1,7 @@
-// When the application hides itself, hides its windows without putting icons in their place, as
-// AppKit does. GNUstep would replace each window with an icon, because the application has no icon
-// that the user could click. If a window came back before its icon had appeared, it would not
-// always get the keyboard focus.
+// When the application hides itself, hides its windows as AppKit does, without putting icons in
+// their place. GNUstep would replace each window with an icon, because the application has no icon
+// that the user could click. If a window came back before its icon had appeared, the window would
+// not always get the keyboard focus.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"
