@@ -7,7 +7,7 @@
 
 namespace onramp {
 
-/// Unicode's replacement character, which stands for a character that is invalid or not allowed.
+/// Unicode's replacement character, which replaces a malformed or forbidden character.
 inline constexpr char32_t kReplacementCharacter = 0xFFFD;
 
 /// Appends `character` to `text` in UTF-8. Appends the replacement character for a surrogate or a
