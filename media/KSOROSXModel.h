@@ -29,8 +29,8 @@ inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< b
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name);
 
 /// Returns the record of the model `name` according to `modelInfoPlist`. A model that is not listed
-/// there supports USB only and has an empty identifier. A listed model supports USB only, unless its
-/// entry says otherwise. If the entry of a listed model has no identifier ("KSCID"), the record
+/// there supports USB only and has an empty identifier. A listed model supports USB only, unless
+/// its entry says otherwise. If the entry of a listed model has no identifier ("KSCID"), the record
 /// holds only the name. When `name` has no value, the record is empty.
 [[nodiscard]] Dictionary initWithName(const std::optional<std::string>& name,
                                       const std::optional<Dictionary>& modelInfoPlist);
