@@ -13,8 +13,8 @@ namespace onramp::qt {
 namespace {
 
 // Returns a tool tip that shows `text`, which may be too long for its column. If `text` looks like
-// markup, escapes it. Otherwise, Qt would show `text` as rich text, and the name of a device could
-// make Qt load pictures.
+// markup, escapes it, because Qt would show it as rich text, and the name of a device could make Qt
+// load pictures.
 QString toolTip(const QString& text) {
   return Qt::mightBeRichText(text) ? Qt::convertFromPlainText(text) : text;
 }

@@ -28,8 +28,8 @@ void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.restore();
 }
 
-// Returns the colour of the default button, which is the colour of selections. If the title is
-// lighter than this colour, darkens the colour until the title can be read.
+// Returns the colour for the default button: the colour of selections, darkened until the button's
+// title can be read. Does not darken the colour if the title is darker than it.
 QColor defaultButtonColor(const QPalette& palette) {
   QColor color = palette.color(QPalette::Highlight);
   const int title = qGray(palette.color(QPalette::HighlightedText).rgb());
@@ -148,7 +148,7 @@ QSize Style::sizeFromContents(ContentsType type, const QStyleOption* option, con
   // Rows that are a little taller than their text are easier to read and to click.
   if (type == CT_ItemViewItem) return normal.expandedTo(QSize(0, ListModel::rowHeight()));
   // In front of the text, Fusion draws a column for check marks, which is as wide as the item is
-  // high. If the text is large, the width that Fusion computes has no room for this column.
+  // high. If the text is large, the width that Fusion computes leaves no room for this column.
   if (type == CT_MenuItem) return normal + QSize(normal.height(), 0);
   if (type != CT_PushButton) return normal;
   return normal + QSize(2 * kRoomBesideTitle, 2 * kRoomAboveTitle);

@@ -54,9 +54,9 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
   }
 }
 
-// Tells the controller which row the user has selected. If no row is selected now, selects the
-// controller's row again. Assistive technology can cause this by deselecting the old row before
-// selecting a new one. Both rows are then selected for a moment, and `added` has only the new one.
+// Tells the controller which row the user has selected. If no row is selected, selects the
+// controller's row again. Assistive technology may deselect the old row before it selects a new
+// one. For a moment, both rows are then selected, but `added` contains only the new one.
 void takeSelection(QAbstractItemView* view, ArrayController& controller,
                    const QItemSelection& added) {
   if (!view->selectionModel()->hasSelection()) {

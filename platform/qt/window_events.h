@@ -25,7 +25,7 @@ class WindowEvents final : public QObject {
  private:
   void close();
 
-  /// Beeps. If a spinner is visible, also shows the text beside it in the title bar until the
+  /// Beeps. If a spinner is visible, also adds the text beside it to the window's title until the
   /// spinner stops.
   void explainRefusal();
 
@@ -42,7 +42,7 @@ class WindowEvents final : public QObject {
 
   QWidget* window_;
   ApplicationDelegate& delegate_;
-  bool isExplained_ = false;  ///< the title bar shows the text beside the spinner
+  bool isExplained_ = false;  ///< the window's title contains the text beside the spinner
 };
 
 }  // namespace qt
