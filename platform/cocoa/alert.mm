@@ -7,8 +7,8 @@
 #import "platform/cocoa/retained.h"
 #import "platform/cocoa/text.h"
 
-/// The delegate of one sheet. When the sheet closes, calls the function given to the initializer
-/// with kAlertOtherReturn or kAlertDefaultReturn, and releases itself.
+/// The delegate of one sheet. When the sheet closes, passes kAlertOtherReturn or
+/// kAlertDefaultReturn to the initializer's function, and releases itself.
 @interface OnrampSheetEnd : NSObject {
   std::function<void(int)> _didEnd;
 }

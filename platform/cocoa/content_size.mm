@@ -43,7 +43,7 @@ class ButtonRow {
   explicit ButtonRow(NSView* content) : content_(content) {}
 
   /// Returns how much wider the content view must be for the visible buttons. The result is
-  /// negative if it is wider than necessary.
+  /// negative if that view is wider than necessary.
   [[nodiscard]] CGFloat missingWidth() const {
     CGFloat needed = leftEdge() + NSWidth([content_ bounds]) - rightEdge();
     CGFloat gap = 0;
@@ -55,8 +55,8 @@ class ButtonRow {
     return needed - NSWidth([content_ bounds]);
   }
 
-  /// Places the visible buttons side by side. Buttons that are attached to the right edge start
-  /// there, and the others start at the left edge.
+  /// Places the visible buttons side by side. The last button that is attached to the right edge
+  /// ends there, and the first of the others starts at the left edge.
   void layOut() const {
     CGFloat left = leftEdge();
     CGFloat right = rightEdge();
@@ -202,7 +202,8 @@ CGFloat missingHeightInside(NSView* view) {
   return missingHere > 0 ? std::max(missing, missingHere - spareHeight(view)) : missing;
 }
 
-// Makes a text field taller by `height`, and moves or shortens the other views in `parent`.
+// Makes a text field taller by `height`, and moves or shortens the views in `parent` that are in
+// the way.
 void grow(NSView* field, CGFloat height, NSView* parent) {
   const NSRect old = [field frame];
   const bool isOnTop = hangsOnTop(field);
@@ -233,8 +234,8 @@ CGFloat startWithin(CGFloat least, CGFloat greatest, CGFloat start, CGFloat leng
   return std::max(least, std::min(std::floor(start), greatest - length));
 }
 
-// Enlarges a window by `width` and `height`, but not beyond the size of the screen. Keeps the
-// window's middle in place as far as possible.
+// Enlarges a window by `width` and `height`, but not beyond the size of the screen. Negative values
+// count as 0. Keeps the window's middle in place as far as possible.
 void enlarge(NSWindow* window, CGFloat width, CGFloat height) {
   NSScreen* const screen = [window screen] ? [window screen] : [NSScreen mainScreen];
   const NSRect bounds = [screen visibleFrame];

@@ -89,8 +89,9 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// Makes buttons perform their actions on `owner`. Skips buttons that have no action or already have
-// a target. The interface file connects the other buttons to the first responder, not to a target.
+// Makes a click on a button in `view` perform the owner's action that the interface file names.
+// Skips buttons that have no action or already have a target. The other buttons have no target,
+// because the file connects them to the first responder.
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {

@@ -7,7 +7,7 @@ class ArrayController;
 }
 
 /// Shows an array controller's entries in a table, and keeps the selections of the table and of the
-/// controller equal. A double-click on a row clicks the window's default button.
+/// controller in sync. A double-click on a row clicks the window's default button.
 @interface OnrampTableSource : NSObject <NSTableViewDataSource, NSTableViewDelegate> {
   NSTableView* _table;
   onramp::ArrayController* _controller;

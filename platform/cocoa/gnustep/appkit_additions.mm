@@ -72,8 +72,8 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
                              arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
-// Returns the size that a text field's wrapped text has within `bounds`. GNUstep's own function
-// returns the size of the text on a single line.
+// For a text field, returns the size of its text when wrapped to fit `bounds`. GNUstep's own
+// function returns the size of the text on a single line.
 NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
   if (![self isKindOfClass:[NSTextFieldCell class]]) return [self cellSize];
   return [[self attributedStringValue] boundingRectWithSize:bounds.size

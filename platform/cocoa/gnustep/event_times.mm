@@ -1,8 +1,8 @@
 // GNUstep stores the time of the last event. This file prevents the stored time from going
 // backwards. Requests for the keyboard focus carry this time, and the window manager refuses a
-// request whose time looks old. GNUstep also stores a number from each "_NET_WM_PING" message,
-// which is not always a time. The window manager Openbox, for example, sends a count that starts at
-// one.
+// request whose time looks old. GNUstep also stores a number from each "_NET_WM_PING" message.
+// This number is not always a time: the window manager Openbox, for example, sends a count that
+// starts at one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"

@@ -1,5 +1,5 @@
-// When the application hides itself, hides its windows without putting icons in their place, as
-// AppKit does. GNUstep would replace each window with an icon, because the application has no icon
+// As in AppKit, an application that hides itself hides its windows without putting icons in their
+// place. GNUstep would replace each window with an icon, because the application has no icon
 // that the user could click. If a window came back before its icon had appeared, it would not
 // always get the keyboard focus.
 
