@@ -37,8 +37,8 @@ bool hasEnded = false;  // main thread only
 
 void runMainLoop() {
   hasEnded = false;
-  // CFRunLoopRunInMode() returns after it has handled a source, or after 0.1 seconds. If the loop
-  // has neither sources nor timers, it returns at once. So this loop repeats the call until an
+  // CFRunLoopRunInMode() returns after it has handled a source, or after 0.1 seconds. If there
+  // are neither sources nor timers, it returns at once. So this loop repeats the call until an
   // action has called endMainLoop().
   while (!hasEnded)
     CFRunLoopRunInMode(kCFRunLoopDefaultMode, 0.1, true);

@@ -46,7 +46,8 @@ std::function<void()> nextAction() {
   if (!hasAction()) return std::move(loop.timers.extract(loop.timers.begin()).mapped());
   std::function<void()> action = std::move(loop.actions.front());
   loop.actions.pop_front();
-  // A due timer must not wait forever because actions keep arriving.
+  // Queues a due timer's action, because the timer would otherwise wait for as long as further
+  // actions keep arriving.
   if (!loop.timers.empty() && loop.timers.begin()->first <= Clock::now()) {
     loop.actions.push_back(std::move(loop.timers.extract(loop.timers.begin()).mapped()));
   }

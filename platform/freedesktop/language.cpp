@@ -15,7 +15,7 @@ struct Renamed {
   std::string_view to;
 };
 
-// Language names that bundles used before there were language codes, and codes that have since been
+// Language names, which bundles used before they used language codes, and codes that ISO 639 has
 // replaced.
 constexpr std::array kRenamed = {
     Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},

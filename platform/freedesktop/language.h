@@ -11,7 +11,7 @@ namespace onramp {
 struct Language {
   std::string code;  ///< ISO 639, in lower case; empty when the identifier is malformed
   /// ISO 15924, such as "Hans"; empty when not given. For Chinese without a script, this is the
-  /// usual script of the region.
+  /// usual script of the region, or "Hans" without a region.
   std::string script;
   std::string region;  ///< ISO 3166, in upper case; empty when not given
 

@@ -21,7 +21,7 @@ std::optional<std::string> programOnPath(std::string_view name) {
     const std::size_t end = rest.find(':');
     const std::string folder(rest.substr(0, end));
     rest.remove_prefix(end == std::string_view::npos ? rest.size() : end + 1);
-    // An empty entry means the current folder. To run programs from there would be unsafe.
+    // An empty entry means the current folder. Running programs from there would be unsafe.
     if (folder.empty()) continue;
     std::string program = folder + "/" + std::string(name);
     std::error_code ignored;

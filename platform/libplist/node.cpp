@@ -26,9 +26,9 @@ template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
 // libplist's functions for integers do not distinguish -1 from 2^64-1, and its functions for dates
-// keep only 32 bits. A binary list keeps every bit, so each integer and date is converted through a
-// binary list of one object. In a binary list, an 8-byte integer begins with kInteger8, a 16-byte
-// integer with kInteger16, and a date with kDate8.
+// keep only 32 bits. A binary list keeps every bit, so dates, and integers where necessary, are
+// converted through a binary list of one object. In a binary list, an 8-byte integer begins with
+// kInteger8, a 16-byte integer with kInteger16, and a date with kDate8.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;
@@ -129,8 +129,7 @@ Value dictionaryOf(plist_t node) {
 }
 
 // Replaces malformed UTF-8, and characters that XML 1.0 does not allow, with the replacement
-// character. XML allows no control characters except tab, line feed and carriage return, not even
-// as references.
+// character. Below U+0020, XML allows only tab, line feed and carriage return, even as references.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());
