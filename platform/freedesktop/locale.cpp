@@ -45,7 +45,7 @@ std::string localeCountryCode() {
 std::vector<std::string> preferredLanguages() {
   const std::string locale = messagesLocale();
   if (locale.empty()) return {kDefaultLanguage};
-  // As in gettext, the list in LANGUAGE is ignored when the locale is not set, C or POSIX.
+  // As in gettext, LANGUAGE is ignored when no locale is set or when the locale is C or POSIX.
   const std::string list = environment("LANGUAGE") + ":" + locale;
   std::vector<std::string> languages;
   for (std::size_t at = 0; at <= list.size();) {
