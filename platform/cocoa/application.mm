@@ -40,7 +40,7 @@
   return _delegate->applicationShouldTerminateAfterLastWindowClosed();
 }
 
-// Lets the user quit only if the window may close. After terminateApplication(), always quits.
+// Lets the user quit only if the window may close. After terminateApplication(), always allows it.
 - (NSApplicationTerminateReply)applicationShouldTerminate:(NSApplication*)application {
   if (onramp::isTerminating() || _delegate->windowShouldClose(_window)) return NSTerminateNow;
   NSBeep();

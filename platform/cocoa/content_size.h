@@ -9,10 +9,10 @@ namespace onramp::cocoa {
 /// as described below. Call this whenever a text has changed or a view has been shown or hidden.
 /// Does nothing when `window` is nil.
 ///
-/// A text field that is attached to the top of its superview grows downwards. Any other text field
-/// grows upwards. A list in the same superview makes room by getting shorter, down to six rows. If
-/// that is not enough, the window gets taller. The buttons directly inside the window's content
-/// view form a row. The interface file must list them from left to right.
+/// A text field that is too small for its text grows: downwards if it is attached to the top of its
+/// superview, otherwise upwards. A list in the same superview makes room by getting shorter, down
+/// to six rows. If that is not enough, the window gets taller. The buttons directly inside the
+/// window's content view form a row. The interface file must list them from left to right.
 void fitWindow(NSWindow* window);
 
 }  // namespace onramp::cocoa

@@ -55,8 +55,8 @@ class ButtonRow {
     return needed - NSWidth([content_ bounds]);
   }
 
-  /// Places the visible buttons side by side. Buttons that are attached to the right edge start
-  /// there, and the others start at the left edge.
+  /// Places the visible buttons side by side. The last button that is attached to the right edge
+  /// ends there, and the first of the others starts at the left edge.
   void layOut() const {
     CGFloat left = leftEdge();
     CGFloat right = rightEdge();

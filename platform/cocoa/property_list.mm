@@ -46,8 +46,8 @@ class Reader {
   }
 
   // Adds `bytes` to the total size of the copied strings and data. This size can exceed the size of
-  // the file, because containers can share an object but each value gets a copy. So the copies
-  // together have the same limit as a file. Each UTF-16 unit of a string counts as one byte.
+  // the file, because an object that several containers share is copied for each of them. So the
+  // copies together have the same limit as a file. Each UTF-16 unit of a string counts as one byte.
   // Returns false if the limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;

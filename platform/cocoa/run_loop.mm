@@ -31,8 +31,8 @@ bool isModalAborted = false;
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while
-// `action` runs a modal loop. Destroys `action` right after running it, on the same thread, because
-// any thread may release the object.
+// `action` runs a modal loop. The object destroys `action` right after running it, on the same
+// thread, because any thread may release the object.
 OnrampAction* once(std::function<void()> action) {
   return [OnrampAction actionWithFunction:[action = std::move(action)]() mutable {
     if (const auto pending = std::exchange(action, nullptr)) pending();

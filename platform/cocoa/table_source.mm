@@ -12,8 +12,8 @@ namespace {
 constexpr CGFloat kCellPadding = 6;  // points
 constexpr NSUInteger kLeastNameLetters = 24;
 
-// Returns the enabled, visible button in `view` that the Return key presses, or nil if there is
-// none.
+// Returns the first enabled button in `view` that the Return key clicks and that is not hidden
+// itself, or nil if there is none.
 NSButton* defaultButton(NSView* view) {
   if ([view isKindOfClass:[NSButton class]] && ![view isHidden]) {
     NSButton* const button = static_cast<NSButton*>(view);

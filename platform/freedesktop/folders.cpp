@@ -12,8 +12,8 @@ namespace onramp {
 
 namespace {
 
-// Returns an absolute `path` without its trailing slashes. Returns an empty string for a relative
-// path, because programs must ignore relative paths in the XDG base directory variables.
+// Returns `path` without its trailing slashes if it is absolute. Otherwise returns an empty string,
+// because programs must ignore relative paths in the XDG base directory variables.
 std::string absolutePath(std::string_view path) {
   while (path.size() > 1 && path.ends_with('/'))
     path.remove_suffix(1);

@@ -129,8 +129,7 @@ Value dictionaryOf(plist_t node) {
 }
 
 // Replaces malformed UTF-8, and characters that XML 1.0 does not allow, with the replacement
-// character. XML allows no control characters except tab, line feed and carriage return, not even
-// as references.
+// character. Below U+0020, XML allows only tab, line feed and carriage return, even as references.
 std::string writable(std::string_view text) {
   std::string result;
   result.reserve(text.size());

@@ -15,8 +15,8 @@ namespace {
 constexpr std::size_t kNone = std::string::npos;
 
 // Limits the work of libplist that grows quadratically with the size of the list. One cause is a
-// dictionary with many keys, which libplist hashes into a fixed number of chains. The other is a
-// text with many entities, because libplist moves the rest of the text at each entity.
+// dictionary with many keys, because libplist hashes the keys into a fixed number of chains. The
+// other is a text with many entities, because libplist moves the rest of the text at each entity.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {

@@ -12,7 +12,7 @@ namespace onramp::libplist {
 /// because libplist would read an integer with leading zeros as octal. Returns nothing in these
 /// cases:
 /// - `text` exceeds the limits in platform/property_list.h or would take libplist too many steps;
-/// - `text` has a null character or containers that are not properly nested;
+/// - `text` has a null character, unfinished markup or containers that are not properly nested;
 /// - `text` has markup that libplist might parse differently from this check, such as a document
 ///   type with an internal subset.
 /// In these cases, stores the place and the reason in `problem`.

@@ -33,8 +33,9 @@ QString textOf(std::string_view text) {
 }
 
 // Creates the widgets of an interface file, including those that this front end defines. In the
-// file, the root widget of a page has the page's class, which is not a widget class. For a page's
-// class, creates a plain widget and stores the name of the class in the property kViewClass.
+// file, the root widget of a page has the page's class, which is not a widget class. For any class
+// that is not a widget class, creates a plain widget and stores the name of the class in the
+// property kViewClass.
 class Loader final : public QUiLoader {
  public:
   using QUiLoader::QUiLoader;

@@ -21,7 +21,7 @@ class ListModel final : public QAbstractTableModel {
   /// Returns the height of a row, including some space around its text.
   [[nodiscard]] static int rowHeight();
 
-  /// Shows the entries of `controller` from now on.
+  /// Shows the entries of `controller`, which must outlive the model.
   void setController(const ArrayController& controller);
 
   /// Call this when the controller's entries have changed.

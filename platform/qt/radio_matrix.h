@@ -12,7 +12,7 @@ class RadioMatrixWidget final : public QWidget {
  public:
   using QWidget::QWidget;
 
-  /// Returns the button at that row and column, or null if there is none.
+  /// Returns the button at `row` and `column`, or null if there is none.
   [[nodiscard]] QRadioButton* cell(int row, int column) const;
 
   /// Returns the row of the selected button, or 0 if no button is selected.

@@ -28,8 +28,8 @@ void drawRing(QPainter& painter, const QRect& around, const QColor& color) {
   painter.restore();
 }
 
-// Returns the colour of the default button, which is the colour of selections. If the title is
-// lighter than this colour, darkens the colour until the title can be read.
+// Returns the colour for the default button: the colour of selections. If the button's title is not
+// darker than this colour, darkens the colour until the title can be read.
 QColor defaultButtonColor(const QPalette& palette) {
   QColor color = palette.color(QPalette::Highlight);
   const int title = qGray(palette.color(QPalette::HighlightedText).rgb());

@@ -14,7 +14,7 @@ Implementation* replaceMethod(Class owner, SEL selector, Implementation* replace
 }
 
 /// Adds an instance method to the class `owner`. Replaces any method that the class already has for
-/// that selector. The method takes one BOOL and returns void.
+/// `selector`. The method takes one BOOL and returns void.
 inline void addMethod(Class owner, SEL selector, void (*implementation)(id, SEL, BOOL)) {
   class_replaceMethod(owner, selector, reinterpret_cast<IMP>(implementation), "v@:c");
 }
