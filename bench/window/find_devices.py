@@ -33,8 +33,8 @@ TYPE = "_pdl-datastream._tcp"
 
 
 def time_of_tools(count):
-    """Returns how many seconds it takes in all to resolve `count` devices with avahi-browse and then
-    ask each of them with snmpget."""
+    """Returns how many seconds it takes in all to resolve `count` devices with avahi-browse and
+    then ask each of them with snmpget."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
                     stderr=subprocess.DEVNULL, text=True)
