@@ -13,9 +13,9 @@
 namespace onramp {
 
 // All browsers post these notifications on the default notification centre, with a null `object`,
-// and observe them there. Each notification carries a NetServiceRef under kServiceInfo. It carries
-// the browse flags, an unsigned long, under kAddFlagInfo in kAddNotification, and under
-// kRemoveFlagsInfo in kRemoveNotification.
+// and observe them there. Each notification carries a NetServiceRef under kServiceInfo.
+// kAddNotification also carries the browse flags, an unsigned long, under kAddFlagInfo.
+// kRemoveNotification carries them under kRemoveFlagsInfo.
 inline constexpr std::string_view kAddNotification = "addNotificationInternal";
 inline constexpr std::string_view kRemoveNotification = "removeNotificationInternal";
 inline constexpr std::string_view kResolvedNotification = "resolveNotificationInternal";
@@ -72,8 +72,8 @@ class KSBonjour {
   /// forwards the events of other browsers.
   void startBrowsing();
 
-  /// Stops browsing, cancels all unfinished resolves and discards the table. Does not call the
-  /// observers. Does nothing when the browser is idle.
+  /// Stops browsing, cancels the resolves of services for which didServiceResolved() is false, and
+  /// discards the table. Does not call the observers. Does nothing when the browser is idle.
   void stopBrowsing();
 
   // These functions handle the three notifications above.

@@ -9,8 +9,8 @@ namespace onramp {
 
 namespace {
 
-// Returns an empty string for a null service, but nothing for a service without the value. So the
-// record's model name is one space for a null service, but empty for a service without a
+// Returns an empty string for a null service, otherwise the result of `read`, which may be nothing.
+// So the record's model name is one space for a null service, but empty for a service without a
 // manufacturer or model.
 std::optional<std::string> textOf(const NetServiceRef& service,
                                   std::optional<std::string> (*read)(const NetServiceRef&)) {

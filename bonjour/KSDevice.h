@@ -27,9 +27,9 @@ class KSDevice {
   static constexpr std::string_view kDeviceURI = "device URI";           ///< string
   static constexpr std::string_view kIPAddressList = "IP address list";  ///< array of strings
 
-  /// Makes the record of `service`, which may be null. `types` becomes the record's
-  /// kBonjourServiceType: the service types under which the device was found. If `types` has no
-  /// value, this array is empty.
+  /// Makes the record of `service`, which may be null. `types` are the service types under which
+  /// the device was found. The record holds them under kBonjourServiceType, or an empty array if
+  /// `types` has no value.
   [[nodiscard]] static Dictionary initWithService(const NetServiceRef& service,
                                                   const std::optional<Array>& types);
 };

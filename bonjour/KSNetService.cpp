@@ -11,8 +11,8 @@ namespace onramp {
 namespace {
 
 // NetService::addressing() returns socket addresses in the BSD layout on every system. These
-// constants are the offsets of the address family and of an IPv4 address, and the number of the
-// IPv4 family.
+// constants are the offset of the address family, the offset and the size of an IPv4 address, and
+// the number of the IPv4 family.
 constexpr std::size_t kFamilyOffset = 1;
 constexpr std::size_t kIPv4Offset = 4;
 constexpr std::size_t kIPv4Size = 4;

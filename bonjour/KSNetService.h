@@ -8,7 +8,7 @@
 
 namespace onramp {
 
-// Operations on network services, on which the classes in bonjour/ are built. A function that
+// The classes in bonjour/ are built on these operations on network services. A function that
 // returns an int returns 0 on success and 1 on failure. A function that reads a service returns
 // nothing or false if the service is null. All functions must be called on the main thread.
 
@@ -41,7 +41,7 @@ int KSNetServiceResolveAsync(const NetServiceRef& service, ServiceClientCallback
 /// service.
 int KSNetServiceCancelResolve(const NetServiceRef& service);
 
-/// Cancels any running resolve of `service`, then resolves it. Blocks until the resolve ends or
+/// Cancels any running resolve of `service` and starts a new one. Blocks until the new one ends or
 /// `timeout` seconds have passed. A timeout of 0 or less means no limit. Returns 1 if the service
 /// is null or the resolve fails or times out.
 int KSNetServiceResolveSync(const NetServiceRef& service, double timeout);
@@ -103,7 +103,8 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 [[nodiscard]] bool KSNetServiceSupportsURF(const NetServiceRef& service);
 
 /// The client function of every browser. `info` is null or points to a ServiceClientCallbacks.
-/// Calls the `add` or `remove` of `info`, or neither if `error` reports a failure.
+/// If `flags` contains kNetServiceFlagRemove, calls the `remove` of `info`, otherwise the `add`.
+/// Calls nothing if `error` reports a failure.
 void KSNetServiceBrowseCallBack(const NetServiceBrowserRef& browser, unsigned long flags,
                                 const NetServiceRef& service, const NetServiceError& error,
                                 void* info);

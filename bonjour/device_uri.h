@@ -25,8 +25,8 @@ struct ServiceInstance {
 /// Returns the service instance in a URI of the form scheme://name.type.domain. The scheme and the
 /// name may be empty, and the name may contain percent escapes. The result's domain is always
 /// "local.". Returns nothing when the URI has another form, when the part after the type does not
-/// contain "local.", or when percentUnescaped() rejects the name. The type ends at the first
-/// "_tcp." or, if there is none, at the first "_udp.". So a name that contains "_tcp." or "_udp."
+/// contain "local.", or when percentUnescaped() rejects the name. The type ends with the first
+/// "_tcp." or, if there is none, with the first "_udp.". So a name that contains "_tcp." or "_udp."
 /// may be misread.
 [[nodiscard]] std::optional<ServiceInstance> serviceInstanceOf(std::string_view uri);
 

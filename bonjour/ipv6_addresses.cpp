@@ -10,8 +10,8 @@ namespace onramp {
 namespace {
 
 // NetService::addressing() returns socket addresses in the BSD layout on every system. These
-// constants are the offsets of the address family and of an IPv6 address, and the number of the
-// IPv6 family, which is 30 even on Linux.
+// constants are the offset of the address family, the offset and the size of an IPv6 address, and
+// the number of the IPv6 family, which is 30 even on Linux.
 constexpr std::size_t kFamilyPlace = 1;
 constexpr std::size_t kIPv6Place = 8;
 constexpr std::size_t kIPv6Length = 16;

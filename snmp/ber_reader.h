@@ -10,9 +10,9 @@
 namespace onramp {
 
 // Each of these functions reads one part of a BER encoding (X.690 section 8, as restricted by RFC
-// 1157). On success, the function moves `in` past that part and returns SNMP_OK. To refuse the
-// input, it returns SNMP_ERR_CODEC, and may leave `in` anywhere in the part. Every function refuses
-// malformed and missing bytes.
+// 1157). On success, the function moves `in` past that part and returns SNMP_OK. If it refuses the
+// part, it returns SNMP_ERR_CODEC and may leave `in` anywhere in the part. Every function refuses a
+// part that is malformed or incomplete.
 
 /// Reads a one-byte tag. Refuses a longer tag without moving `in`.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
@@ -25,8 +25,8 @@ namespace onramp {
   return SNMP_OK;
 }
 
-/// Reads a length in the short form, or in the long form of one or two bytes. Does not check
-/// whether the input has that many bytes left.
+/// Reads a length in the short form, or in the long form with a number of one or two bytes. Does
+/// not check whether the input has that many bytes left.
 [[nodiscard]] inline snmp_status ber_get_length(ByteReader& in, std::uint16_t& length) {
   const auto first = in.byte();
   if (!first) return SNMP_ERR_CODEC;

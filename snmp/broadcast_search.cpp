@@ -23,7 +23,7 @@ constexpr const char* kLoopbackAddress = "127.0.0.1";
 constexpr int kReceiveAttempts = 256;
 constexpr std::chrono::seconds kListening{5};
 
-// Room for kReceiveAttempts replies, each as large as an Ethernet frame.
+// Room for kReceiveAttempts replies, each of which fits in an Ethernet frame.
 constexpr std::size_t kReceiveBufferSize = std::size_t{kReceiveAttempts} * 2048;
 
 std::chrono::seconds wholeSeconds() {
@@ -42,7 +42,8 @@ std::optional<DatagramSocket> openBroadcastSocket() {
   return socket;
 }
 
-// Waits for one datagram and receives it. Returns the values of a valid reply, otherwise nothing.
+// Waits for one datagram and receives it. Returns the result of a valid reply without an error
+// status, otherwise nothing.
 std::optional<Dictionary> receiveResult(DatagramSocket& socket, snmp_table_request& request) {
   snmp_packet reply{};
   if (!socket.waitReadable(kReceiveWait)) return std::nullopt;

@@ -11,11 +11,11 @@ namespace onramp {
 /// snmp_table_request::result() makes from valid replies without an error status, in order of
 /// arrival. There are at most 256 dictionaries for each interface. A device that replies twice has
 /// two dictionaries, because neither the request identifier nor the sender of a reply is checked.
-/// Does not report a failure to send, after which the interface has no results. The program does
-/// not call this function.
+/// If the request cannot be sent on an interface, the interface has no results and the failure is
+/// not reported. The program does not call this function.
 ///
 /// For each interface, blocks for up to 2 seconds to send, and then for 5 to 8 seconds to receive.
-/// Receiving also ends after 256 attempts. Returns an empty array at once when all interfaces are
+/// Receiving ends early after 256 attempts. Returns an empty array at once when all interfaces are
 /// skipped or the list of interfaces cannot be read.
 [[nodiscard]] Array snmp_broadcast_search(mib_table& table);
 

@@ -42,7 +42,7 @@ namespace onramp {
 /// binding, so decoding usually fails.
 ///
 /// Returns SNMP_ERR_CODEC when:
-/// - a function of snmp/ber_reader.h refuses the bytes, such as an integer of more than four bytes,
+/// - a function of snmp/ber_reader.h refuses a part, such as an integer of more than four bytes,
 /// - an expected tag is missing,
 /// - the declared length of the list of bindings exceeds the number of bytes that follow,
 /// - the reply has more bindings than the array `varbinds`, or

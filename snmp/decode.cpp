@@ -41,7 +41,7 @@ snmp_status get_community(ByteReader& in, snmp_message& message) {
 }
 
 // Appends the string to the buffer that all strings of the reply share. `earlier` is the total size
-// of the strings before this one. Adds `length` to it.
+// of the strings before this one. Adds `length` to `earlier`.
 snmp_status get_string(ByteReader& in, snmp_octets* target, std::uint16_t length,
                        std::size_t& earlier) {
   if (target) {

@@ -116,7 +116,7 @@ bool snmp_active_interface_is_wireless(const Array& addresses) {
 bool snmp_active_interface_is_wireless(const Array& addresses, const snmp_ask& ask) {
   std::int64_t active_interface = 0;
   for (const Value& address : addresses) {
-    bool no_reply = false;  // never reset: one unanswered request costs all three attempts
+    bool no_reply = false;  // never reset: after one unanswered request, all attempts are made
     for (int attempt = 0; attempt < kAttemptsPerAddress; ++attempt) {
       const auto* const text = address.as<std::string>();
       const auto result = ask_twice([&] { return ask(text ? text->c_str() : nullptr, no_reply); });

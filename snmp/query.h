@@ -90,9 +90,9 @@ class snmp_table_request {
 /// Asks the device at `address`, an IPv4 address in dotted form, for the objects of `table`.
 /// Returns nothing when `table` or `address` is null, when the request fails, when the reply has an
 /// error status, and when snmp_table_request::result() returns nothing for the reply. A request
-/// fails when it cannot be sent or gets no valid reply. A failed request sets `out_no_reply` to
-/// true; otherwise it is unchanged. Stores the error status and index of a reply in the last two
-/// arguments, each of which may be null. May block as long as snmp_exchange().
+/// fails when it cannot be sent or gets no valid reply. Sets `out_no_reply` to true when the
+/// request fails, otherwise leaves it unchanged. Stores the error status and index of a reply in
+/// the last two arguments, each of which may be null. May block as long as snmp_exchange() does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
@@ -110,8 +110,8 @@ class snmp_table_request {
 /// request if the first returns no result. The first address that answers every request of its
 /// first try decides the result. Each earlier address is tried three times, with a pause of 20 ms
 /// after each try. If no address decides, the last try of the last address does. A try without a
-/// result counts as the value 0 of ActiveIF. An entry that is not a string counts as an address
-/// that answers without a result. Returns false when there are no addresses.
+/// result counts as the value 0 of ActiveIF, and so does an empty list of addresses. An entry that
+/// is not a string counts as an address that answers without a result.
 ///
 /// Blocks for about 12 seconds for each address that sends nothing back, not even a report that the
 /// port is closed.

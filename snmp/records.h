@@ -27,7 +27,7 @@ constexpr std::uint64_t kPduSet = 3;
 /// An object identifier, whose arcs are in the caller's storage. Arcs above 65,535 cannot be
 /// represented.
 struct snmp_oid {
-  std::uint16_t count = 0;     ///< the number of arcs; before decoding, the most arcs to accept
+  std::uint16_t count = 0;     ///< the number of arcs; before decoding, the maximum number
   std::uint16_t capacity = 0;  ///< size of the storage, in arcs
   std::uint16_t* arcs = nullptr;
 };
@@ -47,7 +47,7 @@ struct snmp_varbind {
   std::int64_t int_value = 0;           ///< for types 1, 2 and 65 to 67; the low 32 bits are used
   snmp_octets* octets_value = nullptr;  ///< for types 4, 64 and 68
   snmp_oid* oid_value = nullptr;        ///< for type 6
-  std::uint16_t encoded_length = 0;     ///< set by the encoder: size of name and value together
+  std::uint16_t encoded_length = 0;     ///< set by the encoder: total size of name and value
   std::uint32_t index = 0;  ///< set by the decoder: position in the reply, from 0; see snmp_set()
 };
 

@@ -8,8 +8,8 @@ last service that it resolves.
 Full cache: both programs run on the host of the services, whose Avahi daemon knows all of them.
 Empty cache: a second host searches. Its Avahi daemon is restarted before every search.
 
-Without --json, the program also measures a search that keeps running after it has found everything
-in the full cache, and prints its processor time.
+Without --json, this program also lets a search run on after it has found everything in the full
+cache, and prints the processor time that the search takes.
 """
 
 import argparse

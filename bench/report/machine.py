@@ -29,7 +29,7 @@ def busy_share():
 
 
 def _times():
-    """Returns how long the processors were in each state. In states 3 and 4 they were idle."""
+    """Returns the clock ticks that the processors spent in each state. States 3 and 4 are idle."""
     first_line = pathlib.Path("/proc/stat").read_text().split("\n")[0]
     return [int(field) for field in first_line.split()[1:9]]
 

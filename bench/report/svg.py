@@ -64,7 +64,8 @@ def line(points, series):
 
 
 class LogScale:
-    """A logarithmic scale. Maps values from `low` to `high` to positions from `start` to `end`."""
+    """A logarithmic scale. Maps values between `low` and `high` to positions between `start` and
+    `end`."""
 
     def __init__(self, low, high, start, end):
         self._low, self._high = math.log10(low), math.log10(high)

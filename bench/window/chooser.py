@@ -82,7 +82,7 @@ class Chooser(Person):
         return self._atspi.CoordType.SCREEN
 
     def table(self):
-        """Returns the table of devices. Qt creates no cells when only its number of rows is
+        """Returns the table of devices. Qt creates no cells when only the number of rows is
         read."""
         return self.see("tree").get_table_iface()
 

@@ -5,9 +5,9 @@ The wizard's time runs from the key press that starts a search until the list ha
 tools' time is how long avahi-browse takes to resolve the same devices, plus how long snmpget takes
 to ask each of them.
 
-The network grows up to 200 devices. The wizard ends a search after three seconds if the list has a
-device by then, so slower devices can be missing. The program stops at the first network size for
-which a list is incomplete.
+The network grows in steps, to 200 devices at most. The wizard ends a search after three seconds if
+the list has a device by then, so slower devices can be missing. This program stops at the first
+network size for which a list is incomplete.
 """
 
 import os
@@ -33,8 +33,8 @@ TYPE = "_pdl-datastream._tcp"
 
 
 def time_of_tools(count):
-    """Returns how many seconds avahi-browse takes to resolve `count` devices, and snmpget to ask
-    each of them."""
+    """Returns how many seconds it takes in all to resolve `count` devices with avahi-browse and
+    then ask each of them with snmpget."""
     began = time.monotonic()
     browser = start(["avahi-browse", "-rp", TYPE], "avahi-utils", stdout=subprocess.PIPE,
                     stderr=subprocess.DEVNULL, text=True)
@@ -54,8 +54,8 @@ def time_of_tools(count):
 
 
 def time_of_wizard(person, count):
-    """Refreshes the list, which empties it. Returns the seconds until the list has `count` rows, or
-    None if it has fewer after PATIENCE seconds."""
+    """Makes the wizard empty the list and search again. Returns the seconds until the list has
+    `count` rows again, or None if this takes longer than PATIENCE seconds."""
     table = person.table()
     began = person.refresh()
     emptied = False

@@ -39,7 +39,7 @@ from practice_network import PracticeNetwork
 
 CHECKPOINT_EVERY = 10  # searches
 SEARCHES_AT_CHECKPOINT = 3  # at most
-WARM_UP = 0.1          # the growth leaves out this first part of the run
+WARM_UP = 0.1          # the growth leaves out this fraction of the run, at its start
 
 
 def memory(process):
@@ -149,7 +149,7 @@ class Soak:
 
 
 def soak(desktop, medium, text, devices, seconds):
-    """Searches for `seconds` and returns whether all lists were right."""
+    """Searches again and again for `seconds` seconds. Returns whether all lists were right."""
     with Chooser(desktop, medium, text) as person:
         person.go_there()
         with Ear(person) as ear:
