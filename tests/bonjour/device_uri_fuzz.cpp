@@ -1,5 +1,5 @@
-// Parses each input as a device URI and as a URL. Then escapes and unescapes the input. If it is
-// UTF-8 and not ambiguous as a service's name, also makes and parses the service's device URI.
+// Parses each input as a device URI and as a URL. Then escapes and unescapes it. If it is UTF-8 and
+// not ambiguous as a service's name, also parses the device URI of a service with this name.
 
 #include <cstdint>
 #include <cstdlib>

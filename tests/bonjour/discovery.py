@@ -16,7 +16,7 @@ PATIENCE = 30  # seconds to wait for an event before the test fails
 
 
 def enclose(description):
-    """Restarts this program on a practice network of two hosts, unless it is already running on one.
+    """Unless this program is running on a practice network, restarts it on one with two hosts.
 
     `description` is the network's description file.
     """
@@ -28,7 +28,7 @@ def enclose(description):
 
 class Search:
     """A running `bonjour_probe search`. Each line of its output becomes an event, a list of fields:
-    the time, a word such as "found", the device's name, and details."""
+    the time, a word such as "found", the device's name (after "start", the type), and details."""
 
     def __init__(self, probe, service_type, **options):
         self._process = subprocess.Popen([probe, "search", service_type + "."], text=True,
@@ -63,7 +63,7 @@ class Search:
             return condition()
 
     def wait_for(self, word, name, count=1):
-        """Waits for `count` events with this word and name, and returns the latest one."""
+        """Waits for at least `count` events with this word and name, and returns the latest one."""
         return self.wait(lambda: len(self.events(word, name)) >= count and
                          self.events(word, name)[-1])
 
@@ -100,8 +100,8 @@ class Avahi:
         os.kill(self._pid(), signal.SIGCONT)
 
     def start(self, **settings):
-        """Starts the daemon. Each of `settings` replaces a setting in the configuration file. The
-        argument's name has "_" where the name in the file has "-"."""
+        """Starts the daemon with a copy of its configuration file, in which each of `settings`
+        replaces a setting. The argument's name has "_" where the name in the file has "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

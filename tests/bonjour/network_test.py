@@ -1,8 +1,8 @@
 """Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM [CLASS]
 
 The tests run on one of two hosts. Two cables, each with IPv4 and IPv6, connect the hosts. On the
-other host, Avahi announces devices. One test announces a device from this host with zeroconf,
-another mDNS implementation."""
+other host, Avahi announces devices. One test also announces a device from the tests' own host, with
+zeroconf, another mDNS implementation."""
 
 import os
 import pathlib
@@ -34,8 +34,8 @@ def packets():
 
 
 def asked(seen, last):
-    """Waits for an SNMP request to the address `last`. Returns the destinations of all SNMP
-    requests up to this one."""
+    """Reads from the socket `seen` until an SNMP request goes to the address `last`. Returns the
+    destinations of all SNMP requests up to this one."""
     addresses = []
     while last not in addresses:
         packet = seen.recv(100)
@@ -120,7 +120,7 @@ class Devices(Network):
                         self.network.remove("Dual")
                         search.wait_for("remove", "Dual")
                         # Before Avahi announces a new device, it checks that the name is free.
-                        # Meanwhile, all sightings of the removed device disappear.
+                        # Meanwhile, the removed device disappears on all interfaces and protocols.
                         self.add("Next")
                         search.wait_for("update", "Next")
                         self.assertEqual([event[1] for event in search.events(None, "Dual")],

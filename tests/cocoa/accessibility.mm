@@ -9,8 +9,8 @@
 // "application"), "name", "states" and "presses" (the number of left mouse button presses in its
 // windows so far). Each of the remaining objects describes a visible window or control, and has the
 // keys "role", "name", "states", "x", "y", "width" and "height". Roles and states have their AT-SPI
-// names, except that the state "cut off" marks text that does not fit. Lengths are in pixels, and x
-// and y start at the screen's upper left corner.
+// names. The state "cut off", which AT-SPI lacks, marks text that does not fit. Lengths are in
+// pixels, and x and y start at the screen's upper left corner.
 
 #include <unistd.h>
 
@@ -39,7 +39,7 @@ NSString* nameOf(NSPopUpButton* button) {
   return [[button toolTip] length] > 0 ? [button toolTip] : [button title];
 }
 
-// Collects the controls of one window.
+// Describes one window and its controls.
 class Reader {
  public:
   Reader(NSWindow* window, NSMutableArray* found) : window_(window), found_(found) {}
@@ -91,15 +91,14 @@ class Reader {
   }
 
   // Adds the state "cut off" if the text of `cell` does not fit into `room`. Skips texts in panels,
-  // because GNUstep, not the wizard, lays out panels.
+  // because GNUstep, not the wizard, lays them out.
   void checkRoom(NSCell* cell, NSRect room, NSMutableArray* states) {
     const NSSize needed = [cell cellSizeForBounds:NSMakeRect(0, 0, NSWidth(room), kUnlimited)];
     const bool fits = needed.width <= NSWidth(room) && needed.height <= NSHeight(room);
     if (!fits && ![window_ isKindOfClass:[NSPanel class]]) [states addObject:@"cut off"];
   }
 
-  // Reports each row of a table without headers as a list item, and each cell of a table with
-  // headers as a table cell.
+  // Reports each visible cell: as a table cell if the table has headers, otherwise as a list item.
   void readTable(NSTableView* table) {
     NSString* const role = [table headerView] ? @"table cell" : @"list item";
     const NSRange rows = [table rowsInRect:[table visibleRect]];

@@ -22,7 +22,10 @@ _MENU_BAR_ITEM = "Onramp OSX"
 
 
 class GNUstepPerson(Person):
-    """Starts a program on a desktop and uses its window. A `with` statement terminates the program."""
+    """A person who uses one program with the Cocoa front end.
+
+    The constructor starts the program on a desktop, and leaving the `with` statement terminates it.
+    """
 
     follows_desktop = False
     errors = ()  # using a control that is gone raises no error
@@ -58,9 +61,9 @@ class GNUstepPerson(Person):
         before = self._noticed_presses()
         self.desktop.run(["xdotool", "mousedown", "1"])
         # Holds the mouse button down until the application has counted the press, for at most
-        # `patience` seconds. If the button were released sooner, GNUstep could find it up when it
+        # `patience` seconds. If the button were released sooner, it could be up when GNUstep
         # handles the press. The application cannot count a press inside an open menu, because the
-        # menu grabs the mouse. So callers wait only briefly there.
+        # menu grabs the mouse. So `patience` is short there.
         patience = _MENU_PRESS_SECONDS if control["role"] == "menu item" else _PRESS_SECONDS
         deadline = time.monotonic() + patience
         while self._noticed_presses() == before and time.monotonic() < deadline:
@@ -161,7 +164,7 @@ class GNUstepPerson(Person):
 
     @staticmethod
     def _options_as_environment(arguments):
-        """Turns options into environment variables, as the Cocoa front end has no options."""
+        """Turns an option into a variable, because the Cocoa front end has no options."""
         if not arguments:
             return {}
         option, value = arguments

@@ -68,7 +68,7 @@ TEST(Desktop, OpensWithoutWaitingAndLeavesNoZombie) {
   recording::MediumFolder medium;
   const std::string gate = medium.path("gate");
   const std::string opened = medium.path("opened");
-  // The opener waits for input from the pipe `gate`. Then it writes to the file `opened`: the
+  // This xdg-open, the opener, waits for input from the pipe `gate`. Then it writes to `opened` the
   // number of its arguments, the first argument, and whether it leads its own session.
   medium.write("bin/xdg-open", "#!/bin/sh\ntimeout 60 cat '" + gate +
                                    "' > /dev/null\nwords=\"$#:$1\"\n" +

@@ -36,8 +36,8 @@ std::string binary(const std::vector<std::string>& objects, int offsetSize = 4,
 }
 
 // Returns a binary list whose root is a dictionary with one value, object 2. Besides the dictionary
-// and its key, the list has `count` objects, numbered from 2. `object(i)` returns the
-// bytes of object i.
+// and its key, the list has `count` objects, numbered from 2. `object(i)` returns the bytes of
+// object i.
 std::string dictionaryOver(std::size_t count,
                            const std::function<std::string(std::size_t)>& object) {
   std::vector<std::string> objects{"\xD1" + bigEndian(1) + bigEndian(2), "\x51k"};

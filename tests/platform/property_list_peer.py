@@ -1,6 +1,6 @@
 """Reads and writes property lists with Python's own library. "write XML BINARY" writes a list with every
-kind of value to the two files. "check FILE" fails with a message if FILE does not hold the same
-list."""
+kind of value to the files XML and BINARY. "check FILE" fails with a message if FILE does not hold the
+same list."""
 
 import datetime
 import math

@@ -16,7 +16,7 @@ using std::chrono::milliseconds;
 using std::chrono::steady_clock;
 
 // Returns the value of ActiveIF from the agent at `address`, or nothing when the agent does not
-// answer.
+// answer in time.
 std::optional<std::int64_t> ask(const char* address) {
   bool noReply = false;
   const auto result = snmp_query_table(&active_interface_table, address, noReply, nullptr, nullptr);

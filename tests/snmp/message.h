@@ -22,7 +22,7 @@ inline std::vector<std::uint8_t> hex(std::string_view text) {
   return bytes;
 }
 
-/// Returns net-snmp's reply to a request for ActiveIF with the identifier 7. The value is 2.
+/// Returns net-snmp's reply to request 7, which asks for ActiveIF. The value is 2.
 inline std::vector<std::uint8_t> realReply() {
   return hex(
       "30 30 02 01 00 04 08 63 6f 72 72 69 64 6f 72 a2 21 02 01 07 02 01 00 02 01 00 30 16 30 14 "

@@ -1,7 +1,7 @@
 // Uses each input as an agent's reply to a query, a get and a set. The buffers for the results have
 // no spare room, so the sanitizers report any write past their end. If the input can be decoded,
-// also encodes the result and decodes it again, unless one of its names or values cannot be encoded
-// and decoded.
+// also encodes the decoded message and decodes it again. Skips messages with a name or value that
+// cannot be encoded and decoded.
 
 #include <algorithm>
 #include <array>

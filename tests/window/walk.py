@@ -6,7 +6,8 @@ Usage: walk.py [--seed S] [--count N] MEDIUM
 MEDIUM is the folder of a medium with the application on it. The seeds of the N walks are S, S + 1 and so
 on, so `--seed S --count 1` repeats the choices of the walk with the seed S. A walk fails, for example,
 when the program exits with an error, when the main loop hangs, when the window cannot be closed at the
-end, or when a file for the package is incomplete. A failed walk prints its seed and its steps.
+end, or when the wizard writes an incomplete file for the installer package. A failed walk prints its seed
+and its steps.
 """
 
 import argparse
@@ -117,7 +118,7 @@ class Walk:
             self.devices[name] = True
         elif self.dice.random() < 0.5:
             # Switches between the wizard's service type and another one, so the device leaves or
-            # returns. It still answers, because the wizard may still ask it.
+            # returns. A removed device could not answer, but the wizard may still ask it.
             self.devices[name] = not self.devices[name]
             self.network.set(name, type=PRINTER if self.devices[name] else "_ipp._tcp")
         else:

@@ -31,7 +31,7 @@ OPTIONS = {"PKG_WebLink": True, "PKG_KestrelOnline": False, "PKG_RemoteTool": Fa
 
 
 class WayTest(unittest.TestCase):
-    """Starts the wizard on a new medium for each test. A Person uses the wizard."""
+    """start() starts the wizard on a new medium, and returns the Person who uses the wizard."""
 
     @classmethod
     def setUpClass(cls):
@@ -55,7 +55,8 @@ class WayTest(unittest.TestCase):
             person.press("F10")
 
     def files(self):
-        """Returns the contents of the files for the package by short names such as "instmodel"."""
+        """Returns the contents of the files that the wizard wrote for the package. The keys are short
+        names such as "instmodel"."""
         found = {}
         for folder in (self.desktop.user_folder, self.desktop.local_folder):
             for path in folder.rglob("com.kestrelimaging.*"):

@@ -33,7 +33,7 @@ TEST(PropertyList, ExchangesEveryKindOfValueWithAnotherImplementation) {
   EXPECT_EQ(runAndWait(PYTHON, {PEER, "check", folder / "written"}), 0);
   EXPECT_EQ(loadDictionary(folder / "written"), *read);
 
-  // The checks above would miss a reader that misreads a value and writes it back unchanged.
+  // The checks above would miss an error in reading that writing reverses.
   const Dictionary known{{"true", true},
                          {"least", std::numeric_limits<std::int64_t>::min()},
                          {"greatest", std::numeric_limits<std::uint64_t>::max()},

@@ -14,8 +14,8 @@ struct SCDynamicStoreContext {
 
 namespace standin {
 
-/// A session with the store. The answer to a request holds the request's keys or patterns, and also
-/// a value whose type the backend does not know.
+/// A session with the store. SCDynamicStoreCopyMultiple() returns the keys or the patterns that it
+/// was asked for, and also a value whose type the backend does not know.
 struct Store : Object {
   Store() : Object(kOther) { last = this; }
   ~Store() override {
