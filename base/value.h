@@ -64,7 +64,7 @@ class Dictionary {
   [[nodiscard]] std::size_t size() const;
   [[nodiscard]] bool empty() const { return size() == 0; }
 
-  /// The pairs in ascending byte order of their keys.
+  /// The pairs, sorted by the bytes of their keys in ascending order.
   [[nodiscard]] const Pair* begin() const;
   [[nodiscard]] const Pair* end() const;
 

@@ -5,9 +5,10 @@
 
 #include "netconfig/local_address_list.h"
 
-/// The functions below share one cached list of the computer's addresses. They must be called on
-/// the main thread.
 namespace onramp {
+
+// These functions share one cached list of the computer's addresses. They must be called on the
+// main thread.
 
 /// Fills the cache if it is empty. From then on, until the process exits, replaces the cached list
 /// whenever an interface's IPv4 configuration changes. Failures are not reported; they leave the

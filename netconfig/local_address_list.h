@@ -9,11 +9,11 @@
 
 namespace onramp {
 
-/// The computer's IPv4 addresses when the list was made. The list has one dictionary for every
-/// interface with an IPv4 entity in the dynamic store (platform/dynamic_store.h), in no particular
-/// order. Each dictionary has arrays of strings in dotted form under kSCPropNetIPv4Addresses,
-/// kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks. Any of these arrays may be
-/// missing. A null pointer means that there is no list.
+/// The computer's IPv4 addresses as they were when the list was made. The list has one dictionary
+/// for every interface with an IPv4 entity in the dynamic store (platform/dynamic_store.h), in no
+/// particular order. Each dictionary has arrays of strings in dotted form under
+/// kSCPropNetIPv4Addresses, kSCPropNetIPv4BroadcastAddresses and kSCPropNetIPv4SubnetMasks. Any of
+/// these arrays may be missing. A null pointer means that there is no list.
 using local_address_list = std::shared_ptr<const Array>;
 
 /// KSSysConfigCopyCurrentLocalAddressList() returns this status for an invalid argument.
@@ -29,9 +29,9 @@ int KSSysConfigCopyCurrentLocalAddressList(local_address_list* out_list);
 /// Returns the number of interfaces in `list`, or 0 for a null list.
 [[nodiscard]] std::size_t local_address_list_count(const local_address_list& list);
 
-/// Returns the first string of the array under `key` in the list's entry `index`. Returns null when
-/// the list is null or has no entry `index`, and when the entry's array is missing, is empty or
-/// does not begin with a string. The result points into the list.
+/// Returns the first element of the array under `key` in the list's entry `index`. Returns null
+/// when the list is null or has no entry `index`, and when the array is missing, is empty or does
+/// not begin with a string. The result points into the list.
 [[nodiscard]] const std::string* local_address_list_value(const local_address_list& list,
                                                           std::size_t index, std::string_view key);
 

@@ -6,8 +6,8 @@
 
 namespace onramp {
 
-// Information about service discovery for diagnostic programs. The wizard does not use this header.
-// Call all functions on the main thread.
+// For diagnostic programs: information about service discovery. The wizard does not use this
+// header. Call all functions on the main thread.
 
 /// Returns the reason, in English, why the system's service discovery does not work. Returns
 /// nothing when no reason is known. May block until the system answers. A search can be started
@@ -15,9 +15,10 @@ namespace onramp {
 [[nodiscard]] std::optional<std::string> discoveryProblem();
 
 /// A report that a NetServiceBrowser's search has seen a service on one network interface and
-/// protocol, or no longer sees it there. (The browser's client learns only of a service's first
-/// sighting and of the loss of its last sighting.) Services are not reported as gone when the
-/// search ends, when the search stops covering their domain, or when discovery stops working.
+/// protocol, or no longer sees it there. (The browser's client is told only when a service is
+/// first seen anywhere, and when it is no longer seen anywhere.) Services are not reported as gone
+/// when the search ends, when the search stops covering their domain, or when discovery stops
+/// working.
 struct ServiceSighting {
   std::string name;       ///< see NetService::name()
   std::string type;       ///< see NetService::type()
@@ -28,7 +29,7 @@ struct ServiceSighting {
 };
 
 /// Makes all searches call `watch` on the main thread for each sighting. Replaces the function that
-/// an earlier call has set. An empty `watch` stops the calls. The backend for macOS never calls
+/// an earlier call set. An empty `watch` stops the calls. The backend for macOS never calls
 /// `watch`, because macOS does not report the interface of a sighting.
 void watchSightings(std::function<void(const ServiceSighting&)> watch);
 

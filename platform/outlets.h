@@ -120,7 +120,7 @@ struct Image {
 
 enum class ImageScaling {
   kProportionallyDown,  ///< shown in the image's size, or scaled down to fit the view
-  kAxesIndependently,   ///< stretched to fill the view; Qt hides it in a dark colour scheme
+  kAxesIndependently,   ///< stretched to fill the view; not drawn by Qt in dark colour schemes
 };
 
 class ImageView : public View {

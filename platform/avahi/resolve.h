@@ -20,7 +20,7 @@ struct Resolution {
   Data txt;
 };
 
-/// The host and the port that offer a service, and the data of the service's TXT record.
+/// The host and port on which a service is offered, and the data of the service's TXT record.
 struct Server {
   std::string host;  ///< a domain name with escapes and without a trailing dot
   std::uint16_t port = 0;
@@ -40,8 +40,8 @@ class Resolve {
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
-  /// Returns whether the daemon cannot look up the service because its name, type or domain is
-  /// invalid.
+  /// Returns whether the daemon has refused to look up the service, whose name, type or domain is
+  /// then invalid.
   [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:

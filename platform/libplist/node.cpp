@@ -26,9 +26,10 @@ template <typename T>
 using Owned = std::unique_ptr<T, Free>;
 
 // libplist's functions for integers do not distinguish -1 from 2^64-1, and its functions for dates
-// keep only 32 bits. A binary list keeps every bit, so integers and dates are converted through a
-// binary list of one object, except for reading an integer from 0 to 2^63-1. In a binary list, an
-// 8-byte integer begins with kInteger8, a 16-byte integer with kInteger16, and a date with kDate8.
+// keep only 32 bits. A binary list keeps every bit, so integers and dates are read and written
+// through a binary list of one object. (Only integers between 0 and 2^63-1 are read directly.) In a
+// binary list, an 8-byte integer begins with kInteger8, a 16-byte integer with kInteger16, and a
+// date with kDate8.
 constexpr char kInteger8 = 0x13;
 constexpr char kInteger16 = 0x14;
 constexpr char kDate8 = 0x33;

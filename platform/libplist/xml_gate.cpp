@@ -81,8 +81,9 @@ class XMLWalk {
     return true;
   }
 
-  // Refuses the list and returns false when skipPast() has found an `end` between quotation marks,
-  // or when the skipped markup contains one of the characters in `refused`.
+  // Refuses the list and returns false when the markup that skipPast() has skipped contains an odd
+  // number of quotation marks, because its end is then inside quotation marks, or when it contains
+  // one of the characters in `refused`.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
       return refuse("markup with a quotation mark that is never closed", start_);

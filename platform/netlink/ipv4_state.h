@@ -7,9 +7,10 @@
 
 namespace onramp::netlink {
 
-/// Reads the IPv4 state from the kernel through `socket`. Returns every entry that
-/// platform/dynamic_store.h promises, under its key. Includes the global entry only if `withGlobal`
-/// is true, because all routes must be read for it. Returns nothing when the state cannot be read.
+/// Reads the IPv4 state from the kernel through `socket`. Returns the entries that
+/// platform/dynamic_store.h promises, each under its key. Leaves out the global entry, for which
+/// all routes must be read, unless `withGlobal` is true. Returns nothing when the state cannot be
+/// read.
 ///
 /// A default route of the main table is usable if it has a next hop that is not dead. Of the usable
 /// default routes, the first one with the lowest metric is preferred. The primary interface is the

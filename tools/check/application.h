@@ -10,8 +10,8 @@ inline constexpr const char* kUsualName = "Onramp OSX.app";
 
 /// Returns the name of the application in `root`, the medium's top folder. If there are several,
 /// returns the first in alphabetical order whose name is kUsualName or whose Info.plist has
-/// "CommonResourcePath". If none of them qualifies, returns the first of all. Returns an empty
-/// string when there is no application.
+/// "CommonResourcePath". If there is no such application, returns the alphabetically first one.
+/// Returns an empty string when there is none at all.
 [[nodiscard]] std::string findApplication(const std::string& root);
 
 /// Returns whether the application `name` in the folder `root` is a wizard: its name is kUsualName,

@@ -9,7 +9,7 @@ namespace onramp::check {
 
 namespace {
 
-// Returns how to write a maximum that includes all of the major version `major`.
+// Returns advice on how to write a maximum that includes all of the major version `major`.
 std::string supportAllOf(std::int64_t major) {
   return "to support all of " + std::to_string(major) + ", write " + std::to_string(major + 1) +
          ", 0, 0";
@@ -88,8 +88,8 @@ class RangeCheck {
   }
 
   // Warns when the range ends with minor version 0 of macOS 11 or later, such as 14.0, but begins
-  // in an earlier major version. Leaves out maximums before macOS 11, because there each yearly
-  // release was a minor version.
+  // in an earlier major version. Ignores maximums before macOS 11, because until then each
+  // yearly release was a minor version.
   void checkFirstMinorVersion() {
     constexpr std::int64_t kFirstYearlyMajor = 11;
     const Dictionary& maximum = range_.maximum();

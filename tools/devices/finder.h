@@ -19,8 +19,8 @@ namespace onramp::devices {
 /// functions must be called on the main thread.
 class Finder final : public KSBonjourObserver, public std::enable_shared_from_this<Finder> {
  public:
-  /// Called when a service of `device` is found or is gone, and when the service that provides the
-  /// device's addresses is resolved.
+  /// Called when a service of `device` is found or disappears, and when the service that provides
+  /// the device's addresses is resolved.
   using Changed = std::function<void(Device& device)>;
 
   /// A device may have services of several types. The finder uses the addresses and TXT record of

@@ -36,8 +36,8 @@ def check_packages():
 def _free_display():
     """Returns a random display number that no X server uses.
 
-    An X server does not notice that a server in another network namespace has the same number, and
-    removes that server's socket. So this function looks for the socket.
+    An X server cannot detect a server with the same number in another network namespace, and would
+    remove that server's socket. So this function looks for the socket.
     """
     while True:
         number = random.randrange(100, 50000)
@@ -49,9 +49,9 @@ class Desktop:
     """A context manager that starts a desktop, and stops its programs at the end.
 
     On the desktop, xdg-open only records the path or address that it should open. A process can use
-    only one desktop, because its accessibility library stays on the first desktop's bus. If
-    `window_manager` is false, the desktop has no window manager. If `dense` is true, the screen is
-    large enough for the wizard at a scale of 200 %.
+    only one desktop, because its accessibility library stays connected to the first desktop's bus.
+    If `window_manager` is false, the desktop has no window manager. If `dense` is true, the screen
+    is large enough for the wizard at a scale of 200 %.
     """
 
     def __init__(self, window_manager=True, dense=True):

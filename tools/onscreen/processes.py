@@ -10,7 +10,8 @@ _libc = ctypes.CDLL(None, use_errno=True)
 
 
 class Missing(Exception):
-    """Raised when a program is not installed or does not start. The message names the program."""
+    """Raised when a program is not installed or does not start. The message says what is
+    missing."""
 
 
 class InVain(TimeoutError):

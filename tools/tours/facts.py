@@ -38,7 +38,7 @@ class Model:
 
 
 class Facts:
-    """The models, languages and mistakes of the medium in `folder`."""
+    """The models and languages of the medium in `folder`, and the mistakes on it."""
 
     def __init__(self, folder):
         program = os.environ.get("ONRAMP_CHECK", str(_BUILT))
@@ -60,8 +60,8 @@ class Facts:
         return [model.name for model in self.models]
 
     def kinds(self):
-        """Returns one model for each combination of connections. Prefers a model whose name a
-        device can announce: a maker, a space and a model."""
+        """Returns one model for each combination of connections. A device can announce a name only
+        if it consists of a maker, a space and a model. Prefers models with such a name."""
         chosen = {}
         for model in self.models:
             known = chosen.get(model.kind)
@@ -77,7 +77,7 @@ class Facts:
         return " ".join(said)
 
     def without_tool(self):
-        """Returns what users see because the medium names no wireless set-up tool, or names a file
-        instead of an application's folder. Returns "" otherwise."""
+        """If the medium names no wireless set-up tool, or names a file instead of an application's
+        folder, returns the effect that users see. Returns "" otherwise."""
         return next((finding["effect"] for finding in self.findings
                      if finding["id"] in ("tool-none", "tool-no-bundle")), "")
