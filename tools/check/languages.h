@@ -29,9 +29,9 @@ inline constexpr std::string_view kLanguageFolder = ".lproj";
                                                    const std::string& resources,
                                                    const std::string& table = "");
 
-/// Returns whether `name` is the name of a language, such as "de", "zh_TW", "zh-Hans-CN" or
-/// "German". Returns false if `name` begins with a country code that is easily taken for a language
-/// code, such as "jp".
+/// Returns whether `name` has the form of a language code, such as "de", "zh_TW" or "zh-Hans-CN",
+/// or is an English name that old media use, such as "German". Returns false if `name` begins with
+/// a country code that is easily taken for a language code, such as "jp".
 [[nodiscard]] bool isLanguage(const std::string& name);
 
 /// If `name` begins with a country code that is easily taken for a language code, returns the code

@@ -21,9 +21,9 @@ void writeJSON(std::ostream& out, const Report& report);
 /// whether a medium needs it, and the path of keys.
 void writeKeys(std::ostream& out);
 
-/// Writes a line for every text that the wizard shows from the message bundle: the text's key, the
-/// room for it, what is shown if the medium lacks it, where it is shown and, if "%@" must occur in
-/// it, how often.
+/// Writes a line for every text that the wizard shows from the message bundle. The line has the
+/// text's key, the room for the text, what is shown if the medium lacks the text, and where the
+/// text is shown. If the text must contain "%@", the line also says how often.
 void writeTexts(std::ostream& out);
 
 }  // namespace onramp::check

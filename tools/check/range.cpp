@@ -88,8 +88,8 @@ class RangeCheck {
   }
 
   // Warns when the range ends with minor version 0 of macOS 11 or later, such as 14.0, but begins
-  // in an earlier major version. Ignores maximums before macOS 11, because until then each
-  // yearly release was a minor version.
+  // in an earlier major version. Ignores maximums before macOS 11, because until then each yearly
+  // release was a minor version.
   void checkFirstMinorVersion() {
     constexpr std::int64_t kFirstYearlyMajor = 11;
     const Dictionary& maximum = range_.maximum();
