@@ -40,8 +40,9 @@ IDLE_SECONDS = 30
 
 
 def seconds_until(count, command, name_of):
-    """Runs `command` until it has named `count` services or its output ends. Returns the seconds
-    that this took. `name_of` returns the service that a line of output names, or None."""
+    """Runs `command` until it has named `count` services, and returns the seconds that this took.
+    `name_of` returns the service that a line of output names, or None. Ends this program with a
+    message if the output ends first."""
     started = time.monotonic()
     with subprocess.Popen(command, stdin=subprocess.PIPE, stdout=subprocess.PIPE,
                           stderr=subprocess.DEVNULL, text=True) as process:
@@ -49,10 +50,11 @@ def seconds_until(count, command, name_of):
         for line in process.stdout:
             names.add(name_of(line))
             if len(names - {None}) == count:
-                break
-        needed = time.monotonic() - started
-        process.terminate()
-    return needed
+                needed = time.monotonic() - started
+                process.terminate()
+                return needed
+    sys.exit(f"{command[0]} ended with status {process.returncode} after it had named "
+             f"{len(names - {None})} of {count} services, so there is nothing to compare")
 
 
 def peer(count):
