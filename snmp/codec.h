@@ -9,11 +9,12 @@
 namespace onramp {
 
 /// Encodes `message` (RFC 1157 section 4) at the start of `out_buffer` and stores the size of the
-/// encoding in `out_length`. Sets the `encoded_length` of each encoded binding. Replaces each
-/// negative integer in `message`, except the values of types 65 to 67, with the unsigned number
-/// that has the same bytes (ber_put_int()). For example, -1 becomes 255, so a second call encodes
-/// 255. If the `type` of a binding is not 1, 2, 4, 5, 6 or 64 to 68, encodes the binding without a
-/// value.
+/// encoding in `out_length`. Sets the `encoded_length` of each encoded binding. If the `type` of a
+/// binding is not 1, 2, 4, 5, 6 or 64 to 68, encodes the binding without a value.
+///
+/// Changes each negative integer in `message`, except the values of types 65 to 67, to the unsigned
+/// number that its encoded bytes stand for (ber_put_int()). For example, -1 is encoded as the byte
+/// 255 and becomes 255, so a second call encodes 255.
 ///
 /// Returns SNMP_ERR_CODEC when:
 /// - the message does not fit in the buffer or is longer than 65,535 bytes,
@@ -45,7 +46,7 @@ namespace onramp {
 /// - a function of snmp/ber_reader.h refuses a part, such as an integer of more than four bytes,
 /// - an expected tag is missing,
 /// - the declared length of the list of bindings exceeds the number of bytes that follow,
-/// - the reply has more bindings than the array `varbinds`, or
+/// - the reply has more bindings than fit in the array `varbinds`, or
 /// - the record for a name or value is missing or too small. An empty string needs no record.
 ///
 /// Parts that were decoded before the error stay in `message`.

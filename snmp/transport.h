@@ -12,7 +12,7 @@
 
 namespace onramp {
 
-/// The largest size in bytes of a reply datagram, and of all strings of a reply together.
+/// The maximum size of a reply datagram, and of all strings in a reply together, in bytes.
 constexpr std::uint16_t kReplySize = 1500;
 
 /// A buffer for one encoded message.

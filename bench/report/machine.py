@@ -20,8 +20,8 @@ def describe():
 
 
 def busy_share():
-    """Watches the machine for two seconds. Returns the share of the processors that were busy in
-    this time, from 0 to 1. Call this while no benchmark runs."""
+    """Watches the machine for two seconds. Returns the share of the processors' time that was not
+    idle, from 0 to 1. Call this while no benchmark is running."""
     before = _times()
     time.sleep(_WATCH_SECONDS)
     spent = [after - earlier for earlier, after in zip(before, _times())]
@@ -35,7 +35,7 @@ def _times():
 
 
 def noise():
-    """Returns a case in which `ours` and `peer` time the same work and differ only by noise."""
+    """Returns a case whose `ours` and `peer` are times of the same work, and differ only by noise."""
     def work():
         began = time.perf_counter()
         hashlib.sha256(_BLOCK).digest()

@@ -1,7 +1,7 @@
 #!/usr/bin/python3
 """Compares the wizard's search with avahi-browse and snmpget on the same practice network.
 
-The wizard's time runs from the key press that starts a search until the list has all devices. The
+The wizard's time runs from the key press that starts a search until the list shows all devices. The
 tools' time is how long avahi-browse takes to resolve the same devices, plus how long snmpget takes
 to ask each of them.
 
@@ -28,7 +28,7 @@ from report.cases import Case, Report, parser
 
 COUNTS, QUICK_COUNTS = (1, 10, 50, 100, 200), (1, 50, 100)
 ROUNDS, QUICK_ROUNDS = 9, 5
-PATIENCE = 10  # seconds; a search that finds a device within nine seconds ends earlier
+PATIENCE = 10  # seconds; a search that lists a device within nine seconds has ended by then
 TYPE = "_pdl-datastream._tcp"
 
 
@@ -63,7 +63,7 @@ def time_of_wizard(person, count):
         emptied = emptied or table.get_n_rows() < count
         if time.monotonic() - began > PATIENCE:
             return None
-        time.sleep(0.002)  # each request takes some of the wizard's time
+        time.sleep(0.002)  # the wizard spends some time on each get_n_rows()
     passed = time.monotonic() - began
     person.wait()
     return passed

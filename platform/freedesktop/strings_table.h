@@ -14,8 +14,8 @@ namespace onramp {
 /// exceeds a limit in platform/property_list.h.
 [[nodiscard]] std::optional<Dictionary> loadStringsTable(const std::string& path);
 
-/// Parses the content of a ".strings" file: pairs `"key" = "text";` in the grammar of old-style
-/// property lists, and comments. If a key has no text, the key is also the text. When a key occurs
+/// Parses the content of a ".strings" file: comments, and pairs `"key" = "text";` in the grammar of
+/// old-style property lists. If a key has no text, the key is also the text. When a key occurs
 /// more than once, the last text is used. Returns nothing when the content violates the grammar or
 /// has more than kMostPropertyListObjects pairs. In that case, stores the place and the reason in
 /// `problem`, if given.

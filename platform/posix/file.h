@@ -12,8 +12,8 @@ namespace onramp::posix {
 [[nodiscard]] std::optional<std::string> readFile(const std::string& path, std::size_t most);
 
 /// Writes `bytes` to `path` atomically: writes and flushes a temporary file in the same folder,
-/// then renames it to `path`. Returns false when a step fails. The temporary file is then removed,
-/// and an existing file at `path` is unchanged.
+/// then renames it to `path`. Returns false when a step fails. In that case, the temporary file
+/// is removed, and an existing file at `path` is unchanged.
 bool writeFileAtomically(const std::string& path, std::string_view bytes);
 
 /// Removes the file at `path`, or the folder at `path` with its contents. Also removes the

@@ -56,8 +56,8 @@ void showSelection(QAbstractItemView* view, const ArrayController& controller) {
 
 // Tells the controller which row the user has selected. If no row is selected, selects the
 // controller's row again, because assistive technology may deselect the old row before it selects
-// a new one. When it then selects the new row, both rows are selected for a moment, so this
-// function looks only at `added`, which has only the new row.
+// a new one. Both rows are then selected for a moment, so this function looks only at `added`,
+// which has only the new row.
 void takeSelection(QAbstractItemView* view, ArrayController& controller,
                    const QItemSelection& added) {
   if (!view->selectionModel()->hasSelection()) {

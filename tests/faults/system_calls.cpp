@@ -45,8 +45,8 @@ Result call(const char* name, Result failure, Parameters... arguments) {
   const bool isFailing = fails(name);
   Result result{};
   // Linux closes a descriptor even when close() reports an error, so the replacement does the
-  // same. fsync() never flushes, because flushing would take most of the tests' time and have no
-  // effect that the tests could see.
+  // same. The replacement for fsync() never flushes, because that would take most of the tests'
+  // time and have no effect that the tests could see.
   if ((!isFailing && std::string_view(name) != "fsync") || std::string_view(name) == "close") {
     result = original<Result(Parameters...)>(name)(arguments...);
   }

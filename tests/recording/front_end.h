@@ -78,7 +78,7 @@ class FrontEnd {
   // Used by this front end's implementation of platform/.
   void schedule(double seconds, std::function<void()> action);
   void open(const std::string& target);
-  std::vector<Object*> loaded;  ///< the objects of all loaded interface files, the latest last
+  std::vector<Object*> loaded;  ///< the objects of all loaded interface files, in loading order
   [[nodiscard]] Object* menuBar();
 
   // What the program did.

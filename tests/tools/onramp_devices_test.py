@@ -55,9 +55,9 @@ def tlv(tag, *parts):
 
 def reply(value=tlv(2, b"\2"), status=0, arcs=14, number=0, binding=True, seconds=0):
     """Returns a function that waits `seconds` seconds and turns a request into a reply with the
-    error status `status`. The reply has the first `arcs` of the 14 arcs of the object's name and
-    the value `value`, or neither if `binding` is false. If `number` is not 0, the reply's
-    identifier differs from the request's."""
+    error status `status`. In the reply, the object's name has only its first `arcs` arcs, at most
+    14, and the value is `value`. If `binding` is false, the reply has no name and no value. If
+    `number` is not 0, the reply's identifier differs from the request's."""
     def answer(request):
         time.sleep(seconds)
         at = request.index(b"corridor") + 12

@@ -17,7 +17,7 @@ struct Exchange {
     kError,         ///< the reply has an error status
     kOtherType,     ///< the reply has no value of type INTEGER
     kUnreadable,    ///< the reply is malformed
-    kOtherRequest,  ///< the reply has another request's identifier
+    kOtherRequest,  ///< the reply's identifier is not the request's
     kRefused,       ///< the host reported that no program uses the port
     kLate,          ///< the reply came after the wizard would have stopped waiting
     kNone,          ///< no reply came
@@ -32,7 +32,7 @@ struct Exchange {
   std::uint64_t errorStatus = 0;        ///< for kError; see RFC 1157 section 4.1.1
   std::optional<std::int64_t> value{};  ///< for kValue
   unsigned type = 0;                    ///< for kOtherType; the value's tag
-  /// Whether the reply named a different SNMP object than the request. If so, the wizard would ask
+  /// Whether the reply named a different SNMP object from the request. If so, the wizard would ask
   /// all later devices for the object that the reply named.
   bool changedQuestion = false;
 };
@@ -41,7 +41,7 @@ struct Exchange {
 struct Answer {
   bool isWireless = false;  ///< by the wizard's rules
   bool isComplete = false;  ///< false when askDevice() was stopped
-  double seconds = 0;       ///< how long the wizard's window would not respond
+  double seconds = 0;       ///< how long the wizard's window would be unresponsive
   std::vector<Exchange> exchanges;
 
   /// Returns the exchange that best explains the answer: the last one with a value or, if none has
@@ -50,9 +50,9 @@ struct Answer {
   [[nodiscard]] const Exchange* telling() const;
 };
 
-/// Asks the device at `addresses`, an array of strings, with the same requests in the same order as
-/// the wizard. Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does
-/// not change active_interface_table. May be called on any thread.
+/// Sends the device at `addresses`, an array of strings, the same requests as the wizard, in the
+/// same order. Blocks for about 12 seconds for each silent address, or until `stopped` is set. Does
+/// not change active_interface_table. May be called from any thread.
 [[nodiscard]] Answer askDevice(const Array& addresses, const std::atomic<bool>& stopped);
 
 /// Returns the name of an error status (RFC 1157 section 4.1.1), such as "noSuchName", or "error

@@ -1,11 +1,11 @@
-"""Names of devices that Avahi can publish."""
+"""Shortens the names of devices so that Avahi can publish them."""
 
 import re
 
 _LONGEST_LABEL = 63  # bytes (RFC 1035)
-# Avahi 0.8 ignores every question about a longer name. A service with such a name cannot be resolved
-# once its announcement has expired, which is after two minutes. The length includes the service's
-# type and domain, and counts each byte that Avahi escapes as four characters.
+# Avahi 0.8 ignores every question about a service whose full name is longer than this. Such a service
+# cannot be resolved once its announcement has expired, which is after two minutes. The full name
+# includes the type and domain. Each byte that Avahi escapes counts as four characters.
 _LONGEST_QUESTION = 255
 
 

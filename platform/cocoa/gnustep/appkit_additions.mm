@@ -72,8 +72,9 @@ void beginSheet(id self, SEL, NSWindow* window, id delegate, SEL didEnd, void*) 
                              arrayWithObjects:NSDefaultRunLoopMode, NSModalPanelRunLoopMode, nil]];
 }
 
-// Returns the size that a text field's wrapped text has within `bounds`, or the cell's usual size
-// for any other cell. GNUstep's own function returns the size of the text on a single line.
+// Returns the size of a text field's text when it is wrapped to fit in `bounds`. For any other
+// cell, returns the cell's usual size. GNUstep's own function returns the size of the text on a
+// single line.
 NSSize cellSizeForBounds(id self, SEL, NSRect bounds) {
   if (![self isKindOfClass:[NSTextFieldCell class]]) return [self cellSize];
   return [[self attributedStringValue] boundingRectWithSize:bounds.size
