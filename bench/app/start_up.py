@@ -1,8 +1,8 @@
 #!/usr/bin/python3
 """Compares the wizard's start-up with that of an empty window and of a similar page in plain Qt.
 
-The wizard starts from media with 10 to 10,000 models. A time runs from the start of a program until
-it draws something. The peak memory is read 0.3 seconds later.
+The wizard starts from media with 10 to 10,000 models. Each time is measured from the start of a
+program until it first draws something. The peak memory is read 0.3 seconds later.
 """
 
 import pathlib

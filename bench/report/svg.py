@@ -78,8 +78,8 @@ class LogScale:
         return self._start + part * (self._end - self._start)
 
     def ticks(self):
-        """Returns the powers of ten in the range. If the range is short, also returns 2 and 5 times
-        these powers, as far as they are in the range."""
+        """Returns the powers of ten in the range or, if the range is short, the numbers in the range
+        that are 1, 2 or 5 times a power of ten."""
         steps = (1,) if self._high - self._low > 2.2 else (1, 2, 5)
         powers = range(math.floor(self._low), math.ceil(self._high) + 1)
         values = (step * 10.0 ** power for power in powers for step in steps)

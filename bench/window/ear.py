@@ -17,7 +17,7 @@ class Silence:
 
     began: float      # time.monotonic()
     seconds: float    # excludes waits for a free processor
-    processor: float  # seconds of computing in the main thread
+    processor: float  # seconds that the main thread spent computing
 
     def __str__(self):
         return (f"{self.seconds:.2f} s, of which {self.processor:.2f} s computing and "

@@ -63,7 +63,7 @@ def time_of_wizard(person, count):
         emptied = emptied or table.get_n_rows() < count
         if time.monotonic() - began > PATIENCE:
             return None
-        time.sleep(0.002)  # the wizard spends some time on each get_n_rows()
+        time.sleep(0.002)  # the wizard spends some time on each look at the table
     passed = time.monotonic() - began
     person.wait()
     return passed

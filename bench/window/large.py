@@ -103,7 +103,7 @@ def _seconds_until_listed(person, table, count, began):
             return changed - began
         if time.monotonic() - began > WAIT_SECONDS:
             raise TimeoutError("the search did not end")
-        time.sleep(0.02)  # each request takes some of the wizard's time
+        time.sleep(0.02)  # the wizard spends some time on each look at the table
 
 
 def report(what, figures, person, ear, since=0):

@@ -39,7 +39,7 @@ from practice_network import PracticeNetwork
 
 CHECKPOINT_EVERY = 10  # searches
 SEARCHES_AT_CHECKPOINT = 3  # at most
-WARM_UP = 0.1          # the growth leaves out this fraction of the run, at its start
+WARM_UP = 0.1          # this fraction of the run, at its start, does not count for the growth
 
 
 def memory(process):

@@ -28,7 +28,8 @@ def enclose(description):
 
 class Search:
     """A running `bonjour_probe search`. Each line of its output becomes an event, a list of fields:
-    the time, a word such as "found", the device's name (after "start", the type), and details."""
+    the time, a word such as "found", a name, and details. The name is the device's or, if the word
+    is "start", the service type's."""
 
     def __init__(self, probe, service_type, **options):
         self._process = subprocess.Popen([probe, "search", service_type + "."], text=True,

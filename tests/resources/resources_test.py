@@ -64,7 +64,7 @@ def wanted_columns(page):
 
 
 def recorded_outlets(interface):
-    """Returns the names and kinds of the outlets that the recording front end has for `interface`."""
+    """Returns the names and kinds of the outlets that `interface` has in the tests' own front end."""
     text = text_of("tests/recording/interfaces.cpp")
     parts = re.search(rf'\{{"{interface}",\s*\{{(.*?)\}}\}}[,}}]', text, re.DOTALL)[1]
     return {name: kind for kind, name in re.findall(r'\{k(\w+), "(\w+)"', parts)}

@@ -9,7 +9,7 @@ def _element(tag, *parts):
 
 def reply(identifier, number, status=0):
     """Returns the bytes of a reply. `identifier` holds the bytes of the request's identifier.
-    `number`, from 0 to 32767, is the value of ActiveIF."""
+    `number`, from 0 to 32767, is the device's answer: the number of its active interface."""
     value = _element(2, number.to_bytes(2, "big"))
     pdu = _element(0xA2, _element(2, identifier), _element(2, bytes([status])), _element(2, b"\0"),
                    _element(0x30, _element(0x30, _ACTIVE_IF, value)))

@@ -63,8 +63,8 @@ def run(*command):
 
 
 def take_over_run():
-    """Mounts an empty /run in this process's mount namespace, and hides this machine's Avahi services.
-    """
+    """Mounts an empty /run in this process's mount namespace, and hides the services that this
+    machine's Avahi configuration announces."""
     # These services would appear among the made-up devices.
     if pathlib.Path("/etc/avahi/services").is_dir():
         run("mount", "-t", "tmpfs", "none", "/etc/avahi/services")

@@ -1,5 +1,5 @@
 #!/usr/bin/python3
-"""Copies a medium, and adds models and texts that hardly fit on the wizard's pages.
+"""Copies a medium, and adds models and texts that barely fit on the wizard's pages.
 
 Usage: crowded.py MEDIUM COPY
 

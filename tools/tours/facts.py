@@ -60,8 +60,8 @@ class Facts:
         return [model.name for model in self.models]
 
     def kinds(self):
-        """Returns one model for each combination of connections. A device can announce a name only
-        if it consists of a maker, a space and a model. Prefers models with such a name."""
+        """Returns one model for each combination of connections. Prefers models whose name has a
+        space, because a device announces a maker and a model."""
         chosen = {}
         for model in self.models:
             known = chosen.get(model.kind)

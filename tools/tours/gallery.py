@@ -134,7 +134,7 @@ class Gallery:
             person.see("label", self._text["INST_TXT_CONNECTIONTYPE"], _PATIENCE)
             self._take(person, "2-connection")
             self._search(person)
-            # The device list appears before the wait ends.
+            # The list can show its devices while the search is still running.
             person.see_gone("label", self._text["INST_WAIT"], _PATIENCE)
             with contextlib.suppress(TimeoutError):  # on a busy machine, few devices answer in time
                 wait_for(lambda: len(person.rows()) >= _ROWS, _ANSWER_SECONDS, "devices in the list")

@@ -129,7 +129,8 @@ class Visit:
         wait_for(lambda: self.person.has_state(cable, "checked"), 10, "the cable to be chosen")
 
     def see_package_open(self, files, way):
-        """Waits for the wizard to exit, and compares what it left with what it should leave.
+        """Waits for the wizard to exit, and checks how many files it wrote and what it opened. Raises
+        WentWrong if the exit status is not 0.
 
         `files` is the number of files that the wizard should write for the package. `way` says how
         the user came here, such as "By cable".

@@ -53,8 +53,8 @@ def take_tours(medium, original, pictures, languages, options):
         return status
     if status == NO_NAMESPACE:
         print("A network of made-up devices cannot be created here (see above), "
-              "so the tour goes only by cable.", flush=True)
-    # The next tour accepts the folder even if this one is interrupted.
+              "so the tour chooses only a cable.", flush=True)
+    # Even if this tour is interrupted, the next tour then accepts the folder.
     (folder / "index.html").touch()
     for old in folder.glob("*.png"):
         old.unlink()
