@@ -13,8 +13,8 @@ namespace onramp {
 void scheduleTimer(std::chrono::milliseconds delay, std::function<void()> action);
 
 /// Runs `action` once on the main thread, even while a modal window is shown. Actions never run
-/// inside this function. They run in the order of the calls, but abortModal() can delay them. If
-/// the application terminates, `action` may never run. Callable from any thread.
+/// inside this function. They run in the order of the calls, except that abortModal() can delay
+/// some of them. If the application terminates, `action` may never run. Callable from any thread.
 void performOnMainThread(std::function<void()> action);
 
 /// Shows `window` as a modal window, makes it the key window, and runs the main loop. Returns after
@@ -23,7 +23,7 @@ void performOnMainThread(std::function<void()> action);
 void runModalForWindow(const Window& window);
 
 /// Ends the innermost call of runModalForWindow(), if there is one. Until that call has returned,
-/// the waiting actions of performOnMainThread() do not run. Callable from any thread.
+/// no action of performOnMainThread() runs. Callable from any thread.
 void abortModal();
 
 /// Blocks the calling thread for `duration` and then returns true. If the application terminates,

@@ -11,8 +11,8 @@ namespace onramp {
 
 // Each of these functions reads one part of a BER encoding (X.690 section 8, as restricted by RFC
 // 1157). On success, the function moves `in` past that part and returns SNMP_OK. If it refuses the
-// part, it returns SNMP_ERR_CODEC and may leave `in` anywhere in the part. Every function refuses a
-// part that is malformed or incomplete.
+// part, it returns SNMP_ERR_CODEC and leaves `in` anywhere from the part's start to its end. Every
+// function refuses a part that is malformed or incomplete.
 
 /// Reads a one-byte tag. Refuses a longer tag without moving `in`.
 [[nodiscard]] inline snmp_status ber_get_tag(ByteReader& in, std::uint8_t& tag) {
@@ -26,7 +26,7 @@ namespace onramp {
 }
 
 /// Reads a length in the short form, or in the long form with a number of one or two bytes. Does
-/// not check whether the input has that many bytes left.
+/// not check whether the input has as many bytes left as the length says.
 [[nodiscard]] inline snmp_status ber_get_length(ByteReader& in, std::uint16_t& length) {
   const auto first = in.byte();
   if (!first) return SNMP_ERR_CODEC;

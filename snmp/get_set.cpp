@@ -12,8 +12,8 @@ namespace {
 
 constexpr std::size_t kStringStride = 16;
 
-// Holds the strings of a request, and later the strings of its reply: up to kReplySize bytes of
-// each. The destructor clears the bindings' pointers to this storage.
+// Holds the strings of a request, at most kReplySize bytes in all, and later those of its reply,
+// again at most kReplySize bytes. The destructor clears the bindings' pointers to this storage.
 class string_storage {
  public:
   explicit string_storage(std::span<snmp_varbind> bindings)
@@ -27,7 +27,7 @@ class string_storage {
   }
 
   /// Makes binding `i` point to the kReplySize bytes that start at `offset`, which must be at most
-  /// kReplySize. So there is room for a reply's strings at any `offset`.
+  /// kReplySize. The storage is twice that size, so a reply's strings fit at any `offset`.
   snmp_octets& give(std::size_t i, std::size_t offset) {
     octets_[i] = {kReplySize, kReplySize, bytes_.data() + offset};
     bindings_[i].octets_value = &octets_[i];

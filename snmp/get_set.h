@@ -27,8 +27,8 @@ struct snmp_result_slot {
 ///
 /// If the exchange fails, returns the status of snmp_exchange(). Otherwise returns the reply's
 /// error status, which is 0 on success. Returns SNMP_ERR_CODEC when there are more slots than
-/// bindings in the array, and when a value has no slot, has a different type from its slot or does
-/// not fit in its slot.
+/// bindings in the array `varbinds`, and when a value has no slot, has a different type from its
+/// slot or does not fit in its slot.
 [[nodiscard]] snmp_status snmp_get(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 
@@ -41,8 +41,8 @@ struct snmp_result_slot {
 /// A string here is a value of type 4, 64 or 68. The strings are copied to a buffer of kReplySize
 /// bytes, where each starts at a multiple of 16. The `octets_value` of a binding with a string is
 /// null after the exchange. Returns SNMP_ERR_CODEC and sends nothing when `varbind_count` exceeds
-/// the size of the array, when a binding has no slot, when the snmp_octets pointer for a string is
-/// null, and when the strings do not fit in the buffer.
+/// the size of the array `varbinds`, when a binding has no slot, when the snmp_octets pointer for a
+/// string is null, and when the strings do not fit in the buffer.
 [[nodiscard]] snmp_status snmp_set(snmp_message& message, std::span<snmp_result_slot> results,
                                    const char* address, std::uint32_t mode);
 

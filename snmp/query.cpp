@@ -21,9 +21,9 @@ std::array<mib_entry, 1> active_if_entries = {
 
 constexpr std::array<mib_value_handler, 1> kActiveIFHandlers = {{{kActiveIFKey, decode_active_if}}};
 
-// Compares only the first half of the two names: `capacity` is a number of arcs but is used here as
-// a number of bytes, and an arc takes two bytes. The names in a reply always match, because a reply
-// is decoded into the table's own names.
+// Compares only the first halves of the two names: `capacity` is a number of arcs but is used here
+// as a number of bytes, and an arc takes two bytes. The names in a reply always match, because a
+// reply is decoded into the table's own names.
 bool names_match(const snmp_oid& entry, const snmp_oid& name) {
   return name.capacity >= entry.capacity && std::memcmp(entry.arcs, name.arcs, entry.capacity) == 0;
 }

@@ -48,8 +48,8 @@ constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's 
 constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
 /// The table that asks for kActiveIFObject. The name in each reply overwrites the name in this
-/// table, and later requests ask for the new name. After a reply with a shorter name, longer names
-/// are refused.
+/// table, and later requests ask for the new name. After a reply with a shorter name, replies with
+/// longer names are refused.
 extern mib_table active_interface_table;
 
 /// Stores an INTEGER under `name` as a 32-bit number and returns 0. Returns 1 for a value of any
@@ -110,16 +110,16 @@ class snmp_table_request {
 /// request if the first returns no result. The first address that answers every request of its
 /// first try decides the result. Each earlier address is tried three times, with a pause of 20 ms
 /// after each try. If no address decides, the last try of the last address does. A try without a
-/// result counts as the value 0 of ActiveIF, and so does an empty list of addresses. An entry that
-/// is not a string counts as an address that answers without a result.
+/// result counts as an ActiveIF of 0, and so does an empty list of addresses. An entry that is
+/// not a string counts as an address that answers without a result.
 ///
 /// Blocks for about 12 seconds for each address that sends nothing back, not even a report that the
 /// port is closed.
 [[nodiscard]] bool snmp_active_interface_is_wireless(const Array& addresses);
 
 /// Makes one request to the device at `address`, which is null if the entry in the list of
-/// addresses is not a string. Returns the result of snmp_query_table(), and passes on its
-/// `out_no_reply` in `no_reply`.
+/// addresses is not a string. Returns what snmp_query_table() returns, and sets `no_reply` as
+/// that function sets `out_no_reply`.
 using snmp_ask = std::function<std::optional<Dictionary>(const char* address, bool& no_reply)>;
 
 /// Does what snmp_active_interface_is_wireless() above does, but calls `ask` to make each request.

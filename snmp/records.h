@@ -47,7 +47,7 @@ struct snmp_varbind {
   std::int64_t int_value = 0;           ///< for types 1, 2 and 65 to 67; the low 32 bits are used
   snmp_octets* octets_value = nullptr;  ///< for types 4, 64 and 68
   snmp_oid* oid_value = nullptr;        ///< for type 6
-  std::uint16_t encoded_length = 0;     ///< set by the encoder: total size of name and value
+  std::uint16_t encoded_length = 0;     ///< set by the encoder: bytes of name and value together
   std::uint32_t index = 0;  ///< set by the decoder: position in the reply, from 0; see snmp_set()
 };
 

@@ -14,7 +14,7 @@ namespace onramp {
 
 namespace {
 
-constexpr int kExitOfSignals = 128;  // shells add this to the signal's number
+constexpr int kExitOfSignals = 128;  // in exit statuses, shells add this to the signal's number
 
 }  // namespace
 

@@ -10,7 +10,7 @@ namespace onramp::qt {
 
 namespace {
 
-constexpr int kTitleBarHeight = 32;  // a title bar is assumed to be at least this high
+constexpr int kTitleBarHeight = 32;  // in pixels; a title bar is assumed to be at least this high
 
 }  // namespace
 

@@ -6,7 +6,7 @@ namespace onramp::qt {
 
 /// Gives a window the size that its contents need, and prevents the user from resizing or
 /// maximising the window. The window grows with its contents, up to the size of the screen. It
-/// keeps its size when the contents need less room.
+/// does not shrink when the contents shrink.
 class ContentSize final : public QObject {
   Q_OBJECT
 

@@ -32,9 +32,9 @@ QString textOf(std::string_view text) {
   return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-// Creates the widgets of an interface file, including those that this front end defines. In the
-// file, the root widget of a page has the page's class, which is not a widget class. For any class
-// that is not a widget class, creates a plain widget and stores the name of the class in the
+// Creates the widgets of an interface file, including those whose classes this front end defines.
+// In the file, the root widget of a page has the page's class, which is not a widget class. For any
+// class that is not a widget class, creates a plain widget and stores the name of the class in the
 // property kViewClass.
 class Loader final : public QUiLoader {
  public:

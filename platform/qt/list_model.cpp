@@ -66,7 +66,7 @@ QVariant ListModel::data(const QModelIndex& index, int role) const {
       return toolTip(text(index.row(), columns_.at(index.column())));
     case Qt::AccessibleTextRole:
       return index.column() == 0 ? spokenName(index.row()) : QVariant();
-    case Qt::SizeHintRole:  // a single column is as wide as its view and elides longer text
+    case Qt::SizeHintRole:  // a single column is as wide as its view and elides wider text
       return columns_.size() == 1 ? QSize(0, rowHeight()) : QVariant();
     default:
       return {};

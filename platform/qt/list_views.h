@@ -46,8 +46,8 @@ class ListWidget final : public FramedView<QListView> {
   TypeAhead typeAhead_;
 };
 
-/// A list with several columns. The first column gets the width that the other columns leave, but
-/// at least leastNameWidth(). Each other column is as wide as its contents. Once the user has
+/// A list with several columns. The first column gets the width that the other columns leave free,
+/// but at least leastNameWidth(). Each other column is as wide as its contents. Once the user has
 /// dragged a column's edge, the widths are no longer adjusted.
 class ColumnsWidget final : public FramedView<QTreeView> {
   Q_OBJECT

@@ -12,7 +12,7 @@ namespace onramp::qt {
 
 // The names of some properties that this front end adds to Qt's widgets.
 inline constexpr const char* kViewClass = "viewClass";  ///< string: the page class of a root widget
-inline constexpr const char* kHeading = "heading";      ///< true for a label that is a title
+inline constexpr const char* kHeading = "heading";      ///< true for a label that is a heading
 inline constexpr const char* kSpokenColumns = "spokenColumns";  ///< strings: see ListModel
 
 /// Returns the object behind `outlet` if it is of class `Class`, or null otherwise.

@@ -56,7 +56,7 @@ void runModalForWindow(const Window& window) {
   modalLoops().push_back(&loop);
   loop.exec();
   // Handles the clicks and keys that arrived while the main thread was busy. The user meant them
-  // for this page, not for the next one.
+  // for the page that is still shown, not for the next one.
   if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;

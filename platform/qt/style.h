@@ -7,9 +7,9 @@ namespace onramp::qt {
 
 /// Qt's style "Fusion" with some changes. Fusion draws the same outline around the default button
 /// and the focused control. In this style, the default button has the colour of selections, and a
-/// ring marks the focused control. Buttons, list rows and menu items get more room. The outline of
-/// radio buttons is visible in dark colour schemes, and disabled text is readable in high-contrast
-/// ones.
+/// ring marks the focused control. Buttons, list rows and menu items get more room than in Fusion.
+/// The outline of radio buttons is visible in dark colour schemes, and disabled text is readable in
+/// high-contrast ones.
 class Style final : public QProxyStyle {
   Q_OBJECT
 

@@ -10,9 +10,9 @@ import pathlib
 import struct
 import sys
 
-# The types of the entries for a picture, by the length of its side in pixels. Some pictures get two
-# entries: one for an icon with as many points as the picture has pixels, and one for an icon with half
-# as many points, on a display with two pixels per point.
+# The entry types for a picture, by the length of its side in pixels. Some pictures get two entries:
+# one for an icon with the same number of points per side, and one for an icon with half as many, on a
+# display with two pixels per point.
 TYPES = {16: ["icp4"], 32: ["icp5", "ic11"], 64: ["ic12"], 128: ["ic07"], 256: ["ic08", "ic13"],
          512: ["ic09", "ic14"], 1024: ["ic10"]}
 

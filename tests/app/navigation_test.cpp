@@ -16,7 +16,7 @@ const char* const kUSBAndWired = "INST_TXT_USB\nINST_TXT_ETHERNET";
 
 class Navigation : public Wizard {
  protected:
-  /// Launches the wizard on a medium with `models` and goes to the connection page of the first
+  /// Launches the wizard from a medium with `models` and goes to the connection page of the first
   /// model. The models must differ in their support of USB or wired Ethernet, so that the wizard
   /// shows the model list first.
   void goToConnectionPage(const std::vector<Dictionary::Pair>& models = {
@@ -183,7 +183,7 @@ TEST_F(Navigation, AToolThatAsksToGoBackLeadsToTheConnectionPageWithWirelessSele
   EXPECT_EQ(screen.object("connectionTypeRadioButton").selectedColumn, 0);
   EXPECT_EQ(screen.log, (Strings{"unhide", "activate", "key and front"}));
 
-  // A second search that finds nothing runs the tool again.
+  // After a second search that finds nothing, the tool runs again.
   screen.log.clear();
   screen.click("rightMostButton");
   EXPECT_EQ(screen.log.back(), "hide");

@@ -30,7 +30,7 @@ class Wizard : public testing::Test {
   void TearDown() override { screen.reset(); }
 
   /// Writes the property lists of a medium with a package and two models: "All" (USB, wired,
-  /// wireless) and "Cable" (USB only). `more` holds further entries of the resource dictionary.
+  /// wireless) and "Cable" (USB only). `more` adds entries to the medium resource dictionary.
   void describeTwoModels(const Dictionary& more = {}) const {
     describe({{"All", recording::model(true, true, true)},
               {"Cable", recording::model(true, false, false)}},
@@ -38,7 +38,7 @@ class Wizard : public testing::Test {
   }
 
   /// Writes the property lists of a medium with a package and `models`. Each model is a pair of a
-  /// name and an entry for the model information, such as recording::model() returns.
+  /// name and an entry for the model information, for example one that recording::model() returns.
   void describe(const std::vector<Dictionary::Pair>& models, const Dictionary& more = {}) const {
     std::vector<std::string> names;
     names.reserve(models.size());
@@ -76,7 +76,7 @@ class Wizard : public testing::Test {
 
   void chooseRow(int row) const { screen.object("connectionTypeRadioButton").selectedRow = row; }
 
-  /// Runs the command at `index` of the chooser's menu, counted from 0.
+  /// Runs the command of item `index` in the chooser's menu. Item 0 is the button and has none.
   void chooseMenuItem(std::size_t index) const {
     screen.object("deviceListPopupButton").items.at(index).second();
   }

@@ -102,7 +102,7 @@ class Avahi:
 
     def start(self, **settings):
         """Starts the daemon with a copy of its configuration file, in which each of `settings`
-        replaces a setting. The argument's name has "_" where the name in the file has "-"."""
+        replaces a setting. An argument's name has "_" where the setting's name has "-"."""
         text = self.configuration.read_text()
         for name, value in settings.items():
             key = name.replace("_", "-") + "="

@@ -99,8 +99,8 @@ TEST_F(BrowserTest, RemovalsWithoutAResolveInBetweenCountOnce) {
     network.gone(service);
   EXPECT_TRUE(contains());
 
-  // Only the first of the three removals counted. After the next resolve, the service is gone only
-  // after two more removals.
+  // Only the first of the three removals counted. After the next resolve, it takes two more
+  // removals until the service is gone.
   network.resolves(onThree, {});
   network.gone(onOne);
   EXPECT_TRUE(contains());

@@ -1,5 +1,5 @@
-// Parses each input as a TXT record. Then makes a record with up to 250 bytes of the input as an
-// attribute's value, parses the record, and expects the same value.
+// Parses each input as a TXT record. Then makes a record in which an attribute's value is the
+// input, cut to 250 bytes. Parses the record and expects the same value.
 
 #include <cstdint>
 #include <cstdlib>

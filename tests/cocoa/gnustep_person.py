@@ -133,7 +133,7 @@ class GNUstepPerson(Person):
         self._read()
 
     def _read(self):
-        """Returns an entry for the application and then the visible controls.
+        """Returns an entry for the application, then one for each visible window and control.
 
         Waits while the program's main loop is busy. Returns only the entry for the application if
         the program has exited. Fails if any text is cut off.

@@ -16,7 +16,7 @@
 namespace onramp {
 namespace {
 
-// Makes the allocations of `work` fail as failEveryCall() does. Expects each run of `work` to throw
+// Lets failEveryCall() make the allocations of `work` fail. Expects each run of `work` to throw
 // std::bad_alloc or to return the same result as without a failure. In builds with the address
 // sanitizer, a leak also fails the test.
 template <typename Work>
