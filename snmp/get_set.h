@@ -23,7 +23,7 @@ struct snmp_result_slot {
 /// get-next request when `pdu_type` is kPduGetNext, otherwise a get request. snmp_exchange()
 /// describes `address` and `mode`. A zero byte follows a copied string if the slot has room for it.
 /// Values of types 6, 64 and 68 are not copied; the contents of their slots are undefined. The
-/// `octets_value` of each binding is null afterwards.
+/// `octets_value` of each binding is null after the exchange.
 ///
 /// If the exchange fails, returns the status of snmp_exchange(). Otherwise returns the reply's
 /// error status, which is 0 on success. Returns SNMP_ERR_CODEC when there are more slots than
