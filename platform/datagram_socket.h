@@ -60,7 +60,8 @@ class DatagramSocket {
   [[nodiscard]] bool waitWritable(std::chrono::nanoseconds timeout) const;
   [[nodiscard]] bool waitReadable(std::chrono::nanoseconds timeout) const;
 
-  /// Sends one datagram to the peer of connect(). Returns whether the system accepted the datagram.
+  /// Sends one datagram to the peer that connect() has set. Returns whether the system accepted the
+  /// datagram.
   bool send(std::span<const std::uint8_t> bytes);
 
   /// Sends one datagram. Must not be called after connect(). Returns whether the system accepted

@@ -34,7 +34,7 @@ inline constexpr std::string_view kSCPropNetIPv4BroadcastAddresses = "BroadcastA
 inline constexpr std::string_view kSCPropNetIPv4SubnetMasks = "SubnetMasks";
 inline constexpr std::string_view kSCDynamicStorePropNetPrimaryInterface = "PrimaryInterface";
 
-/// The error codes that both backends use. The backend for macOS also returns the framework's other
+/// The error codes that both backends use. The backend for macOS also uses the framework's other
 /// codes.
 inline constexpr int kSCStatusOK = 0;
 inline constexpr int kSCStatusFailed = 1001;
@@ -56,9 +56,8 @@ using DynamicStoreSourceRef = std::shared_ptr<DynamicStoreSource>;
 using DynamicStoreCallback = std::function<void(const std::vector<std::string>& changedKeys)>;
 
 /// Creates a session. The system uses `name` only for diagnostics. `callback` is called on the main
-/// thread with the keys that setNotificationKeys() has selected and whose values have changed. The
-/// calls begin when the session's source has been added to the main run loop. Returns null on
-/// failure.
+/// thread with those keys selected by setNotificationKeys() whose values have changed. The calls
+/// begin when the session's source has been added to the main run loop. Returns null on failure.
 [[nodiscard]] DynamicStoreRef createDynamicStore(const std::string& name,
                                                  DynamicStoreCallback callback = nullptr);
 

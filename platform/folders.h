@@ -10,8 +10,8 @@ enum class FolderDomain {
 };
 
 /// Returns the absolute path of the domain's application-support folder, without a trailing "/".
-/// If the folder does not exist, tries to create it, but does not report a failure to do so. On
-/// macOS, returns an empty string when the system names no folder for the domain.
+/// If the folder does not exist, tries to create it, but does not report a failure to do so. With
+/// Cocoa, returns an empty string when the system names no folder for the domain.
 [[nodiscard]] std::string applicationSupportFolder(FolderDomain domain);
 
 }  // namespace onramp

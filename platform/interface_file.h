@@ -50,9 +50,9 @@ class Interface {
   /// empty string when there is no view or the file gives the view no class.
   [[nodiscard]] std::string viewClass() const;
 
-  /// Returns a handle to the object that has the handle's kind and that the file calls `name`.
-  /// Returns an empty handle when there is no such object. With Cocoa, finds no menus, no menu
-  /// items, and no windows except the one called "window".
+  /// Returns a handle to the object of kind Handle::kKind that the file calls `name`. Returns an
+  /// empty handle when there is no such object. With Cocoa, finds no menus, no menu items, and
+  /// no windows except the one called "window".
   template <typename Handle>
   [[nodiscard]] Handle outlet(std::string_view name) const {
     return Handle(find(name, Handle::kKind));

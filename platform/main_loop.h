@@ -2,8 +2,8 @@
 
 namespace onramp {
 
-// The main loop of a program without windows. The loop runs the timers and actions that are passed
-// to scheduleTimer() and performOnMainThread() in platform/run_loop.h. There are no modal loops.
+// The main loop of a program without windows. The loop runs the actions that are passed to
+// scheduleTimer() and performOnMainThread() in platform/run_loop.h. There are no modal loops.
 
 /// Runs the loop on the calling thread, which must be the main thread, until endMainLoop() is
 /// called.

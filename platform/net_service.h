@@ -128,7 +128,7 @@ class NetService {
   /// Resolves the service. If `timeLimit` is 0 or less, there is no time limit. With a client,
   /// returns at once; the result says whether the resolve has started. The client is called when
   /// the resolve ends. Without a client, blocks until the resolve ends and returns whether it
-  /// succeeded. Returns false when another resolve of the service is running.
+  /// succeeded. Returns false when a resolve of this object is already running.
   virtual bool resolveWithTimeout(std::chrono::duration<double> timeLimit) = 0;
 
   /// Cancels the running resolve, if there is one, without calling the client.

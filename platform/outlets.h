@@ -29,9 +29,8 @@ enum class OutletKind {
 
 /// A handle to an object of the user interface. The handle does not own the object, and must not be
 /// used once the object has been destroyed. Copies refer to the same object. The functions of an
-/// empty handle do nothing, and return 0 or an empty handle. An object that is missing from the
-/// interface file has an empty handle, so a page works even if its file lacks some objects. Main
-/// thread only.
+/// empty handle do nothing, and return 0 or an empty handle. The handle of an object that the
+/// interface file lacks is empty, so a page works even without some objects. Main thread only.
 class Outlet {
  public:
   Outlet() = default;
@@ -57,7 +56,7 @@ class View : public Outlet {
   /// none.
   [[nodiscard]] View firstSubview() const;
 
-  /// Puts `view` inside this view and makes `view` fill it. Gives the keyboard focus to the first
+  /// Puts `view` inside this view so that it fills this view. Gives the keyboard focus to the first
   /// list in `view` that accepts it, or else to the first control that accepts it. The owner of
   /// `view` does not change.
   void addSubview(const View& view) const;
@@ -155,9 +154,9 @@ class TableView : public Control {
   /// once for each table. `controller` must outlive the table.
   void bind(ArrayController& controller) const;
 
-  /// These functions set whether the user may move columns, and whether a click on a header selects
-  /// the column.
+  /// Sets whether the user may move columns.
   void setAllowsColumnReordering(bool allows) const;
+  /// Sets whether a click on a header selects the column. With Qt, a click never does.
   void setAllowsColumnSelection(bool allows) const;
   /// Shows `title` above the column `identifier`. Does nothing when the table has no column with
   /// that identifier.
@@ -200,10 +199,11 @@ class Window : public Outlet {
   void makeKeyWindow() const;
   /// Shows the window, if it is hidden, and puts it in front of the application's other windows.
   void orderFront() const;
-  /// Does what orderFront() and makeKeyWindow() do.
+  /// Does what orderFront() and makeKeyWindow() do. With Cocoa, also puts the window in front of
+  /// another application's windows if that application is active.
   void makeKeyAndOrderFront() const;
 
-  /// Takes the window off the screen without asking the delegate's windowShouldClose().
+  /// Takes the window off the screen without calling ApplicationDelegate::windowShouldClose().
   void close() const;
 };
 

@@ -89,9 +89,9 @@ void localize(NSView* view, const std::string& interfaceName) {
     localize(subview, interfaceName);
 }
 
-// The selector of a button names one of the owner's actions. Makes a click on the button perform
-// this action. Skips buttons that have no selector or already have a target. The interface file
-// connects all other buttons to the first responder, not to a target.
+// Makes a click on each button perform the owner's action that the button's selector names. Skips
+// buttons that have no selector or already have a target. (A button has no target here if the
+// interface file connects it to the first responder.)
 void connectActions(NSView* view, InterfaceOwner& owner,
                     std::vector<Retained<OnrampAction>>& actions) {
   if ([view isKindOfClass:[NSButton class]]) {

@@ -1,4 +1,4 @@
-// Makes macOS ask the user for permission to use the local network while the first page is shown.
+// While the first page is shown, makes macOS ask the user for permission to use the local network.
 // macOS 15 and later ask when a program first uses the local network. Without this file, the device
 // search would be the first use, and the search might end before the user has answered.
 

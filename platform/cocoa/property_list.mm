@@ -30,7 +30,7 @@ class Reader {
   }
 
  private:
-  // Only two Boolean objects exist, so comparing pointers recognises a Boolean. For any other
+  // Only two Boolean objects exist, so a Boolean can be recognised by its pointer. For any other
   // number, the C type tells whether it is a floating-point number.
   static Value number(NSNumber* number) {
     if (number == [NSNumber numberWithBool:YES]) return Value(true);
@@ -45,9 +45,9 @@ class Reader {
     return isPastSigned ? Value(std::uint64_t{[number unsignedLongLongValue]}) : Value(signedValue);
   }
 
-  // Adds `bytes` to the total size of the copied strings and data. This size can exceed the size of
-  // the file, because an object that several containers share is copied for each of them. So the
-  // copies together have the same limit as a file. Each UTF-16 unit of a string counts as one byte.
+  // Adds `bytes` to the total size of the copied strings and data. An object that several
+  // containers share is copied for each of them, so this total can exceed the size of the file. The
+  // limit on that size also applies to this total. Each UTF-16 unit of a string counts as one byte.
   // Returns false if the limit is exceeded.
   bool takes(std::size_t bytes) {
     bytes_ += bytes;

@@ -12,8 +12,8 @@ namespace {
 constexpr CGFloat kCellPadding = 6;  // points
 constexpr NSUInteger kLeastNameLetters = 24;
 
-// Returns the first enabled button in `view` that the Return key clicks and that is not hidden
-// itself, or nil if there is none.
+// Returns the first enabled button in `view` that the Return key clicks, or nil if there is none.
+// Skips hidden buttons, but not the buttons in hidden views.
 NSButton* defaultButton(NSView* view) {
   if ([view isKindOfClass:[NSButton class]] && ![view isHidden]) {
     NSButton* const button = static_cast<NSButton*>(view);
@@ -92,9 +92,9 @@ CGFloat leastNameWidth(NSCell* cell) {
 }
 
 // Makes every column except the first one at least as wide as its title and its texts. The first
-// column shows names. If necessary, this column gets narrower, but it keeps room for its title and
-// for 24 letters. If the table is still too narrow, makes the window wider. Does nothing if there
-// is only one column.
+// column shows names. If necessary, this column gets narrower, but not narrower than its title or
+// 24 letters. If the table is still too narrow, makes the window wider. Does nothing if there is
+// only one column.
 - (void)fitColumns {
   NSArray* const columns = [_table tableColumns];
   if ([columns count] < 2) return;

@@ -9,8 +9,8 @@ using cocoa::nativeOf;
 
 namespace {
 
-// Asks a screen reader to read the text of `field` aloud. Without this request, it might not read
-// text that appears away from the keyboard focus.
+// Asks the screen reader to read the text of `field` aloud. Without this request, the screen reader
+// might not read text that appears away from the keyboard focus.
 void announce(NSTextField* field) {
   NSDictionary* const announcement = [NSDictionary
       dictionaryWithObjectsAndKeys:[field stringValue], NSAccessibilityAnnouncementKey,

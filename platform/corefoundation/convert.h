@@ -24,7 +24,7 @@ namespace onramp::corefoundation {
 [[nodiscard]] Data toData(CFDataRef data);
 
 /// Converts a string, an array or a dictionary to a value. Returns nothing when `object` is null or
-/// of any other kind. Leaves out items that are of any other kind or whose keys are not strings.
+/// of another kind. Leaves out items of other kinds, and pairs whose keys are not strings.
 [[nodiscard]] std::optional<Value> toValue(CFTypeRef object);
 
 }  // namespace onramp::corefoundation

@@ -15,7 +15,7 @@ struct Renamed {
   std::string_view to;
 };
 
-// Language names that bundles used before they used codes, and outdated codes.
+// Outdated codes, and the language names that bundles once used instead of codes.
 constexpr std::array kRenamed = {
     Renamed{"english", "en"},   Renamed{"german", "de"},  Renamed{"french", "fr"},
     Renamed{"japanese", "ja"},  Renamed{"italian", "it"}, Renamed{"spanish", "es"},

@@ -21,11 +21,11 @@ struct Language {
 
 /// Returns the languages in which to look for a resource, spelled as in `offered`. The languages
 /// come in this order:
-/// - the matches for the first language in `preferred` that has a match: first the match with the
-///   same region, then one without a region, then those with other regions;
+/// - the matches for the first language in `preferred` that has a match: first the matches with the
+///   same region, then those without a region, then those with other regions;
 /// - the matches for `development`;
-/// - if there are none of these, the matches for English;
-/// - if there are none of these either, the alphabetically first well-formed language in `offered`.
+/// - if there is no match so far, the matches for English;
+/// - if there is still no match, the alphabetically first well-formed language in `offered`.
 /// Two languages whose scripts are known and differ never match. The result is empty when `offered`
 /// has no well-formed language.
 [[nodiscard]] std::vector<std::string> languagesToSearch(std::vector<std::string> offered,

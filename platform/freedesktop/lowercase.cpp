@@ -14,8 +14,8 @@ namespace onramp {
 
 namespace {
 
-// Converts letters by the rules of the neutral locale C.UTF-8, because in a Turkish locale "I"
-// becomes an "i" without a dot. If the system lacks C.UTF-8, the process's locale is used.
+// Converts letters to lower case by the rules of the neutral locale C.UTF-8, because in a Turkish
+// locale "I" becomes an "i" without a dot. If the system lacks C.UTF-8, uses the process's locale.
 class PlainLetters {
  public:
   PlainLetters() : locale_(newlocale(LC_CTYPE_MASK, "C.UTF-8", nullptr)) {}

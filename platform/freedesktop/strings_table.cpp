@@ -57,7 +57,7 @@ class Parser {
       refuse(braces ? "text after the closing \"}\"" : "a \"}\" without a \"{\"", at());
     }
     if (!problem_.reason.empty()) return std::nullopt;
-    // The last pair of a key in the file must win, but a dictionary keeps the first one.
+    // If several pairs have the same key, the last must win, but a Dictionary keeps the first.
     std::reverse(pairs.begin(), pairs.end());
     return Dictionary(std::move(pairs));
   }

@@ -13,7 +13,7 @@ namespace {
 constexpr std::string_view kHeader = "bplist00";
 constexpr std::size_t kTrailerSize = 32;
 
-// The kind of an object, which is stored in the upper four bits of the object's first byte.
+// An object's kind is stored in the upper four bits of the object's first byte.
 enum Kind : std::uint64_t {
   kSimple = 0x0,
   kInteger = 0x1,

@@ -10,8 +10,8 @@ namespace onramp::libplist {
 
 /// Returns the value in `bytes`, an XML property list (in UTF-8 or UTF-16) or a binary one. Returns
 /// nothing when `bytes` are malformed or exceed a limit. In that case, stores the place and the
-/// reason in `problem`, if given. However, if only libplist finds the fault, and not the check that
-/// precedes it, `problem` stays empty.
+/// reason in `problem`, if given. However, `problem` stays empty if libplist finds a fault that the
+/// check before it has missed.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 

@@ -14,9 +14,9 @@ namespace {
 
 constexpr std::size_t kNone = std::string::npos;
 
-// Limits the work of libplist that grows quadratically with the size of the list. One cause is a
-// dictionary with many keys, because libplist hashes the keys into a fixed number of chains. The
-// other is a text with many entities, because libplist moves the rest of the text at each entity.
+// Limits the part of libplist's work that grows quadratically with the size of the list. One cause
+// is a dictionary with many keys, because libplist hashes the keys into a fixed number of chains.
+// The other is a text with many entities, because libplist moves the rest of the text at each one.
 constexpr std::uint64_t kMostSquaredSteps = std::uint64_t{1} << 29;
 
 class XMLWalk {
@@ -81,9 +81,9 @@ class XMLWalk {
     return true;
   }
 
-  // Refuses the list and returns false when the markup that skipPast() has skipped contains an odd
-  // number of quotation marks, because its end is then inside quotation marks, or when it contains
-  // one of the characters in `refused`.
+  // Refuses the list and returns false when the markup that skipPast() has skipped contains one of
+  // the characters in `refused` or an odd number of quotation marks. If the number is odd, the
+  // `end` that skipPast() has found is inside quotation marks.
   [[nodiscard]] bool quotesArePaired(std::string_view refused = "") {
     if (std::count(skipped_.begin(), skipped_.end(), '"') % 2 != 0) {
       return refuse("markup with a quotation mark that is never closed", start_);

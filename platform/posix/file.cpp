@@ -21,8 +21,8 @@ namespace {
 namespace fs = std::filesystem;
 
 // Returns ".NAME.", with which the names of all temporary files for `path` begin. A full name is
-// ".NAME.PROCESS-NUMBER", where NAME is the file name in `path`, and PROCESS is a process ID. NAME
-// is cut short so that the full name has at most 255 bytes, the usual limit on file names.
+// ".NAME.PROCESS-NUMBER", where NAME is the file name in `path`, and PROCESS is the writer's
+// process ID. NAME is cut short so that the full name has at most 255 bytes, the usual limit.
 std::string temporaryStem(const fs::path& path) {
   constexpr std::size_t kMostNameBytes = 200;
   return "." + path.filename().string().substr(0, kMostNameBytes) + ".";
@@ -52,7 +52,7 @@ bool writeAll(int descriptor, std::string_view bytes) {
   return true;
 }
 
-// Returns whether no process is writing the temporary file whose name ends with `processAndNumber`.
+// Returns whether the writer of the temporary file whose name ends with `processAndNumber` is gone.
 // A file with this process's ID counts as left over, because only an earlier process with the same
 // ID can have left it. Returns false when `processAndNumber` is malformed.
 bool isLeftOver(std::string_view processAndNumber) {
