@@ -21,7 +21,7 @@ inline constexpr std::string_view kSupportEthernet = "support Ethernet";  ///< b
 inline constexpr std::string_view kSupportWiFi = "support WiFi";          ///< boolean
 
 /// Returns the model information of the medium from which the wizard is running: the dictionary in
-/// the file that the "ModelInfo" entry of the medium resource dictionary (media/medium.h) names.
+/// the file whose path is under "ModelInfo" in the medium resource dictionary (media/medium.h).
 /// Returns nothing when the medium names no such file or the file cannot be read as a dictionary.
 [[nodiscard]] std::optional<Dictionary> modelInfo();
 

@@ -8,7 +8,7 @@
 
 namespace onramp {
 
-/// The wired connections that one model supports, or that several models share.
+/// The wired connections that a model supports, or that each of several models supports.
 enum class ConnectionType : unsigned char {
   kNeither = 0,  ///< neither USB nor Ethernet, or the models differ
   kEthernet = 2,
@@ -36,7 +36,7 @@ enum class ConnectionType : unsigned char {
 
 /// The page that the wizard shows first.
 enum class FirstPage {
-  kNone,  ///< no page: no model supports wireless, so the package opens at once
+  kNone,  ///< no page: no model supports wireless, so the installer package opens at once
   kConnectionType,
   kModelList,
 };

@@ -38,8 +38,8 @@ inline constexpr std::string_view kVenderName = "VenderName";
 [[nodiscard]] std::optional<Dictionary> loadResourceDictionary();
 
 /// Reads the dictionary in another property list of the medium. The string under `key` in
-/// `resources` is the relative path of that list. Returns nothing when `resources` has no string
-/// under `key` or the list cannot be read as a dictionary.
+/// `resources` is the relative path of that list. Returns nothing when `resources` is nothing or
+/// has no string under `key`, and when the list cannot be read as a dictionary.
 [[nodiscard]] std::optional<Dictionary> loadNamedDictionary(
     const std::optional<Dictionary>& resources, std::string_view key);
 

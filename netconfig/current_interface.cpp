@@ -6,9 +6,9 @@ namespace onramp {
 
 namespace {
 
-// Returns the dictionary that the dynamic store has under `key`. Returns nothing when `key` has no
-// value, when the store has no such dictionary, and when the store cannot be read. The store reads
-// `key` as a regular expression, so a key with a character such as "+" finds nothing.
+// Returns the dictionary that the dynamic store has under `key`. Returns nothing when `key` is
+// nothing, when the store has no such dictionary, and when the store cannot be read. The store
+// reads `key` as a regular expression, so a key with a character such as "+" finds nothing.
 std::optional<Dictionary> stateUnder(const std::string& storeName,
                                      const std::optional<std::string>& key) {
   if (!key) return std::nullopt;

@@ -6,7 +6,7 @@
 namespace onramp {
 
 /// Returns the first IPv4 address of the interface named `interface_name`, in dotted form. Returns
-/// nothing when the interface has no IPv4 entity in the dynamic store (platform/dynamic_store.h),
+/// nothing when the dynamic store (platform/dynamic_store.h) has no IPv4 address for the interface,
 /// for example because the interface is down, and when the store cannot be read.
 [[nodiscard]] std::optional<std::string> KSSCcurrentAddressWithInterfaceName(
     const std::string& interface_name);

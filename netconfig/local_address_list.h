@@ -36,7 +36,7 @@ int KSSysConfigCopyCurrentLocalAddressList(local_address_list* out_list);
                                                           std::size_t index, std::string_view key);
 
 /// These three functions call local_address_list_value() with the keys kSCPropNetIPv4Addresses,
-/// kSCPropNetIPv4SubnetMasks and kSCPropNetIPv4BroadcastAddresses.
+/// kSCPropNetIPv4SubnetMasks and kSCPropNetIPv4BroadcastAddresses, respectively.
 [[nodiscard]] const std::string* local_address_at(const local_address_list& list,
                                                   std::size_t index);
 [[nodiscard]] const std::string* local_subnet_mask_at(const local_address_list& list,

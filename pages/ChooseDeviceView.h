@@ -22,7 +22,7 @@ namespace onramp {
 /// Asks the controller to launch the wireless set-up tool. Carries no user info.
 inline constexpr std::string_view kLaunchWLANToolNotification = "addNotificationLaunchWLANTool";
 
-/// Asks the controller to wait until a device is listed, for a limited time. The user info holds an
+/// Asks the controller to wait a limited time for a device to be listed. The user info holds an
 /// int under kWaitTime: how many seconds the controller sleeps before each check of the list (see
 /// app/search_wait.h).
 inline constexpr std::string_view kDeviceWaitNotification = "notificationDeviceWait";

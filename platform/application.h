@@ -44,9 +44,9 @@ int runApplication(int argc, char** argv, const std::string& mainInterfaceName,
                    const std::function<std::unique_ptr<ApplicationDelegate>()>& makeDelegate);
 
 /// Terminates the application. The main loop and any modal loop stop, and no more timers, events or
-/// actions of performOnMainThread() are handled. On some systems, the process exits inside this
-/// function. On other systems, the function returns, and the caller must then return without doing
-/// anything else.
+/// actions passed to performOnMainThread() are handled. On some systems, the process exits inside
+/// this function. On other systems, the function returns, and the caller must then return without
+/// doing anything else.
 void terminateApplication();
 
 /// hideApplication() hides all windows, and unhideApplication() shows them again. Do not call

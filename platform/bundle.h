@@ -39,7 +39,8 @@ class Bundle {
   /// Returns the path of the resource file `name`.`type`, or of the file `name` if `type` is empty.
   /// Searches these folders in this order:
   /// - the resources folder itself;
-  /// - the folder for the user's most preferred language among those that the bundle offers;
+  /// - the folder for the user's most preferred language among those that the bundle offers (some
+  ///   backends also search this language's folders for other regions);
   /// - the folder for the bundle's development language;
   /// - if the bundle has neither of these two language folders, the English folder;
   /// - if there is no English folder either, one of the bundle's other language folders.

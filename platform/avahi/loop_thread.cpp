@@ -55,7 +55,7 @@ void LoopThread::runSoon() {
 }
 
 // Runs on `thread_`. After this function has asked the main thread to run the loop, it ignores the
-// loop's descriptor until the main thread has answered.
+// loop's descriptor until the main thread has run the loop.
 void LoopThread::wait() {
   bool isAsking = false;
   while (!isEnding_) {

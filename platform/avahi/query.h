@@ -38,8 +38,8 @@ class Query {
   Query& operator=(const Query&) = delete;
   ~Query();
 
-  /// Returns whether the request failed for good, because it could not be put into a message or the
-  /// daemon called it invalid. The query then gets no result and is not sent again.
+  /// Returns true if the request failed for good: it could not be put into a message, or the daemon
+  /// called it invalid. The query then gets no result and is not sent again.
   [[nodiscard]] bool isRefused() const { return isRefused_; }
 
  private:

@@ -40,8 +40,7 @@ class Resolve {
   Resolve(Daemon& daemon, const Instance& service,
           std::optional<std::chrono::milliseconds> timeLimit, Report report);
 
-  /// Returns whether the daemon has refused to look up the service, whose name, type or domain is
-  /// then invalid.
+  /// Returns true if the service cannot be looked up because its name, type or domain is invalid.
   [[nodiscard]] bool isRefused() const { return service_ && service_->isRefused(); }
 
  private:

@@ -55,8 +55,8 @@ class ButtonRow {
     return needed - NSWidth([content_ bounds]);
   }
 
-  /// Places the visible buttons side by side. The last button that is attached to the right edge
-  /// ends there, and the first of the others starts at the left edge.
+  /// Places the visible buttons side by side. The last button that is attached to the right ends at
+  /// the row's right edge, and the first of the others starts at the row's left edge.
   void layOut() const {
     CGFloat left = leftEdge();
     CGFloat right = rightEdge();
@@ -128,7 +128,7 @@ CGFloat neededWidth(NSTableView* list) {
 }
 
 // Returns how much wider `view` must be so that every list and radio matrix in it fits. The result
-// can be negative if `view` itself is a list or a matrix.
+// can be negative if `view` itself is a matrix or the scroll view of a list.
 CGFloat missingWidth(NSView* view) {
   if ([view isKindOfClass:[NSMatrix class]]) {
     return neededWidth(static_cast<NSMatrix*>(view)) - NSWidth([view frame]);

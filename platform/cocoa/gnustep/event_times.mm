@@ -1,8 +1,8 @@
 // GNUstep stores the time of the last event. This file prevents the stored time from going
 // backwards. Requests for the keyboard focus carry this time, and the window manager refuses a
-// request whose time looks old. GNUstep also takes a number in each "_NET_WM_PING" message for a
-// time, but some window managers send other numbers. Openbox, for example, sends a count that
-// starts at one.
+// request whose time looks old. GNUstep also stores a number from each "_NET_WM_PING" message as a
+// time, but some window managers send a number that is not a time. Openbox, for example, sends a
+// count that starts at one.
 
 #import "platform/cocoa/gnustep/appkit_additions.h"
 #import "platform/cocoa/gnustep/method_exchange.h"

@@ -51,7 +51,7 @@ PostEvent* originalPostEvent = nullptr;
 }
 
 - (void)wakeLoop {
-  eventfd_write(_descriptor, 1);  // fails only when the counter is full, which wakes the loop, too
+  eventfd_write(_descriptor, 1);  // fails only if the counter is full; that wakes the loop, too
 }
 
 - (void)receivedEvent:(void*)data
