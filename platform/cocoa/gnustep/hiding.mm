@@ -1,5 +1,5 @@
-// Makes an application that hides itself hide its windows as AppKit does, without putting icons in
-// their place. GNUstep would replace each window with an icon, because the application has no icon
+// When the application hides itself, its windows disappear as with AppKit, and no icons take their
+// place. GNUstep would replace each window with an icon, because the application has no icon
 // that the user could click. If a window came back before its icon had appeared, the window would
 // not always get the keyboard focus.
 
