@@ -132,8 +132,8 @@ void KSBonjour::removeKSNetService(const Notification& notification) {
   if (wasValid) KSNetServiceCancelResolve(storedService);
   if (entry.referenceCount >= 2) {
     // Only the first removal after an addition or a resolve lowers the count. So, by design, an
-    // entry that was added three or more times survives any number of removals that come without
-    // an addition or a resolve in between.
+    // entry that was added three or more times survives any number of removals with no addition or
+    // resolve between them.
     if (wasValid) --entry.referenceCount;
     KSNetServiceResolveAsync(storedService, &clientCallbacks());
   } else {
@@ -157,8 +157,8 @@ std::string KSBonjour::keyForService(const std::string& name, const std::string&
 }
 
 // Returns the key of `service` in this browser's table. Returns nothing when the browser is
-// stopped, and when the service is null, lacks a name, type or domain, or has a different type from
-// the browser.
+// stopped, and when the service is null, lacks a name, type or domain, or has a type other than the
+// browser's.
 std::optional<std::string> KSBonjour::ownKeyOf(const NetServiceRef& service) const {
   if (!service || !_services) return std::nullopt;
   const auto name = service->name();

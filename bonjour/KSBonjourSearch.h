@@ -21,16 +21,17 @@ class KSDeviceObserver {
 
   /// Called when a device's service is resolved but is not known.
   virtual void addKSDevice(const Dictionary& device) = 0;
-  /// Called when a device's known service is resolved or reported gone. Even a new device is
-  /// usually reported here, because a browser stores a resolved service before it reports the
-  /// service. So an observer must add any device that is new to it.
+  /// Called when a device's known service is resolved, or when a device's service is reported gone
+  /// but is still known. Even a new device is usually reported here, because a browser stores a
+  /// resolved service before it reports the service. So an observer must add any device that is new
+  /// to it.
   virtual void updateKSDevice(const Dictionary& device) = 0;
   /// Called when a device's service is reported gone and is no longer known.
   virtual void removeKSDevice(const Dictionary& device) = 0;
 };
 
 /// Searches the network for devices that offer the service type that the medium names. Tells the
-/// observers when a device's service is resolved and when the service is gone. Ignores services
+/// observers when a device's service is resolved and when it is reported gone. Ignores services
 /// that lack a name, type or domain. A running search and its browser keep each other alive, so the
 /// owner of a search must call stopBrowsing() before releasing it. All functions must be called on
 /// the main thread.
@@ -60,8 +61,8 @@ class KSBonjourSearch final : public KSBonjourObserver,
   /// Ends the search without calling observers. Does nothing when no search is running.
   void stopBrowsing();
 
-  /// Returns the types, as strings, of all browsers whose tables contain a service with this name
-  /// and domain. Returns an empty array if either argument has no value.
+  /// Returns the types, as strings, of all browsers whose tables contain a service of the browser's
+  /// type with this name and domain. Returns an empty array if either argument has no value.
   [[nodiscard]] Array supportTypes(const std::optional<std::string>& name,
                                    const std::optional<std::string>& domain) const;
 

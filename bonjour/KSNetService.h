@@ -29,7 +29,7 @@ int KSNetServiceBrowserStart(NetServiceBrowserRef& browser, const std::string& d
                              const std::optional<std::string>& type,
                              ServiceClientCallbacks* callbacks);
 
-/// Stops `browser` for good. Does not release the caller's reference. Returns 1 for a null browser.
+/// Stops `browser` for good. The caller keeps its reference. Returns 1 for a null browser.
 int KSNetServiceBrowserStop(const NetServiceBrowserRef& browser);
 
 /// Cancels any running resolve of `service` and starts a new one. `callbacks` may be null. A
@@ -85,7 +85,7 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyDeviceURI(const NetServiceRef& service);
 
 /// These functions return the USB model and the USB manufacturer from the service's TXT record. The
-/// keys in the record depend on the service's type; see identity_keys.h. They return nothing when
+/// keys in the record depend on the service's type; see identity_keys.h. Both return nothing when
 /// the value is absent or not UTF-8, when the record is absent or malformed, and when
 /// identity_keys.h does not list the type.
 [[nodiscard]] std::optional<std::string> KSNetServiceCopyModel(const NetServiceRef& service);
@@ -98,20 +98,21 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 /// Returns the service's name. Returns nothing when the service is null or has no name.
 [[nodiscard]] std::optional<std::string> KSNetServiceGetNameSafe(const NetServiceRef& service);
 
-/// Returns whether the service's TXT record lists "image/urf" in any case under the key "pdl",
-/// which names page description languages. The program does not use this function.
+/// Returns whether the value of "pdl" in the service's TXT record, a list of page description
+/// languages, contains "image/urf". Ignores the case of letters. The program does not use this
+/// function.
 [[nodiscard]] bool KSNetServiceSupportsURF(const NetServiceRef& service);
 
 /// The client function of every browser. `info` is null or points to a ServiceClientCallbacks.
-/// If `flags` contains kNetServiceFlagRemove, calls the `remove` of `info`, otherwise the `add`.
-/// Calls nothing if `error` reports a failure.
+/// If `flags` contains kNetServiceFlagRemove, calls `remove` in `info`, otherwise `add`. Calls
+/// neither if `error` reports a failure.
 void KSNetServiceBrowseCallBack(const NetServiceBrowserRef& browser, unsigned long flags,
                                 const NetServiceRef& service, const NetServiceError& error,
                                 void* info);
 
 /// The client function of every asynchronous resolve. `info` is null or points to a
-/// ServiceClientCallbacks. After a success, calls the `resolved` of `info`. After a failure, starts
-/// the resolve again.
+/// ServiceClientCallbacks. After a success, calls `resolved` in `info`. After a failure, starts the
+/// resolve again.
 void KSNetServiceResolveCallBack(const NetServiceRef& service, const NetServiceError& error,
                                  void* info);
 

@@ -6,7 +6,7 @@
 
 namespace onramp {
 
-/// The service types for which we know the TXT keys of the device's maker and model.
+/// The service types whose TXT keys for the device's maker and model are known.
 inline constexpr std::array<std::string_view, 4> kIdentifyingTypes{
     "_pdl-datastream._tcp.", "_printer._tcp.", "_ipp._tcp.", "_scanner._tcp."};
 

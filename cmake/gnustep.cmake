@@ -9,13 +9,13 @@ set(CMAKE_OBJCXX_STANDARD_REQUIRED ON)
 set(CMAKE_OBJCXX_EXTENSIONS OFF)
 
 # gnustep_flags(VARIABLE KIND) sets VARIABLE to the list of flags that gnustep-config prints for the
-# option KIND.
+# option KIND, adapted to this build.
 function(gnustep_flags variable kind)
   execute_process(COMMAND ${ONRAMP_GNUSTEP_CONFIG} ${kind} OUTPUT_VARIABLE flags
     OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
   separate_arguments(flags NATIVE_COMMAND "${flags}")
-  # Remove flags that the build sets itself or does not want, and suppress warnings in GNUstep's
-  # headers.
+  # Remove flags that the build sets itself or does not want. With -isystem, the compiler does not
+  # warn about GNUstep's headers.
   list(FILTER flags EXCLUDE REGEX "^(-M.*|-Wall|-Wno-import|-g|-O2|-shared-libgcc|-I\\.)$")
   list(TRANSFORM flags REPLACE "^-I" "-isystem")
   set(${variable} ${flags} PARENT_SCOPE)

@@ -10,8 +10,8 @@ set_target_properties(onramp PROPERTIES
   MACOSX_BUNDLE_INFO_PLIST ${PROJECT_BINARY_DIR}/Info.plist
   RUNTIME_OUTPUT_DIRECTORY ${ONRAMP_MEDIUM})
 
-# onramp_resource(FILE [FOLDER]) puts FILE into Resources in the application's bundle, or into
-# Resources/FOLDER.
+# onramp_resource(FILE [FOLDER]) puts FILE into the folder Resources of the application's bundle, or
+# into Resources/FOLDER.
 function(onramp_resource file)
   target_sources(onramp PRIVATE ${file})
   set_source_files_properties(${file} PROPERTIES MACOSX_PACKAGE_LOCATION "Resources/${ARGV1}")

@@ -34,8 +34,8 @@ if(NOT onramp_kind STREQUAL "OBJECT")
     "${PROJECT_SOURCE_DIR}/maker.json shows the form.")
 endif()
 
-# The settings become C++ string literals and XML. So no FORM allows quotation marks, backslashes,
-# angle brackets or line breaks in a string.
+# The settings are inserted into C++ string literals and XML. So no string may contain quotation
+# marks, backslashes, angle brackets or line breaks.
 set(plain "^[^\"\\<>\n\r]+$")
 onramp_maker_setting(ONRAMP_MAKER_NAME name "${plain}" "\"Kestrel Imaging\"")
 onramp_maker_setting(ONRAMP_BUNDLE_NAME bundleName "${plain}" "\"Onramp OSX\"")

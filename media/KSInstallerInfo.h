@@ -21,8 +21,8 @@ struct FileURL {
 /// the key "PkgName", the wizard uses only that key.
 [[nodiscard]] std::optional<std::string_view> packageKey(std::int32_t version);
 
-/// Where the installer package and the wireless set-up tool are on the medium, and which systems
-/// the medium supports. Only the constructor reads the medium.
+/// Says where the installer package and the wireless set-up tool are on the medium, and which
+/// systems the medium supports. Only the constructor reads the medium.
 class KSInstallerInfo {
  public:
   /// Reads the medium from which the wizard is running.

@@ -28,9 +28,9 @@ inline constexpr std::string_view kBonjourServiceType =
 
 /// Makes the record from two dictionaries. `CDCommonInfo` is the medium resource dictionary, from
 /// which only the service type is read. `info` is the dictionary in the file that the "CDInfo"
-/// entry of `CDCommonInfo` names. A value that is absent or has the wrong type gets its default: no
-/// models, true for a package, or an empty string. If `info` is not given, all values get their
-/// defaults, even the service type.
+/// entry of `CDCommonInfo` names. The models are sorted by sortIgnoringCase(). A value that is
+/// absent or has the wrong type gets its default: no models, true for a package, or an empty
+/// string. If `info` is not given, all values get their defaults, even the service type.
 [[nodiscard]] Dictionary initWithCDInfoPlist(const std::optional<Dictionary>& info,
                                              const std::optional<Dictionary>& CDCommonInfo);
 
@@ -40,8 +40,8 @@ inline constexpr std::string_view kBonjourServiceType =
 
 }  // namespace KSOROSXCD
 
-/// Returns the model names that `record` stores under kContainedModels, in the stored order.
-/// Returns an empty list when the record has no array under that key.
+/// Returns the strings in the array under kContainedModels in `record`, in their order. Returns an
+/// empty list when the record has no array under that key.
 [[nodiscard]] std::vector<std::string> containedModels(const Dictionary& record);
 
 }  // namespace onramp

@@ -8,7 +8,7 @@ import time
 
 PERIOD = 0.02  # seconds between two requests
 NOTED = 0.05   # seconds; shorter silences are not recorded
-PATIENCE = 120  # seconds; longer than any silence that is measured
+PATIENCE = 120  # seconds until a request fails; every expected silence is shorter
 
 
 @dataclasses.dataclass(frozen=True)
@@ -87,7 +87,8 @@ def _application(atspi, process):
 
 
 def _schedule(files):
-    """Reads schedstat files. Returns the computing time, in seconds, of the thread that the first
-    file describes, and the total time that the threads of all files waited for a processor."""
+    """Reads schedstat files, each of which describes one thread. Returns two times in seconds: how
+    long the first thread has computed, and how long all threads together have waited for a
+    processor."""
     times = [[int(field) / 1e9 for field in file.read_text().split()[:2]] for file in files]
     return times[0][0], sum(waited for _, waited in times)

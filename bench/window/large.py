@@ -31,7 +31,7 @@ from onscreen.processes import wait_for
 from practice_network import PracticeNetwork
 
 SEARCHES = 3
-LOOKS_AT_ALL = 25  # one in this many looks reads the whole window; the others read only the list
+LOOKS_AT_ALL = 25  # one look in this many reads the whole window; the others only count the rows
 
 
 class Trial:
@@ -61,8 +61,8 @@ class Trial:
             self._network.remove(name)
 
     def search(self, what):
-        """Searches a few times. Returns whether every list had only expected devices, and none of
-        them twice.
+        """Searches a few times. Returns whether every list had only expected devices, each at most
+        once.
 
         A list may be incomplete: the wizard ends a search after three seconds if the list has a
         device by then.
@@ -86,8 +86,8 @@ class Trial:
 
 
 def _seconds_until_listed(person, table, count, began):
-    """Waits until the list has been emptied and then has `count` rows, or the search has ended.
-    Returns the seconds from `began` to the last change that was seen in the list."""
+    """Waits until the list, once emptied, has `count` rows again or the search has ended. Returns
+    the seconds from `began` to the last change that was seen in the list."""
     emptied = False
     last, changed = table.get_n_rows(), began
     for look in itertools.count():
@@ -96,7 +96,7 @@ def _seconds_until_listed(person, table, count, began):
         rows = table.get_n_rows()
         if rows != last or searching and not emptied:
             changed = time.monotonic()
-        # The list may be emptied and filled again between two looks.
+        # A running search is proof enough, because the list may be refilled between two looks.
         emptied = emptied or searching or rows < last or rows == 0
         last = rows
         if emptied and (rows == count or looks_at_all and not searching):

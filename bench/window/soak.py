@@ -39,7 +39,7 @@ from practice_network import PracticeNetwork
 
 CHECKPOINT_EVERY = 10  # searches
 SEARCHES_AT_CHECKPOINT = 3  # at most
-WARM_UP = 0.1          # this fraction of the run, at its start, does not count for the growth
+WARM_UP = 0.1          # the fraction of the run, from its start, that the growth leaves out
 
 
 def memory(process):
@@ -107,11 +107,12 @@ class Soak:
             self._complain(f"{count} devices are listed, not {least} to {most}")
 
     def check(self):
-        """Searches while no device comes or goes, and compares the list with the devices present.
+        """Searches while no device comes or goes, and compares the list with the wireless
+        devices that are present.
 
         The wizard ends a search after three seconds if the list has a device by then. On a busy
-        machine, other devices may be missing. So an incomplete list is counted, and the search is
-        repeated.
+        machine, other devices may be missing. So the search is repeated if the list is incomplete,
+        and only the last list must be complete.
         """
         self._devices.rest()
         try:
