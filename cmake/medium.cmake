@@ -1,6 +1,6 @@
 # The target `medium` assembles a medium in the folder ONRAMP_MEDIUM: the files of the example medium and
-# the application's bundle. The last lines of this file
-# install the bundle on the installed copy of the example medium.
+# the application's bundle. An installation has a copy of the example medium, and the last lines of this
+# file install the bundle on that copy.
 
 set(ONRAMP_MEDIUM ${PROJECT_BINARY_DIR}/medium CACHE PATH "Where the runnable medium is assembled")
 set(onramp_contents "${ONRAMP_MEDIUM}/Onramp OSX.app/Contents")
