@@ -150,7 +150,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   [[nodiscard]] std::string supportSystemMinString() const;
 
   /// Shows an alert that says why the system is not supported. Returns when the user dismisses the
-  /// alert. Does nothing if `type` is kSupported. `parent` is not used.
+  /// alert or the application terminates. Does nothing if `type` is kSupported. Ignores `parent`.
   void showSystemNotSpecifiedAlert(const Window& parent, SystemSupport type) const;
 
   // hand_off.cpp: the files that pass the user's choices to the installer package.
@@ -186,7 +186,7 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   // launching.cpp: starting the package, the set-up tool and the support page.
 
   /// Writes the package-options file and opens the package. Returns false when the medium has no
-  /// package for the system, or when the package cannot be opened.
+  /// package for the system, or when openFile() returns false.
   bool launchPackage();
 
   /// Terminates the application after one second, so that the package has time to open. Returns at
@@ -197,8 +197,8 @@ class OnrampOSXAppDelegate final : public ApplicationDelegate {
   /// launchWLANToolManually() when the user asks for the wireless set-up tool. Both hide the wizard
   /// and return. The tool runs half a second later. When the tool has exited, the wizard acts on
   /// the exit status:
-  /// - 1: The wizard reappears. If the tool was started automatically, the wizard then shows the
-  ///   connection page with the wireless choice selected.
+  /// - 1: The wizard reappears. After an automatic start, it reappears on the connection page with
+  ///   the wireless choice selected.
   /// - 2: The wizard terminates.
   /// - Any other status, or none because the tool could not be run or was killed: The wizard
   ///   reappears, shows the chooser and searches.

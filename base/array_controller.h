@@ -33,7 +33,7 @@ class ArrayController {
   /// Removes all entries and clears the selection.
   void removeAllObjects();
 
-  /// Sorts the entries by the strings that they have under the sort key, in ascending byte order.
+  /// Sorts the entries by the bytes of their strings under the sort key, in ascending order.
   /// Entries with equal strings keep their order. The selected entry stays selected.
   void rearrange();
 

@@ -1,4 +1,5 @@
-// Shows an empty window of the wizard's size. start_up.py compares its start-up with the wizard's.
+// Shows an empty window of the wizard's size. start_up.py compares the start-up of this
+// program with the wizard's.
 
 #include <QApplication>
 #include <QMainWindow>

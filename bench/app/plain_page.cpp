@@ -1,5 +1,5 @@
-// Shows a page like the wizard's first page, written in plain Qt. start_up.py compares its start-up
-// with the wizard's.
+// Shows a page like the wizard's first page, written in plain Qt. start_up.py compares the start-up
+// of this program with the wizard's.
 
 #include <QApplication>
 #include <QLabel>

@@ -22,7 +22,7 @@ class Case:
     unit: str           # the unit of `ours` and `peer`: "s" or "MiB"
     ours: list[float]
     peer: list[float]
-    axis: str = ""      # the label of the plot's x axis, such as "models"; if empty, there is no plot
+    axis: str = ""      # what `size` counts, such as "models"; if empty, there is no plot of cost
     size: int = 0       # the number on the x axis
 
     def ratio(self):

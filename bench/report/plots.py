@@ -72,7 +72,7 @@ def _axes(x, y, unit, axis):
 
 
 def noise(cases):
-    """Returns an SVG that shows, for each case, the spread() of our values and of the peer's."""
+    """Returns an SVG that shows, for each case, the spread() of Onramp's values and of the peer's."""
     spreads = [(f"{case.benchmark}, {case.name}", spread(case.ours), spread(case.peer))
                for case in cases]
     most = max(0.05, *(max(ours, peer) for _, ours, peer in spreads))

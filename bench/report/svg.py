@@ -10,7 +10,7 @@ _DASHES = ("", "6 4")
 
 
 def _colours(number, ground, ink, faint):
-    """Returns CSS rules. `number` is 0 for the light colours of _SERIES, and 1 for the dark ones."""
+    """Returns CSS rules. `number` is 0 for a light colour scheme, and 1 for a dark one."""
     series = "".join(f".stroke{index} {{ stroke: {pair[number]}; }} "
                      f".fill{index} {{ fill: {pair[number]}; }} "
                      for index, pair in enumerate(_SERIES))

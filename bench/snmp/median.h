@@ -6,10 +6,10 @@
 #include <cstring>
 #include <vector>
 
-/// The times of an operation, in nanoseconds.
+/// Measured durations of an operation, in nanoseconds.
 class Samples {
  public:
-  /// Runs `work` as often as `times` says, and adds the mean duration as one sample.
+  /// Runs `work` as often as `times` says, and adds the mean duration of a run as one sample.
   template <typename Work>
   void measure(int times, Work work) {
     const auto start = std::chrono::steady_clock::now();

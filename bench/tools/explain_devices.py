@@ -2,8 +2,8 @@
 """Compares onramp-devices with avahi-browse and snmpget on networks of several sizes.
 
 Each round measures how long onramp-devices takes to find every device and say whether the wizard
-lists it, and how long avahi-browse takes to resolve the same devices. Before the rounds, snmpget asks
-each device that has an SNMP agent. The time of the slowest answer is added to every time of
+lists it, and how long avahi-browse takes to resolve the same devices. Before the rounds, snmpget
+queries each device that has an SNMP agent. The time of the slowest answer is added to every time of
 avahi-browse.
 """
 

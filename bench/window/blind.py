@@ -22,7 +22,7 @@ def descriptors(process):
 class BlindChooser:
     """A context manager that starts the wizard and controls it without reading the screen.
 
-    The constructor first runs the wizard once with the accessibility bus, to find out where the menu
+    The constructor first runs the wizard once with the accessibility bus, to find out where the gear
     button is. The wizard has more open descriptors while it searches, so their number shows whether
     a search is running.
     """
@@ -75,7 +75,7 @@ class BlindChooser:
 
     @staticmethod
     def _try(act, has_begun):
-        """Calls `act` until a search begins, because a click that comes too early is lost. Raises
+        """Calls `act` until a search begins, because input that comes too early is lost. Raises
         TimeoutError if no search begins after several calls."""
         for _ in range(_TRIES):
             act()

@@ -60,8 +60,8 @@ class Devices(threading.Thread):
         return sorted(name for name, answer in self._present.items() if answer == 2)
 
     def bounds(self, moment):
-        """Returns the smallest and the largest number of devices that a search from `moment` until
-        now may list. Do not call this between rest() and resume()."""
+        """Returns a lower and an upper bound for how many devices a search from `moment` until now
+        may list. Do not call this between rest() and resume()."""
         with self._allowed:
             changed = [name for when, name, _ in self.changes if when >= moment]
             there = sum(answer == 2 for name, answer in self._present.items()
@@ -91,8 +91,8 @@ class Devices(threading.Thread):
         self.changes.append((time.monotonic(), name, change))
 
     def near(self, silence):
-        """Describes the devices that came or left during `silence` or in the second before. The
-        times in the description are relative to the start of the silence."""
+        """Describes the devices that came or left during `silence` or in the second before it.
+        Times in the description are relative to the start of the silence."""
         return ", ".join(f"{name} {change} at {when - silence.began:+.2f} s"
                          for when, name, change in self.changes
                          if -1 < when - silence.began < silence.seconds)
