@@ -92,7 +92,7 @@ bool setNotificationKeys(const DynamicStoreRef& store, const std::vector<std::st
 
 /// Adds `source` to the main run loop. The source works even while a modal window is shown. The
 /// loop keeps the source until the process exits. Does nothing when `source` is null or when a
-/// source of the same session has already been added. If the system provides no thread, the
+/// source of the same session has already been added. If the thread for it cannot be created, the
 /// session's callback is not called until setNotificationKeys() is called again and succeeds.
 void addSourceToMainLoop(const DynamicStoreSourceRef& source);
 

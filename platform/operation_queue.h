@@ -19,7 +19,7 @@ class OperationQueue {
       thread.join();
   }
 
-  /// Starts `operation`. Returns false, and does not run it, when the system provides no thread.
+  /// Starts `operation`. Returns false, and does not run it, when the thread cannot be created.
   [[nodiscard]] bool addOperation(std::function<void()> operation) {
     try {
       threads_.emplace_back(std::move(operation));

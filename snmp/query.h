@@ -48,8 +48,8 @@ constexpr const char* kIPAddressKey = "IPaddress";    ///< string, the device's 
 constexpr const char* kActiveIFKey = "ActiveIF";  ///< number: the device's active interface
 
 /// The table that asks for kActiveIFObject. The name in each reply overwrites the name in this
-/// table, and later requests ask for the new name. After a reply with a shorter name, replies with
-/// longer names are refused.
+/// table, and later requests ask for the new name. After a reply with a shorter name, a reply whose
+/// name is longer than that one is refused.
 extern mib_table active_interface_table;
 
 /// Stores an INTEGER under `name` as a 32-bit number and returns 0. Returns 1 for a value of any
@@ -73,10 +73,9 @@ class snmp_table_request {
   /// reply.
   void clear_values();
 
-  /// Returns the values that the handlers accept from the reply in the message. Adds
-  /// kConnectionKey, and `address` under kIPAddressKey. If a handler refuses a value, the values
-  /// before it are dropped, too. Returns nothing when the value of the last entry is refused, and
-  /// when the table has no entries.
+  /// Passes the reply's values to the handlers, and returns the values that follow the last refused
+  /// one. Adds kConnectionKey, and `address` under kIPAddressKey. Returns nothing when the value of
+  /// the last entry is refused, and when the table has no entries.
   [[nodiscard]] std::optional<Dictionary> result(const std::string& address) const;
 
  private:
@@ -91,8 +90,8 @@ class snmp_table_request {
 /// Returns nothing when `table` or `address` is null, when the request fails, when the reply has an
 /// error status, and when snmp_table_request::result() returns nothing for the reply. A request
 /// fails when it cannot be sent or gets no valid reply. Sets `out_no_reply` to true when the
-/// request fails, otherwise leaves it unchanged. Stores the error status and index of a reply in
-/// the last two arguments, each of which may be null. May block as long as snmp_exchange() does.
+/// request fails, and otherwise leaves it unchanged. Stores the error status and index of a reply
+/// in the last two arguments, each of which may be null. May block as long as snmp_exchange() does.
 [[nodiscard]] std::optional<Dictionary> snmp_query_table(mib_table* table, const char* address,
                                                          bool& out_no_reply,
                                                          std::int32_t* out_error_status,
@@ -107,11 +106,11 @@ class snmp_table_request {
 
 /// Returns whether a device reports that it is using its wireless interface. `addresses` holds the
 /// device's addresses as strings, which are tried in order. A try makes one request, and a second
-/// request if the first returns no result. The first address that answers every request of its
-/// first try decides the result. Each earlier address is tried three times, with a pause of 20 ms
-/// after each try. If no address decides, the last try of the last address does. A try without a
-/// result counts as an ActiveIF of 0, and so does an empty list of addresses. An entry that is
-/// not a string counts as an address that answers without a result.
+/// request if the first returns no result. An address whose first try gets a reply to each of its
+/// requests decides the result, and later addresses are not tried. Any other address is tried three
+/// times, with a pause of 20 ms after each try. If no address decides, the last try of the last
+/// address does. A try without a result counts as an ActiveIF of 0, and so does an empty list of
+/// addresses. An entry that is not a string counts as an address that replies without a result.
 ///
 /// Blocks for about 12 seconds for each address that sends nothing back, not even a report that the
 /// port is closed.

@@ -23,11 +23,11 @@ class Query;
 class Daemon {
  public:
   /// Returns the connection that all callers share. If there is none, creates it. The connection
-  /// runs on the main loop. Returns null when the system provides no descriptor or thread.
+  /// runs on the main loop. Returns null when a descriptor or the thread cannot be created.
   [[nodiscard]] static std::shared_ptr<Daemon> shared();
 
-  /// Creates a connection that runs only inside runUntil(). Returns null when the system provides
-  /// no descriptor.
+  /// Creates a connection that runs only inside runUntil(). Returns null when a descriptor
+  /// cannot be created.
   [[nodiscard]] static std::unique_ptr<Daemon> create();
 
   Daemon(const Daemon&) = delete;

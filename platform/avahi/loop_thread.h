@@ -14,8 +14,8 @@ namespace onramp::avahi {
 /// separate thread polls the loop's descriptor, but never touches the loop itself.
 class LoopThread : public std::enable_shared_from_this<LoopThread> {
  public:
-  /// Starts the thread for `loop`, which must outlive the result. Returns null when the system
-  /// provides no descriptor or thread.
+  /// Starts the thread for `loop`, which must outlive the result. Returns null when a descriptor
+  /// or the thread cannot be created.
   [[nodiscard]] static std::shared_ptr<LoopThread> start(sd_event* loop);
 
   LoopThread(const LoopThread&) = delete;

@@ -8,8 +8,8 @@
 
 namespace onramp::avahi {
 
-/// Calls an action once after a given time, from inside an event loop. When the system provides no
-/// memory or descriptor, the timer does nothing and isUsable() returns false.
+/// Calls an action once after a given time, from inside an event loop. If the constructor cannot
+/// get memory or a descriptor, the timer does nothing and isUsable() returns false.
 class Timer {
  public:
   /// `priority` ranks events of `loop` that are due at the same time. With SD_EVENT_PRIORITY_IDLE,

@@ -26,8 +26,8 @@ int modalLoops = 0;
 bool isModalAborted = false;
 
 // True from abortModal() until the modal loop has returned, or until the main thread has found that
-// no loop is running. Meanwhile, actions of performOnMainThread() wait for the end of the loop,
-// because each of them could delay this end by seconds.
+// no loop is running. Meanwhile, the actions that were passed to performOnMainThread() do not
+// run, because each of them could keep the loop from returning for seconds.
 std::atomic<bool> isAborting = false;
 
 // Returns an object that runs `action` only once, even if a timer calls the object again while
@@ -48,8 +48,9 @@ void post(std::function<void()> action) {
   }
 }
 
-// Drops the clicks and keys that arrived while the main thread was busy. The user meant them for
-// the page that was shown at that time. No timer or posted action runs in the loop mode used here.
+// Drops the clicks and key presses that arrived while the main thread was busy. The user meant them
+// for the page that was shown at that time. No timer or posted action runs in the loop mode used
+// here.
 void dropWaitingInput() {
   const NSUInteger input = NSLeftMouseDownMask | NSLeftMouseUpMask | NSRightMouseDownMask |
                            NSRightMouseUpMask | NSKeyDownMask | NSKeyUpMask;

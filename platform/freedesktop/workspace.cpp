@@ -37,7 +37,7 @@ bool openWithDesktop(const std::string& target) {
   const auto process = opener ? startProcess(*opener, {target}, Session::kOwn) : std::nullopt;
   if (!process) return false;
   // A thread waits for the process, which would otherwise remain as a zombie until this program
-  // exits. If the system provides no thread, the zombie remains, which is harmless.
+  // exits. If the thread cannot be created, the zombie remains, which is harmless.
   try {
     std::thread([process] { waitForProcess(*process); }).detach();
   } catch (const std::system_error&) {

@@ -16,13 +16,13 @@ struct NodeFree {
 /// Owns a libplist node and everything below it.
 using Node = std::unique_ptr<std::remove_pointer_t<plist_t>, NodeFree>;
 
-/// Converts `node` to a value. As in an XML list, a UID becomes a dictionary whose only key is
-/// "CF$UID".
+/// Converts `node` to a value. As in an XML property list, a UID becomes a dictionary whose only
+/// key is "CF$UID".
 [[nodiscard]] Value valueOf(plist_t node);
 
 /// Converts `value` to a node that XML can express. Malformed UTF-8 and characters that XML does
-/// not allow become the replacement character. Dates are rounded down to whole seconds and limited
-/// to the years 1 to 9999. A date that is not a number becomes the reference date.
+/// not allow become the replacement character. Dates are rounded down to whole seconds and clamped
+/// to the years 1 to 9999. A date whose time is NaN becomes the reference date.
 [[nodiscard]] Node nodeOf(const Value& value);
 
 }  // namespace onramp::libplist

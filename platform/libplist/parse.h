@@ -10,8 +10,8 @@ namespace onramp::libplist {
 
 /// Returns the value in `bytes`, an XML property list (in UTF-8 or UTF-16) or a binary one. Returns
 /// nothing when `bytes` are malformed or exceed a limit. In that case, stores the place and the
-/// reason in `problem`, if given. However, `problem` stays empty if libplist finds a fault that the
-/// check before it has missed.
+/// reason in `problem`, if given. `bytes` are checked before libplist parses them. If only libplist
+/// finds a fault, `problem` stays empty.
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes);
 [[nodiscard]] std::optional<Value> parsePropertyList(std::string bytes, ParseProblem& problem);
 

@@ -23,8 +23,8 @@ class ChangeWatch {
 
   /// Starts a thread that calls `changed` after every burst of changes. Changes since create() also
   /// count. The destructor stops the calls and waits for a running call to return. If the socket to
-  /// the kernel fails, the calls stop for good without a report. Returns false when the system
-  /// provides no thread. Must not be called twice.
+  /// the kernel fails, the calls stop for good without a report. Returns false when the thread
+  /// cannot be created. Must not be called twice.
   [[nodiscard]] bool start(std::function<void()> changed);
 
  private:

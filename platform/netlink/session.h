@@ -68,7 +68,7 @@ struct DynamicStore {
   void tellChanges();
 
   /// If `watch` and `changesArrived` are set, makes `watch` call `changesArrived`. Destroys `watch`
-  /// and returns false when the system provides no thread.
+  /// and returns false when the thread cannot be created.
   bool startWatch();
 };
 

@@ -105,8 +105,8 @@ bool writeFileAtomically(const std::string& path, std::string_view bytes) {
 
 void removeWithTemporaries(const std::string& path) {
   std::error_code ignored;
-  // remove_all() opens `path` even if it is a file, which fails when the system provides no
-  // descriptor. remove() needs no descriptor, so it is tried first.
+  // remove_all() opens `path` even if it is a file, which fails when no descriptor can be
+  // created. remove() needs no descriptor, so it is tried first.
   if (!fs::remove(path, ignored)) fs::remove_all(path, ignored);
   const std::string stem = temporaryStem(path);
   std::vector<fs::path> leftOver;

@@ -22,8 +22,8 @@ class ImageViewWidget final : public QWidget {
   void paintEvent(QPaintEvent* event) override;
 
  private:
-  /// Returns whether the image must not be drawn. A stretched image is a background for dark text.
-  /// In a dark colour scheme, the text is light and would be unreadable on the image.
+  /// Returns whether the image must not be drawn. A stretched image is meant as a background for
+  /// dark text. In a dark colour scheme, the text is light and would be unreadable on the image.
   [[nodiscard]] bool isOutOfPlace() const;
 
   /// Returns the rectangle in this view in which the image is drawn.

@@ -23,8 +23,8 @@ std::vector<QEventLoop*>& modalLoops() {
 }
 
 // True from abortModal() until the modal loop has returned, or until the main thread has found that
-// no loop is running. Meanwhile, actions of performOnMainThread() wait for the end of the loop,
-// because each of them could delay this end by seconds.
+// no loop is running. Meanwhile, the actions that were passed to performOnMainThread() do not
+// run, because each of them could keep the loop from returning for seconds.
 std::atomic<bool> isAborting = false;
 
 }  // namespace
@@ -55,8 +55,8 @@ void runModalForWindow(const Window& window) {
   QEventLoop loop;
   modalLoops().push_back(&loop);
   loop.exec();
-  // Handles the clicks and keys that arrived while the main thread was busy. The user meant them
-  // for the page that is still shown, not for the next one.
+  // Handles the clicks and key presses that arrived while the main thread was busy. The user meant
+  // them for the page that is still shown, not for the next one.
   if (!isTerminating()) QCoreApplication::processEvents();
   modalLoops().pop_back();
   isAborting = false;

@@ -1,7 +1,7 @@
 """Tests device discovery with real daemons: network_test.py PROBE CHOOSER_PROBE MEDIUM [CLASS]
 
-The tests run on one of two hosts. Two cables, each with IPv4 and IPv6, connect the hosts. On the
-other host, Avahi announces devices. One test also announces a device from the tests' own host, with
+Two cables, each with IPv4 and IPv6, connect two hosts. The tests run on one of them. On the other
+host, Avahi announces devices. One test also announces a device from the tests' own host, with
 zeroconf, another mDNS implementation."""
 
 import os
@@ -35,7 +35,7 @@ def packets():
 
 def asked(seen, last):
     """Reads from the socket `seen` until an SNMP request goes to the address `last`. Returns the
-    destinations of all SNMP requests up to this one."""
+    destinations of all SNMP requests up to and including this one."""
     addresses = []
     while last not in addresses:
         packet = seen.recv(100)

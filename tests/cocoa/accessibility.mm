@@ -10,7 +10,7 @@
 // windows so far). Each of the remaining objects describes a visible window or control, and has the
 // keys "role", "name", "states", "x", "y", "width" and "height". Roles and states have their AT-SPI
 // names. The state "cut off", which AT-SPI lacks, marks text that does not fit. Lengths are in
-// pixels, and x and y start at the screen's upper left corner.
+// pixels, and x and y are measured from the screen's upper left corner.
 
 #include <unistd.h>
 
