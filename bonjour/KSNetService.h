@@ -99,7 +99,7 @@ int KSNetServiceCopyAddressesForDeviceURI(const std::optional<std::string>& uri,
 [[nodiscard]] std::optional<std::string> KSNetServiceGetNameSafe(const NetServiceRef& service);
 
 /// Returns whether the value of "pdl" in the service's TXT record, a list of page description
-/// languages, contains "image/urf". Ignores the case of letters. The program does not use this
+/// languages, contains "image/urf". Ignores the case of letters. The wizard does not use this
 /// function.
 [[nodiscard]] bool KSNetServiceSupportsURF(const NetServiceRef& service);
 

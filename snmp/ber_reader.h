@@ -79,7 +79,7 @@ namespace onramp {
 /// string.
 [[nodiscard]] snmp_status ber_get_octets(ByteReader& in, snmp_octets* target, std::uint16_t length);
 
-// The program does not use ber_get_octets_ref(), which is here for completeness.
+// The wizard does not use ber_get_octets_ref(), which is here for completeness.
 
 /// Reads a string of `length` bytes and makes `target->bytes` point to it in the input, which must
 /// outlive `target`. Sets `target->capacity` to 0, because the input must not be written to. For an

@@ -12,7 +12,7 @@ namespace onramp {
 /// arrival. There are at most 256 dictionaries for each interface. A device that replies twice has
 /// two dictionaries, because neither the request identifier nor the sender of a reply is checked.
 /// If the request cannot be sent on an interface, the interface has no results and the failure is
-/// not reported. The program does not call this function.
+/// not reported. The wizard does not call this function.
 ///
 /// For each interface, blocks for up to 2 seconds to send, and then for 5 to 8 seconds to receive.
 /// Receiving ends early after 256 attempts. Returns an empty array at once when all interfaces are

@@ -71,7 +71,7 @@ void snmp_message_init(snmp_message& message, std::uint64_t varbind_count);
 
 /// Compares two object identifiers arc by arc. At the first difference, returns -1 when the arc of
 /// `first` is smaller, and 1 when it is larger. If there is no difference, returns -1 when `first`
-/// is shorter, and 0 otherwise, even when `second` is shorter. The program does not use this
+/// is shorter, and 0 otherwise, even when `second` is shorter. The wizard does not use this
 /// function.
 [[nodiscard]] int snmp_oid_compare(const snmp_oid& first, const snmp_oid& second);
 

@@ -42,8 +42,8 @@ def medium_with(folder, count):
 
 
 def run_all(build, rounds):
-    """Returns a dictionary with the times and the peak memories of each program. Its keys are the
-    names of the peers and, for the wizard, the numbers of models."""
+    """Returns a dictionary with the times and the peak memories of each program. Its keys are EMPTY
+    and PLAIN and, for the wizard, the numbers of models."""
     with Desktop(window_manager=False) as desktop, tempfile.TemporaryDirectory() as folder:
         env = desktop.env | {"LANG": "en_US.UTF-8"}
         del env["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"]

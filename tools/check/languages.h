@@ -38,12 +38,13 @@ inline constexpr std::string_view kLanguageFolder = ".lproj";
 /// of the country's language, such as "ja" for "jp". Otherwise returns nothing.
 [[nodiscard]] std::optional<std::string> languageOfCountry(const std::string& name);
 
-/// Returns whether two names are those of the same language, in any region and script.
+/// Returns whether two names stand for the same language, whatever their regions and scripts.
 [[nodiscard]] bool isSameLanguage(const std::string& a, const std::string& b);
 
-/// Checks that the message bundle's texts are translated, that the bundle has the language for
-/// users without texts in their own language, and that the application and the set-up tool have all
-/// of the bundle's languages. `tables` maps each language of the bundle to its strings.
+/// Checks that the message bundle's texts are translated, that the bundle has its fallback
+/// language, which users see if it has none of their own languages, and that the application and
+/// the set-up tool have all of the bundle's languages. `tables` maps each language of the bundle to
+/// its strings.
 void checkLanguages(const MediumFiles& files, const Lists& lists,
                     const std::map<std::string, Dictionary>& tables);
 

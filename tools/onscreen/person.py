@@ -95,7 +95,7 @@ class Person:
         return [(row[0].removesuffix(f", {row[-1]}"), *row[1:]) for row in rows]
 
     def has_state(self, control, state):
-        """Returns whether the control has a state such as "enabled", "focused" or "selected"."""
+        """Returns whether the control is in `state`, such as "enabled", "focused" or "selected"."""
         return control.get_state_set().contains(getattr(self._atspi.StateType, state.upper()))
 
     def picture(self, path):
@@ -134,7 +134,7 @@ class Person:
     def open_menu(self, button=None):
         """Opens the menu of the button named `button` or, if that is None, of the focused button.
 
-        The menu does not appear on the accessibility bus, so a person can only use it by keyboard.
+        The menu does not appear on the accessibility bus, so only the keyboard can control it here.
         """
         windows = self._window_count()
         if button:
@@ -153,8 +153,8 @@ class Person:
         self.press(*["Down"] * item, "Return")
 
     def press(self, *keys):
-        """Waits a while for the program to get the keyboard, and presses the keys one after another.
-        Each key is given by its X name, such as "Return" or "alt+F4"."""
+        """Waits a while for the program to get the keyboard focus. Then presses the keys one after
+        another. Each key is given by its X name, such as "Return" or "alt+F4"."""
         try:
             wait_for(self._has_keyboard, _KEYBOARD_SECONDS, "the program to get the keyboard")
         except InVain:
@@ -172,7 +172,7 @@ class Person:
     def is_running(self):
         return self.process.poll() is None
 
-    # How the person looks at the screen.
+    # Helpers, and a measurement of how fast the program answers.
 
     def _alive(self):
         if self.process.poll() is not None:

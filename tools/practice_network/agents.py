@@ -78,8 +78,8 @@ class Agents:
             time.sleep(0.005)
 
     def relay_broadcasts(self, address):
-        """Starts a thread that forwards each request for the broadcast address `address` to every
-        net-snmp agent.
+        """Starts a thread that forwards each request that is sent to the broadcast address `address`
+        to every net-snmp agent.
 
         The agents receive no broadcasts, because each listens only at its own address.
         """

@@ -29,7 +29,7 @@ class Medium:
         self.language = messages.language(self.folder, [language] if language else self._locales())
         self.text = (messages.read(self.folder, self.language) if facts.texts.get(self.language)
                      else messages.Texts())
-        # The name of the menu's button comes from the application, not from the medium.
+        # The name of the menu's button is not in the message bundle, but in the application.
         self.gear = messages.read_table(
             application / f"Contents/Resources/{self.language}.lproj/ChooseDeviceView.strings")[
                 "Actions"]
@@ -89,7 +89,8 @@ class Medium:
 
 
 def _read(path):
-    """Returns the dictionary in a property list, or an empty one if the list cannot be read."""
+    """Returns the dictionary in a property list, or an empty one if the list cannot be read or is not a
+    dictionary."""
     try:
         content = plistlib.loads(path.read_bytes())
     except Exception:  # plistlib's errors have no other common class
@@ -103,7 +104,8 @@ def _text(content, key, default):
 
 
 def _number(value):
-    """Returns the number that the wizard reads: a number itself, a text's leading digits, or 0."""
+    """Returns the number that the wizard reads from `value`: an integer as it is, or the number
+    that a text's leading digits form. Anything else counts as 0."""
     if isinstance(value, str):
         digits = len(value) - len(value.lstrip("0123456789"))
         return int(value[:digits] or 0)
