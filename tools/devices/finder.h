@@ -24,7 +24,8 @@ class Finder final : public KSBonjourObserver, public std::enable_shared_from_th
   using Changed = std::function<void(Device& device)>;
 
   /// A device may have services of several types. The finder uses the addresses and TXT record of
-  /// the service of type `preferred` or, if there is none, of the service that it found first.
+  /// the service of type `preferred` or, if it has never found one, of the service that it found
+  /// first.
   Finder(std::string preferred, Changed changed);
   Finder(const Finder&) = delete;
   Finder& operator=(const Finder&) = delete;
